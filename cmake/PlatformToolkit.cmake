@@ -1,0 +1,33 @@
+# `platform_toolkit`: Foundation and AppKit, of Cocoa on macOS and of GNUstep on Linux.
+# `platform_foundation`: Foundation alone, for what needs no window.
+add_library(platform_foundation INTERFACE)
+add_library(platform_toolkit INTERFACE)
+
+if(APPLE)
+  target_compile_options(platform_foundation INTERFACE $<$<COMPILE_LANGUAGE:OBJCXX>:-fno-objc-arc>)
+  target_link_libraries(platform_foundation INTERFACE "-framework Foundation")
+  target_link_libraries(platform_toolkit INTERFACE platform_foundation "-framework Cocoa" "-framework CoreServices")
+  return()
+endif()
+
+find_program(GNUSTEP_CONFIG gnustep-config REQUIRED)
+function(gnustep_config option result)
+  execute_process(COMMAND ${GNUSTEP_CONFIG} ${option} OUTPUT_VARIABLE output
+                  OUTPUT_STRIP_TRAILING_WHITESPACE COMMAND_ERROR_IS_FATAL ANY)
+  separate_arguments(output UNIX_COMMAND "${output}")
+  set(${result} "${output}" PARENT_SCOPE)
+endfunction()
+gnustep_config(--objc-flags objc_flags)
+gnustep_config(--base-libs base_libs)
+gnustep_config(--gui-libs gui_libs)
+# Optimisation, debugging, warnings and dependency files are CMake's to choose; include folders are the system's,
+# so that our warnings are about our code only.
+list(FILTER objc_flags EXCLUDE REGEX "^(-MMD|-MP|-g|-O[0-9s]|-Wall|-I.*)$")
+list(FILTER base_libs EXCLUDE REGEX "^-L/home.*|^-L/root.*")
+list(FILTER gui_libs EXCLUDE REGEX "^-L/home.*|^-L/root.*")
+find_path(GNUSTEP_INCLUDE Foundation/Foundation.h PATH_SUFFIXES GNUstep REQUIRED)
+target_include_directories(platform_foundation SYSTEM INTERFACE ${GNUSTEP_INCLUDE})
+target_compile_options(platform_foundation INTERFACE
+  $<$<COMPILE_LANGUAGE:OBJCXX>:${objc_flags};-Wno-subobject-linkage;-Wno-deprecated-declarations>)
+target_link_libraries(platform_foundation INTERFACE ${base_libs})
+target_link_libraries(platform_toolkit INTERFACE platform_foundation ${gui_libs})

@@ -1,0 +1,10 @@
+#include "host/Services.h"
+
+namespace tessel
+{
+Services& services()
+{
+    static Services running;
+    return running;
+}
+} // namespace tessel

@@ -1,0 +1,44 @@
+// The parts of the running host, as the SDK's free functions and the parts themselves find one another.
+//
+// `Host` (host/app) makes the parts in an order, stores them here and takes them out again when it ends. A null
+// pointer says that the part is not running; only code that can run outside of a session needs to ask.
+#pragma once
+
+namespace tessel
+{
+class ApplicationServices; // host/services: TsDbHostApplicationServices
+class CallingApplication;  // host/linker: whose entry point or command is running
+class CommandLine;         // host/console: where the host's text goes
+class CommandStack;        // host/commands
+class Document;            // host/documents
+class DynamicLinker;       // host/linker
+class FileSearch;          // host/filesearch
+class Help;                // host/help
+class LispInterpreter;     // host/lisp
+class MessageBox;          // host/messagebox
+class Registry;            // host/registry
+class RemoteFiles;         // host/remote
+class ResourceModules;     // host/resources
+class SystemVariables;     // host/sysvars
+
+struct Services
+{
+    CommandLine* commandLine = nullptr;
+    Registry* registry = nullptr;
+    SystemVariables* variables = nullptr;
+    CallingApplication* callingApplication = nullptr;
+    ResourceModules* resources = nullptr;
+    CommandStack* commands = nullptr;
+    DynamicLinker* linker = nullptr;
+    Document* document = nullptr;
+    LispInterpreter* lisp = nullptr;
+    FileSearch* files = nullptr;
+    RemoteFiles* remote = nullptr;
+    ApplicationServices* application = nullptr;
+    MessageBox* messageBox = nullptr;
+    Help* help = nullptr;
+    bool removingTsLisp = true; // a setting of the host, read once before any application is loaded
+};
+
+Services& services();
+} // namespace tessel

@@ -1,0 +1,32 @@
+// Where the host's text goes: the terminal, a pipe, or a test's buffer.
+#pragma once
+
+#include <functional>
+#include <string>
+#include <string_view>
+
+namespace tessel
+{
+class CommandLine
+{
+public:
+    // `write` receives UTF-8 and must not throw; it is called with whole pieces, in order.
+    using Sink = std::function<void(std::string_view)>;
+
+    explicit CommandLine(Sink write);
+
+    // Prints the text as it stands.
+    void print(std::wstring_view text);
+
+    // Prints one sentence on a line of its own: after a line break if something stands on the line already,
+    // and with a line break behind it.
+    void say(std::wstring_view sentence);
+
+    // Whether the next character starts a line.
+    bool atLineStart() const { return mAtLineStart; }
+
+private:
+    Sink mWrite;
+    bool mAtLineStart = true;
+};
+} // namespace tessel

@@ -1,0 +1,43 @@
+// The service "TESSEL_REGISTERED_COMMANDS": the commands that a person can type.
+#pragma once
+
+#include "tsrx.h"
+
+class TsEdCommand;   // one command; owned by the host
+class TsEdUIContext; // shortcut menus of a command
+
+using TsEdCommandHandler = void (*)();
+
+// Status of the command stack.
+inline constexpr int TSED_COMMAND_OK = 0;
+inline constexpr int TSED_COMMAND_DUPLICATE = 1; // the group has a command of that global name already
+inline constexpr int TSED_COMMAND_INVALID = 2;   // a name is empty or holds white space, or no handler
+inline constexpr int TSED_COMMAND_UNKNOWN = 3;
+
+class TESSEL_API TsEdCommandStack : public TsRxObject
+{
+public:
+    static constexpr const wchar_t* kClassName = L"TsEdCommandStack";
+
+    static TsEdCommandStack* cast(TsRxObject* object)
+    {
+        return object && object->isKindOf(kClassName) ? static_cast<TsEdCommandStack*>(object) : nullptr;
+    }
+
+    // Adds a command to a group (made when it is new). Names compare without regard to case; a person may
+    // type the local name, or the global name with a leading "_". The strings are copied. The command belongs
+    // to the application that adds it and disappears when that is unloaded. `flags` 0 is a plain modal
+    // command; `uiContext` and `resources` may be null; `functionCode` -1 means none; `command`, when not
+    // null, receives the new command.
+    virtual int addCommand(const wchar_t* group, const wchar_t* globalName, const wchar_t* localName,
+                           int flags, TsEdCommandHandler handler, TsEdUIContext* uiContext = nullptr,
+                           int functionCode = -1, void* resources = nullptr,
+                           TsEdCommand** command = nullptr) = 0;
+
+    virtual int removeCommand(const wchar_t* group, const wchar_t* globalName) = 0;
+
+    // Removes every command of the group.
+    virtual int removeGroup(const wchar_t* group) = 0;
+
+    bool isKindOf(const wchar_t* className) const override;
+};

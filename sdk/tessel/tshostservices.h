@@ -1,0 +1,33 @@
+// The host application services: what the host is and where its things are.
+#pragma once
+
+#include "tsdefs.h"
+
+class TESSEL_API TsDbHostApplicationServices
+{
+public:
+    TsDbHostApplicationServices() = default;
+    TsDbHostApplicationServices(const TsDbHostApplicationServices&) = delete;
+    TsDbHostApplicationServices& operator=(const TsDbHostApplicationServices&) = delete;
+    virtual ~TsDbHostApplicationServices() = default;
+
+    // The key of the product below HKEY_CURRENT_USER, without backslashes at its ends:
+    // "Software\\Tessel\\R21" for release 21. Valid as long as the host runs.
+    virtual const wchar_t* productRegistryRoot() const = 0;
+
+    // The product's name as a person reads it: "Tessel".
+    virtual const wchar_t* product() const = 0;
+
+    // Whether the text is a URL that `fetchRemoteFile` can fetch (http or https, case does not matter).
+    virtual bool isUrl(const wchar_t* text) const = 0;
+
+    // Makes a local copy of a remote file, of at most the host's size and within its time limit. Unless
+    // `ignoreCache`, an earlier copy is taken. TS_FETCHED or TS_FROM_CACHE: `localPath` (capacity in
+    // characters) holds the copy's full path. TS_FETCH_FAILED: nothing is left behind, and the reason
+    // stands on the command line.
+    virtual int fetchRemoteFile(const wchar_t* url, wchar_t* localPath, std::size_t capacity,
+                                bool ignoreCache) = 0;
+};
+
+// Null while the host starts or ends.
+TESSEL_API TsDbHostApplicationServices* tsdbHostApplicationServices();

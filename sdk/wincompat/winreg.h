@@ -1,0 +1,43 @@
+// The registry: hierarchical keys with values. Key and value names compare without regard to case (simple
+// case folding of Unicode) and keep the spelling they were created with. The parts of a key path are
+// separated by one backslash; empty parts are passed over. Changes made while a command runs are stored
+// together when it ends, or not at all.
+#pragma once
+
+#include "wintypes.h"
+
+inline const HKEY HKEY_CURRENT_USER = reinterpret_cast<HKEY>(std::uintptr_t{0x80000001});
+
+inline constexpr DWORD KEY_READ = 0x20019;
+inline constexpr DWORD KEY_WRITE = 0x20006;
+inline constexpr DWORD REG_SZ = 1;
+
+// Opens an existing key. ERROR_FILE_NOT_FOUND when there is none. `*result` is closed with `RegCloseKey`.
+TESSEL_API LONG RegOpenKeyExW(HKEY root, const wchar_t* subKey, DWORD reserved, DWORD access, HKEY* result);
+
+// Opens a key and makes it and its missing parents. `keyClass`, `security` and `disposition` may be null.
+// ERROR_ACCESS_DENIED, ERROR_DISK_FULL or ERROR_WRITE_FAULT when the store cannot be written.
+TESSEL_API LONG RegCreateKeyEx(HKEY root, const wchar_t* subKey, DWORD reserved, const wchar_t* keyClass,
+                               DWORD options, DWORD access, const void* security, HKEY* result,
+                               DWORD* disposition);
+
+// The name of the value at an index from 0, in the order in which the values were created. `*nameLength` is
+// the buffer's size in characters, the terminator included, and becomes the name's length without it. The
+// data may be asked for as with RegQueryValueEx, or not (null). ERROR_NO_MORE_ITEMS past the last value,
+// ERROR_MORE_DATA when the name does not fit.
+TESSEL_API LONG RegEnumValueW(HKEY key, DWORD index, wchar_t* name, DWORD* nameLength, DWORD* reserved,
+                              DWORD* type, BYTE* data, DWORD* dataSize);
+
+// Removes a value. ERROR_FILE_NOT_FOUND when there is none.
+TESSEL_API LONG RegDeleteValueW(HKEY key, const wchar_t* name);
+
+TESSEL_API LONG RegCloseKey(HKEY key);
+
+// The host's own value calls. Reading: `*type` is set to the value's type and `*size` (bytes, in: the
+// buffer's, out: the data's with its terminator); ERROR_FILE_NOT_FOUND, or ERROR_MORE_DATA when it does not
+// fit (the buffer is then untouched). An empty name is the key's unnamed value.
+TESSEL_API LONG tsRegGetValue(HKEY key, const wchar_t* name, DWORD reserved, DWORD* type, void* data,
+                              DWORD* size);
+
+// Stores a string value (REG_SZ). A value that exists keeps its place in the order.
+TESSEL_API LONG tsudRegSetString(HKEY key, const wchar_t* name, const wchar_t* data);
