@@ -1,0 +1,42 @@
+#include "host/console/CommandLine.h"
+
+#include <utility>
+#include <vector>
+
+#include <tessel/tsformat.h>
+
+#include "host/Services.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+CommandLine::CommandLine(Sink write) : mWrite(std::move(write))
+{
+}
+
+void CommandLine::print(std::wstring_view text)
+{
+    if (text.empty())
+        return;
+    mWrite(toUtf8(text));
+    mAtLineStart = text.back() == L'\n';
+}
+
+void CommandLine::say(std::wstring_view sentence)
+{
+    if (!mAtLineStart)
+        print(L"\n");
+    print(sentence);
+    print(L"\n");
+}
+} // namespace tessel
+
+int tsutPrintfArguments(const wchar_t* format, const TsFormatArgument* arguments, std::size_t count)
+{
+    const std::size_t length = tsutFormatArguments(nullptr, 0, format, arguments, count);
+    std::vector<wchar_t> text(length + 1);
+    tsutFormatArguments(text.data(), text.size(), format, arguments, count);
+    if (auto* commandLine = tessel::services().commandLine)
+        commandLine->print({text.data(), length});
+    return static_cast<int>(length);
+}
