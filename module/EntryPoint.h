@@ -1,0 +1,25 @@
+// The module's life: what the host calls, and the start-up behind it.
+#pragma once
+
+#include <tessel/tsrx.h>
+
+// Called by the host. Message 1 loads: TSRX_RET_ERROR, with nothing done, when the resource module is missing
+// or the module is loaded already. Message 2 releases the resource module; the lists live on and the command
+// stays, both are the host's to end. Every other message is ignored.
+extern "C" TESSEL_EXPORT int tsrxEntryPoint(unsigned message, void* application);
+
+// Start-up: Startup Suite, History, command, demand-load record.
+void initApp();
+
+// Has nothing to give back; kept as the counterpart that the host's makers ask of every application.
+void unloadApp();
+
+namespace ModrigUtils
+{
+// The handler of the command MODRIG: runs the Load/Unload dialog with the module's texts.
+void ModrigCreate();
+
+// Keeps the host's demand-load record of this module in step with the Startup Suite: the host loads the
+// module at its own start only while there is something to load.
+void updateRegistry();
+} // namespace ModrigUtils

@@ -1,0 +1,44 @@
+#include "module/SplitPath.h"
+
+#include <wincompat/winfile.h>
+
+#include "module/CaseFolding.h"
+
+SplitPath::SplitPath(const CStdStr& path)
+{
+    // A failure has emptied all four, which is what every caller works with.
+    static_cast<void>(_wsplitpath_s(path.c_str(), mDrive, kDriveSize, mFolder, kFolderSize, mName, kNameSize,
+                                    mExtension, kExtensionSize));
+}
+
+CStdStr SplitPath::FileName() const
+{
+    return CStdStr(std::wstring(mName) + mExtension);
+}
+
+bool SplitPath::HasExtension(std::wstring_view extension) const
+{
+    return EqualIgnoringCase(mExtension, extension);
+}
+
+// Name and extension are cut at the last dot in both, so that they are equal together exactly when they are
+// equal one by one; the same goes for drive and folder.
+bool SplitPath::SameFileName(const SplitPath& other) const
+{
+    return EqualIgnoringCase(mName, other.mName) && EqualIgnoringCase(mExtension, other.mExtension);
+}
+
+bool SplitPath::SameFolder(const SplitPath& other) const
+{
+    return EqualIgnoringCase(mDrive, other.mDrive) && EqualIgnoringCase(mFolder, other.mFolder);
+}
+
+std::size_t SplitPath::FileNameHash() const
+{
+    return HashIgnoringCase(mExtension, HashIgnoringCase(mName));
+}
+
+std::size_t SplitPath::PathHash() const
+{
+    return HashIgnoringCase(mFolder, HashIgnoringCase(mDrive, FileNameHash()));
+}
