@@ -1,0 +1,40 @@
+#include "lists/ListMembership.h"
+
+#include "module/Globals.h"
+#include "module/SplitPath.h"
+
+namespace ModrigUtils
+{
+bool FoundinSpecificList(const CStdStr& path, const CStringList& list)
+{
+    return list.HoldsApplication(path);
+}
+
+bool FoundinStartupList(const CStdStr& path)
+{
+    return FoundinSpecificList(path, gStartupList);
+}
+
+bool FoundinHistoryList(const CStdStr& path)
+{
+    return FoundinSpecificList(path, gHistoryList);
+}
+
+bool FoundinLoadedList(const CStdStr& path)
+{
+    return FoundinSpecificList(path, gLoadedAppList);
+}
+
+bool IsALispAppFoundinList(const CStdStr& path)
+{
+    const SplitPath split(path);
+    const bool lisp =
+        split.HasExtension(L".lsp") || split.HasExtension(L".rpk") || split.HasExtension(L".qbc");
+    return lisp && FoundinSpecificList(path, gLoadedAppList);
+}
+
+void RemoveInSpecificList(const CStdStr& path, CStringList& list)
+{
+    list.RemoveFirstNoCase(path);
+}
+} // namespace ModrigUtils
