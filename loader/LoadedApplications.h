@@ -1,0 +1,33 @@
+// The list of loaded applications: rebuilt from the host, asked, and unloaded from.
+#pragma once
+
+#include <vector>
+
+#include "module/CStdStr.h"
+
+namespace ModrigUtils
+{
+// Rebuilds `gLoadedAppList`: macro projects stay, everything else is what the host reports (compiled modules
+// but for this one, then the applications of the current document). In a host without any loaded module the
+// list keeps its macro projects only.
+void PopulateLoadedApps();
+
+// Whether the host has the compiled module loaded (asked by file name). True for files of every other kind. A
+// path without a dot: message 2 and false.
+bool ApplicationIsLoaded(CStdStr path);
+
+// Whether the compiled module may be unloaded. False for files of every other kind. A path without a dot:
+// message 2 and true.
+bool IsAppUnloadAble(CStdStr path);
+
+// An application that the user wants unloaded, and whether it could be unloaded when it was listed.
+struct UnloadCandidate
+{
+    CStdStr path;
+    bool unloadable;
+};
+
+// Unloads every candidate that is unloadable, in order, takes those unloaded out of `gLoadedAppList` and says
+// how many there were. Answers the indexes of the unloaded candidates, ascending.
+std::vector<std::size_t> UnloadApplications(const std::vector<UnloadCandidate>& candidates);
+} // namespace ModrigUtils
