@@ -19,12 +19,15 @@ void CommandLine::print(std::wstring_view text)
     if (text.empty())
         return;
     mWrite(toUtf8(text));
-    mAtLineStart = text.back() == L'\n';
+    const auto lastBreak = text.find_last_of(L"\r\n");
+    if (lastBreak != text.npos)
+        mOpenLine.clear();
+    mOpenLine += text.substr(lastBreak == text.npos ? 0 : lastBreak + 1);
 }
 
 void CommandLine::say(std::wstring_view sentence)
 {
-    if (!mAtLineStart)
+    if (!atLineStart())
         print(L"\n");
     print(sentence);
     print(L"\n");

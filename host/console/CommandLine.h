@@ -23,10 +23,13 @@ public:
     void say(std::wstring_view sentence);
 
     // Whether the next character starts a line.
-    bool atLineStart() const { return mAtLineStart; }
+    bool atLineStart() const { return mOpenLine.empty(); }
+
+    // What stands on the line that is not ended yet: a console must not print its prompt beside it.
+    const std::wstring& openLine() const { return mOpenLine; }
 
 private:
     Sink mWrite;
-    bool mAtLineStart = true;
+    std::wstring mOpenLine;
 };
 } // namespace tessel

@@ -1,0 +1,49 @@
+// The conversation with the user: lines from a terminal, a pipe, a script or the program's arguments.
+#pragma once
+
+#include <filesystem>
+#include <functional>
+#include <iosfwd>
+#include <string>
+#include <string_view>
+
+#include "host/console/CommandLine.h"
+#include "host/console/InputAssembler.h"
+#include "host/console/LineRunner.h"
+
+namespace tessel
+{
+class LineEditor;
+
+// What the host shows when it waits for a command, and when Lisp goes on on the next line.
+inline constexpr wchar_t kPrompt[] = L"Command: ";
+inline constexpr wchar_t kContinuationPrompt[] = L"     ... ";
+
+class Console
+{
+public:
+    // Both are kept for the console's lifetime.
+    Console(CommandLine& commandLine, LineRunner& runner);
+
+    // Talks with the person at the terminal until the session ends: Ctrl-D, or a command. Ctrl-C gives a
+    // fresh prompt, or stops the Lisp that is running.
+    void converse(LineEditor& editor);
+
+    // Runs lines as if typed; each is printed behind the prompt, so that the output is a transcript. A line
+    // that fails does not keep the following ones from running. True when none failed.
+    bool runLines(std::istream& lines);
+    bool runLine(std::string_view line);
+
+    // The same with a file of commands; a file that cannot be read is told in a sentence.
+    bool runScript(const std::filesystem::path& script);
+
+private:
+    const wchar_t* prompt(const InputAssembler& input) const;
+    void makeRoomForPrompt(const wchar_t* prompt);
+    void echo(const InputAssembler& input, const std::wstring& line);
+    bool tellIfUnfinished(const InputAssembler& input);
+
+    CommandLine& mCommandLine;
+    LineRunner& mRunner;
+};
+} // namespace tessel

@@ -1,0 +1,31 @@
+// Makes whole inputs of typed lines: one line for a command, as many as it takes for Lisp.
+#pragma once
+
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace tessel
+{
+// Whether the text begins with a parenthesis, blanks aside: then it is Lisp, not a command.
+bool isLisp(std::wstring_view text);
+
+// Whether Lisp text still has an open parenthesis, string, |symbol| or #| comment |#.
+bool isUnfinishedLisp(std::wstring_view text);
+
+class InputAssembler
+{
+public:
+    // Takes the next line and answers an input that is complete with it. Nothing for a blank line, for a
+    // comment (it begins with a semicolon) and for Lisp that goes on.
+    std::optional<std::wstring> add(std::wstring_view line);
+
+    // Whether Lisp has begun that is not complete yet.
+    bool isOpen() const { return !mText.empty(); }
+
+    void discard() { mText.clear(); }
+
+private:
+    std::wstring mText;
+};
+} // namespace tessel

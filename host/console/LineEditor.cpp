@@ -1,0 +1,121 @@
+#include "host/console/LineEditor.h"
+
+#include <cerrno>
+#include <cstdio>
+
+#include <histedit.h>
+
+#include "host/console/Completion.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr int kHistoryLines = 1000;
+constexpr wchar_t kCompletionFunction[] = L"tessel-complete";
+
+void showCandidates(const std::vector<std::wstring>& candidates)
+{
+    std::fputc('\n', stdout);
+    for (const auto& candidate : candidates)
+        std::fprintf(stdout, "%ls  ", candidate.c_str());
+    std::fputc('\n', stdout);
+    std::fflush(stdout);
+}
+} // namespace
+
+struct LineEditor::Terminal
+{
+    Terminal(const std::filesystem::path& file, Names names);
+    ~Terminal();
+    Terminal(const Terminal&) = delete;
+    Terminal& operator=(const Terminal&) = delete;
+
+    static Terminal& of(EditLine* editor)
+    {
+        void* terminal = nullptr;
+        el_wget(editor, EL_CLIENTDATA, &terminal);
+        return *static_cast<Terminal*>(terminal);
+    }
+    static wchar_t* prompt(EditLine* editor) { return of(editor).promptText.data(); }
+    static unsigned char complete(EditLine* editor, int);
+
+    void remember(const wchar_t* line);
+
+    std::string historyFile;
+    Names commandNames;
+    std::wstring promptText;
+    EditLine* editLine;
+    HistoryW* history;
+    HistEventW event{};
+};
+
+LineEditor::Terminal::Terminal(const std::filesystem::path& file, Names names)
+    : historyFile(file.string()), commandNames(std::move(names)),
+      editLine(el_init("Tessel", stdin, stdout, stderr)), history(history_winit())
+{
+    history_w(history, &event, H_SETSIZE, kHistoryLines);
+    history_w(history, &event, H_SETUNIQUE, 1);
+    history_w(history, &event, H_LOAD, historyFile.c_str()); // the first session has no file yet
+    el_wset(editLine, EL_CLIENTDATA, this);
+    el_wset(editLine, EL_PROMPT, &Terminal::prompt);
+    el_wset(editLine, EL_HIST, history_w, history);
+    el_wset(editLine, EL_EDITOR, L"emacs");
+    el_wset(editLine, EL_ADDFN, kCompletionFunction, L"Complete the name of a command", &Terminal::complete);
+    el_wset(editLine, EL_BIND, L"^I", kCompletionFunction, nullptr);
+}
+
+LineEditor::Terminal::~Terminal()
+{
+    // A history that cannot be stored is no reason to trouble a person who is leaving.
+    history_w(history, &event, H_SAVE, historyFile.c_str());
+    el_end(editLine);
+    history_wend(history);
+}
+
+unsigned char LineEditor::Terminal::complete(EditLine* editor, int)
+{
+    const LineInfoW* line = el_wline(editor);
+    const std::wstring typed(line->buffer, line->cursor);
+    const auto completion = completeCommand(typed, of(editor).commandNames());
+    if (!completion)
+        return CC_REFRESH_BEEP;
+    if (!completion->candidates.empty() && completion->text.size() == typed.size())
+    {
+        showCandidates(completion->candidates);
+        return CC_REDISPLAY;
+    }
+    el_wdeletestr(editor, static_cast<int>(typed.size()));
+    el_winsertstr(editor, completion->text.c_str());
+    return CC_REFRESH;
+}
+
+void LineEditor::Terminal::remember(const wchar_t* line)
+{
+    if (*line != L'\n')
+        history_w(history, &event, H_ENTER, line);
+}
+
+LineEditor::LineEditor(const std::filesystem::path& historyFile, Names names)
+    : mTerminal(std::make_unique<Terminal>(historyFile, std::move(names)))
+{
+}
+
+LineEditor::~LineEditor() = default;
+
+LineEditor::Outcome LineEditor::read(const std::wstring& prompt, std::wstring& line)
+{
+    mTerminal->promptText = prompt;
+    el_resize(mTerminal->editLine); // the window may have changed its size while a command ran
+    int length = 0;
+    errno = 0;
+    const wchar_t* typed = el_wgets(mTerminal->editLine, &length);
+    if (!typed || length <= 0)
+        return errno == EINTR ? Outcome::kInterrupted : Outcome::kEnd;
+    mTerminal->remember(typed);
+    line.assign(typed, static_cast<std::size_t>(length));
+    while (!line.empty() && (line.back() == L'\n' || line.back() == L'\r'))
+        line.pop_back();
+    return Outcome::kLine;
+}
+} // namespace tessel

@@ -1,0 +1,31 @@
+// The help book: HTML pages, one per topic, shown by the user's browser.
+#pragma once
+
+#include <filesystem>
+#include <functional>
+#include <string>
+
+namespace tessel
+{
+class Help
+{
+public:
+    // Shows a page; false when there is nothing to show it with.
+    using Browser = std::function<bool(const std::filesystem::path& page)>;
+
+    // `book`: the folder of the host's own pages.
+    Help(std::filesystem::path book, Browser browser);
+
+    // Shows a topic of the host's book, or of another one when its folder is given; an empty topic is the
+    // first page of the book. Without a browser the page's path is printed. Answers whether the topic exists;
+    // if not, a sentence says so.
+    bool show(const std::wstring& topic, const std::filesystem::path& otherBook = {});
+
+private:
+    std::filesystem::path mBook;
+    Browser mBrowser;
+};
+
+// The browser of the person at the display, if there are both.
+bool openInBrowser(const std::filesystem::path& page);
+} // namespace tessel
