@@ -16,20 +16,18 @@ class CommandStack : public TsEdCommandStack
 {
 public:
     using Arguments = std::vector<std::wstring>;
-    using BuiltIn = std::function<bool(const Arguments&)>; // false: the command failed, and has said why
-
-    // A global and a local name.
-    using Names = std::pair<std::wstring, std::wstring>;
+    using BuiltIn = std::function<bool(const Arguments&)>; // false: it failed, and has said why
+    using Names = std::pair<std::wstring, std::wstring>;   // a global and a local name
 
     struct Description
     {
         std::wstring group;
         std::wstring name;    // what a person types
-        std::wstring usage;   // the arguments, for built-in commands
-        std::wstring summary; // one line, for built-in commands
+        std::wstring usage;   // the arguments, for commands of the host
+        std::wstring summary; // one line, for commands of the host
     };
 
-    // Asked with a command's name when nobody has registered it; true when it has loaded an application that
+    // Asked with the typed name when nobody has registered it; true when it has loaded an application that
     // may have done so.
     using Loader = std::function<bool(const std::wstring& name)>;
 
@@ -42,18 +40,20 @@ public:
     void setLoader(Loader loader);
     void setAfterLine(AfterLine afterLine);
 
-    // A command of the host itself. Its arguments follow on the line.
+    // A command of the host itself: its arguments follow on the line, and no application can remove it.
     void addBuiltIn(const Description& description, BuiltIn handler);
 
+    // The command belongs to the application that is being called.
     int addCommand(const wchar_t* group, const wchar_t* globalName, const wchar_t* localName, int flags,
                    TsEdCommandHandler handler, TsEdUIContext* uiContext, int functionCode, void* resources,
                    TsEdCommand** command) override;
     int removeCommand(const wchar_t* group, const wchar_t* globalName) override;
     int removeGroup(const wchar_t* group) override;
 
-    // Runs one line: a command's name and its arguments (double quotes keep blanks together). A blank line
-    // does nothing. False when the command is unknown or failed; a sentence has then been said. Nothing that
-    // a handler throws comes out of here.
+    // Runs one line: a command's name and its arguments (see `splitLine`). A blank line does nothing. Where
+    // several commands share a name, the one registered first runs, so that nobody can take the host's own
+    // away. False when the command is unknown or failed; a sentence has then been said. Nothing that a
+    // handler throws comes out of here.
     bool run(std::wstring_view line);
 
     // The commands that the application at that path has registered, in the order of registration.
@@ -65,24 +65,23 @@ public:
     // What a person may type now, sorted, in the spelling of registration.
     std::vector<std::wstring> names() const;
 
-    // Every command by group, groups in the order in which they were made.
+    // Every command, group by group, groups in the order in which they were made.
     std::vector<Description> descriptions() const;
 
 private:
-    struct Command;
-    using Commands = std::vector<std::shared_ptr<Command>>;
+    using Command = std::shared_ptr<TsEdCommand>; // shared: a handler may remove the command that runs it
 
-    std::shared_ptr<Command> find(std::wstring_view typedName) const;
-    std::shared_ptr<Command> findOrLoad(const std::wstring& typedName);
-    bool runParts(const Arguments& parts);
-    bool removeIf(const std::function<bool(const Command&)>& goes);
+    Command find(std::wstring_view typedName) const;
+    Command findOrLoad(const std::wstring& typedName) const;
+    bool runParts(const Arguments& parts) const;
+    std::size_t removeIf(const std::function<bool(const TsEdCommand&)>& goes);
 
-    Commands mCommands; // shared: a handler may remove the command that is running
+    std::vector<Command> mCommands;
     Loader mLoader;
     AfterLine mAfterLine;
 };
 
-// The parts of a line: split at blanks, double quotes keep blanks together and are taken away. A quote that
+// The parts of a line: split at blanks; double quotes keep blanks together and are taken away. A quote that
 // is not closed reaches to the end of the line.
 CommandStack::Arguments splitLine(std::wstring_view line);
 } // namespace tessel

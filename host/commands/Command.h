@@ -1,0 +1,23 @@
+// One command of the command stack. The SDK knows it by name only.
+#pragma once
+
+#include <functional>
+#include <string>
+#include <vector>
+
+#include <tessel/tsedcommands.h>
+
+class TsEdCommand
+{
+public:
+    std::wstring group;
+    std::wstring globalName;
+    std::wstring localName;
+    std::wstring owner; // the path of the application that registered it; empty for the host's own
+    TsEdCommandHandler handler = nullptr;
+
+    // The host's own commands have these instead of a handler.
+    std::function<bool(const std::vector<std::wstring>& arguments)> builtIn;
+    std::wstring usage;
+    std::wstring summary;
+};
