@@ -1,0 +1,33 @@
+#include <sys/stat.h>
+#include <unistd.h>
+#include <wincompat/winfile.h>
+
+#include <cwchar>
+#include <filesystem>
+#include <system_error>
+
+#include "host/text/Unicode.h"
+
+DWORD GetFileAttributesW(const wchar_t* path)
+{
+    struct stat status = {};
+    if (!path || !*path || stat(tessel::toUtf8(path).c_str(), &status) != 0)
+        return INVALID_FILE_ATTRIBUTES;
+    DWORD attributes = S_ISDIR(status.st_mode) ? FILE_ATTRIBUTE_DIRECTORY : 0;
+    constexpr mode_t kAnyoneMayWrite = S_IWUSR | S_IWGRP | S_IWOTH;
+    if ((status.st_mode & kAnyoneMayWrite) == 0)
+        attributes |= FILE_ATTRIBUTE_READONLY;
+    return attributes ? attributes : FILE_ATTRIBUTE_NORMAL;
+}
+
+DWORD GetCurrentDirectory(DWORD capacity, wchar_t* buffer)
+{
+    std::error_code failed;
+    const std::wstring folder = tessel::toWide(std::filesystem::current_path(failed).string());
+    if (failed)
+        return 0;
+    if (!buffer || folder.size() + 1 > capacity)
+        return static_cast<DWORD>(folder.size() + 1);
+    std::wmemcpy(buffer, folder.c_str(), folder.size() + 1);
+    return static_cast<DWORD>(folder.size());
+}
