@@ -1,0 +1,24 @@
+#include "tests/support/RecordingDialog.h"
+
+#include "module/DialogBridge.h"
+
+RecordingDialog& recordingDialog()
+{
+    static RecordingDialog dialog;
+    return dialog;
+}
+
+namespace ModrigUtils
+{
+void SetDialogMessage(const CStdStr& text)
+{
+    recordingDialog().messages.push_back(text.Text());
+}
+
+void RunModrigDialog()
+{
+    ++recordingDialog().runs;
+    if (recordingDialog().duringRun)
+        recordingDialog().duringRun();
+}
+} // namespace ModrigUtils

@@ -1,0 +1,56 @@
+// The host application services and the host's remote files, without a network.
+#pragma once
+
+#include <map>
+#include <string>
+#include <vector>
+
+#include <tessel/tshostservices.h>
+#include <tessel/tsinet.h>
+
+class RecordingApplicationServices : public TsDbHostApplicationServices
+{
+public:
+    bool exist = true; // false: `tsdbHostApplicationServices` answers null
+
+    std::wstring registryRoot = L"Software\\Tessel\\R21";
+    std::wstring productName = L"Tessel";
+
+    struct Remote
+    {
+        int status = TS_FETCH_FAILED;
+        std::wstring localPath;
+    };
+    // What fetching a URL answers (exact text); others fail.
+    std::map<std::wstring, Remote> remotes;
+
+    struct Fetch
+    {
+        std::wstring url;
+        bool ignoreCache = false;
+
+        bool operator==(const Fetch&) const = default;
+    };
+    // The fetches and the texts that `isUrl` was asked about, in order.
+    std::vector<Fetch> fetches;
+    mutable std::vector<std::wstring> askedForUrl;
+
+    const wchar_t* productRegistryRoot() const override;
+    const wchar_t* product() const override;
+    bool isUrl(const wchar_t* text) const override; // http:// or https:// and something behind it
+    int fetchRemoteFile(const wchar_t* url, wchar_t* localPath, std::size_t capacity,
+                        bool ignoreCache) override;
+};
+
+class RecordingInternet : public CProxyInet
+{
+public:
+    bool exists = true; // false: `GetProxyInet` answers null
+
+    // The files that are copies of remote ones, and where they came from.
+    std::map<std::wstring, std::wstring> urlsOfLocalFiles;
+    // The paths that were asked about, in order.
+    mutable std::vector<std::wstring> asked;
+
+    bool IsRemoteFile(const wchar_t* localPath, wchar_t* url, std::size_t capacity) const override;
+};

@@ -1,0 +1,110 @@
+#include "tests/support/recording/RecordingCommands.h"
+
+#include <algorithm>
+#include <cwctype>
+
+#include "host/text/Unicode.h"
+#include "tests/support/RecordingHost.h"
+
+namespace
+{
+std::wstring orEmpty(const wchar_t* text)
+{
+    return text ? text : L"";
+}
+
+bool isName(const std::wstring& text)
+{
+    return !text.empty() &&
+           std::none_of(text.begin(), text.end(),
+                        [](wchar_t character) { return std::iswspace(static_cast<wint_t>(character)) != 0; });
+}
+
+bool isCommand(const TsEdCommand& command, const std::wstring& group, const std::wstring& globalName)
+{
+    return tessel::equalIgnoringCase(command.group, group) &&
+           tessel::equalIgnoringCase(command.globalName, globalName);
+}
+} // namespace
+
+bool RecordingCommands::type(const std::wstring& name)
+{
+    const TsEdCommand* found = find(name);
+    if (!found)
+        return false;
+    const TsEdCommandHandler handler = found->handler; // the handler may remove its own command
+    const RecordingCaller caller(found->owner);
+    handler();
+    return true;
+}
+
+void RecordingCommands::removeCommandsOf(const std::wstring& applicationPath)
+{
+    std::erase_if(mCommands, [&](const auto& command) { return command->owner == applicationPath; });
+}
+
+int RecordingCommands::addCommand(const wchar_t* group, const wchar_t* globalName, const wchar_t* localName,
+                                  int flags, TsEdCommandHandler handler, TsEdUIContext* uiContext,
+                                  int functionCode, void* resources, TsEdCommand** command)
+{
+    recordingHost().journal.add(L"addCommand", {group, globalName, localName, flags, functionCode});
+    TsEdCommand asked{.group = orEmpty(group),
+                      .globalName = orEmpty(globalName),
+                      .localName = orEmpty(localName),
+                      .flags = flags,
+                      .handler = handler,
+                      .uiContext = uiContext,
+                      .functionCode = functionCode,
+                      .resources = resources,
+                      .hasResult = command != nullptr,
+                      .owner = recordingHost().loadedModules.applicationName};
+    asked.status = answerToAdd ? *answerToAdd : statusOfAdding(asked);
+    added.push_back(asked);
+    if (answerToAdd || asked.status != TSED_COMMAND_OK)
+        return asked.status;
+    mCommands.push_back(std::make_unique<TsEdCommand>(asked));
+    if (command)
+        *command = mCommands.back().get();
+    return TSED_COMMAND_OK;
+}
+
+int RecordingCommands::removeCommand(const wchar_t* group, const wchar_t* globalName)
+{
+    recordingHost().journal.add(L"removeCommand", {group, globalName});
+    const auto gone = std::erase_if(mCommands, [&](const auto& command)
+                                    { return isCommand(*command, orEmpty(group), orEmpty(globalName)); });
+    return gone > 0 ? TSED_COMMAND_OK : TSED_COMMAND_UNKNOWN;
+}
+
+int RecordingCommands::removeGroup(const wchar_t* group)
+{
+    recordingHost().journal.add(L"removeGroup", {group});
+    const auto gone = std::erase_if(mCommands, [&](const auto& command)
+                                    { return tessel::equalIgnoringCase(command->group, orEmpty(group)); });
+    return gone > 0 ? TSED_COMMAND_OK : TSED_COMMAND_UNKNOWN;
+}
+
+const TsEdCommand* RecordingCommands::find(const std::wstring& typedName) const
+{
+    for (const auto& command : mCommands)
+        if (tessel::equalIgnoringCase(command->localName, typedName) ||
+            tessel::equalIgnoringCase(L"_" + command->globalName, typedName))
+            return command.get();
+    return nullptr;
+}
+
+int RecordingCommands::statusOfAdding(const TsEdCommand& command) const
+{
+    if (!isName(command.group) || !isName(command.globalName) || !isName(command.localName) ||
+        !command.handler)
+        return TSED_COMMAND_INVALID;
+    const bool isTaken = std::any_of(mCommands.begin(), mCommands.end(),
+                                     [&command](const auto& other)
+                                     { return isCommand(*other, command.group, command.globalName); });
+    return isTaken ? TSED_COMMAND_DUPLICATE : TSED_COMMAND_OK;
+}
+
+bool TsEdCommandStack::isKindOf(const wchar_t* className) const
+{
+    return className && std::wstring_view(className) == kClassName;
+}

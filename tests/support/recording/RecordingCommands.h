@@ -1,0 +1,55 @@
+// The command stack: keeps what is added, in order, and runs a command when a test types it.
+#pragma once
+
+#include <memory>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include <tessel/tsedcommands.h>
+
+class TsEdCommand
+{
+public:
+    std::wstring group;
+    std::wstring globalName;
+    std::wstring localName;
+    int flags = 0;
+    TsEdCommandHandler handler = nullptr;
+    TsEdUIContext* uiContext = nullptr;
+    int functionCode = 0;
+    void* resources = nullptr;
+    bool hasResult = false; // whether the caller asked for the new command
+    std::wstring owner;     // the application that was being called
+    int status = TSED_COMMAND_OK;
+};
+
+class RecordingCommands : public TsEdCommandStack
+{
+public:
+    // Every `addCommand`, with all arguments and the status it got.
+    std::vector<TsEdCommand> added;
+
+    // When set, `addCommand` answers this and adds nothing.
+    std::optional<int> answerToAdd;
+
+    // Runs the command of that local name, or of that global name behind a "_", in any case. False when there
+    // is none.
+    bool type(const std::wstring& name);
+    bool has(const std::wstring& localName) const { return find(localName) != nullptr; }
+
+    // The commands that go when their application is unloaded.
+    void removeCommandsOf(const std::wstring& applicationPath);
+
+    int addCommand(const wchar_t* group, const wchar_t* globalName, const wchar_t* localName, int flags,
+                   TsEdCommandHandler handler, TsEdUIContext* uiContext, int functionCode, void* resources,
+                   TsEdCommand** command) override;
+    int removeCommand(const wchar_t* group, const wchar_t* globalName) override;
+    int removeGroup(const wchar_t* group) override;
+
+private:
+    const TsEdCommand* find(const std::wstring& typedName) const;
+    int statusOfAdding(const TsEdCommand& command) const;
+
+    std::vector<std::unique_ptr<TsEdCommand>> mCommands; // those that can be typed now
+};

@@ -1,0 +1,17 @@
+// The current document: a list of names.
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include <tessel/tsdocument.h>
+
+class RecordingDocument : public TsApDocument
+{
+public:
+    bool exists = true; // false: `curDoc` answers null
+    std::vector<std::wstring> applications;
+
+    int loadedApplicationCount() const override;
+    const wchar_t* loadedApplicationName(int index) const override;
+};

@@ -1,0 +1,3 @@
+#include "tests/support/recording/RecordingLisp.h"
+
+const bool recordingHostRemovesTsLisp = RECORDING_HOST_REMOVES_TS_LISP;
