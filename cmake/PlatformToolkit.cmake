@@ -20,6 +20,8 @@ endfunction()
 gnustep_config(--objc-flags objc_flags)
 gnustep_config(--base-libs base_libs)
 gnustep_config(--gui-libs gui_libs)
+# CMake knows no standard flags for GCC's Objective-C++; the toolkit's headers need the GNU dialect.
+list(APPEND objc_flags -std=gnu++20)
 # Optimisation, debugging, warnings and dependency files are CMake's to choose; include folders are the system's,
 # so that our warnings are about our code only.
 list(FILTER objc_flags EXCLUDE REGEX "^(-MMD|-MP|-g|-O[0-9s]|-Wall|-I.*)$")
