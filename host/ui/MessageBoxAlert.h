@@ -1,0 +1,8 @@
+// The host's message box as a window. The host's library loads this one when it first shows a box.
+#pragma once
+
+#include <tessel/tsdefs.h>
+
+// Shows the box and answers the button's code, or 0 when it was not shown: there is no display, or nobody to
+// answer (a script runs and no window of the host is open).
+extern "C" TESSEL_API int tsuiShowMessageBox(const wchar_t* text, unsigned style, void* parent);

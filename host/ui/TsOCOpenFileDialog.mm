@@ -1,0 +1,173 @@
+#import <tesselui/TsOCOpenFileDialog.h>
+
+#import <tesselui/TsOCFileFilter.h>
+
+#include <tesselui/tsuieach.h>
+
+#include "host/ui/platform/Windowing.h"
+
+namespace
+{
+const NSRect kFilterBar = {{0, 0}, {420, 44}};
+const NSRect kFilterLabel = {{16, 14}, {80, 18}};
+const NSRect kFilterChoice = {{100, 10}, {304, 26}};
+
+NSTextField* makeLabel(NSString* text)
+{
+    NSTextField* label = [[[NSTextField alloc] initWithFrame:kFilterLabel] autorelease];
+    [label setStringValue:text];
+    [label setEditable:NO];
+    [label setSelectable:NO];
+    [label setBordered:NO];
+    [label setDrawsBackground:NO];
+    return label;
+}
+} // namespace
+
+// Shows the files of the chosen type: the panel's delegate while it runs.
+@interface TsOCFileTypeChooser : NSObject
+{
+    NSOpenPanel* mPanel;
+    NSArray* mFilters;
+    NSUInteger mChosen;
+}
+- (id)initWithPanel:(NSOpenPanel*)panel filters:(NSArray*)filters;
+- (NSView*)view;
+@end
+
+@implementation TsOCFileTypeChooser
+
+- (id)initWithPanel:(NSOpenPanel*)panel filters:(NSArray*)filters
+{
+    if ((self = [super init]))
+    {
+        mPanel = panel;
+        mFilters = [filters copy];
+    }
+    return self;
+}
+
+- (void)dealloc
+{
+    [mFilters release];
+    [super dealloc];
+}
+
+- (NSView*)view
+{
+    NSPopUpButton* choice = [[[NSPopUpButton alloc] initWithFrame:kFilterChoice pullsDown:NO] autorelease];
+    for (TsOCFileFilter* filter : tsuiEach<TsOCFileFilter*>(mFilters))
+        [choice addItemWithTitle:[filter description]];
+    [choice setTarget:self];
+    [choice setAction:@selector(onChoice:)];
+    [choice setAutoresizingMask:NSViewWidthSizable];
+    NSView* bar = [[[NSView alloc] initWithFrame:kFilterBar] autorelease];
+    [bar addSubview:makeLabel(@"Show:")];
+    [bar addSubview:choice];
+    [bar setAutoresizingMask:NSViewWidthSizable];
+    return bar;
+}
+
+- (void)onChoice:(id)sender
+{
+    mChosen = static_cast<NSUInteger>([sender indexOfSelectedItem]);
+    tessel::windowing::filterAnew(mPanel);
+}
+
+- (BOOL)isFolder:(NSString*)path
+{
+    BOOL folder = NO;
+    return [[NSFileManager defaultManager] fileExistsAtPath:path isDirectory:&folder] && folder;
+}
+
+- (BOOL)panel:(id)sender shouldShowFilename:(NSString*)path
+{
+    (void)sender;
+    for (NSString* extension : tsuiEach<NSString*>([[mFilters objectAtIndex:mChosen] fileExtensions]))
+        if ([[path pathExtension] caseInsensitiveCompare:extension] == NSOrderedSame)
+            return YES;
+    return [self isFolder:path];
+}
+
+@end
+
+@implementation TsOCOpenFileDialog
+
+- (void)dealloc
+{
+    [mTitle release];
+    [mInitialPath release];
+    [mFileFilters release];
+    [mSelectedPathes release];
+    [super dealloc];
+}
+
+- (void)setTitle:(NSString*)title
+{
+    [mTitle autorelease];
+    mTitle = [title copy];
+}
+
+- (void)setInitialPath:(NSString*)path
+{
+    [mInitialPath autorelease];
+    mInitialPath = [path copy];
+}
+
+- (void)setAllowsMultipleSelection:(BOOL)allows
+{
+    mAllowsMultipleSelection = allows;
+}
+
+- (void)setFileFilters:(NSArray*)filters
+{
+    [mFileFilters autorelease];
+    mFileFilters = [filters copy];
+}
+
+- (NSArray*)selectedPathes
+{
+    return mSelectedPathes;
+}
+
+- (void)keepSelectionOf:(NSOpenPanel*)panel
+{
+    NSMutableArray* paths = [NSMutableArray array];
+    for (NSURL* url : tsuiEach<NSURL*>([panel URLs]))
+        [paths addObject:[url path]];
+    [mSelectedPathes autorelease];
+    mSelectedPathes = [paths copy];
+}
+
+- (void)prepare:(NSOpenPanel*)panel
+{
+    if (mTitle)
+        [panel setTitle:mTitle];
+    if (mInitialPath)
+        [panel setDirectoryURL:[NSURL fileURLWithPath:mInitialPath]];
+    [panel setAllowsMultipleSelection:mAllowsMultipleSelection];
+    tessel::windowing::allowFilesOnly(panel);
+}
+
+- (NSInteger)runModal
+{
+    NSOpenPanel* panel = tessel::windowing::makeOpenPanel();
+    [self prepare:panel];
+    TsOCFileTypeChooser* chooser = nil;
+    if ([mFileFilters count])
+    {
+        chooser = [[[TsOCFileTypeChooser alloc] initWithPanel:panel filters:mFileFilters] autorelease];
+        [panel setDelegate:(id)chooser];
+        [panel setAccessoryView:[chooser view]];
+    }
+    const bool chosen = [panel runModal] == NSOKButton;
+    [mSelectedPathes release];
+    mSelectedPathes = [[NSArray alloc] init];
+    if (chosen)
+        [self keepSelectionOf:panel];
+    [panel setDelegate:nil];
+    [panel setAccessoryView:nil];
+    return chosen ? NSOKButton : 0;
+}
+
+@end

@@ -1,0 +1,56 @@
+#import <AppKit/AppKit.h>
+
+#include <tessel/tsformat.h>
+#include <tesselui/tsuidisplay.h>
+
+#include "host/ui/platform/Windowing.h"
+
+namespace
+{
+bool gPrepared = false;
+
+void prepare()
+{
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    tessel::windowing::chooseLook();
+    [NSApplication sharedApplication];
+    tessel::windowing::completeLook();
+    tessel::windowing::acceptFileDrops();
+    // The host's own loop waits for the terminal; these two are what the toolkit's would have done first.
+    [NSApp finishLaunching];
+    [pool drain];
+}
+} // namespace
+
+bool tsuiHasDisplay()
+{
+    return gPrepared || tessel::windowing::displayIsReachable();
+}
+
+bool tsuiPrepareWindows()
+{
+    if (!tsuiHasDisplay())
+    {
+        tsutPrintf(L"Tessel cannot open a window: there is no display.\n");
+        return false;
+    }
+    if (!gPrepared)
+        prepare();
+    gPrepared = true;
+    [NSApp activateIgnoringOtherApps:YES];
+    return true;
+}
+
+void tsuiFinishWindows()
+{
+    if (!gPrepared)
+        return;
+    // Closing a window is only asked of the display; what comes back is taken here, since nobody waits for
+    // it.
+    while (NSEvent* event = [NSApp nextEventMatchingMask:NSAnyEventMask
+                                               untilDate:[NSDate distantPast]
+                                                  inMode:NSDefaultRunLoopMode
+                                                 dequeue:YES])
+        [NSApp sendEvent:event];
+    tessel::windowing::flushScreen();
+}

@@ -1,0 +1,29 @@
+// What the windows of the host need from the platform.
+#pragma once
+
+#import <AppKit/AppKit.h>
+
+namespace tessel::windowing
+{
+// Whether a display answers.
+bool displayIsReachable();
+
+// Before the application object is made: the look that is read once.
+void chooseLook();
+
+// After it is made, before the first window.
+void completeLook();
+void acceptFileDrops();
+
+// Carries out what the screen still has to show.
+void flushScreen();
+
+// A file panel of its own, which disturbs no other one that is open.
+NSOpenPanel* makeOpenPanel();
+
+// Asks the panel's delegate again which files to show.
+void filterAnew(NSOpenPanel* panel);
+
+// The browser of an open panel cannot choose folders where the platform would otherwise offer them.
+void allowFilesOnly(NSOpenPanel* panel);
+} // namespace tessel::windowing

@@ -1,0 +1,46 @@
+#include "host/ui/platform/Windowing.h"
+
+#include <CoreGraphics/CoreGraphics.h>
+
+namespace tessel::windowing
+{
+bool displayIsReachable()
+{
+    // A process outside of a login session has no window server to talk to.
+    NSDictionary* session = [(NSDictionary*)CGSessionCopyCurrentDictionary() autorelease];
+    return session != nil;
+}
+
+// The platform's own look, and its own file drops.
+void chooseLook()
+{
+}
+
+void completeLook()
+{
+    [NSApp setActivationPolicy:NSApplicationActivationPolicyRegular];
+}
+
+void acceptFileDrops()
+{
+}
+
+void flushScreen()
+{
+}
+
+NSOpenPanel* makeOpenPanel()
+{
+    return [NSOpenPanel openPanel];
+}
+
+void filterAnew(NSOpenPanel* panel)
+{
+    [panel validateVisibleColumns];
+}
+
+void allowFilesOnly(NSOpenPanel* panel)
+{
+    [panel setCanChooseDirectories:NO];
+}
+} // namespace tessel::windowing

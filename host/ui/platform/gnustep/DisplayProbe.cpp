@@ -1,0 +1,44 @@
+#include "host/ui/platform/gnustep/DisplayProbe.h"
+
+#include <memory>
+
+#include <X11/Xatom.h>
+#include <X11/Xlib.h>
+
+namespace tessel::windowing
+{
+namespace
+{
+struct CloseDisplay
+{
+    void operator()(Display* display) const { XCloseDisplay(display); }
+};
+using OpenDisplay = std::unique_ptr<Display, CloseDisplay>;
+
+// A window manager that follows the Extended Window Manager Hints puts a window of its own on the root.
+bool hasWindowManager(Display* display)
+{
+    const Atom check = XInternAtom(display, "_NET_SUPPORTING_WM_CHECK", True);
+    if (check == None)
+        return false;
+    Atom type = None;
+    int format = 0;
+    unsigned long count = 0;
+    unsigned long rest = 0;
+    unsigned char* data = nullptr;
+    const int status = XGetWindowProperty(display, DefaultRootWindow(display), check, 0, 1, False, XA_WINDOW,
+                                          &type, &format, &count, &rest, &data);
+    if (data)
+        XFree(data);
+    return status == Success && count == 1;
+}
+} // namespace
+
+DisplayFacts probeDisplay()
+{
+    const OpenDisplay display(XOpenDisplay(nullptr));
+    if (!display)
+        return {};
+    return {.reachable = true, .hasWindowManager = hasWindowManager(display.get())};
+}
+} // namespace tessel::windowing

@@ -1,0 +1,97 @@
+#include "host/ui/platform/Windowing.h"
+
+#include <dlfcn.h>
+
+#include "host/ui/platform/gnustep/DisplayProbe.h"
+
+namespace tessel::windowing
+{
+namespace
+{
+// The host's theme: colours only, in the resources of the host that this library lies in.
+NSString* themePath()
+{
+    Dl_info info;
+    if (!dladdr(reinterpret_cast<const void*>(&themePath), &info) || !info.dli_fname)
+        return nil;
+    NSString* library = [[NSString stringWithUTF8String:info.dli_fname] stringByStandardizingPath];
+    NSString* theme = [[library stringByDeletingLastPathComponent]
+        stringByAppendingPathComponent:@"Resources/Tessel.theme"];
+    return [[NSFileManager defaultManager] fileExistsAtPath:theme] ? theme : nil;
+}
+
+void setDefaults(NSDictionary* defaults)
+{
+    [[NSUserDefaults standardUserDefaults] registerDefaults:defaults];
+}
+} // namespace
+
+bool displayIsReachable()
+{
+    return probeDisplay().reachable;
+}
+
+void chooseLook()
+{
+    NSMutableDictionary* look = [NSMutableDictionary dictionary];
+    [look setObject:@"YES" forKey:@"GSSuppressAppIcon"]; // no tile on the desktop
+    [look setObject:@"NO" forKey:@"GSWorkspaceAppIcon"];
+    [look setObject:@"NSWindows95InterfaceStyle" forKey:@"NSMenuInterfaceStyle"];
+    [look setObject:@"NSMacintoshInterfaceStyle"
+             forKey:@"NSScrollViewInterfaceStyle"]; // scrollers on the right
+    [look setObject:@"NSMacintoshInterfaceStyle" forKey:@"NSBrowserInterfaceStyle"];
+    if (NSString* theme = themePath())
+        [look setObject:theme forKey:@"GSTheme"];
+    // Without a window manager nobody else draws title bars, and the toolkit would wait for what never comes.
+    if (!probeDisplay().hasWindowManager)
+        [look setObject:@"NO" forKey:@"GSBackHandlesWindowDecorations"];
+    setDefaults(look);
+}
+
+void completeLook()
+{
+    NSArray* fonts = [[NSFontManager sharedFontManager] availableFonts];
+    if (![fonts containsObject:@"Inter-Regular"] || ![fonts containsObject:@"Inter-Bold"])
+        return;
+    setDefaults([NSDictionary dictionaryWithObjectsAndKeys:@"Inter-Regular", @"NSFont", @"Inter-Bold",
+                                                           @"NSBoldFont", @"13", @"NSFontSize", nil]);
+}
+
+void flushScreen()
+{
+    [[NSApp context] flushGraphics];
+}
+
+NSOpenPanel* makeOpenPanel()
+{
+    // +openPanel answers one object for the whole program, which may be open already.
+    return [[[NSOpenPanel alloc] init] autorelease];
+}
+
+void allowFilesOnly(NSOpenPanel* panel)
+{
+    [panel setCanChooseDirectories:NO];
+}
+} // namespace tessel::windowing
+
+@interface NSSavePanel (TsBrowser)
+- (void)tsFilterAnew;
+@end
+
+@implementation NSSavePanel (TsBrowser)
+
+// -validateVisibleColumns would empty the columns of the browser.
+- (void)tsFilterAnew
+{
+    NSString* folder = [self directory];
+    [_browser loadColumnZero];
+    [_browser setPath:folder];
+    [_okButton setEnabled:NO];
+}
+
+@end
+
+void tessel::windowing::filterAnew(NSOpenPanel* panel)
+{
+    [panel tsFilterAnew];
+}

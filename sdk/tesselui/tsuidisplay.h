@@ -1,0 +1,17 @@
+// Whether the host can show windows, and getting ready to. An application calls `tsuiPrepareWindows` before
+// it makes its first window of a command; everything else of the toolkit works from then on.
+#pragma once
+
+#include "../tessel/tsdefs.h"
+
+// Whether there is a display that windows can be shown on.
+TESSEL_API bool tsuiHasDisplay();
+
+// Makes the application object of the toolkit, with the host's look, keyboard and file drops from other
+// programs; the first call does the work. False without a display: one sentence on the command line has then
+// said so.
+TESSEL_API bool tsuiPrepareWindows();
+
+// Brings the screen up to date and keeps it so until now. Called when a command has closed its windows: the
+// host goes back to waiting for the terminal, and a window would otherwise stay on the screen.
+TESSEL_API void tsuiFinishWindows();
