@@ -4,14 +4,15 @@
 
 #include <filesystem>
 
+#include "host/text/Unicode.h"
 #include "tests/support/RecordingHost.h"
 
 namespace
 {
-DWORD realAttributes(const std::filesystem::path& path)
+DWORD realAttributes(const std::wstring& path)
 {
     std::error_code error;
-    const auto status = std::filesystem::status(path, error);
+    const auto status = std::filesystem::status(tessel::toUtf8(path), error);
     if (error || !std::filesystem::exists(status))
         return INVALID_FILE_ATTRIBUTES;
     const bool writable =
@@ -42,7 +43,7 @@ DWORD RecordingFiles::attributes(const std::wstring& path) const
 
 std::wstring RecordingFiles::currentFolderNow() const
 {
-    return mReal ? std::filesystem::current_path().wstring() : currentFolder;
+    return mReal ? tessel::toWide(std::filesystem::current_path().string()) : currentFolder;
 }
 
 std::wstring RecordingFiles::search(const std::wstring& name) const

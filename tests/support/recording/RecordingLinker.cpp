@@ -4,7 +4,8 @@
 
 namespace
 {
-int callEntryPoint(const RecordingLinker::EntryPoint& entryPoint, const std::wstring& path, unsigned message,
+// The entry point is a copy: it may give its own path another one.
+int callEntryPoint(RecordingLinker::EntryPoint entryPoint, const std::wstring& path, unsigned message,
                    void* application)
 {
     if (!entryPoint)
