@@ -15,8 +15,8 @@ void MessageBox::setPresenter(Presenter presenter)
 int MessageBox::show(const wchar_t* text, unsigned style, void* parent)
 {
     const std::wstring message = text ? text : L"";
-    if (mPresenter)
-        return mPresenter(message, style, parent);
+    if (const int answer = mPresenter ? mPresenter(message, style, parent) : 0)
+        return answer;
     if (auto* commandLine = services().commandLine)
         commandLine->say(L"Message: " + message);
     return IDOK; // every style begins with the button OK

@@ -11,10 +11,11 @@ namespace tessel
 class MessageBox : public VqHostMessageBox
 {
 public:
-    // Shows a box and answers the button's code. Must not throw.
+    // Shows a box and answers the button's code, or 0 when it cannot. Must not throw.
     using Presenter = std::function<int(const std::wstring& text, unsigned style, void* parent)>;
 
-    // From now on boxes are shown by the presenter; an empty one brings the text back.
+    // From now on boxes are shown by the presenter, and as text where it cannot; an empty one brings the
+    // text back.
     void setPresenter(Presenter presenter);
 
     // As text: "Message: ..." on lines of its own, and the first button counts as chosen.
