@@ -1,0 +1,72 @@
+// The whole host in one object: the composition root. The program Tessel is this and a console; a test starts
+// the same host in its own process:
+//
+//     std::string output;
+//     Host host({.profileFolder = folder / "profile", .output = [&](std::string_view text) { output += text;
+//     }}); ASSERT_TRUE(host.start()); EXPECT_TRUE(host.run(L"VERSION")); host.end();
+//
+// One host at a time in a process, on one thread. The SDK's functions answer for the host that is running.
+#pragma once
+
+#include <filesystem>
+#include <memory>
+#include <string>
+
+#include "host/app/Export.h"
+#include "host/console/CommandLine.h"
+#include "host/console/LineRunner.h"
+
+namespace tessel
+{
+struct HostOptions
+{
+    std::filesystem::path profileFolder; // made when it is missing
+    bool safe = false;                   // load no application by itself
+    CommandLine::Sink output;            // receives everything that the host says
+};
+
+class TESSEL_PROGRAM_API Host : public LineRunner
+{
+public:
+    explicit Host(HostOptions options);
+    ~Host() override; // ends a session that runs
+
+    // Makes the parts and, unless `safe`, loads the applications that are to be loaded at start. False when
+    // the host cannot run at all; a sentence then says why. A registry that cannot be opened or written is
+    // told about and does not keep the host from running.
+    bool start();
+
+    // Runs one line: a command, or Lisp when it begins with a parenthesis. Afterwards the queued Lisp is
+    // evaluated and what the line wrote to the registry is stored.
+    bool run(const std::wstring& input) override;
+
+    // Runs a file of lines as if typed. Scripts may run scripts, to a depth that no sensible one reaches.
+    bool runScript(const std::filesystem::path& script);
+
+    // Unloads every application, stores the registry, and takes the parts down.
+    void end();
+
+    bool isEnding() const override { return mEnding; }
+    void interrupt() noexcept override;
+
+    CommandLine& commandLine() { return mCommandLine; }
+
+    // The names that the Tab key completes.
+    std::vector<std::wstring> commandNames() const;
+
+private:
+    struct Parts;
+
+    bool makeProfileFolder();
+    void makeParts();
+    void publishParts();
+    void addCommands();
+    void finishLine();
+
+    HostOptions mOptions;
+    CommandLine mCommandLine;
+    std::unique_ptr<Parts> mParts;
+    bool mEnding = false;
+    int mScriptDepth = 0;
+};
+} // namespace tessel

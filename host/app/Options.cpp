@@ -1,0 +1,58 @@
+#include "host/app/Options.h"
+
+#include <sstream>
+
+#include <CLI/CLI.hpp>
+
+#include "host/app/Version.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr int kWrongArguments = 2;
+
+constexpr char kAfterword[] =
+    "With --script or -c, Tessel runs the script, then the commands, and ends: with status 0, or with 1 if "
+    "a\n"
+    "command was unknown or failed or a Lisp expression had an error. Otherwise it reads commands from the\n"
+    "terminal, or line by line from a pipe, which is treated like a script. Wrong arguments end with status "
+    "2.";
+
+void declare(CLI::App& app, Options& options)
+{
+    app.footer(kAfterword);
+    app.set_help_flag("--help", "Show this text and end");
+    app.set_version_flag("--version", kVersionLine, "Show the version and end");
+    app.add_option("--profile-dir", options.profileFolder,
+                   "Keep everything in this folder instead of your own")
+        ->type_name("DIR");
+    app.add_option("--script", options.script, "Run the commands in a file")->type_name("FILE");
+    // One argument each, so that a command may begin with a dash and a file name may follow.
+    app.add_option("-c,--command", options.commands, "Run a command or a Lisp expression (may be repeated)")
+        ->type_name("COMMAND")
+        ->expected(1)
+        ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll)
+        ->allow_extra_args(false);
+    app.add_flag("--safe", options.safe, "Start without loading any application");
+}
+} // namespace
+
+ParsedOptions parseOptions(int count, const char* const* arguments)
+{
+    Options options;
+    CLI::App app("Tessel R21, the reference host for Modrig.", "Tessel");
+    declare(app, options);
+    try
+    {
+        app.parse(count, arguments);
+        return {options, {}, 0};
+    }
+    catch (const CLI::ParseError& outcome)
+    {
+        std::ostringstream text;
+        const bool failed = app.exit(outcome, text, text) != 0;
+        return {std::nullopt, text.str(), failed ? kWrongArguments : 0};
+    }
+}
+} // namespace tessel

@@ -1,0 +1,107 @@
+#include "host/app/Program.h"
+
+#include <clocale>
+#include <csignal>
+#include <cstdio>
+#include <cstring>
+#include <iostream>
+#include <string_view>
+
+#include <langinfo.h>
+#include <unistd.h>
+
+#include "host/app/Host.h"
+#include "host/app/Layout.h"
+#include "host/app/Options.h"
+#include "host/app/Version.h"
+#include "host/console/Console.h"
+#include "host/console/InterruptKey.h"
+#include "host/console/LineEditor.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr int kAllWell = 0;
+constexpr int kSomethingFailed = 1;
+
+constexpr char kHistoryFile[] = "history";
+
+// Lines are UTF-8 whatever the locale is called; only the character type is the host's to set.
+void useUtf8()
+{
+    std::setlocale(LC_CTYPE, "");
+    if (std::strcmp(nl_langinfo(CODESET), "UTF-8") != 0 && !std::setlocale(LC_CTYPE, "C.UTF-8"))
+        std::setlocale(LC_CTYPE, "UTF-8");
+}
+
+// A reader that goes away and a file that grows too large are errors of one write, not the end of the host.
+void surviveFailingWrites()
+{
+    std::signal(SIGPIPE, SIG_IGN);
+    std::signal(SIGXFSZ, SIG_IGN);
+}
+
+void writeToStandardOutput(std::string_view text)
+{
+    std::fwrite(text.data(), 1, text.size(), stdout);
+    std::fflush(stdout);
+}
+
+void greet(CommandLine& commandLine)
+{
+    commandLine.say(toWide(kVersionLine) + L". Type HELP for the list of commands, QUIT to leave.");
+}
+
+int runBatch(Host& host, const Options& options)
+{
+    Console console(host.commandLine(), host);
+    bool allWell = options.script.empty() || host.runScript(options.script);
+    for (const auto& command : options.commands)
+        allWell = (host.isEnding() || console.runLine(command)) && allWell;
+    return allWell ? kAllWell : kSomethingFailed;
+}
+
+int converse(Host& host, const std::filesystem::path& profileFolder)
+{
+    LineEditor editor(profileFolder / kHistoryFile, [&host] { return host.commandNames(); });
+    Console(host.commandLine(), host).converse(editor);
+    return kAllWell;
+}
+
+int runSession(Host& host, const Options& options)
+{
+    if (options.isBatch())
+        return runBatch(host, options);
+    if (isatty(STDIN_FILENO))
+        return converse(host, options.profileFolder);
+    return Console(host.commandLine(), host).runLines(std::cin) ? kAllWell : kSomethingFailed;
+}
+
+int runHost(Options options)
+{
+    if (options.profileFolder.empty())
+        options.profileFolder = personalFolder();
+    Host host({options.profileFolder, options.safe, writeToStandardOutput});
+    const InterruptKey interruptKey(host); // applications that load at start may run away too
+    greet(host.commandLine());
+    if (!host.start())
+        return kSomethingFailed;
+    const int status = runSession(host, options);
+    host.end();
+    return status;
+}
+} // namespace
+
+int runProgram(int count, const char* const* arguments)
+{
+    useUtf8();
+    surviveFailingWrites();
+    const auto parsed = parseOptions(count, arguments);
+    if (parsed.options)
+        return runHost(*parsed.options);
+    std::fputs(parsed.text.c_str(), parsed.exitStatus == kAllWell ? stdout : stderr);
+    return parsed.exitStatus;
+}
+} // namespace tessel

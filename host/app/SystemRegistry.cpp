@@ -1,0 +1,34 @@
+// The host's registry of named services.
+#include <string_view>
+
+#include <tessel/tsrx.h>
+
+#include "host/Services.h"
+#include "host/commands/CommandStack.h"
+#include "host/linker/DynamicLinker.h"
+
+namespace tessel
+{
+namespace
+{
+class SystemRegistry : public TsRxSysRegistry
+{
+public:
+    TsRxObject* at(const wchar_t* name) const override
+    {
+        const std::wstring_view wanted = name ? name : L"";
+        if (wanted == TSRX_DYNAMIC_LINKER)
+            return services().linker;
+        if (wanted == TSED_REGISTERED_COMMANDS)
+            return services().commands;
+        return nullptr;
+    }
+};
+} // namespace
+} // namespace tessel
+
+TsRxSysRegistry* tsrxSysRegistry()
+{
+    static tessel::SystemRegistry registry;
+    return &registry;
+}

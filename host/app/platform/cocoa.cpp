@@ -1,0 +1,13 @@
+#include "host/app/platform/DataHome.h"
+
+#include <cstdlib>
+
+namespace tessel
+{
+std::filesystem::path personalDataHome()
+{
+    const char* home = std::getenv("HOME");
+    return home && *home ? std::filesystem::path(home) / "Library/Application Support"
+                         : std::filesystem::path();
+}
+} // namespace tessel

@@ -1,0 +1,16 @@
+#include "host/app/platform/DataHome.h"
+
+#include <cstdlib>
+
+namespace tessel
+{
+// XDG Base Directory Specification: a relative path in the variable is to be ignored.
+std::filesystem::path personalDataHome()
+{
+    const char* dataHome = std::getenv("XDG_DATA_HOME");
+    if (dataHome && std::filesystem::path(dataHome).is_absolute())
+        return dataHome;
+    const char* home = std::getenv("HOME");
+    return home && *home ? std::filesystem::path(home) / ".local/share" : std::filesystem::path();
+}
+} // namespace tessel

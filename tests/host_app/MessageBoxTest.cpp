@@ -1,0 +1,52 @@
+#include <gtest/gtest.h>
+
+#include "host/messagebox/MessageBox.h"
+#include "tests/host_app/HostParts.h"
+
+TEST(MessageBox, IsTextWithTheFirstButtonChosenWithoutADisplay)
+{
+    CapturedOutput output;
+    tessel::MessageBox box;
+    tessel::services().messageBox = &box;
+    output.commandLine().print(L"Loading");
+    EXPECT_EQ(VqHostMessageBox::simple()->show(L"100%s/größe.lsp is missing.", MB_ICONEXCLAMATION, nullptr),
+              IDOK);
+    EXPECT_EQ(output.text(), "Loading\nMessage: 100%s/größe.lsp is missing.\n");
+}
+
+TEST(MessageBox, IsShownByThePresenterWhenThereIsOne)
+{
+    CapturedOutput output;
+    tessel::MessageBox box;
+    std::wstring seen;
+    unsigned seenStyle = 0;
+    box.setPresenter(
+        [&](const std::wstring& text, unsigned style, void*)
+        {
+            seen = text;
+            seenStyle = style;
+            return 7;
+        });
+    EXPECT_EQ(box.show(L"text", 48, nullptr), 7);
+    EXPECT_EQ(seen, L"text");
+    EXPECT_EQ(seenStyle, 48u);
+    EXPECT_EQ(output.text(), "");
+    box.setPresenter({});
+    EXPECT_EQ(box.show(L"text", 48, nullptr), IDOK);
+    EXPECT_EQ(output.text(), "Message: text\n");
+}
+
+TEST(MessageBox, IsTextWhereThePresenterCannotShowIt)
+{
+    CapturedOutput output;
+    tessel::MessageBox box;
+    box.setPresenter([](const std::wstring&, unsigned, void*) { return 0; });
+    EXPECT_EQ(box.show(L"text", MB_OK, nullptr), IDOK);
+    EXPECT_EQ(output.text(), "Message: text\n");
+}
+
+TEST(MessageBox, IsThereEvenWithoutAHost)
+{
+    ASSERT_NE(VqHostMessageBox::simple(), nullptr);
+    EXPECT_EQ(VqHostMessageBox::simple()->show(nullptr, MB_OK, nullptr), IDOK);
+}
