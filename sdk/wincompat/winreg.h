@@ -12,6 +12,10 @@ inline constexpr DWORD KEY_READ = 0x20019;
 inline constexpr DWORD KEY_WRITE = 0x20006;
 inline constexpr DWORD REG_SZ = 1;
 
+// What `RegCreateKeyEx` found.
+inline constexpr DWORD REG_CREATED_NEW_KEY = 1;
+inline constexpr DWORD REG_OPENED_EXISTING_KEY = 2;
+
 // Opens an existing key. ERROR_FILE_NOT_FOUND when there is none. `*result` is closed with `RegCloseKey`.
 TESSEL_API LONG RegOpenKeyExW(HKEY root, const wchar_t* subKey, DWORD reserved, DWORD access, HKEY* result);
 

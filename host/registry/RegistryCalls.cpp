@@ -1,0 +1,131 @@
+// The Windows-style registry calls, on the running host's registry.
+#include <wincompat/winreg.h>
+
+#include <cstring>
+#include <cwchar>
+
+#include "host/Services.h"
+#include "host/registry/Registry.h"
+
+using tessel::Registry;
+
+namespace
+{
+// The registry and the key behind a handle, if both are there.
+struct Target
+{
+    Registry* registry = nullptr;
+    Registry::Key key = Registry::kNoKey;
+
+    explicit operator bool() const { return registry != nullptr; }
+};
+
+Target targetOf(HKEY handle)
+{
+    Registry* registry = tessel::services().registry;
+    const auto key = registry ? registry->keyOf(handle) : std::nullopt;
+    return key ? Target{registry, *key} : Target{};
+}
+
+const wchar_t* orEmpty(const wchar_t* text)
+{
+    return text ? text : L"";
+}
+
+LONG copyData(const std::wstring& data, void* buffer, DWORD* size)
+{
+    const DWORD capacity = *size;
+    *size = static_cast<DWORD>((data.size() + 1) * sizeof(wchar_t));
+    if (!buffer)
+        return ERROR_SUCCESS;
+    if (*size > capacity)
+        return ERROR_MORE_DATA;
+    std::memcpy(buffer, data.c_str(), *size);
+    return ERROR_SUCCESS;
+}
+} // namespace
+
+LONG RegOpenKeyExW(HKEY root, const wchar_t* subKey, DWORD, DWORD, HKEY* result)
+{
+    if (!result)
+        return ERROR_INVALID_PARAMETER;
+    const Target target = targetOf(root);
+    if (!target)
+        return ERROR_INVALID_HANDLE;
+    const Registry::Key key = target.registry->find(orEmpty(subKey), target.key);
+    if (key == Registry::kNoKey)
+        return ERROR_FILE_NOT_FOUND;
+    *result = target.registry->openHandle(key);
+    return ERROR_SUCCESS;
+}
+
+LONG RegCreateKeyEx(HKEY root, const wchar_t* subKey, DWORD, const wchar_t*, DWORD, DWORD, const void*,
+                    HKEY* result, DWORD* disposition)
+{
+    if (!result)
+        return ERROR_INVALID_PARAMETER;
+    const Target target = targetOf(root);
+    if (!target)
+        return ERROR_INVALID_HANDLE;
+    const bool existed =
+        disposition && target.registry->find(orEmpty(subKey), target.key) != Registry::kNoKey;
+    Registry::Key key = Registry::kNoKey;
+    if (const LONG status = target.registry->create(orEmpty(subKey), target.key, key);
+        status != ERROR_SUCCESS)
+        return status;
+    if (disposition)
+        *disposition = existed ? REG_OPENED_EXISTING_KEY : REG_CREATED_NEW_KEY;
+    *result = target.registry->openHandle(key);
+    return ERROR_SUCCESS;
+}
+
+LONG RegEnumValueW(HKEY key, DWORD index, wchar_t* name, DWORD* nameLength, DWORD*, DWORD* type, BYTE* data,
+                   DWORD* dataSize)
+{
+    if (!name || !nameLength)
+        return ERROR_INVALID_PARAMETER;
+    const Target target = targetOf(key);
+    if (!target)
+        return ERROR_INVALID_HANDLE;
+    std::wstring found;
+    if (const LONG status = target.registry->valueName(target.key, index, found); status != ERROR_SUCCESS)
+        return status;
+    if (found.size() + 1 > *nameLength)
+        return ERROR_MORE_DATA;
+    std::wmemcpy(name, found.c_str(), found.size() + 1);
+    *nameLength = static_cast<DWORD>(found.size());
+    return type || dataSize ? tsRegGetValue(key, found.c_str(), 0, type, data, dataSize) : ERROR_SUCCESS;
+}
+
+LONG RegDeleteValueW(HKEY key, const wchar_t* name)
+{
+    const Target target = targetOf(key);
+    return target ? target.registry->removeValue(target.key, orEmpty(name)) : ERROR_INVALID_HANDLE;
+}
+
+LONG RegCloseKey(HKEY key)
+{
+    const Target target = targetOf(key);
+    return target && target.registry->closeHandle(key) ? ERROR_SUCCESS : ERROR_INVALID_HANDLE;
+}
+
+LONG tsRegGetValue(HKEY key, const wchar_t* name, DWORD, DWORD* type, void* data, DWORD* size)
+{
+    const Target target = targetOf(key);
+    if (!target)
+        return ERROR_INVALID_HANDLE;
+    std::wstring found;
+    if (const LONG status = target.registry->readValue(target.key, orEmpty(name), found);
+        status != ERROR_SUCCESS)
+        return status;
+    if (type)
+        *type = REG_SZ;
+    return size ? copyData(found, data, size) : ERROR_SUCCESS;
+}
+
+LONG tsudRegSetString(HKEY key, const wchar_t* name, const wchar_t* data)
+{
+    const Target target = targetOf(key);
+    return target ? target.registry->writeValue(target.key, orEmpty(name), orEmpty(data))
+                  : ERROR_INVALID_HANDLE;
+}

@@ -1,0 +1,71 @@
+// One prepared statement of the store, run and reset. Used by Registry.cpp alone.
+#pragma once
+
+#include <sqlite3.h>
+
+#include <string>
+#include <string_view>
+
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+class Statement
+{
+public:
+    Statement() = default;
+    ~Statement() { sqlite3_finalize(mStatement); }
+    Statement(const Statement&) = delete;
+    Statement& operator=(const Statement&) = delete;
+
+    int prepare(sqlite3* database, const char* sql)
+    {
+        return sqlite3_prepare_v3(database, sql, -1, SQLITE_PREPARE_PERSISTENT, &mStatement, nullptr);
+    }
+
+    Statement& bind(std::int64_t number)
+    {
+        sqlite3_bind_int64(mStatement, ++mBound, number);
+        return *this;
+    }
+    Statement& bind(std::wstring_view text)
+    {
+        const std::string utf8 = toUtf8(text);
+        sqlite3_bind_text(mStatement, ++mBound, utf8.data(), static_cast<int>(utf8.size()), SQLITE_TRANSIENT);
+        return *this;
+    }
+
+    // SQLITE_ROW: a row stands ready. After anything else, or `reset`, the statement can be bound anew.
+    int step()
+    {
+        const int status = sqlite3_step(mStatement);
+        if (status != SQLITE_ROW)
+            reset();
+        return status;
+    }
+    // Runs a statement whose rows do not matter; SQLITE_DONE on success.
+    int run()
+    {
+        const int status = step();
+        reset();
+        return status;
+    }
+    void reset()
+    {
+        sqlite3_reset(mStatement);
+        mBound = 0;
+    }
+
+    std::int64_t number(int column) const { return sqlite3_column_int64(mStatement, column); }
+    std::wstring text(int column) const
+    {
+        const auto* bytes = reinterpret_cast<const char*>(sqlite3_column_text(mStatement, column));
+        const auto size = static_cast<std::size_t>(sqlite3_column_bytes(mStatement, column));
+        return bytes ? toWide({bytes, size}) : std::wstring();
+    }
+
+private:
+    sqlite3_stmt* mStatement = nullptr;
+    int mBound = 0;
+};
+} // namespace tessel
