@@ -1,0 +1,24 @@
+// Finding a file by name along an ordered search path.
+#pragma once
+
+#include <filesystem>
+#include <optional>
+#include <vector>
+
+namespace tessel
+{
+class FileSearch
+{
+public:
+    // `hostFolder` is searched behind the current folder and before those of the variable SEARCHPATH.
+    explicit FileSearch(std::filesystem::path hostFolder);
+
+    // The full path of the first match. A full path is only checked for existence.
+    std::optional<std::filesystem::path> find(const std::filesystem::path& name) const;
+
+private:
+    std::vector<std::filesystem::path> folders() const;
+
+    std::filesystem::path mHostFolder;
+};
+} // namespace tessel

@@ -1,0 +1,50 @@
+#include "host/services/ApplicationServices.h"
+
+#include <algorithm>
+#include <cwchar>
+#include <string_view>
+
+#include "host/Services.h"
+#include "host/remote/RemoteFiles.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+const wchar_t* ApplicationServices::productRegistryRoot() const
+{
+    return L"Software\\Tessel\\R21";
+}
+
+const wchar_t* ApplicationServices::product() const
+{
+    return L"Tessel";
+}
+
+bool ApplicationServices::isUrl(const wchar_t* text) const
+{
+    constexpr std::wstring_view kSchemes[] = {L"http://", L"https://"};
+    const std::wstring_view url = text ? text : L"";
+    return std::any_of(std::begin(kSchemes), std::end(kSchemes),
+                       [url](std::wstring_view scheme) {
+                           return url.size() > scheme.size() &&
+                                  equalIgnoringCase(url.substr(0, scheme.size()), scheme);
+                       });
+}
+
+int ApplicationServices::fetchRemoteFile(const wchar_t* url, wchar_t* localPath, std::size_t capacity,
+                                         bool ignoreCache)
+{
+    if (!services().remote || !isUrl(url) || !localPath)
+        return TS_FETCH_FAILED;
+    const RemoteFiles::Copy copy = services().remote->fetch(url, ignoreCache);
+    if (copy.status == TS_FETCH_FAILED || copy.path.size() + 1 > capacity)
+        return TS_FETCH_FAILED;
+    std::wmemcpy(localPath, copy.path.c_str(), copy.path.size() + 1);
+    return copy.status;
+}
+} // namespace tessel
+
+TsDbHostApplicationServices* tsdbHostApplicationServices()
+{
+    return tessel::services().application;
+}
