@@ -1,0 +1,127 @@
+#include "host/remote/RemoteFiles.h"
+
+#include <tessel/tsdefs.h>
+
+#include <algorithm>
+#include <cstdint>
+#include <cwchar>
+#include <fstream>
+#include <iterator>
+#include <optional>
+#include <system_error>
+
+#include "host/Services.h"
+#include "host/console/CommandLine.h"
+#include "host/remote/Download.h"
+#include "host/text/Unicode.h"
+
+// The cache holds one folder per URL, named by its hash: the copy under the file's own name, so that its
+// extension still tells its kind, and beside it the URL.
+namespace tessel
+{
+namespace
+{
+constexpr const char* kOriginFile = ".url";
+constexpr const char* kUnnamedFile = "download";
+
+// FNV-1a; the URL beside the copy tells two with the same hash apart.
+std::uint64_t hashOf(const std::string& text)
+{
+    std::uint64_t hash = 14695981039346656037ull;
+    for (const char character : text)
+        hash = (hash ^ static_cast<unsigned char>(character)) * 1099511628211ull;
+    return hash;
+}
+
+// The last part of the URL's path, without what cannot be a file's name.
+std::string fileNameOf(const std::string& url)
+{
+    std::string path = url.substr(0, url.find_first_of("?#"));
+    const std::size_t host = path.find("://") + 3;
+    const std::size_t slash = path.rfind('/');
+    std::string name = slash == std::string::npos || slash < host ? "" : path.substr(slash + 1);
+    std::replace(name.begin(), name.end(), '\\', '_');
+    const bool unusable = name.empty() || name == "." || name == ".." || name == kOriginFile;
+    return unusable ? kUnnamedFile : name;
+}
+
+std::string readFile(const std::filesystem::path& file)
+{
+    std::ifstream stream(file, std::ios::binary);
+    return {std::istreambuf_iterator<char>(stream), {}};
+}
+
+bool writeFile(const std::filesystem::path& file, const std::string& text)
+{
+    std::ofstream stream(file, std::ios::binary);
+    stream << text;
+    stream.close();
+    return stream.good();
+}
+
+bool isFile(const std::filesystem::path& file)
+{
+    std::error_code unreachable;
+    return std::filesystem::is_regular_file(file, unreachable);
+}
+
+std::filesystem::path resolved(const std::filesystem::path& path)
+{
+    std::error_code unreachable;
+    return std::filesystem::weakly_canonical(path, unreachable);
+}
+} // namespace
+
+RemoteFiles::RemoteFiles(std::filesystem::path cacheFolder, Limits limits)
+    : mCacheFolder(std::move(cacheFolder)), mLimits(limits)
+{
+}
+
+std::filesystem::path RemoteFiles::folderOf(const std::string& url) const
+{
+    return mCacheFolder / std::to_string(hashOf(url));
+}
+
+RemoteFiles::Copy RemoteFiles::fetch(const std::wstring& url, bool ignoreCache)
+{
+    const std::string address = toUtf8(url);
+    const std::filesystem::path folder = folderOf(address);
+    const std::filesystem::path copy = folder / fileNameOf(address);
+    if (!ignoreCache && isFile(copy) && readFile(folder / kOriginFile) == address)
+        return {TS_FROM_CACHE, toWide(copy.string())};
+    std::error_code failed;
+    const bool isNew = std::filesystem::create_directories(folder, failed);
+    std::string problem = failed ? failed.message() : download(address, copy, mLimits);
+    if (problem.empty() && !writeFile(folder / kOriginFile, address))
+        problem = "the cache " + folder.string() + " cannot be written";
+    if (problem.empty())
+        return {TS_FETCHED, toWide(copy.string())};
+    if (isNew)
+        std::filesystem::remove_all(folder, failed);
+    services().commandLine->say(url + L" could not be fetched: " + toWide(problem) + L".");
+    return {TS_FETCH_FAILED, {}};
+}
+
+bool RemoteFiles::IsRemoteFile(const wchar_t* localPath, wchar_t* url, std::size_t capacity) const
+{
+    const std::filesystem::path file = resolved(toUtf8(localPath ? localPath : L""));
+    const std::filesystem::path folder = file.parent_path();
+    if (folder.parent_path() != resolved(mCacheFolder) || file.filename() == kOriginFile || !isFile(file))
+        return false;
+    const std::wstring origin = toWide(readFile(folder / kOriginFile));
+    if (origin.empty())
+        return false;
+    if (url && capacity > 0)
+    {
+        const std::size_t copied = std::min(origin.size(), capacity - 1);
+        std::wmemcpy(url, origin.data(), copied);
+        url[copied] = L'\0';
+    }
+    return true;
+}
+} // namespace tessel
+
+CProxyInet* CProxyInet::GetProxyInet()
+{
+    return tessel::services().remote;
+}

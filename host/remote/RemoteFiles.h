@@ -1,0 +1,44 @@
+// Remote files: fetched over http and https into a cache that remembers where each local copy came from.
+#pragma once
+
+#include <tessel/tsinet.h>
+
+#include <chrono>
+#include <cstdint>
+#include <filesystem>
+#include <string>
+
+namespace tessel
+{
+class RemoteFiles : public CProxyInet
+{
+public:
+    struct Limits
+    {
+        std::uint64_t bytes = 64u << 20;
+        std::chrono::milliseconds connecting{10'000};
+        std::chrono::milliseconds whole{60'000};
+    };
+
+    struct Copy
+    {
+        int status;        // TS_FETCHED, TS_FROM_CACHE or TS_FETCH_FAILED
+        std::wstring path; // of the local copy
+    };
+
+    // The cache folder is made with the first copy.
+    RemoteFiles(std::filesystem::path cacheFolder, Limits limits);
+
+    // Makes a local copy, or, unless `ignoreCache`, takes an earlier one. A failure leaves nothing behind and
+    // is told in one sentence on the command line.
+    Copy fetch(const std::wstring& url, bool ignoreCache);
+
+    bool IsRemoteFile(const wchar_t* localPath, wchar_t* url, std::size_t capacity) const override;
+
+private:
+    std::filesystem::path folderOf(const std::string& url) const;
+
+    std::filesystem::path mCacheFolder;
+    Limits mLimits;
+};
+} // namespace tessel
