@@ -1,0 +1,130 @@
+#include <gmock/gmock.h>
+
+#include <regex>
+#include <set>
+#include <sstream>
+
+#include "module/Globals.h"
+#include "tests/resources/SourceText.h"
+#include "tests/resources/StringsFile.h"
+#include "tests/support/TemporaryFolder.h"
+#include "types/ApplicationTypes.h"
+
+namespace
+{
+using Table = std::map<std::string, std::string>;
+
+// Every key, in the order of the file types in the panel, and the extensions that each shows.
+const Table kShownExtensions = {
+    {"IDS_MODRIG_TESSEL_APPS", "bundle;zmb;lsp;omp;qbc"},
+    {"IDS_MODRIG_QMB_APPS", "bundle"},
+    {"IDS_MODRIG_ZMB_APPS", "zmb"},
+    {"IDS_MODRIG_LSP_APPS", "lsp"},
+    {"IDS_MODRIG_OMP_APPS", "omp"},
+    {"IDS_MODRIG_QBC_APPS", "qbc"},
+};
+constexpr char kExtensionSuffix[] = "_EXT";
+constexpr char kCloseButton[] = "IDS_MODRIG_CLOSE_BUTTON";
+
+std::set<std::string> everyKey()
+{
+    std::set<std::string> keys = {kCloseButton};
+    for (const auto& [key, extensions] : kShownExtensions)
+        keys.insert({key, key + kExtensionSuffix});
+    return keys;
+}
+
+std::set<std::string> keysOf(const Table& table)
+{
+    std::set<std::string> keys;
+    for (const auto& [key, text] : table)
+        keys.insert(key);
+    return keys;
+}
+
+std::set<std::string> keysIn(const std::string& sources)
+{
+    const std::regex key("IDS_MODRIG_[A-Z_]*[A-Z]");
+    std::set<std::string> keys;
+    for (std::sregex_iterator match(sources.begin(), sources.end(), key), end; match != end; ++match)
+        keys.insert(match->str());
+    return keys;
+}
+
+std::vector<std::string> parts(const std::string& extensions)
+{
+    std::vector<std::string> result;
+    std::istringstream stream(extensions);
+    for (std::string extension; std::getline(stream, extension, ';');)
+        result.push_back(extension);
+    return result;
+}
+
+class LocalizedStrings : public testing::Test
+{
+protected:
+    void SetUp() override
+    {
+        const auto read = readStringsFile(MODRIG_LOCALIZED_STRINGS);
+        ASSERT_TRUE(read.has_value()) << "not a string table: " << MODRIG_LOCALIZED_STRINGS;
+        mTexts = *read;
+    }
+
+    Table mTexts;
+};
+
+TEST_F(LocalizedStrings, HoldTheThirteenKeysAndNoOther)
+{
+    EXPECT_EQ(keysOf(mTexts).size(), 13U);
+    EXPECT_EQ(keysOf(mTexts), everyKey());
+}
+
+TEST_F(LocalizedStrings, HoldEveryKeyThatTheSourcesName)
+{
+    for (const std::string& key : keysIn(moduleSources()))
+        EXPECT_TRUE(mTexts.contains(key)) << key;
+    EXPECT_THAT(keysIn("[TsOCModrigUtil modrigLoadString:@\"IDS_MODRIG_NEW_EXT\"];"),
+                testing::ElementsAre("IDS_MODRIG_NEW_EXT"))
+        << "keys are overlooked";
+}
+
+TEST_F(LocalizedStrings, AreNeverEmptyAndHoldNoPlaceholder)
+{
+    for (const auto& [key, text] : mTexts)
+    {
+        EXPECT_FALSE(text.empty()) << key;
+        EXPECT_EQ(text.find('%'), std::string::npos) << key;
+    }
+}
+
+TEST_F(LocalizedStrings, NameTheExtensionsThatAFilterShowsWithoutDotsOrStars)
+{
+    for (const auto& [key, extensions] : kShownExtensions)
+        EXPECT_EQ(mTexts.at(key + kExtensionSuffix), extensions) << key;
+}
+
+TEST_F(LocalizedStrings, ShowOnlyWhatTheModuleCanLoad)
+{
+    for (const std::string& extension : parts(mTexts.at("IDS_MODRIG_TESSEL_APPS_EXT")))
+    {
+        const int type = ModrigUtils::FileType(CStdStr(std::wstring(extension.begin(), extension.end())));
+        EXPECT_TRUE(type == kCompiledModule || type == kLispFile) << extension;
+    }
+}
+
+TEST_F(LocalizedStrings, DescribeEveryFilterDifferently)
+{
+    std::set<std::string> descriptions;
+    for (const auto& [key, extensions] : kShownExtensions)
+        descriptions.insert(mTexts.at(key));
+    EXPECT_EQ(descriptions.size(), kShownExtensions.size());
+}
+
+TEST(StringsFile, ThatIsBrokenIsNotRead)
+{
+    const TemporaryFolder folder;
+    const auto file = folder.write("Broken.strings", "\"KEY\" = \"a text without an end;\n");
+    EXPECT_FALSE(readStringsFile(file).has_value());
+    EXPECT_FALSE(readStringsFile(folder.path() / "Missing.strings").has_value());
+}
+} // namespace
