@@ -5,12 +5,15 @@
 //     Host host({.profileFolder = folder / "profile", .output = [&](std::string_view text) { output += text;
 //     }}); ASSERT_TRUE(host.start()); EXPECT_TRUE(host.run(L"VERSION")); host.end();
 //
-// One host at a time in a process, on one thread. The SDK's functions answer for the host that is running.
+// One host at a time in a process, and everything on the thread that makes it. The SDK's functions answer for
+// the host that is running.
 #pragma once
 
+#include <atomic>
 #include <filesystem>
 #include <memory>
 #include <string>
+#include <vector>
 
 #include "host/app/Export.h"
 #include "host/console/CommandLine.h"
@@ -18,6 +21,8 @@
 
 namespace tessel
 {
+class LispInterpreter;
+
 struct HostOptions
 {
     std::filesystem::path profileFolder; // made when it is missing
@@ -37,10 +42,10 @@ public:
     bool start();
 
     // Runs one line: a command, or Lisp when it begins with a parenthesis. Afterwards the queued Lisp is
-    // evaluated and what the line wrote to the registry is stored.
+    // evaluated and what the line wrote to the registry is stored; a store that fails makes the line fail.
     bool run(const std::wstring& input) override;
 
-    // Runs a file of lines as if typed. Scripts may run scripts, to a depth that no sensible one reaches.
+    // Runs a file of lines as if typed. Scripts may run scripts, as deep as a sensible one reaches.
     bool runScript(const std::filesystem::path& script);
 
     // Unloads every application, stores the registry, and takes the parts down.
@@ -51,21 +56,23 @@ public:
 
     CommandLine& commandLine() { return mCommandLine; }
 
-    // The names that the Tab key completes.
+    // What the Tab key completes: the commands that are there or that the host knows how to load.
     std::vector<std::wstring> commandNames() const;
 
 private:
     struct Parts;
 
-    bool makeProfileFolder();
-    void makeParts();
-    void publishParts();
+    bool prepareProfileFolder();
+    void makeStore();
+    void makeApplicationParts();
+    void makeUserParts();
     void addCommands();
-    void finishLine();
+    bool finishLine();
 
     HostOptions mOptions;
     CommandLine mCommandLine;
     std::unique_ptr<Parts> mParts;
+    std::atomic<LispInterpreter*> mInterruptible = nullptr; // read by a signal handler
     bool mEnding = false;
     int mScriptDepth = 0;
 };

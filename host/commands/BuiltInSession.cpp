@@ -13,7 +13,7 @@ namespace tessel
 namespace
 {
 constexpr wchar_t kGroup[] = L"Session";
-constexpr std::size_t kUsageColumn = 44;
+constexpr std::size_t kUsageColumn = 50;
 
 void sayCommand(const CommandStack::Description& command)
 {

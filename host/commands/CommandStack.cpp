@@ -157,9 +157,8 @@ bool CommandStack::run(std::wstring_view line)
     if (parts.empty())
         return true;
     const bool done = runParts(parts);
-    if (mAfterLine)
-        mAfterLine();
-    return done;
+    const bool finished = !mAfterLine || mAfterLine();
+    return done && finished;
 }
 
 bool CommandStack::runParts(const Arguments& parts) const

@@ -31,8 +31,8 @@ public:
     // may have done so.
     using Loader = std::function<bool(const std::wstring& name)>;
 
-    // Called at the end of every line that ran, whatever came of it.
-    using AfterLine = std::function<void()>;
+    // Called at the end of every line that ran, whatever came of it; false makes the line one that failed.
+    using AfterLine = std::function<bool()>;
 
     CommandStack();
     ~CommandStack() override;

@@ -9,10 +9,7 @@ namespace tessel
 // The current profile's name; empty when the registry cannot be read.
 std::wstring currentProfile();
 
-// Makes a profile the current one; one that is new begins empty. False when the name is no name of a key or
-// the registry cannot be written; a sentence has then been said.
+// Makes a profile the current one; one that is new begins empty. False when the name cannot be that of a key
+// or the registry cannot be written; a sentence has then been said.
 bool setCurrentProfile(const std::wstring& name);
-
-// Gives a registry that is new a first profile.
-void ensureProfile();
 } // namespace tessel

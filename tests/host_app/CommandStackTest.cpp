@@ -80,7 +80,7 @@ TEST_F(Commands, AreUnknownInOneSentence)
 TEST_F(Commands, ABlankLineIsNoCommand)
 {
     int lines = 0;
-    stack.setAfterLine([&] { ++lines; });
+    stack.setAfterLine([&] { return ++lines > 0; });
     EXPECT_TRUE(stack.run(L" \t "));
     EXPECT_EQ(output.text(), "");
     EXPECT_EQ(lines, 0);
@@ -154,7 +154,7 @@ TEST_F(Commands, EndWithWhatTheyThrow)
     add(kFirst, L"DRAW", L"A", L"BROKEN", [] { throw std::runtime_error("no größe"); });
     add(kFirst, L"DRAW", L"B", L"ODD", [] { throw 42; });
     int lines = 0;
-    stack.setAfterLine([&] { ++lines; });
+    stack.setAfterLine([&] { return ++lines > 0; });
     EXPECT_FALSE(stack.run(L"broken"));
     EXPECT_EQ(output.text(), "The command \"BROKEN\" failed: no größe\n");
     output.clear();
@@ -162,6 +162,14 @@ TEST_F(Commands, EndWithWhatTheyThrow)
     EXPECT_THAT(output.text(), HasSubstr("The command \"ODD\" failed: "));
     EXPECT_EQ(lines, 2);
     EXPECT_EQ(calling.path(), L"");
+}
+
+TEST_F(Commands, FailWhenWhatFollowsTheLineFails)
+{
+    add(kFirst, L"DRAW", L"A", L"A");
+    stack.setAfterLine([] { return false; });
+    EXPECT_FALSE(stack.run(L"A"));
+    EXPECT_EQ(calls, 1);
 }
 
 TEST_F(Commands, OfApplicationsTakeNoArguments)

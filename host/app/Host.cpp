@@ -1,0 +1,207 @@
+#include "host/app/Host.h"
+
+#include <algorithm>
+#include <optional>
+#include <utility>
+
+#include "host/Services.h"
+#include "host/app/Layout.h"
+#include "host/commands/BuiltIn.h"
+#include "host/commands/CommandStack.h"
+#include "host/console/Console.h"
+#include "host/demandload/DemandLoading.h"
+#include "host/documents/Document.h"
+#include "host/filesearch/FileSearch.h"
+#include "host/help/Help.h"
+#include "host/linker/CallingApplication.h"
+#include "host/linker/DynamicLinker.h"
+#include "host/lisp/LispInterpreter.h"
+#include "host/messagebox/WindowBox.h"
+#include "host/registry/ApplicationRecords.h"
+#include "host/registry/Registry.h"
+#include "host/remote/RemoteFiles.h"
+#include "host/resources/ResourceModules.h"
+#include "host/services/ApplicationServices.h"
+#include "host/sysvars/SystemVariables.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr char kRegistryFile[] = "registry.db";
+constexpr char kRemoteFilesFolder[] = "remote-files";
+constexpr int kDeepestScript = 16;
+
+std::wstring wideText(const std::filesystem::path& path)
+{
+    return toWide(path.string());
+}
+} // namespace
+
+// Taken down in the reverse order: what comes later may use what comes before.
+struct Host::Parts
+{
+    Layout layout = runningLayout();
+    ApplicationServices application;
+    std::optional<Registry> registry;
+    std::optional<SystemVariables> variables;
+    CallingApplication callingApplication;
+    CommandStack commands;
+    std::optional<ResourceModules> resources;
+    DynamicLinker linker;
+    std::optional<DemandLoading> demandLoading;
+    std::optional<FileSearch> files;
+    std::optional<RemoteFiles> remote;
+    Document document;
+    MessageBox messageBox;
+    std::optional<Help> help;
+    std::optional<LispInterpreter> lisp;
+};
+
+Host::Host(HostOptions options) : mOptions(std::move(options)), mCommandLine(mOptions.output)
+{
+}
+
+Host::~Host()
+{
+    end();
+}
+
+bool Host::start()
+{
+    if (services().commandLine || !prepareProfileFolder())
+        return false;
+    services().commandLine = &mCommandLine;
+    mParts = std::make_unique<Parts>();
+    makeStore();
+    makeApplicationParts();
+    makeUserParts();
+    addCommands();
+    if (!mOptions.safe)
+        mParts->demandLoading->loadAtStart();
+    finishLine();
+    return true;
+}
+
+bool Host::prepareProfileFolder()
+{
+    std::error_code error;
+    if (mOptions.profileFolder.empty())
+        mCommandLine.say(
+            L"Tessel does not know where to keep its profile: HOME is not set, and no folder was given.");
+    else if (std::filesystem::create_directories(mOptions.profileFolder, error); error)
+        mCommandLine.say(L"The profile folder " + wideText(mOptions.profileFolder) + L" cannot be made: " +
+                         toWide(error.message()) + L".");
+    else
+        mOptions.profileFolder = std::filesystem::canonical(mOptions.profileFolder, error);
+    return !mOptions.profileFolder.empty() && !error;
+}
+
+// What is stored, and what is read from it before any application can ask.
+void Host::makeStore()
+{
+    services().application = &mParts->application;
+    services().registry = &mParts->registry.emplace(mOptions.profileFolder / kRegistryFile);
+    if (const std::wstring& problem = mParts->registry->problem(); !problem.empty())
+        mCommandLine.say(problem);
+    ensureCurrentProfile(*mParts->registry, mParts->application.productRegistryRoot());
+    services().variables = &mParts->variables.emplace();
+    services().removingTsLisp = mParts->variables->number(kRemovingTsLisp) != 0;
+}
+
+void Host::makeApplicationParts()
+{
+    services().callingApplication = &mParts->callingApplication;
+    services().commands = &mParts->commands;
+    services().resources = &mParts->resources.emplace(wideText(mParts->layout.resources));
+    services().linker = &mParts->linker;
+    services().document = &mParts->document;
+    services().files = &mParts->files.emplace(mParts->layout.resources);
+    services().remote =
+        &mParts->remote.emplace(mOptions.profileFolder / kRemoteFilesFolder, RemoteFiles::Limits());
+    services().lisp = &mParts->lisp.emplace();
+    mInterruptible = services().lisp;
+    mParts->demandLoading.emplace(mParts->layout.plugIns);
+}
+
+void Host::makeUserParts()
+{
+    mParts->messageBox.setPresenter(windowBoxes(mParts->layout.binaries));
+    services().messageBox = &mParts->messageBox;
+    services().help = &mParts->help.emplace(mParts->layout.resources / "help", openInBrowser);
+}
+
+void Host::addCommands()
+{
+    CommandStack& commands = mParts->commands;
+    addSessionCommands(commands, {[this] { mEnding = true; },
+                                  [this](const std::filesystem::path& script)
+                                  {
+                                      return runScript(script);
+                                  }});
+    addApplicationCommands(commands);
+    addSettingCommands(commands);
+    addRegistryCommands(commands);
+    commands.setLoader([this](const std::wstring& name)
+                       { return mParts->demandLoading->loadForCommand(name); });
+    commands.setAfterLine([this] { return finishLine(); });
+}
+
+bool Host::run(const std::wstring& input)
+{
+    if (!isLisp(input))
+        return mParts->commands.run(input);
+    const bool evaluated = mParts->lisp->evaluateLine(input);
+    return finishLine() && evaluated;
+}
+
+bool Host::finishLine()
+{
+    mParts->lisp->runQueue();
+    return mParts->registry->endOfCommand();
+}
+
+bool Host::runScript(const std::filesystem::path& script)
+{
+    if (mScriptDepth == kDeepestScript)
+    {
+        mCommandLine.say(L"The script " + wideText(script) +
+                         L" is not run: it seems to be a script that runs itself.");
+        return false;
+    }
+    ++mScriptDepth;
+    const bool allWell = Console(mCommandLine, *this).runScript(script);
+    --mScriptDepth;
+    return allWell;
+}
+
+void Host::end()
+{
+    if (!mParts)
+        return;
+    mParts->linker.unloadAll();
+    mParts->registry->endOfCommand();
+    mInterruptible = nullptr;
+    mParts.reset();
+    services() = {};
+}
+
+void Host::interrupt() noexcept
+{
+    if (LispInterpreter* lisp = mInterruptible)
+        lisp->interrupt();
+}
+
+std::vector<std::wstring> Host::commandNames() const
+{
+    std::vector<std::wstring> names = mParts->commands.names();
+    for (const auto& record : allApplicationRecords())
+        for (const auto& command : record.commands)
+            names.push_back(command.second);
+    std::ranges::sort(names);
+    const auto repeated = std::ranges::unique(names);
+    names.erase(repeated.begin(), repeated.end());
+    return names;
+}
+} // namespace tessel
