@@ -1,0 +1,252 @@
+// The History in the registry, against the same registry calls made bare; looking an application up; memory.
+#include <benchmark/benchmark.h>
+#include <malloc.h>
+#include <wincompat/winreg.h>
+
+#include <cwchar>
+#include <string>
+#include <vector>
+
+#include "bench/Child.h"
+#include "bench/Ratios.h"
+#include "bench/Session.h"
+#include "lists/History.h"
+#include "lists/ListMembership.h"
+#include "lists/ProfileRegistry.h"
+#include "module/Globals.h"
+
+namespace
+{
+constexpr std::size_t kFew = 1'000;
+constexpr std::size_t kMany = 100'000;
+constexpr int kRepetitions = 7;
+constexpr int kFewRepetitions = 31; // short ones are noisy
+constexpr DWORD kBufferCharacters = 1024;
+
+std::wstring pathOf(std::size_t number)
+{
+    return L"/home/user/Applications/library" + std::to_wstring(number / 100) + L"/tool" +
+           std::to_wstring(number) + L".lsp";
+}
+
+void fill(CStringList& list, std::size_t count)
+{
+    list.RemoveAll();
+    for (std::size_t i = 0; i < count; ++i)
+        list.AddTail(pathOf(i));
+}
+
+std::wstring historyKey()
+{
+    return ModrigUtils::GetModrigProfileRegKey().Text() + L"\\History";
+}
+
+std::wstring entryName(std::size_t index)
+{
+    return std::to_wstring(index) + L"History";
+}
+
+bool bareRead(const std::wstring& key, const std::wstring& name, std::wstring& data)
+{
+    HKEY handle = nullptr;
+    if (RegOpenKeyExW(HKEY_CURRENT_USER, key.c_str(), 0, KEY_READ, &handle) != ERROR_SUCCESS)
+        return false;
+    wchar_t buffer[kBufferCharacters] = {};
+    DWORD type = REG_SZ;
+    DWORD size = sizeof buffer;
+    const bool read = tsRegGetValue(handle, name.c_str(), 0, &type, buffer, &size) == ERROR_SUCCESS;
+    RegCloseKey(handle);
+    data = buffer;
+    return read;
+}
+
+HKEY bareCreate(const std::wstring& key)
+{
+    HKEY handle = nullptr;
+    RegCreateKeyEx(HKEY_CURRENT_USER, key.c_str(), 0, nullptr, 0, KEY_WRITE, nullptr, &handle, nullptr);
+    return handle;
+}
+
+void bareWrite(const std::wstring& key, const std::wstring& name, const std::wstring& data)
+{
+    const HKEY handle = bareCreate(key);
+    tsudRegSetString(handle, name.c_str(), data.c_str());
+    RegCloseKey(handle);
+}
+
+std::vector<std::wstring> bareNames(const std::wstring& key)
+{
+    std::vector<std::wstring> names;
+    HKEY handle = nullptr;
+    RegOpenKeyExW(HKEY_CURRENT_USER, key.c_str(), 0, KEY_READ, &handle);
+    wchar_t name[kBufferCharacters] = {};
+    for (DWORD index = 0;; ++index)
+    {
+        DWORD length = kBufferCharacters;
+        if (RegEnumValueW(handle, index, name, &length, nullptr, nullptr, nullptr, nullptr) != ERROR_SUCCESS)
+            break;
+        names.emplace_back(name);
+    }
+    RegCloseKey(handle);
+    return names;
+}
+
+void bareReadAll(std::size_t count)
+{
+    const std::wstring key = historyKey();
+    std::wstring data;
+    for (std::size_t i = 1; i <= count; ++i)
+        benchmark::DoNotOptimize(bareRead(key, entryName(i), data));
+}
+
+// The calls that storing a list makes, and nothing between them.
+void bareWriteAll(const std::vector<std::wstring>& paths)
+{
+    const std::wstring key = historyKey();
+    for (const std::wstring& name : bareNames(key))
+    {
+        const HKEY handle = bareCreate(key);
+        RegDeleteValueW(handle, name.c_str());
+        RegCloseKey(handle);
+    }
+    bareWrite(key, L"NumHistory", std::to_wstring(paths.size()));
+    for (std::size_t i = 0; i < paths.size(); ++i)
+        bareWrite(key, entryName(i + 1), paths[i]);
+}
+
+std::vector<std::wstring> pathsUpTo(std::size_t count)
+{
+    std::vector<std::wstring> paths;
+    for (std::size_t i = 0; i < count; ++i)
+        paths.push_back(pathOf(i));
+    return paths;
+}
+
+void store(std::size_t count)
+{
+    fill(gHistoryList, count);
+    ModrigUtils::WriteHistoryFilesToRegistry();
+    bench::endCommand();
+}
+
+// `prepare` is not timed.
+void measure(const std::string& name, int repetitions, std::function<void()> prepare,
+             std::function<void()> work)
+{
+    benchmark::RegisterBenchmark(
+        name.c_str(),
+        [prepare = std::move(prepare), work = std::move(work)](benchmark::State& state)
+        {
+            for (auto iteration : state)
+            {
+                static_cast<void>(iteration);
+                prepare();
+                state.SetIterationTime(bench::secondsOf(work));
+            }
+        })
+        ->UseManualTime()
+        ->Iterations(1)
+        ->Repetitions(repetitions);
+}
+
+void addHistory(std::size_t count, int repetitions)
+{
+    const std::string of = " " + std::to_string(count) + " of History";
+    const std::vector<std::wstring> paths = pathsUpTo(count);
+    measure(
+        "read" + of, repetitions, [count] { store(count); }, ModrigUtils::InitializeHistoryFiles);
+    measure(
+        "read" + of + ", bare calls", repetitions, [count] { store(count); },
+        [count] { bareReadAll(count); });
+    measure(
+        "write" + of, repetitions, [count] { store(count); }, ModrigUtils::WriteHistoryFilesToRegistry);
+    measure(
+        "write" + of + ", bare calls", repetitions, [count] { store(count); },
+        [paths] { bareWriteAll(paths); });
+}
+
+void addHistoryRatios(const std::string& verb)
+{
+    const std::string many = verb + " " + std::to_string(kMany) + " of History";
+    const std::string few = verb + " " + std::to_string(kFew) + " of History";
+    bench::addRatio({many + " / bare registry calls", many, many + ", bare calls", 2});
+    bench::addRatio({verb + " History, cost per entry at 100000 / at 1000", many, few, 1.5, kMany, kFew});
+}
+
+// Looks a thousand paths up; every second time they differ in case from those in the list.
+void addLookup(const std::string& name, std::size_t count, std::size_t firstAsked)
+{
+    auto list = std::make_shared<CStringList>();
+    fill(*list, count);
+    std::vector<CStdStr> asked;
+    for (std::size_t i = 0; i < kFew; ++i)
+        asked.emplace_back(pathOf(firstAsked + i * (count / kFew)));
+    benchmark::RegisterBenchmark(name.c_str(),
+                                 [list, asked](benchmark::State& state)
+                                 {
+                                     std::size_t next = 0;
+                                     for (auto iteration : state)
+                                     {
+                                         static_cast<void>(iteration);
+                                         benchmark::DoNotOptimize(ModrigUtils::FoundinSpecificList(
+                                             asked[next++ % asked.size()], *list));
+                                     }
+                                 })
+        ->Repetitions(kRepetitions)
+        ->MinTime(0.05);
+}
+
+void addLookups()
+{
+    for (const std::size_t count : {kFew, kMany})
+    {
+        const std::string size = std::to_string(count);
+        addLookup("look up, hit, list of " + size, count, 0);
+        addLookup("look up, miss, list of " + size, count, count);
+    }
+    benchmark::RegisterBenchmark("two microseconds",
+                                 [](benchmark::State& state)
+                                 {
+                                     for (auto iteration : state)
+                                     {
+                                         static_cast<void>(iteration);
+                                         state.SetIterationTime(2e-6);
+                                     }
+                                 })
+        ->UseManualTime()
+        ->Iterations(1);
+    for (const std::string kind : {"hit", "miss"})
+    {
+        const std::string many = "look up, " + kind + ", list of 100000";
+        bench::addRatio({many + " / 2 microseconds", many, "two microseconds", 1});
+        bench::addRatio(
+            {"look up, " + kind + ", at 100000 / at 1000", many, "look up, " + kind + ", list of 1000"});
+    }
+}
+
+// Bytes that the allocator has handed out for a list of entries, against the bytes of their paths.
+void addMemory()
+{
+    std::size_t pathBytes = 0;
+    for (std::size_t i = 0; i < kMany; ++i)
+        pathBytes += pathOf(i).size() * sizeof(wchar_t);
+    CStringList list;
+    const struct mallinfo2 before = mallinfo2();
+    fill(list, kMany);
+    const struct mallinfo2 after = mallinfo2();
+    const auto bytes = static_cast<double>(after.uordblks + after.hblkhd - before.uordblks - before.hblkhd);
+    bench::addFigure("memory of a list entry / bytes of its path", bytes / static_cast<double>(pathBytes),
+                     "x", 3);
+}
+} // namespace
+
+void addListBenchmarks()
+{
+    bench::startHost();
+    addHistory(kFew, kFewRepetitions);
+    addHistory(kMany, kRepetitions);
+    addHistoryRatios("read");
+    addHistoryRatios("write");
+    addLookups();
+    addMemory();
+}
