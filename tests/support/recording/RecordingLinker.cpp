@@ -151,7 +151,14 @@ std::wstring RecordingLinker::load(Application& wanted)
 {
     if (!wanted.whyItDoesNotLoad.empty())
         return wanted.whyItDoesNotLoad;
-    if (callEntryPoint(wanted.entryPoint, wanted.path, TSRX_MSG_LOAD, &wanted) != TSRX_RET_OK)
+    if (!mLoadsAnything && !wanted.entryPoint)
+        return L"there is no such file";
+    if (wanted.loading)
+        return L"its load message is still running";
+    wanted.loading = true;
+    const int answer = callEntryPoint(wanted.entryPoint, wanted.path, TSRX_MSG_LOAD, &wanted);
+    wanted.loading = false;
+    if (answer != TSRX_RET_OK)
     {
         forget(wanted);
         return L"its entry point answered an error";

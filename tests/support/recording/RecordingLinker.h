@@ -38,6 +38,8 @@ public:
     void refuseToLoad(const std::wstring& path, const std::wstring& reason = L"there is no such file");
     void refuseToUnload(const std::wstring& path, const std::wstring& reason = L"it stays mapped");
     void allow(const std::wstring& path);
+    // From now on only paths that were given an entry point load; of the others there is no such file.
+    void loadOnlyKnown() { mLoadsAnything = false; }
     // Called with message 1 during a load and message 2 during an unload, as a real entry point is; while it
     // runs, `tsedGetAppName` answers the path. It may lock its path, load others, or print.
     void setEntryPoint(const std::wstring& path, EntryPoint entryPoint);
@@ -62,6 +64,7 @@ private:
         EntryPoint entryPoint;
         std::wstring whyItDoesNotLoad;
         std::wstring whyItDoesNotUnload;
+        bool loading = false; // its load message is running
         bool loaded = false;
         bool locked = false;
     };
@@ -75,4 +78,5 @@ private:
     std::wstring unload(Application& application);
 
     std::map<std::wstring, Application> mApplications;
+    bool mLoadsAnything = true;
 };

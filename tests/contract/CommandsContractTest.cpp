@@ -1,0 +1,134 @@
+#include <tessel/tsedcommands.h>
+
+#include "tests/contract/ContractTest.h"
+
+namespace
+{
+int timesRun = 0;
+
+void count()
+{
+    ++timesRun;
+}
+
+class CommandsContract : public ContractTest
+{
+protected:
+    CommandsContract() { timesRun = 0; }
+
+    int add(const wchar_t* group, const wchar_t* globalName, const wchar_t* localName) const
+    {
+        return commands->addCommand(group, globalName, localName, 0, count);
+    }
+
+    int runsOf(const std::wstring& typed) const
+    {
+        const int before = timesRun;
+        const bool known = host->type(typed);
+        EXPECT_EQ(known, timesRun > before);
+        return timesRun - before;
+    }
+
+    TsEdCommandStack* commands = TsEdCommandStack::cast(tsrxSysRegistry()->at(TSED_REGISTERED_COMMANDS));
+};
+
+TEST_F(CommandsContract, RunsACommandByItsLocalName)
+{
+    EXPECT_EQ(add(L"CONTRACT", L"CONTRACTONE", L"CONTRACTEINS"), TSED_COMMAND_OK);
+    EXPECT_EQ(runsOf(L"CONTRACTEINS"), 1);
+    EXPECT_EQ(runsOf(L"contracteins"), 1);
+}
+
+TEST_F(CommandsContract, RunsACommandByItsGlobalNameBehindAnUnderscore)
+{
+    EXPECT_EQ(add(L"CONTRACT", L"CONTRACTONE", L"CONTRACTEINS"), TSED_COMMAND_OK);
+    EXPECT_EQ(runsOf(L"_CONTRACTONE"), 1);
+    EXPECT_EQ(runsOf(L"_contractone"), 1);
+    EXPECT_EQ(runsOf(L"CONTRACTONE"), 0);
+    EXPECT_EQ(runsOf(L"_CONTRACTEINS"), 0);
+}
+
+TEST_F(CommandsContract, KnowsNoCommandThatNobodyAdded)
+{
+    EXPECT_EQ(runsOf(L"CONTRACTNONE"), 0);
+}
+
+TEST_F(CommandsContract, RefusesASecondCommandOfAGroupAndGlobalName)
+{
+    EXPECT_EQ(add(L"CONTRACT", L"CONTRACTONE", L"CONTRACTONE"), TSED_COMMAND_OK);
+    EXPECT_EQ(add(L"CONTRACT", L"CONTRACTONE", L"CONTRACTTWO"), TSED_COMMAND_DUPLICATE);
+    EXPECT_EQ(add(L"Contract", L"ContractOne", L"CONTRACTTWO"), TSED_COMMAND_DUPLICATE);
+    EXPECT_EQ(runsOf(L"CONTRACTTWO"), 0);
+    EXPECT_EQ(add(L"OTHER", L"CONTRACTONE", L"CONTRACTTWO"), TSED_COMMAND_OK);
+}
+
+TEST_F(CommandsContract, RefusesNamesThatCannotBeTyped)
+{
+    EXPECT_EQ(add(L"", L"CONTRACTONE", L"CONTRACTONE"), TSED_COMMAND_INVALID);
+    EXPECT_EQ(add(L"CONTRACT", L"", L"CONTRACTONE"), TSED_COMMAND_INVALID);
+    EXPECT_EQ(add(L"CONTRACT", L"CONTRACTONE", L""), TSED_COMMAND_INVALID);
+    EXPECT_EQ(add(L"CONTRACT", L"CONTRACT ONE", L"CONTRACTONE"), TSED_COMMAND_INVALID);
+    EXPECT_EQ(add(L"CONTRACT", L"CONTRACTONE", L"CONTRACT\tONE"), TSED_COMMAND_INVALID);
+    EXPECT_EQ(runsOf(L"CONTRACTONE"), 0);
+}
+
+TEST_F(CommandsContract, RefusesACommandWithoutAHandler)
+{
+    EXPECT_EQ(commands->addCommand(L"CONTRACT", L"CONTRACTONE", L"CONTRACTONE", 0, nullptr),
+              TSED_COMMAND_INVALID);
+    EXPECT_FALSE(host->type(L"CONTRACTONE"));
+}
+
+TEST_F(CommandsContract, HandsOutTheNewCommand)
+{
+    TsEdCommand* made = nullptr;
+    EXPECT_EQ(commands->addCommand(L"CONTRACT", L"CONTRACTONE", L"CONTRACTONE", 0, count, nullptr, -1,
+                                   nullptr, &made),
+              TSED_COMMAND_OK);
+    EXPECT_NE(made, nullptr);
+}
+
+TEST_F(CommandsContract, CopiesTheNames)
+{
+    std::wstring name = L"CONTRACTONE";
+    EXPECT_EQ(add(L"CONTRACT", name.c_str(), name.c_str()), TSED_COMMAND_OK);
+    name = L"CONTRACTTWO";
+    EXPECT_EQ(runsOf(L"CONTRACTONE"), 1);
+}
+
+TEST_F(CommandsContract, RemovesACommandOnce)
+{
+    add(L"CONTRACT", L"CONTRACTONE", L"CONTRACTONE");
+    add(L"CONTRACT", L"CONTRACTTWO", L"CONTRACTTWO");
+    EXPECT_EQ(commands->removeCommand(L"OTHER", L"CONTRACTONE"), TSED_COMMAND_UNKNOWN);
+    EXPECT_EQ(commands->removeCommand(L"contract", L"contractone"), TSED_COMMAND_OK);
+    EXPECT_EQ(commands->removeCommand(L"CONTRACT", L"CONTRACTONE"), TSED_COMMAND_UNKNOWN);
+    EXPECT_EQ(runsOf(L"CONTRACTONE"), 0);
+    EXPECT_EQ(runsOf(L"CONTRACTTWO"), 1);
+}
+
+TEST_F(CommandsContract, RemovesAGroupWhole)
+{
+    add(L"CONTRACT", L"CONTRACTONE", L"CONTRACTONE");
+    add(L"CONTRACT", L"CONTRACTTWO", L"CONTRACTTWO");
+    add(L"OTHER", L"CONTRACTTHREE", L"CONTRACTTHREE");
+    EXPECT_EQ(commands->removeGroup(L"contract"), TSED_COMMAND_OK);
+    EXPECT_EQ(commands->removeGroup(L"CONTRACT"), TSED_COMMAND_UNKNOWN);
+    EXPECT_EQ(runsOf(L"CONTRACTONE"), 0);
+    EXPECT_EQ(runsOf(L"CONTRACTTWO"), 0);
+    EXPECT_EQ(runsOf(L"CONTRACTTHREE"), 1);
+}
+
+TEST_F(CommandsContract, LetsACommandRemoveItself)
+{
+    commands->addCommand(L"CONTRACT", L"CONTRACTONE", L"CONTRACTONE", 0,
+                         []
+                         {
+                             count();
+                             TsEdCommandStack::cast(tsrxSysRegistry()->at(TSED_REGISTERED_COMMANDS))
+                                 ->removeCommand(L"CONTRACT", L"CONTRACTONE");
+                         });
+    EXPECT_EQ(runsOf(L"CONTRACTONE"), 1);
+    EXPECT_EQ(runsOf(L"CONTRACTONE"), 0);
+}
+} // namespace

@@ -1,0 +1,175 @@
+// The reference host, in this process, with its profile and the test's files in a throwaway folder.
+#include <cstdlib>
+#include <stdexcept>
+
+#include "host/app/Host.h"
+#include "host/text/Unicode.h"
+#include "tests/contract/HostUnderTest.h"
+#include "tests/support/TemporaryFolder.h"
+
+namespace
+{
+namespace fs = std::filesystem;
+
+fs::path toPath(const std::wstring& text)
+{
+    return tessel::toUtf8(text);
+}
+
+std::wstring toText(const fs::path& path)
+{
+    return tessel::toWide(path.string());
+}
+
+const char* libraryOf(ContractModule behaviour)
+{
+    switch (behaviour)
+    {
+    case ContractModule::kRefusesToLoad:
+        return CONTRACT_MODULE_refusesToLoad;
+    case ContractModule::kRefusesToUnload:
+        return CONTRACT_MODULE_refusesToUnload;
+    case ContractModule::kLocksItself:
+        return CONTRACT_MODULE_locksItself;
+    case ContractModule::kRegistersItself:
+        return CONTRACT_MODULE_registersItself;
+    case ContractModule::kTellsItsName:
+        return CONTRACT_MODULE_tellsItsName;
+    default:
+        return CONTRACT_MODULE_plain;
+    }
+}
+
+// A string of a resource script.
+std::string quoted(const std::wstring& text)
+{
+    std::string result = "\"";
+    for (const char character : tessel::toUtf8(text))
+        result += character == '"' ? std::string("\"\"") : std::string(1, character);
+    return result + "\"";
+}
+
+void run(const std::string& command)
+{
+    if (std::system((command + " >/dev/null").c_str()) != 0)
+        throw std::runtime_error("failed: " + command);
+}
+
+class TesselHostUnderTest : public HostUnderTest
+{
+public:
+    TesselHostUnderTest() : mHost(options())
+    {
+        if (!mHost.start())
+            throw std::runtime_error("the host does not start: " + mOutput);
+    }
+
+    ~TesselHostUnderTest() override
+    {
+        mHost.end();
+        fs::current_path(mFolderBefore); // the test's own is about to go
+    }
+
+    std::wstring makeFile(const std::wstring& name) override
+    {
+        return toText(mFolder.write(toPath(name), ""));
+    }
+
+    std::wstring makeReadOnlyFile(const std::wstring& name) override
+    {
+        const fs::path file = mFolder.write(toPath(name), "");
+        fs::permissions(file, fs::perms::owner_read);
+        return toText(file);
+    }
+
+    std::wstring makeFolder(const std::wstring& name) override
+    {
+        const fs::path folder = mFolder / toPath(name);
+        fs::create_directories(folder);
+        return toText(folder);
+    }
+
+    void enterFolder(const std::wstring& path) override { fs::current_path(toPath(path)); }
+
+    std::wstring makeResourceModule(const std::wstring& name,
+                                    const std::map<unsigned, std::wstring>& texts) override
+    {
+        std::string script = "STRINGTABLE\nBEGIN\n";
+        for (const auto& [id, text] : texts)
+            script += std::to_string(id) + " " + quoted(text) + "\n";
+        const std::string source = mFolder.write("texts.rc", script + "END\n").string();
+        const std::string compiled = (mFolder / "texts.res").string();
+        const fs::path module = mFolder / toPath(name);
+        run(RESOURCE_COMPILER " /no-preprocess /C 65001 /FO " + compiled + " " + source);
+        run(RESOURCE_LINKER " /dll /noentry /machine:x64 /implib:" + compiled +
+            ".lib /out:" + module.string() + " " + compiled);
+        return toText(module);
+    }
+
+    std::wstring makeModule(const std::wstring& name, ContractModule behaviour) override
+    {
+        const fs::path module = mFolder / toPath(name);
+        fs::copy_file(libraryOf(behaviour), module);
+        return toText(module);
+    }
+
+    void setVariable(const std::wstring& name, const RecordingValue& value) override
+    {
+        const std::wstring text = value.type == TS_STRING ? value.text : std::to_wstring(value.number);
+        if (!mHost.run(L"SETVAR " + name + L" \"" + text + L"\""))
+            throw std::runtime_error("a variable cannot be set: " + mOutput);
+    }
+
+    void searchIn(const std::vector<std::wstring>& folders) override
+    {
+        std::wstring path;
+        for (const std::wstring& folder : folders)
+            path += folder + L";";
+        setVariable(L"SEARCHPATH", RecordingValue::String(path));
+    }
+
+    std::wstring loadLispFile(const std::wstring& name) override
+    {
+        const std::wstring file = toText(mFolder.write(toPath(name), "(setq contract-loaded t)\n"));
+        if (!mHost.run(L"LOAD \"" + file + L"\""))
+            throw std::runtime_error("a Lisp file cannot be loaded: " + mOutput);
+        return file;
+    }
+
+    bool type(const std::wstring& command) override { return mHost.run(command); }
+
+    // Any line will do: what is queued is evaluated behind it.
+    void becomeIdle() override { mHost.run(L"(princ)"); }
+
+    void tellLisp(const std::wstring&, const std::optional<std::wstring>&) override {}
+
+    void defineLisp(const std::wstring&, const std::wstring& definition, const StandIn&) override
+    {
+        if (!mHost.run(definition))
+            throw std::runtime_error("a Lisp function cannot be defined: " + mOutput);
+    }
+
+    std::wstring seen() const override { return tessel::toWide(mOutput); }
+
+private:
+    tessel::HostOptions options()
+    {
+        return {.profileFolder = mFolder / "profile",
+                .safe = true, // the product's own plug-ins stay out of the way
+                .output = [this](std::string_view text)
+                {
+                    mOutput += text;
+                }};
+    }
+
+    fs::path mFolderBefore = fs::current_path();
+    TemporaryFolder mFolder;
+    std::string mOutput;
+    tessel::Host mHost;
+};
+} // namespace
+
+std::unique_ptr<HostUnderTest> startHost()
+{
+    return std::make_unique<TesselHostUnderTest>();
+}
