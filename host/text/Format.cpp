@@ -11,6 +11,8 @@ namespace
 // Numbers are padded no wider than this: a format may come from a file's name, and must not fill the memory.
 constexpr int kWidest = 1000;
 constexpr std::size_t kNumberRoom = 2 * kWidest + 400; // a double may have 309 digits before its point
+// A text is never longer than this many characters, so that a precision beyond it cuts nothing.
+constexpr int kLargestNumber = 100'000'000;
 
 constexpr std::wstring_view kFlags = L"-+ #0";
 constexpr std::wstring_view kLengthModifiers = L"hljztLq";
@@ -37,7 +39,7 @@ int takeNumber(const wchar_t*& at)
 {
     int number = 0;
     for (; *at >= L'0' && *at <= L'9'; ++at)
-        number = std::min(kWidest, number * 10 + static_cast<int>(*at - L'0'));
+        number = std::min(kLargestNumber, number * 10 + static_cast<int>(*at - L'0'));
     return number;
 }
 
@@ -48,7 +50,7 @@ Conversion parse(const wchar_t* at)
     for (; isOneOf(kFlags, *at); ++at)
         if (conversion.flags.find(static_cast<char>(*at)) == std::string::npos)
             conversion.flags += static_cast<char>(*at);
-    conversion.width = takeNumber(at);
+    conversion.width = std::min(kWidest, takeNumber(at));
     if (*at == L'.')
         conversion.precision = takeNumber(++at);
     while (isOneOf(kLengthModifiers, *at))
@@ -80,7 +82,7 @@ std::string cFormat(const Conversion& conversion, const char* size)
     if (conversion.width == 0)
         format = "%" + conversion.flags;
     if (conversion.precision >= 0)
-        format += "." + std::to_string(conversion.precision);
+        format += "." + std::to_string(std::min(kWidest, conversion.precision));
     return format + size + static_cast<char>(conversion.letter);
 }
 
