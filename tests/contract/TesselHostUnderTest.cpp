@@ -154,6 +154,9 @@ public:
 private:
     tessel::HostOptions options()
     {
+        // Without a display a message box and a page of the help book are text, and nobody has to answer.
+        unsetenv("DISPLAY");
+        unsetenv("WAYLAND_DISPLAY");
         return {.profileFolder = mFolder / "profile",
                 .safe = true, // the product's own plug-ins stay out of the way
                 .output = [this](std::string_view text)
