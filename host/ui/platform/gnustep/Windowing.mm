@@ -8,17 +8,29 @@ namespace tessel::windowing
 {
 namespace
 {
+NSString* absolute(NSString* path)
+{
+    NSString* folder = [[NSFileManager defaultManager] currentDirectoryPath];
+    NSString* whole = [path isAbsolutePath] ? path : [folder stringByAppendingPathComponent:path];
+    return [whole stringByStandardizingPath];
+}
+
 // The host's theme: colours only, in the resources of the host that this library lies in.
 NSString* themePath()
 {
     Dl_info info;
     if (!dladdr(reinterpret_cast<const void*>(&themePath), &info) || !info.dli_fname)
         return nil;
-    NSString* library = [[NSString stringWithUTF8String:info.dli_fname] stringByStandardizingPath];
+    NSString* library = absolute([NSString stringWithUTF8String:info.dli_fname]);
     NSString* theme = [[library stringByDeletingLastPathComponent]
         stringByAppendingPathComponent:@"Resources/Tessel.theme"];
     return [[NSFileManager defaultManager] fileExistsAtPath:theme] ? theme : nil;
 }
+
+NSString* const kPlainFontRoles[] = {@"NSFont",        @"NSUserFont",    @"NSControlContentFont",
+                                     @"NSLabelFont",   @"NSMenuFont",    @"NSMessageFont",
+                                     @"NSPaletteFont", @"NSToolTipsFont"};
+NSString* const kBoldFontRoles[] = {@"NSBoldFont", @"NSTitleBarFont"};
 
 void setDefaults(NSDictionary* defaults)
 {
@@ -53,8 +65,12 @@ void completeLook()
     NSArray* fonts = [[NSFontManager sharedFontManager] availableFonts];
     if (![fonts containsObject:@"Inter-Regular"] || ![fonts containsObject:@"Inter-Bold"])
         return;
-    setDefaults([NSDictionary dictionaryWithObjectsAndKeys:@"Inter-Regular", @"NSFont", @"Inter-Bold",
-                                                           @"NSBoldFont", @"13", @"NSFontSize", nil]);
+    NSMutableDictionary* choice = [NSMutableDictionary dictionaryWithObject:@"13" forKey:@"NSFontSize"];
+    for (NSString* role : kPlainFontRoles)
+        [choice setObject:@"Inter-Regular" forKey:role];
+    for (NSString* role : kBoldFontRoles)
+        [choice setObject:@"Inter-Bold" forKey:role];
+    setDefaults(choice);
 }
 
 void flushScreen()

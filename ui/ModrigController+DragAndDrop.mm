@@ -1,0 +1,97 @@
+#import "ui/ModrigController.h"
+
+#include <tesselui/tsuieach.h>
+
+#import "ui/ModrigFilePath.h"
+#import "ui/TsOCModrigUtil.h"
+
+#include "ui/Paths.h"
+#include "ui/model/FileIntake.h"
+#include "ui/model/LoadBatch.h"
+
+namespace
+{
+NSArray* draggedPaths(id<NSDraggingInfo> info)
+{
+    return [[info draggingPasteboard] propertyListForType:NSFilenamesPboardType];
+}
+
+// One file that can be loaded among those dragged is enough.
+NSDragOperation operationFor(id<NSDraggingInfo> info)
+{
+    for (NSString* path : tsuiEach<NSString*>(draggedPaths(info)))
+        if ([TsOCModrigUtil isValidFileForModrig:path])
+            return NSDragOperationCopy;
+    return NSDragOperationNone;
+}
+} // namespace
+
+@implementation ModrigController (DragAndDrop)
+
+- (NSDragOperation)tableView:(NSTableView*)table
+                validateDrop:(id<NSDraggingInfo>)info
+                 proposedRow:(NSInteger)row
+       proposedDropOperation:(NSTableViewDropOperation)operation
+{
+    (void)table;
+    (void)row;
+    if (operation == NSTableViewDropOn)
+        return NSDragOperationNone;
+    return operationFor(info);
+}
+
+// NO in any case: the rows appear as the files are loaded, and the table has nothing to show of its own.
+- (BOOL)tableView:(NSTableView*)table
+       acceptDrop:(id<NSDraggingInfo>)info
+              row:(NSInteger)row
+    dropOperation:(NSTableViewDropOperation)operation
+{
+    (void)operation;
+    if (table == loadedAppsTableView)
+        [self loadedAppsTableViewDropFiles:draggedPaths(info) atRow:row];
+    else if (table == historyListTableView)
+        [self historyTableViewDropFiles:draggedPaths(info) atRow:row];
+    return NO;
+}
+
+- (void)loadedAppsTableViewDropFiles:(NSArray*)paths atRow:(NSInteger)row
+{
+    [self dropFiles:paths atRow:row addToStartupList:NO];
+}
+
+- (void)historyTableViewDropFiles:(NSArray*)paths atRow:(NSInteger)row
+{
+    (void)paths;
+    (void)row;
+    mInsertRow = ModrigUtils::kAppendRow;
+}
+
+- (NSDragOperation)draggingEnteredStartupSuite:(id<NSDraggingInfo>)info
+{
+    return operationFor(info);
+}
+
+- (BOOL)performDragOperationToStartupSuite:(id<NSDraggingInfo>)info
+{
+    if ([[[info draggingPasteboard] types] containsObject:NSFilenamesPboardType])
+        [self dropFiles:draggedPaths(info) atRow:ModrigUtils::kAppendRow addToStartupList:YES];
+    return YES;
+}
+
+- (void)dropFiles:(NSArray*)paths atRow:(NSInteger)row addToStartupList:(BOOL)addToStartupList
+{
+    if (ModrigUtils::RefuseTooManyFiles([paths count]))
+        return;
+    NSArray* files =
+        ModrigUtils::RowsFromPaths(ModrigUtils::AcceptedFiles(ModrigUtils::PathsFromStrings(paths)));
+    if ([files count] == 0)
+        return;
+    NSMutableArray* loaded = addToStartupList ? [NSMutableArray array] : nil;
+    mInsertRow = static_cast<int>(row);
+    [self loadApps:files successedApps:loaded addToStartupSuit:addToStartupList];
+    mInsertRow = ModrigUtils::kAppendRow;
+    if (addToStartupList)
+        ModrigUtils::AddToStartupSuite(ModrigUtils::PathsFromRows(loaded));
+}
+
+@end

@@ -1,0 +1,98 @@
+#import "ui/ModrigController.h"
+
+#include <tesselui/tsuieach.h>
+
+#import "ui/ModrigFilePath.h"
+#import "ui/ModrigStartupSuitController.h"
+
+#include "module/Messages.h"
+#include "ui/Paths.h"
+#include "ui/Settings.h"
+#include "ui/model/LoadBatch.h"
+
+namespace
+{
+constexpr NSInteger kLoadedApplicationsTab = 0;
+constexpr NSInteger kHistoryTab = 1;
+
+// Unless the table has a row for that file already.
+void insertRow(ModrigFilePath* row, NSArrayController* rows, int insertRow)
+{
+    NSArray* present = [rows arrangedObjects];
+    if (![present containsObject:row])
+        [rows insertObject:row
+            atArrangedObjectIndex:ModrigUtils::RowForInsertion(insertRow, [present count])];
+}
+
+void scrollToLastRow(NSTableView* table, NSArrayController* rows)
+{
+    const NSUInteger count = [[rows arrangedObjects] count];
+    if (count > 0)
+        [table scrollRowToVisible:static_cast<NSInteger>(count - 1)];
+}
+} // namespace
+
+@implementation ModrigController (Loading)
+
+- (IBAction)onLoad:(id)sender
+{
+    (void)sender;
+    if ([self openTesselFolder])
+        return;
+    [self loadApps:mSelectedFiles successedApps:nil addToStartupSuit:NO];
+    [[self uiPersistentStore] putControlString:kSettingsGroup
+                                       control:kInitialPathSetting
+                                         value:[mOpenPanel directory]];
+}
+
+- (IBAction)onStartupSuits:(id)sender
+{
+    (void)sender;
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    ModrigStartupSuitController* suite = [[ModrigStartupSuitController alloc] init];
+    [suite showModalWindowCenterOfParent:[[self view] window]];
+    [suite release];
+    [pool drain];
+}
+
+- (IBAction)onHelp:(id)sender
+{
+    (void)sender;
+    ModrigUtils::OnCommandHelp(ModrigUtils::kMainDialogHelp);
+}
+
+- (void)addRowsFor:(NSString*)path
+{
+    ModrigFilePath* row = [[[ModrigFilePath alloc] initWithFilePathName:path] autorelease];
+    insertRow(row, loadedApps, mInsertRow);
+    if (mbSaveHistory)
+        insertRow(row, historyList, mInsertRow);
+}
+
+- (void)showLastRow
+{
+    if (tabViewSelectedIndex == kLoadedApplicationsTab)
+        scrollToLastRow(loadedAppsTableView, loadedApps);
+    else if (tabViewSelectedIndex == kHistoryTab)
+        scrollToLastRow(historyListTableView, historyList);
+}
+
+- (void)loadApps:(NSArray*)files
+       successedApps:(NSMutableArray*)successedApps
+    addToStartupSuit:(BOOL)addToStartupSuit
+{
+    // A copy: what is loaded may change the selection that the files come from.
+    NSArray* batchFiles = [[files copy] autorelease];
+    ModrigUtils::LoadBatch batch;
+    for (ModrigFilePath* file : tsuiEach<ModrigFilePath*>(batchFiles))
+        batch.files.push_back({[file path], static_cast<bool>([self isTesselFolder:[file filePathName]])});
+    batch.saveHistory = mbSaveHistory;
+    batch.loadAll = addToStartupSuit;
+    batch.succeeded = [=](std::size_t index) { [successedApps addObject:[batchFiles objectAtIndex:index]]; };
+    batch.added = [=](std::size_t index)
+    { [self addRowsFor:[[batchFiles objectAtIndex:index] filePathName]]; };
+    if (ModrigUtils::RunLoadBatch(batch) > 0 && mInsertRow == ModrigUtils::kAppendRow)
+        [self showLastRow];
+}
+
+@end

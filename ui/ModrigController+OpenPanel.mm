@@ -1,0 +1,142 @@
+#import "ui/ModrigController.h"
+
+#import <tesselui/TsOCFileFilter.h>
+#include <tesselui/tsuieach.h>
+
+#import "ui/ModrigFilePath.h"
+#import "ui/NSSavePanel+ModrigRuntime.h"
+#import "ui/TsOCModrigUtil.h"
+
+#include "module/MessageIds.h"
+#include "ui/Paths.h"
+#include "ui/Settings.h"
+#include "ui/model/FileVisibility.h"
+#include "ui/platform/Platform.h"
+
+@implementation ModrigController (OpenPanel)
+
+// The panel stays open when files are loaded: its default button is out of sight, and loads.
+- (void)setupButtonsOf:(NSOpenPanel*)panel
+{
+    NSButton* ok = [panel okButton];
+    [ok setHidden:YES];
+    [ok setTarget:self];
+    [ok setAction:@selector(openPanelOK:)];
+    [[panel cancelButton] setFrame:[ok frame]];
+    [[panel cancelButton] setTitle:[TsOCModrigUtil modrigLoadString:@"IDS_MODRIG_CLOSE_BUTTON"]];
+}
+
+- (void)placeHelpButtonIn:(NSOpenPanel*)panel
+{
+    NSButton* spare = [panel hideExtensionButton];
+    [[spare superview] addSubview:helpButton];
+    [helpButton setFrameOrigin:NSMakePoint(NSMinX([spare frame]), NSMinY([[panel okButton] frame]))];
+}
+
+- (NSString*)initialFolder
+{
+    NSString* stored = [[self uiPersistentStore] getControlString:kSettingsGroup control:kInitialPathSetting];
+    return [stored length] ? stored : [[NSBundle mainBundle] bundlePath];
+}
+
+- (void)setupOpenPanel:(NSOpenPanel*)panel
+{
+    ModrigPlatform::RememberPanel(panel);
+    mOpenPanel = panel;
+    [panel setDelegate:(id)self];
+    [panel setAllowsMultipleSelection:YES];
+    [self setupButtonsOf:panel];
+    [panel setAccessoryView:[self view]];
+    [self placeHelpButtonIn:panel];
+    ModrigPlatform::FitAccessoryView([self view]);
+    CStdStr title;
+    title.Load(ModrigMessages::kOpenPanelTitle);
+    [panel setTitle:ModrigUtils::StringFromPath(title)];
+    [panel setDirectory:[self initialFolder]];
+    [self populateFileTypes];
+    [self populateLoadedApplications];
+    [self populateHistoryList];
+    [self onInit];
+    ModrigPlatform::CompletePanel(panel, [self view]);
+}
+
+- (void)cleanOpenPanel:(NSOpenPanel*)panel
+{
+    mOpenPanel = nil;
+    [self onFinish];
+    [panel setAccessoryView:nil];
+    [helpButton removeFromSuperview];
+    ModrigPlatform::RestorePanel(panel);
+}
+
+- (TsOCFileFilter*)selectedFilter
+{
+    NSArray* filters = [fileTypes arrangedObjects];
+    const NSUInteger index = [fileTypes selectionIndex];
+    return index < [filters count] ? [filters objectAtIndex:index] : nil;
+}
+
+- (void)populateFileTypes
+{
+    NSMutableArray* filters = [NSMutableArray array];
+    [TsOCModrigUtil populateModrigFileFilter:filters];
+    [fileTypes addObjects:filters];
+    [fileTypes setSelectionIndex:0];
+    [self onFileTypesChanged:nil];
+}
+
+- (IBAction)onFileTypesChanged:(id)sender
+{
+    (void)sender;
+    if ([self selectedFilter])
+        ModrigPlatform::FilterPanelAnew(mOpenPanel, [[NSBundle bundleForClass:[self class]] bundleURL]);
+}
+
+- (BOOL)panel:(id)panel shouldShowFilename:(NSString*)name
+{
+    TsOCFileFilter* filter = [self selectedFilter];
+    if (!filter)
+        return NO;
+    NSString* path = ModrigPlatform::ResolveLinksAndAliases(name);
+    ModrigUtils::PanelFile file;
+    file.exists = ModrigPlatform::FileExists(path, file.isFolder);
+    file.isPackage = file.isFolder && ModrigPlatform::IsFilePackage(path);
+    file.extension = ModrigUtils::PathFromString([path pathExtension]);
+    file.isHostFolder = [self isTesselFolder:path];
+    return ModrigUtils::IsShownInPanel(file, [panel treatsFilePackagesAsDirectories],
+                                       ModrigUtils::PathsFromStrings([filter fileExtensions]));
+}
+
+- (void)panelSelectionDidChange:(id)panel
+{
+    [mSelectedFiles removeAllObjects];
+    for (NSURL* url : tsuiEach<NSURL*>([panel URLs]))
+    {
+        ModrigFilePath* file = [[ModrigFilePath alloc] initWithFilePathName:[url path]];
+        [mSelectedFiles addObject:file];
+        [file release];
+    }
+}
+
+- (void)openPanelOK:(id)sender
+{
+    [self onLoad:sender];
+}
+
+- (BOOL)openTesselFolder
+{
+    if ([mSelectedFiles count] != 1)
+        return NO;
+    NSString* path = [[mSelectedFiles objectAtIndex:0] filePathName];
+    if (![self isTesselFolder:path])
+        return NO;
+    [mOpenPanel setDirectory:path];
+    return YES;
+}
+
+- (BOOL)isTesselFolder:(NSString*)path
+{
+    return path && [path caseInsensitiveCompare:[[NSBundle mainBundle] bundlePath]] == NSOrderedSame;
+}
+
+@end

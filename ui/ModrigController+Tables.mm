@@ -1,0 +1,141 @@
+#import "ui/ModrigController.h"
+
+#include <tesselui/tsuieach.h>
+
+#import "ui/ModrigFilePath.h"
+#import "ui/TsOCModrigUtil.h"
+
+#include "loader/LoadedApplications.h"
+#include "module/Globals.h"
+#include "ui/Paths.h"
+#include "ui/model/ListRemoval.h"
+#include "ui/model/LoadBatch.h"
+#include "ui/platform/Platform.h"
+
+namespace
+{
+void addLoadedOf(const CStringList& list, NSMutableArray* paths)
+{
+    for (const CStdStr& path : list)
+        if (ModrigUtils::ApplicationIsLoaded(path))
+            [paths addObject:ModrigUtils::StringFromPath(path)];
+}
+
+// Without selecting what is added: nothing has been chosen by anybody yet.
+void fill(NSArrayController* rows, NSArray* paths)
+{
+    [rows setSelectsInsertedObjects:NO];
+    [TsOCModrigUtil addPathNames:paths toArrayController:rows];
+    [rows setSelectsInsertedObjects:YES];
+}
+
+std::vector<ModrigUtils::UnloadCandidate> unloadCandidates(NSArray* rows)
+{
+    std::vector<ModrigUtils::UnloadCandidate> candidates;
+    for (ModrigFilePath* row : tsuiEach<ModrigFilePath*>(rows))
+        candidates.push_back({[row path], static_cast<bool>([row unloadable])});
+    return candidates;
+}
+
+bool hasSelection(NSArrayController* rows)
+{
+    return [[rows selectedObjects] count] > 0;
+}
+} // namespace
+
+@implementation ModrigController (Tables)
+
+- (void)populateLoadedApplications
+{
+    NSMutableArray* paths = [NSMutableArray array];
+    addLoadedOf(gLoadedAppList, paths);
+    addLoadedOf(gStartupList, paths);
+    fill(loadedApps, paths);
+}
+
+- (void)populateHistoryList
+{
+    fill(historyList, ModrigUtils::StringsFromList(gHistoryList));
+}
+
+- (NSArrayController*)rowsOf:(NSTableView*)table
+{
+    if (table == loadedAppsTableView)
+        return loadedApps;
+    return table == historyListTableView ? historyList : nil;
+}
+
+// The columns are bound to the rows; this one answer some platforms want from the data source all the same.
+- (NSInteger)numberOfRowsInTableView:(NSTableView*)table
+{
+    return static_cast<NSInteger>([[[self rowsOf:table] arrangedObjects] count]);
+}
+
+- (void)tableViewSelectionDidChange:(NSNotification*)notification
+{
+    NSTableView* table = [notification object];
+    ModrigPlatform::AdoptTableSelection(table, [self rowsOf:table]);
+    if (table == loadedAppsTableView)
+        self.canUnloadApp = hasSelection(loadedApps);
+    if (table != historyListTableView)
+        return;
+    self.canRemoveHistory = hasSelection(historyList);
+    [mSelectedFiles setArray:[historyList selectedObjects]];
+}
+
+- (BOOL)tableView:(NSTableView*)table shouldSelectRow:(NSInteger)row
+{
+    if (table != loadedAppsTableView)
+        return YES;
+    NSArray* rows = [loadedApps arrangedObjects];
+    if (row < 0 || static_cast<NSUInteger>(row) >= [rows count])
+        return NO;
+    return [[rows objectAtIndex:static_cast<NSUInteger>(row)] unloadable];
+}
+
+- (IBAction)onLoadFromHistory:(id)sender
+{
+    (void)sender;
+    if (hasSelection(historyList))
+        [self loadApps:[historyList selectedObjects] successedApps:nil addToStartupSuit:NO];
+}
+
+- (IBAction)onDoubleClickHistoryTableView:(id)sender
+{
+    if (sender == historyListTableView)
+        [self onLoadFromHistory:sender];
+}
+
+- (IBAction)onAddToStartupSuiteFromHistory:(id)sender
+{
+    (void)sender;
+    NSMutableArray* paths = [NSMutableArray array];
+    for (ModrigFilePath* row : tsuiEach<ModrigFilePath*>([historyList selectedObjects]))
+        [paths addObject:[row filePathName]];
+    if ([paths count])
+        [self dropFiles:paths atRow:ModrigUtils::kAppendRow addToStartupList:YES];
+}
+
+- (IBAction)onRemove:(id)sender
+{
+    (void)sender;
+    NSArray* rows = [[[historyList selectedObjects] copy] autorelease];
+    if ([rows count] == 0)
+        return;
+    [historyList removeObjects:rows];
+    ModrigUtils::RemoveFromHistory(ModrigUtils::PathsFromRows(rows));
+}
+
+- (IBAction)onUnload:(id)sender
+{
+    (void)sender;
+    NSArray* rows = [[[loadedApps selectedObjects] copy] autorelease];
+    if ([rows count] == 0)
+        return;
+    NSMutableArray* unloaded = [NSMutableArray array];
+    for (const std::size_t index : ModrigUtils::UnloadApplications(unloadCandidates(rows)))
+        [unloaded addObject:[rows objectAtIndex:index]];
+    [loadedApps removeObjects:unloaded];
+}
+
+@end

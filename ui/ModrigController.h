@@ -1,0 +1,131 @@
+// The Load/Unload Applications dialog: a file panel of the system, with this controller's view in it.
+//
+// The module's lists are the truth; the array controllers show them, and every action changes both. There is
+// one dialog at a time (see `TsOCModrigUtil`). Main thread only.
+#pragma once
+
+#import <AppKit/AppKit.h>
+#import <tesselui/TsUIPersistentStore.h>
+
+@class ModrigStartupSuiteBox;
+
+@interface ModrigController : NSViewController
+{
+    NSMutableArray* mSelectedFiles;
+    NSOpenPanel* mOpenPanel;
+    BOOL mbSaveHistory;
+    BOOL mbUpdatingFileNameField;
+    int mInsertRow;
+    TsUIPersistentStore* mpUIPersistentStore;
+    IBOutlet NSArrayController* fileTypes;
+    IBOutlet NSArrayController* loadedApps;
+    IBOutlet NSArrayController* historyList;
+    IBOutlet NSTableView* loadedAppsTableView;
+    IBOutlet NSTableView* historyListTableView;
+    IBOutlet NSButton* helpButton;
+    IBOutlet ModrigStartupSuiteBox* startupSuiteBox;
+    NSInteger tabViewSelectedIndex;
+    BOOL canUnloadApp;
+    BOOL canRemoveHistory;
+    NSString* message;
+}
+
+// What Load will load: `ModrigFilePath`s, from the panel's selection or the History's.
+@property (nonatomic, retain) NSMutableArray* selectedFiles;
+@property (nonatomic, assign) BOOL saveHistory;
+// 0 loaded applications, 1 History.
+@property (nonatomic, assign) NSInteger tabViewSelectedIndex;
+@property (nonatomic, assign) BOOL canUnloadApp;
+@property (nonatomic, assign) BOOL canRemoveHistory;
+// The message line.
+@property (nonatomic, retain) NSString* message;
+
+- (id)init;
+
+// Opens the dialog, returns when it is closed, and stores the lists then, whatever was done in it.
+- (void)showModrigDialog;
+
+// The two halves of opening and closing that the panel's set-up and clean-up call.
+- (void)onInit;
+- (void)onFinish;
+
+- (TsUIPersistentStore*)uiPersistentStore;
+
+@end
+
+// ModrigController+Tables.mm: the tables and what their buttons do.
+@interface ModrigController (Tables) <NSTableViewDataSource, NSTableViewDelegate>
+
+- (void)populateLoadedApplications;
+- (void)populateHistoryList;
+
+- (void)tableViewSelectionDidChange:(NSNotification*)notification;
+- (BOOL)tableView:(NSTableView*)table shouldSelectRow:(NSInteger)row;
+
+- (IBAction)onLoadFromHistory:(id)sender;
+- (IBAction)onDoubleClickHistoryTableView:(id)sender;
+- (IBAction)onAddToStartupSuiteFromHistory:(id)sender;
+- (IBAction)onRemove:(id)sender;
+- (IBAction)onUnload:(id)sender;
+
+@end
+
+// ModrigController+Loading.mm
+@interface ModrigController (Loading)
+
+- (IBAction)onLoad:(id)sender;
+- (IBAction)onStartupSuits:(id)sender;
+- (IBAction)onHelp:(id)sender;
+
+// Every road into loading goes through here. Loads the `ModrigFilePath`s in order, up to the first that
+// fails, with rows for those newly loaded. `successedApps` (or nil) receives those that are loaded now, newly
+// or since before.
+- (void)loadApps:(NSArray*)files
+       successedApps:(NSMutableArray*)successedApps
+    addToStartupSuit:(BOOL)addToStartupSuit;
+
+@end
+
+// ModrigController+OpenPanel.mm: the file panel around the view.
+@interface ModrigController (OpenPanel)
+
+- (void)setupOpenPanel:(NSOpenPanel*)panel;
+- (void)cleanOpenPanel:(NSOpenPanel*)panel;
+
+- (void)populateFileTypes;
+- (IBAction)onFileTypesChanged:(id)sender;
+
+- (BOOL)panel:(id)panel shouldShowFilename:(NSString*)name;
+- (void)panelSelectionDidChange:(id)panel;
+// The action of the panel's default button.
+- (void)openPanelOK:(id)sender;
+
+// Moves the panel into the host's own folder when that is all that is selected, and answers whether it did.
+- (BOOL)openTesselFolder;
+- (BOOL)isTesselFolder:(NSString*)path;
+
+@end
+
+// ModrigController+DragAndDrop.mm: files dropped on the tables and on the Startup Suite box.
+@interface ModrigController (DragAndDrop)
+
+- (NSDragOperation)tableView:(NSTableView*)table
+                validateDrop:(id<NSDraggingInfo>)info
+                 proposedRow:(NSInteger)row
+       proposedDropOperation:(NSTableViewDropOperation)operation;
+- (BOOL)tableView:(NSTableView*)table
+       acceptDrop:(id<NSDraggingInfo>)info
+              row:(NSInteger)row
+    dropOperation:(NSTableViewDropOperation)operation;
+- (void)loadedAppsTableViewDropFiles:(NSArray*)paths atRow:(NSInteger)row;
+// The History takes no files.
+- (void)historyTableViewDropFiles:(NSArray*)paths atRow:(NSInteger)row;
+
+- (NSDragOperation)draggingEnteredStartupSuite:(id<NSDraggingInfo>)info;
+- (BOOL)performDragOperationToStartupSuite:(id<NSDraggingInfo>)info;
+
+// Loads the files (path strings), up to 50 of them, with their rows at `row` (-1: at the end), and takes
+// those that are loaded then into the Startup Suite if asked to.
+- (void)dropFiles:(NSArray*)paths atRow:(NSInteger)row addToStartupList:(BOOL)addToStartupList;
+
+@end

@@ -1,0 +1,95 @@
+#import "ui/ModrigController.h"
+
+#import "ui/ModrigStartupSuiteBox.h"
+#import "ui/TsOCModrigUtil.h"
+
+#include "lists/History.h"
+#include "lists/StartupSuite.h"
+#include "loader/LoadedApplications.h"
+#include "module/EntryPoint.h"
+#include "ui/Settings.h"
+#include "ui/model/LoadBatch.h"
+
+@implementation ModrigController
+
+@synthesize selectedFiles = mSelectedFiles;
+@synthesize saveHistory = mbSaveHistory;
+@synthesize tabViewSelectedIndex;
+@synthesize canUnloadApp;
+@synthesize canRemoveHistory;
+@synthesize message;
+
+- (id)init
+{
+    self = [super initWithNibName:@"Modrig" bundle:[NSBundle bundleForClass:[ModrigController class]]];
+    if (!self)
+        return nil;
+    mSelectedFiles = [[NSMutableArray alloc] init];
+    mInsertRow = ModrigUtils::kAppendRow;
+    message = @"";
+    return self;
+}
+
+- (void)dealloc
+{
+    [mpUIPersistentStore release];
+    self.selectedFiles = nil;
+    self.message = nil;
+    [super dealloc];
+}
+
+- (TsUIPersistentStore*)uiPersistentStore
+{
+    if (!mpUIPersistentStore)
+        mpUIPersistentStore = [[TsUIPersistentStore alloc] init];
+    return mpUIPersistentStore;
+}
+
+- (void)showModrigDialog
+{
+    ModrigUtils::PopulateLoadedApps();
+    NSOpenPanel* panel = [NSOpenPanel openPanel];
+    [self setupOpenPanel:panel];
+    @try
+    {
+        [panel runModal];
+    }
+    @finally
+    {
+        [self cleanOpenPanel:panel];
+        ModrigUtils::WriteStartupFilesToRegistry();
+        ModrigUtils::WriteHistoryFilesToRegistry();
+        ModrigUtils::updateRegistry();
+    }
+}
+
+- (void)onInit
+{
+    TsUIPersistentStore* settings = [self uiPersistentStore];
+    self.saveHistory = [settings getControlState:kSettingsGroup control:kSaveHistorySetting] != 0;
+    self.tabViewSelectedIndex = [settings getControlInt:kSettingsGroup control:kLastTabSetting];
+    [TsOCModrigUtil setModrigController:self];
+    NSArray* files = [NSArray arrayWithObject:NSFilenamesPboardType];
+    [loadedAppsTableView registerForDraggedTypes:files];
+    [startupSuiteBox registerForDraggedTypes:files];
+    [loadedAppsTableView setDataSource:self];
+    [historyListTableView setDataSource:self];
+    [historyListTableView setTarget:self];
+    [historyListTableView setDoubleAction:@selector(onDoubleClickHistoryTableView:)];
+}
+
+- (void)onFinish
+{
+    [startupSuiteBox unregisterDraggedTypes];
+    [loadedAppsTableView unregisterDraggedTypes];
+    [loadedAppsTableView setDataSource:nil];
+    [historyListTableView setDataSource:nil];
+    TsUIPersistentStore* settings = [self uiPersistentStore];
+    [settings putControlState:kSettingsGroup control:kSaveHistorySetting state:self.saveHistory];
+    [settings putControlInt:kSettingsGroup
+                    control:kLastTabSetting
+                      value:static_cast<int>(self.tabViewSelectedIndex)];
+    [TsOCModrigUtil setModrigController:nil];
+}
+
+@end

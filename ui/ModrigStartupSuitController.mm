@@ -1,0 +1,134 @@
+#import "ui/ModrigStartupSuitController.h"
+
+#import <tesselui/TsOCOpenFileDialog.h>
+#include <tesselui/tsuieach.h>
+
+#import "ui/ModrigController.h"
+#import "ui/ModrigFilePath.h"
+#import "ui/TsOCModrigUtil.h"
+
+#include "module/Globals.h"
+#include "module/MessageIds.h"
+#include "module/Messages.h"
+#include "ui/Paths.h"
+#include "ui/model/FileIntake.h"
+#include "ui/model/ListRemoval.h"
+#include "ui/platform/Platform.h"
+
+namespace
+{
+constexpr NSInteger kAddSegment = 0;
+constexpr NSInteger kRemoveSegment = 1;
+} // namespace
+
+@implementation ModrigStartupSuitController
+
+- (NSString*)windowNibName
+{
+    return @"ModrigStartupSuit";
+}
+
+- (id)init
+{
+    return [super init];
+}
+
+- (void)doInit
+{
+    ModrigPlatform::CompleteSegments(segmentedControl);
+    [startupApps setSelectsInsertedObjects:NO];
+    [TsOCModrigUtil addPathNames:ModrigUtils::StringsFromList(gStartupList) toArrayController:startupApps];
+    [startupApps setSelectsInsertedObjects:YES];
+    [segmentedControl setEnabled:NO forSegment:kRemoveSegment];
+}
+
+- (void)doClean
+{
+}
+
+- (IBAction)onSegmentedButton:(id)sender
+{
+    switch (ModrigPlatform::TakeSegmentClick(sender))
+    {
+    case kAddSegment:
+        return [self onAdd];
+    case kRemoveSegment:
+        return [self onRemove];
+    default:
+        return;
+    }
+}
+
+- (void)onAdd
+{
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    TsOCOpenFileDialog* dialog = [[[TsOCOpenFileDialog alloc] init] autorelease];
+    CStdStr title;
+    title.Load(ModrigMessages::kStartupSuitePanelTitle);
+    [dialog setTitle:ModrigUtils::StringFromPath(title)];
+    [dialog setInitialPath:[[NSBundle mainBundle] bundlePath]];
+    [dialog setAllowsMultipleSelection:YES];
+    NSMutableArray* filters = [NSMutableArray array];
+    [TsOCModrigUtil populateModrigFileFilter:filters];
+    [dialog setFileFilters:filters];
+    if ([dialog runModal] == NSOKButton)
+        [self addFiles:[dialog selectedPathes]];
+    [pool drain];
+}
+
+- (void)onRemove
+{
+    NSArray* rows = [[[startupApps selectedObjects] copy] autorelease];
+    if ([rows count] == 0)
+        return;
+    [startupApps removeObjects:rows];
+    ModrigUtils::RemoveFromStartupSuite(ModrigUtils::PathsFromRows(rows));
+}
+
+// The columns are bound to the rows; this one answer some platforms want from the data source all the same.
+- (NSInteger)numberOfRowsInTableView:(NSTableView*)table
+{
+    (void)table;
+    return static_cast<NSInteger>([[startupApps arrangedObjects] count]);
+}
+
+- (BOOL)addToSuite:(ModrigFilePath*)file
+{
+    if ([[startupApps arrangedObjects] containsObject:file] ||
+        ModrigUtils::RefuseTemporaryInternetFile([file path]))
+        return NO;
+    [startupApps addObject:file];
+    gStartupList.AddTail([file path]);
+    return YES;
+}
+
+- (void)addFiles:(NSArray*)paths
+{
+    if (ModrigUtils::RefuseTooManyFiles([paths count]))
+        return;
+    NSArray* files =
+        ModrigUtils::RowsFromPaths(ModrigUtils::FilesNewToStartupSuite(ModrigUtils::PathsFromStrings(paths)));
+    NSMutableArray* loaded = [NSMutableArray array];
+    [[TsOCModrigUtil getModrigController] loadApps:files successedApps:loaded addToStartupSuit:YES];
+    NSUInteger added = 0;
+    for (ModrigFilePath* file : tsuiEach<ModrigFilePath*>(loaded))
+        added += [self addToSuite:file];
+    if (added > 0)
+        [startupTableView scrollRowToVisible:[self numberOfRowsInTableView:startupTableView] - 1];
+}
+
+- (void)tableViewSelectionDidChange:(NSNotification*)notification
+{
+    if ([notification object] != startupTableView)
+        return;
+    ModrigPlatform::AdoptTableSelection(startupTableView, startupApps);
+    [segmentedControl setEnabled:[[startupApps selectedObjects] count] > 0 forSegment:kRemoveSegment];
+}
+
+- (IBAction)help:(id)sender
+{
+    (void)sender;
+    ModrigUtils::OnCommandHelp(ModrigUtils::kStartupSuiteHelp);
+}
+
+@end

@@ -1,0 +1,55 @@
+#include "ui/Paths.h"
+
+#include <tesselui/tsuieach.h>
+#include <wincompat/winstring.h>
+
+#import "ui/ModrigFilePath.h"
+
+namespace ModrigUtils
+{
+std::vector<CStdStr> PathsFromStrings(NSArray* strings)
+{
+    std::vector<CStdStr> paths;
+    for (NSString* path : tsuiEach<NSString*>(strings))
+        paths.push_back(PathFromString(path));
+    return paths;
+}
+
+std::vector<CStdStr> PathsFromRows(NSArray* rows)
+{
+    std::vector<CStdStr> paths;
+    for (ModrigFilePath* row : tsuiEach<ModrigFilePath*>(rows))
+        paths.push_back([row path]);
+    return paths;
+}
+
+NSArray* RowsFromPaths(const std::vector<CStdStr>& paths)
+{
+    NSMutableArray* rows = [NSMutableArray array];
+    for (const CStdStr& path : paths)
+    {
+        ModrigFilePath* row = [[ModrigFilePath alloc] initWithFilePathName:StringFromPath(path)];
+        [rows addObject:row];
+        [row release];
+    }
+    return rows;
+}
+
+CStdStr PathFromString(NSString* text)
+{
+    return CStdStr(NSStringToWstring(text));
+}
+
+NSString* StringFromPath(const CStdStr& path)
+{
+    return wcharToNSString(path.c_str());
+}
+
+NSArray* StringsFromList(const CStringList& list)
+{
+    NSMutableArray* strings = [NSMutableArray arrayWithCapacity:list.GetCount()];
+    for (const CStdStr& path : list)
+        [strings addObject:StringFromPath(path)];
+    return strings;
+}
+} // namespace ModrigUtils

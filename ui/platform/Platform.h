@@ -1,0 +1,36 @@
+// What the dialogs do differently on the toolkits they run on.
+#pragma once
+
+#import <AppKit/AppKit.h>
+
+namespace ModrigPlatform
+{
+// The file panel may be shared with the rest of the program: its own state is kept before the dialog changes
+// it, and given back afterwards.
+void RememberPanel(NSOpenPanel* panel);
+void RestorePanel(NSOpenPanel* panel);
+
+// Makes the panel's accessory view as wide as the panel, at any size of it.
+void FitAccessoryView(NSView* view);
+
+// What is left to do when the dialog's view is in its place.
+void CompletePanel(NSOpenPanel* panel, NSView* view);
+
+// Asks the panel's delegate again which files to show. `elsewhere`: any other folder.
+void FilterPanelAnew(NSOpenPanel* panel, NSURL* elsewhere);
+
+// The path with symbolic links and, where there are any, aliases resolved.
+NSString* ResolveLinksAndAliases(NSString* path);
+// Whether the file exists; `isFolder` then says whether it is a folder.
+bool FileExists(NSString* path, bool& isFolder);
+// Whether its user sees the folder as one file.
+bool IsFilePackage(NSString* path);
+
+// Makes the rows that the user selected in the table those that the controller has selected.
+void AdoptTableSelection(NSTableView* table, NSArrayController* rows);
+
+// What the window file could not give the Add and Remove buttons.
+void CompleteSegments(NSSegmentedControl* segments);
+// The segment that was clicked, or -1. It is no longer pressed afterwards.
+NSInteger TakeSegmentClick(NSSegmentedControl* segments);
+} // namespace ModrigPlatform

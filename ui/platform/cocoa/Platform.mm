@@ -1,0 +1,99 @@
+#include <CoreServices/CoreServices.h>
+
+#import "ui/ModrigArrayController.h"
+#import "ui/NSSavePanel+ModrigRuntime.h"
+
+#include "ui/platform/Platform.h"
+
+@implementation ModrigArrayController
+@end
+
+@implementation NSSavePanel (ModrigRuntime)
+
+- (NSButton*)okButton
+{
+    return [self valueForKey:@"_okButton"];
+}
+
+- (NSButton*)cancelButton
+{
+    return [self valueForKey:@"_cancelButton"];
+}
+
+- (NSButton*)hideExtensionButton
+{
+    return [self valueForKey:@"_hideExtensionButton"];
+}
+
+@end
+
+namespace ModrigPlatform
+{
+namespace
+{
+// The file that an alias stands for; the path itself for any other file.
+NSString* originalOf(NSString* path)
+{
+    NSURL* url = [NSURL fileURLWithPath:path];
+    NSURL* original = [NSURL URLByResolvingAliasFileAtURL:url
+                                                  options:NSURLBookmarkResolutionWithoutUI
+                                                    error:NULL];
+    return original ? [original path] : path;
+}
+} // namespace
+
+// Every panel is a new one here.
+void RememberPanel(NSOpenPanel*)
+{
+}
+void RestorePanel(NSOpenPanel*)
+{
+}
+void CompletePanel(NSOpenPanel*, NSView*)
+{
+}
+
+// The panel filters again when it comes to a folder, so it is sent away and back.
+void FilterPanelAnew(NSOpenPanel* panel, NSURL* elsewhere)
+{
+    [panel validateVisibleColumns];
+    NSURL* folder = [[[panel directoryURL] retain] autorelease];
+    [panel setDirectoryURL:elsewhere];
+    [panel setDirectoryURL:folder];
+}
+
+NSString* ResolveLinksAndAliases(NSString* path)
+{
+    return originalOf([path stringByResolvingSymlinksInPath]);
+}
+
+bool FileExists(NSString* path, bool& isFolder)
+{
+    FSRef reference;
+    Boolean folder = false;
+    const auto text = reinterpret_cast<const UInt8*>([path UTF8String]);
+    if (FSPathMakeRef(text, &reference, &folder) != noErr)
+        return false;
+    isFolder = folder;
+    return true;
+}
+
+bool IsFilePackage(NSString* path)
+{
+    return [[NSWorkspace sharedWorkspace] isFilePackageAtPath:path];
+}
+
+// Bindings do it.
+void AdoptTableSelection(NSTableView*, NSArrayController*)
+{
+}
+
+void CompleteSegments(NSSegmentedControl*)
+{
+}
+
+NSInteger TakeSegmentClick(NSSegmentedControl* segments)
+{
+    return [segments selectedSegment];
+}
+} // namespace ModrigPlatform

@@ -1,0 +1,170 @@
+#import "ui/NSSavePanel+ModrigRuntime.h"
+
+#include <sys/stat.h>
+
+#include <iterator>
+
+#include "ui/platform/Platform.h"
+
+@interface NSSavePanel (ModrigBrowser)
+- (void)modrigFilterAnew;
+@end
+
+@implementation NSSavePanel (ModrigRuntime)
+
+- (NSButton*)okButton
+{
+    return _okButton;
+}
+
+- (NSButton*)cancelButton
+{
+    return [[self contentView] viewWithTag:NSFileHandlingPanelCancelButton];
+}
+
+// The toolkit's panel has none; the button that leads to the home folder stands at the start of the row.
+- (NSButton*)hideExtensionButton
+{
+    return [[self contentView] viewWithTag:NSFileHandlingPanelHomeButton];
+}
+
+@end
+
+@implementation NSSavePanel (ModrigBrowser)
+
+// -validateVisibleColumns would empty the columns of the browser and lose the path.
+- (void)modrigFilterAnew
+{
+    NSString* folder = [self directory];
+    [_browser loadColumnZero];
+    [_browser setPath:folder];
+    [_okButton setEnabled:NO];
+}
+
+@end
+
+namespace ModrigPlatform
+{
+namespace
+{
+// A button of the shared panel as it was.
+struct ButtonState
+{
+    NSButton* button;
+    NSString* title;
+    id target;
+    SEL action;
+    NSRect frame;
+    BOOL hidden;
+};
+
+// Everything on the panel's button row: it is the dialog's while that is open.
+constexpr NSInteger kButtonTags[] = {NSFileHandlingPanelOKButton, NSFileHandlingPanelCancelButton,
+                                     NSFileHandlingPanelHomeButton, NSFileHandlingPanelDiskButton,
+                                     NSFileHandlingPanelDiskEjectButton};
+ButtonState gButtons[std::size(kButtonTags)];
+
+ButtonState stateOf(NSButton* button)
+{
+    return {button,          [[button title] retain], [button target],
+            [button action], [button frame],          [button isHidden]};
+}
+
+void giveBack(const ButtonState& state)
+{
+    [state.button setTitle:state.title];
+    [state.button setTarget:state.target];
+    [state.button setAction:state.action];
+    [state.button setFrame:state.frame];
+    [state.button setHidden:state.hidden];
+    [state.title release];
+}
+
+// What leads to other disks is of no use among a host's applications.
+void hideUnusedButtons(NSView* panelView)
+{
+    for (const NSInteger tag :
+         {NSFileHandlingPanelHomeButton, NSFileHandlingPanelDiskButton, NSFileHandlingPanelDiskEjectButton})
+        [[panelView viewWithTag:tag] setHidden:YES];
+}
+
+// The order in which Tab walks: through the panel's own parts, then through the dialog's view and back.
+void joinKeyViews(NSOpenPanel* panel, NSView* view)
+{
+    (void)panel;
+    (void)view;
+}
+} // namespace
+
+void RememberPanel(NSOpenPanel* panel)
+{
+    NSView* panelView = [panel contentView];
+    for (std::size_t index = 0; index < std::size(kButtonTags); ++index)
+        gButtons[index] = stateOf([panelView viewWithTag:kButtonTags[index]]);
+}
+
+void RestorePanel(NSOpenPanel* panel)
+{
+    [panel setDelegate:nil];
+    for (const ButtonState& state : gButtons)
+        giveBack(state);
+}
+
+// The panel has placed the view among its own parts already; there is no frame around it to fill.
+void FitAccessoryView(NSView* view)
+{
+    [view setAutoresizingMask:[view autoresizingMask] | NSViewWidthSizable];
+}
+
+void CompletePanel(NSOpenPanel* panel, NSView* view)
+{
+    hideUnusedButtons([panel contentView]);
+    joinKeyViews(panel, view);
+}
+
+void FilterPanelAnew(NSOpenPanel* panel, NSURL*)
+{
+    [panel modrigFilterAnew];
+}
+
+NSString* ResolveLinksAndAliases(NSString* path)
+{
+    return [path stringByResolvingSymlinksInPath]; // there are no aliases here
+}
+
+bool FileExists(NSString* path, bool& isFolder)
+{
+    struct stat status;
+    if (stat([path fileSystemRepresentation], &status) != 0)
+        return false;
+    isFolder = S_ISDIR(status.st_mode);
+    return true;
+}
+
+bool IsFilePackage(NSString* path)
+{
+    return [[NSWorkspace sharedWorkspace] isFilePackageAtPath:path];
+}
+
+// Bindings lead from the controller to the table only.
+void AdoptTableSelection(NSTableView* table, NSArrayController* rows)
+{
+    [rows setSelectionIndexes:[table selectedRowIndexes]];
+}
+
+// Labels are lost on the way from the window file.
+void CompleteSegments(NSSegmentedControl* segments)
+{
+    [segments setLabel:@"+" forSegment:0];
+    [segments setLabel:@"\u2212" forSegment:1];
+}
+
+// A click on a disabled segment repeats the last one unless that has been taken back.
+NSInteger TakeSegmentClick(NSSegmentedControl* segments)
+{
+    const NSInteger clicked = [segments selectedSegment];
+    if (clicked >= 0)
+        [segments setSelected:NO forSegment:clicked];
+    return clicked;
+}
+} // namespace ModrigPlatform
