@@ -9,13 +9,14 @@ function(add_resource_module target script output)
   cmake_path(ABSOLUTE_PATH script BASE_DIRECTORY "${CMAKE_CURRENT_SOURCE_DIR}")
   cmake_path(GET output PARENT_PATH folder)
   cmake_path(GET output FILENAME name)
-  set(compiled "${CMAKE_CURRENT_BINARY_DIR}/${target}.res")
+  set(scratch "${CMAKE_BINARY_DIR}/resource_modules")
+  set(compiled "${scratch}/${target}.res")
   # The linker insists on an import library; nobody reads it.
-  set(import_library "${CMAKE_CURRENT_BINARY_DIR}/${target}.lib")
+  set(import_library "${scratch}/${target}.lib")
   add_custom_command(
     OUTPUT "${output}"
     BYPRODUCTS "${compiled}"
-    COMMAND ${CMAKE_COMMAND} -E make_directory "${folder}"
+    COMMAND ${CMAKE_COMMAND} -E make_directory "${folder}" "${scratch}"
     COMMAND ${RESOURCE_COMPILER} /no-preprocess /C 65001 /FO "${compiled}" "${script}"
     COMMAND ${RESOURCE_LINKER} /dll /noentry /machine:x64 /Brepro "/implib:${import_library}" "/out:${output}"
             "${compiled}"
