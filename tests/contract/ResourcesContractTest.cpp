@@ -79,6 +79,17 @@ TEST_F(ResourcesContract, LooksInTheCurrentModuleWhenNoneIsNamed)
     EXPECT_NE(FreeLibrary(second), 0);
 }
 
+TEST_F(ResourcesContract, TakesBothSeparators)
+{
+    host->makeFolder(L"folder");
+    std::wstring path = host->makeResourceModule(L"folder/Texts.dll", {{1, L"one"}});
+    path[path.rfind(L'/')] = L'\\';
+    const HMODULE module = LoadLibrary(path.c_str());
+    ASSERT_NE(module, nullptr);
+    EXPECT_EQ(text(module, 1), L"one");
+    EXPECT_NE(FreeLibrary(module), 0);
+}
+
 TEST_F(ResourcesContract, SaysWhichModuleIsMissing)
 {
     const std::wstring path = host->makeFolder(L"folder") + L"/None.dll";

@@ -5,27 +5,36 @@
 
 #include "tests/support/RecordingHost.h"
 
+namespace
+{
+std::wstring withSlashes(std::wstring name)
+{
+    std::replace(name.begin(), name.end(), L'\\', L'/');
+    return name;
+}
+} // namespace
+
 void RecordingResources::addModule(const std::wstring& name, Texts texts)
 {
-    if (const auto found = mModules.find(name); found != mModules.end())
+    if (const auto found = mModules.find(withSlashes(name)); found != mModules.end())
         *found->second = std::move(texts);
     else
-        mModules[name] = std::make_shared<Texts>(std::move(texts));
+        mModules[withSlashes(name)] = std::make_shared<Texts>(std::move(texts));
 }
 
 void RecordingResources::removeModule(const std::wstring& name)
 {
-    mModules.erase(name);
+    mModules.erase(withSlashes(name));
 }
 
 void RecordingResources::setText(const std::wstring& name, unsigned id, const std::wstring& text)
 {
-    (*mModules.at(name))[id] = text;
+    (*mModules.at(withSlashes(name)))[id] = text;
 }
 
 void RecordingResources::removeText(const std::wstring& name, unsigned id)
 {
-    mModules.at(name)->erase(id);
+    mModules.at(withSlashes(name))->erase(id);
 }
 
 bool RecordingResources::isOpen(HMODULE module) const
@@ -40,7 +49,7 @@ std::wstring RecordingResources::nameOf(HMODULE module) const
 
 HMODULE RecordingResources::load(const std::wstring& name)
 {
-    const auto found = mModules.find(name);
+    const auto found = mModules.find(withSlashes(name));
     return found == mModules.end() ? nullptr : &mOpen.emplace_back(TsResourceModule{name, found->second});
 }
 

@@ -21,7 +21,8 @@ class RecordingResources
 public:
     using Texts = std::map<unsigned, std::wstring>;
 
-    // From now on `LoadLibrary` finds a module by exactly this name (a second call replaces its texts).
+    // From now on `LoadLibrary` finds a module by exactly this name, with either separator (a second call
+    // replaces its texts).
     void addModule(const std::wstring& name, Texts texts);
     // From now on it does not; handles that are open keep their texts.
     void removeModule(const std::wstring& name);
