@@ -1,0 +1,20 @@
+// A look at a shared library before the system maps it. The system's linker trusts the headers: a file that
+// was cut short ends the process at the first touch of a page that is not there.
+//
+// The check reads headers only and costs a few microseconds. It vouches for what the headers say about the
+// file's extent and layout, not for the code and data between them: a changed byte there cannot be seen.
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <functional>
+#include <string_view>
+
+namespace tessel
+{
+// Fills the buffer with bytes of the file from an offset; false when the file does not hold that many there.
+using ReadAt = std::function<bool(std::uint64_t offset, void* buffer, std::size_t size)>;
+
+// Why the file must not be mapped, as the end of a sentence; empty when nothing speaks against it.
+std::wstring_view whyNotMappable(std::uint64_t fileSize, const ReadAt& readAt);
+} // namespace tessel

@@ -1,0 +1,52 @@
+// A plain file, open for reading. Whatever else stands at a path (a folder, a pipe, a device, nothing) is
+// told apart in words, without ever waiting for it.
+#pragma once
+
+#include <compare>
+#include <cstddef>
+#include <cstdint>
+#include <string>
+
+#include <sys/types.h>
+
+namespace tessel
+{
+// Which file it is, however its path is spelled and through whatever links it was reached.
+struct FileIdentity
+{
+    dev_t device = 0;
+    ino_t inode = 0;
+
+    auto operator<=>(const FileIdentity&) const = default;
+};
+
+class RegularFile
+{
+public:
+    explicit RegularFile(const std::string& path);
+    ~RegularFile();
+    RegularFile(const RegularFile&) = delete;
+    RegularFile& operator=(const RegularFile&) = delete;
+
+    bool isOpen() const { return mDescriptor >= 0; }
+    // Whether nothing stands at the path at all.
+    bool isMissing() const { return mMissing; }
+    // Why it is not open, as the end of a sentence; empty when it is.
+    const std::wstring& whyNot() const { return mWhyNot; }
+
+    const FileIdentity& identity() const { return mIdentity; }
+    std::uint64_t size() const { return mSize; }
+
+    // Fills the buffer from an offset; false when the file does not hold that many bytes there.
+    bool read(std::uint64_t offset, void* buffer, std::size_t size) const;
+
+private:
+    void refuse(std::wstring whyNot);
+
+    int mDescriptor = -1;
+    bool mMissing = false;
+    std::wstring mWhyNot;
+    FileIdentity mIdentity;
+    std::uint64_t mSize = 0;
+};
+} // namespace tessel
