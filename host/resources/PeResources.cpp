@@ -1,0 +1,274 @@
+#include "host/resources/PeResources.h"
+
+#include <utility>
+
+#include "host/resources/ByteReader.h"
+
+namespace tessel
+{
+namespace
+{
+// Of the file's headers.
+constexpr std::uint16_t kDosMark = 0x5a4d;
+constexpr std::size_t kPeOffsetAt = 0x3c;
+constexpr std::uint32_t kPeMark = 0x4550;
+constexpr std::size_t kOptionalHeaderAt = 24; // from the PE mark
+constexpr std::uint16_t kMark32 = 0x10b;
+constexpr std::uint16_t kMark64 = 0x20b;
+constexpr std::size_t kDirectories32At = 96; // from the optional header
+constexpr std::size_t kDirectories64At = 112;
+constexpr std::size_t kDirectorySize = 8;
+constexpr std::uint32_t kResourceDirectory = 2;
+constexpr std::size_t kSectionHeaderSize = 40;
+
+// Of the tree of resources: types, numbers, languages.
+constexpr std::size_t kNodeSize = 16;
+constexpr std::size_t kEntrySize = 8;
+constexpr std::uint32_t kIsNode = 0x80000000;
+constexpr std::uint32_t kStringTables = 6;
+constexpr unsigned kTextsPerBlock = 16;
+constexpr std::size_t kUnitSize = 2; // a UTF-16 code unit
+
+constexpr const wchar_t* kCutShort = L"the file is cut short";
+constexpr const wchar_t* kNoLibrary = L"it is not a Windows library";
+constexpr const wchar_t* kNoResources = L"it holds no resources";
+constexpr const wchar_t* kBadSections = L"its table of sections is damaged";
+constexpr const wchar_t* kBadTree = L"its resources are damaged";
+constexpr const wchar_t* kBadTexts = L"its string tables are damaged";
+
+struct Extent
+{
+    std::size_t offset = 0;
+    std::size_t size = 0;
+};
+
+struct Section
+{
+    std::uint32_t address = 0; // in memory
+    std::uint32_t memorySize = 0;
+    Extent inFile;
+};
+
+struct Headers
+{
+    std::uint32_t resourceAddress = 0;
+    std::uint32_t resourceSize = 0;
+    std::size_t sectionsAt = 0;
+    unsigned sectionCount = 0;
+};
+
+std::size_t directoriesIn(const ByteReader& file, std::size_t optionalHeader)
+{
+    switch (file.u16(optionalHeader))
+    {
+    case kMark32:
+        return optionalHeader + kDirectories32At;
+    case kMark64:
+        return optionalHeader + kDirectories64At;
+    default:
+        throw DamagedFile{kNoLibrary};
+    }
+}
+
+Headers headersOf(const ByteReader& file)
+{
+    if (file.u16(0) != kDosMark)
+        throw DamagedFile{kNoLibrary};
+    const std::size_t mark = file.u32(kPeOffsetAt);
+    if (file.u32(mark) != kPeMark)
+        throw DamagedFile{kNoLibrary};
+    const std::size_t optionalHeader = mark + kOptionalHeaderAt;
+    const std::size_t directories = directoriesIn(file, optionalHeader);
+    Headers headers;
+    headers.sectionCount = file.u16(mark + 6);
+    headers.sectionsAt = optionalHeader + file.u16(mark + 20);
+    const std::uint32_t directoryCount = file.u32(directories - 4);
+    const std::size_t entry = directories + kResourceDirectory * kDirectorySize;
+    if (directoryCount <= kResourceDirectory || entry + kDirectorySize > headers.sectionsAt)
+        throw DamagedFile{kNoResources};
+    headers.resourceAddress = file.u32(entry);
+    headers.resourceSize = file.u32(entry + 4);
+    if (headers.resourceAddress == 0 || headers.resourceSize == 0)
+        throw DamagedFile{kNoResources};
+    return headers;
+}
+
+Section sectionAt(const ByteReader& file, std::size_t header)
+{
+    const Section section{
+        file.u32(header + 12), file.u32(header + 8), {file.u32(header + 20), file.u32(header + 16)}};
+    file.part(section.inFile.offset, section.inFile.size); // the file has to hold all of it
+    return section;
+}
+
+// Where the file holds the tree of resources: from its root to the end of its section.
+Extent resourcesIn(const ByteReader& file, const Headers& headers)
+{
+    std::optional<Extent> found;
+    std::uint64_t freeFrom = 0; // sections follow one another in memory
+    for (unsigned i = 0; i < headers.sectionCount; ++i)
+    {
+        const Section section = sectionAt(file, headers.sectionsAt + i * kSectionHeaderSize);
+        if (section.address < freeFrom)
+            throw DamagedFile{kBadSections};
+        freeFrom = std::uint64_t{section.address} + section.memorySize;
+        if (headers.resourceAddress < section.address ||
+            headers.resourceAddress - section.address >= section.inFile.size)
+            continue;
+        const std::size_t distance = headers.resourceAddress - section.address;
+        found = {section.inFile.offset + distance, section.inFile.size - distance};
+    }
+    if (!found || headers.resourceSize > found->size)
+        throw DamagedFile{kBadSections};
+    return *found;
+}
+
+// One node of the tree: its entries are named ones first, then numbered ones in rising order.
+class Node
+{
+public:
+    Node(const ByteReader& tree, std::size_t offset)
+        : mTree(tree), mEntries(offset + kNodeSize), mNamed(tree.u16(offset + 12)),
+          mCount(mNamed + tree.u16(offset + 14))
+    {
+        tree.part(mEntries, mCount * kEntrySize);
+    }
+
+    unsigned firstNumbered() const { return mNamed; }
+    unsigned count() const { return mCount; }
+    std::uint32_t number(unsigned entry) const { return mTree.u32(mEntries + entry * kEntrySize); }
+
+    Node child(unsigned entry) const
+    {
+        const std::uint32_t target = mTree.u32(mEntries + entry * kEntrySize + 4);
+        if ((target & kIsNode) == 0)
+            throw DamagedFile{kBadTree};
+        return {mTree, target & ~kIsNode};
+    }
+    // The offset of the description of what hangs here.
+    std::size_t leaf(unsigned entry) const
+    {
+        const std::uint32_t target = mTree.u32(mEntries + entry * kEntrySize + 4);
+        if ((target & kIsNode) != 0)
+            throw DamagedFile{kBadTree};
+        return target;
+    }
+
+private:
+    const ByteReader& mTree;
+    std::size_t mEntries;
+    unsigned mNamed;
+    unsigned mCount;
+};
+
+// The extent, in the tree, of the block that hangs below a node of languages.
+Extent blockBelow(const Node& languages, const ByteReader& tree, std::uint32_t treeAddress)
+{
+    if (languages.count() == 0)
+        throw DamagedFile{kBadTree};
+    const std::size_t leaf = languages.leaf(0);
+    const std::uint32_t address = tree.u32(leaf);
+    const std::uint32_t size = tree.u32(leaf + 4);
+    if (address < treeAddress)
+        throw DamagedFile{kBadTree};
+    tree.part(address - treeAddress, size);
+    return {address - treeAddress, size};
+}
+
+// Sixteen texts, each behind its length, have to stand in the block.
+void checkTexts(const ByteReader& block)
+{
+    std::size_t offset = 0;
+    for (unsigned i = 0; i < kTextsPerBlock; ++i)
+    {
+        const std::size_t size = kUnitSize + block.u16(offset) * kUnitSize;
+        block.part(offset, size);
+        offset += size;
+    }
+}
+
+// The blocks of texts by their numbers, and where each begins in the tree.
+std::map<unsigned, std::size_t> blocksIn(std::span<const std::uint8_t> bytes, std::uint32_t treeAddress)
+{
+    std::map<unsigned, std::size_t> blocks;
+    const ByteReader tree(bytes, kBadTree);
+    const Node types(tree, 0);
+    for (unsigned type = types.firstNumbered(); type < types.count(); ++type)
+    {
+        if (types.number(type) != kStringTables)
+            continue;
+        const Node tables = types.child(type);
+        for (unsigned i = tables.firstNumbered(); i < tables.count(); ++i)
+        {
+            const unsigned number = tables.number(i);
+            if (!blocks.empty() && number <= blocks.rbegin()->first)
+                throw DamagedFile{kBadTree};
+            const Extent block = blockBelow(tables.child(i), tree, treeAddress);
+            checkTexts({tree.part(block.offset, block.size), kBadTexts});
+            blocks.emplace_hint(blocks.end(), number, block.offset);
+        }
+    }
+    return blocks;
+}
+
+bool isFirstHalf(std::uint32_t unit)
+{
+    return unit >= 0xd800 && unit < 0xdc00;
+}
+
+bool isSecondHalf(std::uint32_t unit)
+{
+    return unit >= 0xdc00 && unit < 0xe000;
+}
+
+std::wstring decode(const ByteReader& units)
+{
+    constexpr wchar_t kNoCharacter = 0xfffd;
+    std::wstring text;
+    for (std::size_t at = 0; at < units.size(); at += kUnitSize)
+    {
+        const std::uint32_t unit = units.u16(at);
+        const std::uint32_t next = at + kUnitSize < units.size() ? units.u16(at + kUnitSize) : 0;
+        if (isFirstHalf(unit) && isSecondHalf(next))
+        {
+            text += static_cast<wchar_t>(0x10000 + ((unit - 0xd800) << 10) + (next - 0xdc00));
+            at += kUnitSize;
+        }
+        else
+            text += isFirstHalf(unit) || isSecondHalf(unit) ? kNoCharacter : static_cast<wchar_t>(unit);
+    }
+    return text;
+}
+} // namespace
+
+std::optional<PeResources> PeResources::read(std::vector<std::uint8_t> bytes, std::wstring& whyNot)
+try
+{
+    const ByteReader file(bytes, kCutShort);
+    const Headers headers = headersOf(file);
+    const Extent tree = resourcesIn(file, headers);
+    PeResources result;
+    result.mBlocks = blocksIn(file.part(tree.offset, tree.size), headers.resourceAddress);
+    for (auto& block : result.mBlocks)
+        block.second += tree.offset;
+    result.mBytes = std::move(bytes);
+    return result;
+}
+catch (const DamagedFile& damage)
+{
+    whyNot = damage.why;
+    return std::nullopt;
+}
+
+std::wstring PeResources::string(unsigned id) const
+{
+    const auto block = mBlocks.find(id / kTextsPerBlock + 1);
+    if (block == mBlocks.end())
+        return {};
+    const ByteReader file(mBytes, kBadTexts); // checked when the file was read: nothing is outside
+    std::size_t offset = block->second;
+    for (unsigned i = 0; i < id % kTextsPerBlock; ++i)
+        offset += kUnitSize + file.u16(offset) * kUnitSize;
+    return decode({file.part(offset + kUnitSize, file.u16(offset) * kUnitSize), kBadTexts});
+}
+} // namespace tessel

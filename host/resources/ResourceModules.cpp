@@ -1,0 +1,138 @@
+#include "host/resources/ResourceModules.h"
+
+#include <algorithm>
+#include <filesystem>
+#include <utility>
+
+#include "host/Services.h"
+#include "host/console/CommandLine.h"
+#include "host/linker/Bundle.h"
+#include "host/linker/CallingApplication.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr wchar_t kSeparator = L'/';
+constexpr std::uint64_t kLargestFile = 64 * 1024 * 1024;
+// Handles rise from here; smaller values could be taken for the ids of texts.
+constexpr std::uintptr_t kHandlesBegin = 0x10000;
+
+std::wstring withOneKindOfSeparator(const wchar_t* name)
+{
+    std::wstring result = name ? name : L"";
+    std::ranges::replace(result, L'\\', kSeparator);
+    return result;
+}
+
+// Where the application's resources are; empty outside of a call.
+std::wstring resourcesOf(const std::wstring& application)
+{
+    if (!isBundlePath(toUtf8(application)))
+        return application.substr(0, application.rfind(kSeparator) + 1);
+    for (const wchar_t* folder : {L"/Resources", L"/Contents/Resources"})
+    {
+        std::error_code failed; // what cannot be reached holds nothing that we could open
+        if (std::filesystem::is_directory(toUtf8(application + folder), failed))
+            return application + folder;
+    }
+    return application;
+}
+
+std::wstring joined(const std::vector<std::wstring>& places)
+{
+    std::wstring result;
+    for (const auto& place : places)
+        result += (result.empty() ? L"\"" : L" and no \"") + place + L"\"";
+    return result;
+}
+
+void say(const std::wstring& name, const std::wstring& whyNot)
+{
+    services().commandLine->say(L"The resource module \"" + name + L"\" cannot be opened: " + whyNot + L".");
+}
+} // namespace
+
+ResourceModules::ResourceModules(std::wstring hostFolder)
+    : mHostFolder(std::move(hostFolder)), mLastHandle(kHandlesBegin)
+{
+}
+
+std::vector<std::wstring> ResourceModules::placesOf(const std::wstring& name) const
+{
+    if (name.starts_with(kSeparator))
+        return {name};
+    std::vector<std::wstring> places;
+    for (const std::wstring& folder : {resourcesOf(services().callingApplication->path()), mHostFolder})
+        if (!folder.empty())
+            places.push_back(folder + (folder.ends_with(kSeparator) ? L"" : L"/") + name);
+    return places;
+}
+
+HMODULE ResourceModules::open(const wchar_t* name)
+{
+    const std::wstring plainName = withOneKindOfSeparator(name);
+    if (plainName.empty())
+    {
+        say(plainName, L"it has no name");
+        return nullptr;
+    }
+    const auto places = placesOf(plainName);
+    for (const std::wstring& place : places)
+    {
+        const RegularFile file(toUtf8(place));
+        if (file.isMissing())
+            continue;
+        std::wstring whyNot;
+        const HMODULE module = openFile(file, whyNot);
+        if (!module)
+            say(place, whyNot);
+        return module;
+    }
+    say(plainName, L"there is no " + joined(places));
+    return nullptr;
+}
+
+HMODULE ResourceModules::openFile(const RegularFile& file, std::wstring& whyNot)
+{
+    const auto known = std::ranges::find_if(mEntries, [&](const auto& entry)
+                                            { return entry.second.identity == file.identity(); });
+    if (file.isOpen() && known != mEntries.end())
+    {
+        ++known->second.references;
+        return known->first;
+    }
+    whyNot = file.size() > kLargestFile ? L"the file is too large for a resource module" : file.whyNot();
+    if (!whyNot.empty())
+        return nullptr;
+    std::vector<std::uint8_t> bytes(file.size());
+    if (!file.read(0, bytes.data(), bytes.size()))
+    {
+        whyNot = L"the file cannot be read";
+        return nullptr;
+    }
+    auto resources = PeResources::read(std::move(bytes), whyNot);
+    if (!resources)
+        return nullptr;
+    const auto handle = reinterpret_cast<HMODULE>(++mLastHandle);
+    mEntries.emplace(handle, Entry{file.identity(), std::move(*resources), 1});
+    return handle;
+}
+
+bool ResourceModules::close(HMODULE module)
+{
+    const auto entry = mEntries.find(module);
+    if (entry == mEntries.end())
+        return false;
+    if (--entry->second.references == 0)
+        mEntries.erase(entry);
+    return true;
+}
+
+std::wstring ResourceModules::string(HMODULE module, unsigned id) const
+{
+    const auto entry = mEntries.find(module ? module : mCurrent);
+    return entry == mEntries.end() ? std::wstring() : entry->second.resources.string(id);
+}
+} // namespace tessel
