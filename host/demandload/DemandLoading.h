@@ -1,0 +1,33 @@
+// Loads applications that nobody has asked for by name: at the host's start, and when one of their commands
+// is typed. The host's records say which; what lies in the host's PlugIns folder and has no record yet is
+// loaded at every start, because only then can it tell how it wants to be loaded.
+#pragma once
+
+#include <filesystem>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace tessel
+{
+class DemandLoading
+{
+public:
+    explicit DemandLoading(std::filesystem::path plugInsFolder);
+
+    // Loads what is due at the start: by the records, in their order, then from the PlugIns folder, by name.
+    // What cannot be loaded is explained on the command line, and the start goes on.
+    void loadAtStart() const;
+
+    // Loads the application that has such a command, by its local or its global name, in any case of letters,
+    // and that wants to be loaded for it. A "_" in front means the global name alone. False when nothing was
+    // loaded: nobody has such a command, its application is loaded already, or it cannot be loaded, which the
+    // command line has then been told.
+    bool loadForCommand(std::wstring_view name) const;
+
+private:
+    std::vector<std::filesystem::path> unrecordedPlugIns() const;
+
+    std::filesystem::path mPlugInsFolder;
+};
+} // namespace tessel
