@@ -1,0 +1,73 @@
+#include "tests/host_modules/HostWithModules.h"
+
+#include <dlfcn.h>
+
+HostWithModules::HostWithModules()
+{
+    auto& services = tessel::services();
+    services.commandLine = &mCommandLine;
+    services.callingApplication = &mCalls;
+    services.commands = &mCommands;
+    services.linker = &mLinker;
+    services.resources = &mResources;
+}
+
+HostWithModules::~HostWithModules()
+{
+    mLinker.unloadAll();
+    tessel::services() = {};
+}
+
+std::filesystem::path HostWithModules::fixture(const std::string& name) const
+{
+    return fixture(name, name);
+}
+
+std::filesystem::path HostWithModules::fixture(const std::string& name,
+                                               const std::filesystem::path& copy) const
+{
+    const auto target = mFolder / copy;
+    std::filesystem::create_directories(target.parent_path());
+    std::filesystem::copy(std::filesystem::path(FIXTURE_MODULES) / name, target,
+                          std::filesystem::copy_options::recursive);
+    return target;
+}
+
+bool HostWithModules::load(const std::filesystem::path& path)
+{
+    return mLinker.loadModule(tessel::toWide(path.native()).c_str(), true, true);
+}
+
+bool HostWithModules::unload(const std::filesystem::path& path)
+{
+    return mLinker.unloadModule(tessel::toWide(path.native()).c_str(), true);
+}
+
+std::wstring HostWithModules::names() const
+{
+    std::wstring result;
+    for (const auto& module : mLinker.loadedModules())
+        result += module.name + L" ";
+    return result;
+}
+
+std::string HostWithModules::output()
+{
+    return std::exchange(mOutput, {});
+}
+
+bool HostWithModules::isMapped(const std::filesystem::path& path)
+{
+    void* handle = dlopen(path.c_str(), RTLD_NOLOAD | RTLD_LAZY);
+    return handle && dlclose(handle) == 0;
+}
+
+std::string HostWithModules::notLoaded(const std::filesystem::path& path, const std::string& whyNot)
+{
+    return "The application \"" + path.native() + "\" is not loaded: " + whyNot + ".\n";
+}
+
+std::string HostWithModules::notUnloaded(const std::filesystem::path& path, const std::string& whyNot)
+{
+    return "The application \"" + path.native() + "\" is not unloaded: " + whyNot + ".\n";
+}

@@ -1,0 +1,57 @@
+// A host with the parts that loading needs, its output in a text, and a throwaway folder for modules.
+#pragma once
+
+#include <filesystem>
+#include <string>
+
+#include <gtest/gtest.h>
+
+#include "host/Services.h"
+#include "host/commands/CommandStack.h"
+#include "host/console/CommandLine.h"
+#include "host/linker/CallingApplication.h"
+#include "host/linker/DynamicLinker.h"
+#include "host/resources/ResourceModules.h"
+#include "host/text/Unicode.h"
+#include "tests/support/TemporaryFolder.h"
+
+class HostWithModules : public testing::Test
+{
+public:
+    HostWithModules();
+    ~HostWithModules() override;
+    HostWithModules(const HostWithModules&) = delete;
+    HostWithModules& operator=(const HostWithModules&) = delete;
+
+protected:
+    // A copy of a fixture module in the throwaway folder, so that no other test has mapped it.
+    std::filesystem::path fixture(const std::string& name) const;
+    std::filesystem::path fixture(const std::string& name, const std::filesystem::path& copy) const;
+
+    bool load(const std::filesystem::path& path);
+    bool unload(const std::filesystem::path& path);
+    std::wstring names() const; // of the loaded modules, each with a blank behind it
+
+    // What was printed since the last call.
+    std::string output();
+
+    static bool isMapped(const std::filesystem::path& path);
+    // The sentence for a module that is not loaded.
+    static std::string notLoaded(const std::filesystem::path& path, const std::string& whyNot);
+    static std::string notUnloaded(const std::filesystem::path& path, const std::string& whyNot);
+
+    TemporaryFolder mFolder;
+
+private:
+    std::string mOutput;
+
+protected:
+    tessel::CommandLine mCommandLine{[this](std::string_view piece)
+                                     {
+                                         mOutput += piece;
+                                     }};
+    tessel::CallingApplication mCalls;
+    tessel::CommandStack mCommands;
+    tessel::DynamicLinker mLinker;
+    tessel::ResourceModules mResources{tessel::toWide((mFolder / "HostResources").native())};
+};

@@ -1,0 +1,180 @@
+#include "tests/host_modules/HostWithModules.h"
+
+#include <algorithm>
+#include <iterator>
+
+#include <tessel/tsed.h>
+
+class Unloading : public HostWithModules
+{
+};
+
+TEST_F(Unloading, SendsMessage2AndTakesTheLibraryOut)
+{
+    for (const char* name : {"Good.zmb", "Good.bundle"})
+    {
+        const auto path = fixture(name);
+        load(path);
+        output();
+        EXPECT_TRUE(unload(path));
+        EXPECT_EQ(output(), name + std::string(": message 2\n"));
+        EXPECT_FALSE(isMapped(name == std::string("Good.zmb") ? path : path / "Good"));
+    }
+    EXPECT_EQ(names(), L"");
+}
+
+TEST_F(Unloading, FindsTheApplicationThroughALink)
+{
+    const auto path = fixture("Good.zmb");
+    std::filesystem::create_symlink(path, mFolder / "link.zmb");
+    load(path);
+    EXPECT_TRUE(unload(mFolder / "link.zmb"));
+    EXPECT_EQ(names(), L"");
+}
+
+TEST_F(Unloading, TakesTheCommandsAlong)
+{
+    const auto path = fixture("Command.zmb");
+    load(path);
+    EXPECT_TRUE(mCommands.run(L"pfad"));
+    EXPECT_EQ(output(), "Command.zmb: message 1\n" + path.native() + "\n");
+    EXPECT_TRUE(unload(path));
+    EXPECT_TRUE(mCommands.names().empty());
+}
+
+TEST_F(Unloading, SaysThatNothingIsLoadedFromThePath)
+{
+    const auto path = fixture("Good.zmb");
+    EXPECT_FALSE(unload(path));
+    EXPECT_EQ(output(), notUnloaded(path, "it is not loaded"));
+}
+
+TEST_F(Unloading, KeepsAnApplicationThatAnswersAnErrorOrThrows)
+{
+    const std::pair<const char*, const char*> cases[] = {
+        {"RefusesToUnload.omp", "its entry point answered 3"},
+        {"ThrowsAtUnload.zmb", "its entry point threw an exception: the door is stuck"}};
+    for (const auto& [name, whyNot] : cases)
+    {
+        const auto path = fixture(name);
+        load(path);
+        output();
+        EXPECT_FALSE(unload(path));
+        EXPECT_EQ(output(), name + std::string(": message 2\n") + notUnloaded(path, whyNot));
+    }
+    EXPECT_EQ(names(), L"RefusesToUnload.omp ThrowsAtUnload.zmb ");
+}
+
+TEST_F(Unloading, KeepsALockedApplicationUntilItAllowsIt)
+{
+    const auto path = fixture("LocksItself.zmb");
+    const std::wstring widePath = tessel::toWide(path.native());
+    EXPECT_FALSE(mLinker.isModuleLocked(widePath.c_str()));
+    load(path);
+    output();
+    EXPECT_TRUE(mLinker.isModuleLocked(widePath.c_str()));
+    EXPECT_TRUE(mLinker.loadedModules()[0].locked);
+    EXPECT_FALSE(unload(path));
+    EXPECT_EQ(output(), notUnloaded(path, "it is locked"));
+    mCommands.run(L"UNLOCK");
+    EXPECT_FALSE(mLinker.isModuleLocked(widePath.c_str()));
+    EXPECT_TRUE(unload(path));
+    EXPECT_EQ(output(), "LocksItself.zmb: message 2\n");
+}
+
+TEST_F(Unloading, KeepsAnApplicationWhileOneOfItsCommandsRuns)
+{
+    const auto path = fixture("Command.zmb");
+    load(path);
+    output();
+    EXPECT_TRUE(mCommands.run(L"UNLOADMYSELF"));
+    EXPECT_EQ(output(), notUnloaded(path, "it is at work") + "still here\n");
+    EXPECT_EQ(names(), L"Command.zmb ");
+}
+
+TEST_F(Unloading, AnswersTruthfullyWhenTheSystemKeepsTheLibraryMapped)
+{
+    for (const char* name : {"StaysMapped.zmb", "Classes.bundle"})
+    {
+        const auto path = fixture(name);
+        load(path);
+        output();
+        EXPECT_FALSE(unload(path));
+        EXPECT_EQ(output(),
+                  name + std::string(": message 2\n") +
+                      notUnloaded(path, "it is out of service, but the system keeps its library mapped"));
+        EXPECT_TRUE(isMapped(name == std::string("StaysMapped.zmb") ? path : path / "Classes"));
+        EXPECT_EQ(names(), L"");
+        EXPECT_TRUE(load(path));
+        EXPECT_EQ(output().find(name + std::string(": message 1\n")), 0U);
+        EXPECT_EQ(names(), tessel::toWide(name) + L" ");
+        unload(path);
+    }
+}
+
+TEST_F(Unloading, EndsEverythingInReverseOrderWhenTheHostEnds)
+{
+    const auto locked = fixture("LocksItself.zmb");
+    const auto refusing = fixture("RefusesToUnload.omp");
+    for (const auto& path : {fixture("Good.zmb"), locked, refusing})
+        load(path);
+    output();
+    mLinker.unloadAll();
+    EXPECT_EQ(output(), "RefusesToUnload.omp: message 2\nThe application \"" + refusing.native() +
+                            "\" did not end as it should: its entry point answered 3.\n"
+                            "LocksItself.zmb: message 2\nGood.zmb: message 2\n");
+    EXPECT_EQ(names(), L"");
+    EXPECT_TRUE(isMapped(locked));
+    EXPECT_FALSE(load(locked));
+    EXPECT_EQ(output(), notLoaded(locked, "the host is ending"));
+}
+
+class LoadedModuleFunctions : public HostWithModules
+{
+};
+
+TEST_F(LoadedModuleFunctions, GiveNoListWhenNothingIsLoaded)
+{
+    EXPECT_EQ(tsedQmbLoaded(), nullptr);
+}
+
+TEST_F(LoadedModuleFunctions, ListTheNamesInTheOrderOfLoading)
+{
+    load(fixture("Good.zmb"));
+    load(fixture("Good.bundle"));
+    TsResultBuffer* list = tsedQmbLoaded();
+    ASSERT_NE(list, nullptr);
+    EXPECT_EQ(list->type, TS_STRING);
+    EXPECT_STREQ(list->value.string, L"Good.zmb");
+    ASSERT_NE(list->next, nullptr);
+    EXPECT_STREQ(list->next->value.string, L"Good.bundle");
+    EXPECT_EQ(list->next->next, nullptr);
+    tsutRelRb(list);
+}
+
+TEST_F(LoadedModuleFunctions, FindAPathByNameInAnyCaseAndTheFirstLoadedOfSeveral)
+{
+    const auto first = fixture("Good.zmb", "first/Größe.zmb");
+    const auto second = fixture("Good.zmb", "second/größe.ZMB");
+    load(first);
+    load(second);
+    wchar_t path[1024] = {};
+    EXPECT_EQ(tsedGetModuleFileName(L"GRÖSSE.zmb", path, std::size(path)), 1);
+    EXPECT_EQ(tsedGetModuleFileName(L"GRÖßE.ZMB", path, std::size(path)), 0);
+    EXPECT_EQ(path, tessel::toWide(first.native()));
+    unload(first);
+    EXPECT_EQ(tsedGetModuleFileName(L"größe.zmb", path, std::size(path)), 0);
+    EXPECT_EQ(path, tessel::toWide(second.native()));
+}
+
+TEST_F(LoadedModuleFunctions, LeaveTheBufferAloneWhenThePathDoesNotFit)
+{
+    const auto path = fixture("Good.zmb");
+    load(path);
+    std::wstring buffer(path.native().size(), L'?');
+    EXPECT_NE(tsedGetModuleFileName(L"Good.zmb", buffer.data(), buffer.size()), 0);
+    EXPECT_NE(tsedGetModuleFileName(L"Other.zmb", buffer.data(), buffer.size()), 0);
+    EXPECT_EQ(buffer, std::wstring(path.native().size(), L'?'));
+    buffer.resize(path.native().size() + 1);
+    EXPECT_EQ(tsedGetModuleFileName(L"Good.zmb", buffer.data(), buffer.size()), 0);
+}
