@@ -1,0 +1,133 @@
+#include "types/FileFilters.h"
+
+#include "tests/module/ModuleTest.h"
+
+using namespace ModrigUtils;
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+namespace
+{
+constexpr const wchar_t* kFirst = L"R21 Tessel|*.bundle;*.LSP|";
+constexpr const wchar_t* kBundles = L"Bundles|*.bundle|";
+
+class FileFilters : public ModuleTest
+{
+protected:
+    static std::wstring Readjusted()
+    {
+        CStdStr filter(L"what the caller had");
+        ReAdjustFilterString(filter);
+        return filter.Text();
+    }
+    static void SetText(unsigned id, const wchar_t* text)
+    {
+        host().resources.setText(kResourceModuleName, id, text);
+    }
+    static void Choose(const wchar_t* filter)
+    {
+        host().registry.setValue(host().moduleKey(), L"FileFilter", filter);
+    }
+};
+} // namespace
+
+TEST_F(FileFilters, RememberExactlyTheTextThatWasChosen)
+{
+    for (const wchar_t* choice : {L"Lisp source (*.lsp)", L" 100%s \\ \"ä\" ", L"x"})
+    {
+        EXPECT_TRUE(SetRegFileFilterListIndex(choice));
+        EXPECT_EQ(choice, GetRegFileFilterListIndex().Text());
+    }
+    EXPECT_EQ(L"x", host().registry.value(host().moduleKey(), L"FileFilter"));
+    EXPECT_THAT(boxes(), IsEmpty());
+}
+
+TEST_F(FileFilters, RememberNothingAtFirst)
+{
+    EXPECT_TRUE(GetRegFileFilterListIndex().IsEmpty());
+    EXPECT_THAT(boxes(), IsEmpty());
+}
+
+TEST_F(FileFilters, ForgetAChoiceThatIsTooLongToBeRead)
+{
+    Choose(std::wstring(1024, L'x').c_str());
+    EXPECT_TRUE(GetRegFileFilterListIndex().IsEmpty());
+}
+
+TEST_F(FileFilters, ReportAChoiceThatCannotBeStored)
+{
+    host().registry.failAfter(RecordingRegistry::Operation::kWrite, 0);
+    EXPECT_FALSE(SetRegFileFilterListIndex(L"Bundles"));
+    EXPECT_THAT(boxes(), ElementsAre(L"[24] %s")) << "the text as it stands, without an argument";
+}
+
+TEST_F(FileFilters, ReportAChoiceWhoseKeyCannotBeOpened)
+{
+    host().registry.failAfter(RecordingRegistry::Operation::kCreate, 0);
+    EXPECT_FALSE(SetRegFileFilterListIndex(L"Bundles"));
+    EXPECT_THAT(boxes(), ElementsAre(L"[24] %s"));
+}
+
+TEST_F(FileFilters, PutTheReleaseAndTheHostsNameIntoTheFirstDescription)
+{
+    host().applicationServices.productName = L"Tessel 100%s";
+    EXPECT_EQ(std::wstring(L"R21 Tessel 100%s|*.bundle;*.LSP|") + kBundles, Readjusted());
+}
+
+TEST_F(FileFilters, KeepOnlyPatternsOfApplications)
+{
+    SetText(26, L"Some|*.exe;*.zmb;*.*;*.OMP;*.dll");
+    EXPECT_EQ(std::wstring(kFirst) + L"Some|*.zmb;*.OMP|", Readjusted());
+}
+
+TEST_F(FileFilters, DropAnEntryWithoutAnyPatternLeft)
+{
+    SetText(26, L"Programs|*.exe;*.dll");
+    SetText(27, L"No patterns|");
+    SetText(28, L"No bar");
+    EXPECT_EQ(kFirst, Readjusted());
+}
+
+TEST_F(FileFilters, FollowTheOrderOfTheTableAndNotOfTheNumbers)
+{
+    for (const unsigned id : {26u, 27u, 28u, 29u, 46u, 47u, 51u})
+        SetText(id, (std::to_wstring(id) + L"|*.lsp").c_str());
+    EXPECT_EQ(std::wstring(kFirst) + L"26|*.lsp|51|*.lsp|27|*.lsp|28|*.lsp|29|*.lsp|46|*.lsp|47|*.lsp|",
+              Readjusted());
+}
+
+TEST_F(FileFilters, PutTheRememberedChoiceFirstAndKeepTheOrderOfTheOthers)
+{
+    SetText(51, L"Core|*.zmb");
+    SetText(27, L"Lisp|*.lsp");
+    Choose(L"CORE");
+    EXPECT_EQ(std::wstring(L"Core|*.zmb|") + kFirst + kBundles + L"Lisp|*.lsp|", Readjusted());
+}
+
+TEST_F(FileFilters, CompareTheChoiceWithTheWholeDescription)
+{
+    Choose(L"Bundle");
+    EXPECT_EQ(std::wstring(kFirst) + kBundles, Readjusted());
+    Choose(L"Bundles|*.bundle");
+    EXPECT_EQ(std::wstring(kFirst) + kBundles, Readjusted());
+    Choose(L"bundles");
+    EXPECT_EQ(std::wstring(kBundles) + kFirst, Readjusted());
+}
+
+TEST_F(FileFilters, LookUpNoPatternTwice)
+{
+    SetText(26, L"Some|;;*.lsp;;zmb;");
+    EXPECT_EQ(std::wstring(kFirst) + L"Some|*.lsp;zmb|", Readjusted());
+}
+
+TEST_F(FileFilters, AreEmptyWithoutTexts)
+{
+    host().resources.addModule(kResourceModuleName, {});
+    EXPECT_EQ(L"", Readjusted());
+}
+
+TEST_F(FileFilters, DoWithoutTheHostsServices)
+{
+    host().applicationServices.exist = false;
+    EXPECT_EQ(std::wstring(L"R21 |*.bundle;*.LSP|") + kBundles, Readjusted());
+}
