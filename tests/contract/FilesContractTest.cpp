@@ -2,6 +2,7 @@
 #include <wincompat/winfile.h>
 
 #include <cerrno>
+#include <ostream>
 
 #include "tests/contract/ContractTest.h"
 
@@ -119,6 +120,12 @@ struct Split
     const wchar_t* name;
     const wchar_t* extension;
 };
+
+// Names the case in the list of tests.
+void PrintTo(const Split& split, std::ostream* stream)
+{
+    *stream << testing::PrintToString(std::wstring(split.path));
+}
 
 class SplitPathContract : public ContractTest, public testing::WithParamInterface<Split>
 {
