@@ -3,7 +3,7 @@
 #include <sqlite3.h>
 #include <sys/stat.h>
 
-#include <iterator>
+#include <algorithm>
 
 #include "host/Services.h"
 #include "host/console/CommandLine.h"
@@ -22,6 +22,7 @@ constexpr std::uintptr_t kFirstHandle = 0x1000;
 constexpr unsigned kWritesFlushedAtOnce = 64;
 
 constexpr const char* kSchema =
+    "BEGIN IMMEDIATE;"
     "CREATE TABLE IF NOT EXISTS key(id INTEGER PRIMARY KEY AUTOINCREMENT,"
     " parent INTEGER NOT NULL REFERENCES key(id) ON DELETE CASCADE, name TEXT NOT NULL, fold TEXT NOT NULL,"
     " UNIQUE(parent, fold));"
@@ -32,7 +33,8 @@ constexpr const char* kSchema =
     "CREATE INDEX IF NOT EXISTS key_order ON key(parent, id);"
     "INSERT OR IGNORE INTO key(id, parent, name, fold)"
     " VALUES(1, 1, 'HKEY_CURRENT_USER', 'hkey_current_user');"
-    "PRAGMA user_version=1;";
+    "PRAGMA user_version=1;"
+    "COMMIT;";
 
 LONG statusOf(int sqlite)
 {
@@ -66,7 +68,7 @@ std::wstring_view takePart(std::wstring_view& path)
     return part;
 }
 
-int pragmaNumber(sqlite3* database, const char* sql, int& number)
+int firstNumber(sqlite3* database, const char* sql, int& number)
 {
     Statement statement;
     int status = statement.prepare(database, sql);
@@ -81,7 +83,7 @@ int pragmaNumber(sqlite3* database, const char* sql, int& number)
 
 struct Registry::Statements
 {
-    Statement findKey, insertKey, deleteKey, subKeys;
+    Statement findKey, keyExists, insertKey, deleteKey, subKeys;
     Statement readValue, writeValue, deleteValue, values, nextValue, valueAt;
     Statement begin, commit, rollback;
 
@@ -89,6 +91,7 @@ struct Registry::Statements
     {
         const std::pair<Statement&, const char*> all[] = {
             {findKey, "SELECT id FROM key WHERE parent=? AND fold=? AND id<>1"},
+            {keyExists, "SELECT 1 FROM key WHERE id=?"},
             {insertKey, "INSERT INTO key(parent,name,fold) VALUES(?,?,?)"},
             {deleteKey, "DELETE FROM key WHERE id=?"},
             {subKeys, "SELECT name FROM key WHERE parent=? AND id<>1 ORDER BY id"},
@@ -148,25 +151,39 @@ LONG Registry::openFile()
     return statusOf(sqlite3_busy_timeout(mDatabase, kBusyMilliseconds));
 }
 
+LONG Registry::checkOrigin(int& version)
+{
+    int tables = 0;
+    int status = firstNumber(mDatabase, "PRAGMA user_version", version);
+    if (status == SQLITE_OK && version < kSchemaVersion)
+        status = firstNumber(mDatabase, "SELECT count(*) FROM sqlite_master", tables);
+    if (version > kSchemaVersion)
+        mFailureWords = L"it was written by a newer Tessel";
+    // Another process may have made the registry between the two looks; then it says its version by now.
+    else if (tables > 0 && firstNumber(mDatabase, "PRAGMA user_version", version) == SQLITE_OK &&
+             version < kSchemaVersion)
+        mFailureWords = L"it belongs to another program";
+    return mFailureWords.empty() ? statusOf(status) : ERROR_ACCESS_DENIED;
+}
+
+// What is somebody else's is recognised before anything is written: the journal's kind is part of the file.
 LONG Registry::prepare()
 {
     int version = 0;
-    if (const int status = pragmaNumber(mDatabase, "PRAGMA user_version", version); status != SQLITE_OK)
-        return statusOf(status);
-    if (version > kSchemaVersion)
+    if (const LONG status = checkOrigin(version); status != ERROR_SUCCESS)
+        return status;
+    const auto run = [this](const char* sql)
     {
-        mFailureWords = L"it was written by a newer Tessel";
-        return ERROR_ACCESS_DENIED;
-    }
-    const char* settings = "PRAGMA synchronous=FULL; PRAGMA foreign_keys=ON;";
-    int status = sqlite3_exec(mDatabase, settings, nullptr, nullptr, nullptr);
-    if (status == SQLITE_OK && !mReadOnly)
-        status = sqlite3_exec(mDatabase, "PRAGMA journal_mode=WAL;", nullptr, nullptr, nullptr);
+        return sqlite3_exec(mDatabase, sql, nullptr, nullptr, nullptr);
+    };
+    int status = run("PRAGMA synchronous=FULL; PRAGMA foreign_keys=ON;");
     if (status == SQLITE_OK && version < kSchemaVersion && !mReadOnly)
-        status = sqlite3_exec(mDatabase, kSchema, nullptr, nullptr, nullptr);
+        status = run(kSchema);
     mStatements = std::make_unique<Statements>();
     if (status == SQLITE_OK)
         status = mStatements->prepare(mDatabase);
+    if (status == SQLITE_OK && !mReadOnly)
+        status = run("PRAGMA journal_mode=WAL;");
     return statusOf(status);
 }
 
@@ -178,7 +195,7 @@ std::wstring Registry::storeWords() const
 Registry::Key Registry::findChild(Key parent, std::wstring_view name)
 {
     Statement& find = mStatements->findKey;
-    if (find.bind(parent).bind(foldCase(name)).step() != SQLITE_ROW)
+    if (!isRow(find.bind(parent).bind(foldCase(name)).step()))
         return kNoKey;
     const Key key = find.number(0);
     find.reset();
@@ -242,7 +259,7 @@ std::vector<std::wstring> Registry::subKeys(Key key)
         return names;
     Statement& list = mStatements->subKeys;
     list.bind(key);
-    while (list.step() == SQLITE_ROW)
+    while (isRow(list.step()))
         names.push_back(list.text(0));
     return names;
 }
@@ -263,10 +280,8 @@ LONG Registry::readValue(Key key, std::wstring_view name, std::wstring& data)
         return ERROR_FILE_NOT_FOUND;
     Statement& read = mStatements->readValue;
     const int status = read.bind(key).bind(foldCase(name)).step();
-    if (status == SQLITE_DONE)
-        return ERROR_FILE_NOT_FOUND;
-    if (status != SQLITE_ROW)
-        return ERROR_READ_FAULT;
+    if (!isRow(status))
+        return status == SQLITE_DONE ? ERROR_FILE_NOT_FOUND : ERROR_READ_FAULT;
     data = read.text(0);
     read.reset();
     return ERROR_SUCCESS;
@@ -298,7 +313,7 @@ LONG Registry::valueName(Key key, DWORD index, std::wstring& name)
     Statement& find = next || index == 0 ? mStatements->nextValue : mStatements->valueAt;
     find.bind(key).bind(next ? mCursor.sequence : std::int64_t{index});
     // A store that cannot be read has no more items either: whoever walks it must come to an end.
-    if (find.step() != SQLITE_ROW)
+    if (!isRow(find.step()))
         return ERROR_NO_MORE_ITEMS;
     mCursor = {key, index, find.number(0)};
     name = find.text(1);
@@ -313,7 +328,7 @@ std::vector<Registry::Value> Registry::values(Key key)
         return found;
     Statement& list = mStatements->values;
     list.bind(key);
-    while (list.step() == SQLITE_ROW)
+    while (isRow(list.step()))
         found.push_back({list.text(0), list.text(1)});
     return found;
 }
@@ -343,26 +358,60 @@ LONG Registry::beginWriting()
         return ERROR_SUCCESS;
     mWrites = 0;
     const int status = mStatements->begin.run();
-    return status == SQLITE_DONE ? ERROR_SUCCESS : fail(status);
+    return status == SQLITE_DONE ? ERROR_SUCCESS : fail(status, L"written");
 }
 
 LONG Registry::finishWrite(int status)
 {
     if (status != SQLITE_DONE)
-        return fail(status);
+        return fail(status, L"written");
     ++mWrites;
     if (mWrites > kWritesFlushedAtOnce && mWrites % kWritesFlushedAtOnce != 0)
         return ERROR_SUCCESS;
     status = sqlite3_db_cacheflush(mDatabase);
     // Pages in use are flushed another time.
-    return status == SQLITE_OK || status == SQLITE_BUSY ? ERROR_SUCCESS : fail(status);
+    return status == SQLITE_OK || status == SQLITE_BUSY ? ERROR_SUCCESS : fail(status, L"written");
 }
 
-LONG Registry::fail(int status)
+// What could not be read must not be mistaken for what is not there and then be overwritten: no write of the
+// command is stored after that.
+bool Registry::isRow(int status)
 {
+    if (status != SQLITE_ROW && status != SQLITE_DONE)
+        fail(status, L"read");
+    return status == SQLITE_ROW;
+}
+
+// Undoes the command at once: until it ends it reads what was stored before, and not what half a command
+// left.
+LONG Registry::fail(int status, const wchar_t* done)
+{
+    if (mFailure != ERROR_SUCCESS)
+        return mFailure;
     mFailure = statusOf(status);
-    mFailureWords = toWide(sqlite3_errmsg(mDatabase));
+    // Flushing leaves no words behind.
+    const bool hasWords = sqlite3_errcode(mDatabase) != SQLITE_OK;
+    const char* words = hasWords ? sqlite3_errmsg(mDatabase) : sqlite3_errstr(status);
+    mFailureWords = std::wstring(L" could not be ") + done + L": " + toWide(words);
+    // SQLite may have rolled back by itself already.
+    if (!sqlite3_get_autocommit(mDatabase))
+        mStatements->rollback.run();
+    mCursor = {};
+    closeHandlesOfLostKeys();
     return mFailure;
+}
+
+// The number of a key that was undone is given away again: a handle must not follow it to another key.
+void Registry::closeHandlesOfLostKeys()
+{
+    std::erase_if(mHandles,
+                  [this](const auto& handle)
+                  {
+                      Statement& find = mStatements->keyExists;
+                      const bool lost = find.bind(handle.second).step() == SQLITE_DONE;
+                      find.reset();
+                      return lost;
+                  });
 }
 
 bool Registry::endOfCommand()
@@ -371,18 +420,14 @@ bool Registry::endOfCommand()
         return true;
     if (mFailure == ERROR_SUCCESS && !sqlite3_get_autocommit(mDatabase))
         if (const int status = mStatements->commit.run(); status != SQLITE_DONE)
-            fail(status);
+            fail(status, L"written");
     if (mFailure == ERROR_SUCCESS)
         return true;
-    // SQLite may have rolled back by itself already.
-    if (!sqlite3_get_autocommit(mDatabase))
-        mStatements->rollback.run();
     if (services().commandLine)
-        services().commandLine->say(L"The registry " + toWide(mFile.string()) + L" could not be written: " +
-                                    mFailureWords + L". What was stored before is unchanged.");
+        services().commandLine->say(L"The registry " + toWide(mFile.string()) + mFailureWords +
+                                    L". What was stored before is unchanged.");
     mFailure = ERROR_SUCCESS;
     mFailureWords.clear();
-    mCursor = {};
     return false;
 }
 

@@ -3,8 +3,8 @@
 // Names compare without regard to case (simple case folding) and keep the spelling they were created with;
 // keys and values are enumerated in the order of creation. The first write of a command opens a transaction
 // and `endOfCommand` commits it, so that what a command stores is stored wholly or not at all, whatever
-// happens to the process. Once a write has failed, the rest of the command's writes fail too and all of them
-// are undone.
+// happens to the process. Once the store could not be written or read, all that the command wrote is undone
+// and the rest of its writes fail too.
 //
 // Status codes are those of the Windows-style registry calls (wincompat/wintypes.h).
 #pragma once
@@ -65,8 +65,8 @@ public:
     std::optional<std::wstring> read(std::wstring_view path, std::wstring_view name);
     bool write(std::wstring_view path, std::wstring_view name, std::wstring_view data);
 
-    // Stores what the command wrote. When that fails, everything that the command wrote is undone, one
-    // sentence says so, and the answer is false.
+    // Stores what the command wrote. When that or something before it failed, everything that the command
+    // wrote is undone, one sentence says so, and the answer is false.
     bool endOfCommand();
 
     // Handles for the registry calls. A handle that is not open is recognised, never followed.
@@ -85,12 +85,15 @@ private:
 
     void open();
     LONG openFile();
+    LONG checkOrigin(int& version);
     LONG prepare();
     Key findChild(Key parent, std::wstring_view name);
     LONG createChild(Key parent, std::wstring_view name, Key& key);
     LONG beginWriting();
     LONG finishWrite(int status);
-    LONG fail(int status);
+    bool isRow(int status);
+    LONG fail(int status, const wchar_t* done);
+    void closeHandlesOfLostKeys();
     std::wstring storeWords() const;
 
     std::filesystem::path mFile;
@@ -99,7 +102,7 @@ private:
     bool mReadOnly = false;
     std::unique_ptr<Statements> mStatements;
     Cursor mCursor;
-    LONG mFailure = ERROR_SUCCESS; // of the running command's first failed write
+    LONG mFailure = ERROR_SUCCESS; // of the running command, its first one
     std::wstring mFailureWords;
     unsigned mWrites = 0; // in the running transaction
     std::unordered_map<HKEY, Key> mHandles;

@@ -82,7 +82,7 @@ LONG RegCreateKeyEx(HKEY root, const wchar_t* subKey, DWORD, const wchar_t*, DWO
 LONG RegEnumValueW(HKEY key, DWORD index, wchar_t* name, DWORD* nameLength, DWORD*, DWORD* type, BYTE* data,
                    DWORD* dataSize)
 {
-    if (!name || !nameLength)
+    if (!name || !nameLength || (data && !dataSize))
         return ERROR_INVALID_PARAMETER;
     const Target target = targetOf(key);
     if (!target)
@@ -111,6 +111,8 @@ LONG RegCloseKey(HKEY key)
 
 LONG tsRegGetValue(HKEY key, const wchar_t* name, DWORD, DWORD* type, void* data, DWORD* size)
 {
+    if (data && !size)
+        return ERROR_INVALID_PARAMETER;
     const Target target = targetOf(key);
     if (!target)
         return ERROR_INVALID_HANDLE;
