@@ -4,11 +4,13 @@
 #include <tessel/tsed.h>
 #include <tessel/tshostservices.h>
 
-#include <cwchar>
+#include <charconv>
+#include <optional>
 
 #include "host/Services.h"
 #include "host/commands/CommandStack.h"
 #include "host/registry/Registry.h"
+#include "host/text/Unicode.h"
 
 namespace tessel
 {
@@ -30,18 +32,33 @@ std::wstring keyOf(const std::wstring& name)
     return recordsKey() + L"\\" + name;
 }
 
+// A name with a separator would file the record below another one, where nobody looks for it.
+bool isRecordName(const std::wstring& name)
+{
+    return !name.empty() && name.find(L'\\') == std::wstring::npos;
+}
+
+std::optional<unsigned> parseReasons(const std::wstring& text)
+{
+    const std::string digits = toUtf8(text);
+    unsigned reasons = 0;
+    const auto [end, error] = std::from_chars(digits.data(), digits.data() + digits.size(), reasons);
+    return error == std::errc() && end == digits.data() + digits.size() ? std::optional(reasons)
+                                                                        : std::nullopt;
+}
+
 // A record without a module or readable load reasons is none: somebody else's key, or half of one.
 bool readRecord(Registry& registry, const std::wstring& name, ApplicationRecord& record)
 {
     const std::wstring key = keyOf(name);
     const auto module = registry.read(key, kModule);
-    const auto reasons = registry.read(key, kLoadReasons);
+    const auto reasons = parseReasons(registry.read(key, kLoadReasons).value_or(L""));
     if (!module || !reasons)
         return false;
     record.name = name;
     record.module = *module;
     record.description = registry.read(key, kDescription).value_or(L"");
-    record.loadReasons = static_cast<unsigned>(std::wcstoul(reasons->c_str(), nullptr, 10));
+    record.loadReasons = *reasons;
     return true;
 }
 
@@ -149,7 +166,7 @@ unsigned TesselAppInfo::loadReason() const
 int TesselAppInfo::readFromRegistry()
 {
     tessel::Registry* registry = tessel::services().registry;
-    if (!registry || mRecord->name.empty())
+    if (!registry || !tessel::isRecordName(mRecord->name))
         return TSRX_APPINFO_ERROR;
     tessel::ApplicationRecord found;
     if (!tessel::readRecord(*registry, mRecord->name, found))
@@ -162,7 +179,7 @@ int TesselAppInfo::writeToRegistry(bool, bool withCommands)
 {
     // This host has one user's registry only: a record for all users is stored there too.
     tessel::Registry* registry = tessel::services().registry;
-    if (!registry || mRecord->name.empty() || !tessel::writeRecord(*registry, *mRecord))
+    if (!registry || !tessel::isRecordName(mRecord->name) || !tessel::writeRecord(*registry, *mRecord))
         return TSRX_APPINFO_ERROR;
     if (withCommands && !tessel::writeCommandsOfCaller(*registry, mRecord->name))
         return TSRX_APPINFO_ERROR;

@@ -11,7 +11,7 @@ inline constexpr unsigned TSRX_LOAD_ON_COMMAND = 4; // when one of its commands 
 
 inline constexpr int TSRX_APPINFO_OK = 0;
 inline constexpr int TSRX_APPINFO_NOT_FOUND = 1;
-inline constexpr int TSRX_APPINFO_ERROR = 2; // no name set, or the registry refused
+inline constexpr int TSRX_APPINFO_ERROR = 2; // no name set or one with a backslash, or the registry refused
 
 // One record, kept in memory until it is written. Strings are copied; those given back stay valid until the
 // record changes or goes.
