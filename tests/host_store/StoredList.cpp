@@ -1,0 +1,73 @@
+#include "tests/host_store/StoredList.h"
+
+#include <algorithm>
+#include <string_view>
+
+using tessel::Registry;
+
+namespace
+{
+constexpr const wchar_t* kKey = L"Software\\Tessel\\R21\\Profiles\\Default\\Dialogs\\Modrig\\History";
+constexpr const wchar_t* kCount = L"NumHistory";
+constexpr int kTorn = -1;
+
+std::wstring entryName(int number)
+{
+    return std::to_wstring(number) + L"History";
+}
+
+std::wstring entryData(int generation, int number, std::size_t length)
+{
+    std::wstring text = std::to_wstring(generation) + L" /büro/" + std::to_wstring(number);
+    text.resize(std::max(length, text.size()), L'x');
+    return text;
+}
+
+bool removeOld(Registry& registry)
+{
+    const Registry::Key key = registry.find(kKey);
+    if (key == Registry::kNoKey)
+        return true;
+    for (const auto& value : registry.values(key))
+        if (registry.removeValue(key, value.name) != ERROR_SUCCESS)
+            return false;
+    return true;
+}
+
+bool isEntry(const Registry::Value& value, int generation, int number)
+{
+    const std::wstring start = entryData(generation, number, 0);
+    const std::wstring_view data = value.data;
+    return value.name == entryName(number) && data.starts_with(start) &&
+           data.substr(start.size()).find_first_not_of(L'x') == data.npos;
+}
+} // namespace
+
+bool rewriteList(Registry& registry, int generation, int count, std::size_t entryLength)
+{
+    if (!removeOld(registry))
+        return false;
+    for (int number = 1; number <= count; ++number)
+        if (!registry.write(kKey, entryName(number), entryData(generation, number, entryLength)))
+            return false;
+    return registry.write(kKey, kCount, std::to_wstring(generation) + L" " + std::to_wstring(count));
+}
+
+int generationOf(Registry& registry)
+{
+    const Registry::Key key = registry.find(kKey);
+    const auto values = key == Registry::kNoKey ? std::vector<Registry::Value>() : registry.values(key);
+    if (values.empty())
+        return 0;
+    if (values.back().name != kCount)
+        return kTorn;
+    const std::wstring& counted = values.back().data;
+    const int generation = std::stoi(counted);
+    const auto count = static_cast<std::size_t>(std::stoi(counted.substr(counted.find(L' '))));
+    if (count != values.size() - 1)
+        return kTorn;
+    for (std::size_t i = 0; i < count; ++i)
+        if (!isEntry(values[i], generation, static_cast<int>(i) + 1))
+            return kTorn;
+    return generation;
+}
