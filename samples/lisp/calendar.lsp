@@ -28,7 +28,7 @@
     (list year month)))
 
 (defun calendar (&optional (year (first (calendar-this-month))) (month (second (calendar-this-month))))
-  "Prints a month, the present one if none is given, and answers the number of its days."
+  "Prints a month, the present one if none is given."
   (check-type year (integer 1583 *))
   (check-type month (integer 1 12))
   (let ((days (calendar-days year month))
@@ -41,7 +41,7 @@
           do (format t "~2d" day)
              (if (or (= day days) (= 6 (calendar-weekday year month day)))
                  (terpri)
-                 (write-char #\Space)))
-    days))
+                 (write-char #\Space))))
+  (princ))
 
 (write-line "Calendar: type (calendar) for this month, (calendar 2027 2) for another.")

@@ -52,12 +52,12 @@
         (write-char (if (logtest 2 directions) (code-char #x2500) #\Space) line)))))
 
 (defun hilbert (&optional (order 4))
-  "Draws the curve of an order from 1 to *HILBERT-LARGEST-ORDER* and answers the number of its cells."
+  "Draws the curve of an order from 1 to *HILBERT-LARGEST-ORDER*."
   (check-type order integer)
   (let* ((side (expt 2 (max 1 (min order *hilbert-largest-order*))))
          (joints (hilbert-joints side)))
     (dotimes (y side)
-      (write-line (string-right-trim " " (hilbert-line joints y))))
-    (* side side)))
+      (write-line (string-right-trim " " (hilbert-line joints y)))))
+  (princ)) ; the drawing is the answer: no value is printed
 
 (write-line "Hilbert: type (hilbert 4) to draw the curve of that order, from 1 to 5.")

@@ -34,10 +34,11 @@
     (when (null names)
       (error "There are no units of ~(~a~); try length, mass, force or pressure." kind))
     (format t "~8a~{~12@a~}~%" "" (mapcar #'string-downcase names))
-    (dolist (from names (length names))
+    (dolist (from names)
       (format t "1 ~6a" (string-downcase from))
       (dolist (to names)
         (format t "~12@a" (units-number (convert 1 from to))))
-      (terpri))))
+      (terpri)))
+  (princ))
 
 (write-line "Units: type (convert 1 'inch 'mm) to convert, (units 'mass) for a table of length, mass, force or pressure.")
