@@ -44,4 +44,4 @@
                  (write-char #\Space))))
   (princ))
 
-(write-line "Calendar: type (calendar) for this month, (calendar 2027 2) for another.")
+(format t "~&Calendar: type (calendar) for this month, (calendar 2027 2) for another.~%")

@@ -60,4 +60,4 @@
       (write-line (string-right-trim " " (hilbert-line joints y)))))
   (princ)) ; the drawing is the answer: no value is printed
 
-(write-line "Hilbert: type (hilbert 4) to draw the curve of that order, from 1 to 5.")
+(format t "~&Hilbert: type (hilbert 4) to draw the curve of that order, from 1 to 5.~%")

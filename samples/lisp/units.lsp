@@ -41,4 +41,4 @@
       (terpri)))
   (princ))
 
-(write-line "Units: type (convert 1 'inch 'mm) to convert, (units 'mass) for a table of length, mass, force or pressure.")
+(format t "~&Units: type (convert 1 'inch 'mm) to convert, (units 'mass) for a table of length, mass, force or pressure.~%")
