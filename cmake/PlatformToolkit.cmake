@@ -10,6 +10,15 @@ if(APPLE)
   return()
 endif()
 
+# CMake knows these of C++ on Linux and not of Objective-C++: without them a library gets no name of its own and
+# finds no neighbours.
+foreach(flag SHARED_LIBRARY_SONAME_%_FLAG SHARED_LIBRARY_RUNTIME_%_FLAG SHARED_LIBRARY_RUNTIME_%_FLAG_SEP
+             EXECUTABLE_RUNTIME_%_FLAG EXECUTABLE_RUNTIME_%_FLAG_SEP)
+  string(REPLACE % OBJCXX objcxx_flag CMAKE_${flag})
+  string(REPLACE % CXX cxx_flag CMAKE_${flag})
+  set(${objcxx_flag} "${${cxx_flag}}")
+endforeach()
+
 find_program(GNUSTEP_CONFIG gnustep-config REQUIRED)
 function(gnustep_config option result)
   execute_process(COMMAND ${GNUSTEP_CONFIG} ${option} OUTPUT_VARIABLE output
