@@ -9,6 +9,7 @@
 #include "ui/Paths.h"
 #include "ui/Settings.h"
 #include "ui/model/LoadBatch.h"
+#include "ui/platform/Platform.h"
 
 namespace
 {
@@ -42,7 +43,7 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
     [self loadApps:mSelectedFiles successedApps:nil addToStartupSuit:NO];
     [[self uiPersistentStore] putControlString:kSettingsGroup
                                        control:kInitialPathSetting
-                                         value:[mOpenPanel directory]];
+                                         value:ModrigPlatform::ShownFolder(mOpenPanel)];
 }
 
 - (IBAction)onStartupSuits:(id)sender

@@ -57,6 +57,8 @@
     [self populateLoadedApplications];
     [self populateHistoryList];
     [self onInit];
+    [loadedAppsTableView sizeLastColumnToFit];
+    [historyListTableView sizeLastColumnToFit];
     ModrigPlatform::CompletePanel(panel, [self view]);
 }
 
@@ -110,16 +112,14 @@
 - (void)panelSelectionDidChange:(id)panel
 {
     [mSelectedFiles removeAllObjects];
-    for (NSURL* url : tsuiEach<NSURL*>([panel URLs]))
-    {
-        ModrigFilePath* file = [[ModrigFilePath alloc] initWithFilePathName:[url path]];
-        [mSelectedFiles addObject:file];
-        [file release];
-    }
+    [mSelectedFiles addObjectsFromArray:ModrigUtils::RowsFromPaths(ModrigUtils::PathsFromStrings(
+                                            ModrigPlatform::SelectedPaths(panel)))];
 }
 
 - (void)openPanelOK:(id)sender
 {
+    if (ModrigPlatform::HasUnreportedSelection(mOpenPanel))
+        [self panelSelectionDidChange:mOpenPanel];
     [self onLoad:sender];
 }
 

@@ -36,6 +36,7 @@ constexpr NSInteger kRemoveSegment = 1;
 - (void)doInit
 {
     ModrigPlatform::CompleteSegments(segmentedControl);
+    [startupTableView sizeLastColumnToFit];
     [startupApps setSelectsInsertedObjects:NO];
     [TsOCModrigUtil addPathNames:ModrigUtils::StringsFromList(gStartupList) toArrayController:startupApps];
     [startupApps setSelectsInsertedObjects:YES];

@@ -19,6 +19,7 @@ NSTextField* makeLabel(NSString* text)
     [label setEditable:NO];
     [label setSelectable:NO];
     [label setBordered:NO];
+    [label setBezeled:NO];
     [label setDrawsBackground:NO];
     return label;
 }
@@ -130,15 +131,6 @@ NSTextField* makeLabel(NSString* text)
     return mSelectedPathes;
 }
 
-- (void)keepSelectionOf:(NSOpenPanel*)panel
-{
-    NSMutableArray* paths = [NSMutableArray array];
-    for (NSURL* url : tsuiEach<NSURL*>([panel URLs]))
-        [paths addObject:[url path]];
-    [mSelectedPathes autorelease];
-    mSelectedPathes = [paths copy];
-}
-
 - (void)prepare:(NSOpenPanel*)panel
 {
     if (mTitle)
@@ -162,9 +154,7 @@ NSTextField* makeLabel(NSString* text)
     }
     const bool chosen = [panel runModal] == NSOKButton;
     [mSelectedPathes release];
-    mSelectedPathes = [[NSArray alloc] init];
-    if (chosen)
-        [self keepSelectionOf:panel];
+    mSelectedPathes = [(chosen ? tessel::windowing::chosenPaths(panel) : [NSArray array]) copy];
     [panel setDelegate:nil];
     [panel setAccessoryView:nil];
     return chosen ? NSOKButton : 0;

@@ -24,6 +24,9 @@ NSOpenPanel* makeOpenPanel();
 // Asks the panel's delegate again which files to show.
 void filterAnew(NSOpenPanel* panel);
 
+// The paths of the chosen files, as strings.
+NSArray* chosenPaths(NSOpenPanel* panel);
+
 // The browser of an open panel cannot choose folders where the platform would otherwise offer them.
 void allowFilesOnly(NSOpenPanel* panel);
 } // namespace tessel::windowing

@@ -53,6 +53,21 @@ void CompletePanel(NSOpenPanel*, NSView*)
 {
 }
 
+NSString* ShownFolder(NSOpenPanel* panel)
+{
+    return [[panel directoryURL] path];
+}
+
+NSArray* SelectedPaths(NSOpenPanel* panel)
+{
+    return [[panel URLs] valueForKey:@"path"];
+}
+
+bool HasUnreportedSelection(NSOpenPanel*)
+{
+    return false;
+}
+
 // The panel filters again when it comes to a folder, so it is sent away and back.
 void FilterPanelAnew(NSOpenPanel* panel, NSURL* elsewhere)
 {

@@ -1,12 +1,18 @@
 #import "ui/NSSavePanel+ModrigRuntime.h"
 
+#include <tesselui/tsuieach.h>
+
 #include <sys/stat.h>
 
 #include <iterator>
 
 #include "ui/platform/Platform.h"
 
+// The panel's own idea of its folder does not follow the browser, which is asked instead.
 @interface NSSavePanel (ModrigBrowser)
+- (NSString*)modrigShownFolder;
+- (NSArray*)modrigSelectedPaths;
+- (NSString*)modrigTypedPath;
 - (void)modrigFilterAnew;
 @end
 
@@ -32,10 +38,40 @@
 
 @implementation NSSavePanel (ModrigBrowser)
 
+- (NSString*)modrigShownFolder
+{
+    return [[_browser pathToColumn:[_browser lastColumn]] stringByStandardizingPath];
+}
+
+- (NSArray*)modrigSelectedPaths
+{
+    if (NSString* typed = [self modrigTypedPath])
+        return [NSArray arrayWithObject:typed];
+    NSMutableArray* paths = [NSMutableArray array];
+    if ([_browser selectedColumn] == [_browser lastColumn])
+        for (NSBrowserCell* cell : tsuiEach<NSBrowserCell*>([_browser selectedCells]))
+            if ([cell isLeaf])
+                [paths
+                    addObject:[[self modrigShownFolder] stringByAppendingPathComponent:[cell stringValue]]];
+    return paths;
+}
+
+// What is being typed in the name field, if it names a file that exists.
+- (NSString*)modrigTypedPath
+{
+    if (![_form currentEditor])
+        return nil;
+    NSString* name = [[_form cellAtIndex:0] stringValue];
+    NSString* path = [[self modrigShownFolder] stringByAppendingPathComponent:name];
+    if ([name isAbsolutePath] || [name hasPrefix:@"~"])
+        path = [name stringByExpandingTildeInPath];
+    return [name length] && [[NSFileManager defaultManager] fileExistsAtPath:path] ? path : nil;
+}
+
 // -validateVisibleColumns would empty the columns of the browser and lose the path.
 - (void)modrigFilterAnew
 {
-    NSString* folder = [self directory];
+    NSString* folder = [[[self modrigShownFolder] retain] autorelease];
     [_browser loadColumnZero];
     [_browser setPath:folder];
     [_okButton setEnabled:NO];
@@ -118,8 +154,25 @@ void FitAccessoryView(NSView* view)
 
 void CompletePanel(NSOpenPanel* panel, NSView* view)
 {
+    // A folder that is only walked through would count as selected.
+    [panel setCanChooseDirectories:NO];
     hideUnusedButtons([panel contentView]);
     joinKeyViews(panel, view);
+}
+
+NSString* ShownFolder(NSOpenPanel* panel)
+{
+    return [panel modrigShownFolder];
+}
+
+NSArray* SelectedPaths(NSOpenPanel* panel)
+{
+    return [panel modrigSelectedPaths];
+}
+
+bool HasUnreportedSelection(NSOpenPanel* panel)
+{
+    return [panel modrigTypedPath] != nil;
 }
 
 void FilterPanelAnew(NSOpenPanel* panel, NSURL*)

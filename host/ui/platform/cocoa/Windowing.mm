@@ -39,6 +39,11 @@ void filterAnew(NSOpenPanel* panel)
     [panel validateVisibleColumns];
 }
 
+NSArray* chosenPaths(NSOpenPanel* panel)
+{
+    return [[panel URLs] valueForKey:@"path"];
+}
+
 void allowFilesOnly(NSOpenPanel* panel)
 {
     [panel setCanChooseDirectories:NO];

@@ -41,4 +41,10 @@ DisplayFacts probeDisplay()
         return {};
     return {.reachable = true, .hasWindowManager = hasWindowManager(display.get())};
 }
+
+void completeRequests(void* display)
+{
+    if (display)
+        XSync(static_cast<Display*>(display), False);
+}
 } // namespace tessel::windowing

@@ -1,4 +1,4 @@
-// What a connection of our own tells about the X display.
+// The X display: what a connection of our own tells about it, and the toolkit's own connection.
 #pragma once
 
 namespace tessel::windowing
@@ -11,4 +11,7 @@ struct DisplayFacts
 
 // Connects to the display that DISPLAY names, looks, and disconnects.
 DisplayFacts probeDisplay();
+
+// Waits until the display has done all that it was asked on the connection (the toolkit's, or null).
+void completeRequests(void* display);
 } // namespace tessel::windowing

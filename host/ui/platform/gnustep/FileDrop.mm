@@ -9,6 +9,7 @@
 #include <tesselui/tsuieach.h>
 
 #include "host/ui/platform/Windowing.h"
+#include "host/ui/platform/gnustep/DisplayProbe.h"
 #include "host/ui/platform/gnustep/DropSelection.h"
 
 // The dragging pasteboard of a drag from another program, as far as a drop target asks it.
@@ -112,6 +113,8 @@ void resetDragTypes(id server, SEL selector, id window)
     if (!display)
         return;
     const auto device = reinterpret_cast<unsigned long>([display windowDevice:[window windowNumber]]);
+    // The toolkit's own announcement has to be there first, or it would undo this one.
+    completeRequests([display serverDevice]);
     announceDropTarget(device);
 }
 

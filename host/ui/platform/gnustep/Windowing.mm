@@ -1,5 +1,9 @@
 #include "host/ui/platform/Windowing.h"
 
+#import <GNUstepGUI/GSDisplayServer.h>
+
+#include <tesselui/tsuieach.h>
+
 #include <dlfcn.h>
 
 #include "host/ui/platform/gnustep/DisplayProbe.h"
@@ -75,7 +79,7 @@ void completeLook()
 
 void flushScreen()
 {
-    [[NSApp context] flushGraphics];
+    completeRequests([GSCurrentServer() serverDevice]);
 }
 
 NSOpenPanel* makeOpenPanel()
@@ -90,22 +94,44 @@ void allowFilesOnly(NSOpenPanel* panel)
 }
 } // namespace tessel::windowing
 
+// The panel's own idea of its folder does not follow the browser, which is asked instead.
 @interface NSSavePanel (TsBrowser)
+- (NSString*)tsShownFolder;
+- (NSArray*)tsChosenPaths;
 - (void)tsFilterAnew;
 @end
 
 @implementation NSSavePanel (TsBrowser)
 
+- (NSString*)tsShownFolder
+{
+    return [[_browser pathToColumn:[_browser lastColumn]] stringByStandardizingPath];
+}
+
+- (NSArray*)tsChosenPaths
+{
+    NSMutableArray* paths = [NSMutableArray array];
+    for (NSBrowserCell* cell : tsuiEach<NSBrowserCell*>([_browser selectedCells]))
+        if ([cell isLeaf])
+            [paths addObject:[[self tsShownFolder] stringByAppendingPathComponent:[cell stringValue]]];
+    return paths;
+}
+
 // -validateVisibleColumns would empty the columns of the browser.
 - (void)tsFilterAnew
 {
-    NSString* folder = [self directory];
+    NSString* folder = [[[self tsShownFolder] retain] autorelease];
     [_browser loadColumnZero];
     [_browser setPath:folder];
     [_okButton setEnabled:NO];
 }
 
 @end
+
+NSArray* tessel::windowing::chosenPaths(NSOpenPanel* panel)
+{
+    return [panel tsChosenPaths];
+}
 
 void tessel::windowing::filterAnew(NSOpenPanel* panel)
 {
