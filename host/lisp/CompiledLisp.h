@@ -1,0 +1,22 @@
+// The file format of compiled Lisp (.qbc): byte code behind a header that tells a file that is whole and
+// meant for this Lisp from every other one.
+//
+// The byte code itself is trusted: Lisp does not survive damaged byte code, so nothing else may reach it.
+#pragma once
+
+#include <string>
+#include <string_view>
+
+namespace tessel
+{
+// The bytes of a file that holds the byte code.
+std::string packCompiledLisp(std::string_view byteCode);
+
+struct UnpackedLisp
+{
+    bool ok = false;
+    std::string_view byteCode; // within the bytes that were given
+    std::wstring fault;        // why not: the end of a sentence that begins with the file's name
+};
+UnpackedLisp unpackCompiledLisp(std::string_view bytes);
+} // namespace tessel

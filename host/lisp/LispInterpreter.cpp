@@ -1,0 +1,91 @@
+#include "host/lisp/LispInterpreter.h"
+
+#include <utility>
+
+#include <tessel/tsdefs.h>
+
+#include "host/Services.h"
+#include "host/console/CommandLine.h"
+#include "host/documents/Document.h"
+#include "host/lisp/LispMachine.h"
+
+namespace tessel
+{
+namespace
+{
+LispSurroundings surroundings(const LispInterpreter::Options& options)
+{
+    return {.removingTsLisp = options.removingTsLisp,
+            .heapBytes = options.heapBytes != 0 ? options.heapBytes : kLispHeapBytes,
+            .write = [](std::wstring_view text) { services().commandLine->print(text); },
+            .column = [] { return services().commandLine->openLine().size(); },
+            .fileLoaded =
+                [](const std::wstring& path)
+            {
+                if (services().document)
+                    services().document->add(path);
+            }};
+}
+} // namespace
+
+LispInterpreter::LispInterpreter(const Options& options)
+    : mMachine(std::make_unique<LispMachine>(surroundings(options)))
+{
+}
+
+LispInterpreter::~LispInterpreter() = default;
+
+LispInterpreter::Outcome LispInterpreter::evaluate(std::wstring_view expressions)
+{
+    auto [ok, text] = mMachine->evaluate(expressions);
+    return {ok, std::move(text)};
+}
+
+void LispInterpreter::queue(std::wstring expression)
+{
+    mQueue.push_back(std::move(expression));
+}
+
+bool LispInterpreter::runQueue()
+{
+    if (mRunningQueue)
+        return true;
+    mRunningQueue = true;
+    bool allRan = true;
+    while (!mQueue.empty())
+    {
+        const std::wstring expression = std::move(mQueue.front());
+        mQueue.pop_front();
+        const Outcome outcome = evaluate(expression);
+        if (!outcome.ok)
+            services().commandLine->say(outcome.text);
+        allRan = allRan && outcome.ok;
+    }
+    mRunningQueue = false;
+    return allRan;
+}
+
+bool LispInterpreter::idle() const
+{
+    return mQueue.empty() && !running();
+}
+
+int LispInterpreter::invoke(const TsResultBuffer* call, TsResultBuffer** result)
+{
+    const auto answer = mMachine->call(call, result);
+    if (answer.ok)
+        return TS_NORMAL;
+    services().commandLine->say(answer.text);
+    return TS_ERROR;
+}
+
+void LispInterpreter::interrupt() noexcept
+{
+    mMachine->interrupt();
+}
+
+bool LispInterpreter::running() const noexcept
+{
+    return mMachine->running();
+}
+} // namespace tessel

@@ -1,0 +1,69 @@
+// The host's Lisp, as its users and applications know it: typed expressions, the queue, called functions.
+//
+// Uses the command line and the document of `services()` when it runs.
+#pragma once
+
+#include <cstddef>
+#include <deque>
+#include <memory>
+#include <string>
+#include <string_view>
+
+struct TsResultBuffer;
+
+namespace tessel
+{
+class LispMachine;
+
+class LispInterpreter
+{
+public:
+    struct Options
+    {
+        bool removingTsLisp = true; // as `services().removingTsLisp`
+        std::size_t heapBytes = 0;  // memory for Lisp's objects; 0: as much as is usual
+    };
+
+    // Starts Lisp, on the thread on which everything but `interrupt` is to be called. A later interpreter in
+    // the same process finds none of an earlier one's definitions. One at a time. Throws std::runtime_error.
+    explicit LispInterpreter(const Options& options);
+    ~LispInterpreter();
+    LispInterpreter(const LispInterpreter&) = delete;
+    LispInterpreter& operator=(const LispInterpreter&) = delete;
+
+    struct Outcome
+    {
+        bool ok = false;
+        std::wstring text; // the printed value, empty when there is none to show; or one line of error text
+    };
+
+    // What a typed line does: every form is evaluated, the value is that of the last.
+    Outcome evaluate(std::wstring_view expressions);
+
+    // Expressions for later, when the host is idle. Their values are not printed.
+    void queue(std::wstring expression);
+
+    // Evaluates what is queued, in order, and what is queued meanwhile after that. An error is said in one
+    // line, and does not keep the next expression from running. Called within itself it does nothing. False
+    // when an expression failed.
+    bool runQueue();
+
+    // Whether nothing is queued and nothing runs.
+    bool idle() const;
+
+    // As `tsedInvoke`. A list comes back with its values in their order, lists within it flattened, and nil
+    // within it as TS_NIL. Integers are TS_SHORT if they fit, then TS_LONG; other numbers are TS_REAL, T is
+    // TS_TRUE, symbols are strings of their name, and what is none of these is the string that Lisp would
+    // print.
+    int invoke(const TsResultBuffer* call, TsResultBuffer** result);
+
+    // Stops the evaluation that runs; without one, nothing. Safe in a signal handler and on any thread.
+    void interrupt() noexcept;
+    bool running() const noexcept;
+
+private:
+    std::unique_ptr<LispMachine> mMachine;
+    std::deque<std::wstring> mQueue;
+    bool mRunningQueue = false;
+};
+} // namespace tessel

@@ -1,0 +1,108 @@
+#include "host/lisp/LispInterrupter.h"
+
+#include <cerrno>
+#include <csignal>
+#include <system_error>
+
+#include <fcntl.h>
+#include <unistd.h>
+
+namespace tessel
+{
+namespace
+{
+// No signal of the program's is to land on the watcher: Ctrl-C has to wake the thread that waits for a line.
+// Faults cannot be blocked, and the signals that stop threads for the garbage collector must not be.
+void leaveSignalsToOthers()
+{
+    sigset_t signals;
+    sigemptyset(&signals);
+    for (const int signal :
+         {SIGINT, SIGTERM, SIGHUP, SIGQUIT, SIGCHLD, SIGWINCH, SIGALRM, SIGPIPE, SIGTSTP, SIGCONT})
+        sigaddset(&signals, signal);
+    pthread_sigmask(SIG_BLOCK, &signals, nullptr);
+}
+} // namespace
+
+LispInterrupter::LispInterrupter(cl_object interrupted)
+    : mInterrupted(interrupted), mLisp(ecl_process_env()->own_process)
+{
+    int ends[2];
+    if (pipe(ends) != 0)
+        throw std::system_error(errno, std::generic_category(), "no pipe for interrupting Lisp");
+    mReadEnd = ends[0];
+    mWriteEnd = ends[1];
+    for (const int end : ends)
+        fcntl(end, F_SETFD, FD_CLOEXEC);
+    // A signal handler must not wait, not even when somebody leans on Ctrl-C.
+    fcntl(mWriteEnd, F_SETFL, O_NONBLOCK);
+    mWatcher = std::thread(&LispInterrupter::watch, this);
+}
+
+LispInterrupter::~LispInterrupter()
+{
+    close(mWriteEnd);
+    mWatcher.join();
+    close(mReadEnd);
+}
+
+void LispInterrupter::begin()
+{
+    if (mDepth++ > 0)
+        return;
+    const std::lock_guard lock(mRunChange);
+    ++mRun;
+}
+
+void LispInterrupter::end()
+{
+    if (--mDepth > 0)
+        return;
+    const std::lock_guard lock(mRunChange);
+    ++mRun;
+}
+
+void LispInterrupter::interrupt() noexcept
+{
+    const Run run = mRun.load();
+    if (!isRun(run))
+        return;
+    const int error = errno;
+    // A full pipe holds requests enough.
+    [[maybe_unused]] const auto written = write(mWriteEnd, &run, sizeof run);
+    errno = error;
+}
+
+bool LispInterrupter::takeRequest() noexcept
+{
+    return mRequested.exchange(0) == mRun.load();
+}
+
+std::optional<LispInterrupter::Run> LispInterrupter::receive() const
+{
+    Run run = 0;
+    ssize_t count = 0;
+    do
+        count = read(mReadEnd, &run, sizeof run);
+    while (count < 0 && errno == EINTR);
+    return count == sizeof run ? std::optional(run) : std::nullopt;
+}
+
+void LispInterrupter::watch()
+{
+    leaveSignalsToOthers();
+    ecl_import_current_thread(ECL_NIL, ECL_NIL);
+    while (const auto run = receive())
+        send(*run);
+    ecl_release_current_thread();
+}
+
+void LispInterrupter::send(Run run)
+{
+    const std::lock_guard lock(mRunChange);
+    if (run != mRun.load())
+        return;
+    mRequested = run;
+    mp_interrupt_process(mLisp, mInterrupted);
+}
+} // namespace tessel

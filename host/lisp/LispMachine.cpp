@@ -1,0 +1,269 @@
+#include "host/lisp/LispMachine.h"
+
+#include <algorithm>
+#include <stdexcept>
+#include <utility>
+
+#include <ecl/ecl.h>
+#include <sys/resource.h>
+#include <tessel/tsresbuf.h>
+
+#include "host/lisp/LispInterrupter.h"
+#include "host/lisp/LispPrimitives.h"
+#include "host/lisp/LispSource.h"
+#include "host/lisp/LispValues.h"
+#include "host/lisp/MemoryFaults.h"
+#include "host/lisp/Prelude.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+// With ECL's own 2048 a deep recursion through UNWIND-PROTECT answers wrongly instead of failing.
+constexpr cl_fixnum kFrameStackSize = 65536;
+// ECL counts on the stack that the process began with. What it does not watch, such as EQUAL on deep lists,
+// may use more: as much as the system keeps free below the main thread's stack.
+constexpr rlim_t kStackBytes = rlim_t{112} << 20;
+constexpr int kMostLockHolds = 8;
+
+// Found once; the garbage collector knows them through their symbols.
+struct LispFunctions
+{
+    cl_object beginSession;
+    cl_object evaluate;
+    cl_object invoke;
+    cl_object compileText;
+    cl_object interrupted;
+};
+
+void setSignalOptions()
+{
+    // Signals are the program's. ECL keeps the one that interrupts a thread of Lisp, and the memory fault
+    // that goes with it.
+    for (const int option : {ECL_OPT_TRAP_SIGFPE, ECL_OPT_TRAP_SIGINT, ECL_OPT_TRAP_SIGILL,
+                             ECL_OPT_TRAP_SIGBUS, ECL_OPT_TRAP_SIGPIPE, ECL_OPT_SIGNAL_HANDLING_THREAD})
+        ecl_set_option(option, 0);
+    ecl_set_option(ECL_OPT_TRAP_SIGSEGV, 1);
+    ecl_set_option(ECL_OPT_TRAP_INTERRUPT_SIGNAL, 1);
+}
+
+void raiseStackLimit()
+{
+    rlimit limit{};
+    if (getrlimit(RLIMIT_STACK, &limit) != 0 || limit.rlim_cur >= kStackBytes)
+        return;
+    limit.rlim_cur = std::min(kStackBytes, limit.rlim_max);
+    // Without the slack Lisp works just as well, short of such lists.
+    static_cast<void>(setrlimit(RLIMIT_STACK, &limit));
+}
+
+cl_object functionNamed(const char* name)
+{
+    return cl_symbol_function(_ecl_intern(name, ecl_find_package("TESSEL-HOST")));
+}
+
+// Reads and evaluates the prelude; NIL, or the text of its error.
+cl_object evaluatePrelude(cl_object text)
+{
+    cl_object evaluateAll =
+        cl_eval(ecl_read_from_cstring("(lambda (text)"
+                                      " (handler-case (with-input-from-string (forms text)"
+                                      "                (let ((*package* *package*))"
+                                      "                 (loop (let ((form (read forms nil forms)))"
+                                      "                        (when (eq form forms) (return nil))"
+                                      "                        (eval form)))))"
+                                      "  (serious-condition (condition) (princ-to-string condition))))"));
+    return cl_funcall(2, evaluateAll, text);
+}
+
+// What ECL runs must not jump over C++ objects: the functions that are called under its protection have none.
+cl_object startPrelude(std::wstring_view prelude)
+{
+    cl_object volatile fault = ecl_make_keyword("UNFINISHED");
+    const cl_env_ptr environment = ecl_process_env();
+    ECL_CATCH_ALL_BEGIN(environment)
+    {
+        cl_eval(ecl_read_from_cstring("(make-package \"TESSEL-HOST\" :use '(\"COMMON-LISP\"))"));
+        defineLispPrimitives();
+        fault = evaluatePrelude(toLisp(prelude));
+    }
+    ECL_CATCH_ALL_IF_CAUGHT
+    {
+    }
+    ECL_CATCH_ALL_END;
+    return fault;
+}
+
+LispFunctions startLisp()
+{
+    setSignalOptions();
+    ecl_set_option(ECL_OPT_FRAME_STACK_SIZE, kFrameStackSize);
+    ecl_set_option(ECL_OPT_HEAP_SIZE, kLispHeapBytes);
+    const auto faultAction = currentFaultAction();
+    static char name[] = "tessel";
+    static char* arguments[] = {name, nullptr};
+    cl_boot(1, arguments);
+    shareMemoryFaults(faultAction);
+    raiseStackLimit();
+    cl_object fault = startPrelude(toWide(lispPrelude()));
+    if (fault != ECL_NIL)
+        throw std::runtime_error("Lisp did not start: " + toUtf8(fromLisp(fault)));
+    return {functionNamed("BEGIN-SESSION"), functionNamed("EVALUATE"), functionNamed("INVOKE"),
+            functionNamed("COMPILE-TEXT"), functionNamed("INTERRUPTED")};
+}
+
+const LispFunctions& lispFunctions()
+{
+    static const LispFunctions functions = startLisp();
+    return functions;
+}
+
+// A call of Lisp whose arguments are made under protection, too.
+struct LispCall
+{
+    cl_object function = ECL_NIL;
+    std::wstring_view text{};
+    std::wstring_view name{};               // with COMPILE-TEXT
+    const TsResultBuffer* values = nullptr; // with INVOKE
+};
+
+cl_object apply(const LispCall& call)
+{
+    if (call.values)
+        return cl_funcall(3, call.function, toLisp(call.text), toLisp(call.values->next));
+    if (!call.name.empty())
+        return cl_funcall(3, call.function, toLisp(call.name), toLisp(call.text));
+    return cl_funcall(2, call.function, toLisp(call.text));
+}
+
+// NIL when Lisp was left by a jump.
+cl_object applyProtected(const LispCall& call)
+{
+    cl_object volatile value = ECL_NIL;
+    const cl_env_ptr environment = ecl_process_env();
+    ECL_CATCH_ALL_BEGIN(environment)
+    {
+        value = apply(call);
+    }
+    ECL_CATCH_ALL_IF_CAUGHT
+    {
+        value = ECL_NIL;
+    }
+    ECL_CATCH_ALL_END;
+    return value;
+}
+
+// When memory is exhausted while a symbol is made, ECL jumps away with this lock held, and nothing works any
+// more.
+void releaseForgottenLock()
+{
+    const cl_env_ptr environment = ecl_process_env();
+    ECL_CATCH_ALL_BEGIN(environment)
+    {
+        // Whoever can have the lock now did not find it held.
+        for (int holds = 0; holds < kMostLockHolds; ++holds)
+        {
+            const bool wasFree = mp_get_rwlock_write(2, cl_core.global_env_lock, ECL_NIL) != ECL_NIL;
+            mp_giveup_rwlock_write(cl_core.global_env_lock);
+            if (wasFree)
+                break;
+        }
+    }
+    ECL_CATCH_ALL_IF_CAUGHT
+    {
+    }
+    ECL_CATCH_ALL_END;
+}
+} // namespace
+
+struct LispMachine::Parts
+{
+    explicit Parts(LispSurroundings given)
+        : surroundings(std::move(given)), interrupter(lispFunctions().interrupted)
+    {
+        connectLispPrimitives(&surroundings, &interrupter);
+    }
+    ~Parts() { connectLispPrimitives(nullptr, nullptr); }
+    Parts(const Parts&) = delete;
+    Parts& operator=(const Parts&) = delete;
+
+    // (:DONE . value) or (:FAILED . text), as the prelude answers.
+    struct Raw
+    {
+        bool ok;
+        cl_object value;
+    };
+    Raw run(const LispCall& call)
+    {
+        interrupter.begin();
+        cl_object pair = applyProtected(call);
+        interrupter.end();
+        const bool ok = ECL_CONSP(pair) && ECL_CONS_CAR(pair) == ecl_make_keyword("DONE");
+        if (!ok)
+            releaseForgottenLock();
+        flushLispOutput();
+        return {ok, ECL_CONSP(pair) ? ECL_CONS_CDR(pair) : ECL_NIL};
+    }
+
+    static std::wstring errorText(cl_object text)
+    {
+        return ECL_STRINGP(text) ? fromLisp(text) : L"Lisp has given up what it was doing.";
+    }
+
+    LispAnswer runForText(const LispCall& call)
+    {
+        const Raw raw = run(call);
+        return {raw.ok, raw.ok ? fromLisp(raw.value) : errorText(raw.value)};
+    }
+
+    LispSurroundings surroundings;
+    LispInterrupter interrupter;
+};
+
+LispMachine::LispMachine(LispSurroundings surroundings)
+    : mParts(std::make_unique<Parts>(std::move(surroundings)))
+{
+    const auto& settings = mParts->surroundings;
+    cl_funcall(3, lispFunctions().beginSession, settings.removingTsLisp ? ECL_T : ECL_NIL,
+               ecl_make_fixnum(static_cast<cl_fixnum>(settings.heapBytes)));
+}
+
+LispMachine::~LispMachine() = default;
+
+LispAnswer LispMachine::evaluate(std::wstring_view forms)
+{
+    if (findTooDeepForm(forms))
+        return {false,
+                L"The expression is nested more than " + std::to_wstring(kDeepestNesting) + L" levels deep."};
+    return mParts->runForText({.function = lispFunctions().evaluate, .text = forms});
+}
+
+LispAnswer LispMachine::compile(const std::wstring& name, std::wstring_view text)
+{
+    return mParts->runForText({.function = lispFunctions().compileText, .text = text, .name = name});
+}
+
+LispAnswer LispMachine::call(const TsResultBuffer* call, TsResultBuffer** values)
+{
+    *values = nullptr;
+    if (!call || call->type != TS_STRING || !call->value.string)
+        return {false, L"A Lisp function is called by its name, as the first value of the list."};
+    const auto raw =
+        mParts->run({.function = lispFunctions().invoke, .text = call->value.string, .values = call});
+    if (!raw.ok)
+        return {false, Parts::errorText(raw.value)};
+    *values = resultFromLisp(raw.value);
+    return {true, {}};
+}
+
+void LispMachine::interrupt() noexcept
+{
+    mParts->interrupter.interrupt();
+}
+
+bool LispMachine::running() const noexcept
+{
+    return mParts->interrupter.running();
+}
+} // namespace tessel

@@ -1,0 +1,66 @@
+// Lisp itself, apart from what it is used for: ECL started once in the process, with evaluations that always
+// come back. Nothing of ECL shows here.
+//
+// Errors, endless recursion, exhausted memory, calls of the debugger and jumps to nowhere all end in one line
+// of text, and the next evaluation finds Lisp in order. What Lisp cannot be kept from: code that turns
+// interrupts off and never ends.
+#pragma once
+
+#include <cstddef>
+#include <functional>
+#include <memory>
+#include <string>
+#include <string_view>
+
+struct TsResultBuffer;
+
+namespace tessel
+{
+inline constexpr std::size_t kLispHeapBytes = std::size_t{512} << 20;
+
+// What Lisp meets when it reaches out. None of the functions may call Lisp.
+struct LispSurroundings
+{
+    bool removingTsLisp = true; // compiled files are loaded, and functions for packaged applications offered
+    std::size_t heapBytes = kLispHeapBytes;
+    std::function<void(std::wstring_view)> write;             // what Lisp prints, in pieces
+    std::function<std::size_t()> column;                      // characters on the line that is not ended yet
+    std::function<void(const std::wstring& path)> fileLoaded; // without an error; the path as it was given
+};
+
+struct LispAnswer
+{
+    bool ok = false;
+    std::wstring text; // the printed value, or one line of error text
+};
+
+class LispMachine
+{
+public:
+    // Starts Lisp, or takes over the one that is there with a new, empty user package. One at a time; the
+    // first decides the thread on which all evaluations run. Throws std::runtime_error when Lisp does not
+    // start.
+    explicit LispMachine(LispSurroundings surroundings);
+    ~LispMachine();
+    LispMachine(const LispMachine&) = delete;
+    LispMachine& operator=(const LispMachine&) = delete;
+
+    // Every form, one after the other; the value of the last, or an empty text where there is none to print.
+    LispAnswer evaluate(std::wstring_view forms);
+
+    // Calls the function named by the first value with the rest. The answer's text is for an error only; the
+    // values are the caller's to free, null for nil.
+    LispAnswer call(const TsResultBuffer* call, TsResultBuffer** values);
+
+    // Byte code of a source text, to be packed; `name` is what errors call the text.
+    LispAnswer compile(const std::wstring& name, std::wstring_view text);
+
+    // From any thread or signal handler.
+    void interrupt() noexcept;
+    bool running() const noexcept;
+
+private:
+    struct Parts;
+    std::unique_ptr<Parts> mParts;
+};
+} // namespace tessel

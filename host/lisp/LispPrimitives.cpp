@@ -1,0 +1,199 @@
+#include "host/lisp/LispPrimitives.h"
+
+#include <exception>
+#include <string>
+#include <thread>
+
+#include <ecl/ecl.h>
+
+#include "host/lisp/LispFile.h"
+#include "host/lisp/LispInterrupter.h"
+#include "host/lisp/LispOutput.h"
+#include "host/lisp/LispValues.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+// Lisp calls plain functions, and may leave them by a jump. So everything that has a destructor lives here.
+struct Connection
+{
+    LispSurroundings* surroundings = nullptr;
+    LispInterrupter* interrupter = nullptr;
+    std::thread::id thread;
+    LispOutput output;
+    LispFile file;
+    std::wstring fault; // why the host's own code failed
+};
+
+Connection& connection()
+{
+    static Connection instance;
+    return instance;
+}
+
+template <typename Work>
+void runCatching(Work work) noexcept
+{
+    connection().fault.clear();
+    try
+    {
+        work();
+    }
+    catch (const std::exception& exception)
+    {
+        connection().fault = toWide(exception.what());
+    }
+    catch (...)
+    {
+        connection().fault = L"The host failed for a reason of its own.";
+    }
+}
+
+// Runs code of the host for Lisp. An interrupt waits meanwhile: it would jump over destructors. What the code
+// throws becomes an error of Lisp.
+template <typename Work>
+void callHost(Work work)
+{
+    const cl_env_ptr environment = ecl_process_env();
+    ecl_disable_interrupts_env(environment);
+    runCatching(work);
+    ecl_enable_interrupts_env(environment);
+    if (!connection().fault.empty())
+        FEerror("~A", 1, toLisp(connection().fault));
+}
+
+cl_object answer(cl_object value)
+{
+    ecl_process_env()->nvalues = 1;
+    return value;
+}
+
+// The host's text has one writer. What a thread that the user has started prints goes nowhere.
+bool isThreadOfLisp()
+{
+    return std::this_thread::get_id() == connection().thread;
+}
+
+cl_object writeText(cl_object text, cl_object start, cl_object end)
+{
+    if (ECL_STRINGP(text) && isThreadOfLisp())
+        callHost(
+            [=]
+            {
+                for (cl_fixnum index = ecl_fixnum(start); index < ecl_fixnum(end); ++index)
+                    connection().output.add(
+                        static_cast<wchar_t>(ecl_char(text, static_cast<cl_index>(index))));
+            });
+    return answer(text);
+}
+
+cl_object writeCharacter(cl_object character)
+{
+    if (isThreadOfLisp())
+        callHost([=] { connection().output.add(static_cast<wchar_t>(ECL_CHAR_CODE(character))); });
+    return answer(character);
+}
+
+cl_object flush()
+{
+    if (isThreadOfLisp())
+        callHost([] { connection().output.flush(); });
+    return answer(ECL_NIL);
+}
+
+cl_object column()
+{
+    std::size_t count = 0;
+    if (isThreadOfLisp())
+        callHost([&count] { count = connection().output.column(); });
+    return answer(ecl_make_fixnum(static_cast<cl_fixnum>(count)));
+}
+
+cl_object kindOf(LispFile::Kind kind)
+{
+    switch (kind)
+    {
+    case LispFile::Kind::kSource:
+        return ecl_make_keyword("SOURCE");
+    case LispFile::Kind::kCompiled:
+        return ecl_make_keyword("COMPILED");
+    case LispFile::Kind::kMissing:
+        return ecl_make_keyword("MISSING");
+    default:
+        return ecl_make_keyword("REFUSED");
+    }
+}
+
+// A list: the kind, the name for messages, the text.
+cl_object readFile(cl_object path)
+{
+    callHost(
+        [=]
+        {
+            const auto* surroundings = connection().surroundings;
+            connection().file = readLispFile(fromLisp(path), surroundings && surroundings->removingTsLisp);
+        });
+    cl_object text = toLisp(connection().file.text);
+    cl_object name = toLisp(connection().file.name);
+    cl_object kind = kindOf(connection().file.kind);
+    callHost([] { connection().file = {}; });
+    return answer(cl_list(3, kind, name, text));
+}
+
+cl_object recordLoaded(cl_object path)
+{
+    callHost(
+        [=]
+        {
+            connection().output.flush();
+            if (connection().surroundings && connection().surroundings->fileLoaded)
+                connection().surroundings->fileLoaded(fromLisp(path));
+        });
+    return answer(ECL_NIL);
+}
+
+cl_object interruptWanted()
+{
+    auto* interrupter = connection().interrupter;
+    return answer(interrupter && interrupter->takeRequest() ? ECL_T : ECL_NIL);
+}
+
+// ECL keeps all functions as one type and calls them with the number of arguments that goes with each.
+template <typename... Arguments>
+void define(const char* name, cl_object (*function)(Arguments...))
+{
+    const auto untyped = reinterpret_cast<void (*)()>(function);
+    ecl_def_c_function(_ecl_intern(name, ecl_find_package("TESSEL-HOST")),
+                       reinterpret_cast<cl_objectfn_fixed>(untyped), sizeof...(Arguments));
+}
+} // namespace
+
+void defineLispPrimitives()
+{
+    define("%WRITE", writeText);
+    define("%WRITE-CHAR", writeCharacter);
+    define("%FLUSH", flush);
+    define("%COLUMN", column);
+    define("%READ-FILE", readFile);
+    define("%RECORD-LOADED", recordLoaded);
+    define("%INTERRUPT-WANTED", interruptWanted);
+}
+
+void connectLispPrimitives(LispSurroundings* surroundings, LispInterrupter* interrupter)
+{
+    connection().surroundings = surroundings;
+    connection().interrupter = interrupter;
+    connection().thread = std::this_thread::get_id();
+    if (surroundings)
+        connection().output.connect(surroundings->write, surroundings->column);
+    else
+        connection().output.connect({}, {});
+}
+
+void flushLispOutput()
+{
+    connection().output.flush();
+}
+} // namespace tessel

@@ -1,0 +1,45 @@
+;;; Functions that an application calls by name.
+
+(in-package "TESSEL-HOST")
+
+(defconstant +most-values+ 100000 "A list that is longer is circular, or a mistake.")
+
+(defun plain-value (value)
+  "A string, an integer of 32 bits, a double, T or NIL."
+  (typecase value
+    (string value)
+    (null nil)
+    ((eql t) t)
+    (symbol (symbol-name value))
+    (character (string value))
+    ((signed-byte 32) value)
+    (real (coerce value 'double-float))
+    (t (printed value))))
+
+(defun plain-values (value)
+  "The values of a list in their order, those of the lists within it in their places."
+  (let ((found '()) (count 0) (waiting (list value)))
+    (loop while waiting
+          do (let ((next (pop waiting)))
+               (cond ((> (incf count) +most-values+)
+                      (error "The answer holds more than ~D values, or is circular." +most-values+))
+                     ((consp next)
+                      (when (cdr next)
+                        (push (cdr next) waiting))
+                      (push (car next) waiting))
+                     (t (push (plain-value next) found)))))
+    (nreverse found)))
+
+(defun function-named (name)
+  (let ((symbol (find-symbol (string-upcase name) *package*)))
+    (if (and symbol (fboundp symbol) (not (macro-function symbol)) (not (special-operator-p symbol)))
+        (fdefinition symbol)
+        (error "There is no Lisp function ~A." name))))
+
+(defun invoke (name arguments)
+  (call-guarded
+   (lambda ()
+     (let ((value (apply (function-named name) arguments)))
+       (if (or (null value) (eq value *nothing*))
+           '()
+           (plain-values value))))))

@@ -1,0 +1,6 @@
+#include "host/lisp/CompilerProgram.h"
+
+int main(int count, char** arguments)
+{
+    return tessel::runCompilerProgram(count, arguments);
+}
