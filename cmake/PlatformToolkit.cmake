@@ -31,8 +31,6 @@ gnustep_config(--base-libs base_libs)
 gnustep_config(--gui-libs gui_libs)
 # CMake knows no standard flags for GCC's Objective-C++; the toolkit's headers need the GNU dialect.
 list(APPEND objc_flags -std=gnu++20)
-# Nor how an Objective-C++ library is given its name; without one, what links to it asks for a path of the build folder.
-set(CMAKE_SHARED_LIBRARY_SONAME_OBJCXX_FLAG "-Wl,-soname,")
 # Optimisation, debugging, warnings and dependency files are CMake's to choose; include folders are the system's,
 # so that our warnings are about our code only.
 list(FILTER objc_flags EXCLUDE REGEX "^(-MMD|-MP|-g|-O[0-9s]|-Wall|-I.*)$")

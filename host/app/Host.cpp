@@ -120,7 +120,7 @@ void Host::makeApplicationParts()
     services().files = &mParts->files.emplace(mParts->layout.resources);
     services().remote =
         &mParts->remote.emplace(mOptions.profileFolder / kRemoteFilesFolder, RemoteFiles::Limits());
-    services().lisp = &mParts->lisp.emplace();
+    services().lisp = &mParts->lisp.emplace(LispInterpreter::Options{services().removingTsLisp});
     mInterruptible = services().lisp;
     mParts->demandLoading.emplace(mParts->layout.plugIns);
 }
@@ -152,8 +152,10 @@ bool Host::run(const std::wstring& input)
 {
     if (!isLisp(input))
         return mParts->commands.run(input);
-    const bool evaluated = mParts->lisp->evaluateLine(input);
-    return finishLine() && evaluated;
+    const auto outcome = mParts->lisp->evaluate(input);
+    if (!outcome.text.empty())
+        mCommandLine.say(outcome.text);
+    return finishLine() && outcome.ok;
 }
 
 bool Host::finishLine()

@@ -41,14 +41,33 @@ bool isLispFile(const std::wstring& path)
                                [&](const wchar_t* lisp) { return equalIgnoringCase(extension, lisp); });
 }
 
+// A Lisp string that the reader takes for this very text.
+std::wstring quoted(const std::wstring& text)
+{
+    std::wstring result = L"\"";
+    for (const wchar_t character : text)
+    {
+        if (character == L'"' || character == L'\\')
+            result += L'\\';
+        result += character;
+    }
+    return result + L"\"";
+}
+
+bool loadLisp(const std::wstring& path)
+{
+    const auto outcome = services().lisp->evaluate(L"(load " + quoted(path) + L")");
+    return outcome.ok ? succeed(path + L" is loaded.") : fail(outcome.text);
+}
+
 bool load(const CommandStack::Arguments& arguments)
 {
     if (arguments.size() != 1)
         return failWithUsage(L"LOAD");
     const std::wstring path = fullPath(arguments.front());
     if (isLispFile(path))
-        return services().lisp->loadFile(path);
-    return services().linker->loadModule(path.c_str(), true, true);
+        return loadLisp(path);
+    return services().linker->loadModule(path.c_str(), true, true) && succeed(path + L" is loaded.");
 }
 
 bool unload(const CommandStack::Arguments& arguments)
@@ -60,7 +79,8 @@ bool unload(const CommandStack::Arguments& arguments)
         return fail(path + L" cannot be unloaded: Lisp stays until the session ends.");
     // The name alone is enough for what is loaded.
     const std::wstring loaded = services().linker->pathOfModule(arguments.front());
-    return services().linker->unloadModule((loaded.empty() ? path : loaded).c_str(), true);
+    const std::wstring module = loaded.empty() ? path : loaded;
+    return services().linker->unloadModule(module.c_str(), true) && succeed(module + L" is unloaded.");
 }
 
 void sayApplication(const std::wstring& path, const std::wstring& state)

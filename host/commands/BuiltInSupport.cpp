@@ -13,6 +13,12 @@ void sayLine(const std::wstring& sentence)
     services().commandLine->say(sentence);
 }
 
+bool succeed(const std::wstring& sentence)
+{
+    sayLine(sentence);
+    return true;
+}
+
 bool fail(const std::wstring& sentence)
 {
     sayLine(sentence);

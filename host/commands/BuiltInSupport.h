@@ -10,7 +10,8 @@ namespace tessel
 {
 void sayLine(const std::wstring& sentence);
 
-// Says the sentence and answers false: the end of a command that failed.
+// Says the sentence and answers whether the command succeeded: its end.
+bool succeed(const std::wstring& sentence);
 bool fail(const std::wstring& sentence);
 
 // Says how the command is to be typed, and answers false.

@@ -1,0 +1,63 @@
+// Starts the real Tessel, as a person or a script would, and listens to it.
+//
+//     HostSession session;                                   // a throwaway profile
+//     const HostResult result = session.run({"SETVAR LISPENABLED 0", "VERSION"});
+//     EXPECT_EQ(result.exitStatus, 0);
+//     EXPECT_THAT(result.output, HasSubstr("Tessel R21"));
+//
+// The profile lives as long as the session, so that a second run finds what the first one stored.
+#pragma once
+
+#include <chrono>
+#include <filesystem>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "tests/support/TemporaryFolder.h"
+
+inline constexpr std::chrono::seconds kHostTimeLimit{60};
+
+struct HostResult
+{
+    std::string output; // what the host printed, errors included
+    int exitStatus = 0; // of a host that a signal ended: minus the signal's number
+    bool timedOut = false;
+};
+
+// A variable of the environment with its value.
+using EnvironmentChange = std::pair<std::string, std::string>;
+
+class HostSession
+{
+public:
+    HostSession();
+
+    // Runs the commands by `-c`, one argument each, and waits for the end.
+    HostResult run(const std::vector<std::string>& commands) const;
+
+    // Runs the lines as a script file, or down a pipe.
+    HostResult runScript(const std::string& lines) const;
+    HostResult runPipe(const std::string& lines) const;
+
+    // Starts the host with these arguments behind `--profile-dir`, and gives it the text to read.
+    HostResult start(const std::vector<std::string>& arguments, const std::string& input = {}) const;
+
+    // Arguments that are put in front of all others, such as "--safe".
+    void alwaysWith(std::vector<std::string> arguments) { mAlways = std::move(arguments); }
+
+    // Changes the environment that the host is started in. It has no display from the beginning.
+    void set(const std::string& variable, const std::string& value);
+
+    const TemporaryFolder& folder() const { return mFolder; } // for the files of the test
+    std::filesystem::path profile() const { return mFolder / "profile"; }
+
+    // The program and its arguments, and the environment, as `execve` wants them.
+    std::vector<std::string> commandLine(const std::vector<std::string>& arguments) const;
+    std::vector<std::string> environment() const;
+
+private:
+    TemporaryFolder mFolder;
+    std::vector<std::string> mAlways;
+    std::vector<EnvironmentChange> mEnvironment;
+};

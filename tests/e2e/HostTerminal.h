@@ -1,0 +1,46 @@
+// The real Tessel at a terminal: what a person types, and what appears.
+#pragma once
+
+#include <chrono>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include <sys/types.h>
+
+#include "tests/e2e/HostProcess.h"
+
+class HostTerminal
+{
+public:
+    // Starts the host of the session with these arguments on a terminal of its own.
+    explicit HostTerminal(const HostSession& session, const std::vector<std::string>& arguments = {});
+    ~HostTerminal(); // kills a host that still runs
+    HostTerminal(const HostTerminal&) = delete;
+    HostTerminal& operator=(const HostTerminal&) = delete;
+
+    // Keys as the terminal sends them: "\t" completes, "\r" is Return, kControlC and kControlD.
+    void type(std::string_view keys) const;
+
+    // Waits until the text appears behind what was waited for before. False when the time is over.
+    bool shows(std::string_view text);
+
+    // Waits for the end; the exit status as in HostResult. A host that does not end is killed.
+    int waitForEnd();
+
+    // Everything that appeared, terminal sequences included.
+    const std::string& screen() const { return mOutput; }
+
+    pid_t process() const { return mProcess; }
+
+private:
+    bool readMore(std::chrono::steady_clock::time_point deadline);
+
+    pid_t mProcess = 0;
+    int mTerminal = -1;
+    std::string mOutput;
+    std::size_t mSeen = 0;
+};
+
+inline constexpr std::string_view kControlC = "\x03";
+inline constexpr std::string_view kControlD = "\x04";

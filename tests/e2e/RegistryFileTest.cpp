@@ -1,0 +1,78 @@
+// What becomes of a session whose registry file is damaged, not writable, or shared between sessions.
+#include <gmock/gmock.h>
+
+#include <fstream>
+
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include "tests/e2e/HostProcess.h"
+
+using testing::AllOf;
+using testing::HasSubstr;
+
+namespace
+{
+constexpr char kSet[] = R"(REGISTRY SET Software\Trial "a name" "größe 100%s")";
+constexpr char kGet[] = R"(REGISTRY GET software\TRIAL "A NAME")";
+} // namespace
+
+TEST(RegistryFile, KeepsFromOneSessionToTheNext)
+{
+    const HostSession session;
+    ASSERT_EQ(session.run({kSet}).exitStatus, 0);
+    const auto result = session.run({kGet, R"(REGISTRY LIST Software\Trial)"});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, AllOf(HasSubstr("\ngröße 100%s\n"), HasSubstr("a name = größe 100%s")));
+}
+
+TEST(RegistryFile, ForgetsWhatIsDeleted)
+{
+    const HostSession session;
+    ASSERT_EQ(session.run({kSet, R"(REGISTRY DELETE Software\Trial "A Name")"}).exitStatus, 0);
+    EXPECT_EQ(session.run({kGet}).exitStatus, 1);
+    EXPECT_EQ(session.run({R"(REGISTRY DELETE Software\Trial)"}).exitStatus, 0);
+    EXPECT_EQ(session.run({R"(REGISTRY LIST Software\Trial)"}).exitStatus, 1);
+}
+
+TEST(RegistryFile, ThatIsNoDatabaseIsToldAndLeftAlone)
+{
+    const HostSession session;
+    const std::string content = "This is a letter, not a database. " + std::string(5000, 'x');
+    session.folder().write("profile/registry.db", content);
+    const auto result = session.run({"VERSION"});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, AllOf(HasSubstr((session.profile() / "registry.db").string()),
+                                     HasSubstr("Command: VERSION\nTessel R21")));
+    std::ifstream file(session.profile() / "registry.db", std::ios::binary);
+    const std::string after{std::istreambuf_iterator<char>(file), {}};
+    EXPECT_TRUE(after == content);
+}
+
+TEST(RegistryFile, IsToldWhenItCannotBeMade)
+{
+    const HostSession session;
+    session.folder().write("profile/registry.db/in the way", ""); // a folder of that name
+    const auto result = session.run({kSet, "VERSION"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, AllOf(HasSubstr((session.profile() / "registry.db").string()),
+                                     HasSubstr("Command: VERSION\nTessel R21")));
+}
+
+TEST(ProfileFolder, IsToldWhenItCannotBeMade)
+{
+    const HostSession session;
+    session.folder().write("profile", "a file");
+    const auto result = session.run({"VERSION"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, HasSubstr(session.profile().string()));
+}
+
+TEST(Profiles, CanBeChanged)
+{
+    const HostSession session;
+    EXPECT_THAT(session.run({"PROFILE"}).output, HasSubstr("\nDefault\n"));
+    EXPECT_EQ(session.run({"PROFILE \"Zweites Büro\""}).exitStatus, 0);
+    EXPECT_THAT(session.run({"PROFILE"}).output, HasSubstr("\nZweites Büro\n"));
+    EXPECT_EQ(session.run({R"(PROFILE a\b)"}).exitStatus, 1);
+}

@@ -1,0 +1,158 @@
+// A session from its banner to its end, without a terminal.
+#include <gmock/gmock.h>
+
+#include "tests/e2e/HostProcess.h"
+
+using testing::AllOf;
+using testing::EndsWith;
+using testing::HasSubstr;
+using testing::Not;
+using testing::StartsWith;
+
+TEST(Session, BeginsWithABannerAndEndsByItself)
+{
+    const HostSession session;
+    const auto result = session.run({"VERSION"});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, StartsWith("Tessel R21, reference host for Modrig"));
+    EXPECT_THAT(result.output, EndsWith("Command: VERSION\nTessel R21, reference host for Modrig\n"));
+}
+
+TEST(Session, KeepsEverythingInItsProfileFolder)
+{
+    const HostSession session;
+    ASSERT_EQ(session.run({"VERSION"}).exitStatus, 0);
+    EXPECT_TRUE(std::filesystem::is_regular_file(session.profile() / "registry.db"));
+    EXPECT_FALSE(std::filesystem::exists(session.folder() / "home/.local/share/Tessel"));
+}
+
+TEST(Session, AnswersAnUnknownCommandWithASentenceAndStatusOne)
+{
+    const HostSession session;
+    const auto result = session.run({"FOO", "VERSION"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, HasSubstr("Unknown command \"FOO\". Type HELP for the list of commands.\n"
+                                         "Command: VERSION\n"));
+}
+
+TEST(Session, ListsItsCommandsByGroup)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"});
+    const auto result = session.run({"HELP", "help load"});
+    EXPECT_EQ(result.exitStatus, 0);
+    for (const char* name : {"HELP", "QUIT", "EXIT", "SETVAR", "LOAD", "UNLOAD", "APPS", "REGISTRY",
+                             "PROFILE", "VERSION", "CD", "SCRIPT"})
+        EXPECT_THAT(result.output, HasSubstr(std::string("\n  ") + name)) << name;
+    EXPECT_THAT(result.output, HasSubstr("Session\n  HELP [name]"));
+    EXPECT_THAT(result.output, HasSubstr("Command: help load\n  LOAD"));
+}
+
+TEST(Session, ShowsTheHelpBookWithoutABrowser)
+{
+    const HostSession session;
+    const auto result = session.run({"HELP startup_suite_dialog", "HELP load_unload_applications_dialog",
+                                     "HELP StandardFileSelectionDialogs"});
+    EXPECT_EQ(result.exitStatus, 0);
+    for (const char* topic :
+         {"startup_suite_dialog", "load_unload_applications_dialog", "StandardFileSelectionDialogs"})
+        EXPECT_THAT(result.output, HasSubstr(std::string("/Resources/help/") + topic + ".html\n"));
+    EXPECT_EQ(session.run({"HELP nothing"}).exitStatus, 1);
+}
+
+TEST(Session, ReadsAndWritesSystemVariables)
+{
+    const HostSession session;
+    const auto result = session.run({"SETVAR LISPENABLED", "setvar lispenabled 0", "SETVAR LISPENABLED"});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, HasSubstr("Command: SETVAR LISPENABLED\nLISPENABLED = 1\n"));
+    EXPECT_THAT(result.output, EndsWith("Command: SETVAR LISPENABLED\nLISPENABLED = 0\n"));
+}
+
+TEST(Session, RefusesValuesThatAVariableCannotHave)
+{
+    const HostSession session;
+    for (const char* command : {"SETVAR LISPENABLED 7", "SETVAR LISPENABLED yes", "SETVAR NOSUCHVARIABLE 1"})
+    {
+        const auto result = session.run({command});
+        EXPECT_EQ(result.exitStatus, 1) << result.output;
+    }
+}
+
+TEST(Session, EvaluatesLisp)
+{
+    const HostSession session;
+    const auto result = session.run({"(+ 40 2)", "(princ \"größer\")"});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, AllOf(HasSubstr("Command: (+ 40 2)\n42\n"), HasSubstr("größer")));
+}
+
+TEST(Session, GoesOnAfterALispErrorAndEndsWithStatusOne)
+{
+    const HostSession session;
+    const auto result = session.run({"(car 5)", "(+ 1 2)"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, HasSubstr("Command: (+ 1 2)\n3\n"));
+}
+
+TEST(Session, RunsAScriptAsATranscript)
+{
+    const HostSession session;
+    const auto result = session.runScript("; a comment\n(defun twice (x)\n  (* 2 x))\n(twice 21)\nVERSION\n");
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, AllOf(HasSubstr("Command: ; a comment\n"), HasSubstr("     ...   (* 2 x))\n"),
+                                     HasSubstr("Command: (twice 21)\n42\n")));
+}
+
+TEST(Session, RunsAScriptInsideOfAScript)
+{
+    const HostSession session;
+    const auto inner = session.folder().write("inner script.txt", "VERSION\nFOO\n");
+    const auto result = session.runScript("SCRIPT \"" + inner.string() + "\"\nVERSION\n");
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, HasSubstr("Unknown command \"FOO\""));
+}
+
+TEST(Session, StopsAScriptThatRunsItself)
+{
+    const HostSession session;
+    const auto script = session.folder() / "script.txt";
+    const auto result = session.runScript("SCRIPT " + script.string() + "\n");
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, HasSubstr("runs itself"));
+}
+
+TEST(Session, SaysThatAScriptIsMissing)
+{
+    const HostSession session;
+    const auto result = session.start({"--script", "/nowhere/at all.script"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, HasSubstr("The script /nowhere/at all.script cannot be read: "));
+}
+
+TEST(Session, TreatsAPipeLikeAScript)
+{
+    const HostSession session;
+    const auto result = session.runPipe("VERSION\n(+ 1 2)\nQUIT\nFOO\n");
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, AllOf(HasSubstr("Command: (+ 1 2)\n3\n"), Not(HasSubstr("FOO"))));
+    EXPECT_EQ(session.runPipe("FOO\n").exitStatus, 1);
+}
+
+TEST(Session, EndsWithStatusTwoForArgumentsItDoesNotKnow)
+{
+    const HostSession session;
+    EXPECT_EQ(session.start({"--nonsense"}).exitStatus, 2);
+    EXPECT_EQ(session.start({"--help"}).exitStatus, 0);
+    EXPECT_EQ(session.start({"--version"}).output, "Tessel R21, reference host for Modrig\n");
+}
+
+TEST(Session, ChangesTheCurrentFolder)
+{
+    const HostSession session;
+    const auto folder = session.folder().write("a b/x.txt", "").parent_path().string();
+    const auto result = session.run({"CD \"" + folder + "\"", "CD", "CD /nowhere/at/all"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, AllOf(HasSubstr("Command: CD\n" + folder + "\n"),
+                                     HasSubstr("The folder /nowhere/at/all cannot be entered: ")));
+}

@@ -1,0 +1,84 @@
+// A person at a terminal.
+#include <gtest/gtest.h>
+
+#include "tests/e2e/HostTerminal.h"
+
+TEST(Terminal, EndsWithControlD)
+{
+    const HostSession session;
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type(kControlD);
+    EXPECT_EQ(terminal.waitForEnd(), 0);
+}
+
+TEST(Terminal, CompletesTheNameOfACommandWithTab)
+{
+    const HostSession session;
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("vers\t\r");
+    EXPECT_TRUE(terminal.shows("VERSION ")) << terminal.screen();
+    EXPECT_TRUE(terminal.shows("Tessel R21")) << terminal.screen();
+}
+
+TEST(Terminal, ShowsTheNamesToChooseFrom)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"});
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("s\t");
+    EXPECT_TRUE(terminal.shows("SCRIPT  SETVAR")) << terminal.screen();
+}
+
+TEST(Terminal, StopsRunawayLispWithControlCAndGoesOn)
+{
+    const HostSession session;
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("(progn (princ \"be\") (princ \"gun\") (loop))\r");
+    ASSERT_TRUE(terminal.shows("begun")) << terminal.screen();
+    terminal.type(kControlC);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("(* 6 7)\r");
+    EXPECT_TRUE(terminal.shows("\n42")) << terminal.screen();
+    terminal.type("QUIT\r");
+    EXPECT_EQ(terminal.waitForEnd(), 0);
+}
+
+TEST(Terminal, GivesAFreshPromptForControlC)
+{
+    const HostSession session;
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("(half an expression\r");
+    ASSERT_TRUE(terminal.shows("... ")) << terminal.screen();
+    terminal.type(kControlC);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("rubbish");
+    ASSERT_TRUE(terminal.shows("rubbish")) << terminal.screen();
+    terminal.type(kControlC);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("VERSION\r");
+    EXPECT_TRUE(terminal.shows("Tessel R21")) << terminal.screen();
+    terminal.type("QUIT\r");
+    EXPECT_EQ(terminal.waitForEnd(), 0);
+}
+
+TEST(Terminal, RemembersWhatWasTypedInEarlierSessions)
+{
+    const HostSession session;
+    {
+        HostTerminal terminal(session);
+        ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+        terminal.type("(list 'übung 17)\r");
+        ASSERT_TRUE(terminal.shows("ÜBUNG 17")) << terminal.screen();
+        terminal.type(kControlD);
+        ASSERT_EQ(terminal.waitForEnd(), 0);
+    }
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("\x1b[A"); // the up arrow
+    EXPECT_TRUE(terminal.shows("(list 'übung 17)")) << terminal.screen();
+}
