@@ -1,64 +1,22 @@
 #include "host/registry/Registry.h"
 
 #include <sqlite3.h>
-#include <sys/stat.h>
 
 #include <algorithm>
 
 #include "host/Services.h"
 #include "host/console/CommandLine.h"
-#include "host/registry/Statement.h"
+#include "host/registry/Statements.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
 {
 namespace
 {
-constexpr int kBusyMilliseconds = 5000;
-constexpr int kSchemaVersion = 1;
 constexpr std::uintptr_t kFirstHandle = 0x1000;
 // Written pages are handed to the file system after each of the first writes of a command and every so often
 // later, so that a full disk shows at the write that it hits and the caller can tell its user.
 constexpr unsigned kWritesFlushedAtOnce = 64;
-
-constexpr const char* kSchema =
-    "BEGIN IMMEDIATE;"
-    "CREATE TABLE IF NOT EXISTS key(id INTEGER PRIMARY KEY AUTOINCREMENT,"
-    " parent INTEGER NOT NULL REFERENCES key(id) ON DELETE CASCADE, name TEXT NOT NULL, fold TEXT NOT NULL,"
-    " UNIQUE(parent, fold));"
-    "CREATE TABLE IF NOT EXISTS value(seq INTEGER PRIMARY KEY AUTOINCREMENT,"
-    " key INTEGER NOT NULL REFERENCES key(id) ON DELETE CASCADE, name TEXT NOT NULL, fold TEXT NOT NULL,"
-    " data TEXT NOT NULL, UNIQUE(key, fold));"
-    "CREATE INDEX IF NOT EXISTS value_order ON value(key, seq);"
-    "CREATE INDEX IF NOT EXISTS key_order ON key(parent, id);"
-    "INSERT OR IGNORE INTO key(id, parent, name, fold)"
-    " VALUES(1, 1, 'HKEY_CURRENT_USER', 'hkey_current_user');"
-    "PRAGMA user_version=1;"
-    "COMMIT;";
-
-LONG statusOf(int sqlite)
-{
-    switch (sqlite & 0xFF)
-    {
-    case SQLITE_OK:
-    case SQLITE_DONE:
-        return ERROR_SUCCESS;
-    case SQLITE_FULL:
-        return ERROR_DISK_FULL;
-    case SQLITE_READONLY:
-    case SQLITE_PERM:
-    case SQLITE_AUTH:
-        return ERROR_ACCESS_DENIED;
-    default:
-        return ERROR_WRITE_FAULT;
-    }
-}
-
-bool isMarkedReadOnly(const std::filesystem::path& file)
-{
-    struct stat status = {};
-    return stat(file.c_str(), &status) == 0 && (status.st_mode & (S_IWUSR | S_IWGRP | S_IWOTH)) == 0;
-}
 
 std::wstring_view takePart(std::wstring_view& path)
 {
@@ -67,50 +25,7 @@ std::wstring_view takePart(std::wstring_view& path)
     path.remove_prefix(std::min(end + 1, path.size()));
     return part;
 }
-
-int firstNumber(sqlite3* database, const char* sql, int& number)
-{
-    Statement statement;
-    int status = statement.prepare(database, sql);
-    if (status == SQLITE_OK)
-        status = statement.step();
-    if (status != SQLITE_ROW)
-        return status;
-    number = static_cast<int>(statement.number(0));
-    return SQLITE_OK;
-}
 } // namespace
-
-struct Registry::Statements
-{
-    Statement findKey, keyExists, insertKey, deleteKey, subKeys;
-    Statement readValue, writeValue, deleteValue, values, nextValue, valueAt;
-    Statement begin, commit, rollback;
-
-    int prepare(sqlite3* database)
-    {
-        const std::pair<Statement&, const char*> all[] = {
-            {findKey, "SELECT id FROM key WHERE parent=? AND fold=? AND id<>1"},
-            {keyExists, "SELECT 1 FROM key WHERE id=?"},
-            {insertKey, "INSERT INTO key(parent,name,fold) VALUES(?,?,?)"},
-            {deleteKey, "DELETE FROM key WHERE id=?"},
-            {subKeys, "SELECT name FROM key WHERE parent=? AND id<>1 ORDER BY id"},
-            {readValue, "SELECT data FROM value WHERE key=? AND fold=?"},
-            {writeValue, "INSERT INTO value(key,name,fold,data) VALUES(?,?,?,?)"
-                         " ON CONFLICT(key,fold) DO UPDATE SET data=excluded.data"},
-            {deleteValue, "DELETE FROM value WHERE key=? AND fold=?"},
-            {values, "SELECT name,data FROM value WHERE key=? ORDER BY seq"},
-            {nextValue, "SELECT seq,name FROM value WHERE key=? AND seq>? ORDER BY seq LIMIT 1"},
-            {valueAt, "SELECT seq,name FROM value WHERE key=? ORDER BY seq LIMIT 1 OFFSET ?"},
-            {begin, "BEGIN IMMEDIATE"},
-            {commit, "COMMIT"},
-            {rollback, "ROLLBACK"}};
-        for (const auto& [statement, sql] : all)
-            if (const int status = statement.prepare(database, sql); status != SQLITE_OK)
-                return status;
-        return SQLITE_OK;
-    }
-};
 
 Registry::Registry(std::filesystem::path file) : mFile(std::move(file)), mNextHandle(kFirstHandle)
 {
@@ -122,74 +37,6 @@ Registry::~Registry()
     endOfCommand();
     mStatements.reset();
     sqlite3_close(mDatabase);
-}
-
-void Registry::open()
-{
-    mReadOnly = isMarkedReadOnly(mFile);
-    if (openFile() != ERROR_SUCCESS || prepare() != ERROR_SUCCESS)
-    {
-        mProblem = L"The registry " + toWide(mFile.string()) + L" cannot be used: " + storeWords() +
-                   L". It was left as it is, and nothing will be stored.";
-        mStatements.reset();
-        sqlite3_close(mDatabase);
-        mDatabase = nullptr;
-        return;
-    }
-    if (mReadOnly)
-        mProblem = L"The registry " + toWide(mFile.string()) +
-                   L" may only be read: what is stored there is used, and nothing new will be stored.";
-}
-
-LONG Registry::openFile()
-{
-    const int flags = mReadOnly ? SQLITE_OPEN_READONLY : SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE;
-    const int status = sqlite3_open_v2(mFile.c_str(), &mDatabase, flags | SQLITE_OPEN_NOMUTEX, nullptr);
-    if (status != SQLITE_OK)
-        return statusOf(status);
-    mReadOnly = sqlite3_db_readonly(mDatabase, "main") == 1;
-    return statusOf(sqlite3_busy_timeout(mDatabase, kBusyMilliseconds));
-}
-
-LONG Registry::checkOrigin(int& version)
-{
-    int tables = 0;
-    int status = firstNumber(mDatabase, "PRAGMA user_version", version);
-    if (status == SQLITE_OK && version < kSchemaVersion)
-        status = firstNumber(mDatabase, "SELECT count(*) FROM sqlite_master", tables);
-    if (version > kSchemaVersion)
-        mFailureWords = L"it was written by a newer Tessel";
-    // Another process may have made the registry between the two looks; then it says its version by now.
-    else if (tables > 0 && firstNumber(mDatabase, "PRAGMA user_version", version) == SQLITE_OK &&
-             version < kSchemaVersion)
-        mFailureWords = L"it belongs to another program";
-    return mFailureWords.empty() ? statusOf(status) : ERROR_ACCESS_DENIED;
-}
-
-// What is somebody else's is recognised before anything is written: the journal's kind is part of the file.
-LONG Registry::prepare()
-{
-    int version = 0;
-    if (const LONG status = checkOrigin(version); status != ERROR_SUCCESS)
-        return status;
-    const auto run = [this](const char* sql)
-    {
-        return sqlite3_exec(mDatabase, sql, nullptr, nullptr, nullptr);
-    };
-    int status = run("PRAGMA synchronous=FULL; PRAGMA foreign_keys=ON;");
-    if (status == SQLITE_OK && version < kSchemaVersion && !mReadOnly)
-        status = run(kSchema);
-    mStatements = std::make_unique<Statements>();
-    if (status == SQLITE_OK)
-        status = mStatements->prepare(mDatabase);
-    if (status == SQLITE_OK && !mReadOnly)
-        status = run("PRAGMA journal_mode=WAL;");
-    return statusOf(status);
-}
-
-std::wstring Registry::storeWords() const
-{
-    return mFailureWords.empty() ? toWide(sqlite3_errmsg(mDatabase)) : mFailureWords;
 }
 
 Registry::Key Registry::findChild(Key parent, std::wstring_view name)

@@ -1,0 +1,150 @@
+// Opening the registry's file: whose it is, and whether it may be written.
+#include <sys/stat.h>
+
+#include <string_view>
+
+#include "host/registry/Statements.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr int kBusyMilliseconds = 5000;
+constexpr int kSchemaVersion = 1;
+constexpr const char* kAskVersion = "PRAGMA user_version";
+
+constexpr const char* kSchema =
+    "BEGIN IMMEDIATE;"
+    "CREATE TABLE IF NOT EXISTS key(id INTEGER PRIMARY KEY AUTOINCREMENT,"
+    " parent INTEGER NOT NULL REFERENCES key(id) ON DELETE CASCADE, name TEXT NOT NULL, fold TEXT NOT NULL,"
+    " UNIQUE(parent, fold));"
+    "CREATE TABLE IF NOT EXISTS value(seq INTEGER PRIMARY KEY AUTOINCREMENT,"
+    " key INTEGER NOT NULL REFERENCES key(id) ON DELETE CASCADE, name TEXT NOT NULL, fold TEXT NOT NULL,"
+    " data TEXT NOT NULL, UNIQUE(key, fold));"
+    "CREATE INDEX IF NOT EXISTS value_order ON value(key, seq);"
+    "CREATE INDEX IF NOT EXISTS key_order ON key(parent, id);"
+    "INSERT OR IGNORE INTO key(id, parent, name, fold)"
+    " VALUES(1, 1, 'HKEY_CURRENT_USER', 'hkey_current_user');"
+    "PRAGMA user_version=1;"
+    "COMMIT;";
+
+bool isMarkedReadOnly(const std::filesystem::path& file)
+{
+    struct stat status = {};
+    return stat(file.c_str(), &status) == 0 && (status.st_mode & (S_IWUSR | S_IWGRP | S_IWOTH)) == 0;
+}
+
+bool hasJournal(const std::filesystem::path& file)
+{
+    std::error_code missing;
+    return std::filesystem::exists(file.string() + "-wal", missing);
+}
+
+// The file as one that nobody changes: it is then read without the journal's files beside it, which a folder
+// that may not be written cannot take.
+std::string fixedFile(const std::filesystem::path& file)
+{
+    constexpr char kDigits[] = "0123456789ABCDEF";
+    std::string uri = "file:";
+    for (const char character : std::filesystem::absolute(file).string())
+    {
+        const auto byte = static_cast<unsigned char>(character);
+        if (std::string_view("%?#").find(character) == std::string_view::npos)
+            uri += character;
+        else
+            uri += {'%', kDigits[byte >> 4], kDigits[byte & 0xF]};
+    }
+    return uri + "?immutable=1";
+}
+
+int firstNumber(sqlite3* database, const char* sql, int& number)
+{
+    Statement statement;
+    int status = statement.prepare(database, sql);
+    if (status == SQLITE_OK)
+        status = statement.step();
+    if (status != SQLITE_ROW)
+        return status;
+    number = static_cast<int>(statement.number(0));
+    return SQLITE_OK;
+}
+} // namespace
+
+void Registry::open()
+{
+    mReadOnly = isMarkedReadOnly(mFile);
+    if (openFile() != ERROR_SUCCESS || prepare() != ERROR_SUCCESS)
+    {
+        mProblem = L"The registry " + toWide(mFile.string()) + L" cannot be used: " + storeWords() +
+                   L". It was left as it is, and nothing will be stored.";
+        mStatements.reset();
+        sqlite3_close(mDatabase);
+        mDatabase = nullptr;
+        return;
+    }
+    if (mReadOnly)
+        mProblem = L"The registry " + toWide(mFile.string()) +
+                   L" may only be read: what is stored there is used, and nothing new will be stored.";
+}
+
+LONG Registry::openFile()
+{
+    const int flags = mReadOnly ? SQLITE_OPEN_READONLY : SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE;
+    int status = sqlite3_open_v2(mFile.c_str(), &mDatabase, flags | SQLITE_OPEN_NOMUTEX, nullptr);
+    if (status != SQLITE_OK)
+        return statusOf(status);
+    mReadOnly = sqlite3_db_readonly(mDatabase, "main") == 1;
+    int version = 0;
+    const int asked = firstNumber(mDatabase, kAskVersion, version);
+    const bool journalRefused = mReadOnly && (asked == SQLITE_CANTOPEN || asked == SQLITE_READONLY);
+    if (journalRefused && !hasJournal(mFile))
+    {
+        sqlite3_close(mDatabase);
+        constexpr int kReadUri = SQLITE_OPEN_READONLY | SQLITE_OPEN_URI | SQLITE_OPEN_NOMUTEX;
+        status = sqlite3_open_v2(fixedFile(mFile).c_str(), &mDatabase, kReadUri, nullptr);
+    }
+    return statusOf(status == SQLITE_OK ? sqlite3_busy_timeout(mDatabase, kBusyMilliseconds) : status);
+}
+
+LONG Registry::checkOrigin(int& version)
+{
+    int tables = 0;
+    int status = firstNumber(mDatabase, kAskVersion, version);
+    if (status == SQLITE_OK && version < kSchemaVersion)
+        status = firstNumber(mDatabase, "SELECT count(*) FROM sqlite_master", tables);
+    if (version > kSchemaVersion)
+        mFailureWords = L"it was written by a newer Tessel";
+    // Another process may have made the registry between the two looks; then it says its version by now.
+    else if (tables > 0 && firstNumber(mDatabase, kAskVersion, version) == SQLITE_OK &&
+             version < kSchemaVersion)
+        mFailureWords = L"it belongs to another program";
+    return mFailureWords.empty() ? statusOf(status) : ERROR_ACCESS_DENIED;
+}
+
+// What is somebody else's is recognised before anything is written: the journal's kind is part of the file.
+LONG Registry::prepare()
+{
+    int version = 0;
+    if (const LONG status = checkOrigin(version); status != ERROR_SUCCESS)
+        return status;
+    const auto run = [this](const char* sql)
+    {
+        return sqlite3_exec(mDatabase, sql, nullptr, nullptr, nullptr);
+    };
+    int status = run("PRAGMA synchronous=FULL; PRAGMA foreign_keys=ON;");
+    if (status == SQLITE_OK && version < kSchemaVersion && !mReadOnly)
+        status = run(kSchema);
+    mStatements = std::make_unique<Statements>();
+    if (status == SQLITE_OK)
+        status = mStatements->prepare(mDatabase);
+    if (status == SQLITE_OK && !mReadOnly)
+        status = run("PRAGMA journal_mode=WAL;");
+    return statusOf(status);
+}
+
+std::wstring Registry::storeWords() const
+{
+    return mFailureWords.empty() ? toWide(sqlite3_errmsg(mDatabase)) : mFailureWords;
+}
+} // namespace tessel
