@@ -70,7 +70,7 @@ Host::~Host()
 
 bool Host::start()
 {
-    if (services().commandLine || !prepareProfileFolder())
+    if (anotherRuns() || !prepareProfileFolder())
         return false;
     services().commandLine = &mCommandLine;
     mParts = std::make_unique<Parts>();
@@ -82,6 +82,13 @@ bool Host::start()
         mParts->demandLoading->loadAtStart();
     finishLine();
     return true;
+}
+
+bool Host::anotherRuns()
+{
+    if (services().commandLine)
+        mCommandLine.say(L"Another session runs in this process already.");
+    return services().commandLine;
 }
 
 bool Host::prepareProfileFolder()

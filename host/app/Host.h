@@ -62,6 +62,7 @@ public:
 private:
     struct Parts;
 
+    bool anotherRuns();
     bool prepareProfileFolder();
     void makeStore();
     void makeApplicationParts();

@@ -4,7 +4,6 @@
 #include <fstream>
 
 #include <sys/stat.h>
-#include <unistd.h>
 
 #include "tests/e2e/HostProcess.h"
 
@@ -47,6 +46,16 @@ TEST(RegistryFile, ThatIsNoDatabaseIsToldAndLeftAlone)
     std::ifstream file(session.profile() / "registry.db", std::ios::binary);
     const std::string after{std::istreambuf_iterator<char>(file), {}};
     EXPECT_TRUE(after == content);
+}
+
+TEST(RegistryFile, MarkedReadOnlyIsReadAndKeepsWhatItHolds)
+{
+    const HostSession session;
+    ASSERT_EQ(session.run({kSet}).exitStatus, 0);
+    ASSERT_EQ(chmod((session.profile() / "registry.db").c_str(), S_IRUSR), 0);
+    const auto result = session.run({R"(REGISTRY SET Software\Trial "a name" new)", kGet});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, AllOf(HasSubstr("cannot be written: "), HasSubstr("\ngröße 100%s\n")));
 }
 
 TEST(RegistryFile, IsToldWhenItCannotBeMade)
