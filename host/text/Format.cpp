@@ -78,12 +78,18 @@ bool fits(const Conversion& conversion, const TsFormatArgument& argument)
 // The same conversion for the C library, with the size that the argument is passed in.
 std::string cFormat(const Conversion& conversion, const char* size)
 {
-    std::string format = "%" + conversion.flags + std::to_string(conversion.width);
-    if (conversion.width == 0)
-        format = "%" + conversion.flags;
+    std::string format(1, '%');
+    format += conversion.flags;
+    if (conversion.width > 0)
+        format += std::to_string(conversion.width);
     if (conversion.precision >= 0)
-        format += "." + std::to_string(std::min(kWidest, conversion.precision));
-    return format + size + static_cast<char>(conversion.letter);
+    {
+        format += '.';
+        format += std::to_string(std::min(kWidest, conversion.precision));
+    }
+    format += size;
+    format += static_cast<char>(conversion.letter);
+    return format;
 }
 
 template <class Number>

@@ -1,0 +1,136 @@
+// Rebuilding the list of loaded applications, and validating paths.
+#include <benchmark/benchmark.h>
+#include <tessel/tsed.h>
+#include <tessel/tsrxlinker.h>
+#include <wincompat/winfile.h>
+
+#include <filesystem>
+#include <fstream>
+#include <string>
+#include <vector>
+
+#include "bench/Child.h"
+#include "bench/Ratios.h"
+#include "bench/Session.h"
+#include "loader/LoadedApplications.h"
+#include "types/FileValidation.h"
+
+namespace
+{
+constexpr int kFewModules = 100;
+constexpr int kManyModules = 1'000;
+constexpr int kLispFilesPerModule = 10;
+constexpr int kPaths = 1'000;
+constexpr int kRepetitions = 9;
+
+std::wstring wide(const std::filesystem::path& path)
+{
+    const std::string text = path.string();
+    return {text.begin(), text.end()}; // the folder's name is plain
+}
+
+void loadModules(int count)
+{
+    const auto folder = bench::workFolder() / "rebuild";
+    std::filesystem::create_directories(folder);
+    TsRxDynamicLinker* linker = TsRxDynamicLinker::cast(tsrxSysRegistry()->at(TSRX_DYNAMIC_LINKER));
+    for (int i = 0; i < count; ++i)
+    {
+        const auto path = folder / ("module" + std::to_string(i) + ".zmb");
+        std::filesystem::copy_file(BENCH_MODULE, path, std::filesystem::copy_options::skip_existing);
+        linker->loadModule(wide(path).c_str(), true, true);
+    }
+}
+
+void loadLispFiles(int count)
+{
+    const auto folder = bench::workFolder() / "rebuild";
+    for (int i = 0; i < count; ++i)
+    {
+        const auto path = folder / ("tool" + std::to_string(i) + ".lsp");
+        std::ofstream(path) << "t";
+        qxr_queueexpr((L"(load \"" + wide(path) + L"\")").c_str());
+    }
+    bench::endCommand();
+}
+
+// In a child: what is loaded for one size must not be there for the other.
+void addRebuild(const std::string& name, int modules)
+{
+    benchmark::RegisterBenchmark(name.c_str(),
+                                 [modules](benchmark::State& state)
+                                 {
+                                     for (auto iteration : state)
+                                     {
+                                         static_cast<void>(iteration);
+                                         state.SetIterationTime(bench::inChild(
+                                             [modules]
+                                             {
+                                                 loadModules(modules);
+                                                 loadLispFiles(modules * kLispFilesPerModule);
+                                                 return bench::secondsOf(ModrigUtils::PopulateLoadedApps);
+                                             }));
+                                     }
+                                 })
+        ->UseManualTime()
+        ->Iterations(1)
+        ->Repetitions(kRepetitions);
+}
+
+const std::vector<CStdStr>& existingPaths()
+{
+    static const std::vector<CStdStr> paths = []
+    {
+        std::vector<CStdStr> made;
+        const auto folder = bench::workFolder() / "paths";
+        std::filesystem::create_directories(folder);
+        for (int i = 0; i < kPaths; ++i)
+        {
+            const auto path = folder / ("tool" + std::to_string(i) + ".lsp");
+            std::ofstream(path) << "t";
+            made.emplace_back(wide(path));
+        }
+        return made;
+    }();
+    return paths;
+}
+
+template <class Check>
+void addValidation(const std::string& name, Check check)
+{
+    benchmark::RegisterBenchmark(name.c_str(),
+                                 [check](benchmark::State& state)
+                                 {
+                                     for (auto iteration : state)
+                                     {
+                                         static_cast<void>(iteration);
+                                         for (const CStdStr& path : existingPaths())
+                                             benchmark::DoNotOptimize(check(path));
+                                     }
+                                 })
+        ->Repetitions(kRepetitions)
+        ->MinTime(0.05);
+}
+} // namespace
+
+void addRebuildBenchmarks()
+{
+    bench::startHost();
+    const std::string few = "rebuild with 100 modules, 1000 applications";
+    const std::string many = "rebuild with 1000 modules, 10000 applications";
+    addRebuild(few, kFewModules);
+    addRebuild(many, kManyModules);
+    bench::addRatio(
+        {"rebuild, cost per application at 11000 / at 1100", many, few, 1.5, kManyModules, kFewModules});
+
+    const std::string bare = "validate 1000 paths, bare attribute calls";
+    const std::string validated = "validate 1000 paths";
+    addValidation(bare, [](const CStdStr& path) { return GetFileAttributesW(path.c_str()); });
+    addValidation(validated,
+                  [](const CStdStr& path)
+                  {
+                      CStdStr found = path;
+                      return ModrigUtils::ValidateFileExists(found);
+                  });
+    bench::addRatio({"validating 1000 existing paths / bare attribute calls", validated, bare, 1.5});
+}

@@ -1,0 +1,74 @@
+// From the start of the host's process to its first prompt, against the parts that it cannot do without.
+// Every run is a new process with an empty Startup Suite.
+#include <benchmark/benchmark.h>
+#include <fcntl.h>
+#include <spawn.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <functional>
+#include <string>
+#include <vector>
+
+#include "bench/Child.h"
+#include "bench/Ratios.h"
+#include "bench/Session.h"
+
+extern char** environ;
+
+namespace
+{
+constexpr int kRepetitions = 15;
+
+// Runs the program with its output thrown away and answers whether it ended well.
+bool runProgram(std::vector<std::string> arguments)
+{
+    std::vector<char*> pointers;
+    for (std::string& argument : arguments)
+        pointers.push_back(argument.data());
+    pointers.push_back(nullptr);
+    posix_spawn_file_actions_t actions;
+    posix_spawn_file_actions_init(&actions);
+    posix_spawn_file_actions_addopen(&actions, STDIN_FILENO, "/dev/null", O_RDONLY, 0);
+    posix_spawn_file_actions_addopen(&actions, STDOUT_FILENO, "/dev/null", O_WRONLY, 0);
+    pid_t child = 0;
+    const int status = posix_spawn(&child, pointers[0], &actions, nullptr, pointers.data(), environ);
+    posix_spawn_file_actions_destroy(&actions);
+    int ended = 1;
+    return status == 0 && waitpid(child, &ended, 0) == child && ended == 0;
+}
+
+std::string profileFolder(const std::string& name)
+{
+    return (bench::workFolder() / ("start-" + name)).string();
+}
+
+void add(const std::string& name, const std::vector<std::string>& arguments)
+{
+    benchmark::RegisterBenchmark(name.c_str(),
+                                 [arguments](benchmark::State& state)
+                                 {
+                                     for (auto iteration : state)
+                                     {
+                                         static_cast<void>(iteration);
+                                         bool ended = false;
+                                         state.SetIterationTime(
+                                             bench::secondsOf([&] { ended = runProgram(arguments); }));
+                                         if (!ended)
+                                             state.SkipWithError("the program did not end well");
+                                     }
+                                 })
+        ->UseManualTime()
+        ->Iterations(1)
+        ->Repetitions(kRepetitions);
+}
+} // namespace
+
+void addStartBenchmarks()
+{
+    // Standard input is at its end: the host comes to its first prompt and leaves.
+    add("start: host to prompt", {TESSEL_PROGRAM, "--profile-dir", profileFolder("host")});
+    add("start: the parts, one after the other", {START_PARTS, profileFolder("parts"), MODRIG_BUNDLE});
+    bench::addRatio({"host start to prompt / sum of its parts", "start: host to prompt",
+                     "start: the parts, one after the other", 1.3});
+}

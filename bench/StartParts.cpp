@@ -1,0 +1,30 @@
+// What the host cannot start without, one part after the other and nothing else: the registry, Lisp, and the
+// Modrig bundle mapped by the platform. Linked with the host's objects, since its library hides its parts.
+#include <cstdio>
+#include <filesystem>
+
+#include "host/Services.h"
+#include "host/console/CommandLine.h"
+#include "host/linker/ModuleLibrary.h"
+#include "host/lisp/LispInterpreter.h"
+#include "host/registry/Registry.h"
+
+int main(int argc, char** argv)
+{
+    if (argc != 3)
+    {
+        std::fputs("usage: bench_start_parts PROFILE-FOLDER BUNDLE\n", stderr);
+        return 2;
+    }
+    std::filesystem::create_directories(argv[1]);
+    tessel::CommandLine commandLine([](std::string_view) {});
+    tessel::services().commandLine = &commandLine;
+    tessel::Registry registry(std::filesystem::path(argv[1]) / "registry.db");
+    tessel::services().registry = &registry;
+    tessel::ensureCurrentProfile(registry, L"Software\\Tessel\\R21");
+    registry.endOfCommand();
+    const tessel::LispInterpreter lisp({});
+    std::wstring whyNot;
+    const auto bundle = tessel::ModuleLibrary::open(tessel::moduleFileAt(argv[2]), true, whyNot);
+    return bundle && bundle->entryPoint() ? 0 : 1;
+}
