@@ -26,6 +26,8 @@ constexpr cl_fixnum kFrameStackSize = 65536;
 // may use more: as much as the system keeps free below the main thread's stack.
 constexpr rlim_t kStackBytes = rlim_t{112} << 20;
 constexpr int kMostLockHolds = 8;
+// Room for telling the error and going on when the memory is exhausted by what the user keeps.
+constexpr std::size_t kHeapReserve = std::size_t{16} << 20;
 
 // Found once; the garbage collector knows them through their symbols.
 struct LispFunctions
@@ -100,11 +102,14 @@ LispFunctions startLisp()
     setSignalOptions();
     ecl_set_option(ECL_OPT_FRAME_STACK_SIZE, kFrameStackSize);
     ecl_set_option(ECL_OPT_HEAP_SIZE, kLispHeapBytes);
+    ecl_set_option(ECL_OPT_HEAP_SAFETY_AREA, kHeapReserve);
     const auto faultAction = currentFaultAction();
     static char name[] = "tessel";
     static char* arguments[] = {name, nullptr};
     cl_boot(1, arguments);
     shareMemoryFaults(faultAction);
+    // ECL would write some of its troubles to the terminal, past the host.
+    cl_core.error_output = cl_make_broadcast_stream(0);
     raiseStackLimit();
     cl_object fault = startPrelude(toWide(lispPrelude()));
     if (fault != ECL_NIL)
@@ -175,6 +180,13 @@ void releaseForgottenLock()
     }
     ECL_CATCH_ALL_END;
 }
+// Every exhaustion gives Lisp some memory more, which it keeps only while the rest is in use.
+void takeBackReserve(std::size_t heapBytes)
+{
+    if (cl_core.max_heap_size > heapBytes &&
+        GC_get_heap_size() - GC_get_free_bytes() + kHeapReserve < heapBytes)
+        si_set_limit(ecl_make_symbol("HEAP-SIZE", "EXT"), ecl_make_fixnum(static_cast<cl_fixnum>(heapBytes)));
+}
 } // namespace
 
 struct LispMachine::Parts
@@ -201,7 +213,10 @@ struct LispMachine::Parts
         interrupter.end();
         const bool ok = ECL_CONSP(pair) && ECL_CONS_CAR(pair) == ecl_make_keyword("DONE");
         if (!ok)
+        {
             releaseForgottenLock();
+            takeBackReserve(surroundings.heapBytes);
+        }
         flushLispOutput();
         return {ok, ECL_CONSP(pair) ? ECL_CONS_CDR(pair) : ECL_NIL};
     }

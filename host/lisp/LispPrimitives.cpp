@@ -1,5 +1,6 @@
 #include "host/lisp/LispPrimitives.h"
 
+#include <cstddef>
 #include <exception>
 #include <string>
 #include <thread>
@@ -160,6 +161,27 @@ cl_object interruptWanted()
     return answer(interrupter && interrupter->takeRequest() ? ECL_T : ECL_NIL);
 }
 
+// Half of the reserve is for the error, half for the error in its handler.
+std::ptrdiff_t sizeWithoutReserve(cl_index size, int reserve)
+{
+    return static_cast<std::ptrdiff_t>(size) - 2 * ecl_get_option(reserve);
+}
+
+// ECL lets a stack that has overflowed reach into its reserve, for the error to be handled, and must take
+// that back afterwards. Its own way replaces the stack of frames by a new one while frames are being left,
+// and measures the machine's stack anew, by a limit that is meant for other things.
+cl_object restoreStackLimits()
+{
+    const cl_env_ptr environment = ecl_process_env();
+    environment->frs_limit =
+        environment->frs_org + sizeWithoutReserve(environment->frs_size, ECL_OPT_FRAME_STACK_SAFETY_AREA);
+    environment->bds_limit =
+        environment->bds_org + sizeWithoutReserve(environment->bds_size, ECL_OPT_BIND_STACK_SAFETY_AREA);
+    environment->cs_limit =
+        environment->cs_org - sizeWithoutReserve(environment->cs_size, ECL_OPT_C_STACK_SAFETY_AREA);
+    return answer(ECL_NIL);
+}
+
 // ECL keeps all functions as one type and calls them with the number of arguments that goes with each.
 template <typename... Arguments>
 void define(const char* name, cl_object (*function)(Arguments...))
@@ -178,6 +200,7 @@ void defineLispPrimitives()
     define("%COLUMN", column);
     define("%READ-FILE", readFile);
     define("%RECORD-LOADED", recordLoaded);
+    define("%RESTORE-STACK-LIMITS", restoreStackLimits);
     define("%INTERRUPT-WANTED", interruptWanted);
 }
 

@@ -50,8 +50,20 @@
   (typecase condition
     (ext:stack-overflow "stack overflow: the recursion is endless or too deep.")
     (storage-condition "the memory for Lisp is exhausted.")
-    (t (handler-case (with-plain-printing (on-one-line (cl:princ-to-string condition)))
+    (division-by-zero "division by zero.")
+    (end-of-file "the end of the input was reached too soon.")
+    (t (handler-case (with-plain-printing (report-text condition))
          (error () (format nil "an error of the type ~S, which cannot be printed." (type-of condition)))))))
+
+(defun report-text (condition)
+  (let* ((text (cl:princ-to-string condition))
+         ;; The first line of a reader error names the stream; the place says more.
+         (line-break (and (typep condition 'reader-error) (position #\Newline text)))
+         (line (on-one-line (if line-break (subseq text line-break) text))))
+    ;; Some have no report of their own.
+    (if (eql 0 (search "#<" line))
+        (format nil "an error of the type ~S." (type-of condition))
+        line)))
 
 (defun failure (condition)
   (let ((place (if (eq condition (car *placed-error*)) (cdr *placed-error*) *place*)))

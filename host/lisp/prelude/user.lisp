@@ -51,6 +51,13 @@
 (dolist (name '(si::exit ext:quit))
   (setf (fdefinition name) #'refuse-to-quit))
 
+;;; Endless recursion is an error like others: it cannot be continued with more stack.
+(setf (fdefinition 'si::stack-error-handler)
+      (lambda (continue-text condition arguments)
+        (declare (ignore continue-text))
+        (unwind-protect (apply #'error condition arguments)
+          (%restore-stack-limits))))
+
 ;;; A user who defines one of these by mistake is told, as with the functions of Lisp.
 (ext:package-lock "TESSEL" t)
 
