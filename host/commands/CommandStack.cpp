@@ -230,16 +230,18 @@ CommandStack::Arguments splitLine(std::wstring_view line)
     CommandStack::Arguments parts;
     bool quoted = false;
     bool inPart = false; // also true for a pair of quotes with nothing between them
-    for (const wchar_t character : line)
+    for (std::size_t at = 0; at < line.size(); ++at)
     {
-        const bool separates = !quoted && isBlank(character);
+        const bool separates = !quoted && isBlank(line[at]);
         if (!separates && !inPart)
             parts.emplace_back();
         inPart = !separates;
-        if (character == L'"')
+        const bool doubled = quoted && line.substr(at).starts_with(L"\"\"");
+        if (line[at] == L'"' && !doubled)
             quoted = !quoted;
         else if (!separates)
-            parts.back() += character;
+            parts.back() += line[at];
+        at += doubled ? 1 : 0;
     }
     return parts;
 }

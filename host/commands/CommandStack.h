@@ -81,7 +81,8 @@ private:
     AfterLine mAfterLine;
 };
 
-// The parts of a line: split at blanks; double quotes keep blanks together and are taken away. A quote that
-// is not closed reaches to the end of the line.
+// The parts of a line: split at blanks; double quotes keep blanks together and are taken away. Within them a
+// doubled quote stands for one, so that a file with a quote in its name can be named. A quote that is not
+// closed reaches to the end of the line.
 CommandStack::Arguments splitLine(std::wstring_view line);
 } // namespace tessel

@@ -252,3 +252,9 @@ TEST(SplitLine, KeepsQuotedBlanksTogether)
     EXPECT_THAT(splitLine(LR"(a" "b)"), ElementsAre(L"a b"));
     EXPECT_THAT(splitLine(LR"(LOAD "no end)"), ElementsAre(L"LOAD", L"no end"));
 }
+
+TEST(SplitLine, TakesADoubledQuoteWithinQuotesForAQuote)
+{
+    EXPECT_THAT(splitLine(LR"(LOAD "/a ""b"" c.lsp")"), ElementsAre(L"LOAD", LR"(/a "b" c.lsp)"));
+    EXPECT_THAT(splitLine(LR"("""" a""b)"), ElementsAre(L"\"", L"ab"));
+}
