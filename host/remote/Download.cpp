@@ -1,7 +1,9 @@
 #include "host/remote/Download.h"
 
 #include <curl/curl.h>
+#include <unistd.h>
 
+#include <cerrno>
 #include <fstream>
 #include <memory>
 #include <system_error>
@@ -12,6 +14,7 @@ namespace
 {
 constexpr const char* kProtocols = "http,https"; // for redirections too: a server must not name local files
 constexpr long kMostRedirections = 5;
+constexpr long kWholeFile = 200; // of the other answers none brings the file that was asked for
 
 struct Sink
 {
@@ -57,13 +60,17 @@ void configure(CURL* transfer, const std::string& url, const RemoteFiles::Limits
     curl_easy_setopt(transfer, CURLOPT_WRITEDATA, &sink);
 }
 
-std::string whyNot(CURLcode status, const Sink& sink, const char* words)
+std::string whyNot(CURL* transfer, CURLcode status, const Sink& sink, const char* words)
 {
-    if (sink.isFull())
+    if (sink.isFull() || status == CURLE_FILESIZE_EXCEEDED)
         return "it is larger than " + std::to_string(sink.limit) + " bytes";
+    if (!sink.file)
+        return "the local copy could not be written";
     if (status != CURLE_OK)
         return *words ? words : curl_easy_strerror(status);
-    return sink.file ? "" : "the local copy could not be written";
+    long answer = 0;
+    curl_easy_getinfo(transfer, CURLINFO_RESPONSE_CODE, &answer);
+    return answer == kWholeFile ? "" : "the server answered " + std::to_string(answer);
 }
 
 std::string transferInto(const std::string& url, const std::filesystem::path& part,
@@ -71,7 +78,8 @@ std::string transferInto(const std::string& url, const std::filesystem::path& pa
 {
     Sink sink{std::ofstream(part, std::ios::binary), 0, limits.bytes};
     if (!sink.file)
-        return "the local copy " + part.string() + " cannot be made";
+        return "the local copy " + part.string() +
+               " cannot be made: " + std::generic_category().message(errno);
     const Transfer transfer(curl_easy_init());
     if (!transfer)
         return "the network library cannot be started";
@@ -79,20 +87,21 @@ std::string transferInto(const std::string& url, const std::filesystem::path& pa
     configure(transfer.get(), url, limits, sink, words);
     const CURLcode status = curl_easy_perform(transfer.get());
     sink.file.close();
-    return whyNot(status, sink, words);
+    return whyNot(transfer.get(), status, sink, words);
 }
 } // namespace
 
 std::string download(const std::string& url, const std::filesystem::path& file,
                      const RemoteFiles::Limits& limits)
 {
-    const std::filesystem::path part = file.string() + ".part";
+    // Named after the process: another one may be fetching the same file.
+    const std::filesystem::path part = file.parent_path() / (".part-" + std::to_string(getpid()));
     std::string problem = transferInto(url, part, limits);
     std::error_code failed;
     if (problem.empty())
     {
         std::filesystem::rename(part, file, failed);
-        problem = failed ? failed.message() : "";
+        problem = failed ? "the local copy " + file.string() + " cannot be made: " + failed.message() : "";
     }
     if (!problem.empty())
         std::filesystem::remove(part, failed); // may never have come into being

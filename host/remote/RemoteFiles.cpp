@@ -23,6 +23,7 @@ namespace
 {
 constexpr const char* kOriginFile = ".url";
 constexpr const char* kUnnamedFile = "download";
+constexpr std::size_t kLongestName = 200; // in bytes; a file system takes 255
 
 // FNV-1a; the URL beside the copy tells two with the same hash apart.
 std::uint64_t hashOf(const std::string& text)
@@ -33,6 +34,14 @@ std::uint64_t hashOf(const std::string& text)
     return hash;
 }
 
+// The first byte at or behind the position that begins a character.
+std::size_t firstCharacter(const std::string& utf8, std::size_t position)
+{
+    while (position < utf8.size() && (static_cast<unsigned char>(utf8[position]) & 0xC0) == 0x80)
+        ++position;
+    return position;
+}
+
 // The last part of the URL's path, without what cannot be a file's name.
 std::string fileNameOf(const std::string& url)
 {
@@ -41,6 +50,8 @@ std::string fileNameOf(const std::string& url)
     const std::size_t slash = path.rfind('/');
     std::string name = slash == std::string::npos || slash < host ? "" : path.substr(slash + 1);
     std::replace(name.begin(), name.end(), '\\', '_');
+    if (name.size() > kLongestName) // the end tells the kind
+        name.erase(0, firstCharacter(name, name.size() - kLongestName));
     const bool unusable = name.empty() || name == "." || name == ".." || name == kOriginFile;
     return unusable ? kUnnamedFile : name;
 }
@@ -77,28 +88,45 @@ RemoteFiles::RemoteFiles(std::filesystem::path cacheFolder, Limits limits)
 {
 }
 
-std::filesystem::path RemoteFiles::folderOf(const std::string& url) const
+std::filesystem::path RemoteFiles::copyOf(const std::string& url) const
 {
-    return mCacheFolder / std::to_string(hashOf(url));
+    return mCacheFolder / std::to_string(hashOf(url)) / fileNameOf(url);
 }
 
-RemoteFiles::Copy RemoteFiles::fetch(const std::wstring& url, bool ignoreCache)
+RemoteFiles::Copy RemoteFiles::fetch(const std::wstring& url, std::size_t longestPath, bool ignoreCache)
 {
     const std::string address = toUtf8(url);
-    const std::filesystem::path folder = folderOf(address);
-    const std::filesystem::path copy = folder / fileNameOf(address);
-    if (!ignoreCache && isFile(copy) && readFile(folder / kOriginFile) == address)
-        return {TS_FROM_CACHE, toWide(copy.string())};
+    const std::filesystem::path copy = copyOf(address);
+    const std::wstring path = toWide(copy.string());
+    if (path.size() > longestPath)
+        return fail(url, "the path of its local copy has more than " + std::to_string(longestPath) +
+                             " characters");
+    if (!ignoreCache && isFile(copy) && readFile(copy.parent_path() / kOriginFile) == address)
+        return {TS_FROM_CACHE, path};
+    const std::string problem = fetchInto(copy, address);
+    return problem.empty() ? Copy{TS_FETCHED, path} : fail(url, problem);
+}
+
+std::string RemoteFiles::fetchInto(const std::filesystem::path& copy, const std::string& url) const
+{
+    const std::filesystem::path folder = copy.parent_path();
     std::error_code failed;
     const bool isNew = std::filesystem::create_directories(folder, failed);
-    std::string problem = failed ? failed.message() : download(address, copy, mLimits);
-    if (problem.empty() && !writeFile(folder / kOriginFile, address))
-        problem = "the cache " + folder.string() + " cannot be written";
-    if (problem.empty())
-        return {TS_FETCHED, toWide(copy.string())};
-    if (isNew)
+    if (failed)
+        return "the cache folder " + folder.string() + " cannot be made: " + failed.message();
+    std::string problem = download(url, copy, mLimits);
+    // What an earlier fetch wrote stays: a copy without its origin would be lost.
+    const bool isKnown = readFile(folder / kOriginFile) == url;
+    if (problem.empty() && !isKnown && !writeFile(folder / kOriginFile, url))
+        problem = "the cache folder " + folder.string() + " cannot be written";
+    if (!problem.empty() && isNew)
         std::filesystem::remove_all(folder, failed);
-    services().commandLine->say(url + L" could not be fetched: " + toWide(problem) + L".");
+    return problem;
+}
+
+RemoteFiles::Copy RemoteFiles::fail(const std::wstring& url, const std::string& reason) const
+{
+    services().commandLine->say(url + L" could not be fetched: " + toWide(reason) + L".");
     return {TS_FETCH_FAILED, {}};
 }
 
@@ -106,11 +134,12 @@ bool RemoteFiles::IsRemoteFile(const wchar_t* localPath, wchar_t* url, std::size
 {
     const std::filesystem::path file = resolved(toUtf8(localPath ? localPath : L""));
     const std::filesystem::path folder = file.parent_path();
-    if (folder.parent_path() != resolved(mCacheFolder) || file.filename() == kOriginFile || !isFile(file))
+    if (folder.parent_path() != resolved(mCacheFolder) || !isFile(file))
         return false;
-    const std::wstring origin = toWide(readFile(folder / kOriginFile));
-    if (origin.empty())
+    const std::string address = readFile(folder / kOriginFile);
+    if (address.empty() || file.filename() != fileNameOf(address))
         return false;
+    const std::wstring origin = toWide(address);
     if (url && capacity > 0)
     {
         const std::size_t copied = std::min(origin.size(), capacity - 1);

@@ -29,14 +29,17 @@ public:
     // The cache folder is made with the first copy.
     RemoteFiles(std::filesystem::path cacheFolder, Limits limits);
 
-    // Makes a local copy, or, unless `ignoreCache`, takes an earlier one. A failure leaves nothing behind and
-    // is told in one sentence on the command line.
-    Copy fetch(const std::wstring& url, bool ignoreCache);
+    // Makes a local copy, or, unless `ignoreCache`, takes an earlier one. A failure, which a path longer than
+    // `longestPath` characters is too, leaves nothing new behind and is told in one sentence on the command
+    // line.
+    Copy fetch(const std::wstring& url, std::size_t longestPath, bool ignoreCache);
 
     bool IsRemoteFile(const wchar_t* localPath, wchar_t* url, std::size_t capacity) const override;
 
 private:
-    std::filesystem::path folderOf(const std::string& url) const;
+    std::filesystem::path copyOf(const std::string& url) const;
+    std::string fetchInto(const std::filesystem::path& copy, const std::string& url) const;
+    Copy fail(const std::wstring& url, const std::string& reason) const;
 
     std::filesystem::path mCacheFolder;
     Limits mLimits;

@@ -2,9 +2,11 @@
 
 #include <algorithm>
 #include <cwchar>
+#include <string>
 #include <string_view>
 
 #include "host/Services.h"
+#include "host/console/CommandLine.h"
 #include "host/remote/RemoteFiles.h"
 #include "host/text/Unicode.h"
 
@@ -34,12 +36,17 @@ bool ApplicationServices::isUrl(const wchar_t* text) const
 int ApplicationServices::fetchRemoteFile(const wchar_t* url, wchar_t* localPath, std::size_t capacity,
                                          bool ignoreCache)
 {
-    if (!services().remote || !isUrl(url) || !localPath)
+    if (!services().remote || !localPath || capacity == 0)
         return TS_FETCH_FAILED;
-    const RemoteFiles::Copy copy = services().remote->fetch(url, ignoreCache);
-    if (copy.status == TS_FETCH_FAILED || copy.path.size() + 1 > capacity)
+    if (!isUrl(url))
+    {
+        services().commandLine->say(L"\"" + std::wstring(url ? url : L"") +
+                                    L"\" is no http or https address.");
         return TS_FETCH_FAILED;
-    std::wmemcpy(localPath, copy.path.c_str(), copy.path.size() + 1);
+    }
+    const RemoteFiles::Copy copy = services().remote->fetch(url, capacity - 1, ignoreCache);
+    if (copy.status != TS_FETCH_FAILED)
+        std::wmemcpy(localPath, copy.path.c_str(), copy.path.size() + 1);
     return copy.status;
 }
 } // namespace tessel
