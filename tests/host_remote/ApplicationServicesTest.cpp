@@ -1,0 +1,77 @@
+#include "host/services/ApplicationServices.h"
+
+#include <gmock/gmock.h>
+
+#include "tests/host_remote/HttpServer.h"
+#include "tests/host_remote/RemoteHost.h"
+
+using testing::HasSubstr;
+using testing::IsEmpty;
+
+namespace
+{
+constexpr std::size_t kRoom = 1024;
+
+class ApplicationServices : public testing::Test
+{
+protected:
+    RemoteHost host;
+    tessel::ApplicationServices services;
+    HttpServer server{[](const std::string&)
+                      {
+                          return HttpServer::Answer{httpAnswer("200 OK", "1"), "", {}};
+                      }};
+};
+} // namespace
+
+TEST_F(ApplicationServices, TellWhatTheHostIs)
+{
+    EXPECT_STREQ(services.productRegistryRoot(), L"Software\\Tessel\\R21");
+    EXPECT_STREQ(services.product(), L"Tessel");
+    EXPECT_EQ(tsdbHostApplicationServices(), nullptr);
+    tessel::services().application = &services;
+    EXPECT_EQ(tsdbHostApplicationServices(), &services);
+}
+
+TEST_F(ApplicationServices, TakeHttpAndHttpsForAddresses)
+{
+    for (const wchar_t* url : {L"http://x", L"https://x/tool.lsp", L"HTTP://X", L"HttpS://x"})
+        EXPECT_TRUE(services.isUrl(url)) << url;
+    for (const wchar_t* text : {L"", L"http://", L"https://", L"http:/x", L"ftp://x", L"file:///x",
+                                L"/http://x", L" http://x", L"tool.lsp", L"C:\\tool.lsp", L"httpx://x"})
+        EXPECT_FALSE(services.isUrl(text)) << text;
+    EXPECT_FALSE(services.isUrl(nullptr));
+}
+
+TEST_F(ApplicationServices, FetchThenTakeFromTheCacheUnlessToldOtherwise)
+{
+    const std::wstring url = server.url(L"/tool.lsp");
+    wchar_t path[kRoom] = {};
+    EXPECT_EQ(services.fetchRemoteFile(url.c_str(), path, kRoom, false), TS_FETCHED);
+    EXPECT_EQ(host.content(std::wstring(path)), "1");
+    EXPECT_EQ(services.fetchRemoteFile(url.c_str(), path, kRoom, false), TS_FROM_CACHE);
+    EXPECT_EQ(services.fetchRemoteFile(url.c_str(), path, kRoom, true), TS_FETCHED);
+    EXPECT_EQ(server.requests().size(), 2u);
+}
+
+TEST_F(ApplicationServices, LeaveNothingBehindWhenThePathDoesNotFit)
+{
+    const std::wstring url = server.url(L"/tool.lsp");
+    wchar_t path[kRoom] = L"untouched";
+    EXPECT_EQ(services.fetchRemoteFile(url.c_str(), path, 20, false), TS_FETCH_FAILED);
+    EXPECT_STREQ(path, L"untouched");
+    EXPECT_THAT(host.stored(), IsEmpty());
+    EXPECT_THAT(host.output().text(), HasSubstr("the path of its local copy has more than 19 characters"));
+}
+
+TEST_F(ApplicationServices, RefuseWhatIsNoAddressWithASentence)
+{
+    wchar_t path[kRoom] = L"untouched";
+    EXPECT_EQ(services.fetchRemoteFile(L"file:///etc/passwd", path, kRoom, false), TS_FETCH_FAILED);
+    EXPECT_EQ(host.output().text(), "\"file:///etc/passwd\" is no http or https address.\n");
+    EXPECT_EQ(services.fetchRemoteFile(nullptr, path, kRoom, false), TS_FETCH_FAILED);
+    EXPECT_EQ(services.fetchRemoteFile(L"http://x", nullptr, kRoom, false), TS_FETCH_FAILED);
+    EXPECT_EQ(services.fetchRemoteFile(L"http://x", path, 0, false), TS_FETCH_FAILED);
+    EXPECT_STREQ(path, L"untouched");
+    EXPECT_THAT(host.stored(), IsEmpty());
+}
