@@ -178,6 +178,7 @@ TEST_F(Remote, OtherFilesAreNotRemote)
 {
     offer("/tool.lsp", httpAnswer("200 OK", "1"));
     const fs::path copy = tessel::toUtf8(host.fetch(server.url(L"/tool.lsp")).path);
+    ASSERT_TRUE(fs::exists(copy));
     host.folder().write("tool.lsp", "");
     std::ofstream(copy.parent_path() / "beside.lsp") << "mine";
     std::ofstream(host.cache() / "mine.lsp") << "mine";
