@@ -45,7 +45,7 @@ TsResultBuffer* resultBuffer(cl_object value)
         return tsutBuildList({integerValue(ecl_fixnum(value))});
     if (ECL_DOUBLE_FLOAT_P(value))
         return tsutBuildList({TsRbValue::Real(ecl_double_float(value))});
-    return tsutBuildList({value == ECL_NIL ? TsRbValue::Nil() : TsRbValue::True()});
+    return tsutBuildList({value == ECL_NIL ? TsRbValue::NilValue() : TsRbValue::TrueValue()});
 }
 } // namespace
 

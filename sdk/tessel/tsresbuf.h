@@ -46,8 +46,8 @@ public:
         value.mReal = number;
         return value;
     }
-    static TsRbValue True() { return TsRbValue(TS_TRUE); }
-    static TsRbValue Nil() { return TsRbValue(TS_NIL); }
+    static TsRbValue TrueValue() { return TsRbValue(TS_TRUE); }
+    static TsRbValue NilValue() { return TsRbValue(TS_NIL); }
 
     int type() const { return mType; }
     const wchar_t* text() const { return mText; }

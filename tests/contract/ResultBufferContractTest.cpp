@@ -12,7 +12,7 @@ TEST_F(ResultBufferContract, BuildsAListInOrder)
 {
     TsResultBuffer* list =
         tsutBuildList({TsRbValue::String(L"qz-load"), TsRbValue::Short(-3), TsRbValue::Long(70000),
-                       TsRbValue::Real(0.5), TsRbValue::True(), TsRbValue::Nil()});
+                       TsRbValue::Real(0.5), TsRbValue::TrueValue(), TsRbValue::NilValue()});
     EXPECT_THAT(recordedValues(list),
                 ElementsAre(RecordingValue::String(L"qz-load"), RecordingValue::Short(-3),
                             RecordingValue::Long(70000), RecordingValue::Real(0.5), RecordingValue::True(),

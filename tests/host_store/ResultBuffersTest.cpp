@@ -8,7 +8,7 @@ TEST(ResultBuffers, HoldTheValuesInTheirOrder)
 {
     TsResultBuffer* list =
         tsutBuildList({TsRbValue::String(L"größe"), TsRbValue::Short(-7), TsRbValue::Long(1 << 30),
-                       TsRbValue::Real(0.5), TsRbValue::True(), TsRbValue::Nil()});
+                       TsRbValue::Real(0.5), TsRbValue::TrueValue(), TsRbValue::NilValue()});
     const int types[] = {TS_STRING, TS_SHORT, TS_LONG, TS_REAL, TS_TRUE, TS_NIL};
     const TsResultBuffer* at = list;
     for (const int type : types)

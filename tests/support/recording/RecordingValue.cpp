@@ -32,9 +32,9 @@ TsRbValue sdkValue(const RecordingValue& value)
     case TS_REAL:
         return TsRbValue::Real(value.real);
     case TS_TRUE:
-        return TsRbValue::True();
+        return TsRbValue::TrueValue();
     default:
-        return TsRbValue::Nil();
+        return TsRbValue::NilValue();
     }
 }
 } // namespace
