@@ -189,6 +189,9 @@ void Host::end()
 {
     if (!mParts)
         return;
+    // A Lisp file may have left its prompt behind; what applications say at the end is not part of it.
+    if (!mCommandLine.atLineStart())
+        mCommandLine.print(L"\n");
     mParts->linker.unloadAll();
     mParts->registry->endOfCommand();
     mInterruptible = nullptr;
