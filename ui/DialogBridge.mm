@@ -6,33 +6,25 @@
 #include <tesselui/tsuidisplay.h>
 
 #import "ui/ModrigController.h"
+#import "ui/ToolkitErrors.h"
 #import "ui/TsOCModrigUtil.h"
 
 #include "ui/Paths.h"
 
 namespace
 {
-// What went wrong in the toolkit ends the dialog, not the host.
-void SayWhatFailed(NSException* exception)
+void RunDialog(void*)
 {
-    NSString* text = [NSString stringWithFormat:@"%@: %@", [exception name], [exception reason]];
-    const CStdStr reason = ModrigUtils::PathFromString(text);
-    tsutPrintf(L"The Load/Unload Applications dialog was closed by an error of the toolkit, %s.\n",
-               reason.c_str());
+    ModrigController* controller = [[[ModrigController alloc] init] autorelease];
+    [controller showModrigDialog];
 }
 
-void RunDialog()
+// What went wrong in the toolkit ends the dialog, not the host.
+void SayWhatFailed(NSString* error)
 {
-    ModrigController* controller = [[ModrigController alloc] init];
-    @try
-    {
-        [controller showModrigDialog];
-    }
-    @catch (NSException* exception)
-    {
-        SayWhatFailed(exception);
-    }
-    [controller release];
+    const CStdStr reason = ModrigUtils::PathFromString(error);
+    tsutPrintf(L"The Load/Unload Applications dialog was closed by an error of the toolkit: %s.\n",
+               reason.c_str());
 }
 } // namespace
 
@@ -47,7 +39,8 @@ void RunModrigDialog()
 {
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
     if (tsuiPrepareWindows())
-        RunDialog();
+        if (NSString* error = ModrigToolkitErrorOf(RunDialog, nullptr))
+            SayWhatFailed(error);
     [pool drain];
     tsuiFinishWindows();
 }

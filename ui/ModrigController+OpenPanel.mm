@@ -52,7 +52,7 @@
     CStdStr title;
     title.Load(ModrigMessages::kOpenPanelTitle);
     [panel setTitle:ModrigUtils::StringFromPath(title)];
-    [panel setDirectory:[self initialFolder]];
+    ModrigPlatform::ShowFolder(panel, [self initialFolder]);
     [self populateFileTypes];
     [self populateLoadedApplications];
     [self populateHistoryList];
@@ -130,7 +130,7 @@
     NSString* path = [[mSelectedFiles objectAtIndex:0] filePathName];
     if (![self isTesselFolder:path])
         return NO;
-    [mOpenPanel setDirectory:path];
+    ModrigPlatform::ShowFolder(mOpenPanel, path);
     return YES;
 }
 

@@ -16,9 +16,10 @@ void FitAccessoryView(NSView* view);
 // What is left to do when the dialog's view is in its place.
 void CompletePanel(NSOpenPanel* panel, NSView* view);
 
-// The folder that the panel shows, and the paths selected in it. A folder that is only walked through is not
+// The folder that the panel shows, moving it to another one, and the paths selected in it. A folder that is only walked through is not
 // selected.
 NSString* ShownFolder(NSOpenPanel* panel);
+void ShowFolder(NSOpenPanel* panel, NSString* folder);
 NSArray* SelectedPaths(NSOpenPanel* panel);
 
 // Whether the user has named a file in a way that the panel's delegate is not told of: by typing.

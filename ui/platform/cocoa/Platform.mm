@@ -58,6 +58,11 @@ NSString* ShownFolder(NSOpenPanel* panel)
     return [[panel directoryURL] path];
 }
 
+void ShowFolder(NSOpenPanel* panel, NSString* folder)
+{
+    [panel setDirectory:folder];
+}
+
 NSArray* SelectedPaths(NSOpenPanel* panel)
 {
     return [[panel URLs] valueForKey:@"path"];

@@ -165,6 +165,19 @@ NSString* ShownFolder(NSOpenPanel* panel)
     return [panel modrigShownFolder];
 }
 
+// The browser raises an exception on its way to a folder that is gone, or that the delegate hides: it looks
+// for the nearest one there is, without the delegate.
+void ShowFolder(NSOpenPanel* panel, NSString* folder)
+{
+    bool isFolder = false;
+    while ([folder length] > 1 && !(FileExists(folder, isFolder) && isFolder))
+        folder = [folder stringByDeletingLastPathComponent];
+    id delegate = [panel delegate];
+    [panel setDelegate:nil];
+    [panel setDirectory:folder];
+    [panel setDelegate:delegate];
+}
+
 NSArray* SelectedPaths(NSOpenPanel* panel)
 {
     return [panel modrigSelectedPaths];

@@ -1,0 +1,86 @@
+#include "tests/ui/support/DialogTest.h"
+
+#import "ui/ModrigFilePath.h"
+
+#include <filesystem>
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+namespace
+{
+class FilePath : public DialogTest
+{
+protected:
+    static ModrigFilePath* make(NSString* path)
+    {
+        return [[[ModrigFilePath alloc] initWithFilePathName:path] autorelease];
+    }
+};
+} // namespace
+
+TEST_F(FilePath, TakesAPathApart)
+{
+    ModrigFilePath* row = make(path("tool.lsp"));
+    EXPECT_EQ(file("tool.lsp"), wide([row filePathName]));
+    EXPECT_EQ(L"tool.lsp", wide([row fileName]));
+    EXPECT_EQ(mFolder.path().wstring(), wide([row filePath]));
+}
+
+TEST_F(FilePath, ResolvesLinksInTheFullPathOnly)
+{
+    file("real.lsp");
+    std::filesystem::create_directory(mFolder / "links");
+    std::filesystem::create_symlink(mFolder / "real.lsp", mFolder / "links/link.lsp");
+    ModrigFilePath* row = make(path("links/link.lsp"));
+    EXPECT_EQ(file("real.lsp"), wide([row filePathName]));
+    EXPECT_EQ(L"link.lsp", wide([row fileName]));
+    EXPECT_EQ((mFolder / "links").wstring(), wide([row filePath]));
+}
+
+TEST_F(FilePath, IsEmptyAndNotUnloadableForNil)
+{
+    ModrigFilePath* row = make(nil);
+    EXPECT_EQ(nil, [row filePathName]);
+    EXPECT_EQ(nil, [row fileName]);
+    EXPECT_EQ(nil, [row filePath]);
+    EXPECT_FALSE([row unloadable]);
+    EXPECT_THAT(boxes(), IsEmpty());
+}
+
+TEST_F(FilePath, IsUnloadableForAModuleThatIsNotLocked)
+{
+    EXPECT_TRUE([make(text(loadedModule("tool.zmb"))) unloadable]);
+    host().linker.setLocked(file("locked.zmb"));
+    EXPECT_FALSE([make(path("locked.zmb")) unloadable]);
+    EXPECT_FALSE([make(path("tool.lsp")) unloadable]);
+}
+
+TEST_F(FilePath, KeepsWhatItFoundWhenItWasMade)
+{
+    ModrigFilePath* row = make(text(loadedModule("tool.zmb")));
+    host().linker.setLocked(file("tool.zmb"));
+    EXPECT_TRUE([row unloadable]);
+}
+
+TEST_F(FilePath, AsksAboutThePathAsItWasGiven)
+{
+    std::filesystem::create_symlink(mFolder / "real", mFolder / "link.zmb");
+    host().linker.setLocked((mFolder / "link.zmb").wstring());
+    EXPECT_FALSE([make(path("link.zmb")) unloadable]);
+    EXPECT_THAT(boxes(), IsEmpty());
+}
+
+TEST_F(FilePath, EqualsAPathInOtherLetterCase)
+{
+    EXPECT_TRUE([make(@"/X/y.qbc") isEqual:make(@"/x/Y.QBC")]);
+    EXPECT_EQ([make(@"/X/y.qbc") hash], [make(@"/x/Y.QBC") hash]);
+    EXPECT_FALSE([make(@"/X/y.qbc") isEqual:make(@"/x/z.qbc")]);
+}
+
+TEST_F(FilePath, EqualsNoOtherKindOfObject)
+{
+    EXPECT_FALSE([make(@"/x/y.qbc") isEqual:@"/x/y.qbc"]);
+    EXPECT_FALSE([make(@"/x/y.qbc") isEqual:nil]);
+    EXPECT_FALSE([make(@"/x/y.qbc") isEqual:make(nil)]);
+}

@@ -1,0 +1,224 @@
+#include "tests/ui/support/DialogTest.h"
+
+#include "module/DialogBridge.h"
+
+#import "ui/ModrigFilePath.h"
+#import "ui/NSSavePanel+ModrigRuntime.h"
+#import "ui/TsOCModrigUtil.h"
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+namespace
+{
+constexpr NSUInteger kLispFilter = 3;
+constexpr NSUInteger kBundleFilter = 1;
+const std::wstring kSettings = L"Software\\Tessel\\R21\\Profiles\\Default\\DialogSettings\\Modrig";
+
+class OpenPanel : public OpenDialogTest
+{
+protected:
+    void openIn(const std::filesystem::path& folder)
+    {
+        host().registry.setValue(kSettings, L"InitialPath", folder.wstring());
+        open();
+    }
+    void choose(NSUInteger filter)
+    {
+        [[mController valueForKey:@"fileTypes"] setSelectionIndex:filter];
+        [mController onFileTypesChanged:nil];
+    }
+    bool shows(const std::filesystem::path& path)
+    {
+        return [mController panel:mPanel shouldShowFilename:text(path.wstring())];
+    }
+    NSBrowser* browser() { return [[mPanel contentView] viewWithTag:NSFileHandlingPanelBrowser]; }
+    std::vector<std::wstring> shownFiles()
+    {
+        std::vector<std::wstring> names;
+        NSMatrix* column = [browser() matrixInColumn:[browser() lastColumn]];
+        for (NSInteger row = 0; row < [column numberOfRows]; ++row)
+            names.push_back(wide([[column cellAtRow:row column:0] stringValue]));
+        return names;
+    }
+    // Clicks files in the last column, the first alone and the others added to it.
+    void click(std::initializer_list<const wchar_t*> names)
+    {
+        NSMatrix* column = [browser() matrixInColumn:[browser() lastColumn]];
+        [column deselectAllCells];
+        for (NSInteger row = 0; row < [column numberOfRows]; ++row)
+            for (const wchar_t* name : names)
+                if (wide([[column cellAtRow:row column:0] stringValue]) == name)
+                    [column highlightCell:YES atRow:row column:0], [column selectCellAtRow:row column:0];
+        [browser() doClick:column];
+    }
+};
+} // namespace
+
+TEST_F(OpenPanel, ReplacesThePanelsButtonsAndGivesThemBack)
+{
+    NSOpenPanel* panel = [NSOpenPanel openPanel];
+    NSButton* ok = [panel okButton];
+    NSButton* cancel = [panel cancelButton];
+    const NSRect okFrame = [ok frame];
+    const NSRect cancelFrame = [cancel frame];
+    const std::wstring cancelTitle = wide([cancel title]);
+    const SEL action = [ok action];
+    open();
+    EXPECT_TRUE([ok isHidden]);
+    EXPECT_EQ(mController, [ok target]);
+    EXPECT_EQ(@selector(openPanelOK:), [ok action]);
+    EXPECT_EQ(L"Close", wide([cancel title]));
+    EXPECT_TRUE(NSEqualRects(okFrame, [cancel frame]));
+    close();
+    EXPECT_FALSE([ok isHidden]);
+    EXPECT_NE(mController, [ok target]);
+    EXPECT_EQ(action, [ok action]);
+    EXPECT_EQ(cancelTitle, wide([cancel title]));
+    EXPECT_TRUE(NSEqualRects(cancelFrame, [cancel frame]));
+    EXPECT_EQ(nil, [panel accessoryView]);
+    EXPECT_EQ(nil, [panel delegate]);
+}
+
+TEST_F(OpenPanel, ShowsTheDialogsViewAndHelpButtonUnderItsOwnTitle)
+{
+    open();
+    EXPECT_EQ([mController view], [mPanel accessoryView]);
+    EXPECT_EQ(L"Load", wide([mPanel title]));
+    EXPECT_TRUE([mPanel allowsMultipleSelection]);
+    NSButton* help = [mController valueForKey:@"helpButton"];
+    EXPECT_EQ([[mPanel okButton] superview], [help superview]);
+    EXPECT_NE(0u, [[mController view] autoresizingMask] & NSViewWidthSizable);
+}
+
+TEST_F(OpenPanel, OpensInTheHostsFolderUnlessAnotherIsRemembered)
+{
+    open();
+    EXPECT_EQ(wide([[NSBundle mainBundle] bundlePath]), wide([mPanel directory]));
+    close();
+    openIn("");
+    EXPECT_EQ(wide([[NSBundle mainBundle] bundlePath]), wide([mPanel directory]));
+    close();
+    openIn(mFolder.path());
+    EXPECT_EQ(mFolder.path().wstring(), wide([mPanel directory]));
+}
+
+TEST_F(OpenPanel, StartsWithTheFirstOfSixFilters)
+{
+    open();
+    NSArrayController* types = [mController valueForKey:@"fileTypes"];
+    EXPECT_EQ(6u, [[types arrangedObjects] count]);
+    EXPECT_EQ(0u, [types selectionIndex]);
+}
+
+TEST_F(OpenPanel, ShowsFilesOfTheFilterAndFolders)
+{
+    mFolder.write("a.LSP", "");
+    mFolder.write("a.txt", "");
+    mFolder.write("folder/inside.txt", "");
+    mFolder.write("Other.app/inside.txt", "");
+    mFolder.write("tool.bundle/tool", "");
+    open();
+    choose(kLispFilter);
+    EXPECT_TRUE(shows(mFolder / "a.LSP"));
+    EXPECT_FALSE(shows(mFolder / "a.txt"));
+    EXPECT_TRUE(shows(mFolder / "folder"));
+    EXPECT_FALSE(shows(mFolder / "Other.app"));
+    EXPECT_FALSE(shows(mFolder / "tool.bundle"));
+    choose(kBundleFilter);
+    EXPECT_TRUE(shows(mFolder / "tool.bundle"));
+    EXPECT_FALSE(shows(mFolder / "a.LSP"));
+}
+
+TEST_F(OpenPanel, ShowsTheHostItself)
+{
+    open();
+    choose(kLispFilter);
+    EXPECT_TRUE(shows(wide([[NSBundle mainBundle] bundlePath])));
+}
+
+TEST_F(OpenPanel, JudgesALinkByWhatItLeadsTo)
+{
+    file("real.lsp");
+    std::filesystem::create_symlink(mFolder / "real.lsp", mFolder / "link.txt");
+    std::filesystem::create_symlink(mFolder / "gone.lsp", mFolder / "broken.lsp");
+    open();
+    EXPECT_TRUE(shows(mFolder / "link.txt"));
+    EXPECT_FALSE(shows(mFolder / "broken.lsp"));
+    EXPECT_FALSE(shows(mFolder / "missing.lsp"));
+}
+
+TEST_F(OpenPanel, HidesEverythingWithoutAFilter)
+{
+    open();
+    [[mController valueForKey:@"fileTypes"] setContent:[NSMutableArray array]];
+    EXPECT_FALSE(shows(mFolder.path()));
+    EXPECT_FALSE(shows(file("tool.lsp")));
+}
+
+TEST_F(OpenPanel, FiltersTheListingAnewInTheSameFolder)
+{
+    for (const char* name : {"one.lsp", "two.zmb", "three.txt"})
+        file(name);
+    openIn(mFolder.path());
+    EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp", L"two.zmb"));
+    choose(kLispFilter);
+    EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp"));
+    choose(0);
+    EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp", L"two.zmb"));
+    EXPECT_EQ(mFolder.path().wstring(), wide([mPanel directory]));
+}
+
+TEST_F(OpenPanel, KeepsTheSelectedFilesAsTheyStandInThePanel)
+{
+    for (const char* name : {"one.lsp", "two.zmb"})
+        file(name);
+    openIn(mFolder.path());
+    click({L"two.zmb"});
+    [mController panelSelectionDidChange:mPanel];
+    ASSERT_EQ(1u, [[mController selectedFiles] count]);
+    EXPECT_EQ(file("two.zmb"), wide([[[mController selectedFiles] objectAtIndex:0] filePathName]));
+}
+
+TEST_F(OpenPanel, TakesAFolderThatIsWalkedThroughForNoSelection)
+{
+    mFolder.write("folder/one.lsp", "");
+    openIn(mFolder.path());
+    selectFiles({"old.lsp"});
+    click({L"folder"});
+    [mController panelSelectionDidChange:mPanel];
+    EXPECT_EQ(0u, [[mController selectedFiles] count]);
+    EXPECT_THAT(boxes(), IsEmpty());
+    EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp"));
+    click({L"one.lsp"});
+    [mController panelSelectionDidChange:mPanel];
+    ASSERT_EQ(1u, [[mController selectedFiles] count]);
+    EXPECT_EQ(file("folder/one.lsp"), wide([[[mController selectedFiles] objectAtIndex:0] filePathName]));
+}
+
+TEST_F(OpenPanel, KnowsTheHostsFolderInAnyCase)
+{
+    open();
+    NSString* folder = [[NSBundle mainBundle] bundlePath];
+    EXPECT_TRUE([mController isTesselFolder:folder]);
+    EXPECT_TRUE([mController isTesselFolder:[folder uppercaseString]]);
+    EXPECT_FALSE([mController isTesselFolder:[folder stringByDeletingLastPathComponent]]);
+    EXPECT_FALSE([mController isTesselFolder:nil]);
+}
+
+TEST_F(OpenPanel, LoadsWithReturnAndClosesWithEscape)
+{
+    host().registry.setValue(kSettings, L"InitialPath", mFolder.path().wstring());
+    file("one.zmb");
+    const ModalSteps steps({[this] { mPanel = runningPanel(); }, [this] { click({L"one.zmb"}); },
+                            [this] { pressKey(mPanel, @"\r"); },
+                            [this]
+                            {
+                                EXPECT_TRUE(host().linker.isLoaded(file("one.zmb")));
+                                EXPECT_TRUE([mPanel isVisible]);
+                                pressKey(mPanel, @"\033");
+                            }});
+    ModrigUtils::RunModrigDialog();
+    EXPECT_FALSE([mPanel isVisible]);
+    EXPECT_THAT(lines(), ElementsAre(Message(8, L"one.zmb")));
+}

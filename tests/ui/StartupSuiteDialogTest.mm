@@ -1,0 +1,258 @@
+#include "tests/ui/support/DialogTest.h"
+
+#include "module/DialogBridge.h"
+
+#import "ui/ModrigStartupSuitController.h"
+#import "ui/NSSavePanel+ModrigRuntime.h"
+#import "ui/TsOCModrigUtil.h"
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+namespace
+{
+constexpr NSInteger kAdd = 0;
+constexpr NSInteger kRemove = 1;
+
+class StartupSuiteDialog : public OpenDialogTest
+{
+protected:
+    void TearDown() override
+    {
+        [mSuite doClean];
+        [mSuite release];
+        OpenDialogTest::TearDown();
+    }
+    void openSuite()
+    {
+        mSuite = [[ModrigStartupSuitController alloc] init];
+        ASSERT_TRUE([mSuite window]);
+        [mSuite doInit];
+    }
+    NSArrayController* rows() { return [mSuite valueForKey:@"startupApps"]; }
+    NSTableView* table() { return [mSuite valueForKey:@"startupTableView"]; }
+    NSSegmentedControl* segments() { return [mSuite valueForKey:@"segmentedControl"]; }
+    void clickSegment(NSInteger segment)
+    {
+        [segments() setSelectedSegment:segment];
+        [mSuite onSegmentedButton:segments()];
+    }
+
+    ModrigStartupSuitController* mSuite = nil;
+};
+} // namespace
+
+TEST_F(StartupSuiteDialog, IsEmptyWithRemoveDisabledForAnEmptySuite)
+{
+    openSuite();
+    EXPECT_EQ(L"ModrigStartupSuit", wide([mSuite windowNibName]));
+    EXPECT_EQ(0, [table() numberOfRows]);
+    EXPECT_TRUE([segments() isEnabledForSegment:kAdd]);
+    EXPECT_FALSE([segments() isEnabledForSegment:kRemove]);
+}
+
+TEST_F(StartupSuiteDialog, ListsTheSuiteInItsOrderWithNothingSelected)
+{
+    gStartupList.AddTail(file("one.lsp"));
+    gStartupList.AddTail(file("two.zmb"));
+    openSuite();
+    EXPECT_THAT(rowsOf(rows()), ElementsAre(file("one.lsp"), file("two.zmb")));
+    EXPECT_EQ(2, [table() numberOfRows]);
+    EXPECT_THAT(selectionOf(rows()), IsEmpty());
+    EXPECT_FALSE([segments() isEnabledForSegment:kRemove]);
+}
+
+TEST_F(StartupSuiteDialog, EnablesRemoveWithASelection)
+{
+    gStartupList.AddTail(file("one.lsp"));
+    openSuite();
+    select(table(), {0});
+    EXPECT_TRUE([segments() isEnabledForSegment:kRemove]);
+    [table() deselectAll:nil];
+    EXPECT_FALSE([segments() isEnabledForSegment:kRemove]);
+}
+
+TEST_F(StartupSuiteDialog, IgnoresTheSelectionOfAnyOtherTable)
+{
+    gStartupList.AddTail(file("one.lsp"));
+    openSuite();
+    [rows() setSelectionIndex:0];
+    [segments() setEnabled:NO forSegment:kRemove];
+    NSTableView* other = [[[NSTableView alloc] init] autorelease];
+    [mSuite tableViewSelectionDidChange:[NSNotification notificationWithName:@"selection" object:other]];
+    EXPECT_FALSE([segments() isEnabledForSegment:kRemove]);
+}
+
+TEST_F(StartupSuiteDialog, RemovesSelectedRowsFromTheSuiteWithoutAMessage)
+{
+    for (const char* name : {"one.lsp", "two.lsp", "three.lsp"})
+        gStartupList.AddTail(file(name));
+    openSuite();
+    select(table(), {0, 2});
+    clickSegment(kRemove);
+    EXPECT_THAT(rowsOf(rows()), ElementsAre(file("two.lsp")));
+    EXPECT_THAT(Texts(gStartupList), ElementsAre(file("two.lsp")));
+    EXPECT_THAT(lines(), IsEmpty());
+    EXPECT_FALSE([segments() isEnabledForSegment:kRemove]);
+}
+
+TEST_F(StartupSuiteDialog, RemovesNothingWithoutASelection)
+{
+    gStartupList.AddTail(file("one.lsp"));
+    openSuite();
+    [mSuite onRemove];
+    EXPECT_EQ(1u, gStartupList.GetCount());
+}
+
+TEST_F(StartupSuiteDialog, LoadsNewFilesThroughTheMainDialogAndAddsThem)
+{
+    open();
+    openSuite();
+    [mSuite addFiles:paths({"one.zmb", "two.lsp"})];
+    EXPECT_THAT(rowsOf(rows()), ElementsAre(file("one.zmb"), file("two.lsp")));
+    EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb"), file("two.lsp")));
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb"), file("two.lsp")));
+    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2")));
+}
+
+TEST_F(StartupSuiteDialog, AddsAFileThatIsLoadedAlready)
+{
+    gLoadedAppList.AddTail(loadedModule("one.zmb"));
+    open();
+    openSuite();
+    [mSuite addFiles:paths({"one.zmb"})];
+    EXPECT_THAT(rowsOf(rows()), ElementsAre(file("one.zmb")));
+    EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(48, L"one.zmb")));
+}
+
+TEST_F(StartupSuiteDialog, PassesOverAFileOfTheSuiteSilently)
+{
+    gStartupList.AddTail(file("one.zmb"));
+    open();
+    openSuite();
+    [mSuite addFiles:paths({"one.zmb"})];
+    EXPECT_FALSE(host().linker.isLoaded(file("one.zmb")));
+    EXPECT_THAT(rowsOf(rows()), ElementsAre(file("one.zmb")));
+    EXPECT_EQ(1u, gStartupList.GetCount());
+    EXPECT_THAT(lines(), IsEmpty());
+}
+
+TEST_F(StartupSuiteDialog, DropsBadAndMissingFilesSilently)
+{
+    open();
+    openSuite();
+    NSArray* files = [paths({"a.txt"}) arrayByAddingObject:@"/gone/missing.lsp"];
+    [mSuite addFiles:files];
+    EXPECT_THAT(rowsOf(rows()), IsEmpty());
+    EXPECT_THAT(lines(), IsEmpty());
+    EXPECT_THAT(boxes(), IsEmpty());
+}
+
+TEST_F(StartupSuiteDialog, AddsWhatWasLoadedBeforeAFailure)
+{
+    open();
+    openSuite();
+    host().linker.refuseToLoad(file("bad.zmb"));
+    [mSuite addFiles:paths({"one.zmb", "bad.zmb", "two.zmb"})];
+    EXPECT_THAT(rowsOf(rows()), ElementsAre(file("one.zmb")));
+    EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
+}
+
+TEST_F(StartupSuiteDialog, KeepsTemporaryInternetFilesOut)
+{
+    open();
+    openSuite();
+    host().internet.urlsOfLocalFiles[file("net.zmb")] = L"http://example.org/net.zmb";
+    [mSuite addFiles:paths({"net.zmb", "one.zmb"})];
+    EXPECT_THAT(boxes(), ElementsAre(Message(41, file("net.zmb"))));
+    EXPECT_THAT(rowsOf(rows()), ElementsAre(file("one.zmb")));
+    EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
+}
+
+TEST_F(StartupSuiteDialog, RefusesFiftyOneFiles)
+{
+    open();
+    openSuite();
+    NSMutableArray* files = [NSMutableArray array];
+    for (int index = 0; index < 51; ++index)
+        [files addObject:path("tool" + std::to_string(index) + ".zmb")];
+    [mSuite addFiles:files];
+    EXPECT_THAT(boxes(), ElementsAre(Message(37, L"50")));
+    EXPECT_THAT(rowsOf(rows()), IsEmpty());
+    [files removeLastObject];
+    [mSuite addFiles:files];
+    EXPECT_EQ(50u, gStartupList.GetCount());
+}
+
+TEST_F(StartupSuiteDialog, AddsNothingWhenNoMainDialogIsOpen)
+{
+    openSuite();
+    [mSuite addFiles:paths({"one.zmb"})];
+    EXPECT_FALSE(host().linker.isLoaded(file("one.zmb")));
+    EXPECT_THAT(rowsOf(rows()), IsEmpty());
+    EXPECT_TRUE(gStartupList.IsEmpty());
+}
+
+TEST_F(StartupSuiteDialog, ScrollsToTheNewRow)
+{
+    for (int index = 0; index < 60; ++index)
+        gStartupList.AddTail(file("tool" + std::to_string(index) + ".lsp"));
+    open();
+    openSuite();
+    [mSuite addFiles:paths({"last.zmb"})];
+    EXPECT_TRUE(NSLocationInRange(60, [table() rowsInRect:[table() visibleRect]]));
+}
+
+TEST_F(StartupSuiteDialog, OpensItsHelpPage)
+{
+    openSuite();
+    [mSuite help:nil];
+    ASSERT_EQ(1u, host().output.helpCalls.size());
+    EXPECT_EQ(L"startup_suite_dialog", host().output.helpCalls[0].topic);
+}
+
+TEST_F(StartupSuiteDialog, RunsOverTheMainDialogAndStoresTheShortenedSuiteWhenBothAreClosed)
+{
+    for (const char* name : {"one.lsp", "two.lsp"})
+        gStartupList.AddTail(file(name));
+    NSWindow* suite = nil;
+    const ModalSteps steps({[] { [[TsOCModrigUtil getModrigController] onStartupSuits:nil]; },
+                            [&]
+                            {
+                                suite = [NSApp modalWindow];
+                                ASSERT_EQ(L"Startup Suite", wide([suite title]));
+                                mSuite = [(ModrigStartupSuitController*)[suite delegate] retain];
+                                const NSRect inner = [suite frame];
+                                const NSRect outer = [runningPanel() frame];
+                                EXPECT_NEAR(NSMidX(outer), NSMidX(inner), 1);
+                                EXPECT_NEAR(NSMidY(outer), NSMidY(inner), 1);
+                                select(table(), {0});
+                                clickSegment(kRemove);
+                            },
+                            [&] { pressKey(suite, @"\033"); },
+                            [&]
+                            {
+                                EXPECT_FALSE([suite isVisible]);
+                                EXPECT_EQ(runningPanel(), [NSApp modalWindow]);
+                                [[runningPanel() cancelButton] performClick:nil];
+                            }});
+    ModrigUtils::RunModrigDialog();
+    EXPECT_EQ(L"1", host().registry.value(host().moduleKey() + L"\\Startup", L"NumStartup"));
+    EXPECT_EQ(file("two.lsp"), host().registry.value(host().moduleKey() + L"\\Startup", L"1Startup"));
+}
+
+TEST_F(StartupSuiteDialog, ChangesNothingWhenTheFileDialogIsCancelled)
+{
+    gStartupList.AddTail(file("one.lsp"));
+    openSuite();
+    const ModalSteps steps({[]
+                            {
+                                NSWindow* dialog = [NSApp modalWindow];
+                                EXPECT_EQ(L"Add", wide([dialog title]));
+                                [(NSOpenPanel*)dialog cancel:nil];
+                            }});
+    clickSegment(kAdd);
+    EXPECT_THAT(rowsOf(rows()), ElementsAre(file("one.lsp")));
+    EXPECT_EQ(1u, gStartupList.GetCount());
+}

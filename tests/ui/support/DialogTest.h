@@ -1,0 +1,92 @@
+// What the tests of the dialogs share: the module's lists and texts over a recording host, real files in a
+// folder of their own, and dialogs that are opened, used and closed.
+#pragma once
+
+#include "tests/module/ModuleTest.h"
+
+#include <functional>
+#include <memory>
+#include <vector>
+
+#include "module/Globals.h"
+#include "tests/support/TemporaryFolder.h"
+
+#import <AppKit/AppKit.h>
+
+#import "ui/ModrigController.h"
+
+class DialogTest : public ModuleTest
+{
+protected:
+    void SetUp() override;
+    void TearDown() override;
+
+    // The path of a file of the test's folder, written when it is new.
+    std::wstring file(const std::string& name);
+    NSString* path(const std::string& name);
+    NSArray* paths(std::initializer_list<std::string> names);
+
+    // A module that the host has loaded.
+    std::wstring loadedModule(const std::string& name);
+
+    TemporaryFolder mFolder;
+
+private:
+    NSAutoreleasePool* mPool = nil;
+};
+
+// The main dialog in its panel, set up as for a run, without the run.
+class OpenDialogTest : public DialogTest
+{
+protected:
+    void TearDown() override;
+
+    // Opens the dialog with what the lists hold now.
+    void open();
+    void close();
+
+    ModrigController* mController = nil;
+    NSOpenPanel* mPanel = nil;
+
+    NSArrayController* loadedApps() { return [mController valueForKey:@"loadedApps"]; }
+    NSArrayController* historyList() { return [mController valueForKey:@"historyList"]; }
+    NSTableView* loadedTable() { return [mController valueForKey:@"loadedAppsTableView"]; }
+    NSTableView* historyTable() { return [mController valueForKey:@"historyListTableView"]; }
+
+    // What the user does.
+    void select(NSTableView* table, std::initializer_list<NSUInteger> rows);
+    // As if the panel had reported the files as selected.
+    void selectFiles(std::initializer_list<std::string> names);
+};
+
+// The paths of the rows of a table.
+std::vector<std::wstring> rowsOf(NSArrayController* rows);
+// The selected ones.
+std::vector<std::wstring> selectionOf(NSArrayController* rows);
+
+std::wstring wide(NSString* text);
+NSString* text(const std::wstring& wide);
+
+// Runs the steps, one after another, inside the modal run that is going on then; each once the last one's
+// effects are through. Steps that nothing runs are a failure of the test, reported when the object goes.
+class ModalSteps
+{
+public:
+    explicit ModalSteps(std::vector<std::function<void()>> steps);
+    ~ModalSteps();
+    ModalSteps(const ModalSteps&) = delete;
+    ModalSteps& operator=(const ModalSteps&) = delete;
+
+private:
+    const std::vector<std::function<void()>> mSteps;
+    id mRunner;
+};
+
+// The panel of the main dialog that is running.
+NSOpenPanel* runningPanel();
+
+// A key, as the window that has the keyboard gets it.
+void pressKey(NSWindow* window, NSString* characters);
+
+// A drag of files, as a drop target sees it.
+id<NSDraggingInfo> dragOf(NSArray* paths);

@@ -1,0 +1,246 @@
+#include "tests/ui/support/DialogTest.h"
+
+#include <wincompat/winstring.h>
+
+#include "host/text/Unicode.h"
+
+#import "ui/ModrigFilePath.h"
+#import "ui/ToolkitErrors.h"
+#import "ui/TsOCModrigUtil.h"
+
+namespace
+{
+NSArray* const kStepModes = [[NSArray alloc]
+    initWithObjects:NSModalPanelRunLoopMode, NSDefaultRunLoopMode, NSEventTrackingRunLoopMode, nil];
+
+std::vector<std::wstring> pathsOf(NSArray* rows)
+{
+    std::vector<std::wstring> paths;
+    for (NSUInteger index = 0; index < [rows count]; ++index)
+        paths.push_back(wide([[rows objectAtIndex:index] filePathName]));
+    return paths;
+}
+
+struct OpeningDialog
+{
+    ModrigController* controller;
+    NSOpenPanel* panel;
+};
+
+void setUp(void* opening)
+{
+    [static_cast<OpeningDialog*>(opening)->controller
+        setupOpenPanel:static_cast<OpeningDialog*>(opening)->panel];
+}
+} // namespace
+
+std::wstring wide(NSString* text)
+{
+    return NSStringToWstring(text);
+}
+
+NSString* text(const std::wstring& wide)
+{
+    return wcharToNSString(wide.c_str());
+}
+
+std::vector<std::wstring> rowsOf(NSArrayController* rows)
+{
+    return pathsOf([rows arrangedObjects]);
+}
+
+std::vector<std::wstring> selectionOf(NSArrayController* rows)
+{
+    return pathsOf([rows selectedObjects]);
+}
+
+void DialogTest::SetUp()
+{
+    ModuleTest::SetUp();
+    mPool = [[NSAutoreleasePool alloc] init];
+    host().files.useRealFileSystem();
+}
+
+void DialogTest::TearDown()
+{
+    EXPECT_EQ(nil, [TsOCModrigUtil getModrigController]) << "a dialog is still open";
+    [mPool drain];
+    ModuleTest::TearDown();
+}
+
+std::wstring DialogTest::file(const std::string& name)
+{
+    const auto file = mFolder / name;
+    if (!std::filesystem::exists(file))
+        mFolder.write(name, "");
+    return tessel::toWide(file.string());
+}
+
+NSString* DialogTest::path(const std::string& name)
+{
+    return text(file(name));
+}
+
+NSArray* DialogTest::paths(std::initializer_list<std::string> names)
+{
+    NSMutableArray* paths = [NSMutableArray array];
+    for (const std::string& name : names)
+        [paths addObject:path(name)];
+    return paths;
+}
+
+std::wstring DialogTest::loadedModule(const std::string& name)
+{
+    const std::wstring path = file(name);
+    host().linker.setLoaded(path);
+    return path;
+}
+
+void OpenDialogTest::open()
+{
+    mController = [[ModrigController alloc] init];
+    mPanel = [NSOpenPanel openPanel];
+    OpeningDialog opening = {mController, mPanel};
+    if (NSString* error = ModrigToolkitErrorOf(setUp, &opening))
+        FAIL() << [error UTF8String];
+}
+
+void OpenDialogTest::close()
+{
+    if (!mController)
+        return;
+    [mController cleanOpenPanel:mPanel];
+    [mController release];
+    mController = nil;
+}
+
+void OpenDialogTest::TearDown()
+{
+    close();
+    DialogTest::TearDown();
+}
+
+void OpenDialogTest::select(NSTableView* table, std::initializer_list<NSUInteger> rows)
+{
+    NSMutableIndexSet* indexes = [NSMutableIndexSet indexSet];
+    for (const NSUInteger row : rows)
+        [indexes addIndex:row];
+    [table selectRowIndexes:indexes byExtendingSelection:NO];
+}
+
+void OpenDialogTest::selectFiles(std::initializer_list<std::string> names)
+{
+    NSMutableArray* files = [NSMutableArray array];
+    for (const std::string& name : names)
+        [files addObject:[[[ModrigFilePath alloc] initWithFilePathName:path(name)] autorelease]];
+    [[mController selectedFiles] setArray:files];
+}
+
+@interface StepRunner : NSObject
+{
+@public
+    const std::vector<std::function<void()>>* steps;
+    std::size_t next;
+}
+- (void)schedule;
+@end
+
+@implementation StepRunner
+
+- (void)schedule
+{
+    [self performSelector:@selector(runStep) withObject:nil afterDelay:0.05 inModes:kStepModes];
+}
+
+- (void)runStep
+{
+    if (next >= steps->size())
+        return;
+    // Scheduled first: a step may open another modal run, which goes on with the steps behind it.
+    const auto& step = (*steps)[next++];
+    [self schedule];
+    step();
+}
+
+@end
+
+ModalSteps::ModalSteps(std::vector<std::function<void()>> steps) : mSteps(std::move(steps))
+{
+    StepRunner* runner = [[StepRunner alloc] init];
+    runner->steps = &mSteps;
+    [runner schedule];
+    mRunner = runner;
+}
+
+ModalSteps::~ModalSteps()
+{
+    StepRunner* runner = mRunner;
+    EXPECT_EQ(mSteps.size(), runner->next) << "the modal run ended before all steps were done";
+    [NSObject cancelPreviousPerformRequestsWithTarget:runner];
+    [runner release];
+}
+
+NSOpenPanel* runningPanel()
+{
+    return [[TsOCModrigUtil getModrigController] valueForKey:@"mOpenPanel"];
+}
+
+void pressKey(NSWindow* window, NSString* characters)
+{
+    [NSApp postEvent:[NSEvent keyEventWithType:NSKeyDown
+                                            location:NSZeroPoint
+                                       modifierFlags:0
+                                           timestamp:0
+                                        windowNumber:[window windowNumber]
+                                             context:[window graphicsContext]
+                                          characters:characters
+                         charactersIgnoringModifiers:characters
+                                           isARepeat:NO
+                                             keyCode:0]
+             atStart:NO];
+}
+
+// Stands for the pasteboard and the drag itself; answers what the drop targets ask.
+@interface FileDrag : NSObject
+{
+    NSArray* mPaths;
+}
+- (id)initWithPaths:(NSArray*)paths;
+@end
+
+@implementation FileDrag
+
+- (id)initWithPaths:(NSArray*)paths
+{
+    if ((self = [super init]))
+        mPaths = [paths copy];
+    return self;
+}
+
+- (void)dealloc
+{
+    [mPaths release];
+    [super dealloc];
+}
+
+- (id)draggingPasteboard
+{
+    return self;
+}
+
+- (NSArray*)types
+{
+    return mPaths ? [NSArray arrayWithObject:NSFilenamesPboardType] : [NSArray array];
+}
+
+- (id)propertyListForType:(NSString*)type
+{
+    return [type isEqual:NSFilenamesPboardType] ? mPaths : nil;
+}
+
+@end
+
+id<NSDraggingInfo> dragOf(NSArray* paths)
+{
+    return (id<NSDraggingInfo>)[[[FileDrag alloc] initWithPaths:paths] autorelease];
+}

@@ -1,0 +1,30 @@
+// Runs all tests of the dialogs under one display of their own.
+#include <cstdlib>
+#include <iostream>
+
+#include <gtest/gtest.h>
+
+#include "tests/ui/support/VirtualDisplay.h"
+
+#include <tesselui/tsuidisplay.h>
+
+#import <Foundation/Foundation.h>
+
+int main(int argc, char** argv)
+try
+{
+    testing::InitGoogleTest(&argc, argv);
+    const VirtualDisplay display;
+    setenv("DISPLAY", display.name().c_str(), 1);
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    if (!tsuiPrepareWindows())
+        return EXIT_FAILURE;
+    const int result = RUN_ALL_TESTS();
+    [pool drain];
+    return result;
+}
+catch (const std::exception& error)
+{
+    std::cerr << error.what() << '\n';
+    return EXIT_FAILURE;
+}
