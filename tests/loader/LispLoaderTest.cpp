@@ -111,6 +111,12 @@ TEST_F(LispLoader, KeepsBlanksPerCentSignsAndLettersOfAnyScript)
     EXPECT_EQ(L"(progn (_INTERNAL-LOAD-ALL-FILE \"/a/100%s%n%%.lsp\" nil T T nil)(princ))", queued().front());
 }
 
+TEST_F(LispLoader, KeepsADoubleQuoteInANameFromEndingTheLispText)
+{
+    EXPECT_EQ(L"/a/x\\\").lsp", SafePath(L"/a/x\").lsp"));
+    EXPECT_EQ(L"C:/a/\\\"q\\\".lsp", SafePath(L"C:\\a\\\"q\".lsp"));
+}
+
 TEST_F(LispLoader, QueuesAPathOf4000CharactersWhole)
 {
     const std::wstring path = LongPath(4000, L"tool.lsp");
