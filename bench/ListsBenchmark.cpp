@@ -4,6 +4,8 @@
 #include <wincompat/winreg.h>
 
 #include <cwchar>
+#include <memory>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -122,9 +124,16 @@ std::vector<std::wstring> pathsUpTo(std::size_t count)
     return paths;
 }
 
+// Makes a History of that size the stored one: each size has a profile of its own, so that it is written only
+// once for all the runs that begin with it.
 void store(std::size_t count)
 {
-    fill(gHistoryList, count);
+    bench::useProfile(L"History" + std::to_wstring(count));
+    static std::set<std::size_t> stored;
+    if (gHistoryList.GetCount() != count)
+        fill(gHistoryList, count);
+    if (!stored.insert(count).second)
+        return;
     ModrigUtils::WriteHistoryFilesToRegistry();
     bench::endCommand();
 }

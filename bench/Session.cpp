@@ -58,6 +58,11 @@ void startHost()
         throw std::runtime_error("the host does not start");
 }
 
+void useProfile(const std::wstring& name)
+{
+    host().run(L"PROFILE " + name);
+}
+
 void endCommand()
 {
     host().run(L"VERSION");

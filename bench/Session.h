@@ -2,6 +2,7 @@
 #pragma once
 
 #include <filesystem>
+#include <string>
 
 namespace bench
 {
@@ -10,6 +11,9 @@ const std::filesystem::path& workFolder();
 
 // Starts the host, once, without applications.
 void startHost();
+
+// Makes the profile the current one, in a command of its own.
+void useProfile(const std::wstring& name);
 
 // What the host does at the end of a command: stores what was written.
 void endCommand();
