@@ -11,6 +11,8 @@ namespace tessel
 {
 namespace
 {
+constexpr auto kTimeToLeave = std::chrono::milliseconds(200);
+
 // No signal of the program's is to land on the watcher: Ctrl-C has to wake the thread that waits for a line.
 // Faults cannot be blocked, and the signals that stop threads for the garbage collector must not be.
 void leaveSignalsToOthers()
@@ -75,7 +77,13 @@ void LispInterrupter::interrupt() noexcept
 
 bool LispInterrupter::takeRequest() noexcept
 {
-    return mRequested.exchange(0) == mRun.load();
+    const Run run = mRequested.exchange(0);
+    const auto now = std::chrono::steady_clock::now();
+    if (run != mRun.load() || (run == mInterruptedRun && now - mInterruptedAt < kTimeToLeave))
+        return false;
+    mInterruptedRun = run;
+    mInterruptedAt = now;
+    return true;
 }
 
 std::optional<LispInterrupter::Run> LispInterrupter::receive() const

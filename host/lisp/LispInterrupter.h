@@ -6,6 +6,7 @@
 #pragma once
 
 #include <atomic>
+#include <chrono>
 #include <mutex>
 #include <optional>
 #include <thread>
@@ -33,7 +34,8 @@ public:
     // Safe in a signal handler. Without an evaluation that runs it does nothing.
     void interrupt() noexcept;
 
-    // Whether an interrupt was meant for the evaluation that runs; once true for each.
+    // Whether an interrupt was meant for the evaluation that runs; once true for each. Not again while Lisp
+    // may still be on its way out of what was interrupted: two jumps at once miss their aim.
     bool takeRequest() noexcept;
 
 private:
@@ -52,6 +54,8 @@ private:
     int mDepth = 0;
     std::atomic<Run> mRun = 0;
     std::atomic<Run> mRequested = 0;
+    Run mInterruptedRun = 0; // used by the thread of Lisp only
+    std::chrono::steady_clock::time_point mInterruptedAt;
     std::mutex
         mRunChange; // held while an interrupt is sent: the evaluation it is sent to does not end meanwhile
     std::thread mWatcher;

@@ -25,6 +25,8 @@ constexpr cl_fixnum kFrameStackSize = 65536;
 // ECL counts on the stack that the process began with. What it does not watch, such as EQUAL on deep lists,
 // may use more: as much as the system keeps free below the main thread's stack.
 constexpr rlim_t kStackBytes = rlim_t{112} << 20;
+// What an error may use when the stack has run out. ECL's own 32 KB are not always enough for its handlers.
+constexpr cl_fixnum kStackReserve = 512 * 1024;
 constexpr int kMostLockHolds = 8;
 // Room for telling the error and going on when the memory is exhausted by what the user keeps.
 constexpr std::size_t kHeapReserve = std::size_t{16} << 20;
@@ -37,6 +39,7 @@ struct LispFunctions
     cl_object invoke;
     cl_object compileText;
     cl_object interrupted;
+    cl_object makeSymbol;
 };
 
 void setSignalOptions()
@@ -100,13 +103,17 @@ cl_object startPrelude(std::wstring_view prelude)
 LispFunctions startLisp()
 {
     setSignalOptions();
+    const cl_fixnum usualFrameStackSize = ecl_get_option(ECL_OPT_FRAME_STACK_SIZE);
     ecl_set_option(ECL_OPT_FRAME_STACK_SIZE, kFrameStackSize);
+    ecl_set_option(ECL_OPT_C_STACK_SAFETY_AREA, kStackReserve);
     ecl_set_option(ECL_OPT_HEAP_SIZE, kLispHeapBytes);
     ecl_set_option(ECL_OPT_HEAP_SAFETY_AREA, kHeapReserve);
     const auto faultAction = currentFaultAction();
     static char name[] = "tessel";
     static char* arguments[] = {name, nullptr};
     cl_boot(1, arguments);
+    // Other threads do with less: the large one takes a good part of Lisp's memory.
+    ecl_set_option(ECL_OPT_FRAME_STACK_SIZE, usualFrameStackSize);
     shareMemoryFaults(faultAction);
     // ECL would write some of its troubles to the terminal, past the host.
     cl_core.error_output = cl_make_broadcast_stream(0);
@@ -114,14 +121,21 @@ LispFunctions startLisp()
     cl_object fault = startPrelude(toWide(lispPrelude()));
     if (fault != ECL_NIL)
         throw std::runtime_error("Lisp did not start: " + toUtf8(fromLisp(fault)));
-    return {functionNamed("BEGIN-SESSION"), functionNamed("EVALUATE"), functionNamed("INVOKE"),
-            functionNamed("COMPILE-TEXT"), functionNamed("INTERRUPTED")};
+    return {functionNamed("BEGIN-SESSION"), functionNamed("EVALUATE"),    functionNamed("INVOKE"),
+            functionNamed("COMPILE-TEXT"),  functionNamed("INTERRUPTED"), functionNamed("MAKE-USER-SYMBOL")};
 }
 
 const LispFunctions& lispFunctions()
 {
     static const LispFunctions functions = startLisp();
     return functions;
+}
+
+// One for the process: a thread that joins Lisp takes memory that Lisp does not give back.
+LispInterrupter& lispInterrupter()
+{
+    static LispInterrupter interrupter(lispFunctions().interrupted);
+    return interrupter;
 }
 
 // A call of Lisp whose arguments are made under protection, too.
@@ -159,6 +173,24 @@ cl_object applyProtected(const LispCall& call)
     return value;
 }
 
+// A new user package, and memory up to the limit. Whether it was made.
+bool beginSession(const LispSurroundings& surroundings)
+{
+    volatile bool made = false;
+    const cl_env_ptr environment = ecl_process_env();
+    ECL_CATCH_ALL_BEGIN(environment)
+    {
+        cl_funcall(3, lispFunctions().beginSession, surroundings.removingTsLisp ? ECL_T : ECL_NIL,
+                   ecl_make_fixnum(static_cast<cl_fixnum>(surroundings.heapBytes)));
+        made = true;
+    }
+    ECL_CATCH_ALL_IF_CAUGHT
+    {
+    }
+    ECL_CATCH_ALL_END;
+    return made;
+}
+
 // When memory is exhausted while a symbol is made, ECL jumps away with this lock held, and nothing works any
 // more.
 void releaseForgottenLock()
@@ -180,6 +212,24 @@ void releaseForgottenLock()
     }
     ECL_CATCH_ALL_END;
 }
+// Whether Lisp can take in a new name, without which nothing can be typed.
+bool canMakeSymbols()
+{
+    volatile bool made = false;
+    const cl_env_ptr environment = ecl_process_env();
+    ECL_CATCH_ALL_BEGIN(environment)
+    {
+        cl_funcall(1, lispFunctions().makeSymbol);
+        made = true;
+    }
+    ECL_CATCH_ALL_IF_CAUGHT
+    {
+    }
+    ECL_CATCH_ALL_END;
+    releaseForgottenLock();
+    return made;
+}
+
 // Every exhaustion gives Lisp some memory more, which it keeps only while the rest is in use.
 void takeBackReserve(std::size_t heapBytes)
 {
@@ -191,10 +241,11 @@ void takeBackReserve(std::size_t heapBytes)
 
 struct LispMachine::Parts
 {
-    explicit Parts(LispSurroundings given)
-        : surroundings(std::move(given)), interrupter(lispFunctions().interrupted)
+    explicit Parts(LispSurroundings given) : surroundings(std::move(given)), interrupter(lispInterrupter())
     {
         connectLispPrimitives(&surroundings, &interrupter);
+        if (!beginSession(surroundings))
+            throw std::runtime_error("Lisp cannot begin a new session.");
     }
     ~Parts() { connectLispPrimitives(nullptr, nullptr); }
     Parts(const Parts&) = delete;
@@ -203,45 +254,51 @@ struct LispMachine::Parts
     // (:DONE . value) or (:FAILED . text), as the prelude answers.
     struct Raw
     {
-        bool ok;
-        cl_object value;
+        bool ok = false;
+        cl_object value = ECL_NIL;
     };
+
     Raw run(const LispCall& call)
     {
         interrupter.begin();
         cl_object pair = applyProtected(call);
         interrupter.end();
-        const bool ok = ECL_CONSP(pair) && ECL_CONS_CAR(pair) == ecl_make_keyword("DONE");
-        if (!ok)
-        {
-            releaseForgottenLock();
-            takeBackReserve(surroundings.heapBytes);
-        }
+        restoreLispStackLimits();
         flushLispOutput();
-        return {ok, ECL_CONSP(pair) ? ECL_CONS_CDR(pair) : ECL_NIL};
+        if (!ECL_CONSP(pair))
+            return {false, recover()};
+        if (ECL_CONS_CAR(pair) == ecl_make_keyword("DONE"))
+            return {true, ECL_CONS_CDR(pair)};
+        releaseForgottenLock();
+        takeBackReserve(surroundings.heapBytes);
+        return {false, ECL_CONS_CDR(pair)};
     }
 
-    static std::wstring errorText(cl_object text)
+    // After a jump out of everything; answers what is to be told.
+    cl_object recover()
     {
-        return ECL_STRINGP(text) ? fromLisp(text) : L"Lisp has given up what it was doing.";
+        releaseForgottenLock();
+        if (canMakeSymbols())
+            return toLisp(L"Lisp has given up what it was doing.");
+        // The user's symbols fill the memory.
+        if (!beginSession(surroundings))
+            return toLisp(L"the memory for Lisp is exhausted; only a new start of the host frees it.");
+        return toLisp(L"the memory for Lisp is exhausted; everything that was defined is forgotten.");
     }
 
     LispAnswer runForText(const LispCall& call)
     {
         const Raw raw = run(call);
-        return {raw.ok, raw.ok ? fromLisp(raw.value) : errorText(raw.value)};
+        return {raw.ok, fromLisp(raw.value)};
     }
 
     LispSurroundings surroundings;
-    LispInterrupter interrupter;
+    LispInterrupter& interrupter;
 };
 
 LispMachine::LispMachine(LispSurroundings surroundings)
     : mParts(std::make_unique<Parts>(std::move(surroundings)))
 {
-    const auto& settings = mParts->surroundings;
-    cl_funcall(3, lispFunctions().beginSession, settings.removingTsLisp ? ECL_T : ECL_NIL,
-               ecl_make_fixnum(static_cast<cl_fixnum>(settings.heapBytes)));
 }
 
 LispMachine::~LispMachine() = default;
@@ -267,7 +324,7 @@ LispAnswer LispMachine::call(const TsResultBuffer* call, TsResultBuffer** values
     const auto raw =
         mParts->run({.function = lispFunctions().invoke, .text = call->value.string, .values = call});
     if (!raw.ok)
-        return {false, Parts::errorText(raw.value)};
+        return {false, fromLisp(raw.value)};
     *values = resultFromLisp(raw.value);
     return {true, {}};
 }

@@ -167,18 +167,9 @@ std::ptrdiff_t sizeWithoutReserve(cl_index size, int reserve)
     return static_cast<std::ptrdiff_t>(size) - 2 * ecl_get_option(reserve);
 }
 
-// ECL lets a stack that has overflowed reach into its reserve, for the error to be handled, and must take
-// that back afterwards. Its own way replaces the stack of frames by a new one while frames are being left,
-// and measures the machine's stack anew, by a limit that is meant for other things.
 cl_object restoreStackLimits()
 {
-    const cl_env_ptr environment = ecl_process_env();
-    environment->frs_limit =
-        environment->frs_org + sizeWithoutReserve(environment->frs_size, ECL_OPT_FRAME_STACK_SAFETY_AREA);
-    environment->bds_limit =
-        environment->bds_org + sizeWithoutReserve(environment->bds_size, ECL_OPT_BIND_STACK_SAFETY_AREA);
-    environment->cs_limit =
-        environment->cs_org - sizeWithoutReserve(environment->cs_size, ECL_OPT_C_STACK_SAFETY_AREA);
+    restoreLispStackLimits();
     return answer(ECL_NIL);
 }
 
@@ -213,6 +204,20 @@ void connectLispPrimitives(LispSurroundings* surroundings, LispInterrupter* inte
         connection().output.connect(surroundings->write, surroundings->column);
     else
         connection().output.connect({}, {});
+}
+
+// ECL lets a stack that has overflowed reach into its reserve, for the error to be handled, and must take
+// that back afterwards. Its own way replaces the stack of frames by a new one while frames are being left,
+// and measures the machine's stack anew, by a limit that is meant for other things.
+void restoreLispStackLimits()
+{
+    const cl_env_ptr environment = ecl_process_env();
+    environment->frs_limit =
+        environment->frs_org + sizeWithoutReserve(environment->frs_size, ECL_OPT_FRAME_STACK_SAFETY_AREA);
+    environment->bds_limit =
+        environment->bds_org + sizeWithoutReserve(environment->bds_size, ECL_OPT_BIND_STACK_SAFETY_AREA);
+    environment->cs_limit =
+        environment->cs_org - sizeWithoutReserve(environment->cs_size, ECL_OPT_C_STACK_SAFETY_AREA);
 }
 
 void flushLispOutput()

@@ -13,6 +13,9 @@ void defineLispPrimitives();
 // Whom they serve from now on, on this thread; null for nobody.
 void connectLispPrimitives(LispSurroundings* surroundings, LispInterrupter* interrupter);
 
+// Gives the stacks of this thread their reserve back, after an evaluation that may have ended in it.
+void restoreLispStackLimits();
+
 // Hands on what Lisp has printed since.
 void flushLispOutput();
 } // namespace tessel

@@ -105,21 +105,23 @@ private:
 
     void open()
     {
-        mLevels.push_back(mMarks + 1);
+        mLevels.push_back({mMarks + 1, mFeature ? mMarks : 0});
         mDepth += mMarks + 1;
         mMarks = 0;
+        mFeature = false;
         ++mAt;
     }
 
     void close()
     {
+        mMarks = 0;
         // A parenthesis too many closes nothing: the reader is to complain about it.
         if (!mLevels.empty())
         {
-            mDepth -= mLevels.back();
+            mDepth -= mLevels.back().count;
+            mMarks = mLevels.back().marksBehind;
             mLevels.pop_back();
         }
-        mMarks = 0;
         ++mAt;
     }
 
@@ -136,6 +138,7 @@ private:
             return;
         }
         ++mMarks;
+        mFeature = mText[mAt] == L'+' || mText[mAt] == L'-';
         if (mText[mAt] != L'(' && mText[mAt] != L'"')
             ++mAt;
     }
@@ -149,15 +152,25 @@ private:
             else
                 mAt += mText[mAt] == L'\\' ? 2 : 1;
         }
-        mMarks = 0;
+        // The form that a feature is for is still to come.
+        if (!mFeature)
+            mMarks = 0;
+        mFeature = false;
     }
+
+    struct Level
+    {
+        std::size_t count;       // a parenthesis and the marks before it
+        std::size_t marksBehind; // marks whose form is still to come
+    };
 
     std::wstring_view mText;
     std::size_t mAt = 0;
     std::size_t mForm = 0;  // where the top-level form began
     std::size_t mDepth = 0; // levels that parentheses have closed over
     std::size_t mMarks = 0; // marks before the next form: each is a level until that form ends
-    std::vector<std::size_t> mLevels;
+    bool mFeature = false;  // behind #+ or #-
+    std::vector<Level> mLevels;
 };
 } // namespace
 

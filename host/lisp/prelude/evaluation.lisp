@@ -21,16 +21,19 @@
       text))
 
 (defun on-one-line (text)
-  "The text with every run of white space as one blank."
+  "The text with every line break, and the blanks around it, as one blank. Other blanks may belong to a file's name."
   (with-output-to-string (line)
-    (let ((gap nil) (begun nil))
+    (let ((blanks 0) (broken nil) (begun nil))
       (loop for character across (shortened text)
-            do (cond ((member character '(#\Space #\Newline #\Return #\Tab #\Page))
-                      (setf gap t))
+            do (cond ((char= character #\Space)
+                      (incf blanks))
+                     ((member character '(#\Newline #\Return #\Tab #\Page))
+                      (setf broken t))
                      (t
-                      (when (and gap begun)
-                        (write-char #\Space line))
-                      (setf gap nil begun t)
+                      (when begun
+                        (dotimes (i (if broken 1 blanks))
+                          (write-char #\Space line)))
+                      (setf blanks 0 broken nil begun t)
                       (write-char character line)))))))
 
 (defun printed (value)
@@ -55,11 +58,18 @@
     (t (handler-case (with-plain-printing (report-text condition))
          (error () (format nil "an error of the type ~S, which cannot be printed." (type-of condition)))))))
 
+(defun reader-fault (condition)
+  "The report of a reader error without its first line, which names a stream; the place says more."
+  (let* ((control (simple-condition-format-control condition))
+         (line-break (search "~%" control)))
+    (if (eql 0 (search "Reader error in file ~S, position ~D:~%" control))
+        (apply #'format nil (subseq control (+ 2 line-break)) (cddr (simple-condition-format-arguments condition)))
+        (cl:princ-to-string condition))))
+
 (defun report-text (condition)
-  (let* ((text (cl:princ-to-string condition))
-         ;; The first line of a reader error names the stream; the place says more.
-         (line-break (and (typep condition 'reader-error) (position #\Newline text)))
-         (line (on-one-line (if line-break (subseq text line-break) text))))
+  (let ((line (on-one-line (if (and (typep condition 'reader-error) (typep condition 'simple-condition))
+                               (reader-fault condition)
+                               (cl:princ-to-string condition)))))
     ;; Some have no report of their own.
     (if (eql 0 (search "#<" line))
         (format nil "an error of the type ~S." (type-of condition))

@@ -1,0 +1,50 @@
+#include <gmock/gmock.h>
+
+#include "host/lisp/CompiledLisp.h"
+
+using tessel::packCompiledLisp;
+using tessel::unpackCompiledLisp;
+
+TEST(CompiledLisp, ComesOutAsItWentIn)
+{
+    for (const std::string& byteCode : {std::string(), std::string("(1 . code)"), std::string(100000, '\0')})
+    {
+        const std::string bytes = packCompiledLisp(byteCode);
+        const auto unpacked = unpackCompiledLisp(bytes);
+        EXPECT_TRUE(unpacked.ok);
+        EXPECT_EQ(unpacked.byteCode, byteCode);
+    }
+}
+
+TEST(CompiledLisp, IsRefusedWithAnyByteChangedInAnyBit)
+{
+    const std::string whole = packCompiledLisp("(1 . code)\n(2 . code)\n");
+    for (std::size_t at = 0; at < whole.size(); ++at)
+        for (int bit = 0; bit < 8; ++bit)
+        {
+            std::string damaged = whole;
+            damaged[at] = static_cast<char>(damaged[at] ^ (1 << bit));
+            const auto unpacked = unpackCompiledLisp(damaged);
+            EXPECT_FALSE(unpacked.ok) << at << " " << bit;
+            EXPECT_FALSE(unpacked.fault.empty());
+        }
+}
+
+TEST(CompiledLisp, IsRefusedAtAnyOtherLength)
+{
+    const std::string whole = packCompiledLisp("(1 . code)\n(2 . code)\n");
+    for (std::size_t length = 0; length < whole.size(); ++length)
+        EXPECT_FALSE(unpackCompiledLisp(std::string_view(whole).substr(0, length)).ok) << length;
+    EXPECT_FALSE(unpackCompiledLisp(whole + "x").ok);
+}
+
+TEST(CompiledLisp, TellsWhatIsWrong)
+{
+    const std::string whole = packCompiledLisp("(1 . code)");
+    EXPECT_EQ(unpackCompiledLisp("(defun a () 1)").fault, L"is not compiled Lisp");
+    EXPECT_EQ(unpackCompiledLisp(std::string_view(whole).substr(0, whole.size() - 1)).fault, L"is cut short");
+    EXPECT_EQ(unpackCompiledLisp(whole + "x").fault, L"is damaged");
+    std::string other = whole;
+    other[8] = 99;
+    EXPECT_EQ(unpackCompiledLisp(other).fault, L"was compiled for another version of Lisp; compile it again");
+}

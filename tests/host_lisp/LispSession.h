@@ -1,0 +1,86 @@
+// An interpreter with the parts of the host that it needs, the output in a text.
+#pragma once
+
+#include <functional>
+#include <string>
+#include <vector>
+
+#include <gtest/gtest.h>
+#include <tessel/tsed.h>
+
+#include "host/Services.h"
+#include "host/console/CommandLine.h"
+#include "host/documents/Document.h"
+#include "host/lisp/LispInterpreter.h"
+#include "host/text/Unicode.h"
+
+// Small enough to be filled quickly.
+inline constexpr std::size_t kTestHeapBytes = std::size_t{64} << 20;
+
+class LispSession
+{
+public:
+    explicit LispSession(bool removingTsLisp = true)
+        : mLisp({.removingTsLisp = removingTsLisp, .heapBytes = kTestHeapBytes})
+    {
+        auto& services = tessel::services();
+        services.commandLine = &mCommandLine;
+        services.document = &mDocument;
+        services.lisp = &mLisp;
+        services.removingTsLisp = removingTsLisp;
+    }
+    ~LispSession() { tessel::services() = {}; }
+    LispSession(const LispSession&) = delete;
+    LispSession& operator=(const LispSession&) = delete;
+
+    tessel::LispInterpreter& lisp() { return mLisp; }
+    tessel::Document& document() { return mDocument; }
+    tessel::CommandLine& commandLine() { return mCommandLine; }
+    const std::string& output() const { return mOutput; }
+    void clearOutput() { mOutput.clear(); }
+
+    // Called with every piece of output, while Lisp runs.
+    void onOutput(std::function<void(std::string_view)> listener) { mListener = std::move(listener); }
+
+    // The printed value; a failure fails the test.
+    std::string value(const std::string& expression)
+    {
+        const auto outcome = mLisp.evaluate(tessel::toWide(expression));
+        EXPECT_TRUE(outcome.ok) << expression << ": " << tessel::toUtf8(outcome.text);
+        return tessel::toUtf8(outcome.text);
+    }
+
+    // The line of error text; success fails the test, and so does more than one line.
+    std::string error(const std::string& expression)
+    {
+        const auto outcome = mLisp.evaluate(tessel::toWide(expression));
+        EXPECT_FALSE(outcome.ok) << expression << ": " << tessel::toUtf8(outcome.text);
+        EXPECT_EQ(outcome.text.find(L'\n'), std::wstring::npos) << tessel::toUtf8(outcome.text);
+        return tessel::toUtf8(outcome.text);
+    }
+
+    std::vector<std::string> documentNames() const
+    {
+        std::vector<std::string> names;
+        for (int index = 0; index < mDocument.loadedApplicationCount(); ++index)
+            names.push_back(tessel::toUtf8(mDocument.loadedApplicationName(index)));
+        return names;
+    }
+
+private:
+    void receive(std::string_view piece)
+    {
+        mOutput += piece;
+        if (mListener)
+            mListener(piece);
+    }
+
+    std::string mOutput;
+    std::function<void(std::string_view)> mListener;
+    tessel::CommandLine mCommandLine{[this](std::string_view piece)
+                                     {
+                                         receive(piece);
+                                     }};
+    tessel::Document mDocument;
+    tessel::LispInterpreter mLisp;
+};
