@@ -1,5 +1,7 @@
 #include "tests/ui/support/DialogTest.h"
 
+#include <objc/runtime.h>
+
 #include "module/DialogBridge.h"
 
 #import "ui/ModrigFilePath.h"
@@ -23,6 +25,24 @@ protected:
         host().registry.setValue(kSettings, L"InitialPath", folder.wstring());
         open();
     }
+    // Runs the dialog in a folder; the steps are followed by the one that closes it.
+    void runIn(const std::filesystem::path& folder, std::vector<ModalStep> steps)
+    {
+        host().registry.setValue(kSettings, L"InitialPath", folder.wstring());
+        steps.insert(steps.begin(), ModalStep(
+                                        [this]
+                                        {
+                                            mController = [[TsOCModrigUtil getModrigController] retain];
+                                            mPanel = runningPanel();
+                                        }));
+        steps.push_back(ModalStep([this] { [mPanel cancel:nil]; }));
+        {
+            const ModalSteps running(steps);
+            ModrigUtils::RunModrigDialog();
+        }
+        [mController release];
+        mController = nil;
+    }
     void choose(NSUInteger filter)
     {
         [[mController valueForKey:@"fileTypes"] setSelectionIndex:filter];
@@ -41,6 +61,7 @@ protected:
             names.push_back(wide([[column cellAtRow:row column:0] stringValue]));
         return names;
     }
+    std::wstring selectedFile() { return wide([[[mController selectedFiles] objectAtIndex:0] filePathName]); }
     // Clicks files in the last column, the first alone and the others added to it.
     void click(std::initializer_list<const wchar_t*> names)
     {
@@ -61,19 +82,22 @@ TEST_F(OpenPanel, ReplacesThePanelsButtonsAndGivesThemBack)
     NSButton* ok = [panel okButton];
     NSButton* cancel = [panel cancelButton];
     const NSRect okFrame = [ok frame];
+    const CGFloat width = [panel frame].size.width;
     const NSRect cancelFrame = [cancel frame];
     const std::wstring cancelTitle = wide([cancel title]);
     const SEL action = [ok action];
     open();
     EXPECT_TRUE([ok isHidden]);
     EXPECT_EQ(mController, [ok target]);
-    EXPECT_EQ(@selector(openPanelOK:), [ok action]);
+    EXPECT_TRUE(sel_isEqual(@selector(openPanelOK:), [ok action]));
     EXPECT_EQ(L"Close", wide([cancel title]));
-    EXPECT_TRUE(NSEqualRects(okFrame, [cancel frame]));
+    EXPECT_TRUE(NSEqualRects([ok frame], [cancel frame]));
     close();
     EXPECT_FALSE([ok isHidden]);
     EXPECT_NE(mController, [ok target]);
-    EXPECT_EQ(action, [ok action]);
+    EXPECT_TRUE(sel_isEqual(action, [ok action]));
+    EXPECT_TRUE(NSEqualRects(okFrame, [ok frame]));
+    EXPECT_EQ(width, [panel frame].size.width);
     EXPECT_EQ(cancelTitle, wide([cancel title]));
     EXPECT_TRUE(NSEqualRects(cancelFrame, [cancel frame]));
     EXPECT_EQ(nil, [panel accessoryView]);
@@ -101,6 +125,20 @@ TEST_F(OpenPanel, OpensInTheHostsFolderUnlessAnotherIsRemembered)
     close();
     openIn(mFolder.path());
     EXPECT_EQ(mFolder.path().wstring(), wide([mPanel directory]));
+}
+
+TEST_F(OpenPanel, OpensInTheNearestFolderThatIsLeftOfTheRememberedOne)
+{
+    openIn(mFolder / "gone/for/good");
+    EXPECT_EQ(mFolder.path().wstring(), wide([mPanel directory]));
+}
+
+TEST_F(OpenPanel, FiltersAnewInsideAPackageThatTheFilterHides)
+{
+    mFolder.write("tool.bundle/inner.lsp", "");
+    openIn(mFolder / "tool.bundle");
+    choose(kLispFilter);
+    EXPECT_TRUE(shows(mFolder / "tool.bundle/inner.lsp"));
 }
 
 TEST_F(OpenPanel, StartsWithTheFirstOfSixFilters)
@@ -160,40 +198,56 @@ TEST_F(OpenPanel, FiltersTheListingAnewInTheSameFolder)
 {
     for (const char* name : {"one.lsp", "two.zmb", "three.txt"})
         file(name);
-    openIn(mFolder.path());
-    EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp", L"two.zmb"));
-    choose(kLispFilter);
-    EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp"));
-    choose(0);
-    EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp", L"two.zmb"));
-    EXPECT_EQ(mFolder.path().wstring(), wide([mPanel directory]));
+    runIn(mFolder.path(), {[this]
+                           {
+                               EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp", L"two.zmb"));
+                               choose(kLispFilter);
+                               EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp"));
+                               choose(0);
+                               EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp", L"two.zmb"));
+                           }});
 }
 
 TEST_F(OpenPanel, KeepsTheSelectedFilesAsTheyStandInThePanel)
 {
     for (const char* name : {"one.lsp", "two.zmb"})
         file(name);
-    openIn(mFolder.path());
-    click({L"two.zmb"});
-    [mController panelSelectionDidChange:mPanel];
-    ASSERT_EQ(1u, [[mController selectedFiles] count]);
-    EXPECT_EQ(file("two.zmb"), wide([[[mController selectedFiles] objectAtIndex:0] filePathName]));
+    runIn(mFolder.path(), {[this] { click({L"two.zmb"}); },
+                           [this]
+                           {
+                               ASSERT_EQ(1u, [[mController selectedFiles] count]);
+                               EXPECT_EQ(file("two.zmb"), selectedFile());
+                           }});
 }
 
 TEST_F(OpenPanel, TakesAFolderThatIsWalkedThroughForNoSelection)
 {
     mFolder.write("folder/one.lsp", "");
-    openIn(mFolder.path());
-    selectFiles({"old.lsp"});
-    click({L"folder"});
-    [mController panelSelectionDidChange:mPanel];
-    EXPECT_EQ(0u, [[mController selectedFiles] count]);
-    EXPECT_THAT(boxes(), IsEmpty());
-    EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp"));
-    click({L"one.lsp"});
-    [mController panelSelectionDidChange:mPanel];
-    ASSERT_EQ(1u, [[mController selectedFiles] count]);
-    EXPECT_EQ(file("folder/one.lsp"), wide([[[mController selectedFiles] objectAtIndex:0] filePathName]));
+    runIn(mFolder.path(), {[this]
+                           {
+                               selectFiles({"old.lsp"});
+                               click({L"folder"});
+                           },
+                           [this]
+                           {
+                               EXPECT_EQ(0u, [[mController selectedFiles] count]);
+                               EXPECT_THAT(boxes(), IsEmpty());
+                               EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp"));
+                               click({L"one.lsp"});
+                           },
+                           [this]
+                           {
+                               ASSERT_EQ(1u, [[mController selectedFiles] count]);
+                               EXPECT_EQ(file("folder/one.lsp"), selectedFile());
+                           }});
+}
+
+TEST_F(OpenPanel, RemembersTheFolderThatTheUserWentTo)
+{
+    mFolder.write("folder/one.zmb", "");
+    runIn(mFolder.path(), {[this] { click({L"folder"}); }, [this] { click({L"one.zmb"}); },
+                           [this] { [mController onLoad:nil]; }});
+    EXPECT_EQ((mFolder / "folder").wstring(), host().registry.value(kSettings, L"InitialPath"));
 }
 
 TEST_F(OpenPanel, KnowsTheHostsFolderInAnyCase)
@@ -210,11 +264,15 @@ TEST_F(OpenPanel, LoadsWithReturnAndClosesWithEscape)
 {
     host().registry.setValue(kSettings, L"InitialPath", mFolder.path().wstring());
     file("one.zmb");
-    const ModalSteps steps({[this] { mPanel = runningPanel(); }, [this] { click({L"one.zmb"}); },
+    const ModalSteps steps({[this]
+                            {
+                                mPanel = runningPanel();
+                                click({L"one.zmb"});
+                            },
                             [this] { pressKey(mPanel, @"\r"); },
+                            [this] { return host().linker.isLoaded(file("one.zmb")); },
                             [this]
                             {
-                                EXPECT_TRUE(host().linker.isLoaded(file("one.zmb")));
                                 EXPECT_TRUE([mPanel isVisible]);
                                 pressKey(mPanel, @"\033");
                             }});

@@ -233,9 +233,13 @@ TEST_F(StartupSuiteDialog, RunsOverTheMainDialogAndStoresTheShortenedSuiteWhenBo
                             [&] { pressKey(suite, @"\033"); },
                             [&]
                             {
-                                EXPECT_FALSE([suite isVisible]);
-                                EXPECT_EQ(runningPanel(), [NSApp modalWindow]);
+                                if ([suite isVisible])
+                                    return false;
+
+                                if ([NSApp modalWindow] != runningPanel())
+                                    return false;
                                 [[runningPanel() cancelButton] performClick:nil];
+                                return true;
                             }});
     ModrigUtils::RunModrigDialog();
     EXPECT_EQ(L"1", host().registry.value(host().moduleKey() + L"\\Startup", L"NumStartup"));

@@ -67,18 +67,40 @@ std::vector<std::wstring> selectionOf(NSArrayController* rows);
 std::wstring wide(NSString* text);
 NSString* text(const std::wstring& wide);
 
-// Runs the steps, one after another, inside the modal run that is going on then; each once the last one's
-// effects are through. Steps that nothing runs are a failure of the test, reported when the object goes.
+// One thing that a user does while a window runs modally. A step that answers false is not ready: what it
+// waits for is still to come, and it is asked again.
+class ModalStep
+{
+public:
+    template <class Function> ModalStep(Function function)
+    {
+        if constexpr (std::is_same_v<bool, decltype(function())>)
+            mRun = function;
+        else
+            mRun = [function]
+            {
+                function();
+                return true;
+            };
+    }
+    bool run() const { return mRun(); }
+
+private:
+    std::function<bool()> mRun;
+};
+
+// Runs the steps, one after another, inside the modal run that is going on then. Steps that nothing runs are
+// a failure of the test, reported when the object goes; a step that never gets ready ends the program.
 class ModalSteps
 {
 public:
-    explicit ModalSteps(std::vector<std::function<void()>> steps);
+    explicit ModalSteps(std::vector<ModalStep> steps);
     ~ModalSteps();
     ModalSteps(const ModalSteps&) = delete;
     ModalSteps& operator=(const ModalSteps&) = delete;
 
 private:
-    const std::vector<std::function<void()>> mSteps;
+    const std::vector<ModalStep> mSteps;
     id mRunner;
 };
 

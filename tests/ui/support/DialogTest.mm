@@ -2,6 +2,9 @@
 
 #include <wincompat/winstring.h>
 
+#include <cstdlib>
+#include <iostream>
+
 #include "host/text/Unicode.h"
 
 #import "ui/ModrigFilePath.h"
@@ -12,6 +15,8 @@ namespace
 {
 NSArray* const kStepModes = [[NSArray alloc]
     initWithObjects:NSModalPanelRunLoopMode, NSDefaultRunLoopMode, NSEventTrackingRunLoopMode, nil];
+
+constexpr int kMostTries = 400;
 
 std::vector<std::wstring> pathsOf(NSArray* rows)
 {
@@ -139,8 +144,9 @@ void OpenDialogTest::selectFiles(std::initializer_list<std::string> names)
 @interface StepRunner : NSObject
 {
 @public
-    const std::vector<std::function<void()>>* steps;
+    const std::vector<ModalStep>* steps;
     std::size_t next;
+    int tries;
 }
 - (void)schedule;
 @end
@@ -152,19 +158,30 @@ void OpenDialogTest::selectFiles(std::initializer_list<std::string> names)
     [self performSelector:@selector(runStep) withObject:nil afterDelay:0.05 inModes:kStepModes];
 }
 
+- (void)giveUp
+{
+    std::cerr << "Step " << next << " of a modal run never got ready.\n";
+    std::_Exit(EXIT_FAILURE);
+}
+
 - (void)runStep
 {
     if (next >= steps->size())
         return;
+    const std::size_t step = next++;
+    if (++tries > kMostTries)
+        [self giveUp];
     // Scheduled first: a step may open another modal run, which goes on with the steps behind it.
-    const auto& step = (*steps)[next++];
     [self schedule];
-    step();
+    if (!(*steps)[step].run())
+        next = step;
+    else
+        tries = 0;
 }
 
 @end
 
-ModalSteps::ModalSteps(std::vector<std::function<void()>> steps) : mSteps(std::move(steps))
+ModalSteps::ModalSteps(std::vector<ModalStep> steps) : mSteps(std::move(steps))
 {
     StepRunner* runner = [[StepRunner alloc] init];
     runner->steps = &mSteps;

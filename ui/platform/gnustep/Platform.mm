@@ -40,6 +40,9 @@
 
 - (NSString*)modrigShownFolder
 {
+    // Until the panel runs, the browser is still at the folder of its last run.
+    if (![self isVisible])
+        return [self directory];
     return [[_browser pathToColumn:[_browser lastColumn]] stringByStandardizingPath];
 }
 
