@@ -138,9 +138,12 @@ LONG Registry::prepare()
     mStatements = std::make_unique<Statements>();
     if (status == SQLITE_OK)
         status = mStatements->prepare(mDatabase);
-    if (status == SQLITE_OK && !mReadOnly)
+    if (status != SQLITE_OK)
+        return statusOf(status);
+    if (!mReadOnly)
         status = run("PRAGMA journal_mode=WAL;");
-    return statusOf(status);
+    // Another process is about to change the journal's kind; until then the old one keeps the promises too.
+    return status == SQLITE_BUSY ? ERROR_SUCCESS : statusOf(status);
 }
 
 std::wstring Registry::storeWords() const
