@@ -1,4 +1,5 @@
-// Conversions between the encodings that meet in the host. None of them fails: what is not text becomes U+FFFD.
+// Conversions between the encodings that meet in the host. None of them fails: what is not text becomes
+// U+FFFD.
 #pragma once
 
 #include <string>
