@@ -1,10 +1,13 @@
 // Addresses as people and programs write them.
 #include <gmock/gmock.h>
 
+#include <ostream>
+
 #include <tessel/tsdefs.h>
 
 #include "tests/host_remote/HttpServer.h"
 #include "tests/host_remote/RemoteHost.h"
+#include "tests/host_store/CaseName.h"
 
 namespace fs = std::filesystem;
 
@@ -21,6 +24,11 @@ struct Case
     const wchar_t* target;
     const char* fileName; // of the local copy
 };
+
+void PrintTo(const Case& value, std::ostream* stream)
+{
+    *stream << tessel::toUtf8(value.target);
+}
 
 class OddAddress : public testing::TestWithParam<Case>
 {
@@ -64,7 +72,8 @@ INSTANTIATE_TEST_SUITE_P(
                     Case{L"/..", "download"}, Case{L"/a/../../tool.lsp", "tool.lsp"}, Case{L"/.", "download"},
                     Case{L"/.url", "download"}, Case{L"/..\\..\\tool.lsp", ".._.._tool.lsp"},
                     Case{L"/100%25s%25n.lsp", "100%25s%25n.lsp"}, Case{L"/größe.lsp", "größe.lsp"},
-                    Case{L"//tool.lsp", "tool.lsp"}, Case{L"/tool.lsp;v=1", "tool.lsp;v=1"}));
+                    Case{L"//tool.lsp", "tool.lsp"}, Case{L"/tool.lsp;v=1", "tool.lsp;v=1"}),
+    [](const auto& which) { return caseName(which.index, which.param.target); });
 
 TEST(LongAddress, KeepsTheEndOfItsNameWhichTellsTheKind)
 {

@@ -3,7 +3,11 @@
 #include <wincompat/winfile.h>
 
 #include <cerrno>
+#include <ostream>
 #include <string>
+
+#include "host/text/Unicode.h"
+#include "tests/host_store/CaseName.h"
 
 namespace
 {
@@ -17,6 +21,11 @@ struct Case
     const wchar_t* name;
     const wchar_t* extension;
 };
+
+void PrintTo(const Case& value, std::ostream* stream)
+{
+    *stream << tessel::toUtf8(value.path);
+}
 
 // Buffers that are known not to be empty before the call.
 struct Parts
@@ -77,7 +86,8 @@ INSTANTIATE_TEST_SUITE_P(
                     Case{L"dir.old\\tool", L"", L"dir.old\\", L"tool", L""},
                     Case{L"/x/..", L"", L"/x/", L".", L"."},
                     Case{L"/x/100%s \"a\".lsp", L"", L"/x/", L"100%s \"a\"", L".lsp"},
-                    Case{L"/büro/größe.LSP", L"", L"/büro/", L"größe", L".LSP"}));
+                    Case{L"/büro/größe.LSP", L"", L"/büro/", L"größe", L".LSP"}),
+    [](const auto& which) { return caseName(which.index, which.param.path); });
 
 TEST(SplitPathBuffers, MayFitExactly)
 {
