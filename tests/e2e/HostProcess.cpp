@@ -107,7 +107,8 @@ void HostSession::set(const std::string& variable, const std::string& value)
 
 std::vector<std::string> HostSession::commandLine(const std::vector<std::string>& arguments) const
 {
-    std::vector<std::string> all = {TESSEL_PROGRAM, "--profile-dir", profile().string()};
+    std::vector<std::string> all = mLauncher;
+    all.insert(all.end(), {TESSEL_PROGRAM, "--profile-dir", profile().string()});
     all.insert(all.end(), mAlways.begin(), mAlways.end());
     all.insert(all.end(), arguments.begin(), arguments.end());
     return all;

@@ -46,6 +46,9 @@ public:
     // Arguments that are put in front of all others, such as "--safe".
     void alwaysWith(std::vector<std::string> arguments) { mAlways = std::move(arguments); }
 
+    // A shell command that starts the host, which it knows as "$0" "$@": for limits and pipes.
+    void startBy(const std::string& shellCommand) { mLauncher = {"/bin/sh", "-c", shellCommand}; }
+
     // Changes the environment that the host is started in. It has no display from the beginning.
     void set(const std::string& variable, const std::string& value);
 
@@ -58,6 +61,7 @@ public:
 
 private:
     TemporaryFolder mFolder;
+    std::vector<std::string> mLauncher;
     std::vector<std::string> mAlways;
     std::vector<EnvironmentChange> mEnvironment;
 };
