@@ -1,0 +1,92 @@
+#include "tests/e2e/Applications.h"
+
+#include <algorithm>
+#include <filesystem>
+
+#include <gtest/gtest.h>
+
+namespace
+{
+constexpr std::size_t kNameColumn = 24;
+constexpr std::size_t kFolderColumn = 48;
+
+std::string padded(std::string text, std::size_t width)
+{
+    text.resize(std::max(text.size(), width), ' ');
+    return text;
+}
+} // namespace
+
+std::string sample(const std::string& name)
+{
+    return std::string(SAMPLES_FOLDER) + "/" + name;
+}
+
+std::string fixtureModule(const std::string& name)
+{
+    return std::string(FIXTURE_MODULES) + "/" + name;
+}
+
+std::string lispFixture(const std::string& name)
+{
+    return std::string(LISP_FIXTURES) + "/" + name;
+}
+
+std::string modrigBundle()
+{
+    return MODRIG_BUNDLE;
+}
+
+std::string quoted(const std::string& text)
+{
+    std::string result = "\"";
+    for (const char character : text)
+        result += character == '"' ? std::string("\"\"") : std::string(1, character);
+    return result + "\"";
+}
+
+std::string setInSuite(const std::string& name, const std::string& data)
+{
+    return std::string("REGISTRY SET ") + kSuiteKey + " " + name + " " + quoted(data);
+}
+
+std::vector<std::string> byArguments(const std::vector<std::string>& commands)
+{
+    std::vector<std::string> arguments;
+    for (const std::string& command : commands)
+        arguments.insert(arguments.end(), {"-c", command});
+    return arguments;
+}
+
+void storeSuite(const HostSession& session, const Paths& paths)
+{
+    std::vector<std::string> commands = {setInSuite("NumStartup", std::to_string(paths.size()))};
+    for (std::size_t index = 0; index < paths.size(); ++index)
+        commands.push_back(setInSuite(std::to_string(index + 1) + "Startup", paths[index]));
+    std::vector<std::string> arguments = byArguments(commands);
+    arguments.emplace_back("--safe");
+    const HostResult result = session.start(arguments);
+    ASSERT_EQ(result.exitStatus, 0) << result.output;
+}
+
+std::string listed(const std::string& path, const std::string& state)
+{
+    const std::filesystem::path file = path;
+    return "  " + padded(file.filename(), kNameColumn) + " " + padded(file.parent_path(), kFolderColumn) +
+           " " + state + "\n";
+}
+
+std::string linkerRefuses(const std::string& path, const std::string& reason)
+{
+    return "The application \"" + path + "\" is not loaded: " + reason + ".\n";
+}
+
+std::string modrigDoesNotKnow(const std::string& path)
+{
+    return "Message: “" + path + "” is not of a type that can be loaded.\n";
+}
+
+std::string modrigDoesNotLoad(const std::string& path)
+{
+    return "Message: “" + path + "” could not be loaded.\n";
+}

@@ -1,0 +1,42 @@
+// The applications that the tests of Modrig in the real host load, and what the host says about them.
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "tests/e2e/HostProcess.h"
+
+inline constexpr char kBanner[] =
+    "Tessel R21, reference host for Modrig. Type HELP for the list of commands, QUIT to leave.\n";
+
+// What loading a Lisp file by way of Modrig ends with, when a line follows.
+inline constexpr char kLispReady[] = "\nReady. \n";
+
+inline constexpr char kSuiteKey[] = R"(Software\Tessel\R21\Profiles\Default\Dialogs\Modrig\Startup)";
+inline constexpr char kRecordKey[] = R"(Software\Tessel\R21\Applications\TesselModrig)";
+
+using Paths = std::vector<std::string>;
+
+std::string sample(const std::string& name);
+std::string fixtureModule(const std::string& name);
+std::string lispFixture(const std::string& name);
+std::string modrigBundle();
+
+// An argument of a command, in quotes.
+std::string quoted(const std::string& text);
+
+// A command that puts a value into the stored Startup Suite.
+std::string setInSuite(const std::string& name, const std::string& data);
+// Stores the Startup Suite, in a session that loads nothing.
+void storeSuite(const HostSession& session, const Paths& paths);
+// The arguments that run the commands one after the other.
+std::vector<std::string> byArguments(const std::vector<std::string>& commands);
+
+// The line of APPS about an application. The state: kMayBeUnloaded, "locked", "Lisp".
+inline constexpr char kMayBeUnloaded[] = "may be unloaded";
+std::string listed(const std::string& path, const std::string& state = kMayBeUnloaded);
+
+// What is said about a file that is not loaded: by the linker, and by Modrig.
+std::string linkerRefuses(const std::string& path, const std::string& reason);
+std::string modrigDoesNotKnow(const std::string& path);
+std::string modrigDoesNotLoad(const std::string& path);

@@ -1,0 +1,249 @@
+// Startup Suites with files that cannot be loaded: each is told in sentences that name the file and the
+// reason, the applications around it are loaded, and the host goes on.
+#include <gmock/gmock.h>
+
+#include <algorithm>
+#include <csignal>
+#include <fstream>
+
+#include <sys/stat.h>
+
+#include "tests/e2e/Applications.h"
+#include "tests/e2e/HostTerminal.h"
+
+namespace fs = std::filesystem;
+
+using testing::HasSubstr;
+using testing::Not;
+
+namespace
+{
+constexpr char kGoOn[] = "VERSION";
+constexpr char kStillThere[] = "Command: VERSION\nTessel R21, reference host for Modrig\n";
+constexpr char kGoodLisp[] = "good.lsp: loaded\n";
+
+std::string contentOf(const fs::path& file)
+{
+    std::ifstream stream(file, std::ios::binary);
+    return {std::istreambuf_iterator<char>(stream), {}};
+}
+
+// What is said about a broken file between a good file of its kind and another one.
+class BrokenSuite : public testing::Test
+{
+protected:
+    std::string saidAboutModule(const std::string& path)
+    {
+        storeSuite(session, {fixtureModule("Good.zmb"), path, fixtureModule("Good.bundle")});
+        return between("Good.zmb: message 1\n", "Good.bundle: message 1\n" + std::string(kStillThere) +
+                                                    "Good.bundle: message 2\nGood.zmb: message 2\n");
+    }
+
+    std::string saidAboutLisp(const std::string& path)
+    {
+        const auto last = session.folder().write("last.lsp", "(write-line \"last.lsp: loaded\")\n").string();
+        storeSuite(session, {lispFixture("good.lsp"), path, last});
+        // Every file but the last is followed by the prompt, and what comes next stands behind it.
+        return between(std::string(kGoodLisp) + "\nReady. ",
+                       std::string("\nReady. last.lsp: loaded\n") + kLispReady + kStillThere);
+    }
+
+    HostSession session;
+
+private:
+    std::string between(const std::string& before, const std::string& after)
+    {
+        const auto result = session.run({kGoOn});
+        EXPECT_EQ(result.exitStatus, 0) << result.output;
+        const std::string start = kBanner + before;
+        EXPECT_TRUE(result.output.starts_with(start)) << result.output;
+        EXPECT_TRUE(result.output.ends_with(after)) << result.output;
+        if (result.output.size() < start.size() + after.size())
+            return "too little was said: " + result.output;
+        return result.output.substr(start.size(), result.output.size() - start.size() - after.size());
+    }
+};
+
+struct BrokenModule
+{
+    const char* file;
+    const char* reason;
+    const char* saidBefore = ""; // by the module itself
+};
+
+class BrokenModules : public BrokenSuite, public testing::WithParamInterface<BrokenModule>
+{
+};
+
+std::string nameOf(const testing::TestParamInfo<BrokenModule>& info)
+{
+    return fs::path(info.param.file).stem();
+}
+struct BrokenLisp
+{
+    const char* file;
+    const char* reason; // behind the path
+    const char* saidBefore = "";
+};
+
+class BrokenLispFiles : public BrokenSuite, public testing::WithParamInterface<BrokenLisp>
+{
+};
+
+std::string nameOfLisp(const testing::TestParamInfo<BrokenLisp>& info)
+{
+    return fs::path(info.param.file).stem();
+}
+
+} // namespace
+
+TEST_P(BrokenModules, AreToldWithTheReasonAndByModrig)
+{
+    const std::string path = fixtureModule(GetParam().file);
+    EXPECT_EQ(saidAboutModule(path),
+              GetParam().saidBefore + linkerRefuses(path, GetParam().reason) + modrigDoesNotLoad(path));
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    OfEveryKind, BrokenModules,
+    testing::Values(
+        BrokenModule{"NoEntry.zmb", "it has no entry point \"tsrxEntryPoint\""},
+        BrokenModule{"Unresolved.zmb", "undefined symbol: aFunctionThatNobodyHas"},
+        BrokenModule{"UnresolvedClasses.bundle", "undefined symbol: aFunctionThatNobodyHas"},
+        BrokenModule{"MissingDependency.zmb",
+                     "libfixture_absent.so: cannot open shared object file: No such file or directory"},
+        BrokenModule{"Answers3.zmb", "its entry point answered 3", "Answers3.zmb: message 1\n"},
+        BrokenModule{"Throws.zmb", "its entry point threw an exception: the coffee is cold"},
+        BrokenModule{"ThrowsNumber.omp",
+                     "its entry point threw something that is not an error of the standard library"},
+        BrokenModule{"Raises.bundle",
+                     "its entry point threw an exception: NSInvalidArgumentException: the tea is cold"},
+        BrokenModule{"Missing.bundle", "No such file or directory"}),
+    nameOf);
+
+TEST_F(BrokenSuite, SaysThatAModuleIsCutShort)
+{
+    const auto cut = session.folder() / "cut short.zmb";
+    const std::string whole = contentOf(fixtureModule("Good.zmb"));
+    for (const std::size_t length : {whole.size() / 2, std::size_t{64}, std::size_t{3}, std::size_t{0}})
+    {
+        std::ofstream(cut, std::ios::binary) << whole.substr(0, length);
+        const std::string said = saidAboutModule(cut);
+        EXPECT_THAT(said, HasSubstr("The application \"" + cut.string() + "\" is not loaded: "));
+        EXPECT_TRUE(said.ends_with(".\n" + modrigDoesNotLoad(cut))) << said;
+        EXPECT_EQ(std::ranges::count(said, '\n'), 2) << said;
+    }
+}
+
+TEST_F(BrokenSuite, SaysThatAFileIsNoSharedLibrary)
+{
+    const auto text = session.folder().write("letter.zmb", "Dear Sir or Madam,\n").string();
+    EXPECT_EQ(saidAboutModule(text),
+              linkerRefuses(text, "it is not a shared library") + modrigDoesNotLoad(text));
+    const auto folder = session.folder() / "folder.omp";
+    fs::create_directory(folder);
+    EXPECT_EQ(saidAboutModule(folder),
+              linkerRefuses(folder, "it is a folder, not a file") + modrigDoesNotLoad(folder));
+}
+
+TEST_F(BrokenSuite, SaysThatABundleIsEmpty)
+{
+    const auto bundle = session.folder() / "empty.bundle";
+    fs::create_directory(bundle);
+    const std::string said = saidAboutModule(bundle);
+    EXPECT_THAT(said, HasSubstr("The application \"" + bundle.string() + "\" is not loaded: "));
+    EXPECT_TRUE(said.ends_with(".\n" + modrigDoesNotLoad(bundle))) << said;
+    EXPECT_EQ(std::ranges::count(said, '\n'), 2) << said;
+}
+
+TEST_P(BrokenLispFiles, AreToldWithTheLineAndTheReason)
+{
+    const std::string path = lispFixture(GetParam().file);
+    EXPECT_EQ(saidAboutLisp(path), std::string(*GetParam().saidBefore ? GetParam().saidBefore : "\n") + path +
+                                       GetParam().reason + "\n");
+}
+
+TEST_P(BrokenLispFiles, AreToldTheSameWhenTheyAreLoadedByHand)
+{
+    session.alwaysWith({"--safe"});
+    const std::string path = lispFixture(GetParam().file);
+    const auto result = session.run({"LOAD " + path, kGoOn});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_EQ(result.output, kBanner + ("Command: LOAD " + path + "\n") + GetParam().saidBefore + path +
+                                 GetParam().reason + "\n" + kStillThere);
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    OfEveryKind, BrokenLispFiles,
+    testing::Values(
+        BrokenLisp{"never_closed.lsp", ":5: The form that begins here is never closed.",
+                   "never_closed.lsp: begun\n"},
+        BrokenLisp{"one_too_many.lsp", ":3: Unmatched right parenthesis, #\\)", "one_too_many.lsp: begun\n"},
+        BrokenLisp{"error_on_line_3.lsp",
+                   ":3: In function CAR, the value of the only argument is 5 which is not of the "
+                   "expected type CONS",
+                   "error_on_line_3.lsp: one\nerror_on_line_3.lsp: two\n"},
+        BrokenLisp{"endless_recursion.lsp", ":6: stack overflow: the recursion is endless or too deep."},
+        BrokenLisp{"undefined_function.lsp", ":2: The function NO-SUCH-FUNCTION is undefined."}),
+    nameOfLisp);
+
+TEST_F(BrokenSuite, LoadsALispFileThatHoldsNothing)
+{
+    EXPECT_EQ(saidAboutLisp(lispFixture("nothing.lsp")), "");
+}
+
+TEST_F(BrokenSuite, SaysThatALispFileIsNone)
+{
+    const auto folder = session.folder() / "folder.lsp";
+    fs::create_directory(folder);
+    EXPECT_EQ(saidAboutLisp(folder), "\nCannot load \"" + folder.string() + "\": it is a folder.\n");
+    const auto pipe = session.folder() / "pipe.lsp";
+    ASSERT_EQ(mkfifo(pipe.c_str(), S_IRUSR | S_IWUSR), 0);
+    EXPECT_EQ(saidAboutLisp(pipe), "\nCannot load \"" + pipe.string() + "\": it is not a file.\n");
+}
+
+TEST_F(BrokenSuite, SaysThatALispFileIsNoText)
+{
+    std::string bytes;
+    for (int value = 0; value < 256; ++value)
+        bytes += static_cast<char>(value);
+    const auto file = session.folder().write("bytes.lsp", bytes).string();
+    const std::string said = saidAboutLisp(file);
+    EXPECT_TRUE(said.starts_with("\n" + file + ":")) << said;
+    EXPECT_THAT(said, Not(HasSubstr("#<"))) << "an object of Lisp tells nobody anything";
+    EXPECT_EQ(std::ranges::count(said, '\n'), 2) << said;
+}
+
+TEST_F(BrokenSuite, SaysThatCompiledLispIsDamaged)
+{
+    const std::string whole = contentOf(sample("calendar.qbc"));
+    const auto file = session.folder() / "damaged.qbc";
+    const auto saidAbout = [&](const std::string& content)
+    {
+        std::ofstream(file, std::ios::binary) << content;
+        return saidAboutLisp(file);
+    };
+    const std::string refusal = "\nCannot load \"" + file.string() + "\": it ";
+    std::string changed = whole;
+    changed[whole.size() / 2] = static_cast<char>(changed[whole.size() / 2] ^ 1);
+    EXPECT_EQ(saidAbout(whole.substr(0, whole.size() / 2)), refusal + "is cut short.\n");
+    EXPECT_EQ(saidAbout(changed), refusal + "is damaged.\n");
+    EXPECT_EQ(saidAbout("(write-line \"not compiled\")"), refusal + "is not compiled Lisp.\n");
+    EXPECT_EQ(saidAbout(""), refusal + "is not compiled Lisp.\n");
+}
+
+TEST_F(BrokenSuite, WithAnEndlessLoopIsStoppedByTheInterruptSignal)
+{
+    const std::string loop = lispFixture("endless_loop.lsp");
+    storeSuite(session, {lispFixture("good.lsp"), loop, sample("hilbert.lsp")});
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.shows("endless_loop.lsp: begun")) << terminal.screen();
+    ASSERT_EQ(kill(terminal.process(), SIGINT), 0);
+    ASSERT_TRUE(terminal.shows(loop + ":5: Lisp was interrupted.")) << terminal.screen();
+    ASSERT_TRUE(terminal.shows("Hilbert: ")) << terminal.screen();
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("(good)\r");
+    EXPECT_TRUE(terminal.shows("\n42")) << terminal.screen();
+    terminal.type("QUIT\r");
+    EXPECT_EQ(terminal.waitForEnd(), 0);
+}

@@ -1,0 +1,156 @@
+// Applications in folders and under names that are unusual: whatever a file may be called, it is loaded, and
+// what is said about it names it as it is.
+#include <gtest/gtest.h>
+
+#include "tests/e2e/Applications.h"
+
+namespace fs = std::filesystem;
+
+namespace
+{
+constexpr std::size_t kLongestFileName = 255;
+constexpr std::size_t kLongestStored = 1023; // what can be read back from the registry
+
+struct OddName
+{
+    const char* test;
+    std::string name;
+};
+
+class OddPaths : public testing::TestWithParam<OddName>
+{
+protected:
+    fs::path makeModule(const fs::path& file) const
+    {
+        fs::create_directories(file.parent_path());
+        fs::copy_file(fixtureModule("Good.zmb"), file);
+        return file;
+    }
+
+    fs::path makeLisp(const fs::path& file) const
+    {
+        fs::create_directories(file.parent_path());
+        fs::copy_file(lispFixture("good.lsp"), file);
+        return file;
+    }
+
+    // A file in folders within folders, whose whole path has this many bytes.
+    fs::path longPath(const std::string& name, std::size_t length) const
+    {
+        fs::path path = session.folder().path();
+        std::size_t missing = length - path.string().size() - 1 - name.size();
+        while (missing > 0)
+        {
+            const std::size_t part = std::min(missing - 1, std::size_t{200});
+            path /= std::string(part, 'x');
+            missing -= part + 1;
+        }
+        return path / name;
+    }
+
+    HostSession session;
+};
+
+std::string nameOf(const testing::TestParamInfo<OddName>& info)
+{
+    return info.param.test;
+}
+
+const std::string kLoadedLisp = std::string("good.lsp: loaded\n");
+} // namespace
+
+TEST_P(OddPaths, AreLoadedFromTheStartupSuite)
+{
+    const fs::path folder = session.folder() / GetParam().name;
+    const std::string module = makeModule(folder / (GetParam().name + ".zmb"));
+    const std::string lisp = makeLisp(folder / (GetParam().name + ".lsp"));
+    const std::string missing = folder / "missing.zmb";
+    storeSuite(session, {module, missing, lisp});
+    const auto result = session.run({"(good)"});
+    EXPECT_EQ(result.output, kBanner + (GetParam().name + ".zmb: message 1\n") +
+                                 linkerRefuses(missing, "No such file or directory") +
+                                 modrigDoesNotLoad(missing) + kLoadedLisp + kLispReady +
+                                 "Command: (good)\n42\n" + GetParam().name + ".zmb: message 2\n");
+}
+
+TEST_P(OddPaths, AreLoadedAndUnloadedByHand)
+{
+    session.alwaysWith({"--safe"});
+    const fs::path folder = session.folder() / GetParam().name;
+    const std::string module = makeModule(folder / (GetParam().name + ".zmb"));
+    const std::string lisp = makeLisp(folder / (GetParam().name + ".lsp"));
+    const std::string name = GetParam().name + ".zmb";
+    const auto result = session.run({"LOAD " + quoted(module), "UNLOAD " + quoted(module),
+                                     "LOAD " + quoted(lisp), "LOAD " + quoted(folder / "missing.lsp")});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_EQ(result.output, kBanner + ("Command: LOAD " + quoted(module) + "\n" + name + ": message 1\n") +
+                                 module + " is loaded.\nCommand: UNLOAD " + quoted(module) + "\n" + name +
+                                 ": message 2\n" + module + " is unloaded.\nCommand: LOAD " + quoted(lisp) +
+                                 "\n" + kLoadedLisp + lisp + " is loaded.\nCommand: LOAD " +
+                                 quoted(folder / "missing.lsp") + "\nCannot load \"" +
+                                 (folder / "missing.lsp").string() + "\": No such file or directory.\n");
+}
+
+INSTANTIATE_TEST_SUITE_P(WithOddNames, OddPaths,
+                         testing::Values(OddName{"Blanks", "  two  blanks "},
+                                         OddName{"Quotes", "the \"quoted\" 'name'"},
+                                         OddName{"PerCentSigns", "100%s %n%n %ls %5000000d %"},
+                                         OddName{"Letters", "größe ЖУК 日本語 😀"},
+                                         OddName{"Dollars", "$HOME `id` ; & | *"},
+                                         OddName{"Brackets", "(setq [x] #{y} #. )"},
+                                         OddName{"Dots", "a.b..c.zmb"}, OddName{"Tildes", "~ ~% ~A @x"}),
+                         nameOf);
+
+TEST_F(OddPaths, OfFourThousandCharactersAreLoadedByHand)
+{
+    session.alwaysWith({"--safe"});
+    const std::string module = makeModule(longPath("Good.zmb", 4000));
+    const std::string lisp = makeLisp(longPath("good.lsp", 4000));
+    const auto result = session.run({"LOAD " + module, "LOAD " + lisp, "(good)"});
+    EXPECT_EQ(result.exitStatus, 0);
+    EXPECT_EQ(result.output, kBanner + ("Command: LOAD " + module + "\nGood.zmb: message 1\n") + module +
+                                 " is loaded.\nCommand: LOAD " + lisp + "\n" + kLoadedLisp + lisp +
+                                 " is loaded.\nCommand: (good)\n42\nGood.zmb: message 2\n");
+}
+
+TEST_F(OddPaths, OfFourThousandCharactersThatAreMissingAreTold)
+{
+    session.alwaysWith({"--safe"});
+    for (const std::size_t length : {4000u, 9000u})
+    {
+        const std::string module = longPath("missing.zmb", length);
+        const auto result = session.run({"LOAD " + module, "VERSION"});
+        const std::string reason = length > 4095 ? "File name too long" : "No such file or directory";
+        EXPECT_EQ(result.output, kBanner + ("Command: LOAD " + module + "\n") +
+                                     linkerRefuses(module, reason) +
+                                     "Command: VERSION\nTessel R21, reference host for Modrig\n");
+    }
+}
+
+TEST_F(OddPaths, AsLongAsCanBeReadBackAreLoadedFromTheStartupSuite)
+{
+    const std::string module = makeModule(longPath("Good.zmb", kLongestStored));
+    const std::string lisp = makeLisp(longPath("good.lsp", kLongestStored));
+    storeSuite(session, {module, lisp});
+    EXPECT_EQ(session.run({"(good)"}).output, kBanner + ("Good.zmb: message 1\n" + kLoadedLisp) + kLispReady +
+                                                  "Command: (good)\n42\nGood.zmb: message 2\n");
+}
+
+// The Suite ends where its next value cannot be read, as at a gap.
+TEST_F(OddPaths, OfFourThousandCharactersEndTheStartupSuite)
+{
+    const std::string module = makeModule(longPath("Good.omp", 4000));
+    storeSuite(session, {lispFixture("good.lsp"), module, fixtureModule("Good.zmb")});
+    const auto result = session.run({"VERSION"});
+    EXPECT_EQ(result.output, kBanner + kLoadedLisp + kLispReady +
+                                 "Command: VERSION\nTessel R21, reference host for Modrig\n");
+}
+
+TEST_F(OddPaths, WithTheLongestFileNameAreLoadedFromTheStartupSuite)
+{
+    const std::string name = std::string(kLongestFileName - 4, 'n') + ".zmb";
+    storeSuite(session, {makeModule(session.folder() / name)});
+    EXPECT_EQ(session.run({"VERSION"}).output, kBanner + (name + ": message 1\nCommand: VERSION\n") +
+                                                   "Tessel R21, reference host for Modrig\n" + name +
+                                                   ": message 2\n");
+}
