@@ -167,8 +167,10 @@ bool Host::run(const std::wstring& input)
 
 bool Host::finishLine()
 {
+    // What the line wrote is stored before the queue runs: queued Lisp may take its time, or never end.
+    const bool stored = mParts->registry->endOfCommand();
     mParts->lisp->runQueue();
-    return mParts->registry->endOfCommand();
+    return mParts->registry->endOfCommand() && stored;
 }
 
 bool Host::runScript(const std::filesystem::path& script)

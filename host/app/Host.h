@@ -41,8 +41,8 @@ public:
     // told about and does not keep the host from running.
     bool start();
 
-    // Runs one line: a command, or Lisp when it begins with a parenthesis. Afterwards the queued Lisp is
-    // evaluated and what the line wrote to the registry is stored; a store that fails makes the line fail.
+    // Runs one line: a command, or Lisp when it begins with a parenthesis. Afterwards what the line wrote to
+    // the registry is stored, and the queued Lisp is evaluated; a store that fails makes the line fail.
     bool run(const std::wstring& input) override;
 
     // Runs a file of lines as if typed. Scripts may run scripts, as deep as a sensible one reaches.

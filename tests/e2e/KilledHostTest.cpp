@@ -1,4 +1,4 @@
-// A host that is killed loses nothing that it has stored.
+// A host that is killed loses nothing that it has stored, and one that is busy keeps nobody from storing.
 #include <gtest/gtest.h>
 
 #include <csignal>
@@ -39,7 +39,18 @@ TEST(KilledHost, KeepsTheRecordThatModrigWroteAtItsStart)
         ASSERT_EQ(kill(terminal.process(), SIGKILL), 0);
         EXPECT_EQ(terminal.waitForEnd(), -SIGKILL);
     }
-    const std::string get = std::string("REGISTRY GET ") + kSuiteKey + " 1Startup";
-    EXPECT_EQ(session.start({"--safe", "-c", get}).output,
-              kBanner + ("Command: " + get + "\n" + lispFixture("endless_loop.lsp") + "\n"));
+    const std::string get = std::string("REGISTRY GET ") + kRecordKey + " LoadReasons";
+    EXPECT_EQ(session.start({"--safe", "-c", get}).output, kBanner + ("Command: " + get + "\n6\n"));
+}
+
+TEST(BusyHost, LeavesTheRegistryToOtherSessionsWhileItsLispRuns)
+{
+    const HostSession session;
+    storeSuite(session, {lispFixture("endless_loop.lsp")});
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.shows("endless_loop.lsp: begun")) << terminal.screen();
+    const std::string set = R"(REGISTRY SET Software\Trial name data)";
+    const auto result = session.start({"--safe", "-c", set});
+    EXPECT_EQ(result.exitStatus, 0);
+    EXPECT_EQ(result.output, kBanner + ("Command: " + set + "\n"));
 }
