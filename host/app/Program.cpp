@@ -63,19 +63,20 @@ int runBatch(Host& host, const Options& options)
     return allWell ? kAllWell : kSomethingFailed;
 }
 
-int converse(Host& host, const std::filesystem::path& profileFolder)
+int converse(Host& host, const std::filesystem::path& profileFolder, const InterruptKey& interruptKey)
 {
-    LineEditor editor(profileFolder / kHistoryFile, [&host] { return host.commandNames(); });
+    LineEditor editor(
+        profileFolder / kHistoryFile, [&host] { return host.commandNames(); }, interruptKey.wakeUp());
     Console(host.commandLine(), host).converse(editor);
     return kAllWell;
 }
 
-int runSession(Host& host, const Options& options)
+int runSession(Host& host, const Options& options, const InterruptKey& interruptKey)
 {
     if (options.isBatch())
         return runBatch(host, options);
     if (isatty(STDIN_FILENO))
-        return converse(host, options.profileFolder);
+        return converse(host, options.profileFolder, interruptKey);
     return Console(host.commandLine(), host).runLines(std::cin) ? kAllWell : kSomethingFailed;
 }
 
@@ -88,7 +89,7 @@ int runHost(Options options)
     greet(host.commandLine());
     if (!host.start())
         return kSomethingFailed;
-    const int status = runSession(host, options);
+    const int status = runSession(host, options, interruptKey);
     host.end();
     return status;
 }

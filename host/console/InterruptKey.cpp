@@ -1,23 +1,49 @@
 #include "host/console/InterruptKey.h"
 
+#include <array>
+#include <cerrno>
+
+#include <fcntl.h>
+#include <unistd.h>
+
 namespace tessel
 {
 namespace
 {
-LineRunner* theRunner = nullptr; // a signal handler can be given nothing
+// A signal handler can be given nothing.
+LineRunner* theRunner = nullptr;
+volatile std::sig_atomic_t theWriteEnd = -1;
+
+void onKey(int)
+{
+    const int before = errno;
+    theRunner->interrupt();
+    // A pipe that is full has notes enough.
+    [[maybe_unused]] const auto written = write(theWriteEnd, "", 1);
+    errno = before;
 }
+
+void makeIndependent(int descriptor)
+{
+    fcntl(descriptor, F_SETFD, FD_CLOEXEC);
+    fcntl(descriptor, F_SETFL, O_NONBLOCK);
+}
+} // namespace
 
 InterruptKey::InterruptKey(LineRunner& runner)
 {
     theRunner = &runner;
-    // Without SA_RESTART: a console that waits for a line is to wake up and give a fresh prompt.
+    std::array<int, 2> ends{-1, -1};
+    if (pipe(ends.data()) == 0)
+        for (const int end : ends)
+            makeIndependent(end);
+    mReadEnd = ends[0];
+    theWriteEnd = ends[1];
+    // Without SA_RESTART: a script that is read from a terminal's pipe is to wake up, too.
     struct sigaction action
     {
     };
-    action.sa_handler = [](int)
-    {
-        theRunner->interrupt();
-    };
+    action.sa_handler = onKey;
     sigemptyset(&action.sa_mask);
     sigaction(SIGINT, &action, &mPrevious);
 }
@@ -25,5 +51,8 @@ InterruptKey::InterruptKey(LineRunner& runner)
 InterruptKey::~InterruptKey()
 {
     sigaction(SIGINT, &mPrevious, nullptr);
+    close(theWriteEnd);
+    close(mReadEnd);
+    theWriteEnd = -1;
 }
 } // namespace tessel

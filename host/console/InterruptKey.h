@@ -16,9 +16,14 @@ public:
     InterruptKey(const InterruptKey&) = delete;
     InterruptKey& operator=(const InterruptKey&) = delete;
 
+    // A descriptor that can be read from when the key was pressed: whoever waits for input waits for it, too.
+    // A signal alone can arrive just before the waiting begins, and be lost.
+    int wakeUp() const { return mReadEnd; }
+
 private:
     struct sigaction mPrevious
     {
     };
+    int mReadEnd = -1;
 };
 } // namespace tessel

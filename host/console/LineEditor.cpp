@@ -6,6 +6,7 @@
 #include <histedit.h>
 
 #include "host/console/Completion.h"
+#include "host/console/TerminalInput.h"
 
 namespace tessel
 {
@@ -26,7 +27,7 @@ void showCandidates(const std::vector<std::wstring>& candidates)
 
 struct LineEditor::Terminal
 {
-    Terminal(const std::filesystem::path& file, Names names);
+    Terminal(const std::filesystem::path& file, Names names, int interruptKey);
     ~Terminal();
     Terminal(const Terminal&) = delete;
     Terminal& operator=(const Terminal&) = delete;
@@ -39,19 +40,21 @@ struct LineEditor::Terminal
     }
     static wchar_t* prompt(EditLine* editor) { return of(editor).promptText.data(); }
     static unsigned char complete(EditLine* editor, int);
+    static int readCharacter(EditLine* editor, wchar_t* character);
 
     void remember(const wchar_t* line);
 
     std::string historyFile;
     Names commandNames;
+    TerminalInput input;
     std::wstring promptText;
     EditLine* editLine;
     HistoryW* history;
     HistEventW event{};
 };
 
-LineEditor::Terminal::Terminal(const std::filesystem::path& file, Names names)
-    : historyFile(file.string()), commandNames(std::move(names)),
+LineEditor::Terminal::Terminal(const std::filesystem::path& file, Names names, int interruptKey)
+    : historyFile(file.string()), commandNames(std::move(names)), input(interruptKey),
       editLine(el_init("Tessel", stdin, stdout, stderr)), history(history_winit())
 {
     history_w(history, &event, H_SETSIZE, kHistoryLines);
@@ -60,6 +63,7 @@ LineEditor::Terminal::Terminal(const std::filesystem::path& file, Names names)
     el_wset(editLine, EL_CLIENTDATA, this);
     el_wset(editLine, EL_PROMPT, &Terminal::prompt);
     el_wset(editLine, EL_HIST, history_w, history);
+    el_wset(editLine, EL_GETCFN, &Terminal::readCharacter);
     el_wset(editLine, EL_EDITOR, L"emacs");
     el_wset(editLine, EL_ADDFN, kCompletionFunction, L"Complete the name of a command", &Terminal::complete);
     el_wset(editLine, EL_BIND, L"^I", kCompletionFunction, nullptr);
@@ -90,14 +94,30 @@ unsigned char LineEditor::Terminal::complete(EditLine* editor, int)
     return CC_REFRESH;
 }
 
+// The editor's own reading would miss a Ctrl-C that comes between the prompt and the waiting.
+int LineEditor::Terminal::readCharacter(EditLine* editor, wchar_t* character)
+{
+    switch (of(editor).input.read(*character))
+    {
+    case TerminalInput::Outcome::kCharacter:
+        return 1;
+    case TerminalInput::Outcome::kInterrupted:
+        errno = EINTR;
+        return -1;
+    case TerminalInput::Outcome::kEnd:
+        break;
+    }
+    return 0;
+}
+
 void LineEditor::Terminal::remember(const wchar_t* line)
 {
     if (*line != L'\n')
         history_w(history, &event, H_ENTER, line);
 }
 
-LineEditor::LineEditor(const std::filesystem::path& historyFile, Names names)
-    : mTerminal(std::make_unique<Terminal>(historyFile, std::move(names)))
+LineEditor::LineEditor(const std::filesystem::path& historyFile, Names names, int interruptKey)
+    : mTerminal(std::make_unique<Terminal>(historyFile, std::move(names), interruptKey))
 {
 }
 
@@ -107,6 +127,10 @@ LineEditor::Outcome LineEditor::read(const std::wstring& prompt, std::wstring& l
 {
     mTerminal->promptText = prompt;
     el_resize(mTerminal->editLine); // the window may have changed its size while a command ran
+    // Before the prompt invites to type: a Ctrl-D that the terminal still takes for the end of a line is
+    // lost.
+    el_wset(mTerminal->editLine, EL_PREP_TERM, 1);
+    mTerminal->input.forgetInterrupts();
     int length = 0;
     errno = 0;
     const wchar_t* typed = el_wgets(mTerminal->editLine, &length);

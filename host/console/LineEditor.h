@@ -15,8 +15,9 @@ public:
     using Names = std::function<std::vector<std::wstring>()>;
 
     // Reads standard input and writes standard output. The history is read from the file, if there is one,
-    // and stored there at the end. `names`: what the Tab key completes.
-    LineEditor(const std::filesystem::path& historyFile, Names names);
+    // and stored there at the end. `names`: what the Tab key completes. `interruptKey`: a descriptor that can
+    // be read from when Ctrl-C was pressed.
+    LineEditor(const std::filesystem::path& historyFile, Names names, int interruptKey);
     ~LineEditor();
     LineEditor(const LineEditor&) = delete;
     LineEditor& operator=(const LineEditor&) = delete;

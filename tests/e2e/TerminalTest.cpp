@@ -47,6 +47,23 @@ TEST(Terminal, StopsRunawayLispWithControlCAndGoesOn)
     EXPECT_EQ(terminal.waitForEnd(), 0);
 }
 
+TEST(Terminal, StopsLispThatRunsAwayWhileTheHostStarts)
+{
+    const HostSession session;
+    const auto lisp =
+        session.folder().write("endless.lsp", "(princ \"be\") (princ \"gun\") (loop)\n").string();
+    const std::string key = R"(REGISTRY SET Software\Tessel\R21\Profiles\Default\Dialogs\Modrig\Startup )";
+    ASSERT_EQ(
+        session.start({"--safe", "-c", key + "NumStartup 1", "-c", key + "1Startup " + lisp}).exitStatus, 0);
+
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.shows("begun")) << terminal.screen();
+    terminal.type(kControlC);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("QUIT\r");
+    EXPECT_EQ(terminal.waitForEnd(), 0);
+}
+
 TEST(Terminal, GivesAFreshPromptForControlC)
 {
     const HostSession session;
@@ -74,6 +91,7 @@ TEST(Terminal, RemembersWhatWasTypedInEarlierSessions)
         ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
         terminal.type("(list 'übung 17)\r");
         ASSERT_TRUE(terminal.shows("ÜBUNG 17")) << terminal.screen();
+        ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
         terminal.type(kControlD);
         ASSERT_EQ(terminal.waitForEnd(), 0);
     }
