@@ -48,16 +48,17 @@ TEST_P(BadModules, AreToldInOneSentenceAndTheHostLivesOn)
 
 INSTANTIATE_TEST_SUITE_P(
     OfEveryKind, BadModules,
-    testing::Values(BadModule{"NoEntry.zmb", "it has no entry point \"tsrxEntryPoint\""},
-                    BadModule{"Unresolved.zmb", "undefined symbol: aFunctionThatNobodyHas"},
-                    BadModule{"UnresolvedClasses.bundle", "undefined symbol: aFunctionThatNobodyHas"},
-                    BadModule{"MissingDependency.zmb",
-                              "libfixture_absent.so: cannot open shared object file"},
-                    BadModule{"Answers3.zmb", "its entry point answered 3"},
-                    BadModule{"Throws.zmb", "its entry point threw an exception: the coffee is cold"},
-                    BadModule{"ThrowsNumber.omp", "its entry point threw something"},
-                    BadModule{"Raises.bundle", "NSInvalidArgumentException: the tea is cold"},
-                    BadModule{"Missing.bundle", "No such file or directory"}),
+    testing::Values(
+        BadModule{"NoEntry.zmb", "it has no entry point \"tsrxEntryPoint\""},
+        BadModule{"Unresolved.zmb", "undefined symbol: aFunctionThatNobodyHas"},
+        BadModule{"UnresolvedClasses.bundle", "undefined symbol: aFunctionThatNobodyHas"},
+        BadModule{"MissingDependency.zmb", "libfixture_absent.so: cannot open shared object file"},
+        BadModule{"Answers3.zmb", "its entry point answered 3"},
+        BadModule{"Throws.zmb", "its entry point threw an exception: the coffee is cold"},
+        BadModule{"ThrowsNumber.omp", "its entry point threw something"},
+        BadModule{"Raises.bundle",
+                  "its entry point threw an exception: NSInvalidArgumentException: the tea is cold"},
+        BadModule{"Missing.bundle", "No such file or directory"}),
     nameOf);
 
 TEST(BadModule, ThatIsCutShortIsRefusedBeforeItIsMapped)

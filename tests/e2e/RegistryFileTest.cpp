@@ -58,6 +58,20 @@ TEST(RegistryFile, MarkedReadOnlyIsReadAndKeepsWhatItHolds)
     EXPECT_THAT(result.output, AllOf(HasSubstr("cannot be written: "), HasSubstr("\ngröße 100%s\n")));
 }
 
+TEST(RegistryFile, KeepsWhatItHoldsWhenItMayNotGrow)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"}); // Modrig would write, too
+    ASSERT_EQ(session.run({kSet}).exitStatus, 0);
+    session.startBy("ulimit -f 80; exec \"$0\" \"$@\""); // in blocks of 512 bytes
+    const auto result = session.run({"REGISTRY SET Software\\Trial big " + std::string(100'000, 'x'), kGet});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output,
+                AllOf(HasSubstr((session.profile() / "registry.db").string()), HasSubstr("\ngröße 100%s\n")));
+    session.startBy("exec \"$0\" \"$@\"");
+    EXPECT_EQ(session.run({kGet}).exitStatus, 0);
+}
+
 TEST(RegistryFile, IsToldWhenItCannotBeMade)
 {
     const HostSession session;

@@ -1,6 +1,8 @@
 // A session from its banner to its end, without a terminal.
 #include <gmock/gmock.h>
 
+#include <fstream>
+
 #include "tests/e2e/HostProcess.h"
 
 using testing::AllOf;
@@ -145,6 +147,20 @@ TEST(Session, EndsWithStatusTwoForArgumentsItDoesNotKnow)
     EXPECT_EQ(session.start({"--nonsense"}).exitStatus, 2);
     EXPECT_EQ(session.start({"--help"}).exitStatus, 0);
     EXPECT_EQ(session.start({"--version"}).output, "Tessel R21, reference host for Modrig\n");
+}
+
+TEST(Session, OutlivesTheReaderOfItsOutput)
+{
+    HostSession session;
+    const auto status = session.folder() / "status";
+    session.startBy("{ \"$0\" \"$@\"; echo $? >'" + status.string() + "'; } | true");
+    session.run({"HELP", R"(REGISTRY SET Software\Trial name kept)"});
+    std::string content;
+    std::ifstream(status) >> content;
+    EXPECT_EQ(content, "0");
+
+    session.startBy("exec \"$0\" \"$@\"");
+    EXPECT_THAT(session.run({R"(REGISTRY GET Software\Trial name)"}).output, EndsWith("\nkept\n"));
 }
 
 TEST(Session, ChangesTheCurrentFolder)
