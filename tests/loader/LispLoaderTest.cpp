@@ -17,6 +17,9 @@ class LispLoader : public ModuleTest
 protected:
     static const std::vector<std::wstring>& queued() { return host().lisp.queued; }
 
+    // Empty when nothing is queued.
+    static std::wstring First() { return queued().empty() ? std::wstring() : queued().front(); }
+
     // The path as it stands in the expression that loads it.
     static std::wstring SafePath(const std::wstring& path)
     {
@@ -24,8 +27,12 @@ protected:
         EXPECT_TRUE(LoadLispFile(CStdStr(path), 1, 0));
         const std::wstring before = L"(load \"";
         const std::wstring after = L"\")";
-        const std::wstring expression = queued().front();
-        EXPECT_TRUE(expression.starts_with(before) && expression.ends_with(after));
+        const std::wstring expression = First();
+        if (!expression.starts_with(before) || !expression.ends_with(after))
+        {
+            ADD_FAILURE() << "no load expression: " << testing::PrintToString(expression);
+            return {};
+        }
         return expression.substr(before.size(), expression.size() - before.size() - after.size());
     }
 };
@@ -47,7 +54,7 @@ TEST_F(LispLoader, LoadsAllPartsWhereTheHostKnowsHow)
                             kNewLine, kPrompt));
     host().lisp.queued.clear();
     EXPECT_TRUE(LoadLispFile(L"/a/tool.lsp", 1, -1)) << "any flag but 0 is yes";
-    EXPECT_TRUE(queued().front().starts_with(L"(progn"));
+    EXPECT_TRUE(First().starts_with(L"(progn"));
 }
 
 TEST_F(LispLoader, LoadsPlainlyWhereTheHostDoesNotKnowHow)
@@ -108,7 +115,7 @@ TEST_F(LispLoader, KeepsBlanksPerCentSignsAndLettersOfAnyScript)
     EXPECT_EQ(L"C:/ä/чертёж.lsp", SafePath(L"C:\\ä\\чертёж.lsp"));
     host().lisp.queued.clear();
     LoadLispFile(L"/a/100%s%n%%.lsp", 1, 1);
-    EXPECT_EQ(L"(progn (_INTERNAL-LOAD-ALL-FILE \"/a/100%s%n%%.lsp\" nil T T nil)(princ))", queued().front());
+    EXPECT_EQ(L"(progn (_INTERNAL-LOAD-ALL-FILE \"/a/100%s%n%%.lsp\" nil T T nil)(princ))", First());
 }
 
 TEST_F(LispLoader, KeepsADoubleQuoteInANameFromEndingTheLispText)
@@ -123,13 +130,14 @@ TEST_F(LispLoader, QueuesAPathOf4000CharactersWhole)
     EXPECT_EQ(path, SafePath(path));
     host().lisp.queued.clear();
     LoadLispFile(CStdStr(path), 1, 1);
-    EXPECT_EQ(L"(progn (_INTERNAL-LOAD-ALL-FILE \"" + path + L"\" nil T T nil)(princ))", queued().front());
+    EXPECT_EQ(L"(progn (_INTERNAL-LOAD-ALL-FILE \"" + path + L"\" nil T T nil)(princ))", First());
 }
 
 TEST_F(LispLoader, TakesThePromptFromTheTexts)
 {
     host().resources.setText(kResourceModuleName, 15, L"100%s>");
     LoadLispFile(L"/a/tool.lsp", 1, 0);
+    ASSERT_FALSE(queued().empty());
     EXPECT_EQ(L"(prompt \"100%s> \")", queued().back());
     host().resources.removeText(kResourceModuleName, 15);
     LoadLispFile(L"/a/tool.lsp", 1, 0);
@@ -155,7 +163,7 @@ TEST_F(LispLoader, UnloadsAPackageByItsNameAlsoWithTheLispEnvironment)
 {
     gbOrreryLoaded = true;
     EXPECT_TRUE(LoadLispFile(L"/a/tool.rpk", 0, 0));
-    EXPECT_EQ(L"(qz-unload-rpk \"tool\")", queued().front());
+    EXPECT_EQ(L"(qz-unload-rpk \"tool\")", First());
     EXPECT_THAT(host().lisp.invoked, IsEmpty());
 }
 
