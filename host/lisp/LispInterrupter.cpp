@@ -11,6 +11,8 @@ namespace tessel
 {
 namespace
 {
+// Lisp that jumps out of what it was doing does not stand a second interrupt: the jump would arrive without
+// its value.
 constexpr auto kTimeToLeave = std::chrono::milliseconds(200);
 
 // No signal of the program's is to land on the watcher: Ctrl-C has to wake the thread that waits for a line.
@@ -77,12 +79,9 @@ void LispInterrupter::interrupt() noexcept
 
 bool LispInterrupter::takeRequest() noexcept
 {
-    const Run run = mRequested.exchange(0);
-    const auto now = std::chrono::steady_clock::now();
-    if (run != mRun.load() || (run == mInterruptedRun && now - mInterruptedAt < kTimeToLeave))
+    if (mRequested.exchange(0) != mRun.load())
         return false;
-    mInterruptedRun = run;
-    mInterruptedAt = now;
+    mTaken = std::chrono::steady_clock::now();
     return true;
 }
 
@@ -105,11 +104,18 @@ void LispInterrupter::watch()
     ecl_release_current_thread();
 }
 
+bool LispInterrupter::isOnItsWay(Run run) const
+{
+    return run == mSent &&
+           (mRequested.load() == run || std::chrono::steady_clock::now() - mTaken.load() < kTimeToLeave);
+}
+
 void LispInterrupter::send(Run run)
 {
     const std::lock_guard lock(mRunChange);
-    if (run != mRun.load())
+    if (run != mRun.load() || isOnItsWay(run))
         return;
+    mSent = run;
     mRequested = run;
     mp_interrupt_process(mLisp, mInterrupted);
 }

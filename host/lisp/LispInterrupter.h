@@ -34,8 +34,7 @@ public:
     // Safe in a signal handler. Without an evaluation that runs it does nothing.
     void interrupt() noexcept;
 
-    // Whether an interrupt was meant for the evaluation that runs; once true for each. Not again while Lisp
-    // may still be on its way out of what was interrupted: two jumps at once miss their aim.
+    // Whether an interrupt was meant for the evaluation that runs; once true for each.
     bool takeRequest() noexcept;
 
 private:
@@ -44,6 +43,7 @@ private:
     static bool isRun(Run run) { return run % 2 != 0; }
 
     void watch();
+    bool isOnItsWay(Run run) const;
     void send(Run run);
     std::optional<Run> receive() const;
 
@@ -54,10 +54,10 @@ private:
     int mDepth = 0;
     std::atomic<Run> mRun = 0;
     std::atomic<Run> mRequested = 0;
-    Run mInterruptedRun = 0; // used by the thread of Lisp only
-    std::chrono::steady_clock::time_point mInterruptedAt;
-    std::mutex
-        mRunChange; // held while an interrupt is sent: the evaluation it is sent to does not end meanwhile
+    std::atomic<std::chrono::steady_clock::time_point> mTaken;
+    Run mSent = 0; // used by the watcher only
+    // Held while an interrupt is sent: the evaluation that it is sent to does not end meanwhile.
+    std::mutex mRunChange;
     std::thread mWatcher;
 };
 } // namespace tessel

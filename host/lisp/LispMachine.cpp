@@ -26,7 +26,7 @@ constexpr cl_fixnum kFrameStackSize = 65536;
 // may use more: as much as the system keeps free below the main thread's stack.
 constexpr rlim_t kStackBytes = rlim_t{112} << 20;
 // What an error may use when the stack has run out. ECL's own 32 KB are not always enough for its handlers.
-constexpr cl_fixnum kStackReserve = 512 * 1024;
+constexpr cl_fixnum kStackReserve = cl_fixnum{512} << 10;
 constexpr int kMostLockHolds = 8;
 // Room for telling the error and going on when the memory is exhausted by what the user keeps.
 constexpr std::size_t kHeapReserve = std::size_t{16} << 20;
@@ -260,26 +260,31 @@ struct LispMachine::Parts
 
     Raw run(const LispCall& call)
     {
+        const std::size_t memoryBefore = cl_core.max_heap_size;
         interrupter.begin();
         cl_object pair = applyProtected(call);
         interrupter.end();
         restoreLispStackLimits();
         flushLispOutput();
         if (!ECL_CONSP(pair))
-            return {false, recover()};
-        if (ECL_CONS_CAR(pair) == ecl_make_keyword("DONE"))
-            return {true, ECL_CONS_CDR(pair)};
+            return {false, recover(cl_core.max_heap_size > memoryBefore)};
+        if (cl_car(pair) == ecl_make_keyword("DONE"))
+            return {true, cl_cdr(pair)};
         releaseForgottenLock();
         takeBackReserve(surroundings.heapBytes);
-        return {false, ECL_CONS_CDR(pair)};
+        return {false, cl_cdr(pair)};
     }
 
     // After a jump out of everything; answers what is to be told.
-    cl_object recover()
+    cl_object recover(bool memoryWasExhausted)
     {
         releaseForgottenLock();
         if (canMakeSymbols())
-            return toLisp(L"Lisp has given up what it was doing.");
+        {
+            takeBackReserve(surroundings.heapBytes);
+            return toLisp(memoryWasExhausted ? L"the memory for Lisp is exhausted."
+                                             : L"Lisp has given up what it was doing.");
+        }
         // The user's symbols fill the memory.
         if (!beginSession(surroundings))
             return toLisp(L"the memory for Lisp is exhausted; only a new start of the host frees it.");

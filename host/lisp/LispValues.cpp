@@ -7,8 +7,8 @@ namespace tessel
 {
 namespace
 {
-constexpr wchar_t kReplacement = L'\xFFFD';
-constexpr wchar_t kLastCharacter = 0x10FFFF;
+constexpr std::uint32_t kReplacement = 0xFFFD;
+constexpr std::uint32_t kLastCharacter = 0x10FFFF;
 
 cl_object toLispValue(const TsResultBuffer& value)
 {
@@ -54,9 +54,9 @@ cl_object toLisp(std::wstring_view text)
     cl_object string = ecl_alloc_simple_extended_string(text.size());
     for (std::size_t index = 0; index < text.size(); ++index)
     {
-        const wchar_t character = text[index];
-        const bool known = character >= 0 && character <= kLastCharacter;
-        string->string.self[index] = static_cast<ecl_character>(known ? character : kReplacement);
+        const auto character = static_cast<std::uint32_t>(text[index]);
+        string->string.self[index] =
+            static_cast<ecl_character>(character <= kLastCharacter ? character : kReplacement);
     }
     return string;
 }
@@ -84,9 +84,9 @@ TsResultBuffer* resultFromLisp(cl_object values)
 {
     TsResultBuffer* head = nullptr;
     TsResultBuffer** tail = &head;
-    for (; ECL_CONSP(values); values = ECL_CONS_CDR(values))
+    for (; ECL_CONSP(values); values = cl_cdr(values))
     {
-        *tail = resultBuffer(ECL_CONS_CAR(values));
+        *tail = resultBuffer(cl_car(values));
         tail = &(*tail)->next;
     }
     return head;

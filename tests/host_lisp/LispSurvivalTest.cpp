@@ -1,5 +1,8 @@
 // Whatever Lisp does, the host goes on, and so does Lisp.
 #include <csignal>
+#include <cstdint>
+
+#include <sys/wait.h>
 
 #include <gmock/gmock.h>
 
@@ -113,6 +116,15 @@ TEST_F(LispSurvival, OfThreadsWithErrors)
     EXPECT_EQ(session.output(), "");
 }
 
+namespace
+{
+// By the signal, or by the sanitizer's report of it.
+bool endsByMemoryFault(int status)
+{
+    return WIFSIGNALED(status) ? WTERMSIG(status) == SIGSEGV : WEXITSTATUS(status) != 0;
+}
+} // namespace
+
 TEST(LispAndMemoryFaultsDeathTest, LeavesRealOnesAsTheyWere)
 {
     testing::FLAGS_gtest_death_test_style = "threadsafe";
@@ -120,9 +132,8 @@ TEST(LispAndMemoryFaultsDeathTest, LeavesRealOnesAsTheyWere)
         {
             LispSession session;
             session.value("(+ 1 2)");
-            std::raise(SIGSEGV);
-            volatile int* nowhere = nullptr;
+            auto* nowhere = reinterpret_cast<volatile int*>(std::uintptr_t{64});
             *nowhere = 1;
         },
-        testing::KilledBySignal(SIGSEGV), "");
+        endsByMemoryFault, "");
 }
