@@ -4,9 +4,9 @@
 
 #include <tessel/tsformat.h>
 #include <tesselui/tsuidisplay.h>
+#include <tesselui/tsuierrors.h>
 
 #import "ui/ModrigController.h"
-#import "ui/ToolkitErrors.h"
 #import "ui/TsOCModrigUtil.h"
 
 #include "ui/Paths.h"
@@ -39,7 +39,7 @@ void RunModrigDialog()
 {
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
     if (tsuiPrepareWindows())
-        if (NSString* error = ModrigToolkitErrorOf(RunDialog, nullptr))
+        if (NSString* error = tsuiErrorOf(RunDialog, nullptr))
             SayWhatFailed(error);
     [pool drain];
     tsuiFinishWindows();

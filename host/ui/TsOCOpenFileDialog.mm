@@ -135,10 +135,8 @@ NSTextField* makeLabel(NSString* text)
 {
     if (mTitle)
         [panel setTitle:mTitle];
-    if (mInitialPath)
-        [panel setDirectoryURL:[NSURL fileURLWithPath:mInitialPath]];
     [panel setAllowsMultipleSelection:mAllowsMultipleSelection];
-    tessel::windowing::allowFilesOnly(panel);
+    tessel::windowing::showFilesOf(panel, mInitialPath);
 }
 
 - (NSInteger)runModal

@@ -45,6 +45,7 @@ void tsuiFinishWindows()
 {
     if (!gPrepared)
         return;
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
     // Closing a window is only asked of the display; what comes back is taken here, since nobody waits for
     // it.
     while (NSEvent* event = [NSApp nextEventMatchingMask:NSAnyEventMask
@@ -53,4 +54,5 @@ void tsuiFinishWindows()
                                                  dequeue:YES])
         [NSApp sendEvent:event];
     tessel::windowing::flushScreen();
+    [pool drain];
 }

@@ -27,6 +27,6 @@ void filterAnew(NSOpenPanel* panel);
 // The paths of the chosen files, as strings.
 NSArray* chosenPaths(NSOpenPanel* panel);
 
-// The browser of an open panel cannot choose folders where the platform would otherwise offer them.
-void allowFilesOnly(NSOpenPanel* panel);
+// Opens the panel in a folder (nil: where it likes), for choosing files only.
+void showFilesOf(NSOpenPanel* panel, NSString* folder);
 } // namespace tessel::windowing

@@ -1,5 +1,6 @@
 #include "tests/ui/support/DialogTest.h"
 
+#include <tesselui/tsuierrors.h>
 #include <wincompat/winstring.h>
 
 #include <cstdlib>
@@ -8,7 +9,6 @@
 #include "host/text/Unicode.h"
 
 #import "ui/ModrigFilePath.h"
-#import "ui/ToolkitErrors.h"
 #import "ui/TsOCModrigUtil.h"
 
 namespace
@@ -106,7 +106,7 @@ void OpenDialogTest::open()
     mController = [[ModrigController alloc] init];
     mPanel = [NSOpenPanel openPanel];
     OpeningDialog opening = {mController, mPanel};
-    if (NSString* error = ModrigToolkitErrorOf(setUp, &opening))
+    if (NSString* error = tsuiErrorOf(setUp, &opening))
         FAIL() << [error UTF8String];
 }
 

@@ -1,6 +1,7 @@
 #import "ui/NSSavePanel+ModrigRuntime.h"
 
 #include <tesselui/tsuieach.h>
+#include <tesselui/tsuierrors.h>
 
 #include <sys/stat.h>
 
@@ -119,6 +120,47 @@ void giveBack(const ButtonState& state)
     [state.title release];
 }
 
+NSString* nearestFolder(NSString* path)
+{
+    bool isFolder = false;
+    while ([path length] > 1 && !(ModrigPlatform::FileExists(path, isFolder) && isFolder))
+        path = [path stringByDeletingLastPathComponent];
+    return path;
+}
+
+// The browser raises an exception when a folder that it shows, /tmp, say, changes under it. It has the new
+// state the next time. What still does not work then shows on the screen.
+constexpr int kMostTries = 5;
+
+void persist(void (*change)(void*), void* argument)
+{
+    for (int tries = 0; tries < kMostTries && tsuiErrorOf(change, argument); ++tries)
+        ;
+}
+
+struct FolderChange
+{
+    NSOpenPanel* panel;
+    NSString* folder;
+};
+
+void changeFolder(void* change)
+{
+    const auto* wanted = static_cast<FolderChange*>(change);
+    [wanted->panel setDirectory:wanted->folder];
+}
+
+void filterAnew(void* panel)
+{
+    [static_cast<NSOpenPanel*>(panel) modrigFilterAnew];
+}
+
+// A folder that is only walked through would count as selected.
+void allowFilesOnly(void* panel)
+{
+    [static_cast<NSOpenPanel*>(panel) setCanChooseDirectories:NO];
+}
+
 // What leads to other disks is of no use among a host's applications.
 void hideUnusedButtons(NSView* panelView)
 {
@@ -157,8 +199,7 @@ void FitAccessoryView(NSView* view)
 
 void CompletePanel(NSOpenPanel* panel, NSView* view)
 {
-    // A folder that is only walked through would count as selected.
-    [panel setCanChooseDirectories:NO];
+    persist(allowFilesOnly, panel);
     hideUnusedButtons([panel contentView]);
     joinKeyViews(panel, view);
 }
@@ -168,16 +209,14 @@ NSString* ShownFolder(NSOpenPanel* panel)
     return [panel modrigShownFolder];
 }
 
-// The browser raises an exception on its way to a folder that is gone, or that the delegate hides: it looks
-// for the nearest one there is, without the delegate.
+// Without the delegate, which might hide a folder on the way, and to the nearest folder that there is: the
+// browser raises an exception when it cannot get through.
 void ShowFolder(NSOpenPanel* panel, NSString* folder)
 {
-    bool isFolder = false;
-    while ([folder length] > 1 && !(FileExists(folder, isFolder) && isFolder))
-        folder = [folder stringByDeletingLastPathComponent];
     id delegate = [panel delegate];
     [panel setDelegate:nil];
-    [panel setDirectory:folder];
+    FolderChange change = {panel, nearestFolder(folder)};
+    persist(changeFolder, &change);
     [panel setDelegate:delegate];
 }
 
@@ -193,7 +232,7 @@ bool HasUnreportedSelection(NSOpenPanel* panel)
 
 void FilterPanelAnew(NSOpenPanel* panel, NSURL*)
 {
-    [panel modrigFilterAnew];
+    persist(filterAnew, panel);
 }
 
 NSString* ResolveLinksAndAliases(NSString* path)

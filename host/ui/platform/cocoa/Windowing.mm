@@ -44,8 +44,10 @@ NSArray* chosenPaths(NSOpenPanel* panel)
     return [[panel URLs] valueForKey:@"path"];
 }
 
-void allowFilesOnly(NSOpenPanel* panel)
+void showFilesOf(NSOpenPanel* panel, NSString* folder)
 {
     [panel setCanChooseDirectories:NO];
+    if (folder)
+        [panel setDirectoryURL:[NSURL fileURLWithPath:folder]];
 }
 } // namespace tessel::windowing

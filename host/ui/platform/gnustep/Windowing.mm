@@ -3,6 +3,7 @@
 #import <GNUstepGUI/GSDisplayServer.h>
 
 #include <tesselui/tsuieach.h>
+#include <tesselui/tsuierrors.h>
 
 #include <dlfcn.h>
 
@@ -39,6 +40,29 @@ NSString* const kBoldFontRoles[] = {@"NSBoldFont", @"NSTitleBarFont"};
 void setDefaults(NSDictionary* defaults)
 {
     [[NSUserDefaults standardUserDefaults] registerDefaults:defaults];
+}
+// The browser raises an exception when a folder that it shows, /tmp, say, changes under it. It has the new
+// state the next time. What still does not work then shows on the screen.
+constexpr int kMostTries = 5;
+
+void persist(void (*change)(void*), void* argument)
+{
+    for (int tries = 0; tries < kMostTries && tsuiErrorOf(change, argument); ++tries)
+        ;
+}
+
+struct PanelFolder
+{
+    NSOpenPanel* panel;
+    NSString* folder;
+};
+
+void openFolder(void* wanted)
+{
+    const auto* place = static_cast<PanelFolder*>(wanted);
+    [place->panel setCanChooseDirectories:NO];
+    if (place->folder)
+        [place->panel setDirectory:place->folder];
 }
 } // namespace
 
@@ -88,9 +112,10 @@ NSOpenPanel* makeOpenPanel()
     return [[[NSOpenPanel alloc] init] autorelease];
 }
 
-void allowFilesOnly(NSOpenPanel* panel)
+void showFilesOf(NSOpenPanel* panel, NSString* folder)
 {
-    [panel setCanChooseDirectories:NO];
+    PanelFolder wanted = {panel, folder};
+    persist(openFolder, &wanted);
 }
 } // namespace tessel::windowing
 
@@ -135,5 +160,5 @@ NSArray* tessel::windowing::chosenPaths(NSOpenPanel* panel)
 
 void tessel::windowing::filterAnew(NSOpenPanel* panel)
 {
-    [panel tsFilterAnew];
+    persist([](void* shown) { [static_cast<NSOpenPanel*>(shown) tsFilterAnew]; }, panel);
 }

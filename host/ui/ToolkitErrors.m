@@ -1,8 +1,9 @@
-#import "ui/ToolkitErrors.h"
-
+/* Plain Objective-C: in Objective-C++, GCC's @catch crashes. */
 #import <Foundation/Foundation.h>
 
-NSString* ModrigToolkitErrorOf(void (*function)(void*), void* argument)
+__attribute__((visibility("default"))) NSString* tsuiErrorOf(void (*function)(void*), void* argument);
+
+NSString* tsuiErrorOf(void (*function)(void*), void* argument)
 {
     @try
     {
