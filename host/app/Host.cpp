@@ -214,8 +214,7 @@ std::vector<std::wstring> Host::commandNames() const
         for (const auto& command : record.commands)
             names.push_back(command.second);
     std::ranges::sort(names);
-    const auto repeated = std::ranges::unique(names);
-    names.erase(repeated.begin(), repeated.end());
+    names.erase(std::unique(names.begin(), names.end()), names.end());
     return names;
 }
 } // namespace tessel

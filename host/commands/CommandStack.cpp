@@ -206,8 +206,7 @@ std::vector<std::wstring> CommandStack::names() const
     for (const auto& command : mCommands)
         result.push_back(command->localName);
     std::ranges::sort(result);
-    const auto repeated = std::ranges::unique(result);
-    result.erase(repeated.begin(), repeated.end());
+    result.erase(std::unique(result.begin(), result.end()), result.end());
     return result;
 }
 

@@ -22,8 +22,8 @@ std::string findProgram(const std::string& name)
     const char* searchPath = std::getenv("PATH");
     std::istringstream folders(searchPath ? searchPath : "");
     for (std::string folder; std::getline(folders, folder, ':');)
-        if (const auto program = folder + "/" + name; access(program.c_str(), X_OK) == 0)
-            return program;
+        if (auto program = std::filesystem::path(folder) / name; access(program.c_str(), X_OK) == 0)
+            return program.string();
     return {};
 }
 
