@@ -98,7 +98,8 @@ bool LoadLispFile(CStdStr path, signed char load, signed char loadAll)
     // purpose: such a host replaces a package by loading it again.
     if (!load && RemovingTsLISP())
     {
-        QueueWithPrompt(ConcatenateLisp(L"(qz-unload-rpk \"", CStdStr(split.Name()), L"\")"));
+        QueueWithPrompt(
+            ConcatenateLisp(L"(qz-unload-rpk \"", CStdStr(EscapeQuotes(std::wstring(split.Name()))), L"\")"));
         return true;
     }
     if (gbOrreryLoaded)
