@@ -3,7 +3,7 @@
 //
 // Errors, endless recursion, exhausted memory, calls of the debugger and jumps to nowhere all end in one line
 // of text, and the next evaluation finds Lisp in order. What Lisp cannot be kept from: code that turns
-// interrupts off and never ends.
+// interrupts off and never ends, and code that itself reads or compares data nested millions of levels deep.
 #pragma once
 
 #include <cstddef>
