@@ -9,6 +9,7 @@
 #include "module/EntryPoint.h"
 #include "ui/Settings.h"
 #include "ui/model/LoadBatch.h"
+#include "ui/platform/Platform.h"
 
 @implementation ModrigController
 
@@ -48,7 +49,7 @@
 - (void)showModrigDialog
 {
     ModrigUtils::PopulateLoadedApps();
-    NSOpenPanel* panel = [NSOpenPanel openPanel];
+    NSOpenPanel* panel = ModrigPlatform::MakeOpenPanel();
     [self setupOpenPanel:panel];
     @try
     {

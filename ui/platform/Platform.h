@@ -5,6 +5,9 @@
 
 namespace ModrigPlatform
 {
+// The file panel for a run of the dialog.
+NSOpenPanel* MakeOpenPanel();
+
 // The file panel may be shared with the rest of the program: its own state is kept before the dialog changes
 // it, and given back afterwards.
 void RememberPanel(NSOpenPanel* panel);

@@ -42,6 +42,11 @@ NSString* originalOf(NSString* path)
 }
 } // namespace
 
+NSOpenPanel* MakeOpenPanel()
+{
+    return [NSOpenPanel openPanel];
+}
+
 // Every panel is a new one here.
 void RememberPanel(NSOpenPanel*)
 {

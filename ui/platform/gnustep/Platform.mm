@@ -177,6 +177,13 @@ void joinKeyViews(NSOpenPanel* panel, NSView* view)
 }
 } // namespace
 
+// A new one: +openPanel answers one object for the whole program, and its window is drawn out of place when
+// it has shown an accessory view once and is to show one again.
+NSOpenPanel* MakeOpenPanel()
+{
+    return [[[NSOpenPanel alloc] init] autorelease];
+}
+
 void RememberPanel(NSOpenPanel* panel)
 {
     NSView* panelView = [panel contentView];
