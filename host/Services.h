@@ -1,7 +1,7 @@
 // The parts of the running host, as the SDK's free functions and the parts themselves find one another.
 //
-// `Host` (host/app) makes the parts in an order, stores them here and takes them out again when it ends. A null
-// pointer says that the part is not running; only code that can run outside of a session needs to ask.
+// `Host` (host/app) makes the parts in an order, stores them here and takes them out again when it ends. A
+// null pointer says that the part is not running; only code that can run outside of a session needs to ask.
 #pragma once
 
 namespace tessel

@@ -17,7 +17,8 @@ struct FileIdentity
     dev_t device = 0;
     ino_t inode = 0;
 
-    auto operator<=>(const FileIdentity&) const = default;
+    // clang-tidy 14 takes the comparison with 0 inside for a null pointer.
+    auto operator<=>(const FileIdentity&) const = default; // NOLINT(modernize-use-nullptr)
 };
 
 class RegularFile

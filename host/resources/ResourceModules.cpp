@@ -15,7 +15,7 @@ namespace tessel
 namespace
 {
 constexpr wchar_t kSeparator = L'/';
-constexpr std::uint64_t kLargestFile = 64 * 1024 * 1024;
+constexpr std::uint64_t kLargestFile = std::uint64_t{64} << 20;
 // Handles rise from here; smaller values could be taken for the ids of texts.
 constexpr std::uintptr_t kHandlesBegin = 0x10000;
 
@@ -64,9 +64,14 @@ std::vector<std::wstring> ResourceModules::placesOf(const std::wstring& name) co
     if (name.starts_with(kSeparator))
         return {name};
     std::vector<std::wstring> places;
-    for (const std::wstring& folder : {resourcesOf(services().callingApplication->path()), mHostFolder})
-        if (!folder.empty())
-            places.push_back(folder + (folder.ends_with(kSeparator) ? L"" : L"/") + name);
+    for (std::wstring place : {resourcesOf(services().callingApplication->path()), mHostFolder})
+    {
+        if (place.empty())
+            continue;
+        if (!place.ends_with(kSeparator))
+            place += kSeparator;
+        places.push_back(place += name);
+    }
     return places;
 }
 

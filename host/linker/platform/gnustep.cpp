@@ -59,9 +59,11 @@ bool mustStayMapped(void* library)
     const link_map* map = linkMapOf(library);
     if (!map)
         return true;
-    const std::string_view names(reinterpret_cast<const char*>(dynamicEntry(*map, DT_STRTAB)),
-                                 dynamicEntry(*map, DT_STRSZ));
-    return names.find(kRegistration) != names.npos;
+    const auto* names = reinterpret_cast<const char*>(dynamicEntry(*map, DT_STRTAB));
+    if (!names)
+        return true;
+    return std::string_view(names, dynamicEntry(*map, DT_STRSZ)).find(kRegistration) !=
+           std::string_view::npos;
 }
 
 std::string firstUnresolvedFunction(void* library)
@@ -71,6 +73,8 @@ std::string firstUnresolvedFunction(void* library)
         return {};
     const auto* symbols = reinterpret_cast<const ElfW(Sym)*>(dynamicEntry(*map, DT_SYMTAB));
     const auto* names = reinterpret_cast<const char*>(dynamicEntry(*map, DT_STRTAB));
+    if (!symbols || !names)
+        return {};
     for (std::uint32_t i = 1; i < endOfReferences(*map); ++i) // the first symbol is no symbol
         if (const char* name = names + symbols[i].st_name; isMissing(library, symbols[i], name))
             return name;
