@@ -41,7 +41,7 @@
 
 - (void)setupOpenPanel:(NSOpenPanel*)panel
 {
-    ModrigPlatform::RememberPanel(panel);
+    ModrigPlatform::TakePanel(panel);
     mOpenPanel = panel;
     [panel setDelegate:(id)self];
     [panel setAllowsMultipleSelection:YES];
@@ -59,7 +59,7 @@
     [self onInit];
     [loadedAppsTableView sizeLastColumnToFit];
     [historyListTableView sizeLastColumnToFit];
-    ModrigPlatform::CompletePanel(panel, [self view]);
+    ModrigPlatform::UpdateKeyViews(panel);
 }
 
 - (void)cleanOpenPanel:(NSOpenPanel*)panel
@@ -68,7 +68,7 @@
     [self onFinish];
     [panel setAccessoryView:nil];
     [helpButton removeFromSuperview];
-    ModrigPlatform::RestorePanel(panel);
+    ModrigPlatform::GiveBackPanel(panel);
 }
 
 - (TsOCFileFilter*)selectedFilter

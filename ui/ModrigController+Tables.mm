@@ -93,6 +93,14 @@ bool hasSelection(NSArrayController* rows)
     return [[rows objectAtIndex:static_cast<NSUInteger>(row)] unloadable];
 }
 
+- (void)tabView:(NSTabView*)tabView didSelectTabViewItem:(NSTabViewItem*)item
+{
+    (void)item;
+    [loadedAppsTableView sizeLastColumnToFit];
+    [historyListTableView sizeLastColumnToFit];
+    ModrigPlatform::UpdateKeyViews([tabView window]);
+}
+
 - (IBAction)onLoadFromHistory:(id)sender
 {
     (void)sender;

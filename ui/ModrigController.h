@@ -62,6 +62,8 @@
 - (void)tableViewSelectionDidChange:(NSNotification*)notification;
 - (BOOL)tableView:(NSTableView*)table shouldSelectRow:(NSInteger)row;
 
+- (void)tabView:(NSTabView*)tabView didSelectTabViewItem:(NSTabViewItem*)item;
+
 - (IBAction)onLoadFromHistory:(id)sender;
 - (IBAction)onDoubleClickHistoryTableView:(id)sender;
 - (IBAction)onAddToStartupSuiteFromHistory:(id)sender;

@@ -17,7 +17,7 @@
 - (void)doInit;
 - (void)doClean;
 
-// The control with the segments Add and Remove.
+// The control with the segments Add and Remove; the keys Insert and Delete do the same.
 - (IBAction)onSegmentedButton:(id)sender;
 - (void)onAdd;
 - (void)onRemove;

@@ -19,6 +19,12 @@ namespace
 {
 constexpr NSInteger kAddSegment = 0;
 constexpr NSInteger kRemoveSegment = 1;
+
+unichar keyOf(NSEvent* event)
+{
+    NSString* characters = [event charactersIgnoringModifiers];
+    return [characters length] == 1 ? [characters characterAtIndex:0] : 0;
+}
 } // namespace
 
 @implementation ModrigStartupSuitController
@@ -57,6 +63,22 @@ constexpr NSInteger kRemoveSegment = 1;
         return [self onRemove];
     default:
         return;
+    }
+}
+
+// What the segmented control does, for the keyboard.
+- (void)keyDown:(NSEvent*)event
+{
+    switch (keyOf(event))
+    {
+    case NSInsertFunctionKey:
+        return [self onAdd];
+    case NSDeleteFunctionKey:
+    case NSDeleteCharacter:
+    case NSBackspaceCharacter:
+        return [self onRemove];
+    default:
+        return [super keyDown:event];
     }
 }
 

@@ -8,19 +8,19 @@ namespace ModrigPlatform
 // The file panel for a run of the dialog.
 NSOpenPanel* MakeOpenPanel();
 
-// The file panel may be shared with the rest of the program: its own state is kept before the dialog changes
-// it, and given back afterwards.
-void RememberPanel(NSOpenPanel* panel);
-void RestorePanel(NSOpenPanel* panel);
+// Makes the panel ready to become the dialog. It may be shared with the rest of the program: its own state is
+// kept, and given back afterwards.
+void TakePanel(NSOpenPanel* panel);
+void GiveBackPanel(NSOpenPanel* panel);
 
 // Makes the panel's accessory view as wide as the panel, at any size of it.
 void FitAccessoryView(NSView* view);
 
-// What is left to do when the dialog's view is in its place.
-void CompletePanel(NSOpenPanel* panel, NSView* view);
+// Lets Tab walk through everything that the window shows now.
+void UpdateKeyViews(NSWindow* window);
 
-// The folder that the panel shows, moving it to another one, and the paths selected in it. A folder that is only walked through is not
-// selected.
+// The folder that the panel shows, moving it to another one, and the paths selected in it. A folder that is
+// only walked through is not selected.
 NSString* ShownFolder(NSOpenPanel* panel);
 void ShowFolder(NSOpenPanel* panel, NSString* folder);
 NSArray* SelectedPaths(NSOpenPanel* panel);

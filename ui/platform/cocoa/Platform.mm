@@ -48,10 +48,10 @@ NSOpenPanel* MakeOpenPanel()
 }
 
 // Every panel is a new one here.
-void RememberPanel(NSOpenPanel*)
+void TakePanel(NSOpenPanel*)
 {
 }
-void RestorePanel(NSOpenPanel*)
+void GiveBackPanel(NSOpenPanel*)
 {
 }
 void CompletePanel(NSOpenPanel*, NSView*)

@@ -96,7 +96,10 @@ struct ButtonState
     SEL action;
     NSRect frame;
     BOOL hidden;
+    NSUInteger resizing;
 };
+
+constexpr CGFloat kPanelMargin = 8;
 
 // Everything on the panel's button row: it is the dialog's while that is open.
 constexpr NSInteger kButtonTags[] = {NSFileHandlingPanelOKButton, NSFileHandlingPanelCancelButton,
@@ -106,8 +109,8 @@ ButtonState gButtons[std::size(kButtonTags)];
 
 ButtonState stateOf(NSButton* button)
 {
-    return {button,          [[button title] retain], [button target],
-            [button action], [button frame],          [button isHidden]};
+    return {button,         [[button title] retain], [button target],          [button action],
+            [button frame], [button isHidden],       [button autoresizingMask]};
 }
 
 void giveBack(const ButtonState& state)
@@ -117,6 +120,7 @@ void giveBack(const ButtonState& state)
     [state.button setAction:state.action];
     [state.button setFrame:state.frame];
     [state.button setHidden:state.hidden];
+    [state.button setAutoresizingMask:state.resizing];
     [state.title release];
 }
 
@@ -161,19 +165,16 @@ void allowFilesOnly(void* panel)
     [static_cast<NSOpenPanel*>(panel) setCanChooseDirectories:NO];
 }
 
-// What leads to other disks is of no use among a host's applications.
-void hideUnusedButtons(NSView* panelView)
+// What leads to other disks is of no use among a host's applications. The first of those buttons keeps a
+// place at the start of the row.
+void clearButtonRow(NSView* panelView)
 {
     for (const NSInteger tag :
          {NSFileHandlingPanelHomeButton, NSFileHandlingPanelDiskButton, NSFileHandlingPanelDiskEjectButton})
         [[panelView viewWithTag:tag] setHidden:YES];
-}
-
-// The order in which Tab walks: through the panel's own parts, then through the dialog's view and back.
-void joinKeyViews(NSOpenPanel* panel, NSView* view)
-{
-    (void)panel;
-    (void)view;
+    NSButton* first = [panelView viewWithTag:NSFileHandlingPanelHomeButton];
+    [first setFrameOrigin:NSMakePoint(kPanelMargin, NSMinY([first frame]))];
+    [first setAutoresizingMask:NSViewMaxXMargin];
 }
 } // namespace
 
@@ -184,14 +185,16 @@ NSOpenPanel* MakeOpenPanel()
     return [[[NSOpenPanel alloc] init] autorelease];
 }
 
-void RememberPanel(NSOpenPanel* panel)
+void TakePanel(NSOpenPanel* panel)
 {
     NSView* panelView = [panel contentView];
     for (std::size_t index = 0; index < std::size(kButtonTags); ++index)
         gButtons[index] = stateOf([panelView viewWithTag:kButtonTags[index]]);
+    persist(allowFilesOnly, panel);
+    clearButtonRow(panelView);
 }
 
-void RestorePanel(NSOpenPanel* panel)
+void GiveBackPanel(NSOpenPanel* panel)
 {
     [panel setDelegate:nil];
     for (const ButtonState& state : gButtons)
@@ -204,11 +207,10 @@ void FitAccessoryView(NSView* view)
     [view setAutoresizingMask:[view autoresizingMask] | NSViewWidthSizable];
 }
 
-void CompletePanel(NSOpenPanel* panel, NSView* view)
+// The toolkit works it out once, and not anew when another tab shows.
+void UpdateKeyViews(NSWindow* window)
 {
-    persist(allowFilesOnly, panel);
-    hideUnusedButtons([panel contentView]);
-    joinKeyViews(panel, view);
+    [window recalculateKeyViewLoop];
 }
 
 NSString* ShownFolder(NSOpenPanel* panel)

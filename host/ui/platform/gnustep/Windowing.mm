@@ -8,6 +8,7 @@
 #include <dlfcn.h>
 
 #include "host/ui/platform/gnustep/DisplayProbe.h"
+#include "host/ui/platform/gnustep/Theme.h"
 
 namespace tessel::windowing
 {
@@ -80,8 +81,6 @@ void chooseLook()
     [look setObject:@"NSMacintoshInterfaceStyle"
              forKey:@"NSScrollViewInterfaceStyle"]; // scrollers on the right
     [look setObject:@"NSMacintoshInterfaceStyle" forKey:@"NSBrowserInterfaceStyle"];
-    if (NSString* theme = themePath())
-        [look setObject:theme forKey:@"GSTheme"];
     // Without a window manager nobody else draws title bars, and the toolkit would wait for what never comes.
     if (!probeDisplay().hasWindowManager)
         [look setObject:@"NO" forKey:@"GSBackHandlesWindowDecorations"];
@@ -90,6 +89,7 @@ void chooseLook()
 
 void completeLook()
 {
+    useTheme(themePath());
     NSArray* fonts = [[NSFontManager sharedFontManager] availableFonts];
     if (![fonts containsObject:@"Inter-Regular"] || ![fonts containsObject:@"Inter-Bold"])
         return;
