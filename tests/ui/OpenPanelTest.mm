@@ -266,7 +266,7 @@ TEST_F(OpenPanel, LoadsWithReturnAndClosesWithEscape)
     file("one.zmb");
     const ModalSteps steps({[this]
                             {
-                                mPanel = runningPanel();
+                                mPanel = [runningPanel() retain];
                                 click({L"one.zmb"});
                             },
                             [this] { pressKey(mPanel, @"\r"); },
@@ -278,5 +278,6 @@ TEST_F(OpenPanel, LoadsWithReturnAndClosesWithEscape)
                             }});
     ModrigUtils::RunModrigDialog();
     EXPECT_FALSE([mPanel isVisible]);
+    [mPanel release];
     EXPECT_THAT(lines(), ElementsAre(Message(8, L"one.zmb")));
 }
