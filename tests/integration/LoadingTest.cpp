@@ -3,6 +3,8 @@
 
 #include <gmock/gmock.h>
 
+#include "module/Globals.h"
+
 using testing::Contains;
 using testing::ElementsAre;
 using testing::IsEmpty;
@@ -120,6 +122,30 @@ TEST_F(Loading, OfAPathWithQuotesRunsNoneOfIt)
     std::filesystem::copy_file(folder / "plain.lsp", folder / name);
     EXPECT_EQ(load(folder / name), kLoaded);
     EXPECT_EQ(said(), std::string("plain.lsp\n") + kReady);
+}
+
+TEST_F(Loading, OfALispFileIsDoneAtOnceWithTheLispEnvironment)
+{
+    gbOrreryLoaded = true; // as other code of the process sets it
+    const auto file = lisp("a file.lsp");
+    dialog(
+        [&]
+        {
+            EXPECT_EQ(ModrigUnderTest::load(wide(file), false, false), kLoaded);
+            EXPECT_EQ(said(), "a file.lsp\n") << "nothing is queued, not even the prompt";
+        });
+    EXPECT_EQ(said(), "");
+    EXPECT_THAT(ModrigUnderTest::loaded(), ElementsAre(wide(file)));
+}
+
+TEST_F(Loading, OfALispFileThatIsMissingFailsWithTheLispEnvironment)
+{
+    gbOrreryLoaded = true;
+    EXPECT_EQ(load("/nowhere/a.lsp", true), kNotLoaded);
+    EXPECT_EQ(said(), "Cannot load \"/nowhere/a.lsp\": No such file or directory.\n"
+                      "Message: “/nowhere/a.lsp” could not be loaded.\n");
+    EXPECT_THAT(ModrigUnderTest::loaded(), IsEmpty());
+    EXPECT_THAT(ModrigUnderTest::history(), IsEmpty());
 }
 
 TEST_F(Loading, AddsNothingToTheListsFromTheStartupSuite)
