@@ -327,6 +327,7 @@ TEST_F(Remote, ACopyThatCannotBeMadeIsAFailure)
 {
     offer("/tool.lsp", httpAnswer("200 OK", "1"));
     const fs::path copy = tessel::toUtf8(host.fetch(server.url(L"/tool.lsp")).path);
+    ASSERT_TRUE(copy.is_absolute()) << "the folder would be made where the test runs";
     fs::remove(copy);
     fs::create_directories(copy / "in the way");
     expectFailure("/tool.lsp", "the local copy " + copy.string() + " cannot be made: ");
