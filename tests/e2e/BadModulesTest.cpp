@@ -16,6 +16,12 @@ struct BadModule
     const char* reason; // how the sentence goes on
 };
 
+// Names the case in the list of tests; without it the name would hold addresses.
+void PrintTo(const BadModule& module, std::ostream* stream)
+{
+    *stream << module.file;
+}
+
 std::string fixture(const std::string& file)
 {
     return std::string(FIXTURE_MODULES) + "/" + file;

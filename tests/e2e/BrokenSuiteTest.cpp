@@ -71,6 +71,12 @@ struct BrokenModule
     const char* saidBefore = ""; // by the module itself
 };
 
+// Names the case in the list of tests; without it the name would hold addresses.
+void PrintTo(const BrokenModule& module, std::ostream* stream)
+{
+    *stream << module.file;
+}
+
 class BrokenModules : public BrokenSuite, public testing::WithParamInterface<BrokenModule>
 {
 };
@@ -79,12 +85,18 @@ std::string nameOf(const testing::TestParamInfo<BrokenModule>& info)
 {
     return fs::path(info.param.file).stem();
 }
+
 struct BrokenLisp
 {
     const char* file;
     const char* reason; // behind the path
     const char* saidBefore = "";
 };
+
+void PrintTo(const BrokenLisp& lisp, std::ostream* stream)
+{
+    *stream << lisp.file;
+}
 
 class BrokenLispFiles : public BrokenSuite, public testing::WithParamInterface<BrokenLisp>
 {
@@ -94,7 +106,6 @@ std::string nameOfLisp(const testing::TestParamInfo<BrokenLisp>& info)
 {
     return fs::path(info.param.file).stem();
 }
-
 } // namespace
 
 TEST_P(BrokenModules, AreToldWithTheReasonAndByModrig)

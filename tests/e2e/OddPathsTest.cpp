@@ -17,6 +17,12 @@ struct OddName
     std::string name;
 };
 
+// Names the case in the list of tests; without it the name would hold addresses.
+void PrintTo(const OddName& odd, std::ostream* stream)
+{
+    *stream << odd.test;
+}
+
 class OddPaths : public testing::TestWithParam<OddName>
 {
 protected:

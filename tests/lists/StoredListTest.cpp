@@ -21,6 +21,12 @@ struct ListUnderTest
     void (*write)();
 };
 
+// Names the case in the list of tests; without it the name would hold addresses.
+void PrintTo(const ListUnderTest& tested, std::ostream* stream)
+{
+    *stream << testing::PrintToString(std::wstring(tested.name));
+}
+
 class StoredList : public ModuleTest, public testing::WithParamInterface<ListUnderTest>
 {
 protected:

@@ -3,6 +3,7 @@
 #include "tests/module/ModuleTest.h"
 
 using namespace ModrigUtils;
+using namespace std::string_literals;
 using testing::ElementsAre;
 using testing::IsEmpty;
 
@@ -14,7 +15,7 @@ protected:
     static const std::wstring& printed() { return host().output.printed; }
 };
 
-class HelpTopics : public ModuleTest, public testing::WithParamInterface<std::pair<int, const wchar_t*>>
+class HelpTopics : public ModuleTest, public testing::WithParamInterface<std::pair<int, std::wstring>>
 {
 };
 } // namespace
@@ -149,8 +150,8 @@ TEST_P(HelpTopics, OpenThePageOfTheDialogInTheHostsOwnBook)
 }
 
 INSTANTIATE_TEST_SUITE_P(EveryTopic, HelpTopics,
-                         testing::Values(std::pair{0, L"load_unload_applications_dialog"},
-                                         std::pair{1, L"startup_suite_dialog"},
-                                         std::pair{2, L"StandardFileSelectionDialogs"},
-                                         std::pair{3, L"load_unload_applications_dialog"},
-                                         std::pair{-1, L"load_unload_applications_dialog"}));
+                         testing::Values(std::pair{0, L"load_unload_applications_dialog"s},
+                                         std::pair{1, L"startup_suite_dialog"s},
+                                         std::pair{2, L"StandardFileSelectionDialogs"s},
+                                         std::pair{3, L"load_unload_applications_dialog"s},
+                                         std::pair{-1, L"load_unload_applications_dialog"s}));
