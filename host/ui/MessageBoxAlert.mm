@@ -23,6 +23,7 @@ void runAlert(const wchar_t* text, unsigned style)
     [alert setMessageText:@"Tessel"];
     [alert setInformativeText:wcharToNSString(text)];
     [alert setAlertStyle:style & MB_ICONEXCLAMATION ? NSWarningAlertStyle : NSInformationalAlertStyle];
+    [alert setIcon:[NSApp applicationIconImage]];
     [alert addButtonWithTitle:@"OK"];
     [alert runModal];
 }
