@@ -1,0 +1,111 @@
+// Loading files that are chosen in the panel.
+#include "tests/e2e_dialogs/DialogTest.h"
+
+using testing::HasSubstr;
+using testing::Not;
+
+class DialogBrowser : public DialogTest
+{
+};
+
+TEST_F(DialogBrowser, LoadsTwoFilesThatAreSelectedTogether)
+{
+    writeLisp("a.lsp");
+    writeLisp("b.lsp");
+    open();
+    click(places::kAddToHistory);
+    click(places::file(0));
+    mScreen.clickHolding("shift", mDialog, places::file(1));
+    shoot("selected");
+    click(places::kLoad);
+    EXPECT_TRUE(prints("2 applications were loaded."));
+    shoot("loaded");
+    click(places::kHistoryTab);
+    shoot("history");
+    const std::string output = closeAndEnd();
+    EXPECT_THAT(output, HasSubstr("a.lsp runs"));
+    EXPECT_THAT(output, HasSubstr("b.lsp runs"));
+    EXPECT_THAT(output, HasSubstr(listedIn("a.lsp", files())));
+    EXPECT_THAT(output, HasSubstr(listedIn("b.lsp", files())));
+    EXPECT_EQ(stored("History"), "NumHistory = 2\n1History = " + (files() / "a.lsp").string() +
+                                     "\n2History = " + (files() / "b.lsp").string() + "\n");
+}
+
+TEST_F(DialogBrowser, ReturnLoadsTheFileWhoseNameIsTyped)
+{
+    writeLisp("typed.lsp");
+    open();
+    typeName("typed.lsp");
+    shoot("typed");
+    mScreen.key("Return");
+    EXPECT_TRUE(prints(wasLoaded("typed.lsp")));
+    shoot("loaded");
+    const std::string output = closeAndEnd();
+    EXPECT_THAT(output, HasSubstr("typed.lsp runs"));
+    EXPECT_THAT(output, HasSubstr(listedIn("typed.lsp", files())));
+}
+
+TEST_F(DialogBrowser, ReturnLoadsTheFileThatIsSelected)
+{
+    writeLisp("chosen.lsp");
+    open();
+    click(places::file(0));
+    mScreen.key("Return");
+    EXPECT_TRUE(prints(wasLoaded("chosen.lsp")));
+    EXPECT_THAT(closeAndEnd(), HasSubstr("chosen.lsp runs"));
+}
+
+TEST_F(DialogBrowser, SaysThatAFileIsLoadedAlready)
+{
+    copySample("gears.omp");
+    open();
+    click(places::file(0));
+    click(places::kLoad);
+    EXPECT_TRUE(prints(wasLoaded("gears.omp")));
+    click(places::kLoad);
+    EXPECT_TRUE(prints("gears.omp is already loaded.\n"));
+    shoot("already-loaded");
+    const std::string output = closeAndEnd();
+    const std::string listed = listedIn("gears.omp", files());
+    EXPECT_THAT(output, HasSubstr(listed));
+    EXPECT_EQ(output.find(listed), output.rfind(listed)) << "one entry: " << output;
+}
+
+TEST_F(DialogBrowser, StopsAtTheFileThatCannotBeLoaded)
+{
+    writeLisp("a.lsp");
+    mSession.folder().write("files/b.zmb", "no module");
+    writeLisp("c.lsp");
+    open();
+    click(places::file(0));
+    mScreen.clickHolding("shift", mDialog, places::file(1));
+    mScreen.clickHolding("shift", mDialog, places::file(2));
+    shoot("selected");
+    click(places::kLoad);
+    dismissMessageBox();
+    shoot("stopped");
+    const std::string output = closeAndEnd();
+    EXPECT_THAT(output, HasSubstr(listedIn("a.lsp", files())));
+    EXPECT_THAT(output, HasSubstr("a.lsp runs"));
+    EXPECT_THAT(output, HasSubstr("b.zmb\" is not loaded: "));
+    EXPECT_THAT(output, Not(HasSubstr(listedIn("b.zmb", files()))));
+    EXPECT_THAT(output, Not(HasSubstr("c.lsp")));
+}
+
+TEST_F(DialogBrowser, ShowsTheFilesOfTheChosenTypeOnly)
+{
+    copySample("gears.omp");
+    writeLisp("z.lsp");
+    open();
+    mScreen.choose(mDialog, places::kFileTypes, {places::kFileTypes.x, places::kFileTypes.y + 3 * 26});
+    shoot("lisp-only");
+    click(places::file(0)); // where gears.omp has been
+    click(places::kLoad);
+    EXPECT_TRUE(prints(wasLoaded("z.lsp")));
+    mScreen.choose(mDialog, places::kFileTypes, {places::kFileTypes.x, places::kFileTypes.y - 3 * 26});
+    shoot("all-types");
+    click(places::file(0));
+    click(places::kLoad);
+    EXPECT_TRUE(prints(wasLoaded("gears.omp")));
+    EXPECT_THAT(closeAndEnd(), HasSubstr("z.lsp runs"));
+}

@@ -1,0 +1,53 @@
+// Closing the dialog, and what it remembers.
+#include "tests/e2e_dialogs/DialogTest.h"
+
+using testing::HasSubstr;
+
+class DialogClosing : public DialogTest
+{
+};
+
+TEST_F(DialogClosing, ByEscapeLeavesAHostThatGoesOn)
+{
+    open();
+    mScreen.key("Escape");
+    EXPECT_TRUE(mScreen.waitUntilGone(kDialog));
+    mHost->type("VERSION");
+    EXPECT_THAT(end(), HasSubstr("Command: VERSION\nTessel R21"));
+}
+
+TEST_F(DialogClosing, RemembersTheTabAndTheCheckBox)
+{
+    open();
+    click(places::kAddToHistory);
+    click(places::kHistoryTab);
+    shoot("changed");
+    closeAndEnd();
+    EXPECT_EQ(storedSetting("SaveHistory"), "1\n");
+    EXPECT_EQ(storedSetting("LastTab"), "1\n");
+    open();
+    click(places::kAddToHistory);
+    click(places::kLoadedTab);
+    closeAndEnd();
+    EXPECT_EQ(storedSetting("SaveHistory"), "0\n");
+    EXPECT_EQ(storedSetting("LastTab"), "0\n");
+}
+
+TEST_F(DialogClosing, RemembersTheFolderOfTheFilesThatWereLoaded)
+{
+    mSession.folder().write("files/deeper/inner.lsp", "(write-line \"inner runs\")\n");
+    open();
+    click(places::file(0));                             // the folder
+    click({places::file(0).x + 60, places::file(0).y}); // apart, so that it is no double-click
+    shoot("walked");
+    click(places::kLoad);
+    EXPECT_TRUE(prints(wasLoaded("inner.lsp")));
+    closeAndEnd();
+    EXPECT_EQ(storedSetting("InitialPath"), (files() / "deeper").string() + "\n");
+    open();
+    shoot("again");
+    click(places::file(0));
+    click(places::kLoad);
+    EXPECT_TRUE(prints(wasLoaded("inner.lsp")));
+    closeAndEnd();
+}

@@ -1,0 +1,178 @@
+#include "tests/e2e_dialogs/DialogTest.h"
+
+#include <algorithm>
+
+using testing::HasSubstr;
+
+namespace
+{
+constexpr char kMessageBox[] = "(Alert|Tessel)";
+constexpr char kDragWindow[] = "Files to drag";
+constexpr Place kDragButton{50, 30};
+
+std::string quoted(const std::string& text)
+{
+    return "\"" + text + "\"";
+}
+
+std::vector<std::string> listCommands(const std::string& list, const std::string& count,
+                                      const std::vector<std::string>& paths)
+{
+    const std::string set = std::string("REGISTRY SET ") + kDialogsKey + "\\" + list + " ";
+    std::vector<std::string> commands = {set + count + " " + std::to_string(paths.size())};
+    for (std::size_t index = 0; index < paths.size(); ++index)
+        commands.push_back(set + std::to_string(index + 1) + list + " " + quoted(paths[index]));
+    return commands;
+}
+} // namespace
+
+DialogTest::DialogTest()
+{
+    mSession.set("DISPLAY", mScreen.display());
+    std::filesystem::create_directories(files());
+    setSetting("InitialPath", files().string());
+}
+
+std::string DialogTest::writeLisp(const std::string& name) const
+{
+    return mSession.folder().write("files/" + name, "(write-line \"" + name + " runs\")\n").string();
+}
+
+std::string DialogTest::copySample(const std::string& name) const
+{
+    std::filesystem::copy(std::filesystem::path(SAMPLES_FOLDER) / name, files() / name);
+    return (files() / name).string();
+}
+
+std::vector<std::string> DialogTest::writeManyLisp(int count) const
+{
+    std::vector<std::string> paths;
+    for (int number = 1; number <= count; ++number)
+        paths.push_back(writeLisp("many" + std::to_string(number) + ".lsp"));
+    return paths;
+}
+
+std::string DialogTest::runQuietly(const std::vector<std::string>& commands) const
+{
+    std::vector<std::string> arguments = {"--safe"};
+    for (const auto& command : commands)
+        arguments.insert(arguments.end(), {"-c", command});
+    const auto result = mSession.start(arguments);
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    return result.output;
+}
+
+void DialogTest::setSetting(const std::string& name, const std::string& value) const
+{
+    runQuietly({std::string("REGISTRY SET ") + kSettingsKey + " " + name + " " + quoted(value)});
+}
+
+void DialogTest::storeHistory(const std::vector<std::string>& paths) const
+{
+    runQuietly(listCommands("History", "NumHistory", paths));
+}
+
+void DialogTest::storeSuite(const std::vector<std::string>& paths) const
+{
+    runQuietly(listCommands("Startup", "NumStartup", paths));
+}
+
+std::string DialogTest::stored(const std::string& list) const
+{
+    const std::string command = std::string("REGISTRY LIST ") + kDialogsKey + "\\" + list;
+    const std::string output = runQuietly({command});
+    const std::string asked = command + "\n";
+    return output.substr(std::min(output.size(), output.find(asked) + asked.size()));
+}
+
+std::string DialogTest::storedSetting(const std::string& name) const
+{
+    const std::string command = std::string("REGISTRY GET ") + kSettingsKey + " " + name;
+    const std::string output = runQuietly({command});
+    const std::string asked = command + "\n";
+    return output.substr(std::min(output.size(), output.find(asked) + asked.size()));
+}
+
+void DialogTest::open()
+{
+    mHost = std::make_unique<Program>(mSession.commandLine({}), mSession.environment(),
+                                      mSession.folder() / "output.txt");
+    openAgain();
+}
+
+void DialogTest::openAgain()
+{
+    mHost->type("MODRIG");
+    mDialog = mScreen.waitForWindow(kDialog);
+    ASSERT_FALSE(mDialog.empty()) << mHost->output();
+    // The name field takes what is typed as soon as the panel runs.
+    shoot("opened");
+}
+
+std::string DialogTest::closeAndEnd()
+{
+    mScreen.key("Escape");
+    EXPECT_TRUE(mScreen.waitUntilGone(kDialog));
+    return end();
+}
+
+std::string DialogTest::end()
+{
+    mHost->type("APPS");
+    mHost->type("QUIT");
+    EXPECT_TRUE(mHost->endsByItself()) << mHost->output();
+    return mHost->output();
+}
+
+void DialogTest::typeName(const std::string& name) const
+{
+    click(places::kName);
+    mScreen.key("ctrl+a");
+    mScreen.text(name);
+}
+
+void DialogTest::shoot(const std::string& step) const
+{
+    const auto* test = testing::UnitTest::GetInstance()->current_test_info();
+    mScreen.shoot(std::string(test->test_suite_name()) + "." + test->name() + "-" + step);
+}
+
+bool DialogTest::prints(const std::string& text) const
+{
+    return comesTrue([&] { return mHost->output().find(text) != std::string::npos; });
+}
+
+void DialogTest::dismissMessageBox() const
+{
+    ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty()) << "no message box";
+    shoot("message-box");
+    mScreen.key("Return");
+    EXPECT_TRUE(mScreen.waitUntilGone(kMessageBox));
+}
+
+void DialogTest::dragFiles(const std::vector<std::string>& paths, Place place,
+                           const std::function<void()>& answer) const
+{
+    std::vector<std::string> arguments = {"/usr/bin/python3", DRAG_SOURCE};
+    arguments.insert(arguments.end(), paths.begin(), paths.end());
+    const Program source(arguments, mScreen.environment(), mSession.folder() / "drag.txt");
+    const std::string window = mScreen.waitForWindow(kDragWindow);
+    ASSERT_FALSE(window.empty()) << source.output();
+    mScreen.drag(window, kDragButton, mDialog, place);
+    shoot("dropped");
+    answer();
+    EXPECT_TRUE(comesTrue([&] { return source.output().find("drag ended") != std::string::npos; }))
+        << source.output();
+}
+
+std::string wasLoaded(const std::string& name)
+{
+    return name + " was loaded.\n";
+}
+
+std::string listedIn(const std::string& name, const std::filesystem::path& folder)
+{
+    std::string line = "  " + name;
+    line.resize(std::max<std::size_t>(line.size(), 26), ' ');
+    return line + " " + folder.string();
+}

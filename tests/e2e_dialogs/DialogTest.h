@@ -1,0 +1,76 @@
+// The real host with its dialog open, in a throwaway profile, on a display of its own.
+#pragma once
+
+#include <functional>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include "tests/e2e/HostProcess.h"
+#include "tests/e2e_dialogs/Places.h"
+#include "tests/e2e_dialogs/Program.h"
+#include "tests/e2e_dialogs/Screen.h"
+#include "tests/e2e_dialogs/Waiting.h"
+
+inline constexpr char kDialog[] = "Load/Unload Applications";
+inline constexpr char kSuiteDialog[] = "Startup Suite";
+inline constexpr char kDialogsKey[] = R"(Software\Tessel\R21\Profiles\Default\Dialogs\Modrig)";
+inline constexpr char kSettingsKey[] = R"(Software\Tessel\R21\Profiles\Default\DialogSettings\Modrig)";
+
+class DialogTest : public testing::Test
+{
+protected:
+    DialogTest();
+
+    // The folder that the dialog opens in, and what lies there: Lisp that prints "<name> runs".
+    std::filesystem::path files() const { return mSession.folder() / "files"; }
+    std::string writeLisp(const std::string& name) const;
+    std::string copySample(const std::string& name) const;
+    std::vector<std::string> writeManyLisp(int count) const;
+
+    // Runs commands in a host that loads nothing, before or after the one with the dialog.
+    std::string runQuietly(const std::vector<std::string>& commands) const;
+    void setSetting(const std::string& name, const std::string& value) const;
+    void storeHistory(const std::vector<std::string>& paths) const;
+    void storeSuite(const std::vector<std::string>& paths) const;
+    // The stored list as REGISTRY LIST shows it.
+    std::string stored(const std::string& list) const;
+    std::string storedSetting(const std::string& name) const;
+
+    // Starts the host, and types MODRIG into it.
+    void open();
+    // Types MODRIG into the running host once more.
+    void openAgain();
+    // Closes the dialog by Escape; answers what the host printed up to its end, with APPS asked last.
+    std::string closeAndEnd();
+    std::string end();
+
+    void click(Place place) const { mScreen.click(mDialog, place); }
+    // Selects a file by its name, which is typed into the panel.
+    void typeName(const std::string& name) const;
+    // Takes a picture: <test>-<step>.png.
+    void shoot(const std::string& step) const;
+    // Waits until the host has printed the text.
+    bool prints(const std::string& text) const;
+    // Waits for a message box and ends it.
+    void dismissMessageBox() const;
+
+    // Drags the files from a program of another toolkit to a place in the dialog.
+    // What the drop leads to may need an answer before that program is told that the drag is over.
+    void dragFiles(
+        const std::vector<std::string>& paths, Place place,
+        const std::function<void()>& answer = [] {}) const;
+
+    Screen mScreen;
+    HostSession mSession;
+    std::unique_ptr<Program> mHost;
+    std::string mDialog;
+};
+
+// What loading a file of `writeLisp` says on the way.
+std::string wasLoaded(const std::string& name);
+// The name and the folder of a path, as APPS lists them.
+std::string listedIn(const std::string& name, const std::filesystem::path& folder);

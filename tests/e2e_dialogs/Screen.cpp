@@ -1,0 +1,134 @@
+#include "tests/e2e_dialogs/Screen.h"
+
+#include <cstdio>
+#include <filesystem>
+#include <stdexcept>
+
+#include <unistd.h>
+
+#include "tests/e2e_dialogs/Waiting.h"
+
+namespace
+{
+// The window manager's close button, from the right edge of the window.
+constexpr int kCloseButtonInward = 11;
+
+constexpr char kPress[] = " mousedown 1 sleep 0.12 mouseup 1 ";
+
+std::string moveTo(const std::string& window, Place place)
+{
+    return " mousemove --window " + window + " " + std::to_string(place.x) + " " + std::to_string(place.y) +
+           " ";
+}
+
+std::string inShellQuotes(const std::string& text)
+{
+    std::string result = "'";
+    for (const char character : text)
+        result += character == '\'' ? std::string("'\\''") : std::string(1, character);
+    return result + "'";
+}
+} // namespace
+
+Screen::Screen()
+{
+    mWindowManager = std::make_unique<Program>(std::vector<std::string>{"openbox"}, environment(),
+                                               mFolder / "window-manager.txt");
+    // It tells so on the root window when it is ready.
+    if (!comesTrue([this]
+                   { return run("xprop -root _NET_SUPPORTING_WM_CHECK").find("# 0x") != std::string::npos; }))
+        throw std::runtime_error("openbox does not start (Debian package openbox)");
+    std::filesystem::create_directories(SCREENSHOTS);
+}
+
+std::vector<std::string> Screen::environment() const
+{
+    std::vector<std::string> variables = {"DISPLAY=" + display(), "HOME=" + mFolder.path().string(),
+                                          "LC_ALL=C.UTF-8"};
+    for (char** variable = environ; *variable; ++variable)
+        if (std::string(*variable).starts_with("PATH="))
+            variables.emplace_back(*variable);
+    return variables;
+}
+
+std::string Screen::run(const std::string& command) const
+{
+    FILE* output = popen(("DISPLAY=" + display() + " " + command + " 2>/dev/null").c_str(), "r");
+    if (!output)
+        throw std::runtime_error("cannot run " + command);
+    std::string text;
+    char piece[256];
+    while (fgets(piece, sizeof piece, output))
+        text += piece;
+    pclose(output);
+    return text;
+}
+
+std::string Screen::window(const std::string& title) const
+{
+    const std::string found = run("xdotool search --onlyvisible --name '^" + title + "$'");
+    return found.substr(0, found.find('\n'));
+}
+
+std::string Screen::waitForWindow(const std::string& title) const
+{
+    std::string found;
+    comesTrue([&] { return !(found = window(title)).empty(); });
+    return found;
+}
+
+bool Screen::waitUntilGone(const std::string& title) const
+{
+    return comesTrue([&] { return window(title).empty(); });
+}
+
+void Screen::click(const std::string& window, Place place) const
+{
+    run("xdotool" + moveTo(window, place) + kPress);
+}
+
+void Screen::clickHolding(const std::string& key, const std::string& window, Place place) const
+{
+    run("xdotool keydown " + key + moveTo(window, place) + kPress + "keyup " + key);
+}
+
+void Screen::doubleClick(const std::string& window, Place place) const
+{
+    run("xdotool" + moveTo(window, place) + kPress + "sleep 0.05" + kPress);
+}
+
+void Screen::drag(const std::string& fromWindow, Place from, const std::string& toWindow, Place to) const
+{
+    const auto step = [](int pixels)
+    {
+        return " sleep 0.1 mousemove_relative " + std::to_string(pixels) + " " + std::to_string(pixels);
+    };
+    run("xdotool" + moveTo(fromWindow, from) + "sleep 0.2 mousedown 1 sleep 0.2" + step(20) + step(30) +
+        moveTo(toWindow, to) + "sleep 0.3" + step(2) + " sleep 0.5 mouseup 1");
+}
+
+void Screen::choose(const std::string& window, Place menu, Place item) const
+{
+    run("xdotool" + moveTo(window, menu) + "mousedown 1 sleep 0.4" + moveTo(window, item) +
+        "sleep 0.2 mouseup 1 sleep 0.2");
+}
+
+void Screen::key(const std::string& name) const
+{
+    run("xdotool key " + name);
+}
+
+void Screen::text(const std::string& text) const
+{
+    run("xdotool type --delay 15 " + inShellQuotes(text));
+}
+
+void Screen::clickCloseButton(const std::string& window, int width) const
+{
+    run("xdotool" + moveTo(window, {width - kCloseButtonInward, 0}) + "mousemove_relative -- 0 -11" + kPress);
+}
+
+void Screen::shoot(const std::string& name) const
+{
+    run("import -window root " + inShellQuotes(std::string(SCREENSHOTS) + "/" + name + ".png"));
+}

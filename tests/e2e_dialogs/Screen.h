@@ -1,0 +1,56 @@
+// A virtual display with a window manager, and the hands and eyes of a person in front of it.
+#pragma once
+
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "tests/e2e_dialogs/Program.h"
+#include "tests/support/TemporaryFolder.h"
+#include "tests/ui/support/VirtualDisplay.h"
+
+// A place in a window, from its left and its upper edge.
+struct Place
+{
+    int x = 0;
+    int y = 0;
+};
+
+class Screen
+{
+public:
+    Screen();
+
+    const std::string& display() const { return mDisplay.name(); }
+    std::vector<std::string> environment() const;
+
+    // The visible window with this title; empty when there is none.
+    std::string window(const std::string& title) const;
+    std::string waitForWindow(const std::string& title) const;
+    bool waitUntilGone(const std::string& title) const;
+
+    // Presses and releases the mouse button, slowly enough for the toolkit.
+    void click(const std::string& window, Place place) const;
+    void clickHolding(const std::string& key, const std::string& window, Place place) const;
+    void doubleClick(const std::string& window, Place place) const;
+    // Presses at one place and releases at another, with time for the drag to be noticed on the way.
+    void drag(const std::string& fromWindow, Place from, const std::string& toWindow, Place to) const;
+
+    // Opens a menu and lets go over one of its items.
+    void choose(const std::string& window, Place menu, Place item) const;
+
+    void key(const std::string& name) const;
+    void text(const std::string& text) const;
+    // The button in the title bar of a window of this width.
+    void clickCloseButton(const std::string& window, int width) const;
+
+    // A picture of the whole screen.
+    void shoot(const std::string& name) const;
+
+private:
+    std::string run(const std::string& command) const;
+
+    TemporaryFolder mFolder;
+    VirtualDisplay mDisplay;
+    std::unique_ptr<Program> mWindowManager;
+};

@@ -1,0 +1,74 @@
+// The Startup Suite dialog over the main one.
+#include "tests/e2e_dialogs/DialogTest.h"
+
+using testing::HasSubstr;
+using testing::Not;
+
+class DialogStartupSuite : public DialogTest
+{
+protected:
+    static constexpr char kAddPanel[] = "Add to Startup Suite";
+
+    void openSuite()
+    {
+        open();
+        click(places::kContents);
+        mSuite = mScreen.waitForWindow(kSuiteDialog);
+        ASSERT_FALSE(mSuite.empty());
+        shoot("suite");
+    }
+
+    void closeSuite()
+    {
+        mScreen.click(mSuite, places::kCloseSuite);
+        EXPECT_TRUE(mScreen.waitUntilGone(kSuiteDialog));
+    }
+
+    std::string mSuite;
+};
+
+TEST_F(DialogStartupSuite, TakesAFileThatTheNextStartLoads)
+{
+    const std::string file = writeLisp("suite.lsp");
+    openSuite();
+    mScreen.click(mSuite, places::kAdd);
+    const std::string panel = mScreen.waitForWindow(kAddPanel);
+    ASSERT_FALSE(panel.empty());
+    mScreen.text(file); // takes the panel to the folder
+    mScreen.click(panel, places::kFirstFileToAdd);
+    shoot("selected");
+    mScreen.key("Return");
+    EXPECT_TRUE(mScreen.waitUntilGone(kAddPanel));
+    shoot("added");
+    closeSuite();
+    EXPECT_THAT(closeAndEnd(), HasSubstr("suite.lsp runs"));
+    EXPECT_EQ(stored("Startup"), "NumStartup = 1\n1Startup = " + file + "\n");
+    EXPECT_THAT(mSession.run({"VERSION"}).output, HasSubstr("suite.lsp runs"));
+}
+
+TEST_F(DialogStartupSuite, LosesAFileThatTheNextStartDoesNotLoad)
+{
+    const std::string first = writeLisp("first.lsp");
+    const std::string second = writeLisp("second.lsp");
+    storeSuite({first, second});
+    openSuite();
+    mScreen.click(mSuite, places::kFirstSuiteRow);
+    shoot("selected");
+    mScreen.click(mSuite, places::kRemove);
+    shoot("removed");
+    closeSuite();
+    closeAndEnd();
+    EXPECT_EQ(stored("Startup"), "NumStartup = 1\n1Startup = " + second + "\n");
+    const std::string output = mSession.run({"VERSION"}).output;
+    EXPECT_THAT(output, HasSubstr("second.lsp runs"));
+    EXPECT_THAT(output, Not(HasSubstr("first.lsp")));
+}
+
+TEST_F(DialogStartupSuite, IsClosedByEscapeWithTheMainDialogLeftOpen)
+{
+    openSuite();
+    mScreen.key("Escape");
+    EXPECT_TRUE(mScreen.waitUntilGone(kSuiteDialog));
+    EXPECT_FALSE(mScreen.window(kDialog).empty());
+    closeAndEnd();
+}

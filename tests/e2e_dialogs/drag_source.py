@@ -1,0 +1,23 @@
+"""A small window at the left upper corner whose button drags the files of the command line."""
+import pathlib
+import sys
+
+import gi
+
+gi.require_version("Gdk", "3.0")
+gi.require_version("Gtk", "3.0")
+from gi.repository import Gdk, Gtk  # noqa: E402
+
+uris = [pathlib.Path(name).resolve().as_uri() for name in sys.argv[1:]]
+window = Gtk.Window(title="Files to drag")
+window.set_default_size(120, 60)
+window.move(20, 20)
+button = Gtk.Button(label="Drag me")
+button.drag_source_set(Gdk.ModifierType.BUTTON1_MASK, [], Gdk.DragAction.COPY)
+button.drag_source_add_uri_targets()
+button.connect("drag-data-get", lambda widget, context, data, info, time: data.set_uris(uris))
+button.connect("drag-end", lambda widget, context: print("drag ended", flush=True))
+window.add(button)
+window.connect("destroy", Gtk.main_quit)
+window.show_all()
+Gtk.main()
