@@ -84,6 +84,8 @@ NSTextField* makeLabel(NSString* text)
 - (BOOL)panel:(id)sender shouldShowFilename:(NSString*)path
 {
     (void)sender;
+    if ([mFilters count] == 0)
+        return YES;
     for (NSString* extension : tsuiEach<NSString*>([[mFilters objectAtIndex:mChosen] fileExtensions]))
         if ([[path pathExtension] caseInsensitiveCompare:extension] == NSOrderedSame)
             return YES;
@@ -143,13 +145,11 @@ NSTextField* makeLabel(NSString* text)
 {
     NSOpenPanel* panel = tessel::windowing::makeOpenPanel();
     [self prepare:panel];
-    TsOCFileTypeChooser* chooser = nil;
+    TsOCFileTypeChooser* chooser = [[[TsOCFileTypeChooser alloc] initWithPanel:panel
+                                                                       filters:mFileFilters] autorelease];
+    [panel setDelegate:(id)chooser];
     if ([mFileFilters count])
-    {
-        chooser = [[[TsOCFileTypeChooser alloc] initWithPanel:panel filters:mFileFilters] autorelease];
-        [panel setDelegate:(id)chooser];
         [panel setAccessoryView:[chooser view]];
-    }
     const bool chosen = [panel runModal] == NSOKButton;
     [mSelectedPathes release];
     mSelectedPathes = [(chosen ? tessel::windowing::chosenPaths(panel) : [NSArray array]) copy];

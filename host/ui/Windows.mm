@@ -16,6 +16,7 @@ void prepare()
     [NSApplication sharedApplication];
     tessel::windowing::completeLook();
     tessel::windowing::acceptFileDrops();
+    tessel::windowing::makeWindowsClosable();
     // The host's own loop waits for the terminal; these two are what the toolkit's would have done first.
     [NSApp finishLaunching];
     [pool drain];

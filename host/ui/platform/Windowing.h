@@ -14,6 +14,8 @@ void chooseLook();
 // After it is made, before the first window.
 void completeLook();
 void acceptFileDrops();
+// Lets every window be closed by its frame: file panels are cancelled then, message boxes answered.
+void makeWindowsClosable();
 
 // Carries out what the screen still has to show.
 void flushScreen();

@@ -133,6 +133,12 @@ void Desktop::clickToo(Point point) const
             " sleep 0.1 keydown Shift mousedown 1 sleep 0.1 mouseup 1 keyup Shift sleep 0.2");
 }
 
+void Desktop::choose(Point popUp, Point choice) const
+{
+    xdotool("mousemove " + place(popUp) + " sleep 0.1 mousedown 1 sleep 0.4 mousemove " + place(choice) +
+            " sleep 0.3 mouseup 1 sleep 0.2");
+}
+
 void Desktop::key(const std::string& keys) const
 {
     xdotool("key --delay 60 " + keys + " sleep 0.1");

@@ -40,6 +40,8 @@ public:
     void doubleClick(Point place) const { press(place, 2); }
     // The same with Shift held down: what is clicked joins the selection.
     void clickToo(Point place) const;
+    // Chooses from a pop-up: the button goes down on it and up on the choice.
+    void choose(Point popUp, Point choice) const;
     // The keyboard: "Return", "alt+2", several separated by spaces.
     void key(const std::string& keys) const;
     // Drags files from a window of another program and drops them.

@@ -46,7 +46,9 @@ void DialogByHand::store(const std::string& key, const std::string& name, const 
 
 std::string DialogByHand::stored(const std::string& key, const std::string& name)
 {
-    return mSession->start({"--safe", "-c", "REGISTRY GET " + key + " " + name}).output;
+    const std::string output = mSession->start({"--safe", "-c", "REGISTRY GET " + key + " " + name}).output;
+    const auto answer = output.find('\n', output.find("REGISTRY GET")) + 1;
+    return output.substr(answer, output.find('\n', answer) - answer);
 }
 
 void DialogByHand::storeHistory(const std::vector<fs::path>& files)

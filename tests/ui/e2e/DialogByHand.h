@@ -22,7 +22,7 @@ inline constexpr char kSettingsKey[] = R"(Software\Tessel\R21\Profiles\Default\D
 namespace places
 {
 inline constexpr Point kFileTypes = {235, 390};
-inline constexpr Point kAddToHistory = {327, 390};
+inline constexpr Point kAddToHistory = {383, 390};
 inline constexpr Point kLoad = {676, 391};
 inline constexpr Point kLoadedTab = {106, 426};
 inline constexpr Point kHistoryTab = {219, 426};
@@ -74,7 +74,7 @@ protected:
     std::filesystem::path lispFile(const std::string& name);
     std::filesystem::path brokenModule(const std::string& name);
 
-    // The registry, with the host not running.
+    // A value of the registry, with the host not running; what is not stored is an empty text.
     void store(const std::string& key, const std::string& name, const std::string& data);
     std::string stored(const std::string& key, const std::string& name);
     void storeHistory(const std::vector<std::filesystem::path>& files);

@@ -20,7 +20,7 @@ namespace
     dup2(nothing, STDERR_FILENO);
     const std::string number = std::to_string(numberPipe);
     execlp("Xvfb", "Xvfb", "-displayfd", number.c_str(), "-screen", "0", "1280x1024x24", "-nolisten", "tcp",
-           static_cast<char*>(nullptr));
+           "-noreset", static_cast<char*>(nullptr));
     _exit(127);
 }
 

@@ -29,6 +29,11 @@ void flushScreen()
 {
 }
 
+// No window of the platform is ended from outside.
+void makeClosable(NSWindow*)
+{
+}
+
 NSOpenPanel* makeOpenPanel()
 {
     return [NSOpenPanel openPanel];

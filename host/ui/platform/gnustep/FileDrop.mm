@@ -11,6 +11,7 @@
 #include "host/ui/platform/Windowing.h"
 #include "host/ui/platform/gnustep/DisplayProbe.h"
 #include "host/ui/platform/gnustep/DropSelection.h"
+#include "host/ui/platform/gnustep/StandIn.h"
 
 // The dragging pasteboard of a drag from another program, as far as a drop target asks it.
 @interface TsDroppedFiles : NSObject
@@ -118,16 +119,6 @@ void resetDragTypes(id server, SEL selector, id window)
     announceDropTarget(device);
 }
 
-// The runtime keeps every method under one type of function; which one it is, its name tells.
-template <class Function> Function standInFor(const char* className, SEL selector, Function replacement)
-{
-    const Method method = class_getInstanceMethod(objc_getClass(className), selector);
-    if (!method)
-        return nullptr;
-    const auto untyped = reinterpret_cast<void*>(replacement);
-    return reinterpret_cast<Function>(
-        reinterpret_cast<void*>(method_setImplementation(method, reinterpret_cast<IMP>(untyped))));
-}
 } // namespace
 
 void acceptFileDrops()

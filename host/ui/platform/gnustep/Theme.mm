@@ -129,7 +129,11 @@ void tessel::windowing::useTheme(NSString* folder)
     NSBundle* bundle = folder ? [NSBundle bundleWithPath:folder] : nil;
     if (!bundle)
         return;
-    [GSTheme setTheme:[[[TesselTheme alloc] initWithBundle:bundle] autorelease]];
+    GSTheme* theme = [[[TesselTheme alloc] initWithBundle:bundle] autorelease];
+    [GSTheme setTheme:theme];
+    // Whenever a user default changes, the toolkit goes back to the theme that the defaults name.
+    [[NSUserDefaults standardUserDefaults] registerDefaults:[NSDictionary dictionaryWithObject:[theme name]
+                                                                                        forKey:@"GSTheme"]];
     NSString* icon = [bundle pathForResource:@"Tessel" ofType:@"png"];
     [NSApp setApplicationIconImage:[[[NSImage alloc] initWithContentsOfFile:icon] autorelease]];
 }

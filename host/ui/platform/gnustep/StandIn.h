@@ -1,0 +1,21 @@
+// Standing in for a method of the toolkit.
+#pragma once
+
+#include <objc/runtime.h>
+
+namespace tessel::windowing
+{
+// Replaces the method and answers the toolkit's own, or null where there is no such method.
+//
+// The runtime keeps every method under one type of function; which one it is, its name tells.
+template <class Function>
+Function standInFor(const char* className, SEL selector, Function replacement)
+{
+    const Method method = class_getInstanceMethod(objc_getClass(className), selector);
+    if (!method)
+        return nullptr;
+    const auto untyped = reinterpret_cast<void*>(replacement);
+    return reinterpret_cast<Function>(
+        reinterpret_cast<void*>(method_setImplementation(method, reinterpret_cast<IMP>(untyped))));
+}
+} // namespace tessel::windowing
