@@ -45,10 +45,21 @@ void RegularFile::refuse(std::wstring whyNot)
     mDescriptor = -1;
 }
 
+void RegularFile::readHead() const
+{
+    const ssize_t length = pread(mDescriptor, mHead.data(), mHead.size(), 0);
+    mHeadLength = length > 0 ? static_cast<std::size_t>(length) : 0;
+}
+
 bool RegularFile::read(std::uint64_t offset, void* buffer, std::size_t size) const
 {
     if (size > mSize || offset > mSize - size)
         return false;
-    return pread(mDescriptor, buffer, size, static_cast<off_t>(offset)) == static_cast<ssize_t>(size);
+    if (mHeadLength == 0)
+        readHead();
+    if (offset + size > mHeadLength)
+        return pread(mDescriptor, buffer, size, static_cast<off_t>(offset)) == static_cast<ssize_t>(size);
+    std::memcpy(buffer, mHead.data() + offset, size);
+    return true;
 }
 } // namespace tessel

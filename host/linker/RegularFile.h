@@ -2,6 +2,7 @@
 // told apart in words, without ever waiting for it.
 #pragma once
 
+#include <array>
 #include <compare>
 #include <cstddef>
 #include <cstdint>
@@ -42,12 +43,18 @@ public:
     bool read(std::uint64_t offset, void* buffer, std::size_t size) const;
 
 private:
+    // Everything that tells whether a library can be mapped usually stands here, so that one read serves.
+    static constexpr std::size_t kHeadSize = 1024;
+
     void refuse(std::wstring whyNot);
+    void readHead() const;
 
     int mDescriptor = -1;
     bool mMissing = false;
     std::wstring mWhyNot;
     FileIdentity mIdentity;
     std::uint64_t mSize = 0;
+    mutable std::array<unsigned char, kHeadSize> mHead;
+    mutable std::size_t mHeadLength = 0; // 0: not read yet
 };
 } // namespace tessel
