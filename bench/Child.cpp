@@ -3,15 +3,25 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
-#include <chrono>
+#include <ctime>
 
 namespace bench
 {
+namespace
+{
+double processorSeconds()
+{
+    timespec now = {};
+    clock_gettime(CLOCK_PROCESS_CPUTIME_ID, &now);
+    return static_cast<double>(now.tv_sec) + static_cast<double>(now.tv_nsec) * 1e-9;
+}
+} // namespace
+
 double secondsOf(const std::function<void()>& work)
 {
-    const auto start = std::chrono::steady_clock::now();
+    const double start = processorSeconds();
     work();
-    return std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
+    return processorSeconds() - start;
 }
 
 double inChild(const std::function<double()>& work)

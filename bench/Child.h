@@ -10,6 +10,7 @@ namespace bench
 // did not come to its end.
 double inChild(const std::function<double()>& work);
 
-// Seconds that the work takes.
+// Seconds of processor time, the system's included, that the work takes of this process. Machines are shared:
+// what others do meanwhile lengthens the time on the clock, of long runs more often than of short ones.
 double secondsOf(const std::function<void()>& work);
 } // namespace bench

@@ -3,6 +3,7 @@
 #include <benchmark/benchmark.h>
 #include <fcntl.h>
 #include <spawn.h>
+#include <sys/resource.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -10,7 +11,6 @@
 #include <string>
 #include <vector>
 
-#include "bench/Child.h"
 #include "bench/Ratios.h"
 #include "bench/Session.h"
 
@@ -20,8 +20,14 @@ namespace
 {
 constexpr int kRepetitions = 15;
 
-// Runs the program with its output thrown away and answers whether it ended well.
-bool runProgram(std::vector<std::string> arguments)
+double secondsOf(const timeval& time)
+{
+    return static_cast<double>(time.tv_sec) + static_cast<double>(time.tv_usec) * 1e-6;
+}
+
+// Runs the program with its output thrown away. Answers the processor time that it took, or a negative number
+// if it did not end well.
+double runProgram(std::vector<std::string> arguments)
 {
     std::vector<char*> pointers;
     for (std::string& argument : arguments)
@@ -35,7 +41,10 @@ bool runProgram(std::vector<std::string> arguments)
     const int status = posix_spawn(&child, pointers[0], &actions, nullptr, pointers.data(), environ);
     posix_spawn_file_actions_destroy(&actions);
     int ended = 1;
-    return status == 0 && waitpid(child, &ended, 0) == child && ended == 0;
+    rusage used = {};
+    if (status != 0 || wait4(child, &ended, 0, &used) != child || ended != 0)
+        return -1;
+    return secondsOf(used.ru_utime) + secondsOf(used.ru_stime);
 }
 
 std::string profileFolder(const std::string& name)
@@ -51,10 +60,9 @@ void add(const std::string& name, const std::vector<std::string>& arguments)
                                      for (auto iteration : state)
                                      {
                                          static_cast<void>(iteration);
-                                         bool ended = false;
-                                         state.SetIterationTime(
-                                             bench::secondsOf([&] { ended = runProgram(arguments); }));
-                                         if (!ended)
+                                         const double seconds = runProgram(arguments);
+                                         state.SetIterationTime(seconds);
+                                         if (seconds < 0)
                                              state.SkipWithError("the program did not end well");
                                      }
                                  })
