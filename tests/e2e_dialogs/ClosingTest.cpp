@@ -16,6 +16,15 @@ TEST_F(DialogClosing, ByEscapeLeavesAHostThatGoesOn)
     EXPECT_THAT(end(), HasSubstr("Command: VERSION\nTessel R21"));
 }
 
+TEST_F(DialogClosing, ByTheWindowsCloseButtonLeavesAHostThatGoesOn)
+{
+    open();
+    mScreen.clickCloseButton(mDialog, places::kDialogWidth);
+    EXPECT_TRUE(mScreen.waitUntilGone(kDialog));
+    mHost->type("VERSION");
+    EXPECT_THAT(end(), HasSubstr("Command: VERSION\nTessel R21"));
+}
+
 TEST_F(DialogClosing, RemembersTheTabAndTheCheckBox)
 {
     open();
