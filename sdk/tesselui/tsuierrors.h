@@ -5,6 +5,7 @@
 
 #include "../tessel/tsdefs.h"
 
-// Calls the function and answers what the toolkit raised meanwhile, "name: reason", or nil. An application written
-// in Objective-C++ needs it on every platform where GCC compiles it: there, GCC's own `@catch` crashes.
+// Calls the function and answers what the toolkit raised meanwhile, "name: reason", or nil. An application
+// written in Objective-C++ needs it on every platform where GCC compiles it: there, GCC's own `@catch`
+// crashes.
 extern "C" TESSEL_API NSString* tsuiErrorOf(void (*function)(void*), void* argument);

@@ -146,6 +146,7 @@ void Desktop::key(const std::string& keys) const
 
 void Desktop::dropFiles(const std::vector<std::filesystem::path>& files, Point target) const
 {
+    waitForWindowGone("Drag source"); // of the drop before, which is over when it has been taken
     std::string command = "DISPLAY=" + display() + " timeout 60 /usr/bin/python3 " DRAG_SOURCE;
     for (const auto& file : files)
         command += " " + quoted(file.string());

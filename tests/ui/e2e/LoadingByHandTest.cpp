@@ -162,12 +162,12 @@ TEST_F(LoadingByHand, ShowsAndHidesFilesWithTheFilter)
     sample("primes.zmb");
     startHost();
     openDialog();
-    mDesktop->choose(inDialog(kFileTypes), inDialog(fileType(3)));
+    mDesktop->choose(inDialog(kFileTypes), inDialog(fileType(+3)));
     picture("13-lisp-source-only");
     click(fileInPanel(0));
     click(kLoad);
     EXPECT_TRUE(says("hill.lsp was loaded."));
-    mDesktop->choose(inDialog(kFileTypes), inDialog(fileType(0)));
+    mDesktop->choose(inDialog(kFileTypes), inDialog(fileType(-3)));
     picture("14-all-applications-again");
     click(fileInPanel(2));
     click(kLoad);
@@ -215,6 +215,20 @@ TEST_F(LoadingByHand, ClosesWithEscapeWithItsButtonAndWithTheWindowsButton)
     EXPECT_TRUE(mDesktop->waitForWindowGone(kDialogTitle));
     EXPECT_TRUE(says("Command: "));
     picture("16-closed");
+    quit();
+}
+
+TEST_F(LoadingByHand, TakesAClosedMessageBoxForAnswered)
+{
+    brokenModule("a.zmb");
+    startHost();
+    openDialog();
+    click(fileInPanel(0));
+    mDesktop->key("Return");
+    ASSERT_TRUE(mDesktop->waitForWindow(kAlertTitle));
+    mDesktop->key("alt+F4");
+    EXPECT_TRUE(mDesktop->waitForWindowGone(kAlertTitle));
+    closeDialog();
     quit();
 }
 

@@ -1,0 +1,105 @@
+// The classes that the host offers for windows, as far as they need no user.
+#include "tests/ui/support/DialogTest.h"
+
+#import <tesselui/TsOCFileFilter.h>
+#import <tesselui/TsUIPersistentStore.h>
+#include <tesselui/tsuierrors.h>
+
+using testing::ElementsAre;
+
+namespace
+{
+class FileFilter : public DialogTest
+{
+};
+
+class PersistentStore : public DialogTest
+{
+protected:
+    void SetUp() override
+    {
+        DialogTest::SetUp();
+        mStore = [[TsUIPersistentStore alloc] init];
+    }
+    void TearDown() override
+    {
+        [mStore release];
+        DialogTest::TearDown();
+    }
+    TsUIPersistentStore* mStore = nil;
+};
+
+void raise(void*)
+{
+    [NSException raise:NSRangeException format:@"beyond the last row"];
+}
+
+void returnQuietly(void*)
+{
+}
+} // namespace
+
+TEST_F(FileFilter, TakesExtensionsWithAndWithoutWildcards)
+{
+    TsOCFileFilter* filter = [[[TsOCFileFilter alloc] initWithDescription:@"Lisp"
+                                                             extensionStr:@"lsp;*.qbc; .rpk;;"] autorelease];
+    EXPECT_EQ(L"Lisp", wide([filter description]));
+    ASSERT_EQ(3u, [[filter fileExtensions] count]);
+    EXPECT_EQ(L"lsp", wide([[filter fileExtensions] objectAtIndex:0]));
+    EXPECT_EQ(L"qbc", wide([[filter fileExtensions] objectAtIndex:1]));
+    EXPECT_EQ(L"rpk", wide([[filter fileExtensions] objectAtIndex:2]));
+}
+
+TEST_F(FileFilter, HasNoExtensionsForAnEmptyText)
+{
+    TsOCFileFilter* filter = [[[TsOCFileFilter alloc] initWithDescription:@"" extensionStr:@""] autorelease];
+    EXPECT_EQ(0u, [[filter fileExtensions] count]);
+}
+
+TEST_F(PersistentStore, AnswersNothingForWhatIsNotStored)
+{
+    EXPECT_EQ(0, [mStore getControlState:@"Group" control:@"Box"]);
+    EXPECT_EQ(0, [mStore getControlInt:@"Group" control:@"Number"]);
+    EXPECT_EQ(nil, [mStore getControlString:@"Group" control:@"Text"]);
+}
+
+TEST_F(PersistentStore, AnswersWhatWasStored)
+{
+    [mStore putControlState:@"Group" control:@"Box" state:1];
+    [mStore putControlInt:@"Group" control:@"Number" value:-42];
+    [mStore putControlString:@"Group" control:@"Text" value:@"/Ångström/a \"b\" %s"];
+    EXPECT_EQ(1, [mStore getControlState:@"Group" control:@"Box"]);
+    EXPECT_EQ(-42, [mStore getControlInt:@"Group" control:@"Number"]);
+    EXPECT_EQ(L"/Ångström/a \"b\" %s", wide([mStore getControlString:@"Group" control:@"Text"]));
+    EXPECT_EQ(nil, [mStore getControlString:@"Other" control:@"Text"]);
+}
+
+TEST_F(PersistentStore, KeepsLongTexts)
+{
+    NSString* text = [@"" stringByPaddingToLength:5000 withString:@"folder/" startingAtIndex:0];
+    [mStore putControlString:@"Group" control:@"Text" value:text];
+    EXPECT_EQ(wide(text), wide([mStore getControlString:@"Group" control:@"Text"]));
+}
+
+TEST_F(PersistentStore, ForgetsATextThatIsSetToNil)
+{
+    [mStore putControlString:@"Group" control:@"Text" value:@"text"];
+    [mStore putControlString:@"Group" control:@"Text" value:nil];
+    EXPECT_EQ(nil, [mStore getControlString:@"Group" control:@"Text"]);
+}
+
+TEST_F(PersistentStore, KeepsTheSettingsOfEveryProfile)
+{
+    [mStore putControlInt:@"Group" control:@"Number" value:1];
+    host().setProfile(L"Other");
+    EXPECT_EQ(0, [mStore getControlInt:@"Group" control:@"Number"]);
+    [mStore putControlInt:@"Group" control:@"Number" value:2];
+    host().setProfile(L"Default");
+    EXPECT_EQ(1, [mStore getControlInt:@"Group" control:@"Number"]);
+}
+
+TEST(ToolkitErrors, AreAnsweredAsText)
+{
+    EXPECT_EQ(L"NSRangeException: beyond the last row", wide(tsuiErrorOf(raise, nullptr)));
+    EXPECT_EQ(nil, tsuiErrorOf(returnQuietly, nullptr));
+}
