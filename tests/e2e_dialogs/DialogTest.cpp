@@ -105,12 +105,13 @@ void DialogTest::openAgain()
     mHost->type("MODRIG");
     mDialog = mScreen.waitForWindow(kDialog);
     ASSERT_FALSE(mDialog.empty()) << mHost->output();
-    // The name field takes what is typed as soon as the panel runs.
+    ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
     shoot("opened");
 }
 
 std::string DialogTest::closeAndEnd()
 {
+    EXPECT_TRUE(mScreen.waitUntilActive(mDialog)) << "another window has the keyboard";
     mScreen.key("Escape");
     EXPECT_TRUE(mScreen.waitUntilGone(kDialog));
     return end();
@@ -144,7 +145,9 @@ bool DialogTest::prints(const std::string& text) const
 
 void DialogTest::dismissMessageBox() const
 {
-    ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty()) << "no message box";
+    const std::string box = mScreen.waitForWindow(kMessageBox);
+    ASSERT_FALSE(box.empty()) << "no message box";
+    ASSERT_TRUE(mScreen.waitUntilActive(box));
     shoot("message-box");
     mScreen.key("Return");
     EXPECT_TRUE(mScreen.waitUntilGone(kMessageBox));

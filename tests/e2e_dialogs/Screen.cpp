@@ -77,6 +77,11 @@ std::string Screen::waitForWindow(const std::string& title) const
     return found;
 }
 
+bool Screen::waitUntilActive(const std::string& window) const
+{
+    return comesTrue([&] { return run("xdotool getactivewindow") == window + "\n"; });
+}
+
 bool Screen::waitUntilGone(const std::string& title) const
 {
     return comesTrue([&] { return window(title).empty(); });

@@ -27,6 +27,8 @@ public:
     // The visible window with this title; empty when there is none.
     std::string window(const std::string& title) const;
     std::string waitForWindow(const std::string& title) const;
+    // Until the window manager has given the keyboard to the window.
+    bool waitUntilActive(const std::string& window) const;
     bool waitUntilGone(const std::string& title) const;
 
     // Presses and releases the mouse button, slowly enough for the toolkit.

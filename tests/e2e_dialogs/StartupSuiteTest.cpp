@@ -15,6 +15,7 @@ protected:
         click(places::kContents);
         mSuite = mScreen.waitForWindow(kSuiteDialog);
         ASSERT_FALSE(mSuite.empty());
+        ASSERT_TRUE(mScreen.waitUntilActive(mSuite));
         shoot("suite");
     }
 
@@ -34,6 +35,7 @@ TEST_F(DialogStartupSuite, TakesAFileThatTheNextStartLoads)
     mScreen.click(mSuite, places::kAdd);
     const std::string panel = mScreen.waitForWindow(kAddPanel);
     ASSERT_FALSE(panel.empty());
+    ASSERT_TRUE(mScreen.waitUntilActive(panel));
     mScreen.text(file); // takes the panel to the folder
     mScreen.click(panel, places::kFirstFileToAdd);
     shoot("selected");
