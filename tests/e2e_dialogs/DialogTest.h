@@ -58,11 +58,10 @@ protected:
     // Waits for a message box and ends it.
     void dismissMessageBox() const;
 
-    // Drags the files from a program of another toolkit to a place in the dialog.
-    // What the drop leads to may need an answer before that program is told that the drag is over.
-    void dragFiles(
-        const std::vector<std::string>& paths, Place place,
-        const std::function<void()>& answer = [] {}) const;
+    // Drags the files from a program of another toolkit to a place in the dialog. That program lives until
+    // the effect has been waited for.
+    void dragFiles(const std::vector<std::string>& paths, Place place,
+                   const std::function<void()>& effect) const;
 
     Screen mScreen;
     HostSession mSession;

@@ -32,8 +32,7 @@ TEST_F(DialogDrop, LoadsTwoFilesDroppedOnTheTable)
 {
     const auto paths = writeManyLisp(2);
     open();
-    dragFiles(paths, kTable);
-    EXPECT_TRUE(prints("2 applications were loaded.\n"));
+    dragFiles(paths, kTable, [this] { EXPECT_TRUE(prints("2 applications were loaded.\n")); });
     shoot("loaded");
     const std::string output = closeAndEnd();
     EXPECT_THAT(output, HasSubstr("many1.lsp runs"));
@@ -44,8 +43,7 @@ TEST_F(DialogDrop, LoadsFiftyFilesDroppedOnTheTable)
 {
     const auto paths = writeManyLisp(50);
     open();
-    dragFiles(paths, kTable);
-    EXPECT_TRUE(prints("50 applications were loaded.\n"));
+    dragFiles(paths, kTable, [this] { EXPECT_TRUE(prints("50 applications were loaded.\n")); });
     shoot("loaded");
     const std::string output = closeAndEnd();
     for (int number = 1; number <= 50; ++number)
@@ -61,8 +59,8 @@ TEST_F(DialogDrop, TakesTwoFilesIntoTheStartupSuite)
 {
     const auto paths = writeManyLisp(2);
     open();
-    dragFiles(paths, places::kStartupSuiteBox);
-    EXPECT_TRUE(prints("2 applications were added to the Startup Suite.\n"));
+    dragFiles(paths, places::kStartupSuiteBox,
+              [this] { EXPECT_TRUE(prints("2 applications were added to the Startup Suite.\n")); });
     shoot("added");
     EXPECT_THAT(closeAndEnd(), HasSubstr("many2.lsp runs"));
     EXPECT_EQ(stored("Startup"), listOf(paths));
@@ -72,8 +70,8 @@ TEST_F(DialogDrop, TakesFiftyFilesIntoTheStartupSuite)
 {
     const auto paths = writeManyLisp(50);
     open();
-    dragFiles(paths, places::kStartupSuiteBox);
-    EXPECT_TRUE(prints("50 applications were added to the Startup Suite.\n"));
+    dragFiles(paths, places::kStartupSuiteBox,
+              [this] { EXPECT_TRUE(prints("50 applications were added to the Startup Suite.\n")); });
     closeAndEnd();
     EXPECT_EQ(stored("Startup"), listOf(paths));
 }
