@@ -24,6 +24,9 @@
 // With nil all texts are nil, and `unloadable` is NO. A path without a dot: message 2.
 - (id)initWithFilePathName:(NSString*)path;
 
+// The same for a path that has no symbolic links in it, which is then not looked at on the disk.
+- (id)initWithResolvedPath:(NSString*)path;
+
 // `filePathName` as the module's logic takes it.
 - (CStdStr)path;
 

@@ -13,9 +13,18 @@
 
 - (id)initWithFilePathName:(NSString*)path
 {
+    if (!(self = [self initWithResolvedPath:path]) || !path)
+        return self;
+    [mFilePathName release];
+    mFilePathName = [[path stringByResolvingSymlinksInPath] copy];
+    return self;
+}
+
+- (id)initWithResolvedPath:(NSString*)path
+{
     if (!(self = [super init]) || !path)
         return self;
-    mFilePathName = [[path stringByResolvingSymlinksInPath] copy];
+    mFilePathName = [path copy];
     mFileName = [[path lastPathComponent] copy];
     mFilePath = [[path stringByDeletingLastPathComponent] copy];
     mUnloadable = ModrigUtils::IsAppUnloadAble(CStdStr(NSStringToWstring(path)));

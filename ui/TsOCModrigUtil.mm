@@ -65,10 +65,11 @@ NSMutableSet* identitiesOfRows(NSArrayController* controller)
     for (NSString* path : tsuiEach<NSString*>(paths))
     {
         NSString* resolved = [path stringByResolvingSymlinksInPath];
-        if ([known containsObject:identity(resolved)])
+        NSString* key = identity(resolved);
+        if ([known containsObject:key])
             continue;
-        [known addObject:identity(resolved)];
-        ModrigFilePath* row = [[ModrigFilePath alloc] initWithFilePathName:resolved];
+        [known addObject:key];
+        ModrigFilePath* row = [[ModrigFilePath alloc] initWithResolvedPath:resolved];
         [rows addObject:row];
         [row release];
     }
