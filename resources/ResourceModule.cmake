@@ -1,27 +1,39 @@
-# Texts by id: a resource script becomes a portable executable without code that the host reads strings from.
+# Texts by id: resource scripts become a portable executable without code that the host reads strings from.
 find_program(RESOURCE_COMPILER NAMES llvm-rc llvm-rc-14 REQUIRED)
 find_program(RESOURCE_LINKER NAMES lld-link lld-link-14 REQUIRED)
 
-# add_resource_module(TARGET SCRIPT.rc OUTPUT.dll)
-# The script is UTF-8 and is not preprocessed, so that no C compiler is needed. The same script always gives the
+# add_resource_module(OUTPUT.dll SCRIPT.rc|OBJECT.obj...)
+# The scripts are UTF-8 and are not preprocessed, so that no C compiler is needed. The same scripts always give the
 # same bytes.
-function(add_resource_module target script output)
-  cmake_path(ABSOLUTE_PATH script BASE_DIRECTORY "${CMAKE_CURRENT_SOURCE_DIR}")
+function(add_resource_module output)
   cmake_path(GET output PARENT_PATH folder)
   cmake_path(GET output FILENAME name)
-  set(scratch "${CMAKE_BINARY_DIR}/resource_modules")
-  set(compiled "${scratch}/${target}.res")
+  cmake_path(GET output STEM stem)
+  # Compiler and linker take a path that begins with a slash for an option when its first letters are those of one
+  # (/check/... is read as /c), so that they are given names relative to the folder they work in.
+  set(scratch "${CMAKE_CURRENT_BINARY_DIR}/${stem}.resources")
+  file(MAKE_DIRECTORY "${scratch}")
+  file(RELATIVE_PATH relative_output "${scratch}" "${output}")
+  foreach(source IN LISTS ARGN)
+    cmake_path(ABSOLUTE_PATH source BASE_DIRECTORY "${CMAKE_CURRENT_SOURCE_DIR}")
+    list(APPEND sources "${source}")
+    file(RELATIVE_PATH linked "${scratch}" "${source}")
+    if(source MATCHES "[.]rc$")
+      cmake_path(GET source STEM script)
+      list(APPEND compile COMMAND ${RESOURCE_COMPILER} /no-preprocess /C 65001 /FO "${script}.res" "${linked}")
+      set(linked "${script}.res")
+    endif()
+    list(APPEND all_linked "${linked}")
+  endforeach()
   # The linker insists on an import library; nobody reads it.
-  set(import_library "${scratch}/${target}.lib")
   add_custom_command(
     OUTPUT "${output}"
-    BYPRODUCTS "${compiled}"
-    COMMAND ${CMAKE_COMMAND} -E make_directory "${folder}" "${scratch}"
-    COMMAND ${RESOURCE_COMPILER} /no-preprocess /C 65001 /FO "${compiled}" "${script}"
-    COMMAND ${RESOURCE_LINKER} /dll /noentry /machine:x64 /Brepro "/implib:${import_library}" "/out:${output}"
-            "${compiled}"
-    DEPENDS "${script}"
+    COMMAND ${CMAKE_COMMAND} -E make_directory "${folder}"
+    ${compile}
+    COMMAND ${RESOURCE_LINKER} /dll /noentry /machine:x64 /Brepro "/implib:${stem}.lib" "/out:${relative_output}"
+            ${all_linked}
+    DEPENDS ${sources}
+    WORKING_DIRECTORY "${scratch}"
     COMMENT "Making ${name}"
     VERBATIM)
-  add_custom_target(${target} DEPENDS "${output}")
 endfunction()

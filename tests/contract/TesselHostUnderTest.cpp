@@ -97,12 +97,13 @@ public:
         std::string script = "STRINGTABLE\nBEGIN\n";
         for (const auto& [id, text] : texts)
             script += std::to_string(id) + " " + quoted(text) + "\n";
-        const std::string source = mFolder.write("texts.rc", script + "END\n").string();
-        const std::string compiled = (mFolder / "texts.res").string();
+        mFolder.write("texts.rc", script + "END\n");
         const fs::path module = mFolder / toPath(name);
-        run(RESOURCE_COMPILER " /no-preprocess /C 65001 /FO " + compiled + " " + source);
-        run(RESOURCE_LINKER " /dll /noentry /machine:x64 /implib:" + compiled +
-            ".lib /out:" + module.string() + " " + compiled);
+        // Relative names: an absolute one can be read as an option.
+        const std::string inFolder = "cd " + mFolder.path().string() + " && ";
+        run(inFolder + RESOURCE_COMPILER " /no-preprocess /C 65001 /FO texts.res texts.rc");
+        run(inFolder + RESOURCE_LINKER " /dll /noentry /machine:x64 /implib:texts.lib /out:" +
+            toPath(name).string() + " texts.res");
         return toText(module);
     }
 
