@@ -17,6 +17,7 @@ void prepare()
     tessel::windowing::completeLook();
     tessel::windowing::acceptFileDrops();
     tessel::windowing::makeWindowsClosable();
+    tessel::windowing::letNewWindowsHaveTheKeyboard();
     // The host's own loop waits for the terminal; these two are what the toolkit's would have done first.
     [NSApp finishLaunching];
     [pool drain];

@@ -16,6 +16,8 @@ void completeLook();
 void acceptFileDrops();
 // Lets every window be closed by its frame: file panels are cancelled then, message boxes answered.
 void makeWindowsClosable();
+// Lets a window that opens right after another has closed get the keyboard.
+void letNewWindowsHaveTheKeyboard();
 
 // Carries out what the screen still has to show.
 void flushScreen();

@@ -29,8 +29,12 @@ void flushScreen()
 {
 }
 
-// No window of the platform is ended from outside.
-void makeClosable(NSWindow*)
+// No window of the platform is ended from outside, and a new one has the keyboard.
+void makeWindowsClosable()
+{
+}
+
+void letNewWindowsHaveTheKeyboard()
 {
 }
 

@@ -47,4 +47,14 @@ void completeRequests(void* display)
     if (display)
         XSync(static_cast<Display*>(display), False);
 }
+
+void giveKeyboardTo(void* window, void* display)
+{
+    const auto xWindow = reinterpret_cast<Window>(window);
+    auto* connection = static_cast<Display*>(display);
+    XWindowAttributes attributes;
+    if (xWindow != None && XGetWindowAttributes(connection, xWindow, &attributes) &&
+        attributes.map_state == IsViewable)
+        XSetInputFocus(connection, xWindow, RevertToParent, CurrentTime);
+}
 } // namespace tessel::windowing

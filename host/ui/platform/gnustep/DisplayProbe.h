@@ -14,4 +14,8 @@ DisplayFacts probeDisplay();
 
 // Waits until the display has done all that it was asked on the connection (the toolkit's, or null).
 void completeRequests(void* display);
+
+// Moves the keyboard to the window (an X window's number, as the toolkit hands it out) if it is on the
+// screen.
+void giveKeyboardTo(void* window, void* display);
 } // namespace tessel::windowing
