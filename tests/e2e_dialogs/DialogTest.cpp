@@ -6,7 +6,6 @@ using testing::HasSubstr;
 
 namespace
 {
-constexpr char kMessageBox[] = "(Alert|Tessel)";
 constexpr char kDragWindow[] = "Files to drag";
 constexpr Place kDragButton{50, 30};
 

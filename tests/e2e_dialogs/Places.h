@@ -16,11 +16,14 @@ inline constexpr Place kLoad{676, 390};
 inline constexpr Place kLoadedTab{100, 425};
 inline constexpr Place kHistoryTab{219, 425};
 inline constexpr Place kUnload{471, 646};
+inline constexpr Place kAddToStartupSuite{206, 646};
 inline constexpr Place kLoadFromHistory{70, 646};
 inline constexpr Place kRemoveFromHistory{471, 646};
 inline constexpr Place kStartupSuiteBox{636, 560};
 inline constexpr Place kContents{636, 635};
 inline constexpr Place kName{400, 720};
+inline constexpr Place kHelp{50, 750};
+inline constexpr Place kClose{705, 750};
 
 // The Startup Suite dialog
 inline constexpr Place kAdd{30, 330};

@@ -1,0 +1,64 @@
+// The dialog's other buttons, and a message box that is closed by its frame.
+#include "tests/e2e_dialogs/DialogTest.h"
+
+class DialogEdges : public DialogTest
+{
+};
+
+TEST_F(DialogEdges, LoadsSelectedHistoryRowsWithTheLoadButtonOfThePanel)
+{
+    storeHistory({writeLisp("a.lsp"), writeLisp("b.lsp")});
+    setSetting("LastTab", "1");
+    open();
+    click(places::tableRow(1));
+    click(places::kLoad);
+    EXPECT_TRUE(prints(wasLoaded("b.lsp")));
+    closeAndEnd();
+}
+
+TEST_F(DialogEdges, TakesHistoryRowsIntoTheStartupSuite)
+{
+    const std::string path = writeLisp("a.lsp");
+    storeHistory({path});
+    setSetting("LastTab", "1");
+    open();
+    click(places::tableRow(0));
+    click(places::kAddToStartupSuite);
+    EXPECT_TRUE(prints("a.lsp was added to the Startup Suite.\n"));
+    shoot("added");
+    closeAndEnd();
+    EXPECT_EQ(stored("Startup"), "NumStartup = 1\n1Startup = " + path + "\n");
+}
+
+TEST_F(DialogEdges, AMessageBoxThatIsClosedByItsFrameIsAnswered)
+{
+    mSession.folder().write("files/broken.zmb", "no module");
+    open();
+    click(places::file(0));
+    click(places::kLoad);
+    const std::string box = mScreen.waitForWindow(kMessageBox);
+    ASSERT_FALSE(box.empty());
+    ASSERT_TRUE(mScreen.waitUntilActive(box));
+    mScreen.key("alt+F4");
+    EXPECT_TRUE(mScreen.waitUntilGone(kMessageBox));
+    ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
+    closeAndEnd();
+}
+
+TEST_F(DialogEdges, TheCloseButtonClosesAndTheDialogOpensAgain)
+{
+    open();
+    click(places::kClose);
+    EXPECT_TRUE(mScreen.waitUntilGone(kDialog));
+    openAgain();
+    shoot("again");
+    closeAndEnd();
+}
+
+TEST_F(DialogEdges, TheHelpButtonOpensItsPage)
+{
+    open();
+    click(places::kHelp);
+    EXPECT_TRUE(prints("load_unload_applications_dialog"));
+    closeAndEnd();
+}
