@@ -22,6 +22,14 @@ bool isThere(const std::filesystem::path& path)
     std::error_code unreachable; // is as good as not there
     return std::filesystem::exists(path, unreachable);
 }
+
+// Nothing below a current folder that was removed: what is still found there by ".." has no path.
+std::optional<std::filesystem::path> absolutePath(const std::filesystem::path& path)
+{
+    std::error_code gone;
+    const auto absolute = std::filesystem::absolute(path, gone);
+    return gone ? std::nullopt : std::optional(absolute.lexically_normal());
+}
 } // namespace
 
 FileSearch::FileSearch(std::filesystem::path hostFolder) : mHostFolder(std::move(hostFolder))
@@ -51,7 +59,8 @@ std::optional<std::filesystem::path> FileSearch::find(const std::filesystem::pat
         return isThere(name) ? std::optional(name) : std::nullopt;
     for (const std::filesystem::path& folder : folders())
         if (!folder.empty() && isThere(folder / name))
-            return std::filesystem::absolute(folder / name).lexically_normal();
+            if (auto path = absolutePath(folder / name))
+                return path;
     return std::nullopt;
 }
 } // namespace tessel

@@ -117,6 +117,14 @@ TEST_F(FileSearch, GoesOnWhenTheCurrentFolderIsGone)
     EXPECT_EQ(find("other.lsp"), "nothing");
 }
 
+TEST_F(FileSearch, FindsNothingBesideACurrentFolderThatIsGone)
+{
+    folder.write("second/tool.lsp", "");
+    setSearchPath("../second");
+    fs::remove(folder / "current");
+    EXPECT_EQ(find("tool.lsp"), "nothing");
+}
+
 TEST_F(FileSearch, FindsNothingForWhatIsNoName)
 {
     EXPECT_EQ(find(""), "nothing");
