@@ -81,6 +81,7 @@ bool LispInterrupter::takeRequest() noexcept
 {
     if (mRequested.exchange(0) != mRun.load())
         return false;
+    mTakenRun = mRun.load();
     mTaken = std::chrono::steady_clock::now();
     return true;
 }

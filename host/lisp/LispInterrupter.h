@@ -37,6 +37,9 @@ public:
     // Whether an interrupt was meant for the evaluation that runs; once true for each.
     bool takeRequest() noexcept;
 
+    // Whether the evaluation that runs has taken one.
+    bool hasTakenRequest() const noexcept { return mTakenRun == mRun.load(); }
+
 private:
     // Counts up at every beginning and every end: odd while Lisp runs.
     using Run = unsigned;
@@ -55,7 +58,8 @@ private:
     std::atomic<Run> mRun = 0;
     std::atomic<Run> mRequested = 0;
     std::atomic<std::chrono::steady_clock::time_point> mTaken;
-    Run mSent = 0; // used by the watcher only
+    Run mTakenRun = 0; // used by the thread of Lisp only
+    Run mSent = 0;     // used by the watcher only
     // Held while an interrupt is sent: the evaluation that it is sent to does not end meanwhile.
     std::mutex mRunChange;
     std::thread mWatcher;

@@ -143,11 +143,12 @@ struct LispMachine::Parts
         const std::size_t memoryBefore = cl_core.max_heap_size;
         interrupter.begin();
         cl_object pair = applyProtected(call);
+        const bool interrupted = interrupter.hasTakenRequest();
         interrupter.end();
         restoreLispStackLimits();
         flushLispOutput();
         if (!ECL_CONSP(pair))
-            return {false, recover(cl_core.max_heap_size > memoryBefore)};
+            return {false, recover(cl_core.max_heap_size > memoryBefore, interrupted)};
         if (cl_car(pair) == ecl_make_keyword("DONE"))
             return {true, cl_cdr(pair)};
         releaseForgottenLock();
@@ -156,14 +157,16 @@ struct LispMachine::Parts
     }
 
     // After a jump out of everything; answers what is to be told.
-    cl_object recover(bool memoryWasExhausted)
+    cl_object recover(bool memoryWasExhausted, bool interrupted)
     {
         releaseForgottenLock();
         if (canMakeSymbols())
         {
             takeBackReserve(surroundings.heapBytes);
-            return toLisp(memoryWasExhausted ? L"the memory for Lisp is exhausted."
-                                             : L"Lisp has given up what it was doing.");
+            if (memoryWasExhausted)
+                return toLisp(L"the memory for Lisp is exhausted.");
+            // A second interrupt can meet the jump that the first one began; what it carried is lost then.
+            return toLisp(interrupted ? L"Lisp was interrupted." : L"Lisp has given up what it was doing.");
         }
         // The user's symbols fill the memory.
         if (!beginSession(surroundings))
