@@ -32,15 +32,18 @@ std::size_t EndOfNetworkPrefix(const std::wstring& path)
     return 0;
 }
 
-// A double quote would end the Lisp string early and let the rest of a file's name run as code.
+// A double quote would end the Lisp string early and let the rest of a file's name run as code. One behind a
+// backslash that escapes it already is left alone: one more would escape the backslash instead.
 std::wstring EscapeQuotes(const std::wstring& text)
 {
     std::wstring escaped;
+    bool afterEscape = false;
     for (const wchar_t character : text)
     {
-        if (character == L'"')
+        if (character == L'"' && !afterEscape)
             escaped += L'\\';
         escaped += character;
+        afterEscape = character == L'\\' && !afterEscape;
     }
     return escaped;
 }

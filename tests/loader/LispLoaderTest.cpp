@@ -124,6 +124,14 @@ TEST_F(LispLoader, KeepsADoubleQuoteInANameFromEndingTheLispText)
     EXPECT_EQ(L"C:/a/\\\"q\\\".lsp", SafePath(L"C:\\a\\\"q\".lsp"));
 }
 
+TEST_F(LispLoader, EscapesADoubleQuoteOnceWhenABackslashThatIsKeptEscapesItAlready)
+{
+    EXPECT_EQ(L"\\\\\\\"\\x.lsp", SafePath(L"\\\"\\x.lsp"));
+    EXPECT_EQ(L"\\\\/\\\"\\x.lsp", SafePath(L"/\\\"\\x.lsp"));
+    EXPECT_EQ(L"\\\\\\a\\\"x.lsp", SafePath(L"\\a\\\"x.lsp"));
+    EXPECT_EQ(L"\\\\\\\\\\\"x.lsp", SafePath(L"\\\\\"x.lsp"));
+}
+
 TEST_F(LispLoader, QueuesAPathOf4000CharactersWhole)
 {
     const std::wstring path = LongPath(4000, L"tool.lsp");
