@@ -10,84 +10,6 @@ namespace
 constexpr std::wstring_view kBlanks = L" \t\r";
 constexpr std::wstring_view kWordEnds = L" \t\r\n()\"';";
 
-// Walks over Lisp text and keeps count of what is open. Only as much of the reader's syntax as can hide a
-// parenthesis.
-class LispScanner
-{
-public:
-    explicit LispScanner(std::wstring_view text) : mText(text) {}
-
-    bool endsOpen()
-    {
-        while (mAt < mText.size())
-            step();
-        return mDepth > 0 || mCutShort;
-    }
-
-private:
-    bool startsWith(std::wstring_view mark) const { return mText.substr(mAt).starts_with(mark); }
-
-    void step()
-    {
-        if (startsWith(L"#\\"))
-            skipCharacter();
-        else if (startsWith(L"#|"))
-            skipBlockComment();
-        else if (mText[mAt] == L';')
-            mAt = std::min(mText.find(L'\n', mAt), mText.size());
-        else if (mText[mAt] == L'"' || mText[mAt] == L'|')
-            skipQuoted(mText[mAt]);
-        else
-            count(mText[mAt]);
-    }
-
-    void count(wchar_t character)
-    {
-        if (character == L'(')
-            ++mDepth;
-        // A parenthesis too many closes nothing: the interpreter is to complain about it.
-        if (character == L')' && mDepth > 0)
-            --mDepth;
-        mAt += character == L'\\' ? 2 : 1;
-    }
-
-    // #\( and #\Space: the first character may be anything.
-    void skipCharacter()
-    {
-        mAt += 3;
-        if (mAt < mText.size())
-            mAt = std::min(mText.find_first_of(kWordEnds, mAt), mText.size());
-    }
-
-    void skipQuoted(wchar_t quote)
-    {
-        ++mAt;
-        while (mAt < mText.size() && mText[mAt] != quote)
-            mAt += mText[mAt] == L'\\' ? 2 : 1;
-        mCutShort = mAt >= mText.size();
-        ++mAt;
-    }
-
-    // These nest.
-    void skipBlockComment()
-    {
-        int depth = 0;
-        do
-        {
-            const bool opens = startsWith(L"#|");
-            const bool closes = startsWith(L"|#");
-            depth += (opens ? 1 : 0) - (closes ? 1 : 0);
-            mAt += opens || closes ? 2 : 1;
-        } while (depth > 0 && mAt < mText.size());
-        mCutShort = depth > 0;
-    }
-
-    std::wstring_view mText;
-    std::size_t mAt = 0;
-    int mDepth = 0;
-    bool mCutShort = false;
-};
-
 std::wstring_view withoutLeadingBlanks(std::wstring_view text)
 {
     return text.substr(std::min(text.find_first_not_of(kBlanks), text.size()));
@@ -99,9 +21,101 @@ bool isLisp(std::wstring_view text)
     return withoutLeadingBlanks(text).starts_with(L'(');
 }
 
-bool isUnfinishedLisp(std::wstring_view text)
+void LispScanner::take(std::wstring_view text)
 {
-    return LispScanner(text).endsOpen();
+    for (const wchar_t character : text)
+        step(character);
+}
+
+bool LispScanner::isOpen() const
+{
+    return mDepth > 0 || mState == State::kQuoted || mState == State::kEscapedInQuoted ||
+           mState == State::kBlockComment;
+}
+
+void LispScanner::step(wchar_t character)
+{
+    switch (mState)
+    {
+    case State::kPlain:
+        return stepPlain(character);
+    case State::kHash:
+        return stepBehindHash(character);
+    case State::kEscaped:
+        mState = State::kPlain;
+        return;
+    case State::kCharacter:
+        mState = State::kCharacterName;
+        return;
+    case State::kCharacterName:
+        if (kWordEnds.find(character) != std::wstring_view::npos)
+            stepPlain(character);
+        return;
+    case State::kLineComment:
+        mState = character == L'\n' ? State::kPlain : State::kLineComment;
+        return;
+    case State::kQuoted:
+        return stepQuoted(character);
+    case State::kEscapedInQuoted:
+        mState = State::kQuoted;
+        return;
+    case State::kBlockComment:
+        return stepBlockComment(character);
+    }
+}
+
+void LispScanner::stepPlain(wchar_t character)
+{
+    mState = State::kPlain;
+    if (character == L'(')
+        ++mDepth;
+    // A parenthesis too many closes nothing: the interpreter is to complain about it.
+    else if (character == L')' && mDepth > 0)
+        --mDepth;
+    else if (character == L'#')
+        mState = State::kHash;
+    else if (character == L'\\')
+        mState = State::kEscaped;
+    else if (character == L';')
+        mState = State::kLineComment;
+    else if (character == L'"' || character == L'|')
+    {
+        mQuote = character;
+        mState = State::kQuoted;
+    }
+}
+
+void LispScanner::stepBehindHash(wchar_t character)
+{
+    if (character == L'\\')
+        mState = State::kCharacter;
+    else if (character == L'|')
+    {
+        mState = State::kBlockComment;
+        mCommentDepth = 1;
+        mBefore = L'\0';
+    }
+    else
+        stepPlain(character);
+}
+
+void LispScanner::stepQuoted(wchar_t character)
+{
+    if (character == L'\\')
+        mState = State::kEscapedInQuoted;
+    else if (character == mQuote)
+        mState = State::kPlain;
+}
+
+// These nest. No character belongs to two marks.
+void LispScanner::stepBlockComment(wchar_t character)
+{
+    const bool opens = mBefore == L'#' && character == L'|';
+    const bool closes = mBefore == L'|' && character == L'#';
+    mCommentDepth += (opens ? 1 : 0) - (closes ? 1 : 0);
+    mBefore = opens || closes ? L'\0' : character;
+    if (mCommentDepth == 0)
+        mState = State::kPlain;
 }
 
 std::optional<std::wstring> InputAssembler::add(std::wstring_view line)
@@ -109,10 +123,20 @@ std::optional<std::wstring> InputAssembler::add(std::wstring_view line)
     const auto content = withoutLeadingBlanks(line);
     if (!isOpen() && (content.empty() || content.starts_with(L';')))
         return std::nullopt;
-    mText += isOpen() ? L"\n" : L"";
-    mText += line;
-    if (isLisp(mText) && isUnfinishedLisp(mText))
+    if (!isOpen() && !isLisp(line))
+        return std::wstring(line);
+    const std::wstring added = (isOpen() ? L"\n" : L"") + std::wstring(line);
+    mText += added;
+    mScanner.take(added);
+    if (mScanner.isOpen())
         return std::nullopt;
+    mScanner = {};
     return std::exchange(mText, {});
+}
+
+void InputAssembler::discard()
+{
+    mText.clear();
+    mScanner = {};
 }
 } // namespace tessel

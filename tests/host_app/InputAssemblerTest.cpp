@@ -4,7 +4,16 @@
 
 using tessel::InputAssembler;
 using tessel::isLisp;
-using tessel::isUnfinishedLisp;
+
+namespace
+{
+bool isUnfinishedLisp(std::wstring_view text)
+{
+    tessel::LispScanner scanner;
+    scanner.take(text);
+    return scanner.isOpen();
+}
+} // namespace
 
 TEST(InputAssembler, TakesACommandAsOneLine)
 {
@@ -36,9 +45,28 @@ TEST(InputAssembler, GathersLispUntilItsParenthesesBalance)
 TEST(InputAssembler, ForgetsDiscardedLisp)
 {
     InputAssembler input;
-    input.add(L"(loop");
+    input.add(L"(princ \"loop");
     input.discard();
     EXPECT_EQ(input.add(L"HELP"), L"HELP");
+    EXPECT_EQ(input.add(L"(car x)"), L"(car x)");
+}
+
+TEST(InputAssembler, KeepsInMindWhatALineLeavesOpen)
+{
+    const std::pair<const wchar_t*, const wchar_t*> inputs[] = {
+        {L"(princ \"a", L")\")"},         // a string
+        {L"(princ \"a\\", L"b)\")"},      // its last character is escaped: the line's end
+        {L"(list |a", L")b|)"},           // a symbol
+        {L"(list #| a #| b |#", L")|#)"}, // comments in one another
+        {L"(list #", L"|a)|)"},           // no comment: the line ends between
+        {L"(list #\\", L")"}};            // the character is the line's end
+    for (const auto& [first, second] : inputs)
+    {
+        InputAssembler input;
+        EXPECT_EQ(input.add(first), std::nullopt) << testing::PrintToString(first);
+        EXPECT_EQ(input.add(second), std::wstring(first) + L"\n" + second);
+        EXPECT_FALSE(input.isOpen());
+    }
 }
 
 TEST(InputAssembler, TellsLispByItsParenthesis)
