@@ -1,6 +1,6 @@
-// The toolkit asks for the keyboard with the time of the last event that it has seen. The display ignores that
-// when the window manager has moved the keyboard since, as it does when a window closes: a window that opens
-// soon after would never get it. Here it is asked for again, with the present time.
+// The toolkit asks for the keyboard with the time of the last event that it has seen. The display ignores
+// that when the window manager has moved the keyboard since, as it does when a window closes: a window that
+// opens soon after would never get it. Here it is asked for again, with the present time.
 #import <AppKit/AppKit.h>
 #import <GNUstepGUI/GSDisplayServer.h>
 
