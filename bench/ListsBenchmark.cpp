@@ -93,12 +93,14 @@ std::vector<std::wstring> bareNames(const std::wstring& key)
     return names;
 }
 
-void bareReadAll(std::size_t count)
+bool bareReadAll(std::size_t count)
 {
     const std::wstring key = historyKey();
     std::wstring data;
+    bool all = true;
     for (std::size_t i = 1; i <= count; ++i)
-        benchmark::DoNotOptimize(bareRead(key, entryName(i), data));
+        all = bareRead(key, entryName(i), data) && all;
+    return all;
 }
 
 // The calls that storing a list makes, and nothing between them.
@@ -124,6 +126,13 @@ std::vector<std::wstring> pathsUpTo(std::size_t count)
     return paths;
 }
 
+// Whether the last of so many entries is stored.
+bool isStored(std::size_t count)
+{
+    std::wstring data;
+    return bareRead(historyKey(), entryName(count), data) && data == pathOf(count - 1);
+}
+
 // Makes a History of that size the stored one: each size has a profile of its own, so that it is written only
 // once for all the runs that begin with it.
 void store(std::size_t count)
@@ -138,9 +147,9 @@ void store(std::size_t count)
     bench::endCommand();
 }
 
-// `prepare` is not timed.
+// `prepare` is not timed; `work` answers whether it has done what it should.
 void measure(const std::string& name, int repetitions, std::function<void()> prepare,
-             std::function<void()> work)
+             std::function<bool()> work)
 {
     benchmark::RegisterBenchmark(
         name.c_str(),
@@ -150,7 +159,10 @@ void measure(const std::string& name, int repetitions, std::function<void()> pre
             {
                 static_cast<void>(iteration);
                 prepare();
-                state.SetIterationTime(bench::secondsOf(work));
+                bool done = false;
+                state.SetIterationTime(bench::secondsOf([&] { done = work(); }));
+                if (!done)
+                    state.SkipWithError("the stored list does not hold what it should");
             }
         })
         ->UseManualTime()
@@ -162,16 +174,29 @@ void addHistory(std::size_t count, int repetitions)
 {
     const std::string of = " " + std::to_string(count) + " of History";
     const std::vector<std::wstring> paths = pathsUpTo(count);
-    measure(
-        "read" + of, repetitions, [count] { store(count); }, ModrigUtils::InitializeHistoryFiles);
-    measure(
-        "read" + of + ", bare calls", repetitions, [count] { store(count); },
-        [count] { bareReadAll(count); });
-    measure(
-        "write" + of, repetitions, [count] { store(count); }, ModrigUtils::WriteHistoryFilesToRegistry);
-    measure(
-        "write" + of + ", bare calls", repetitions, [count] { store(count); },
-        [paths] { bareWriteAll(paths); });
+    const auto prepare = [count]
+    {
+        store(count);
+    };
+    measure("read" + of, repetitions, prepare,
+            [count]
+            {
+                ModrigUtils::InitializeHistoryFiles();
+                return gHistoryList.GetCount() == count;
+            });
+    measure("read" + of + ", bare calls", repetitions, prepare, [count] { return bareReadAll(count); });
+    measure("write" + of, repetitions, prepare,
+            [count]
+            {
+                ModrigUtils::WriteHistoryFilesToRegistry();
+                return isStored(count);
+            });
+    measure("write" + of + ", bare calls", repetitions, prepare,
+            [paths]
+            {
+                bareWriteAll(paths);
+                return isStored(paths.size());
+            });
 }
 
 void addHistoryRatios(const std::string& verb)
@@ -229,7 +254,7 @@ void addLookups()
         const std::string many = "look up, " + kind + ", list of 100000";
         bench::addRatio({many + " / 2 microseconds", many, "two microseconds", 1});
         bench::addRatio(
-            {"look up, " + kind + ", at 100000 / at 1000", many, "look up, " + kind + ", list of 1000"});
+            {"look up, " + kind + ", at 100000 / at 1000", many, "look up, " + kind + ", list of 1000", 2});
     }
 }
 

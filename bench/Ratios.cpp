@@ -109,15 +109,13 @@ void addFigure(const std::string& what, double value, const std::string& unit, d
     figures().push_back({what, value, unit, most});
 }
 
-int runAll(int argc, char** argv)
+int runAll()
 {
-    std::vector<std::string> arguments = {argv[0], "--benchmark_enable_random_interleaving=true"};
-    arguments.insert(arguments.end(), argv + 1, argv + argc);
-    std::vector<char*> pointers;
-    for (std::string& argument : arguments)
-        pointers.push_back(argument.data());
-    int count = static_cast<int>(pointers.size());
-    benchmark::Initialize(&count, pointers.data());
+    std::string program = "bench";
+    std::string interleaving = "--benchmark_enable_random_interleaving=true";
+    char* arguments[] = {program.data(), interleaving.data()};
+    int count = 2;
+    benchmark::Initialize(&count, arguments);
     Collector collector;
     benchmark::RunSpecifiedBenchmarks(&collector);
     collector.printMedians();

@@ -24,5 +24,5 @@ void addFigure(const std::string& what, double value, const std::string& unit, d
 
 // Runs every registered benchmark, its repetitions interleaved with the others' in random order, and prints
 // the medians and the table. Answers the number of limits that were missed.
-int runAll(int argc, char** argv);
+int runAll();
 } // namespace bench

@@ -13,6 +13,7 @@
 #include "bench/Ratios.h"
 #include "bench/Session.h"
 #include "loader/LoadedApplications.h"
+#include "module/Globals.h"
 #include "types/FileValidation.h"
 
 namespace
@@ -29,17 +30,20 @@ std::wstring wide(const std::filesystem::path& path)
     return {text.begin(), text.end()}; // the folder's name is plain
 }
 
-void loadModules(int count)
+// Whether all of them were loaded.
+bool loadModules(int count)
 {
     const auto folder = bench::workFolder() / "rebuild";
     std::filesystem::create_directories(folder);
     TsRxDynamicLinker* linker = TsRxDynamicLinker::cast(tsrxSysRegistry()->at(TSRX_DYNAMIC_LINKER));
+    bool all = true;
     for (int i = 0; i < count; ++i)
     {
         const auto path = folder / ("module" + std::to_string(i) + ".zmb");
         std::filesystem::copy_file(BENCH_MODULE, path, std::filesystem::copy_options::skip_existing);
-        linker->loadModule(wide(path).c_str(), true, true);
+        all = linker->loadModule(wide(path).c_str(), true, true) && all;
     }
+    return all;
 }
 
 void loadLispFiles(int count)
@@ -54,6 +58,17 @@ void loadLispFiles(int count)
     bench::endCommand();
 }
 
+// Seconds, negative when the list does not hold then what was loaded.
+double rebuild(int modules)
+{
+    const int lispFiles = modules * kLispFilesPerModule;
+    const bool loaded = loadModules(modules);
+    loadLispFiles(lispFiles);
+    const double seconds = bench::secondsOf(ModrigUtils::PopulateLoadedApps);
+    const auto listed = static_cast<int>(gLoadedAppList.GetCount());
+    return loaded && listed == modules + lispFiles ? seconds : -1;
+}
+
 // In a child: what is loaded for one size must not be there for the other.
 void addRebuild(const std::string& name, int modules)
 {
@@ -63,13 +78,11 @@ void addRebuild(const std::string& name, int modules)
                                      for (auto iteration : state)
                                      {
                                          static_cast<void>(iteration);
-                                         state.SetIterationTime(bench::inChild(
-                                             [modules]
-                                             {
-                                                 loadModules(modules);
-                                                 loadLispFiles(modules * kLispFilesPerModule);
-                                                 return bench::secondsOf(ModrigUtils::PopulateLoadedApps);
-                                             }));
+                                         const double seconds =
+                                             bench::inChild([modules] { return rebuild(modules); });
+                                         if (seconds < 0)
+                                             state.SkipWithError("not everything was loaded and listed");
+                                         state.SetIterationTime(seconds);
                                      }
                                  })
         ->UseManualTime()
@@ -95,18 +108,22 @@ const std::vector<CStdStr>& existingPaths()
     return paths;
 }
 
+// `check` answers whether the path is there.
 template <class Check>
 void addValidation(const std::string& name, Check check)
 {
     benchmark::RegisterBenchmark(name.c_str(),
                                  [check](benchmark::State& state)
                                  {
+                                     bool all = true;
                                      for (auto iteration : state)
                                      {
                                          static_cast<void>(iteration);
                                          for (const CStdStr& path : existingPaths())
-                                             benchmark::DoNotOptimize(check(path));
+                                             all = check(path) && all;
                                      }
+                                     if (!all)
+                                         state.SkipWithError("a path is not there");
                                  })
         ->Repetitions(kRepetitions)
         ->MinTime(0.05);
@@ -125,7 +142,8 @@ void addRebuildBenchmarks()
 
     const std::string bare = "validate 1000 paths, bare attribute calls";
     const std::string validated = "validate 1000 paths";
-    addValidation(bare, [](const CStdStr& path) { return GetFileAttributesW(path.c_str()); });
+    addValidation(bare, [](const CStdStr& path)
+                  { return GetFileAttributesW(path.c_str()) != INVALID_FILE_ATTRIBUTES; });
     addValidation(validated,
                   [](const CStdStr& path)
                   {

@@ -7,7 +7,6 @@
 #include <system_error>
 
 #include "host/app/Host.h"
-#include "module/DialogBridge.h"
 
 namespace bench
 {
@@ -68,14 +67,3 @@ void endCommand()
     host().run(L"VERSION");
 }
 } // namespace bench
-
-// No dialog is open in a benchmark.
-namespace ModrigUtils
-{
-void SetDialogMessage(const CStdStr&)
-{
-}
-void RunModrigDialog()
-{
-}
-} // namespace ModrigUtils

@@ -1,0 +1,216 @@
+// Opening the dialog's tables with a long History, and dropping many files on one: real windows over the real
+// host. Without a display the program starts one of its own.
+#include <benchmark/benchmark.h>
+#include <tessel/tsrxlinker.h>
+#include <tesselui/tsuidisplay.h>
+#include <tesselui/tsuieach.h>
+
+#include <cstdlib>
+#include <exception>
+#include <filesystem>
+#include <functional>
+#include <iostream>
+#include <optional>
+#include <string>
+
+#include "bench/Child.h"
+#include "bench/Ratios.h"
+#include "bench/Session.h"
+#include "module/Globals.h"
+#include "tests/ui/support/VirtualDisplay.h"
+#include "ui/platform/Platform.h"
+
+#import <AppKit/AppKit.h>
+
+#import "ui/ModrigController.h"
+#import "ui/ModrigFilePath.h"
+#import "ui/Paths.h"
+
+namespace
+{
+constexpr std::size_t kFewEntries = 1'000;
+constexpr std::size_t kManyEntries = 10'000;
+constexpr std::size_t kFewFiles = 10;
+constexpr std::size_t kManyFiles = 50;
+constexpr int kRepetitions = 15;
+
+std::wstring wide(const std::filesystem::path& path)
+{
+    const std::string text = path.string();
+    return {text.begin(), text.end()}; // the folder's name is plain
+}
+
+void fillHistory(std::size_t count)
+{
+    gHistoryList.RemoveAll();
+    for (std::size_t i = 0; i < count; ++i)
+        gHistoryList.AddTail(L"/home/user/Applications/library" + std::to_wstring(i / 100) + L"/tool" +
+                             std::to_wstring(i) + L".lsp");
+}
+
+// The main dialog in its panel, set up as for a run, without the run.
+class OpenDialog
+{
+public:
+    OpenDialog() : mController([[ModrigController alloc] init]), mPanel(ModrigPlatform::MakeOpenPanel())
+    {
+        [mController setupOpenPanel:mPanel];
+    }
+    ~OpenDialog()
+    {
+        [mController cleanOpenPanel:mPanel];
+        [mController release];
+    }
+    OpenDialog(const OpenDialog&) = delete;
+    OpenDialog& operator=(const OpenDialog&) = delete;
+
+    ModrigController* controller() const { return mController; }
+    NSUInteger rows(NSString* table) const
+    {
+        return [[[mController valueForKey:table] arrangedObjects] count];
+    }
+
+private:
+    ModrigController* mController;
+    NSOpenPanel* mPanel;
+};
+
+// Runs `once` again and again; it answers the seconds of what it measures, negative when that went wrong.
+void measure(const std::string& name, std::function<double()> once)
+{
+    const auto run = [once = std::move(once), name](benchmark::State& state)
+    {
+        for (auto iteration : state)
+        {
+            static_cast<void>(iteration);
+            NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+            const double seconds = once();
+            [pool drain];
+            if (seconds < 0)
+                state.SkipWithError((name + ": the table does not hold what it should").c_str());
+            state.SetIterationTime(seconds);
+        }
+    };
+    benchmark::RegisterBenchmark(name.c_str(), run)
+        ->UseManualTime()
+        ->Iterations(1)
+        ->Repetitions(kRepetitions);
+}
+
+// In a pool of its own: giving back what the work has left behind is part of its cost.
+double secondsInPool(const std::function<void()>& work)
+{
+    return bench::secondsOf(
+        [&]
+        {
+            NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+            work();
+            [pool drain];
+        });
+}
+
+// What opening does for the History's table, in a dialog that has opened without one.
+double openTable(std::size_t entries)
+{
+    gHistoryList.RemoveAll();
+    const OpenDialog dialog;
+    fillHistory(entries);
+    const double seconds = secondsInPool([&] { [dialog.controller() populateHistoryList]; });
+    return dialog.rows(@"historyList") == entries ? seconds : -1;
+}
+
+double giveToBareController(std::size_t entries)
+{
+    fillHistory(entries);
+    NSMutableArray* rows = [NSMutableArray array];
+    for (NSString* path : tsuiEach<NSString*>(ModrigUtils::StringsFromList(gHistoryList)))
+        [rows addObject:[[[ModrigFilePath alloc] initWithFilePathName:path] autorelease]];
+    NSArrayController* bare =
+        [[[NSArrayController alloc] initWithContent:[NSMutableArray array]] autorelease];
+    const double seconds = secondsInPool([&] { [bare addObjects:rows]; });
+    return [[bare arrangedObjects] count] == entries ? seconds : -1;
+}
+
+// Paths of modules that nothing has loaded.
+NSArray* modulePaths(std::size_t count)
+{
+    const auto folder = bench::workFolder() / "dropped";
+    std::filesystem::create_directories(folder);
+    NSMutableArray* paths = [NSMutableArray array];
+    for (std::size_t i = 0; i < count; ++i)
+    {
+        const auto path = folder / ("module" + std::to_string(i) + ".zmb");
+        std::filesystem::copy_file(BENCH_MODULE, path, std::filesystem::copy_options::skip_existing);
+        [paths addObject:ModrigUtils::StringFromPath(CStdStr(wide(path)))];
+    }
+    return paths;
+}
+
+void unload(NSArray* paths)
+{
+    TsRxDynamicLinker* linker = TsRxDynamicLinker::cast(tsrxSysRegistry()->at(TSRX_DYNAMIC_LINKER));
+    for (const CStdStr& path : ModrigUtils::PathsFromStrings(paths))
+        linker->unloadModule(path.c_str(), true);
+    gLoadedAppList.RemoveAll();
+}
+
+// A drop on the table of loaded applications, with a row for each file in both tables.
+double dropFiles(std::size_t files)
+{
+    gHistoryList.RemoveAll();
+    NSArray* paths = modulePaths(files);
+    const OpenDialog dialog;
+    [dialog.controller() setSaveHistory:YES];
+    const double seconds =
+        secondsInPool([&] { [dialog.controller() loadedAppsTableViewDropFiles:paths atRow:0]; });
+    const bool all = dialog.rows(@"loadedApps") == files && dialog.rows(@"historyList") == files;
+    unload(paths);
+    return all ? seconds : -1;
+}
+
+std::string opening(std::size_t entries)
+{
+    return "open tables, History of " + std::to_string(entries);
+}
+
+std::string dropping(std::size_t files)
+{
+    return "drop " + std::to_string(files) + " files";
+}
+
+void addBenchmarks()
+{
+    const std::string bare = "give 10000 rows to a bare array controller";
+    for (const std::size_t entries : {kFewEntries, kManyEntries})
+        measure(opening(entries), [entries] { return openTable(entries); });
+    measure(bare, [] { return giveToBareController(kManyEntries); });
+    for (const std::size_t files : {kFewFiles, kManyFiles})
+        measure(dropping(files), [files] { return dropFiles(files); });
+    bench::addRatio({opening(kManyEntries) + " / bare array controller", opening(kManyEntries), bare, 2});
+    bench::addRatio({"open tables, cost per entry at 10000 / at 1000", opening(kManyEntries),
+                     opening(kFewEntries), 1.5, kManyEntries, kFewEntries});
+    bench::addRatio({"drop, cost per file of 50 / of 10", dropping(kManyFiles), dropping(kFewFiles), 1.5,
+                     kManyFiles, kFewFiles});
+}
+} // namespace
+
+int main()
+try
+{
+    std::optional<VirtualDisplay> display;
+    if (!std::getenv("DISPLAY"))
+        setenv("DISPLAY", display.emplace().name().c_str(), 1);
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    bench::startHost();
+    if (!tsuiPrepareWindows())
+        return EXIT_FAILURE;
+    addBenchmarks();
+    const int missed = bench::runAll();
+    [pool drain];
+    return missed == 0 ? EXIT_SUCCESS : EXIT_FAILURE;
+}
+catch (const std::exception& error)
+{
+    std::cerr << error.what() << '\n';
+    return EXIT_FAILURE;
+}

@@ -1,0 +1,12 @@
+// The road to the dialogs, for benchmarks that open none.
+#include "module/DialogBridge.h"
+
+namespace ModrigUtils
+{
+void SetDialogMessage(const CStdStr&)
+{
+}
+void RunModrigDialog()
+{
+}
+} // namespace ModrigUtils
