@@ -36,12 +36,18 @@ bool ApplicationServices::isUrl(const wchar_t* text) const
 int ApplicationServices::fetchRemoteFile(const wchar_t* url, wchar_t* localPath, std::size_t capacity,
                                          bool ignoreCache)
 {
-    if (!services().remote || !localPath || capacity == 0)
+    if (!services().remote)
         return TS_FETCH_FAILED;
     if (!isUrl(url))
     {
         services().commandLine->say(L"\"" + std::wstring(url ? url : L"") +
                                     L"\" is no http or https address.");
+        return TS_FETCH_FAILED;
+    }
+    if (!localPath || capacity == 0)
+    {
+        services().commandLine->say(
+            std::wstring(url) + L" could not be fetched: there is no room for the path of its local copy.");
         return TS_FETCH_FAILED;
     }
     const RemoteFiles::Copy copy = services().remote->fetch(url, capacity - 1, ignoreCache);

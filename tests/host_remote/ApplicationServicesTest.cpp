@@ -2,8 +2,8 @@
 
 #include <gmock/gmock.h>
 
-#include "tests/host_remote/HttpServer.h"
 #include "tests/host_remote/RemoteHost.h"
+#include "tests/support/HttpServer.h"
 
 using testing::HasSubstr;
 using testing::IsEmpty;
@@ -70,8 +70,19 @@ TEST_F(ApplicationServices, RefuseWhatIsNoAddressWithASentence)
     EXPECT_EQ(services.fetchRemoteFile(L"file:///etc/passwd", path, kRoom, false), TS_FETCH_FAILED);
     EXPECT_EQ(host.output().text(), "\"file:///etc/passwd\" is no http or https address.\n");
     EXPECT_EQ(services.fetchRemoteFile(nullptr, path, kRoom, false), TS_FETCH_FAILED);
+    EXPECT_STREQ(path, L"untouched");
+    EXPECT_THAT(host.stored(), IsEmpty());
+}
+
+TEST_F(ApplicationServices, SayThatThereIsNoRoomForThePathAtAll)
+{
+    const std::string sentence =
+        "http://x could not be fetched: there is no room for the path of its local copy.\n";
+    wchar_t path[kRoom] = L"untouched";
     EXPECT_EQ(services.fetchRemoteFile(L"http://x", nullptr, kRoom, false), TS_FETCH_FAILED);
+    EXPECT_EQ(host.output().text(), sentence);
     EXPECT_EQ(services.fetchRemoteFile(L"http://x", path, 0, false), TS_FETCH_FAILED);
+    EXPECT_EQ(host.output().text(), sentence + sentence);
     EXPECT_STREQ(path, L"untouched");
     EXPECT_THAT(host.stored(), IsEmpty());
 }

@@ -7,9 +7,9 @@
 
 #include <tessel/tsdefs.h>
 
-#include "tests/host_remote/HttpServer.h"
 #include "tests/host_remote/RemoteHost.h"
 #include "tests/host_store/ChildProcess.h"
+#include "tests/support/HttpServer.h"
 
 using testing::AllOf;
 using testing::HasSubstr;

@@ -5,9 +5,9 @@
 
 #include <tessel/tsdefs.h>
 
-#include "tests/host_remote/HttpServer.h"
 #include "tests/host_remote/RemoteHost.h"
 #include "tests/host_store/CaseName.h"
+#include "tests/support/HttpServer.h"
 
 namespace fs = std::filesystem;
 

@@ -10,8 +10,8 @@
 
 #include <tessel/tsdefs.h>
 
-#include "tests/host_remote/HttpServer.h"
 #include "tests/host_remote/RemoteHost.h"
+#include "tests/support/HttpServer.h"
 
 namespace fs = std::filesystem;
 

@@ -8,7 +8,7 @@
 
 #include "host/Services.h"
 #include "host/remote/RemoteFiles.h"
-#include "tests/host_remote/HttpServer.h"
+#include "tests/support/HttpServer.h"
 
 using testing::AllOf;
 using testing::ElementsAre;

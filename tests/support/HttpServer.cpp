@@ -1,4 +1,4 @@
-#include "tests/host_remote/HttpServer.h"
+#include "tests/support/HttpServer.h"
 
 #include <stdexcept>
 
