@@ -44,6 +44,11 @@ public:
     // A compiled application, not loaded yet.
     virtual std::wstring makeModule(const std::wstring& name, ContractModule behaviour) = 0;
 
+    // A file on a web server that the host can reach; the answer is its URL.
+    virtual std::wstring serve(const std::wstring& name) = 0;
+    // The server has no such file any more.
+    virtual void stopServing(const std::wstring& name) = 0;
+
     virtual void setVariable(const std::wstring& name, const RecordingValue& value) = 0;
     virtual void searchIn(const std::vector<std::wstring>& folders) = 0;
 

@@ -6,6 +6,7 @@
 namespace
 {
 constexpr const wchar_t* kFolder = L"/contract/";
+constexpr const wchar_t* kServer = L"http://contract.test/";
 
 RecordingLinker::EntryPoint entryPoint(ContractModule behaviour)
 {
@@ -69,6 +70,18 @@ public:
     {
         recordingHost().linker.setEntryPoint(kFolder + name, entryPoint(behaviour));
         return kFolder + name;
+    }
+
+    std::wstring serve(const std::wstring& name) override
+    {
+        recordingHost().applicationServices.remotes[kServer + name] = {TS_FETCHED,
+                                                                       kFolder + (L"copies/" + name)};
+        return kServer + name;
+    }
+
+    void stopServing(const std::wstring& name) override
+    {
+        recordingHost().applicationServices.remotes.erase(kServer + name);
     }
 
     void setVariable(const std::wstring& name, const RecordingValue& value) override

@@ -2,7 +2,6 @@
 #include <tessel/tsed.h>
 #include <tessel/tsedcommands.h>
 #include <tessel/tshostservices.h>
-#include <tessel/tsinet.h>
 #include <tessel/tsmessagebox.h>
 #include <tessel/tsrxlinker.h>
 #include <wincompat/winreg.h>
@@ -73,38 +72,6 @@ TEST_F(ServicesContract, HasACurrentProfileFromItsFirstStart)
     EXPECT_EQ(tsRegGetValue(key, L"", 0, &type, name, &size), ERROR_SUCCESS);
     EXPECT_STRNE(name, L"");
     RegCloseKey(key);
-}
-
-TEST_F(ServicesContract, KnowsAUrlThatItCanFetch)
-{
-    TsDbHostApplicationServices* services = tsdbHostApplicationServices();
-    for (const wchar_t* url :
-         {L"http://example.test/tool.lsp", L"https://example.test", L"HTTPS://Example.Test/"})
-        EXPECT_TRUE(services->isUrl(url));
-    for (const wchar_t* text :
-         {L"", L"/a/tool.lsp", L"tool.lsp", L"http:", L"http://", L"ftp://example.test/tool.lsp",
-          L"file:///a/tool.lsp", L"C:\\a\\tool.lsp", L" http://example.test/"})
-        EXPECT_FALSE(services->isUrl(text)) << testing::PrintToString(text);
-}
-
-TEST_F(ServicesContract, SaysWhyAUrlCannotBeFetched)
-{
-    // Nobody listens at the discard port of this machine.
-    const std::wstring url = L"http://127.0.0.1:9/tool.lsp";
-    wchar_t path[kPathSize] = {};
-    EXPECT_EQ(tsdbHostApplicationServices()->fetchRemoteFile(url.c_str(), path, kPathSize, false),
-              TS_FETCH_FAILED);
-    EXPECT_TRUE(contains(host->seen(), url));
-}
-
-TEST_F(ServicesContract, TakesAnOrdinaryFileForNoRemoteFile)
-{
-    CProxyInet* proxy = CProxyInet::GetProxyInet();
-    ASSERT_NE(proxy, nullptr);
-    wchar_t url[kPathSize] = {};
-    EXPECT_FALSE(proxy->IsRemoteFile(host->makeFile(L"tool.lsp").c_str(), url, kPathSize));
-    EXPECT_FALSE(proxy->IsRemoteFile(L"/none/tool.lsp", url, kPathSize));
-    EXPECT_FALSE(proxy->IsRemoteFile(L"", url, kPathSize));
 }
 
 TEST_F(ServicesContract, ShowsAMessageAndAnswersItsButton)

@@ -1,10 +1,12 @@
 // The reference host, in this process, with its profile and the test's files in a throwaway folder.
 #include <cstdlib>
+#include <set>
 #include <stdexcept>
 
 #include "host/app/Host.h"
 #include "host/text/Unicode.h"
 #include "tests/contract/HostUnderTest.h"
+#include "tests/support/HttpServer.h"
 #include "tests/support/TemporaryFolder.h"
 
 namespace
@@ -114,6 +116,14 @@ public:
         return toText(module);
     }
 
+    std::wstring serve(const std::wstring& name) override
+    {
+        mServed.insert(tessel::toUtf8(L"/" + name));
+        return mServer.url(L"/" + name);
+    }
+
+    void stopServing(const std::wstring& name) override { mServed.erase(tessel::toUtf8(L"/" + name)); }
+
     void setVariable(const std::wstring& name, const RecordingValue& value) override
     {
         const std::wstring text = value.type == TS_STRING ? value.text : std::to_wstring(value.number);
@@ -166,10 +176,21 @@ private:
                 }};
     }
 
+    HttpServer::Answer answerTo(const std::string& target) const
+    {
+        const bool isServed = mServed.contains(target);
+        return {httpAnswer(isServed ? "200 OK" : "404 Not Found", target), "", {}};
+    }
+
     fs::path mFolderBefore = fs::current_path();
     TemporaryFolder mFolder;
     std::string mOutput;
     tessel::Host mHost;
+    std::set<std::string> mServed; // changed only between requests
+    HttpServer mServer{[this](const std::string& target)
+                       {
+                           return answerTo(target);
+                       }};
 };
 } // namespace
 

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <map>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -21,7 +22,8 @@ public:
         int status = TS_FETCH_FAILED;
         std::wstring localPath;
     };
-    // What fetching a URL answers (exact text); others fail.
+    // What fetching a URL answers (exact text); others fail. What was fetched (TS_FETCHED) is a file and a
+    // known copy from then on, and is taken from the cache the next time.
     std::map<std::wstring, Remote> remotes;
 
     struct Fetch
@@ -40,6 +42,9 @@ public:
     bool isUrl(const wchar_t* text) const override; // http:// or https:// and something behind it
     int fetchRemoteFile(const wchar_t* url, wchar_t* localPath, std::size_t capacity,
                         bool ignoreCache) override;
+
+private:
+    Remote answerTo(const std::wstring& url, bool ignoreCache) const;
 };
 
 class RecordingInternet : public CProxyInet
@@ -47,10 +52,13 @@ class RecordingInternet : public CProxyInet
 public:
     bool exists = true; // false: `GetProxyInet` answers null
 
-    // The files that are copies of remote ones, and where they came from.
+    // The files that are copies of remote ones, and where they came from; what is fetched joins them.
     std::map<std::wstring, std::wstring> urlsOfLocalFiles;
     // The paths that were asked about, in order.
     mutable std::vector<std::wstring> asked;
 
     bool IsRemoteFile(const wchar_t* localPath, wchar_t* url, std::size_t capacity) const override;
+
+    // The local copy of a URL, if there is one.
+    std::optional<std::wstring> copyOf(const std::wstring& url) const;
 };
