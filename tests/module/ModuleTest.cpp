@@ -42,7 +42,7 @@ void ModuleTest::SetUp()
 
 void ModuleTest::TearDown()
 {
-    EXPECT_EQ(0u, host().registry.openHandles());
+    CTemporaryResourceOverride::ReleaseDefaultResource();
 }
 
 std::wstring Message(unsigned id, const std::wstring& argument)

@@ -16,7 +16,7 @@ class ModuleTest : public testing::Test
 {
 protected:
     void SetUp() override;
-    // Whatever a test did: no registry key stays open.
+    // Ends the module as far as a test has started it: the texts are what it keeps between two calls.
     void TearDown() override;
 
     static RecordingHost& host() { return recordingHost(); }

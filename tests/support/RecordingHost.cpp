@@ -4,6 +4,8 @@
 #include <memory>
 #include <utility>
 
+#include "tests/support/recording/RecordingLoans.h"
+
 namespace
 {
 constexpr const wchar_t* kFirstProfile = L"Default";
@@ -16,6 +18,7 @@ RecordingHost::RecordingHost()
 
 void RecordingHost::reset()
 {
+    recording_loans::forgetAll();
     // Made anew in place: the parts keep their addresses, which a module under test may have kept.
     std::destroy_at(this);
     std::construct_at(this);

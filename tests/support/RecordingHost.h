@@ -17,6 +17,8 @@
 // (what `RemovingTsLISP` answers during static initialisation); with the module's logic also
 // `recording_dialog` (see RecordingDialog.h).
 //
+// Whatever the SDK has the caller give back is watched: a test that ends before it has been given back fails.
+//
 // Untold, the host behaves like a real one that has just been started: every application loads, there is one
 // profile, one empty document, no file, no variable, no resource module. Each part below says in its own
 // header what can be told and what is remembered.

@@ -5,8 +5,11 @@
 #include <tessel/tsed.h>
 #include <tessel/tsformat.h>
 
+#include "tests/support/recording/RecordingLoans.h"
+
 using testing::ElementsAre;
 using testing::IsEmpty;
+using testing::UnorderedElementsAre;
 
 namespace
 {
@@ -85,6 +88,7 @@ TEST_F(RecordingHostTest, FailsForTheCallsThatATestPicks)
     EXPECT_EQ(tsudRegSetString(key, L"2History", L"2"), ERROR_ACCESS_DENIED);
     EXPECT_EQ(host.registry.value(L"Key", L"1History"), L"1");
     EXPECT_EQ(host.registry.value(L"Key", L"2History"), std::nullopt);
+    EXPECT_EQ(RegCloseKey(key), ERROR_SUCCESS);
 }
 
 TEST_F(RecordingHostTest, MissesAServiceOrGivesAnotherForIt)
@@ -142,6 +146,37 @@ TEST_F(RecordingHostTest, AnswersFetchesAsTold)
     EXPECT_STREQ(path, L"/copy");
     EXPECT_EQ(host.applicationServices.fetchRemoteFile(L"http://a/c", path, 16, true), TS_FETCH_FAILED);
     EXPECT_EQ(host.applicationServices.fetches.back().ignoreCache, true);
+}
+
+TEST_F(RecordingHostTest, KnowsWhatHasNotBeenGivenBack)
+{
+    host.resources.addModule(L"Texts.dll", {});
+    host.variables.set(L"TEXT", RecordingValue::String(L"text"));
+    TsResultBuffer* list = tsutBuildList({TsRbValue::String(L"name"), TsRbValue::Short(1)});
+    TsResultBuffer variable = {};
+    tsedGetVar(L"TEXT", &variable);
+    const HMODULE module = LoadLibrary(L"Texts.dll");
+    const HKEY key = create(L"Key");
+    auto record = std::make_unique<TesselAppInfo>();
+    EXPECT_THAT(recording_loans::outstanding(),
+                UnorderedElementsAre("result buffer", "result buffer", "string of a variable",
+                                     "resource module", "registry key", "application record"));
+    tsutRelRb(list);
+    delete[] variable.value.string;
+    EXPECT_NE(FreeLibrary(module), 0);
+    EXPECT_EQ(RegCloseKey(key), ERROR_SUCCESS);
+    record.reset();
+    EXPECT_THAT(recording_loans::outstanding(), IsEmpty());
+}
+
+TEST_F(RecordingHostTest, MissesOnlyTheValuesOfAListThatAreNotGivenBack)
+{
+    TsResultBuffer* list = tsutBuildList({TsRbValue::Short(1), TsRbValue::Short(2), TsRbValue::Short(3)});
+    TsResultBuffer* rest = list->next;
+    list->next = nullptr;
+    tsutRelRb(list);
+    EXPECT_THAT(recording_loans::outstanding(), ElementsAre("result buffer", "result buffer"));
+    tsutRelRb(rest);
 }
 
 TEST_F(RecordingHostTest, RefusesCommandsAndRecordsAsTold)

@@ -2,6 +2,7 @@
 
 #include "host/text/Unicode.h"
 #include "tests/support/RecordingHost.h"
+#include "tests/support/recording/RecordingLoans.h"
 
 struct TesselAppInfo::Record : RecordingApplicationRecord
 {
@@ -28,8 +29,13 @@ std::optional<RecordingApplicationRecord> RecordingApplicationRecords::find(cons
 
 TesselAppInfo::TesselAppInfo() : mRecord(std::make_unique<Record>())
 {
+    recording_loans::lend(this, "application record");
 }
-TesselAppInfo::~TesselAppInfo() = default;
+
+TesselAppInfo::~TesselAppInfo()
+{
+    recording_loans::takeBack(this);
+}
 
 void TesselAppInfo::setAppName(const wchar_t* name)
 {

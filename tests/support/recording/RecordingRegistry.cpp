@@ -8,6 +8,7 @@
 
 #include "host/text/Unicode.h"
 #include "tests/support/RecordingHost.h"
+#include "tests/support/recording/RecordingLoans.h"
 
 namespace
 {
@@ -261,8 +262,10 @@ LONG RecordingRegistry::close(HKEY key)
     if (!path)
         return key == HKEY_CURRENT_USER ? ERROR_SUCCESS : ERROR_INVALID_HANDLE;
     const LONG status = record({.operation = Operation::kClose, .key = *path});
-    if (status == ERROR_SUCCESS)
-        mOpen.remove_if([path](const std::wstring& open) { return &open == path; });
+    if (status != ERROR_SUCCESS)
+        return status;
+    recording_loans::takeBack(key);
+    mOpen.remove_if([path](const std::wstring& open) { return &open == path; });
     return status;
 }
 
@@ -329,7 +332,9 @@ LONG RecordingRegistry::resolve(HKEY root, const wchar_t* subKey, std::wstring& 
 
 HKEY RecordingRegistry::newHandle(const std::wstring& path)
 {
-    return &mOpen.emplace_back(path);
+    const HKEY key = &mOpen.emplace_back(path);
+    recording_loans::lend(key, "registry key");
+    return key;
 }
 
 LONG RecordingRegistry::record(Call call)

@@ -4,6 +4,7 @@
 #include <cwchar>
 
 #include "tests/support/RecordingHost.h"
+#include "tests/support/recording/RecordingLoans.h"
 
 namespace
 {
@@ -72,7 +73,9 @@ HMODULE LoadLibrary(const wchar_t* name)
     host.journal.add(L"LoadLibrary", {name});
     host.resources.requested.emplace_back(name);
     const HMODULE module = host.resources.load(name);
-    if (!module)
+    if (module)
+        recording_loans::lend(module, "resource module");
+    else
         host.output.say(std::wstring(L"Cannot open the resource module ") + name + L".");
     return module;
 }
@@ -82,6 +85,7 @@ int FreeLibrary(HMODULE module)
     RecordingHost& host = recordingHost();
     host.journal.add(L"FreeLibrary", {host.resources.nameOf(module)});
     host.resources.freed.push_back(module);
+    recording_loans::takeBack(module);
     return host.resources.free(module) ? 1 : 0;
 }
 
