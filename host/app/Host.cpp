@@ -13,6 +13,7 @@
 #include "host/documents/Document.h"
 #include "host/filesearch/FileSearch.h"
 #include "host/help/Help.h"
+#include "host/linker/AutoreleasePool.h"
 #include "host/linker/CallingApplication.h"
 #include "host/linker/DynamicLinker.h"
 #include "host/lisp/LispInterpreter.h"
@@ -70,6 +71,7 @@ Host::~Host()
 
 bool Host::start()
 {
+    const AutoreleasePool pool;
     if (anotherRuns() || !prepareProfileFolder())
         return false;
     services().commandLine = &mCommandLine;
@@ -157,6 +159,7 @@ void Host::addCommands()
 
 bool Host::run(const std::wstring& input)
 {
+    const AutoreleasePool pool;
     if (!isLisp(input))
         return mParts->commands.run(input);
     const auto outcome = mParts->lisp->evaluate(input);
@@ -191,6 +194,7 @@ void Host::end()
 {
     if (!mParts)
         return;
+    const AutoreleasePool pool;
     // A Lisp file may have left its prompt behind; what applications say at the end is not part of it.
     if (!mCommandLine.atLineStart())
         mCommandLine.print(L"\n");

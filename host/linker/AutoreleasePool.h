@@ -1,19 +1,17 @@
-// What the platform allocates in a scope goes at its end. For Objective-C++ only.
+// What applications and the platform leave to be released later goes at the end of a scope. These nest.
 #pragma once
-
-#import <Foundation/NSAutoreleasePool.h>
 
 namespace tessel
 {
 class AutoreleasePool
 {
 public:
-    AutoreleasePool() : mPool([[NSAutoreleasePool alloc] init]) {}
-    ~AutoreleasePool() { [mPool drain]; }
+    AutoreleasePool();
+    ~AutoreleasePool();
     AutoreleasePool(const AutoreleasePool&) = delete;
     AutoreleasePool& operator=(const AutoreleasePool&) = delete;
 
 private:
-    NSAutoreleasePool* mPool;
+    void* mPool; // of a class that only Objective-C knows
 };
 } // namespace tessel

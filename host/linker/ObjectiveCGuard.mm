@@ -11,11 +11,11 @@ namespace tessel
 {
 std::optional<std::wstring> catchObjectiveC(const std::function<void()>& call)
 {
-    const AutoreleasePool pool;
     const id thrown = tesselCatch(
         [](const void* context) { (*static_cast<const std::function<void()>*>(context))(); }, &call);
     if (!thrown)
         return std::nullopt;
+    const AutoreleasePool pool;
     NSString* text = [thrown isKindOfClass:[NSException class]]
                          ? [NSString stringWithFormat:@"%@: %@", [(NSException*)thrown name],
                                                       [(NSException*)thrown reason]]
