@@ -3,12 +3,18 @@
 #pragma once
 
 #include <functional>
+#include <string>
+#include <vector>
 
 namespace bench
 {
 // Runs the work in a fork of this process and answers the seconds that it answered; negative when the child
 // did not come to its end.
 double inChild(const std::function<double()>& work);
+
+// Runs this program anew with the arguments and answers the seconds that it printed; negative when it did not
+// end well.
+double inNewProcess(const std::vector<std::string>& arguments);
 
 // Seconds of processor time, the system's included, that the work takes of this process. Machines are shared:
 // what others do meanwhile lengthens the time on the clock, of long runs more often than of short ones.

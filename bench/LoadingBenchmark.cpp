@@ -1,13 +1,14 @@
 // Loading 500 compiled modules: the module's loader against the host's linker, the bare system calls, and the
 // module loaders of two toolkits. Every run is a new process, since a library is mapped for the first time
-// once.
+// once; and a whole one with a host of its own, since a fork would pay for every page of memory that it is
+// the first to write to.
 #include <benchmark/benchmark.h>
 #include <dlfcn.h>
 #include <gmodule.h>
 #include <tessel/tsrxlinker.h>
 
 #include <QLibrary>
-#include <functional>
+#include <filesystem>
 #include <string>
 #include <vector>
 
@@ -23,29 +24,23 @@ constexpr int kModules = 500;
 constexpr int kRepetitions = 15;
 constexpr const char* kEntry = "tsrxEntryPoint";
 
-const std::vector<std::string>& modules()
+std::filesystem::path moduleIn(const std::filesystem::path& folder, int number)
 {
-    static const std::vector<std::string> paths = []
-    {
-        std::vector<std::string> made;
-        const auto folder = bench::workFolder() / "modules";
-        std::filesystem::create_directories(folder);
-        for (int i = 0; i < kModules; ++i)
-        {
-            made.push_back((folder / ("module" + std::to_string(i) + ".zmb")).string());
-            std::filesystem::copy_file(BENCH_MODULE, made.back());
-        }
-        return made;
-    }();
-    return paths;
+    return folder / ("module" + std::to_string(number) + ".zmb");
 }
 
-std::vector<std::wstring> widePaths()
+// The modules, made once.
+const std::filesystem::path& moduleFolder()
 {
-    std::vector<std::wstring> wide;
-    for (const std::string& path : modules())
-        wide.emplace_back(path.begin(), path.end()); // the folder's name is plain
-    return wide;
+    static const std::filesystem::path folder = []
+    {
+        auto made = bench::workFolder() / "modules";
+        std::filesystem::create_directories(made);
+        for (int i = 0; i < kModules; ++i)
+            std::filesystem::copy_file(BENCH_MODULE, moduleIn(made, i));
+        return made;
+    }();
+    return folder;
 }
 
 bool callEntry(void* entry)
@@ -85,7 +80,7 @@ bool loadByModrig(const std::wstring& path)
 }
 
 template <class Path>
-double secondsForAll(const std::vector<Path>& paths, const std::function<bool(const Path&)>& load)
+double secondsForAll(const std::vector<Path>& paths, bool (*load)(const Path&))
 {
     bool all = true;
     const double seconds = bench::secondsOf(
@@ -97,38 +92,82 @@ double secondsForAll(const std::vector<Path>& paths, const std::function<bool(co
     return all ? seconds : -1;
 }
 
-template <class Path>
-void measure(const char* name, std::vector<Path> paths, std::function<bool(const Path&)> load)
+struct Loader
 {
-    const auto run = [paths = std::move(paths), load = std::move(load)](benchmark::State& state)
+    const char* name;
+    double (*secondsForAll)(const std::vector<std::string>& paths);
+};
+
+template <bool (*kLoad)(const std::string&)>
+double secondsBy(const std::vector<std::string>& paths)
+{
+    return secondsForAll(paths, kLoad);
+}
+
+template <bool (*kLoad)(const std::wstring&)>
+double secondsBy(const std::vector<std::string>& paths)
+{
+    std::vector<std::wstring> wide;
+    for (const std::string& path : paths)
+        wide.emplace_back(path.begin(), path.end()); // the folder's name is plain
+    return secondsForAll(wide, kLoad);
+}
+
+constexpr Loader kLoaders[] = {{"bare dlopen and entry", secondsBy<loadBare>},
+                               {"GModule", secondsBy<loadByGModule>},
+                               {"QLibrary", secondsBy<loadByQLibrary>},
+                               {"host linker", secondsBy<loadByHostLinker>},
+                               {"PerformModrig", secondsBy<loadByModrig>}};
+
+std::string benchmarkOf(const std::string& loader)
+{
+    return "load 500: " + loader;
+}
+
+void add(const Loader& loader)
+{
+    const auto run = [name = std::string(loader.name)](benchmark::State& state)
     {
         for (auto iteration : state)
         {
             static_cast<void>(iteration);
-            const double seconds = bench::inChild([&] { return secondsForAll<Path>(paths, load); });
+            const double seconds = bench::inNewProcess({"load", name, moduleFolder().string()});
             if (seconds < 0)
                 state.SkipWithError("not every module was loaded");
             state.SetIterationTime(seconds);
         }
     };
-    benchmark::RegisterBenchmark(name, run)->UseManualTime()->Iterations(1)->Repetitions(kRepetitions);
+    benchmark::RegisterBenchmark(benchmarkOf(loader.name).c_str(), run)
+        ->UseManualTime()
+        ->Iterations(1)
+        ->Repetitions(kRepetitions);
+}
+
+void addLoadingRatio(const std::string& what, const std::string& base, double most = 0)
+{
+    bench::addRatio({what + " / " + base + ", 500 modules", benchmarkOf(what), benchmarkOf(base), most});
 }
 } // namespace
 
+double secondsToLoad(const std::string& loader, const std::string& folder)
+{
+    std::vector<std::string> paths;
+    for (int i = 0; i < kModules; ++i)
+        paths.push_back(moduleIn(folder, i).string());
+    bench::startHost();
+    for (const Loader& known : kLoaders)
+        if (loader == known.name)
+            return known.secondsForAll(paths);
+    return -1;
+}
+
 void addLoadingBenchmarks()
 {
-    bench::startHost();
-    measure<std::string>("load 500: bare dlopen and entry", modules(), loadBare);
-    measure<std::string>("load 500: GModule", modules(), loadByGModule);
-    measure<std::string>("load 500: QLibrary", modules(), loadByQLibrary);
-    measure<std::wstring>("load 500: host linker", widePaths(), loadByHostLinker);
-    measure<std::wstring>("load 500: PerformModrig", widePaths(), loadByModrig);
-    bench::addRatio({"PerformModrig / host linker, 500 modules", "load 500: PerformModrig",
-                     "load 500: host linker", 1.05});
-    bench::addRatio({"PerformModrig / bare dlopen and entry", "load 500: PerformModrig",
-                     "load 500: bare dlopen and entry", 1.3});
-    bench::addRatio({"PerformModrig / QLibrary", "load 500: PerformModrig", "load 500: QLibrary", 1.0});
-    bench::addRatio({"PerformModrig / GModule", "load 500: PerformModrig", "load 500: GModule"});
-    bench::addRatio(
-        {"QLibrary / bare dlopen and entry", "load 500: QLibrary", "load 500: bare dlopen and entry"});
+    for (const Loader& loader : kLoaders)
+        add(loader);
+    addLoadingRatio("PerformModrig", "host linker", 1.05);
+    addLoadingRatio("PerformModrig", "bare dlopen and entry", 1.3);
+    addLoadingRatio("PerformModrig", "QLibrary", 1.0);
+    addLoadingRatio("PerformModrig", "GModule");
+    addLoadingRatio("QLibrary", "bare dlopen and entry");
 }

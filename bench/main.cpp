@@ -2,10 +2,12 @@
 // missed.
 #include <cstdio>
 #include <cstring>
+#include <string>
 
 #include "bench/Ratios.h"
 
 void addLoadingBenchmarks();
+double secondsToLoad(const std::string& loader, const std::string& folder);
 void addListBenchmarks();
 void addRebuildBenchmarks();
 void addStartBenchmarks();
@@ -28,6 +30,12 @@ constexpr Group kGroups[] = {{"loading", addLoadingBenchmarks},
 
 int main(int argc, char** argv)
 {
+    if (argc == 4 && std::strcmp(argv[1], "load") == 0)
+    {
+        const double seconds = secondsToLoad(argv[2], argv[3]);
+        std::printf("%.9f\n", seconds);
+        return seconds < 0 ? 1 : 0;
+    }
     const char* wanted = argc == 2 ? argv[1] : "";
     for (const Group& group : kGroups)
     {
