@@ -6,29 +6,53 @@ using testing::Not;
 
 class DialogBrowser : public DialogTest
 {
+protected:
+    // With Add to History switched on.
+    void loadGearsAndPrimesTogether()
+    {
+        copySample("gears.omp");
+        copySample("primes.zmb");
+        open();
+        click(places::kAddToHistory);
+        click(places::file(0));
+        mScreen.clickHolding("shift", mDialog, places::file(1));
+        shoot("selected");
+        click(places::kLoad);
+        EXPECT_TRUE(prints("2 applications were loaded.\n"));
+        shoot("loaded");
+    }
 };
 
 TEST_F(DialogBrowser, LoadsTwoFilesThatAreSelectedTogether)
 {
-    writeLisp("a.lsp");
-    writeLisp("b.lsp");
-    open();
-    click(places::kAddToHistory);
-    click(places::file(0));
-    mScreen.clickHolding("shift", mDialog, places::file(1));
-    shoot("selected");
-    click(places::kLoad);
-    EXPECT_TRUE(prints("2 applications were loaded."));
-    shoot("loaded");
+    loadGearsAndPrimesTogether();
+    const std::string output = closeAndEnd();
+    EXPECT_THAT(output, HasSubstr(listedIn("gears.omp", files())));
+    EXPECT_THAT(output, HasSubstr(listedIn("primes.zmb", files())));
+    EXPECT_EQ(stored("History"), "NumHistory = 2\n1History = " + (files() / "gears.omp").string() +
+                                     "\n2History = " + (files() / "primes.zmb").string() + "\n");
+}
+
+// Each row does what only its own file can have done.
+TEST_F(DialogBrowser, ShowsTwoLoadedFilesInBothTables)
+{
+    loadGearsAndPrimesTogether();
+    click(places::tableRow(0));
+    click(places::kUnload);
+    EXPECT_TRUE(prints("gears.omp was unloaded.\n"));
+    shoot("first-unloaded");
+    click(places::tableRow(0)); // the second file has moved up
+    click(places::kUnload);
+    EXPECT_TRUE(prints("primes.zmb was unloaded.\n"));
+    shoot("second-unloaded");
     click(places::kHistoryTab);
     shoot("history");
-    const std::string output = closeAndEnd();
-    EXPECT_THAT(output, HasSubstr("a.lsp runs"));
-    EXPECT_THAT(output, HasSubstr("b.lsp runs"));
-    EXPECT_THAT(output, HasSubstr(listedIn("a.lsp", files())));
-    EXPECT_THAT(output, HasSubstr(listedIn("b.lsp", files())));
-    EXPECT_EQ(stored("History"), "NumHistory = 2\n1History = " + (files() / "a.lsp").string() +
-                                     "\n2History = " + (files() / "b.lsp").string() + "\n");
+    mScreen.doubleClick(mDialog, places::tableRow(0));
+    EXPECT_TRUE(prints(wasLoaded("gears.omp")));
+    mScreen.doubleClick(mDialog, places::tableRow(1));
+    EXPECT_TRUE(prints(wasLoaded("primes.zmb")));
+    shoot("loaded-again");
+    closeAndEnd();
 }
 
 TEST_F(DialogBrowser, ReturnLoadsTheFileWhoseNameIsTyped)
@@ -52,7 +76,22 @@ TEST_F(DialogBrowser, ReturnLoadsTheFileThatIsSelected)
     click(places::file(0));
     mScreen.key("Return");
     EXPECT_TRUE(prints(wasLoaded("chosen.lsp")));
+    shoot("loaded");
     EXPECT_THAT(closeAndEnd(), HasSubstr("chosen.lsp runs"));
+}
+
+TEST_F(DialogBrowser, LoadsAFileByADoubleClick)
+{
+    writeLisp("a.lsp");
+    writeLisp("b.lsp");
+    open();
+    mScreen.doubleClick(mDialog, places::file(1));
+    EXPECT_TRUE(prints(wasLoaded("b.lsp")));
+    shoot("loaded");
+    const std::string output = closeAndEnd();
+    EXPECT_THAT(output, HasSubstr("b.lsp runs"));
+    EXPECT_EQ(output.find("b.lsp runs"), output.rfind("b.lsp runs")) << "once: " << output;
+    EXPECT_THAT(output, Not(HasSubstr("a.lsp")));
 }
 
 TEST_F(DialogBrowser, SaysThatAFileIsLoadedAlready)
@@ -90,6 +129,7 @@ TEST_F(DialogBrowser, StopsAtTheFileThatCannotBeLoaded)
     EXPECT_THAT(output, HasSubstr("b.zmb\" is not loaded: "));
     EXPECT_THAT(output, Not(HasSubstr(listedIn("b.zmb", files()))));
     EXPECT_THAT(output, Not(HasSubstr("c.lsp")));
+    EXPECT_THAT(output, Not(HasSubstr("loaded.\n"))) << "nothing was completed that could be summed up";
 }
 
 TEST_F(DialogBrowser, ShowsTheFilesOfTheChosenTypeOnly)

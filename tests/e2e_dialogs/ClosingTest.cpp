@@ -12,6 +12,7 @@ TEST_F(DialogClosing, ByEscapeLeavesAHostThatGoesOn)
     open();
     mScreen.key("Escape");
     EXPECT_TRUE(mScreen.waitUntilGone(kDialog));
+    shoot("closed");
     mHost->type("VERSION");
     EXPECT_THAT(end(), HasSubstr("Command: VERSION\nTessel R21"));
 }
@@ -21,12 +22,16 @@ TEST_F(DialogClosing, ByTheWindowsCloseButtonLeavesAHostThatGoesOn)
     open();
     mScreen.clickCloseButton(mDialog, places::kDialogWidth);
     EXPECT_TRUE(mScreen.waitUntilGone(kDialog));
+    shoot("closed");
     mHost->type("VERSION");
     EXPECT_THAT(end(), HasSubstr("Command: VERSION\nTessel R21"));
 }
 
 TEST_F(DialogClosing, RemembersTheTabAndTheCheckBox)
 {
+    const std::string first = writeLisp("a.lsp");
+    const std::string second = writeLisp("b.lsp");
+    storeHistory({first});
     open();
     click(places::kAddToHistory);
     click(places::kHistoryTab);
@@ -35,8 +40,24 @@ TEST_F(DialogClosing, RemembersTheTabAndTheCheckBox)
     EXPECT_EQ(storedSetting("SaveHistory"), "1\n");
     EXPECT_EQ(storedSetting("LastTab"), "1\n");
     open();
+    mScreen.doubleClick(mDialog, places::tableRow(0)); // only the tab of the History has this row
+    EXPECT_TRUE(prints(wasLoaded("a.lsp")));
+    click(places::file(1));
+    click(places::kLoad);
+    EXPECT_TRUE(prints(wasLoaded("b.lsp")));
+    shoot("loaded");
+    closeAndEnd();
+    EXPECT_EQ(stored("History"), "NumHistory = 2\n1History = " + first + "\n2History = " + second + "\n");
+}
+
+TEST_F(DialogClosing, RemembersThatTheTabAndTheCheckBoxWereChangedBack)
+{
+    setSetting("SaveHistory", "1");
+    setSetting("LastTab", "1");
+    open();
     click(places::kAddToHistory);
     click(places::kLoadedTab);
+    shoot("changed-back");
     closeAndEnd();
     EXPECT_EQ(storedSetting("SaveHistory"), "0\n");
     EXPECT_EQ(storedSetting("LastTab"), "0\n");

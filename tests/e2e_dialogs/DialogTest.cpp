@@ -124,6 +124,17 @@ std::string DialogTest::end()
     return mHost->output();
 }
 
+void DialogTest::press(const std::string& key, int times) const
+{
+    for (int time = 0; time < times; ++time)
+        mScreen.key(key);
+}
+
+bool DialogTest::changes(Place place, const std::string& before) const
+{
+    return comesTrue([&] { return look(place) != before; });
+}
+
 void DialogTest::typeName(const std::string& name) const
 {
     click(places::kName);

@@ -17,6 +17,7 @@
 
 inline constexpr char kDialog[] = "Load/Unload Applications";
 inline constexpr char kSuiteDialog[] = "Startup Suite";
+inline constexpr char kAddPanel[] = "Add to Startup Suite";
 inline constexpr char kMessageBox[] = "Alert"; // the toolkit's title
 inline constexpr char kDialogsKey[] = R"(Software\Tessel\R21\Profiles\Default\Dialogs\Modrig)";
 inline constexpr char kSettingsKey[] = R"(Software\Tessel\R21\Profiles\Default\DialogSettings\Modrig)";
@@ -50,6 +51,10 @@ protected:
     std::string end();
 
     void click(Place place) const { mScreen.click(mDialog, place); }
+    void press(const std::string& key, int times = 1) const;
+    std::string look(Place place) const { return mScreen.look(mDialog, place); }
+    // Waits until the place does not look as before.
+    bool changes(Place place, const std::string& before) const;
     // Selects a file by its name, which is typed into the panel.
     void typeName(const std::string& name) const;
     // Takes a picture: <test>-<step>.png.

@@ -72,6 +72,7 @@ TEST_F(DialogDrop, TakesFiftyFilesIntoTheStartupSuite)
     open();
     dragFiles(paths, places::kStartupSuiteBox,
               [this] { EXPECT_TRUE(prints("50 applications were added to the Startup Suite.\n")); });
+    shoot("added");
     closeAndEnd();
     EXPECT_EQ(stored("Startup"), listOf(paths));
 }

@@ -1,13 +1,70 @@
 // The dialogs without a mouse.
 #include "tests/e2e_dialogs/DialogTest.h"
 
+using testing::HasSubstr;
+
+namespace
+{
+// How often Tab is pressed to get to a control from the name field, where the keyboard is when the dialog
+// opens. Between Close and the file types it stops at the browser and at its columns. What is disabled is
+// left out.
+constexpr int kTabsToHelp = 1;
+constexpr int kTabsToClose = 2;
+constexpr int kTabsToColumns = 4;
+constexpr int kTabsToAddToHistory = 6;
+constexpr int kTabsToTable = 8;
+constexpr int kTabsToContents = 9; // with nothing selected in the table
+
+// From the columns to Load, and from the table to what is under it when a row is selected.
+constexpr int kTabsFromColumnsToLoad = 3;
+constexpr int kTabsToFirstButton = 1; // Unload, or Load from the History
+constexpr int kTabsToAddToStartupSuite = 2;
+constexpr int kTabsToRemove = 3;
+
+// In the Startup Suite's window.
+constexpr int kTabsToSuiteHelp = 2;
+constexpr int kTabsToSuiteClose = 3;
+constexpr int kTabsToBrowserOfAddPanel = 5;
+} // namespace
+
 class DialogKeyboard : public DialogTest
 {
 protected:
-    void press(const std::string& key, int times = 1) const
+    // Goes to a control and presses it.
+    void pressAt(int tabs, const std::string& control) const
     {
-        for (int time = 0; time < times; ++time)
-            mScreen.key(key);
+        press("Tab", tabs);
+        shoot("at-" + control);
+        press("space");
+    }
+
+    void openWithHistory()
+    {
+        storeHistory({writeLisp("a.lsp"), writeLisp("b.lsp")});
+        setSetting("LastTab", "1");
+        open();
+    }
+
+    void selectFirstRow() const
+    {
+        press("Tab", kTabsToTable);
+        press("Down");
+    }
+
+    void openSuite()
+    {
+        open();
+        pressAt(kTabsToContents, "contents");
+        const std::string suite = mScreen.waitForWindow(kSuiteDialog);
+        ASSERT_FALSE(suite.empty());
+        ASSERT_TRUE(mScreen.waitUntilActive(suite));
+        shoot("suite");
+    }
+
+    void waitForTheMainDialog() const
+    {
+        ASSERT_TRUE(mScreen.waitUntilGone(kSuiteDialog));
+        ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
     }
 };
 
@@ -20,35 +77,142 @@ TEST_F(DialogKeyboard, GoesToTheTabs)
     EXPECT_EQ(storedSetting("LastTab"), "1\n");
     open();
     press("alt+1");
+    shoot("loaded-applications");
     closeAndEnd();
     EXPECT_EQ(storedSetting("LastTab"), "0\n");
 }
 
-// From the name field: Help, Close, the browser and its columns, the file types, the check box.
 TEST_F(DialogKeyboard, ReachesTheCheckBoxWithTab)
 {
     open();
-    press("Tab", 6);
+    press("Tab", kTabsToAddToHistory);
     shoot("check-box-has-the-keyboard");
+    const std::string before = look(places::kAddToHistory);
     press("space");
+    EXPECT_TRUE(changes(places::kAddToHistory, before));
+    shoot("switched-on");
     closeAndEnd();
     EXPECT_EQ(storedSetting("SaveHistory"), "1\n");
 }
 
-TEST_F(DialogKeyboard, OpensTheStartupSuiteAndRemovesFromItWithDelete)
+TEST_F(DialogKeyboard, LoadsAFileThatTheArrowKeysChose)
+{
+    writeLisp("a.lsp");
+    writeLisp("b.lsp");
+    open();
+    press("Tab", kTabsToColumns);
+    press("Right"); // from the folder to its first file
+    press("Down");
+    pressAt(kTabsFromColumnsToLoad, "load");
+    EXPECT_TRUE(prints(wasLoaded("b.lsp")));
+    shoot("loaded");
+    closeAndEnd();
+}
+
+TEST_F(DialogKeyboard, Unloads)
+{
+    storeSuite({copySample("gears.omp")});
+    open();
+    selectFirstRow();
+    pressAt(kTabsToFirstButton, "unload");
+    EXPECT_TRUE(prints("gears.omp was unloaded.\n"));
+    shoot("unloaded");
+    closeAndEnd();
+}
+
+TEST_F(DialogKeyboard, LoadsFromTheHistory)
+{
+    openWithHistory();
+    selectFirstRow();
+    pressAt(kTabsToFirstButton, "load");
+    EXPECT_TRUE(prints(wasLoaded("a.lsp")));
+    shoot("loaded");
+    closeAndEnd();
+}
+
+TEST_F(DialogKeyboard, AddsToTheStartupSuiteFromTheHistory)
+{
+    openWithHistory();
+    selectFirstRow();
+    pressAt(kTabsToAddToStartupSuite, "add-to-startup-suite");
+    EXPECT_TRUE(prints("a.lsp was added to the Startup Suite.\n"));
+    shoot("added");
+    closeAndEnd();
+}
+
+TEST_F(DialogKeyboard, RemovesFromTheHistory)
+{
+    openWithHistory();
+    selectFirstRow();
+    pressAt(kTabsToRemove, "remove");
+    EXPECT_TRUE(prints("a.lsp was removed from the History list.\n"));
+    shoot("removed");
+    closeAndEnd();
+}
+
+TEST_F(DialogKeyboard, OpensTheHelp)
+{
+    mSession.set("PATH", ""); // no browser: the page is printed
+    open();
+    pressAt(kTabsToHelp, "help");
+    EXPECT_TRUE(prints("load_unload_applications_dialog.html"));
+    shoot("helped");
+    closeAndEnd();
+}
+
+TEST_F(DialogKeyboard, Closes)
+{
+    open();
+    pressAt(kTabsToClose, "close");
+    EXPECT_TRUE(mScreen.waitUntilGone(kDialog));
+    shoot("closed");
+    mHost->type("VERSION");
+    EXPECT_THAT(end(), HasSubstr("Command: VERSION\nTessel R21"));
+}
+
+TEST_F(DialogKeyboard, OpensTheStartupSuiteAndItsHelpAndClosesIt)
+{
+    mSession.set("PATH", "");
+    openSuite();
+    pressAt(kTabsToSuiteHelp, "suite-help");
+    EXPECT_TRUE(prints("startup_suite_dialog.html"));
+    pressAt(kTabsToSuiteClose - kTabsToSuiteHelp, "suite-close");
+    waitForTheMainDialog();
+    shoot("closed");
+    closeAndEnd();
+}
+
+TEST_F(DialogKeyboard, AddsToTheStartupSuiteWithInsert)
+{
+    const std::string file = writeLisp("a.lsp");
+    openSuite();
+    press("Insert");
+    const std::string panel = mScreen.waitForWindow(kAddPanel);
+    ASSERT_FALSE(panel.empty());
+    ASSERT_TRUE(mScreen.waitUntilActive(panel));
+    mScreen.text(file); // takes the panel to the folder
+    press("Tab", kTabsToBrowserOfAddPanel);
+    press("Right"); // from the folder to its first file
+    shoot("selected");
+    press("Return");
+    EXPECT_TRUE(mScreen.waitUntilGone(kAddPanel));
+    shoot("added");
+    press("Escape");
+    waitForTheMainDialog();
+    closeAndEnd();
+    EXPECT_EQ(stored("Startup"), "NumStartup = 1\n1Startup = " + file + "\n");
+}
+
+TEST_F(DialogKeyboard, RemovesFromTheStartupSuiteWithDelete)
 {
     storeSuite({writeLisp("a.lsp"), writeLisp("b.lsp")});
-    open();
-    click(places::kContents);
-    const std::string suite = mScreen.waitForWindow(kSuiteDialog);
-    ASSERT_FALSE(suite.empty());
-    ASSERT_TRUE(mScreen.waitUntilActive(suite));
+    openSuite();
     press("Down");
+    shoot("selected");
     press("Delete");
     shoot("removed");
     press("Escape");
-    ASSERT_TRUE(mScreen.waitUntilGone(kSuiteDialog));
-    ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
+    waitForTheMainDialog();
     closeAndEnd();
     EXPECT_EQ(stored("Startup"), "NumStartup = 1\n1Startup = " + (files() / "b.lsp").string() + "\n");
 }

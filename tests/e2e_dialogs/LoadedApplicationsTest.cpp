@@ -29,14 +29,19 @@ TEST_F(DialogLoadedApplications, UnloadsTheSelectedRow)
 
 TEST_F(DialogLoadedApplications, DoesNotSelectARowThatCannotBeUnloaded)
 {
-    storeSuite({writeLisp("z.lsp")});
-    copySample("gears.omp");
+    storeSuite({writeLisp("z.lsp"), copySample("gears.omp")});
     open();
-    loadFirstFile("gears.omp");
-    click(places::tableRow(0)); // Lisp stays loaded
+    const std::string rowBefore = look(places::tableRow(1));
+    const std::string buttonBefore = look(places::kUnload);
+    const std::string boxBefore = look(places::kAddToHistory);
+    click(places::tableRow(1));   // Lisp stays loaded
+    click(places::kAddToHistory); // shows that the click before it has been dealt with
+    ASSERT_TRUE(changes(places::kAddToHistory, boxBefore));
     shoot("clicked");
-    click(places::kUnload);
-    click(places::tableRow(1));
+    EXPECT_EQ(look(places::tableRow(1)), rowBefore) << "the row is drawn selected";
+    EXPECT_EQ(look(places::kUnload), buttonBefore) << "Unload is enabled";
+    click(places::tableRow(0));
+    EXPECT_TRUE(changes(places::kUnload, buttonBefore)) << "Unload is disabled";
     shoot("selected");
     click(places::kUnload);
     EXPECT_TRUE(prints("gears.omp was unloaded.\n"));

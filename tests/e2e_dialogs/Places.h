@@ -26,8 +26,10 @@ inline constexpr Place kHelp{50, 750};
 inline constexpr Place kClose{705, 750};
 
 // The Startup Suite dialog
+inline constexpr int kSuiteWidth = 560;
 inline constexpr Place kAdd{30, 330};
 inline constexpr Place kRemove{67, 330};
+inline constexpr Place kSuiteHelp{386, 330};
 inline constexpr Place kCloseSuite{496, 330};
 inline constexpr Place kFirstFileToAdd{280, 105}; // in its panel
 inline constexpr Place kFirstSuiteRow{80, 77};

@@ -13,6 +13,10 @@ namespace
 // The window manager's close button, from the right edge of the window.
 constexpr int kCloseButtonInward = 11;
 
+// The piece of a window that is looked at: the inside of a button, and no more than a row of a table.
+constexpr int kLookWidth = 60;
+constexpr int kLookHeight = 16;
+
 constexpr char kPress[] = " mousedown 1 sleep 0.12 mouseup 1 ";
 
 std::string moveTo(const std::string& window, Place place)
@@ -136,4 +140,17 @@ void Screen::clickCloseButton(const std::string& window, int width) const
 void Screen::shoot(const std::string& name) const
 {
     run("import -window root " + inShellQuotes(std::string(SCREENSHOTS) + "/" + name + ".png"));
+}
+
+std::string Screen::look(const std::string& window, Place place) const
+{
+    const std::string piece = std::to_string(kLookWidth) + "x" + std::to_string(kLookHeight) + "+" +
+                              std::to_string(place.x - kLookWidth / 2) + "+" +
+                              std::to_string(place.y - kLookHeight / 2);
+    const std::string pixels = "import -window " + window + " -crop " + piece + " -depth 8 rgb:-";
+    const std::string sum = run("sh -c '" + pixels + " | sha256sum'");
+    static const std::string kNothing = run("sha256sum /dev/null");
+    if (sum.empty() || sum.substr(0, sum.find(' ')) == kNothing.substr(0, kNothing.find(' ')))
+        throw std::runtime_error("cannot look at the window (Debian package imagemagick)");
+    return sum;
 }

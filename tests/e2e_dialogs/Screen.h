@@ -48,6 +48,8 @@ public:
 
     // A picture of the whole screen.
     void shoot(const std::string& name) const;
+    // What a piece of the window around the place looks like: equal as long as no pixel of it changes.
+    std::string look(const std::string& window, Place place) const;
 
 private:
     std::string run(const std::string& command) const;

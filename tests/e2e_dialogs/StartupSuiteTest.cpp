@@ -7,8 +7,6 @@ using testing::Not;
 class DialogStartupSuite : public DialogTest
 {
 protected:
-    static constexpr char kAddPanel[] = "Add to Startup Suite";
-
     void openSuite()
     {
         open();
@@ -23,6 +21,16 @@ protected:
     {
         mScreen.click(mSuite, places::kCloseSuite);
         EXPECT_TRUE(mScreen.waitUntilGone(kSuiteDialog));
+    }
+
+    void expectTheMainDialogAlone()
+    {
+        EXPECT_TRUE(mScreen.waitUntilGone(kSuiteDialog));
+        EXPECT_TRUE(mScreen.waitUntilActive(mDialog));
+        shoot("closed");
+        click(places::kHistoryTab); // and it listens
+        closeAndEnd();
+        EXPECT_EQ(storedSetting("LastTab"), "1\n");
     }
 
     std::string mSuite;
@@ -70,7 +78,12 @@ TEST_F(DialogStartupSuite, IsClosedByEscapeWithTheMainDialogLeftOpen)
 {
     openSuite();
     mScreen.key("Escape");
-    EXPECT_TRUE(mScreen.waitUntilGone(kSuiteDialog));
-    EXPECT_FALSE(mScreen.window(kDialog).empty());
-    closeAndEnd();
+    expectTheMainDialogAlone();
+}
+
+TEST_F(DialogStartupSuite, IsClosedByItsWindowsCloseButtonWithTheMainDialogLeftOpen)
+{
+    openSuite();
+    mScreen.clickCloseButton(mSuite, places::kSuiteWidth);
+    expectTheMainDialogAlone();
 }
