@@ -138,7 +138,6 @@ bool DialogTest::changes(Place place, const std::string& before) const
 void DialogTest::typeName(const std::string& name) const
 {
     click(places::kName);
-    mScreen.key("ctrl+a");
     mScreen.text(name);
 }
 

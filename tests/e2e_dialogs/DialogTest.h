@@ -55,7 +55,7 @@ protected:
     std::string look(Place place) const { return mScreen.look(mDialog, place); }
     // Waits until the place does not look as before.
     bool changes(Place place, const std::string& before) const;
-    // Selects a file by its name, which is typed into the panel.
+    // Types a name into the name field, which is empty so far.
     void typeName(const std::string& name) const;
     // Takes a picture: <test>-<step>.png.
     void shoot(const std::string& step) const;

@@ -196,6 +196,7 @@ TEST_F(DialogKeyboard, AddsToTheStartupSuiteWithInsert)
     shoot("selected");
     press("Return");
     EXPECT_TRUE(mScreen.waitUntilGone(kAddPanel));
+    EXPECT_TRUE(prints(wasLoaded("a.lsp")));
     shoot("added");
     press("Escape");
     waitForTheMainDialog();

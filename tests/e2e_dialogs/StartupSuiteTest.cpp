@@ -49,6 +49,7 @@ TEST_F(DialogStartupSuite, TakesAFileThatTheNextStartLoads)
     shoot("selected");
     mScreen.key("Return");
     EXPECT_TRUE(mScreen.waitUntilGone(kAddPanel));
+    EXPECT_TRUE(prints(wasLoaded("suite.lsp")));
     shoot("added");
     closeSuite();
     EXPECT_THAT(closeAndEnd(), HasSubstr("suite.lsp runs"));
