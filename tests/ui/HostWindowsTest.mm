@@ -5,11 +5,17 @@
 #import <tesselui/TsUIPersistentStore.h>
 #include <tesselui/tsuierrors.h>
 
+#include "host/ui/platform/gnustep/ThemeSegments.h"
+
 using testing::ElementsAre;
 
 namespace
 {
 class FileFilter : public DialogTest
+{
+};
+
+class Segments : public DialogTest
 {
 };
 
@@ -102,4 +108,44 @@ TEST(ToolkitErrors, AreAnsweredAsText)
 {
     EXPECT_EQ(L"NSRangeException: beyond the last row", wide(tsuiErrorOf(raise, nullptr)));
     EXPECT_EQ(nil, tsuiErrorOf(returnQuietly, nullptr));
+}
+
+namespace
+{
+// What the control looks like on the screen.
+NSData* pictureOf(NSView* view)
+{
+    [view lockFocus];
+    NSBitmapImageRep* picture =
+        [[[NSBitmapImageRep alloc] initWithFocusedViewRect:[view bounds]] autorelease];
+    [view unlockFocus];
+    return [picture TIFFRepresentation];
+}
+} // namespace
+
+TEST_F(Segments, LookDisabledWhenTheyAre)
+{
+    tessel::windowing::drawSegmentsAsButtons();
+    NSWindow* window = [[[NSWindow alloc] initWithContentRect:NSMakeRect(0, 0, 100, 40)
+                                                    styleMask:NSBorderlessWindowMask
+                                                      backing:NSBackingStoreBuffered
+                                                        defer:NO] autorelease];
+    [window setReleasedWhenClosed:NO];
+    NSSegmentedControl* segments =
+        [[[NSSegmentedControl alloc] initWithFrame:NSMakeRect(10, 10, 72, 24)] autorelease];
+    [segments setSegmentCount:2];
+    [segments setLabel:@"+" forSegment:0];
+    [segments setLabel:@"-" forSegment:1];
+    [[window contentView] addSubview:segments];
+    [window orderFront:nil];
+    [window display];
+    NSData* enabled = pictureOf(segments);
+    EXPECT_TRUE([enabled isEqual:pictureOf(segments)]);
+    [segments setEnabled:NO forSegment:1];
+    [window display];
+    EXPECT_FALSE([enabled isEqual:pictureOf(segments)]);
+    [segments setEnabled:YES forSegment:1];
+    [window display];
+    EXPECT_TRUE([enabled isEqual:pictureOf(segments)]);
+    [window orderOut:nil];
 }

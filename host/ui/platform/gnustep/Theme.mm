@@ -4,6 +4,7 @@
 
 #include <tesselui/tsuieach.h>
 
+#include "host/ui/platform/gnustep/ThemeSegments.h"
 #include "host/ui/platform/gnustep/ThemeShapes.h"
 
 using namespace tessel::windowing;
@@ -131,6 +132,7 @@ void tessel::windowing::useTheme(NSString* folder)
         return;
     GSTheme* theme = [[[TesselTheme alloc] initWithBundle:bundle] autorelease];
     [GSTheme setTheme:theme];
+    drawSegmentsAsButtons();
     // Whenever a user default changes, the toolkit goes back to the theme that the defaults name.
     [[NSUserDefaults standardUserDefaults] registerDefaults:[NSDictionary dictionaryWithObject:[theme name]
                                                                                         forKey:@"GSTheme"]];
