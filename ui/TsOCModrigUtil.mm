@@ -5,6 +5,8 @@
 #include <wincompat/winfile.h>
 #include <wincompat/winstring.h>
 
+#include <set>
+
 #import "ui/ModrigController.h"
 #import "ui/ModrigFilePath.h"
 
@@ -23,18 +25,25 @@ CStdStr wide(NSString* text)
     return CStdStr(NSStringToWstring(text));
 }
 
-// What is equal for the user is equal here.
-NSString* identity(NSString* path)
+// The order of paths by which rows are equal. Found in it, a path is equal to one of many without a
+// comparison with each.
+struct IsBefore
 {
-    return [path lowercaseString];
-}
+    bool operator()(NSString* left, NSString* right) const
+    {
+        return [left caseInsensitiveCompare:right] == NSOrderedAscending;
+    }
+};
 
-NSMutableSet* identitiesOfRows(NSArrayController* controller)
+// The paths belong to whoever made the set.
+using Identities = std::set<NSString*, IsBefore>;
+
+Identities identitiesOfRows(NSArrayController* controller)
 {
-    NSMutableSet* identities = [NSMutableSet set];
+    Identities identities;
     for (ModrigFilePath* row : tsuiEach<ModrigFilePath*>([controller arrangedObjects]))
         if ([row filePathName])
-            [identities addObject:identity([row filePathName])];
+            identities.insert([row filePathName]);
     return identities;
 }
 } // namespace
@@ -60,15 +69,13 @@ NSMutableSet* identitiesOfRows(NSArrayController* controller)
 
 + (void)addPathNames:(NSArray*)paths toArrayController:(NSArrayController*)controller
 {
-    NSMutableSet* known = identitiesOfRows(controller);
+    Identities known = identitiesOfRows(controller);
     NSMutableArray* rows = [NSMutableArray array];
     for (NSString* path : tsuiEach<NSString*>(paths))
     {
         NSString* resolved = [path stringByResolvingSymlinksInPath];
-        NSString* key = identity(resolved);
-        if ([known containsObject:key])
+        if (!known.insert(resolved).second)
             continue;
-        [known addObject:key];
         ModrigFilePath* row = [[ModrigFilePath alloc] initWithResolvedPath:resolved];
         [rows addObject:row];
         [row release];

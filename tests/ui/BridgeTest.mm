@@ -81,6 +81,22 @@ TEST_F(Bridge, AddsManyPathsLikeOneAfterAnother)
     EXPECT_THAT(rowsOf(table), ElementsAre(L"/a/one.lsp", L"/a/two.lsp", L"/a/three.lsp"));
 }
 
+TEST_F(Bridge, AddsPathsByTheEqualityOfRows)
+{
+    // The same letter in one character and in two, as file systems hand it out.
+    NSString* whole = @"/a/Caf\u00e9.lsp";
+    NSString* parts = @"/a/CAFE\u0301.lsp";
+    ModrigFilePath* wholeRow = [[[ModrigFilePath alloc] initWithFilePathName:whole] autorelease];
+    ModrigFilePath* partsRow = [[[ModrigFilePath alloc] initWithFilePathName:parts] autorelease];
+    ASSERT_TRUE([wholeRow isEqual:partsRow]);
+    ModrigArrayController* table = makeTable();
+    [TsOCModrigUtil addPathName:whole toArrayController:table];
+    [TsOCModrigUtil addPathName:parts toArrayController:table];
+    EXPECT_EQ(1u, [[table arrangedObjects] count]);
+    [table removeObjects:[NSArray arrayWithObject:partsRow]];
+    EXPECT_EQ(0u, [[table arrangedObjects] count]);
+}
+
 TEST_F(Bridge, OffersSixFiltersInTheirOrderWhateverIsStored)
 {
     host().registry.setValue(host().moduleKey(), L"FileFilter", L"Lisp source (*.lsp)");

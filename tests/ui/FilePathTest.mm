@@ -4,6 +4,12 @@
 
 #include <filesystem>
 
+@interface SpecialFilePath : ModrigFilePath
+@end
+
+@implementation SpecialFilePath
+@end
+
 using testing::ElementsAre;
 using testing::IsEmpty;
 
@@ -83,4 +89,34 @@ TEST_F(FilePath, EqualsNoOtherKindOfObject)
     EXPECT_FALSE([make(@"/x/y.qbc") isEqual:@"/x/y.qbc"]);
     EXPECT_FALSE([make(@"/x/y.qbc") isEqual:nil]);
     EXPECT_FALSE([make(@"/x/y.qbc") isEqual:make(nil)]);
+}
+
+TEST_F(FilePath, EqualsOneOfASubclassThatDoesNotEqualItInTurn)
+{
+    ModrigFilePath* special = [[[SpecialFilePath alloc] initWithFilePathName:@"/x/y.qbc"] autorelease];
+    EXPECT_TRUE([make(@"/X/Y.qbc") isEqual:special]);
+    EXPECT_FALSE([special isEqual:make(@"/X/Y.qbc")]);
+    EXPECT_TRUE([special isEqual:special]);
+}
+
+TEST_F(FilePath, HasTheHashOfEveryPathThatItEquals)
+{
+    int equal = 0;
+    // Beyond, the toolkit fails to make capitals.
+    for (unichar character = 0x20; character < 0x1F80; ++character)
+    {
+        NSString* name = [NSString stringWithCharacters:&character length:1];
+        ModrigFilePath* row = make([@"/x/a" stringByAppendingString:name]);
+        NSString* others[] = {
+            [name lowercaseString], [name uppercaseString], [name decomposedStringWithCanonicalMapping]};
+        for (NSString* other : others)
+        {
+            ModrigFilePath* twin = make([@"/x/a" stringByAppendingString:other]);
+            if (![row isEqual:twin])
+                continue;
+            ++equal;
+            ASSERT_EQ([row hash], [twin hash]) << "U+" << std::hex << character;
+        }
+    }
+    EXPECT_LT(0x1F80, equal);
 }
