@@ -16,11 +16,20 @@ NSArray* draggedPaths(id<NSDraggingInfo> info)
     return [[info draggingPasteboard] propertyListForType:NSFilenamesPboardType];
 }
 
+// A file without an extension gets message 2 when it is asked whether it can be loaded. During a drag that
+// would be a box at every move of the mouse, which the program that the files come from holds, out of reach
+// until the drop: what has no extension is passed over here, and heard of when it is dropped with others.
+bool hasExtension(NSString* path)
+{
+    const NSRange dot = [path rangeOfString:@"." options:NSBackwardsSearch];
+    return dot.location != NSNotFound && NSMaxRange(dot) < [path length];
+}
+
 // One file that can be loaded among those dragged is enough.
 NSDragOperation operationFor(id<NSDraggingInfo> info)
 {
     for (NSString* path : tsuiEach<NSString*>(draggedPaths(info)))
-        if ([TsOCModrigUtil isValidFileForModrig:path])
+        if (hasExtension(path) && [TsOCModrigUtil isValidFileForModrig:path])
             return NSDragOperationCopy;
     return NSDragOperationNone;
 }

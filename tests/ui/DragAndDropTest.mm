@@ -1,5 +1,6 @@
 #include "tests/ui/support/DialogTest.h"
 
+#import "ui/ModrigStartupSuitController.h"
 #import "ui/ModrigStartupSuiteBox.h"
 #import "ui/TsOCModrigUtil.h"
 
@@ -43,6 +44,38 @@ TEST_F(Dropping, OffersToCopyBetweenRowsWhenOneFileCanBeLoaded)
     EXPECT_EQ(NSDragOperationNone, hover(paths({"a.txt", "b.txt"}), NSTableViewDropAbove));
     EXPECT_EQ(NSDragOperationNone, hover([NSArray array], NSTableViewDropAbove));
     EXPECT_EQ(NSDragOperationNone, hover(nil, NSTableViewDropAbove));
+}
+
+TEST_F(Dropping, ShowsNoBoxWhileFilesWithoutAnExtensionHover)
+{
+    open();
+    std::filesystem::create_directory(mFolder / "folder");
+    NSArray* files = paths({"folder", "README", "ends."});
+    for (int move = 0; move < 3; ++move)
+    {
+        EXPECT_EQ(NSDragOperationNone, hover(files, NSTableViewDropAbove));
+        EXPECT_EQ(NSDragOperationNone, [box() draggingEntered:dragOf(files)]);
+    }
+    EXPECT_EQ(NSDragOperationCopy, hover(paths({"README", "one.zmb"}), NSTableViewDropAbove));
+    EXPECT_THAT(boxes(), IsEmpty());
+}
+
+TEST_F(Dropping, TellsOfAFileWithoutAnExtensionOnceItIsDropped)
+{
+    open();
+    drop(loadedTable(), paths({"README", "one.zmb"}), 0);
+    EXPECT_THAT(boxes(), ElementsAre(Message(2, file("README"))));
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb")));
+}
+
+TEST_F(Dropping, ScrollsToNoRow)
+{
+    for (int index = 0; index < 60; ++index)
+        gLoadedAppList.AddTail(file("tool" + std::to_string(index) + ".lsp"));
+    open();
+    drop(loadedTable(), paths({"one.zmb"}), 60);
+    EXPECT_EQ(file("one.zmb"), rowsOf(loadedApps()).back());
+    EXPECT_TRUE(NSLocationInRange(0, [loadedTable() rowsInRect:[loadedTable() visibleRect]]));
 }
 
 TEST_F(Dropping, IsRefusedOnARow)
@@ -200,4 +233,15 @@ TEST_F(Dropping, FindsNoDialogWhenNoneIsOpen)
     ModrigStartupSuiteBox* box = [[[ModrigStartupSuiteBox alloc] initWithFrame:NSZeroRect] autorelease];
     EXPECT_EQ(NSDragOperationNone, [box draggingEntered:dragOf(paths({"b.lsp"}))]);
     EXPECT_FALSE([box performDragOperation:dragOf(paths({"b.lsp"}))]);
+}
+
+TEST_F(Dropping, DoesNotShowInAStartupSuiteDialogThatIsOpen)
+{
+    open();
+    ModrigStartupSuitController* suite = [[[ModrigStartupSuitController alloc] init] autorelease];
+    ASSERT_TRUE([suite window]);
+    [suite doInit];
+    [box() performDragOperation:dragOf(paths({"one.zmb"}))];
+    EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
+    EXPECT_THAT(rowsOf([suite valueForKey:@"startupApps"]), IsEmpty());
 }
