@@ -66,6 +66,7 @@
 {
     mOpenPanel = nil;
     [self onFinish];
+    [panel setDelegate:nil];
     [panel setAccessoryView:nil];
     [helpButton removeFromSuperview];
     ModrigPlatform::GiveBackPanel(panel);
@@ -118,8 +119,6 @@
 
 - (void)openPanelOK:(id)sender
 {
-    if (ModrigPlatform::HasUnreportedSelection(mOpenPanel))
-        [self panelSelectionDidChange:mOpenPanel];
     [self onLoad:sender];
 }
 

@@ -20,15 +20,17 @@ void FitAccessoryView(NSView* view);
 void UpdateKeyViews(NSWindow* window);
 
 // The folder that the panel shows, moving it to another one, and the paths selected in it. A folder that is
-// only walked through is not selected.
+// only walked through is not selected. The panel's delegate hears of a selection that is lost on the way.
 NSString* ShownFolder(NSOpenPanel* panel);
 void ShowFolder(NSOpenPanel* panel, NSString* folder);
 NSArray* SelectedPaths(NSOpenPanel* panel);
 
-// Whether the user has named a file in a way that the panel's delegate is not told of: by typing.
+// Whether the panel has another selection than `SelectedPaths` answered last, and its delegate has not been
+// told: the user has typed a name.
 bool HasUnreportedSelection(NSOpenPanel* panel);
 
-// Asks the panel's delegate again which files to show. `elsewhere`: any other folder.
+// Asks the panel's delegate again which files to show, and tells it when that ends the selection.
+// `elsewhere`: any other folder.
 void FilterPanelAnew(NSOpenPanel* panel, NSURL* elsewhere);
 
 // The path with symbolic links and, where there are any, aliases resolved.

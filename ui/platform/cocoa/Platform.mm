@@ -54,7 +54,19 @@ void TakePanel(NSOpenPanel*)
 void GiveBackPanel(NSOpenPanel*)
 {
 }
-void CompletePanel(NSOpenPanel*, NSView*)
+
+// The panel sizes the frame around the view, which has to hand its size on.
+void FitAccessoryView(NSView* view)
+{
+    [view setAutoresizingMask:[view autoresizingMask] | NSViewWidthSizable];
+    NSView* frame = [view superview];
+    [frame setAutoresizesSubviews:YES];
+    [view setFrameOrigin:NSZeroPoint];
+    [frame resizeSubviewsWithOldSize:[view frame].size];
+}
+
+// The platform follows what shows.
+void UpdateKeyViews(NSWindow*)
 {
 }
 

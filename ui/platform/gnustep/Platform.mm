@@ -15,6 +15,7 @@
 - (NSArray*)modrigSelectedPaths;
 - (NSString*)modrigTypedPath;
 - (void)modrigFilterAnew;
+- (void)modrigForgetName;
 @end
 
 @implementation NSSavePanel (ModrigRuntime)
@@ -60,16 +61,18 @@
     return paths;
 }
 
-// What is being typed in the name field, if it names a file that exists.
+// What stands in the name field, if it names a file that exists. It is the selected file's name unless the
+// user types another; with several files selected it is empty. A folder is a place on the way.
 - (NSString*)modrigTypedPath
 {
-    if (![_form currentEditor])
-        return nil;
     NSString* name = [[_form cellAtIndex:0] stringValue];
     NSString* path = [[self modrigShownFolder] stringByAppendingPathComponent:name];
     if ([name isAbsolutePath] || [name hasPrefix:@"~"])
         path = [name stringByExpandingTildeInPath];
-    return [name length] && [[NSFileManager defaultManager] fileExistsAtPath:path] ? path : nil;
+    bool isFolder = false;
+    if (![name length] || !ModrigPlatform::FileExists(path, isFolder))
+        return nil;
+    return isFolder && !ModrigPlatform::IsFilePackage(path) ? nil : path;
 }
 
 // -validateVisibleColumns would empty the columns of the browser and lose the path.
@@ -79,6 +82,14 @@
     [_browser loadColumnZero];
     [_browser setPath:folder];
     [_okButton setEnabled:NO];
+    [self modrigForgetName];
+}
+
+// The browser forgets what was selected, the field with its name does not.
+- (void)modrigForgetName
+{
+    [[_form cellAtIndex:0] setStringValue:@""];
+    [[_form currentEditor] setString:@""];
 }
 
 @end
@@ -106,6 +117,23 @@ constexpr NSInteger kButtonTags[] = {NSFileHandlingPanelOKButton, NSFileHandling
                                      NSFileHandlingPanelHomeButton, NSFileHandlingPanelDiskButton,
                                      NSFileHandlingPanelDiskEjectButton};
 ButtonState gButtons[std::size(kButtonTags)];
+
+// What the dialog has last been told to be selected.
+NSArray* gReportedPaths = nil;
+
+void report(NSArray* paths)
+{
+    [paths retain];
+    [gReportedPaths release];
+    gReportedPaths = paths;
+}
+
+// The toolkit tells of clicks only.
+void tellOfLostSelection(NSOpenPanel* panel)
+{
+    if (ModrigPlatform::HasUnreportedSelection(panel))
+        [[panel delegate] panelSelectionDidChange:panel];
+}
 
 ButtonState stateOf(NSButton* button)
 {
@@ -152,6 +180,7 @@ void changeFolder(void* change)
 {
     const auto* wanted = static_cast<FolderChange*>(change);
     [wanted->panel setDirectory:wanted->folder];
+    [wanted->panel modrigForgetName];
 }
 
 void filterAnew(void* panel)
@@ -190,13 +219,14 @@ void TakePanel(NSOpenPanel* panel)
     NSView* panelView = [panel contentView];
     for (std::size_t index = 0; index < std::size(kButtonTags); ++index)
         gButtons[index] = stateOf([panelView viewWithTag:kButtonTags[index]]);
+    report(nil);
     persist(allowFilesOnly, panel);
     clearButtonRow(panelView);
 }
 
-void GiveBackPanel(NSOpenPanel* panel)
+void GiveBackPanel(NSOpenPanel*)
 {
-    [panel setDelegate:nil];
+    report(nil);
     for (const ButtonState& state : gButtons)
         giveBack(state);
 }
@@ -227,21 +257,25 @@ void ShowFolder(NSOpenPanel* panel, NSString* folder)
     FolderChange change = {panel, nearestFolder(folder)};
     persist(changeFolder, &change);
     [panel setDelegate:delegate];
+    tellOfLostSelection(panel);
 }
 
 NSArray* SelectedPaths(NSOpenPanel* panel)
 {
-    return [panel modrigSelectedPaths];
+    report([panel modrigSelectedPaths]);
+    return gReportedPaths;
 }
 
 bool HasUnreportedSelection(NSOpenPanel* panel)
 {
-    return [panel modrigTypedPath] != nil;
+    NSArray* paths = [panel modrigSelectedPaths];
+    return [paths count] + [gReportedPaths count] > 0 && ![paths isEqual:gReportedPaths];
 }
 
 void FilterPanelAnew(NSOpenPanel* panel, NSURL*)
 {
     persist(filterAnew, panel);
+    tellOfLostSelection(panel);
 }
 
 NSString* ResolveLinksAndAliases(NSString* path)
