@@ -38,6 +38,8 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
 - (IBAction)onLoad:(id)sender
 {
     (void)sender;
+    if (ModrigPlatform::HasUnreportedSelection(mOpenPanel))
+        [self panelSelectionDidChange:mOpenPanel];
     if ([self openTesselFolder])
         return;
     [self loadApps:mSelectedFiles successedApps:nil addToStartupSuit:NO];
@@ -62,12 +64,32 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
     ModrigUtils::OnCommandHelp(ModrigUtils::kMainDialogHelp);
 }
 
+// Whether Load would load the rows that are selected in the History.
+- (BOOL)historyIsChosen
+{
+    return [[historyList selectedObjects] indexOfObjectIdenticalTo:[mSelectedFiles lastObject]] != NSNotFound;
+}
+
+// A new row comes selected, and a selection in the History replaces the selected files. When those are from
+// the panel, they are kept: it still shows them as selected, and the next Load is to load what it shows.
+- (void)insertIntoHistory:(ModrigFilePath*)row
+{
+    if ([[historyList arrangedObjects] containsObject:row])
+        return;
+    const bool keeps = [mSelectedFiles count] > 0 && ![self historyIsChosen];
+    NSArray* selected = [[mSelectedFiles copy] autorelease];
+    insertRow(row, historyList, mInsertRow);
+    [mSelectedFiles setArray:keeps ? selected : [historyList selectedObjects]];
+}
+
 - (void)addRowsFor:(NSString*)path
 {
     ModrigFilePath* row = [[[ModrigFilePath alloc] initWithFilePathName:path] autorelease];
     insertRow(row, loadedApps, mInsertRow);
+    // A row that comes in the place of the selected one does not count as a change of the selection.
+    [self keepToUnloadableRows];
     if (mbSaveHistory)
-        insertRow(row, historyList, mInsertRow);
+        [self insertIntoHistory:row];
 }
 
 - (void)showLastRow

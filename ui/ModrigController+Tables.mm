@@ -76,7 +76,7 @@ bool hasSelection(NSArrayController* rows)
     NSTableView* table = [notification object];
     ModrigPlatform::AdoptTableSelection(table, [self rowsOf:table]);
     if (table == loadedAppsTableView)
-        self.canUnloadApp = hasSelection(loadedApps);
+        [self keepToUnloadableRows];
     if (table != historyListTableView)
         return;
     self.canRemoveHistory = hasSelection(historyList);
@@ -91,6 +91,21 @@ bool hasSelection(NSArrayController* rows)
     if (row < 0 || static_cast<NSUInteger>(row) >= [rows count])
         return NO;
     return [[rows objectAtIndex:static_cast<NSUInteger>(row)] unloadable];
+}
+
+// The table is asked which rows may be selected when they are clicked, and not when new rows come selected.
+- (void)keepToUnloadableRows
+{
+    NSMutableIndexSet* unloadable = [NSMutableIndexSet indexSet];
+    NSIndexSet* selected = [loadedApps selectionIndexes];
+    for (NSUInteger row = [selected firstIndex]; row != NSNotFound;
+         row = [selected indexGreaterThanIndex:row])
+        if ([self tableView:loadedAppsTableView shouldSelectRow:static_cast<NSInteger>(row)])
+            [unloadable addIndex:row];
+    [loadedApps setSelectionIndexes:unloadable];
+    // The binding is silent while it is at work itself.
+    [loadedAppsTableView selectRowIndexes:unloadable byExtendingSelection:NO];
+    self.canUnloadApp = hasSelection(loadedApps);
 }
 
 - (void)tabView:(NSTabView*)tabView didSelectTabViewItem:(NSTabViewItem*)item

@@ -61,6 +61,8 @@
 
 - (void)tableViewSelectionDidChange:(NSNotification*)notification;
 - (BOOL)tableView:(NSTableView*)table shouldSelectRow:(NSInteger)row;
+// Takes rows that cannot be unloaded out of the selection, whoever put them there.
+- (void)keepToUnloadableRows;
 
 - (void)tabView:(NSTabView*)tabView didSelectTabViewItem:(NSTabViewItem*)item;
 

@@ -7,6 +7,7 @@
 #include "lists/StartupSuite.h"
 #include "loader/LoadedApplications.h"
 #include "module/EntryPoint.h"
+#include "ui/Detaching.h"
 #include "ui/Settings.h"
 #include "ui/model/LoadBatch.h"
 #include "ui/platform/Platform.h"
@@ -50,9 +51,9 @@
 {
     ModrigUtils::PopulateLoadedApps();
     NSOpenPanel* panel = ModrigPlatform::MakeOpenPanel();
-    [self setupOpenPanel:panel];
     @try
     {
+        [self setupOpenPanel:panel];
         [panel runModal];
     }
     @finally
@@ -79,18 +80,28 @@
     [historyListTableView setDoubleAction:@selector(onDoubleClickHistoryTableView:)];
 }
 
+- (void)storeSettings
+{
+    TsUIPersistentStore* settings = [self uiPersistentStore];
+    [settings putControlState:kSettingsGroup control:kSaveHistorySetting state:self.saveHistory];
+    [settings putControlInt:kSettingsGroup
+                    control:kLastTabSetting
+                      value:static_cast<int>(self.tabViewSelectedIndex)];
+}
+
 - (void)onFinish
 {
     [startupSuiteBox unregisterDraggedTypes];
     [loadedAppsTableView unregisterDraggedTypes];
     [loadedAppsTableView setDataSource:nil];
     [historyListTableView setDataSource:nil];
-    TsUIPersistentStore* settings = [self uiPersistentStore];
-    [settings putControlState:kSettingsGroup control:kSaveHistorySetting state:self.saveHistory];
-    [settings putControlInt:kSettingsGroup
-                    control:kLastTabSetting
-                      value:static_cast<int>(self.tabViewSelectedIndex)];
+    // A dialog that failed before it had read its settings would store others over them.
+    if ([TsOCModrigUtil getModrigController] == self)
+        [self storeSettings];
     [TsOCModrigUtil setModrigController:nil];
+    [historyListTableView setDoubleAction:nullptr];
+    ModrigUtils::DetachFrom(self, [self view]);
+    ModrigUtils::DetachFrom(self, helpButton); // which has left the view for the panel's button row
 }
 
 @end

@@ -407,6 +407,53 @@ TEST_F(MainDialog, ScrollsTheShownTableToTheNewRow)
     EXPECT_TRUE(NSLocationInRange(60, [loadedTable() rowsInRect:visible]));
 }
 
+TEST_F(MainDialog, ScrollsTheHistoryWhenThatShows)
+{
+    for (int index = 0; index < 60; ++index)
+        gHistoryList.AddTail(file("tool" + std::to_string(index) + ".lsp"));
+    open();
+    [mController setTabViewSelectedIndex:kHistoryTab];
+    [mController setSaveHistory:YES];
+    selectFiles({"last.zmb"});
+    [mController onLoad:nil];
+    EXPECT_TRUE(NSLocationInRange(60, [historyTable() rowsInRect:[historyTable() visibleRect]]));
+}
+
+TEST_F(MainDialog, ScrollsNowhereAfterAFailure)
+{
+    for (int index = 0; index < 60; ++index)
+        gLoadedAppList.AddTail(file("tool" + std::to_string(index) + ".lsp"));
+    open();
+    host().linker.refuseToLoad(file("bad.zmb"));
+    selectFiles({"one.zmb", "bad.zmb"});
+    [mController onLoad:nil];
+    EXPECT_EQ(61u, rowsOf(loadedApps()).size());
+    EXPECT_TRUE(NSLocationInRange(0, [loadedTable() rowsInRect:[loadedTable() visibleRect]]));
+}
+
+TEST_F(MainDialog, EndsABatchSilentlyWhereLispIsOff)
+{
+    host().variables.set(L"LISPENABLED", RecordingValue::Short(0));
+    open();
+    selectFiles({"one.zmb", "tool.lsp", "two.zmb"});
+    [mController onLoad:nil];
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb")));
+    EXPECT_FALSE(host().linker.isLoaded(file("two.zmb")));
+    EXPECT_THAT(boxes(), IsEmpty());
+    EXPECT_THAT(lines(), IsEmpty());
+    EXPECT_EQ(L"", message());
+}
+
+TEST_F(MainDialog, AddsNothingToTheStartupSuiteWithoutASelection)
+{
+    fillHistory({"one.zmb"});
+    open();
+    [mController onAddToStartupSuiteFromHistory:nil];
+    EXPECT_TRUE(gStartupList.IsEmpty());
+    EXPECT_THAT(rowsOf(loadedApps()), IsEmpty());
+    EXPECT_THAT(lines(), IsEmpty());
+}
+
 TEST_F(MainDialog, TurnsDropsOffWhenItCloses)
 {
     open();

@@ -62,6 +62,22 @@ protected:
         return names;
     }
     std::wstring selectedFile() { return wide([[[mController selectedFiles] objectAtIndex:0] filePathName]); }
+    NSForm* form() { return [[mPanel contentView] viewWithTag:NSFileHandlingPanelForm]; }
+    std::wstring shownName() { return wide([[form() cellAtIndex:0] stringValue]); }
+    void typeName(NSString* name)
+    {
+        [mPanel makeFirstResponder:nil];
+        [form() selectTextAtIndex:0];
+        [[form() currentEditor] selectAll:nil];
+        [(NSTextView*)[form() currentEditor] insertText:name];
+    }
+    std::vector<std::wstring> selectedFiles()
+    {
+        std::vector<std::wstring> files;
+        for (NSUInteger index = 0; index < [[mController selectedFiles] count]; ++index)
+            files.push_back(wide([[[mController selectedFiles] objectAtIndex:index] filePathName]));
+        return files;
+    }
     // Clicks files in the last column, the first alone and the others added to it.
     void click(std::initializer_list<const wchar_t*> names)
     {
@@ -112,6 +128,8 @@ TEST_F(OpenPanel, ShowsTheDialogsViewAndHelpButtonUnderItsOwnTitle)
     EXPECT_TRUE([mPanel allowsMultipleSelection]);
     NSButton* help = [mController valueForKey:@"helpButton"];
     EXPECT_EQ([[mPanel okButton] superview], [help superview]);
+    EXPECT_EQ(NSMinX([[mPanel hideExtensionButton] frame]), NSMinX([help frame]));
+    EXPECT_EQ(NSMinY([[mPanel okButton] frame]), NSMinY([help frame]));
     EXPECT_NE(0u, [[mController view] autoresizingMask] & NSViewWidthSizable);
 }
 
@@ -280,4 +298,73 @@ TEST_F(OpenPanel, LoadsWithReturnAndClosesWithEscape)
     EXPECT_FALSE([mPanel isVisible]);
     [mPanel release];
     EXPECT_THAT(lines(), ElementsAre(Message(8, L"one.zmb")));
+}
+
+TEST_F(OpenPanel, ForgetsTheSelectedFileWhenTheListingIsFilteredAnew)
+{
+    for (const char* name : {"one.lsp", "two.zmb"})
+        file(name);
+    runIn(mFolder.path(), {[this] { click({L"two.zmb"}); },
+                           [this]
+                           {
+                               EXPECT_THAT(selectedFiles(), ElementsAre(file("two.zmb")));
+                               EXPECT_EQ(L"two.zmb", shownName());
+                               choose(kLispFilter);
+                               EXPECT_THAT(selectedFiles(), IsEmpty());
+                               EXPECT_EQ(L"", shownName());
+                               [mController onLoad:nil];
+                               EXPECT_FALSE(host().linker.isLoaded(file("two.zmb")));
+                           }});
+}
+
+TEST_F(OpenPanel, LoadsTheTypedNameWithTheLoadButton)
+{
+    for (const char* name : {"one.zmb", "two.zmb"})
+        file(name);
+    runIn(mFolder.path(), {[this]
+                           {
+                               selectFiles({"one.zmb"});
+                               typeName(@"two.zmb");
+                           },
+                           [this]
+                           {
+                               // A click on the button takes the keyboard from the name.
+                               [mPanel makeFirstResponder:nil];
+                               [mController onLoad:nil];
+                               EXPECT_TRUE(host().linker.isLoaded(file("two.zmb")));
+                               EXPECT_FALSE(host().linker.isLoaded(file("one.zmb")));
+                               EXPECT_EQ(L"two.zmb", shownName());
+                           }});
+}
+
+TEST_F(OpenPanel, LoadsNothingForATypedNameOfNoFile)
+{
+    file("one.zmb");
+    mFolder.write("folder/inside.zmb", "");
+    runIn(mFolder.path(), {[this] { click({L"one.zmb"}); },
+                           [this]
+                           {
+                               for (NSString* name : {@"zz.zmb", @"folder"})
+                               {
+                                   typeName(name);
+                                   [mController onLoad:nil];
+                                   EXPECT_THAT(selectedFiles(), IsEmpty());
+                               }
+                               EXPECT_FALSE(host().linker.isLoaded(file("one.zmb")));
+                               EXPECT_THAT(boxes(), IsEmpty());
+                           }});
+}
+
+TEST_F(OpenPanel, LoadsSelectedFilesInItsOwnOrder)
+{
+    for (const char* name : {"a.zmb", "b.zmb", "c.zmb"})
+        file(name);
+    runIn(mFolder.path(), {[this] {
+                               click({L"c.zmb", L"a.zmb"});
+                           },
+                           [this]
+                           {
+                               [mController panelSelectionDidChange:mPanel];
+                               EXPECT_THAT(selectedFiles(), ElementsAre(file("a.zmb"), file("c.zmb")));
+                           }});
 }

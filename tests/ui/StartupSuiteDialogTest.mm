@@ -2,6 +2,8 @@
 
 #include "module/DialogBridge.h"
 
+#import <tesselui/TsOCFileFilter.h>
+
 #import "ui/ModrigStartupSuitController.h"
 #import "ui/NSSavePanel+ModrigRuntime.h"
 #import "ui/TsOCModrigUtil.h"
@@ -40,6 +42,26 @@ protected:
 
     ModrigStartupSuitController* mSuite = nil;
 };
+
+// Presses the close button of the window that is modal, when it is the one of that title.
+bool closeWindow(NSString* title)
+{
+    NSWindow* window = [NSApp modalWindow];
+    if (![[window title] isEqual:title])
+        return false;
+    [window performClose:nil];
+    // The modal run ends at the next event.
+    pressKey(window, @"x");
+    return true;
+}
+
+bool cancelMainDialog()
+{
+    if (![NSApp modalWindow] || [NSApp modalWindow] != runningPanel())
+        return false;
+    [runningPanel() cancel:nil];
+    return true;
+}
 } // namespace
 
 TEST_F(StartupSuiteDialog, IsEmptyWithRemoveDisabledForAnEmptySuite)
@@ -244,6 +266,78 @@ TEST_F(StartupSuiteDialog, RunsOverTheMainDialogAndStoresTheShortenedSuiteWhenBo
     ModrigUtils::RunModrigDialog();
     EXPECT_EQ(L"1", host().registry.value(host().moduleKey() + L"\\Startup", L"NumStartup"));
     EXPECT_EQ(file("two.lsp"), host().registry.value(host().moduleKey() + L"\\Startup", L"1Startup"));
+}
+
+TEST_F(StartupSuiteDialog, ChoosesFilesInTheHostsFolderWhateverTheOtherDialogRemembers)
+{
+    host().registry.setValue(L"Software\\Tessel\\R21\\Profiles\\Default\\DialogSettings\\Modrig",
+                             L"InitialPath", mFolder.path().wstring());
+    openSuite();
+    const ModalSteps steps({[]
+                            {
+                                NSOpenPanel* dialog = (NSOpenPanel*)[NSApp modalWindow];
+                                EXPECT_EQ(wide([[NSBundle mainBundle] bundlePath]), wide([dialog directory]));
+                                EXPECT_TRUE([dialog allowsMultipleSelection]);
+                                NSPopUpButton* types = [[[dialog accessoryView] subviews] lastObject];
+                                NSMutableArray* filters = [NSMutableArray array];
+                                [TsOCModrigUtil populateModrigFileFilter:filters];
+                                EXPECT_EQ(6u, [filters count]);
+                                EXPECT_TRUE(
+                                    [[types itemTitles] isEqual:[filters valueForKey:@"description"]]);
+                                [dialog cancel:nil];
+                            }});
+    clickSegment(kAdd);
+}
+
+TEST_F(StartupSuiteDialog, DoesNothingForAnyOtherSegment)
+{
+    gStartupList.AddTail(file("one.lsp"));
+    openSuite();
+    select(table(), {0});
+    [segments() setSegmentCount:3];
+    clickSegment(2);
+    EXPECT_EQ(1u, gStartupList.GetCount());
+    [mSuite onSegmentedButton:segments()];
+    EXPECT_EQ(1u, gStartupList.GetCount());
+}
+
+TEST_F(StartupSuiteDialog, AddsWithTheInsertKey)
+{
+    bool asked = false;
+    const unichar insert = NSInsertFunctionKey;
+    NSString* key = [NSString stringWithCharacters:&insert length:1];
+    const ModalSteps steps({[] { [[TsOCModrigUtil getModrigController] onStartupSuits:nil]; },
+                            [&] { pressKey([NSApp modalWindow], key); },
+                            [&]
+                            {
+                                if (![[NSApp modalWindow] isKindOfClass:[NSOpenPanel class]])
+                                    return false;
+                                asked = [NSApp modalWindow] != runningPanel();
+                                [(NSOpenPanel*)[NSApp modalWindow] cancel:nil];
+                                return true;
+                            },
+                            [] { return closeWindow(@"Startup Suite"); }, [] { return cancelMainDialog(); }});
+    ModrigUtils::RunModrigDialog();
+    EXPECT_TRUE(asked);
+}
+
+TEST_F(StartupSuiteDialog, EndsWithTheCloseButtonOfItsWindow)
+{
+    const ModalSteps steps({[] { [[TsOCModrigUtil getModrigController] onStartupSuits:nil]; },
+                            [] { return closeWindow(@"Startup Suite"); }, [] { return cancelMainDialog(); }});
+    ModrigUtils::RunModrigDialog();
+    EXPECT_EQ(nil, [NSApp modalWindow]);
+}
+
+TEST_F(StartupSuiteDialog, SelectsWhatIsAddedOnceItIsFilled)
+{
+    gStartupList.AddTail(file("one.lsp"));
+    open();
+    openSuite();
+    EXPECT_TRUE([rows() selectsInsertedObjects]);
+    [mSuite addFiles:paths({"two.zmb"})];
+    EXPECT_THAT(selectionOf(rows()), ElementsAre(file("two.zmb")));
+    EXPECT_TRUE([segments() isEnabledForSegment:kRemove]);
 }
 
 TEST_F(StartupSuiteDialog, ChangesNothingWhenTheFileDialogIsCancelled)

@@ -107,6 +107,9 @@ private:
 // The panel of the main dialog that is running.
 NSOpenPanel* runningPanel();
 
+// A click of the mouse on a row of a table that shows.
+void clickRow(NSTableView* table, NSInteger row);
+
 // A key, as the window that has the keyboard gets it.
 void pressKey(NSWindow* window, NSString* characters);
 

@@ -202,6 +202,24 @@ NSOpenPanel* runningPanel()
     return [[TsOCModrigUtil getModrigController] valueForKey:@"mOpenPanel"];
 }
 
+void clickRow(NSTableView* table, NSInteger row)
+{
+    NSWindow* window = [table window];
+    const NSRect place = [table rectOfRow:row];
+    const NSPoint point = [table convertPoint:NSMakePoint(NSMinX(place) + 10, NSMidY(place)) toView:nil];
+    for (const NSEventType type : {NSLeftMouseDown, NSLeftMouseUp})
+        [NSApp postEvent:[NSEvent mouseEventWithType:type
+                                            location:point
+                                       modifierFlags:0
+                                           timestamp:0
+                                        windowNumber:[window windowNumber]
+                                             context:[window graphicsContext]
+                                         eventNumber:0
+                                          clickCount:1
+                                            pressure:1]
+                 atStart:NO];
+}
+
 void pressKey(NSWindow* window, NSString* characters)
 {
     [NSApp postEvent:[NSEvent keyEventWithType:NSKeyDown

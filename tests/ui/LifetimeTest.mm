@@ -1,0 +1,207 @@
+// How the dialogs open and close, and that nothing is left of them.
+#include "tests/ui/support/DialogTest.h"
+
+#include <tesselui/tsuierrors.h>
+
+#include <algorithm>
+
+#include "module/DialogBridge.h"
+
+#import "ui/ModrigFilePath.h"
+#import "ui/ModrigStartupSuitController.h"
+#import "ui/ModrigStartupSuiteBox.h"
+#import "ui/NSSavePanel+ModrigRuntime.h"
+#import "ui/TsOCModrigUtil.h"
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+namespace
+{
+int gDialogsGone = 0;
+int gSuitesGone = 0;
+} // namespace
+
+@interface CountedDialog : ModrigController
+@end
+
+@implementation CountedDialog
+
+- (void)dealloc
+{
+    ++gDialogsGone;
+    [super dealloc];
+}
+
+@end
+
+// Fails when it is open already.
+@interface FailingDialog : CountedDialog
+@end
+
+@implementation FailingDialog
+
+- (void)onInit
+{
+    [super onInit];
+    [NSException raise:NSGenericException format:@"no more"];
+}
+
+@end
+
+// Fails before it has read its settings.
+@interface EarlyFailingDialog : CountedDialog
+@end
+
+@implementation EarlyFailingDialog
+
+- (void)populateHistoryList
+{
+    [NSException raise:NSGenericException format:@"too early"];
+}
+
+@end
+
+@interface CountedSuite : ModrigStartupSuitController
+@end
+
+@implementation CountedSuite
+
+- (void)dealloc
+{
+    ++gSuitesGone;
+    [super dealloc];
+}
+
+@end
+
+namespace
+{
+const std::wstring kSettings = L"Software\\Tessel\\R21\\Profiles\\Default\\DialogSettings\\Modrig";
+
+void showAndRelease(void* dialog)
+{
+    [static_cast<ModrigController*>(dialog) showModrigDialog];
+}
+
+class Lifetime : public OpenDialogTest
+{
+protected:
+    void SetUp() override
+    {
+        OpenDialogTest::SetUp();
+        gDialogsGone = gSuitesGone = 0;
+        host().loadedModules.applicationName = L"/host/PlugIns/Modrig.bundle";
+    }
+    // Runs the dialog in a pool of its own, so that all that is only lent to it is gone afterwards.
+    static std::wstring run(ModrigController* dialog)
+    {
+        NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+        const std::wstring error = wide(tsuiErrorOf(showAndRelease, dialog));
+        [dialog release];
+        [pool drain];
+        return error;
+    }
+    ModrigStartupSuiteBox* box() { return [mController valueForKey:@"startupSuiteBox"]; }
+};
+} // namespace
+
+TEST_F(Lifetime, OfADialogEndsWithItsRun)
+{
+    gLoadedAppList.AddTail(loadedModule("one.zmb"));
+    gHistoryList.AddTail(file("one.zmb"));
+    const ModalSteps steps({[] { [[TsOCModrigUtil getModrigController] setTabViewSelectedIndex:1]; },
+                            [] { [runningPanel() cancel:nil]; }});
+    EXPECT_EQ(L"", run([[CountedDialog alloc] init]));
+    EXPECT_EQ(1, gDialogsGone);
+}
+
+TEST_F(Lifetime, OfADialogThatFailsEndsAsWell)
+{
+    gStartupList.AddTail(file("suite.lsp"));
+    gHistoryList.AddTail(file("history.lsp"));
+    EXPECT_EQ(L"NSGenericException: no more", run([[FailingDialog alloc] init]));
+    EXPECT_EQ(nil, [TsOCModrigUtil getModrigController]);
+    EXPECT_EQ(file("suite.lsp"), host().registry.value(host().moduleKey() + L"\\Startup", L"1Startup"));
+    EXPECT_EQ(file("history.lsp"), host().registry.value(host().moduleKey() + L"\\History", L"1History"));
+    EXPECT_EQ(1, gDialogsGone);
+}
+
+TEST_F(Lifetime, OfADialogThatFailsBeforeItReadItsSettingsLeavesThemAlone)
+{
+    host().registry.setValue(kSettings, L"SaveHistory", L"1");
+    host().registry.setValue(kSettings, L"LastTab", L"1");
+    EXPECT_EQ(L"NSGenericException: too early", run([[EarlyFailingDialog alloc] init]));
+    EXPECT_EQ(L"1", host().registry.value(kSettings, L"SaveHistory"));
+    EXPECT_EQ(L"1", host().registry.value(kSettings, L"LastTab"));
+    EXPECT_EQ(1, gDialogsGone);
+}
+
+TEST_F(Lifetime, OfTheStartupSuiteDialogEndsWithItsRun)
+{
+    gStartupList.AddTail(file("one.lsp"));
+    const ModalSteps steps({[] { pressKey([NSApp modalWindow], @"\033"); }});
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    CountedSuite* suite = [[CountedSuite alloc] init];
+    [suite showModalWindowCenterOfParent:nil];
+    [suite release];
+    [pool drain];
+    EXPECT_EQ(1, gSuitesGone);
+}
+
+TEST_F(Lifetime, OfTheViewIsSafeBeyondThatOfTheDialog)
+{
+    gHistoryList.AddTail(file("one.zmb"));
+    open();
+    NSTableView* loaded = [[loadedTable() retain] autorelease];
+    NSTableView* history = [[historyTable() retain] autorelease];
+    NSButton* help = [[[mController valueForKey:@"helpButton"] retain] autorelease];
+    ASSERT_EQ(mController, [loaded delegate]);
+    ASSERT_EQ(mController, [history target]);
+    ASSERT_EQ(mController, [help target]);
+    close();
+    EXPECT_EQ(nil, [loaded delegate]);
+    EXPECT_EQ(nil, [history delegate]);
+    EXPECT_EQ(nil, [history dataSource]);
+    EXPECT_EQ(nil, [history target]);
+    EXPECT_EQ(nullptr, [history doubleAction]);
+    EXPECT_EQ(nil, [help target]);
+}
+
+TEST_F(Lifetime, IsWhenTheBoxTakesDropsAndTheHistoryNever)
+{
+    open();
+    ModrigStartupSuiteBox* suiteBox = [[box() retain] autorelease];
+    EXPECT_EQ(wide(NSFilenamesPboardType), wide([[suiteBox registeredDraggedTypes] lastObject]));
+    EXPECT_EQ(mController, [historyTable() dataSource]);
+    EXPECT_EQ(0u, [[historyTable() registeredDraggedTypes] count]);
+    close();
+    EXPECT_EQ(0u, [[suiteBox registeredDraggedTypes] count]);
+}
+
+TEST_F(Lifetime, EndsWithTheStartupSuiteStoredThenTheHistoryThenTheModulesRecord)
+{
+    gStartupList.AddTail(file("suite.lsp"));
+    gHistoryList.AddTail(file("history.lsp"));
+    const ModalSteps steps({[]
+                            {
+                                host().journal.clear();
+                                [runningPanel() cancel:nil];
+                            }});
+    ModrigUtils::RunModrigDialog();
+    const auto calls = host().journal.entries();
+    const auto callWith = [&](const wchar_t* text)
+    {
+        return std::ranges::find_if(calls, [&](const std::wstring& call)
+                                    { return call.find(text) != std::wstring::npos; });
+    };
+    const auto settings = callWith(L", LastTab, ");
+    const auto suite = callWith(L"suite.lsp)");
+    const auto history = callWith(L"history.lsp)");
+    const auto record = callWith(L"writeToRegistry(TesselModrig, ");
+    EXPECT_LT(settings, suite);
+    EXPECT_LT(suite, history);
+    EXPECT_LT(history, record);
+    ASSERT_NE(calls.end(), record);
+    EXPECT_EQ(L"writeToRegistry(TesselModrig, 6, false, true)", *record);
+}
