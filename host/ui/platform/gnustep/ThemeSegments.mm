@@ -13,6 +13,17 @@ namespace tessel::windowing
 namespace
 {
 using DrawSegment = void (*)(id, SEL, NSInteger, NSRect, NSView*);
+DrawSegment toolkitDrawSegment;
+DrawSegment toolkitDrawSegment;
+
+// By drawing a segment the toolkit learns where clicks on it go, so it draws; nobody sees it.
+void drawUnseen(id cell, SEL selector, NSInteger segment, NSRect frame, NSView* view)
+{
+    [NSGraphicsContext saveGraphicsState];
+    NSRectClip(NSZeroRect);
+    toolkitDrawSegment(cell, selector, segment, frame, view);
+    [NSGraphicsContext restoreGraphicsState];
+}
 
 void drawLabel(NSString* label, NSFont* font, bool enabled, NSRect frame)
 {
@@ -24,8 +35,9 @@ void drawLabel(NSString* label, NSFont* font, bool enabled, NSRect frame)
         withAttributes:look];
 }
 
-void drawSegment(id cell, SEL, NSInteger segment, NSRect frame, NSView*)
+void drawSegment(id cell, SEL selector, NSInteger segment, NSRect frame, NSView* view)
 {
+    drawUnseen(cell, selector, segment, frame, view);
     const bool enabled = [cell isEnabledForSegment:segment];
     drawButtonShape(NSInsetRect(frame, 1, 1), [cell isSelectedForSegment:segment], !enabled);
     if (NSString* label = [cell labelForSegment:segment])
@@ -35,6 +47,8 @@ void drawSegment(id cell, SEL, NSInteger segment, NSRect frame, NSView*)
 
 void drawSegmentsAsButtons()
 {
-    standInFor<DrawSegment>("NSSegmentedCell", @selector(drawSegment:inFrame:withView:), drawSegment);
+    if (!toolkitDrawSegment)
+        toolkitDrawSegment =
+            standInFor<DrawSegment>("NSSegmentedCell", @selector(drawSegment:inFrame:withView:), drawSegment);
 }
 } // namespace tessel::windowing
