@@ -14,7 +14,6 @@ namespace
 {
 using DrawSegment = void (*)(id, SEL, NSInteger, NSRect, NSView*);
 DrawSegment toolkitDrawSegment;
-DrawSegment toolkitDrawSegment;
 
 // By drawing a segment the toolkit learns where clicks on it go, so it draws; nobody sees it.
 void drawUnseen(id cell, SEL selector, NSInteger segment, NSRect frame, NSView* view)
