@@ -88,8 +88,10 @@ TEST_F(StartupSuiteDialog, EnablesRemoveWithASelection)
 {
     gStartupList.AddTail(file("one.lsp"));
     openSuite();
+    [segments() setNeedsDisplay:NO];
     select(table(), {0});
     EXPECT_TRUE([segments() isEnabledForSegment:kRemove]);
+    EXPECT_TRUE([segments() needsDisplay]);
     [table() deselectAll:nil];
     EXPECT_FALSE([segments() isEnabledForSegment:kRemove]);
 }
