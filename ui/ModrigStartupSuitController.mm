@@ -27,6 +27,10 @@ unichar keyOf(NSEvent* event)
 }
 } // namespace
 
+@interface ModrigStartupSuitController (Segments)
+- (void)enableRemove:(BOOL)enabled;
+@end
+
 @implementation ModrigStartupSuitController
 
 - (NSString*)windowNibName
@@ -46,7 +50,13 @@ unichar keyOf(NSEvent* event)
     [startupApps setSelectsInsertedObjects:NO];
     [TsOCModrigUtil addPathNames:ModrigUtils::StringsFromList(gStartupList) toArrayController:startupApps];
     [startupApps setSelectsInsertedObjects:YES];
-    [segmentedControl setEnabled:NO forSegment:kRemoveSegment];
+    [self enableRemove:NO];
+}
+
+- (void)enableRemove:(BOOL)enabled
+{
+    [segmentedControl setEnabled:enabled forSegment:kRemoveSegment];
+    [segmentedControl setNeedsDisplay:YES]; // not every toolkit draws the segment anew by itself
 }
 
 - (void)doClean
@@ -145,7 +155,7 @@ unichar keyOf(NSEvent* event)
     if ([notification object] != startupTableView)
         return;
     ModrigPlatform::AdoptTableSelection(startupTableView, startupApps);
-    [segmentedControl setEnabled:[[startupApps selectedObjects] count] > 0 forSegment:kRemoveSegment];
+    [self enableRemove:[[startupApps selectedObjects] count] > 0];
 }
 
 - (IBAction)help:(id)sender
