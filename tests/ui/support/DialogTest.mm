@@ -164,6 +164,21 @@ void OpenDialogTest::selectFiles(std::initializer_list<std::string> names)
     std::_Exit(EXIT_FAILURE);
 }
 
+// A modal loop looks whether it is over only when an event has come, and a step is none.
+- (void)wakeLoop
+{
+    [NSApp postEvent:[NSEvent otherEventWithType:NSApplicationDefined
+                                        location:NSZeroPoint
+                                   modifierFlags:0
+                                       timestamp:0
+                                    windowNumber:0
+                                         context:nil
+                                         subtype:0
+                                           data1:0
+                                           data2:0]
+             atStart:NO];
+}
+
 - (void)runStep
 {
     if (next >= steps->size())
@@ -177,6 +192,7 @@ void OpenDialogTest::selectFiles(std::initializer_list<std::string> names)
         next = step;
     else
         tries = 0;
+    [self wakeLoop];
 }
 
 @end
