@@ -2,12 +2,33 @@
 
 #import "ui/ModrigFilePath.h"
 
+#include <wincompat/winstring.h>
+
 #include <filesystem>
 
 @interface SpecialFilePath : ModrigFilePath
 @end
 
 @implementation SpecialFilePath
+@end
+
+// Some toolkits make no string of what is no text.
+@interface HalvesOfCharacters : NSString
+@end
+
+@implementation HalvesOfCharacters
+
+- (NSUInteger)length
+{
+    return 5;
+}
+
+- (unichar)characterAtIndex:(NSUInteger)index
+{
+    constexpr unichar kHalves[] = {0xDE00, 'a', 0xD83D, 'b', 0xD83D};
+    return kHalves[index];
+}
+
 @end
 
 using testing::ElementsAre;
@@ -24,6 +45,20 @@ protected:
     }
 };
 } // namespace
+
+TEST_F(FilePath, KeepsEveryCharacterOfItsPath)
+{
+    const std::wstring name = L"\u00FC \u4E2D \U0001F600 100%.lsp";
+    EXPECT_EQ(name, wide([make(wcharToNSString((L"/none/" + name).c_str())) fileName]));
+    EXPECT_EQ(L"/none/" + name, [make(wcharToNSString((L"/none/" + name).c_str())) path].Text());
+}
+
+TEST_F(FilePath, ReplacesWhatIsHalfACharacter)
+{
+    NSString* halves = [[[HalvesOfCharacters alloc] init] autorelease];
+    EXPECT_EQ(L"\uFFFDa\uFFFDb\uFFFD", NSStringToWstring(halves));
+    EXPECT_EQ(L"", NSStringToWstring(nil));
+}
 
 TEST_F(FilePath, TakesAPathApart)
 {
