@@ -6,4 +6,11 @@
 #import <AppKit/AppKit.h>
 
 @interface ModrigArrayController : NSArrayController
+{
+    NSTableView* mTable;
+}
+
+// The table to tell of other rows, where it is not bound to them. It is not retained.
+- (void)setTable:(NSTableView*)table;
+
 @end

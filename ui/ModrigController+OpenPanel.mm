@@ -53,6 +53,8 @@
     title.Load(ModrigMessages::kOpenPanelTitle);
     [panel setTitle:ModrigUtils::StringFromPath(title)];
     ModrigPlatform::ShowFolder(panel, [self initialFolder]);
+    ModrigPlatform::ShowRows(loadedAppsTableView, loadedApps);
+    ModrigPlatform::ShowRows(historyListTableView, historyList);
     [self populateFileTypes];
     [self populateLoadedApplications];
     [self populateHistoryList];

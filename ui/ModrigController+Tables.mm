@@ -65,10 +65,14 @@ bool hasSelection(NSArrayController* rows)
     return table == historyListTableView ? historyList : nil;
 }
 
-// The columns are bound to the rows; this one answer some platforms want from the data source all the same.
 - (NSInteger)numberOfRowsInTableView:(NSTableView*)table
 {
     return static_cast<NSInteger>([[[self rowsOf:table] arrangedObjects] count]);
+}
+
+- (id)tableView:(NSTableView*)table objectValueForTableColumn:(NSTableColumn*)column row:(NSInteger)row
+{
+    return ModrigUtils::ValueInRow([self rowsOf:table], column, row);
 }
 
 - (void)tableViewSelectionDidChange:(NSNotification*)notification

@@ -2,38 +2,47 @@
 
 #include <wincompat/winstring.h>
 
-#include <cctype>
+#include <array>
 #include <functional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "loader/LoadedApplications.h"
 
 namespace
 {
+constexpr unichar kLastAscii = 0x7F;
+
 // Nothing else is equal to these and their capitals without regard to case. Left out are the letters that
 // something is: the s (long s), the k (Kelvin), those of ligatures.
 constexpr std::string_view kUnmistakable = "0123456789/._-bcdeghmopqruvwxyz";
-constexpr unichar kLastAscii = 0x7F;
 
-bool isUnmistakable(unichar character)
+// The lower-case letter of each unmistakable character, and 0 of every other one.
+constexpr auto kCertain = []
 {
-    const int lower = character <= kLastAscii ? std::tolower(character) : 0;
-    return kUnmistakable.find(static_cast<char>(lower)) != std::string_view::npos;
-}
+    std::array<char, kLastAscii + 1> certain = {};
+    for (const char character : kUnmistakable)
+    {
+        certain[static_cast<std::size_t>(character)] = character;
+        if (character >= 'a' && character <= 'z')
+            certain[static_cast<std::size_t>(character - 'a' + 'A')] = character;
+    }
+    return certain;
+}();
 } // namespace
 
 @implementation ModrigFilePath
 
 @synthesize filePathName = mFilePathName;
-@synthesize fileName = mFileName;
-@synthesize filePath = mFilePath;
 @synthesize unloadable = mUnloadable;
 
 - (id)initWithFilePathName:(NSString*)path
 {
     if (!(self = [self initWithResolvedPath:path]) || !path)
         return self;
+    mFileName = [[path lastPathComponent] copy];
+    mFilePath = [[path stringByDeletingLastPathComponent] copy];
     [mFilePathName release];
     mFilePathName = [[path stringByResolvingSymlinksInPath] copy];
     return self;
@@ -44,8 +53,6 @@ bool isUnmistakable(unichar character)
     if (!(self = [super init]) || !path)
         return self;
     mFilePathName = [path copy];
-    mFileName = [[path lastPathComponent] copy];
-    mFilePath = [[path stringByDeletingLastPathComponent] copy];
     mUnloadable = ModrigUtils::IsAppUnloadAble(CStdStr(NSStringToWstring(path)));
     return self;
 }
@@ -56,6 +63,21 @@ bool isUnmistakable(unichar character)
     [mFileName release];
     [mFilePath release];
     [super dealloc];
+}
+
+// Where no other path was given, name and folder wait for the first who asks: few of many rows ever show.
+- (NSString*)fileName
+{
+    if (!mFileName)
+        mFileName = [[mFilePathName lastPathComponent] copy];
+    return mFileName;
+}
+
+- (NSString*)filePath
+{
+    if (!mFilePath)
+        mFilePath = [[mFilePathName stringByDeletingLastPathComponent] copy];
+    return mFilePath;
 }
 
 - (CStdStr)path
@@ -77,16 +99,15 @@ bool isUnmistakable(unichar character)
 // behind its letter, or part of it. So a letter counts only where no such character follows.
 - (NSUInteger)hash
 {
-    std::string certain;
     const NSUInteger length = [mFilePathName length];
+    std::vector<unichar> characters(length + 1); // nothing follows the last one
+    [mFilePathName getCharacters:characters.data() range:NSMakeRange(0, length)];
+    std::string certain;
+    certain.reserve(length);
     for (NSUInteger index = 0; index < length; ++index)
-    {
-        const unichar character = [mFilePathName characterAtIndex:index];
-        const bool standsAlone =
-            index + 1 == length || [mFilePathName characterAtIndex:index + 1] <= kLastAscii;
-        if (standsAlone && isUnmistakable(character))
-            certain += static_cast<char>(std::tolower(character));
-    }
+        if (characters[index] <= kLastAscii && characters[index + 1] <= kLastAscii &&
+            kCertain[characters[index]])
+            certain += kCertain[characters[index]];
     return std::hash<std::string>()(certain);
 }
 

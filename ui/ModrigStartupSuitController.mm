@@ -47,6 +47,7 @@ unichar keyOf(NSEvent* event)
 {
     ModrigPlatform::CompleteSegments(segmentedControl);
     [startupTableView sizeLastColumnToFit];
+    ModrigPlatform::ShowRows(startupTableView, startupApps);
     [startupApps setSelectsInsertedObjects:NO];
     [TsOCModrigUtil addPathNames:ModrigUtils::StringsFromList(gStartupList) toArrayController:startupApps];
     [startupApps setSelectsInsertedObjects:YES];
@@ -118,11 +119,16 @@ unichar keyOf(NSEvent* event)
     ModrigUtils::RemoveFromStartupSuite(ModrigUtils::PathsFromRows(rows));
 }
 
-// The columns are bound to the rows; this one answer some platforms want from the data source all the same.
 - (NSInteger)numberOfRowsInTableView:(NSTableView*)table
 {
     (void)table;
     return static_cast<NSInteger>([[startupApps arrangedObjects] count]);
+}
+
+- (id)tableView:(NSTableView*)table objectValueForTableColumn:(NSTableColumn*)column row:(NSInteger)row
+{
+    (void)table;
+    return ModrigUtils::ValueInRow(startupApps, column, row);
 }
 
 - (BOOL)addToSuite:(ModrigFilePath*)file

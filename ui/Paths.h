@@ -1,7 +1,7 @@
 // Paths and rows between the dialogs and the module's logic.
 #pragma once
 
-#import <Foundation/Foundation.h>
+#import <AppKit/AppKit.h>
 
 #include <vector>
 
@@ -17,6 +17,9 @@ std::vector<CStdStr> PathsFromRows(NSArray* rows);
 
 // New rows for the paths, links not resolved before their names are taken.
 NSArray* RowsFromPaths(const std::vector<CStdStr>& paths);
+
+// What a column shows of a row; nil for a row that is not there.
+id ValueInRow(NSArrayController* rows, NSTableColumn* column, NSInteger row);
 
 CStdStr PathFromString(NSString* text);
 NSString* StringFromPath(const CStdStr& path);

@@ -35,6 +35,14 @@ NSArray* RowsFromPaths(const std::vector<CStdStr>& paths)
     return rows;
 }
 
+id ValueInRow(NSArrayController* rows, NSTableColumn* column, NSInteger row)
+{
+    NSArray* all = [rows arrangedObjects];
+    if (row < 0 || static_cast<NSUInteger>(row) >= [all count])
+        return nil;
+    return [[all objectAtIndex:static_cast<NSUInteger>(row)] valueForKey:[column identifier]];
+}
+
 CStdStr PathFromString(NSString* text)
 {
     return CStdStr(NSStringToWstring(text));

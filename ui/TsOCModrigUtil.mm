@@ -5,8 +5,6 @@
 #include <wincompat/winfile.h>
 #include <wincompat/winstring.h>
 
-#include <set>
-
 #import "ui/ModrigController.h"
 #import "ui/ModrigFilePath.h"
 
@@ -23,28 +21,6 @@ NSString* const kFilterKeys[] = {@"IDS_MODRIG_TESSEL_APPS", @"IDS_MODRIG_QMB_APP
 CStdStr wide(NSString* text)
 {
     return CStdStr(NSStringToWstring(text));
-}
-
-// The order of paths by which rows are equal. Found in it, a path is equal to one of many without a
-// comparison with each.
-struct IsBefore
-{
-    bool operator()(NSString* left, NSString* right) const
-    {
-        return [left caseInsensitiveCompare:right] == NSOrderedAscending;
-    }
-};
-
-// The paths belong to whoever made the set.
-using Identities = std::set<NSString*, IsBefore>;
-
-Identities identitiesOfRows(NSArrayController* controller)
-{
-    Identities identities;
-    for (ModrigFilePath* row : tsuiEach<ModrigFilePath*>([controller arrangedObjects]))
-        if ([row filePathName])
-            identities.insert([row filePathName]);
-    return identities;
 }
 } // namespace
 
@@ -69,15 +45,16 @@ Identities identitiesOfRows(NSArrayController* controller)
 
 + (void)addPathNames:(NSArray*)paths toArrayController:(NSArrayController*)controller
 {
-    Identities known = identitiesOfRows(controller);
+    NSMutableSet* known = [NSMutableSet setWithArray:[controller arrangedObjects]];
     NSMutableArray* rows = [NSMutableArray array];
     for (NSString* path : tsuiEach<NSString*>(paths))
     {
-        NSString* resolved = [path stringByResolvingSymlinksInPath];
-        if (!known.insert(resolved).second)
-            continue;
-        ModrigFilePath* row = [[ModrigFilePath alloc] initWithResolvedPath:resolved];
-        [rows addObject:row];
+        ModrigFilePath* row =
+            [[ModrigFilePath alloc] initWithResolvedPath:[path stringByResolvingSymlinksInPath]];
+        const NSUInteger before = [known count];
+        [known addObject:row];
+        if ([known count] > before)
+            [rows addObject:row];
         [row release];
     }
     if ([rows count])

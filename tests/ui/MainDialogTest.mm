@@ -29,9 +29,11 @@ protected:
         return host().registry.value(settingsKey(), name);
     }
     std::wstring message() { return wide([mController message]); }
-    static std::wstring keyPathOf(NSTableColumn* column)
+    static NSString* shownIn(NSTableView* table, NSUInteger column, NSInteger row)
     {
-        return wide([[column infoForBinding:@"value"] objectForKey:NSObservedKeyPathKey]);
+        return [[table dataSource] tableView:table
+                   objectValueForTableColumn:[[table tableColumns] objectAtIndex:column]
+                                         row:row];
     }
     void fillHistory(std::initializer_list<std::string> names)
     {
@@ -81,8 +83,8 @@ TEST_F(MainDialog, ShowsFileAndFolderInTheColumns)
     ASSERT_EQ(2u, [columns count]);
     EXPECT_EQ(L"File", wide([[[columns objectAtIndex:0] headerCell] stringValue]));
     EXPECT_EQ(L"Folder", wide([[[columns objectAtIndex:1] headerCell] stringValue]));
-    EXPECT_EQ(L"arrangedObjects.fileName", keyPathOf([columns objectAtIndex:0]));
-    EXPECT_EQ(L"arrangedObjects.filePath", keyPathOf([columns objectAtIndex:1]));
+    EXPECT_EQ(L"one.zmb", wide(shownIn(loadedTable(), 0, 0)));
+    EXPECT_EQ(mFolder.path().wstring(), wide(shownIn(loadedTable(), 1, 0)));
 }
 
 TEST_F(MainDialog, IsTheCurrentControllerWhileItIsOpen)

@@ -40,6 +40,10 @@ bool FileExists(NSString* path, bool& isFolder);
 // Whether its user sees the folder as one file.
 bool IsFilePackage(NSString* path);
 
+// Makes the table show the rows. Its columns are bound to them, and have the keys of what they show for
+// identifiers; its data source answers both questions of a table, for toolkits where bindings are slow.
+void ShowRows(NSTableView* table, NSArrayController* rows);
+
 // Makes the rows that the user selected in the table those that the controller has selected.
 void AdoptTableSelection(NSTableView* table, NSArrayController* rows);
 

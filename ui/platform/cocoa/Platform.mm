@@ -121,6 +121,11 @@ bool IsFilePackage(NSString* path)
 }
 
 // Bindings do it.
+// The bindings do.
+void ShowRows(NSTableView*, NSArrayController*)
+{
+}
+
 void AdoptTableSelection(NSTableView*, NSArrayController*)
 {
 }

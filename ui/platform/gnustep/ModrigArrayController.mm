@@ -18,9 +18,15 @@
     return self;
 }
 
+- (void)setTable:(NSTableView*)table
+{
+    mTable = table;
+}
+
 - (void)replaceContent:(NSMutableArray*)content selecting:(NSArray*)wanted
 {
     [self setContent:content];
+    [mTable reloadData];
     NSMutableIndexSet* selection = [NSMutableIndexSet indexSet];
     for (NSUInteger index = 0; index < [wanted count]; ++index)
     {

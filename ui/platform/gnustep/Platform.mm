@@ -1,3 +1,4 @@
+#import "ui/ModrigArrayController.h"
 #import "ui/NSSavePanel+ModrigRuntime.h"
 
 #include <tesselui/tsuieach.h>
@@ -298,6 +299,15 @@ bool IsFilePackage(NSString* path)
 }
 
 // Bindings lead from the controller to the table only.
+// A bound column watches every row, and fetches what all of them show anew for each cell that it draws.
+void ShowRows(NSTableView* table, NSArrayController* rows)
+{
+    for (NSTableColumn* column : tsuiEach<NSTableColumn*>([table tableColumns]))
+        [column unbind:NSValueBinding];
+    [(ModrigArrayController*)rows setTable:table];
+    [table reloadData];
+}
+
 void AdoptTableSelection(NSTableView* table, NSArrayController* rows)
 {
     [rows setSelectionIndexes:[table selectedRowIndexes]];
