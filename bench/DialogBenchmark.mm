@@ -119,16 +119,60 @@ double openTable(std::size_t entries)
     return dialog.rows(@"historyList") == entries ? seconds : -1;
 }
 
-double giveToBareController(std::size_t entries)
+NSMutableArray* readyRows(std::size_t entries)
 {
     fillHistory(entries);
     NSMutableArray* rows = [NSMutableArray array];
     for (NSString* path : tsuiEach<NSString*>(ModrigUtils::StringsFromList(gHistoryList)))
         [rows addObject:[[[ModrigFilePath alloc] initWithFilePathName:path] autorelease]];
-    NSArrayController* bare =
-        [[[NSArrayController alloc] initWithContent:[NSMutableArray array]] autorelease];
-    const double seconds = secondsInPool([&] { [bare addObjects:rows]; });
+    return rows;
+}
+
+NSArrayController* bareController()
+{
+    return [[[NSArrayController alloc] initWithContent:[NSMutableArray array]] autorelease];
+}
+
+// One by one, as the entries of the History come; nothing shows them.
+double giveToBareController(std::size_t entries)
+{
+    NSArray* rows = readyRows(entries);
+    NSArrayController* bare = bareController();
+    const double seconds = secondsInPool(
+        [&]
+        {
+            for (ModrigFilePath* row : tsuiEach<ModrigFilePath*>(rows))
+                [bare addObject:row];
+        });
     return [[bare arrangedObjects] count] == entries ? seconds : -1;
+}
+
+NSTableView* boundTable(NSArrayController* rows)
+{
+    NSTableView* table = [[[NSTableView alloc] initWithFrame:NSMakeRect(0, 0, 400, 200)] autorelease];
+    for (NSString* key : {@"fileName", @"filePath"})
+    {
+        NSTableColumn* column = [[[NSTableColumn alloc] initWithIdentifier:key] autorelease];
+        [table addTableColumn:column];
+        [column bind:NSValueBinding
+               toObject:rows
+            withKeyPath:[@"arrangedObjects." stringByAppendingString:key]
+                options:nil];
+    }
+    return table;
+}
+
+// All in one call, to the rows of a table with two columns that are bound to them.
+double giveToBoundController(std::size_t entries)
+{
+    NSArray* rows = readyRows(entries);
+    NSArrayController* bare = bareController();
+    NSTableView* table = boundTable(bare);
+    const double seconds = secondsInPool([&] { [bare addObjects:rows]; });
+    const bool all = static_cast<std::size_t>([table numberOfRows]) == entries;
+    for (NSTableColumn* column : tsuiEach<NSTableColumn*>([table tableColumns]))
+        [column unbind:NSValueBinding];
+    return all ? seconds : -1;
 }
 
 // Paths of modules that nothing has loaded.
@@ -181,12 +225,16 @@ std::string dropping(std::size_t files)
 void addBenchmarks()
 {
     const std::string bare = "give 10000 rows to a bare array controller";
+    const std::string bound = "give 10000 rows to one that a table is bound to";
     for (const std::size_t entries : {kFewEntries, kManyEntries})
         measure(opening(entries), [entries] { return openTable(entries); });
     measure(bare, [] { return giveToBareController(kManyEntries); });
+    measure(bound, [] { return giveToBoundController(kManyEntries); });
     for (const std::size_t files : {kFewFiles, kManyFiles})
         measure(dropping(files), [files] { return dropFiles(files); });
     bench::addRatio({opening(kManyEntries) + " / bare array controller", opening(kManyEntries), bare, 2});
+    bench::addRatio(
+        {opening(kManyEntries) + " / the same with a table bound", opening(kManyEntries), bound, 2});
     bench::addRatio({"open tables, cost per entry at 10000 / at 1000", opening(kManyEntries),
                      opening(kFewEntries), 1.5, kManyEntries, kFewEntries});
     bench::addRatio({"drop, cost per file of 50 / of 10", dropping(kManyFiles), dropping(kFewFiles), 1.5,
