@@ -69,6 +69,18 @@ TEST_F(DialogBrowser, ReturnLoadsTheFileWhoseNameIsTyped)
     EXPECT_THAT(output, HasSubstr(listedIn("typed.lsp", files())));
 }
 
+TEST_F(DialogBrowser, LoadsTheFileWhoseNameIsTyped)
+{
+    writeLisp("typed.lsp");
+    open();
+    typeName("typed.lsp");
+    shoot("typed");
+    click(places::kLoad);
+    EXPECT_TRUE(prints(wasLoaded("typed.lsp")));
+    shoot("loaded");
+    EXPECT_THAT(closeAndEnd(), HasSubstr("typed.lsp runs"));
+}
+
 TEST_F(DialogBrowser, ReturnLoadsTheFileThatIsSelected)
 {
     writeLisp("chosen.lsp");
@@ -148,4 +160,19 @@ TEST_F(DialogBrowser, ShowsTheFilesOfTheChosenTypeOnly)
     click(places::kLoad);
     EXPECT_TRUE(prints(wasLoaded("gears.omp")));
     EXPECT_THAT(closeAndEnd(), HasSubstr("z.lsp runs"));
+}
+
+TEST_F(DialogBrowser, LoadsNothingThatTheChosenTypeHides)
+{
+    copySample("gears.omp");
+    writeLisp("z.lsp");
+    open();
+    click(places::file(0));
+    shoot("selected");
+    mScreen.choose(mDialog, places::kFileTypes, {places::kFileTypes.x, places::kFileTypes.y + 3 * 26});
+    click(places::kLoad);
+    shoot("hidden");
+    const std::string output = closeAndEnd();
+    EXPECT_THAT(output, Not(HasSubstr("loaded.\n")));
+    EXPECT_THAT(output, Not(HasSubstr("gears.omp")));
 }

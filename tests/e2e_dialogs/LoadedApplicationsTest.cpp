@@ -27,6 +27,20 @@ TEST_F(DialogLoadedApplications, UnloadsTheSelectedRow)
     EXPECT_THAT(closeAndEnd(), Not(HasSubstr(listedIn("gears.omp", files()))));
 }
 
+TEST_F(DialogLoadedApplications, DoesNotSelectALoadedFileThatCannotBeUnloaded)
+{
+    writeLisp("z.lsp");
+    open();
+    const std::string buttonBefore = look(places::kUnload);
+    loadFirstFile("z.lsp");
+    const std::string boxBefore = look(places::kAddToHistory);
+    click(places::kAddToHistory); // shows that the load has been dealt with
+    ASSERT_TRUE(changes(places::kAddToHistory, boxBefore));
+    shoot("loaded");
+    EXPECT_EQ(look(places::kUnload), buttonBefore) << "Unload is enabled";
+    closeAndEnd();
+}
+
 TEST_F(DialogLoadedApplications, DoesNotSelectARowThatCannotBeUnloaded)
 {
     storeSuite({writeLisp("z.lsp"), copySample("gears.omp")});
