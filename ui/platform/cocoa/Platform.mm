@@ -6,6 +6,12 @@
 #include "ui/platform/Platform.h"
 
 @implementation ModrigArrayController
+
+- (void)setTable:(NSTableView*)table
+{
+    mTable = table;
+}
+
 @end
 
 @implementation NSSavePanel (ModrigRuntime)
