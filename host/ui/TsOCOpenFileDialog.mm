@@ -150,6 +150,7 @@ NSTextField* makeLabel(NSString* text)
     [panel setDelegate:(id)chooser];
     if ([mFileFilters count])
         [panel setAccessoryView:[chooser view]];
+    [panel recalculateKeyViewLoop]; // the choice of the file type is one of the stops of the Tab key
     const bool chosen = [panel runModal] == NSOKButton;
     [mSelectedPathes release];
     mSelectedPathes = [(chosen ? tessel::windowing::chosenPaths(panel) : [NSArray array]) copy];

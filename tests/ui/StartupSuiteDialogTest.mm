@@ -16,6 +16,16 @@ namespace
 constexpr NSInteger kAdd = 0;
 constexpr NSInteger kRemove = 1;
 
+// Whether Tab comes to the view from the window's name field.
+bool isReachedByTab(NSView* wanted, NSWindow* window)
+{
+    constexpr int kMostStops = 50;
+    NSView* view = [[window contentView] viewWithTag:NSFileHandlingPanelForm];
+    for (int stop = 0; stop < kMostStops && view && view != wanted; ++stop)
+        view = [view nextValidKeyView];
+    return view == wanted;
+}
+
 class StartupSuiteDialog : public OpenDialogTest
 {
 protected:
@@ -286,6 +296,7 @@ TEST_F(StartupSuiteDialog, ChoosesFilesInTheHostsFolderWhateverTheOtherDialogRem
                                 EXPECT_EQ(6u, [filters count]);
                                 EXPECT_TRUE(
                                     [[types itemTitles] isEqual:[filters valueForKey:@"description"]]);
+                                EXPECT_TRUE(isReachedByTab(types, dialog));
                                 [dialog cancel:nil];
                             }});
     clickSegment(kAdd);
