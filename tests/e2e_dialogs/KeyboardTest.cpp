@@ -24,7 +24,7 @@ constexpr int kTabsToRemove = 3;
 // In the Startup Suite's window.
 constexpr int kTabsToSuiteHelp = 2;
 constexpr int kTabsToSuiteClose = 3;
-constexpr int kTabsToBrowserOfAddPanel = 5;
+constexpr int kTabsToBrowserOfAddPanel = 6;
 } // namespace
 
 class DialogKeyboard : public DialogTest
