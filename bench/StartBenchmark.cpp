@@ -13,6 +13,7 @@
 
 #include "bench/Ratios.h"
 #include "bench/Session.h"
+#include "tests/support/ProgramArguments.h"
 
 extern char** environ;
 
@@ -29,10 +30,7 @@ double secondsOf(const timeval& time)
 // if it did not end well.
 double runProgram(std::vector<std::string> arguments)
 {
-    std::vector<char*> pointers;
-    for (std::string& argument : arguments)
-        pointers.push_back(argument.data());
-    pointers.push_back(nullptr);
+    const std::vector<char*> pointers = pointersTo(arguments);
     posix_spawn_file_actions_t actions;
     posix_spawn_file_actions_init(&actions);
     posix_spawn_file_actions_addopen(&actions, STDIN_FILENO, "/dev/null", O_RDONLY, 0);

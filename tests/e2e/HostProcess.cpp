@@ -12,20 +12,13 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include "tests/support/ProgramArguments.h"
+
 extern char** environ;
 
 namespace
 {
 using Clock = std::chrono::steady_clock;
-
-std::vector<char*> pointersTo(std::vector<std::string>& texts)
-{
-    std::vector<char*> pointers;
-    for (auto& text : texts)
-        pointers.push_back(text.data());
-    pointers.push_back(nullptr);
-    return pointers;
-}
 
 class Pipe
 {

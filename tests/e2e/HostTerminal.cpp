@@ -8,20 +8,13 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include "tests/support/ProgramArguments.h"
+
 namespace
 {
 using Clock = std::chrono::steady_clock;
 
 constexpr winsize kWindow{24, 200, 0, 0}; // wide: nothing a test looks for is broken over two lines
-
-std::vector<char*> pointersTo(std::vector<std::string>& texts)
-{
-    std::vector<char*> pointers;
-    for (auto& text : texts)
-        pointers.push_back(text.data());
-    pointers.push_back(nullptr);
-    return pointers;
-}
 } // namespace
 
 HostTerminal::HostTerminal(const HostSession& session, const std::vector<std::string>& arguments)

@@ -11,18 +11,7 @@
 #include <unistd.h>
 
 #include "tests/e2e_dialogs/Waiting.h"
-
-namespace
-{
-std::vector<char*> pointersTo(std::vector<std::string>& texts)
-{
-    std::vector<char*> pointers;
-    for (auto& text : texts)
-        pointers.push_back(text.data());
-    pointers.push_back(nullptr);
-    return pointers;
-}
-} // namespace
+#include "tests/support/ProgramArguments.h"
 
 Program::Program(std::vector<std::string> arguments, std::vector<std::string> environment,
                  std::filesystem::path output)
