@@ -21,14 +21,6 @@ void addLoadedOf(const CStringList& list, NSMutableArray* paths)
             [paths addObject:ModrigUtils::StringFromPath(path)];
 }
 
-// Without selecting what is added: nothing has been chosen by anybody yet.
-void fill(NSArrayController* rows, NSArray* paths)
-{
-    [rows setSelectsInsertedObjects:NO];
-    [TsOCModrigUtil addPathNames:paths toArrayController:rows];
-    [rows setSelectsInsertedObjects:YES];
-}
-
 std::vector<ModrigUtils::UnloadCandidate> unloadCandidates(NSArray* rows)
 {
     std::vector<ModrigUtils::UnloadCandidate> candidates;
@@ -50,12 +42,12 @@ bool hasSelection(NSArrayController* rows)
     NSMutableArray* paths = [NSMutableArray array];
     addLoadedOf(gLoadedAppList, paths);
     addLoadedOf(gStartupList, paths);
-    fill(loadedApps, paths);
+    [TsOCModrigUtil fill:loadedApps withPathNames:paths];
 }
 
 - (void)populateHistoryList
 {
-    fill(historyList, ModrigUtils::StringsFromList(gHistoryList));
+    [TsOCModrigUtil fill:historyList withPathNames:ModrigUtils::StringsFromList(gHistoryList)];
 }
 
 - (NSArrayController*)rowsOf:(NSTableView*)table

@@ -48,9 +48,7 @@ unichar keyOf(NSEvent* event)
     ModrigPlatform::CompleteSegments(segmentedControl);
     [startupTableView sizeLastColumnToFit];
     ModrigPlatform::ShowRows(startupTableView, startupApps);
-    [startupApps setSelectsInsertedObjects:NO];
-    [TsOCModrigUtil addPathNames:ModrigUtils::StringsFromList(gStartupList) toArrayController:startupApps];
-    [startupApps setSelectsInsertedObjects:YES];
+    [TsOCModrigUtil fill:startupApps withPathNames:ModrigUtils::StringsFromList(gStartupList)];
     [self enableRemove:NO];
 }
 

@@ -61,6 +61,13 @@ CStdStr wide(NSString* text)
         [controller addObjects:rows];
 }
 
++ (void)fill:(NSArrayController*)controller withPathNames:(NSArray*)paths
+{
+    [controller setSelectsInsertedObjects:NO];
+    [self addPathNames:paths toArrayController:controller];
+    [controller setSelectsInsertedObjects:YES];
+}
+
 + (NSString*)modrigLoadString:(NSString*)key
 {
     NSBundle* bundle = [NSBundle bundleForClass:[TsOCModrigUtil class]];
