@@ -7,7 +7,6 @@
 
 #include <cstdlib>
 #include <exception>
-#include <filesystem>
 #include <functional>
 #include <iostream>
 #include <optional>
@@ -33,12 +32,6 @@ constexpr std::size_t kManyEntries = 10'000;
 constexpr std::size_t kFewFiles = 10;
 constexpr std::size_t kManyFiles = 50;
 constexpr int kRepetitions = 15;
-
-std::wstring wide(const std::filesystem::path& path)
-{
-    const std::string text = path.string();
-    return {text.begin(), text.end()}; // the folder's name is plain
-}
 
 void fillHistory(std::size_t count)
 {
@@ -178,15 +171,10 @@ double giveToBoundController(std::size_t entries)
 // Paths of modules that nothing has loaded.
 NSArray* modulePaths(std::size_t count)
 {
-    const auto folder = bench::workFolder() / "dropped";
-    std::filesystem::create_directories(folder);
+    const auto folder = bench::folderOfModules("dropped", count);
     NSMutableArray* paths = [NSMutableArray array];
     for (std::size_t i = 0; i < count; ++i)
-    {
-        const auto path = folder / ("module" + std::to_string(i) + ".zmb");
-        std::filesystem::copy_file(BENCH_MODULE, path, std::filesystem::copy_options::skip_existing);
-        [paths addObject:ModrigUtils::StringFromPath(CStdStr(wide(path)))];
-    }
+        [paths addObject:ModrigUtils::StringFromPath(CStdStr(bench::wide(bench::moduleIn(folder, i))))];
     return paths;
 }
 

@@ -8,7 +8,6 @@
 #include <tessel/tsrxlinker.h>
 
 #include <QLibrary>
-#include <filesystem>
 #include <string>
 #include <vector>
 
@@ -20,28 +19,9 @@
 
 namespace
 {
-constexpr int kModules = 500;
+constexpr std::size_t kModules = 500;
 constexpr int kRepetitions = 15;
 constexpr const char* kEntry = "tsrxEntryPoint";
-
-std::filesystem::path moduleIn(const std::filesystem::path& folder, int number)
-{
-    return folder / ("module" + std::to_string(number) + ".zmb");
-}
-
-// The modules, made once.
-const std::filesystem::path& moduleFolder()
-{
-    static const std::filesystem::path folder = []
-    {
-        auto made = bench::workFolder() / "modules";
-        std::filesystem::create_directories(made);
-        for (int i = 0; i < kModules; ++i)
-            std::filesystem::copy_file(BENCH_MODULE, moduleIn(made, i));
-        return made;
-    }();
-    return folder;
-}
 
 bool callEntry(void* entry)
 {
@@ -107,10 +87,10 @@ double secondsBy(const std::vector<std::string>& paths)
 template <bool (*kLoad)(const std::wstring&)>
 double secondsBy(const std::vector<std::string>& paths)
 {
-    std::vector<std::wstring> wide;
+    std::vector<std::wstring> widePaths;
     for (const std::string& path : paths)
-        wide.emplace_back(path.begin(), path.end()); // the folder's name is plain
-    return secondsForAll(wide, kLoad);
+        widePaths.push_back(bench::wide(path));
+    return secondsForAll(widePaths, kLoad);
 }
 
 constexpr Loader kLoaders[] = {{"bare dlopen and entry", secondsBy<loadBare>},
@@ -124,14 +104,14 @@ std::string benchmarkOf(const std::string& loader)
     return "load 500: " + loader;
 }
 
-void add(const Loader& loader)
+void add(const Loader& loader, const std::string& folder)
 {
-    const auto run = [name = std::string(loader.name)](benchmark::State& state)
+    const auto run = [name = std::string(loader.name), folder](benchmark::State& state)
     {
         for (auto iteration : state)
         {
             static_cast<void>(iteration);
-            const double seconds = bench::inNewProcess({"load", name, moduleFolder().string()});
+            const double seconds = bench::inNewProcess({"load", name, folder});
             if (seconds < 0)
                 state.SkipWithError("not every module was loaded");
             state.SetIterationTime(seconds);
@@ -152,8 +132,8 @@ void addLoadingRatio(const std::string& what, const std::string& base, double mo
 double secondsToLoad(const std::string& loader, const std::string& folder)
 {
     std::vector<std::string> paths;
-    for (int i = 0; i < kModules; ++i)
-        paths.push_back(moduleIn(folder, i).string());
+    for (std::size_t i = 0; i < kModules; ++i)
+        paths.push_back(bench::moduleIn(folder, i).string());
     bench::startHost();
     for (const Loader& known : kLoaders)
         if (loader == known.name)
@@ -163,8 +143,9 @@ double secondsToLoad(const std::string& loader, const std::string& folder)
 
 void addLoadingBenchmarks()
 {
+    const std::string folder = bench::folderOfModules("modules", kModules).string();
     for (const Loader& loader : kLoaders)
-        add(loader);
+        add(loader, folder);
     addLoadingRatio("PerformModrig", "host linker", 1.05);
     addLoadingRatio("PerformModrig", "bare dlopen and entry", 1.3);
     addLoadingRatio("PerformModrig", "QLibrary", 1.0);

@@ -24,24 +24,16 @@ constexpr int kLispFilesPerModule = 10;
 constexpr int kPaths = 1'000;
 constexpr int kRepetitions = 9;
 
-std::wstring wide(const std::filesystem::path& path)
-{
-    const std::string text = path.string();
-    return {text.begin(), text.end()}; // the folder's name is plain
-}
-
 // Whether all of them were loaded.
 bool loadModules(int count)
 {
-    const auto folder = bench::workFolder() / "rebuild";
-    std::filesystem::create_directories(folder);
+    const auto folder = bench::folderOfModules("rebuild", static_cast<std::size_t>(count));
     TsRxDynamicLinker* linker = TsRxDynamicLinker::cast(tsrxSysRegistry()->at(TSRX_DYNAMIC_LINKER));
     bool all = true;
     for (int i = 0; i < count; ++i)
     {
-        const auto path = folder / ("module" + std::to_string(i) + ".zmb");
-        std::filesystem::copy_file(BENCH_MODULE, path, std::filesystem::copy_options::skip_existing);
-        all = linker->loadModule(wide(path).c_str(), true, true) && all;
+        const auto path = bench::moduleIn(folder, static_cast<std::size_t>(i));
+        all = linker->loadModule(bench::wide(path).c_str(), true, true) && all;
     }
     return all;
 }
@@ -53,7 +45,7 @@ void loadLispFiles(int count)
     {
         const auto path = folder / ("tool" + std::to_string(i) + ".lsp");
         std::ofstream(path) << "t";
-        qxr_queueexpr((L"(load \"" + wide(path) + L"\")").c_str());
+        qxr_queueexpr((L"(load \"" + bench::wide(path) + L"\")").c_str());
     }
     bench::endCommand();
 }
@@ -101,7 +93,7 @@ const std::vector<CStdStr>& existingPaths()
         {
             const auto path = folder / ("tool" + std::to_string(i) + ".lsp");
             std::ofstream(path) << "t";
-            made.emplace_back(wide(path));
+            made.emplace_back(bench::wide(path));
         }
         return made;
     }();

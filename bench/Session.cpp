@@ -50,6 +50,27 @@ const std::filesystem::path& workFolder()
     return folder.path();
 }
 
+std::filesystem::path moduleIn(const std::filesystem::path& folder, std::size_t number)
+{
+    return folder / ("module" + std::to_string(number) + ".zmb");
+}
+
+std::filesystem::path folderOfModules(const std::string& name, std::size_t count)
+{
+    auto folder = workFolder() / name;
+    std::filesystem::create_directories(folder);
+    for (std::size_t i = 0; i < count; ++i)
+        std::filesystem::copy_file(BENCH_MODULE, moduleIn(folder, i),
+                                   std::filesystem::copy_options::skip_existing);
+    return folder;
+}
+
+std::wstring wide(const std::filesystem::path& path)
+{
+    const std::string text = path.string();
+    return {text.begin(), text.end()};
+}
+
 void startHost()
 {
     static const bool started = host().start();

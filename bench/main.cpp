@@ -1,5 +1,6 @@
 // Runs one group of the benchmarks that need no display: modrig_bench GROUP. Ends non-zero when a limit is
-// missed.
+// missed. For each of its runs the loading group starts it again: modrig_bench load LOADER FOLDER prints
+// seconds.
 #include <cstdio>
 #include <cstring>
 #include <string>
