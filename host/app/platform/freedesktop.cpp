@@ -4,7 +4,7 @@
 
 namespace tessel
 {
-// XDG Base Directory Specification: a relative path in the variable is to be ignored.
+// A relative path in the variable counts as none, as it does for every program that keeps to these folders.
 std::filesystem::path personalDataHome()
 {
     const char* dataHome = std::getenv("XDG_DATA_HOME");
