@@ -81,14 +81,6 @@ void AddDocumentApplications()
     for (int index = 0; index < count; ++index)
         AddUnlessFound(CStdStr(document->loadedApplicationName(index)));
 }
-
-bool Unload(const CStdStr& path)
-{
-    if (!LoadApplication(path, kUnload, 0))
-        return false;
-    RemoveInSpecificList(path, gLoadedAppList);
-    return true;
-}
 } // namespace
 
 void PopulateLoadedApps()
@@ -126,9 +118,10 @@ bool IsAppUnloadAble(CStdStr path)
     return FileTypeOfPath(path) == kCompiledModule && !IsModuleLocked(path);
 }
 
-std::vector<std::size_t> UnloadApplications(const std::vector<UnloadCandidate>& candidates)
+void UnloadApplications(const std::vector<UnloadCandidate>& candidates,
+                        const std::function<void(std::size_t index)>& unloaded)
 {
-    std::vector<std::size_t> unloaded;
+    unsigned count = 0;
     // The summary of one names the last application tried, whether or not it was the one unloaded: that is
     // the one whose own message stands right above.
     CStdStr lastTried;
@@ -137,11 +130,12 @@ std::vector<std::size_t> UnloadApplications(const std::vector<UnloadCandidate>& 
         if (!candidates[index].unloadable)
             continue;
         lastTried = candidates[index].path;
-        if (Unload(lastTried))
-            unloaded.push_back(index);
+        if (!LoadApplication(lastTried, kUnload, 0))
+            continue;
+        unloaded(index);
+        RemoveInSpecificList(lastTried, gLoadedAppList);
+        ++count;
     }
-    ModrigCmdlineSummary(ModrigMessages::kOneUnloaded, ModrigMessages::kManyUnloaded,
-                         static_cast<unsigned>(unloaded.size()), lastTried);
-    return unloaded;
+    ModrigCmdlineSummary(ModrigMessages::kOneUnloaded, ModrigMessages::kManyUnloaded, count, lastTried);
 }
 } // namespace ModrigUtils

@@ -1,6 +1,7 @@
 // The list of loaded applications: rebuilt from the host, asked, and unloaded from.
 #pragma once
 
+#include <functional>
 #include <vector>
 
 #include "module/CStdStr.h"
@@ -28,6 +29,8 @@ struct UnloadCandidate
 };
 
 // Unloads every candidate that is unloadable, in order, takes those unloaded out of `gLoadedAppList` and says
-// how many there were. Answers the indexes of the unloaded candidates, ascending.
-std::vector<std::size_t> UnloadApplications(const std::vector<UnloadCandidate>& candidates);
+// how many there were. `unloaded` is called with the index of each right before it leaves the list: the
+// table's row goes first, so that table and list are in step before the next is tried.
+void UnloadApplications(const std::vector<UnloadCandidate>& candidates,
+                        const std::function<void(std::size_t index)>& unloaded);
 } // namespace ModrigUtils

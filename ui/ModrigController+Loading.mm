@@ -4,10 +4,12 @@
 
 #import "ui/ModrigFilePath.h"
 #import "ui/ModrigStartupSuitController.h"
+#import "ui/TsOCModrigUtil.h"
 
 #include "module/Messages.h"
 #include "ui/Paths.h"
 #include "ui/Settings.h"
+#include "ui/model/ChosenFiles.h"
 #include "ui/model/LoadBatch.h"
 #include "ui/platform/Platform.h"
 
@@ -35,11 +37,33 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
 
 @implementation ModrigController (Loading)
 
+// Removing rows from the History, say, leaves nothing chosen while the panel still shows its files as
+// selected.
+- (void)chooseWhatIsStillSelected
+{
+    const bool panelHasSelection = [ModrigPlatform::SelectedPaths(mOpenPanel) count] > 0;
+    const bool historyHasSelection = [[historyList selectedObjects] count] > 0;
+    switch (ModrigUtils::SourceForLoad([mSelectedFiles count] > 0, panelHasSelection, historyHasSelection))
+    {
+    case ModrigUtils::LoadSource::kPanel:
+        return [self panelSelectionDidChange:mOpenPanel];
+    case ModrigUtils::LoadSource::kHistory:
+        return [self chooseFromHistory];
+    case ModrigUtils::LoadSource::kNothing:
+        NSBeep();
+        self.message = [TsOCModrigUtil modrigLoadString:@"IDS_MODRIG_NOTHING_CHOSEN"];
+        return;
+    case ModrigUtils::LoadSource::kChosenFiles:
+        return;
+    }
+}
+
 - (IBAction)onLoad:(id)sender
 {
     (void)sender;
     if (ModrigPlatform::HasUnreportedSelection(mOpenPanel))
         [self panelSelectionDidChange:mOpenPanel];
+    [self chooseWhatIsStillSelected];
     if ([self openTesselFolder])
         return;
     [self loadApps:mSelectedFiles successedApps:nil addToStartupSuit:NO];
@@ -64,32 +88,17 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
     ModrigUtils::OnCommandHelp(ModrigUtils::kMainDialogHelp);
 }
 
-// Whether Load would load the rows that are selected in the History.
-- (BOOL)historyIsChosen
-{
-    return [[historyList selectedObjects] indexOfObjectIdenticalTo:[mSelectedFiles lastObject]] != NSNotFound;
-}
-
-// A new row comes selected, and a selection in the History replaces the selected files. When those are from
-// the panel, they are kept: it still shows them as selected, and the next Load is to load what it shows.
-- (void)insertIntoHistory:(ModrigFilePath*)row
-{
-    if ([[historyList arrangedObjects] containsObject:row])
-        return;
-    const bool keeps = [mSelectedFiles count] > 0 && ![self historyIsChosen];
-    NSArray* selected = [[mSelectedFiles copy] autorelease];
-    insertRow(row, historyList, mInsertRow);
-    [mSelectedFiles setArray:keeps ? selected : [historyList selectedObjects]];
-}
-
 - (void)addRowsFor:(NSString*)path
 {
     ModrigFilePath* row = [[[ModrigFilePath alloc] initWithFilePathName:path] autorelease];
     insertRow(row, loadedApps, mInsertRow);
     // A row that comes in the place of the selected one does not count as a change of the selection.
     [self keepToUnloadableRows];
-    if (mbSaveHistory)
-        [self insertIntoHistory:row];
+    if (!mbSaveHistory)
+        return;
+    insertRow(row, historyList, mInsertRow);
+    // New rows come selected, and not every toolkit tells of that.
+    [self chooseFromHistory];
 }
 
 - (void)showLastRow

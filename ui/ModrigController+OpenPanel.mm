@@ -5,11 +5,14 @@
 
 #import "ui/ModrigFilePath.h"
 #import "ui/NSSavePanel+ModrigRuntime.h"
+#import "ui/NSString+ModrigPaths.h"
 #import "ui/TsOCModrigUtil.h"
 
 #include "module/MessageIds.h"
+#include "types/FileFilters.h"
 #include "ui/Paths.h"
 #include "ui/Settings.h"
+#include "ui/model/ChosenFiles.h"
 #include "ui/model/FileVisibility.h"
 #include "ui/platform/Platform.h"
 
@@ -90,11 +93,20 @@
     [self onFileTypesChanged:nil];
 }
 
+// The pop-up sends itself; nobody has chosen anything when the dialog fills it.
 - (IBAction)onFileTypesChanged:(id)sender
 {
-    (void)sender;
-    if ([self selectedFilter])
-        ModrigPlatform::FilterPanelAnew(mOpenPanel, [[NSBundle bundleForClass:[self class]] bundleURL]);
+    TsOCFileFilter* filter = [self selectedFilter];
+    if (!filter)
+        return;
+    if (sender)
+        ModrigUtils::SetRegFileFilterListIndex(ModrigUtils::PathFromString([filter description]));
+    NSArray* chosen = [[mSelectedFiles copy] autorelease];
+    const bool chosenInHistory = [self historyIsChosen];
+    ModrigPlatform::FilterPanelAnew(mOpenPanel, [[NSBundle bundleForClass:[self class]] bundleURL]);
+    if (!ModrigUtils::PanelSelectionCounts(ModrigUtils::PanelChange::kFileType, [mSelectedFiles count] == 0,
+                                           chosenInHistory))
+        [mSelectedFiles setArray:chosen];
 }
 
 - (BOOL)panel:(id)panel shouldShowFilename:(NSString*)name
@@ -102,7 +114,7 @@
     TsOCFileFilter* filter = [self selectedFilter];
     if (!filter)
         return NO;
-    NSString* path = ModrigPlatform::ResolveLinksAndAliases(name);
+    NSString* path = [name stringByResolvingSymlinksAndAliasesInPath];
     ModrigUtils::PanelFile file;
     file.exists = ModrigPlatform::FileExists(path, file.isFolder);
     file.isPackage = file.isFolder && ModrigPlatform::IsFilePackage(path);

@@ -73,10 +73,20 @@ bool hasSelection(NSArrayController* rows)
     ModrigPlatform::AdoptTableSelection(table, [self rowsOf:table]);
     if (table == loadedAppsTableView)
         [self keepToUnloadableRows];
-    if (table != historyListTableView)
-        return;
+    else if (table == historyListTableView)
+        [self chooseFromHistory];
+}
+
+// Whoever selected the rows: Load loads what the History shows as selected.
+- (void)chooseFromHistory
+{
     self.canRemoveHistory = hasSelection(historyList);
     [mSelectedFiles setArray:[historyList selectedObjects]];
+}
+
+- (BOOL)historyIsChosen
+{
+    return [[historyList selectedObjects] indexOfObjectIdenticalTo:[mSelectedFiles lastObject]] != NSNotFound;
 }
 
 - (BOOL)tableView:(NSTableView*)table shouldSelectRow:(NSInteger)row
@@ -141,8 +151,8 @@ bool hasSelection(NSArrayController* rows)
     NSArray* rows = [[[historyList selectedObjects] copy] autorelease];
     if ([rows count] == 0)
         return;
-    [historyList removeObjects:rows];
-    ModrigUtils::RemoveFromHistory(ModrigUtils::PathsFromRows(rows));
+    ModrigUtils::RemoveFromHistory(ModrigUtils::PathsFromRows(rows),
+                                   ModrigUtils::RemovingRows(rows, historyList));
 }
 
 - (IBAction)onUnload:(id)sender
@@ -151,10 +161,7 @@ bool hasSelection(NSArrayController* rows)
     NSArray* rows = [[[loadedApps selectedObjects] copy] autorelease];
     if ([rows count] == 0)
         return;
-    NSMutableArray* unloaded = [NSMutableArray array];
-    for (const std::size_t index : ModrigUtils::UnloadApplications(unloadCandidates(rows)))
-        [unloaded addObject:[rows objectAtIndex:index]];
-    [loadedApps removeObjects:unloaded];
+    ModrigUtils::UnloadApplications(unloadCandidates(rows), ModrigUtils::RemovingRows(rows, loadedApps));
 }
 
 @end

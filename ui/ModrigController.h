@@ -64,6 +64,11 @@
 // Takes rows that cannot be unloaded out of the selection, whoever put them there.
 - (void)keepToUnloadableRows;
 
+// Makes the rows that are selected in the History what Load will load.
+- (void)chooseFromHistory;
+// Whether they are that now.
+- (BOOL)historyIsChosen;
+
 - (void)tabView:(NSTabView*)tabView didSelectTabViewItem:(NSTabViewItem*)item;
 
 - (IBAction)onLoadFromHistory:(id)sender;

@@ -47,8 +47,17 @@
     return mpUIPersistentStore;
 }
 
+- (void)readSettings
+{
+    TsUIPersistentStore* settings = [self uiPersistentStore];
+    self.saveHistory = [settings getControlState:kSettingsGroup control:kSaveHistorySetting] != 0;
+    self.tabViewSelectedIndex = [settings getControlInt:kSettingsGroup control:kLastTabSetting];
+}
+
 - (void)showModrigDialog
 {
+    // At once, and not only when all else is set up: closing stores them, after a failure too.
+    [self readSettings];
     ModrigUtils::PopulateLoadedApps();
     NSOpenPanel* panel = ModrigPlatform::MakeOpenPanel();
     @try
@@ -67,9 +76,7 @@
 
 - (void)onInit
 {
-    TsUIPersistentStore* settings = [self uiPersistentStore];
-    self.saveHistory = [settings getControlState:kSettingsGroup control:kSaveHistorySetting] != 0;
-    self.tabViewSelectedIndex = [settings getControlInt:kSettingsGroup control:kLastTabSetting];
+    [self readSettings];
     [TsOCModrigUtil setModrigController:self];
     NSArray* files = [NSArray arrayWithObject:NSFilenamesPboardType];
     [loadedAppsTableView registerForDraggedTypes:files];
@@ -95,9 +102,7 @@
     [loadedAppsTableView unregisterDraggedTypes];
     [loadedAppsTableView setDataSource:nil];
     [historyListTableView setDataSource:nil];
-    // A dialog that failed before it had read its settings would store others over them.
-    if ([TsOCModrigUtil getModrigController] == self)
-        [self storeSettings];
+    [self storeSettings];
     [TsOCModrigUtil setModrigController:nil];
     [historyListTableView setDoubleAction:nullptr];
     ModrigUtils::DetachFrom(self, [self view]);

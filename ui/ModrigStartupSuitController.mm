@@ -113,8 +113,8 @@ unichar keyOf(NSEvent* event)
     NSArray* rows = [[[startupApps selectedObjects] copy] autorelease];
     if ([rows count] == 0)
         return;
-    [startupApps removeObjects:rows];
-    ModrigUtils::RemoveFromStartupSuite(ModrigUtils::PathsFromRows(rows));
+    ModrigUtils::RemoveFromStartupSuite(ModrigUtils::PathsFromRows(rows),
+                                        ModrigUtils::RemovingRows(rows, startupApps));
 }
 
 - (NSInteger)numberOfRowsInTableView:(NSTableView*)table

@@ -3,6 +3,7 @@
 
 #import <AppKit/AppKit.h>
 
+#include <functional>
 #include <vector>
 
 #include "module/CStdStr.h"
@@ -17,6 +18,9 @@ std::vector<CStdStr> PathsFromRows(NSArray* rows);
 
 // New rows for the paths, links not resolved before their names are taken.
 NSArray* RowsFromPaths(const std::vector<CStdStr>& paths);
+
+// Removes the row of an index from the table. Neither array may go before the function does.
+std::function<void(std::size_t index)> RemovingRows(NSArray* rows, NSArrayController* table);
 
 // What a column shows of a row; nil for a row that is not there.
 id ValueInRow(NSArrayController* rows, NSTableColumn* column, NSInteger row);

@@ -35,6 +35,11 @@ NSArray* RowsFromPaths(const std::vector<CStdStr>& paths)
     return rows;
 }
 
+std::function<void(std::size_t)> RemovingRows(NSArray* rows, NSArrayController* table)
+{
+    return [=](std::size_t index) { [table removeObject:[rows objectAtIndex:index]]; };
+}
+
 id ValueInRow(NSArrayController* rows, NSTableColumn* column, NSInteger row)
 {
     NSArray* all = [rows arrangedObjects];

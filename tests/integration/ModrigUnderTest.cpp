@@ -80,12 +80,22 @@ int load(const std::wstring& path, bool addToHistory, bool addToStartup)
     return ModrigUtils::PerformModrig(path, addToHistory, addToStartup, ModrigUtils::kReportFailure);
 }
 
+namespace
+{
+std::vector<std::size_t> unloadRows(const std::vector<ModrigUtils::UnloadCandidate>& rows)
+{
+    std::vector<std::size_t> unloaded;
+    ModrigUtils::UnloadApplications(rows, [&](std::size_t index) { unloaded.push_back(index); });
+    return unloaded;
+}
+} // namespace
+
 std::vector<std::size_t> unload(const Paths& selection)
 {
     std::vector<ModrigUtils::UnloadCandidate> rows;
     for (const std::wstring& path : selection)
         rows.push_back({path, mayBeUnloaded(path)});
-    return ModrigUtils::UnloadApplications(rows);
+    return unloadRows(rows);
 }
 
 std::vector<std::size_t> unloadAsListedUnloadable(const Paths& selection)
@@ -93,7 +103,7 @@ std::vector<std::size_t> unloadAsListedUnloadable(const Paths& selection)
     std::vector<ModrigUtils::UnloadCandidate> rows;
     for (const std::wstring& path : selection)
         rows.push_back({path, true});
-    return ModrigUtils::UnloadApplications(rows);
+    return unloadRows(rows);
 }
 
 bool mayBeUnloaded(const std::wstring& path)

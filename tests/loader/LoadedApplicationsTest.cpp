@@ -42,6 +42,21 @@ protected:
             host().linker.setLoaded(path);
         Fill(gLoadedAppList, paths);
     }
+    // The indexes of those unloaded.
+    std::vector<std::size_t> Unload(const std::vector<UnloadCandidate>& candidates)
+    {
+        std::vector<std::size_t> unloaded;
+        UnloadApplications(candidates,
+                           [&](std::size_t index)
+                           {
+                               unloaded.push_back(index);
+                               mEntriesLeft.push_back(gLoadedAppList.GetCount());
+                           });
+        return unloaded;
+    }
+
+    // What the list held each time that a row went.
+    std::vector<std::size_t> mEntriesLeft;
 };
 } // namespace
 
@@ -224,7 +239,7 @@ TEST_F(AskingWhatMayBeUnloaded, AnswersNoForEverythingElseWithoutAskingTheHost)
 TEST_F(Unloading, OneModuleTakesItOutOfTheListAndNamesIt)
 {
     Load({L"/a/one.zmb", L"/a/two.zmb"});
-    EXPECT_THAT(UnloadApplications({{L"/A/Two.zmb", false}, {L"/a/two.zmb", true}}), ElementsAre(1u));
+    EXPECT_THAT(Unload({{L"/A/Two.zmb", false}, {L"/a/two.zmb", true}}), ElementsAre(1u));
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(L"/a/one.zmb"));
     EXPECT_THAT(lines(), ElementsAre(Message(12, L"two.zmb")));
     EXPECT_THAT(recordingDialog().messages, ElementsAre(Message(12, L"two.zmb")));
@@ -233,15 +248,16 @@ TEST_F(Unloading, OneModuleTakesItOutOfTheListAndNamesIt)
 TEST_F(Unloading, SeveralModulesCountsThem)
 {
     Load({L"/a/one.zmb", L"/a/two.zmb", L"/a/three.bundle"});
-    EXPECT_THAT(UnloadApplications({{L"/a/three.bundle", true}, {L"/a/one.zmb", true}}), ElementsAre(0u, 1u));
+    EXPECT_THAT(Unload({{L"/a/three.bundle", true}, {L"/a/one.zmb", true}}), ElementsAre(0u, 1u));
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(L"/a/two.zmb"));
+    EXPECT_THAT(mEntriesLeft, ElementsAre(3u, 2u));
     EXPECT_THAT(lines(), ElementsAre(Message(13, L"2")));
 }
 
 TEST_F(Unloading, GoesInTheOrderOfTheSelectionAndAsksForEachLockAgain)
 {
     Load({L"/a/one.zmb", L"/a/two.zmb"});
-    UnloadApplications({{L"/a/two.zmb", true}, {L"/a/one.zmb", true}});
+    Unload({{L"/a/two.zmb", true}, {L"/a/one.zmb", true}});
     std::vector<std::wstring> linkerCalls = host().journal.entries();
     std::erase_if(linkerCalls,
                   [](const std::wstring& entry) { return entry.find(L".zmb") == std::wstring::npos; });
@@ -252,8 +268,8 @@ TEST_F(Unloading, GoesInTheOrderOfTheSelectionAndAsksForEachLockAgain)
 TEST_F(Unloading, NothingSaysNothing)
 {
     Load({L"/a/one.zmb"});
-    EXPECT_THAT(UnloadApplications({}), IsEmpty());
-    EXPECT_THAT(UnloadApplications({{L"/a/one.zmb", false}, {L"/a/tool.lsp", false}}), IsEmpty());
+    EXPECT_THAT(Unload({}), IsEmpty());
+    EXPECT_THAT(Unload({{L"/a/one.zmb", false}, {L"/a/tool.lsp", false}}), IsEmpty());
     EXPECT_THAT(host().journal.entries(), IsEmpty());
     EXPECT_THAT(recordingDialog().messages, IsEmpty());
     EXPECT_EQ(1u, gLoadedAppList.GetCount());
@@ -263,7 +279,7 @@ TEST_F(Unloading, ALockedModuleStaysAndIsTheOnlyThingSaid)
 {
     Load({L"/a/one.zmb"});
     host().linker.setLocked(L"/a/one.zmb");
-    EXPECT_THAT(UnloadApplications({{L"/a/one.zmb", true}}), IsEmpty());
+    EXPECT_THAT(Unload({{L"/a/one.zmb", true}}), IsEmpty());
     EXPECT_THAT(lines(), ElementsAre(Message(3, L"one.zmb")));
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(L"/a/one.zmb"));
 }
@@ -272,7 +288,7 @@ TEST_F(Unloading, NamesTheLastOneTriedAlsoWhenAnotherWasUnloaded)
 {
     Load({L"/a/a.zmb", L"/a/b.zmb"});
     host().linker.setLocked(L"/a/b.zmb");
-    EXPECT_THAT(UnloadApplications({{L"/a/a.zmb", true}, {L"/a/b.zmb", true}}), ElementsAre(0u));
+    EXPECT_THAT(Unload({{L"/a/a.zmb", true}, {L"/a/b.zmb", true}}), ElementsAre(0u));
     EXPECT_THAT(lines(), ElementsAre(Message(3, L"b.zmb"), Message(12, L"b.zmb")));
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(L"/a/b.zmb"));
 }
@@ -280,7 +296,7 @@ TEST_F(Unloading, NamesTheLastOneTriedAlsoWhenAnotherWasUnloaded)
 TEST_F(Unloading, DoesNotCountARowThatIsNotUnloadableAsTried)
 {
     Load({L"/a/a.zmb", L"/a/b.zmb"});
-    UnloadApplications({{L"/a/a.zmb", true}, {L"/a/b.zmb", false}});
+    Unload({{L"/a/a.zmb", true}, {L"/a/b.zmb", false}});
     EXPECT_THAT(lines(), ElementsAre(Message(12, L"a.zmb")));
 }
 
@@ -288,8 +304,7 @@ TEST_F(Unloading, GoesOnBehindAModuleThatDoesNotUnload)
 {
     Load({L"/a/a.zmb", L"/a/b.zmb", L"/a/c.zmb"});
     host().linker.refuseToUnload(L"/a/a.zmb", L"it stays mapped");
-    EXPECT_THAT(UnloadApplications({{L"/a/a.zmb", true}, {L"/a/b.zmb", true}, {L"/a/c.zmb", true}}),
-                ElementsAre(1u, 2u));
+    EXPECT_THAT(Unload({{L"/a/a.zmb", true}, {L"/a/b.zmb", true}, {L"/a/c.zmb", true}}), ElementsAre(1u, 2u));
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(L"/a/a.zmb"));
     EXPECT_EQ(Message(13, L"2"), lines().back());
 }
@@ -298,13 +313,13 @@ TEST_F(Unloading, TakesAnObjectDatabaseModuleOutByItsWholePath)
 {
     Load({L"/a/tool.omp"});
     host().linker.setLoaded(L"/b/tool.omp");
-    EXPECT_THAT(UnloadApplications({{L"/b/tool.omp", true}}), ElementsAre(0u));
+    EXPECT_THAT(Unload({{L"/b/tool.omp", true}}), ElementsAre(0u));
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(L"/a/tool.omp"));
 }
 
 TEST_F(Unloading, APathWithoutADotThatCountsAsUnloadableIsRefusedByTheLoader)
 {
-    EXPECT_THAT(UnloadApplications({{L"/a/tool", true}}), IsEmpty());
+    EXPECT_THAT(Unload({{L"/a/tool", true}}), IsEmpty());
     EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/tool")));
     EXPECT_THAT(lines(), IsEmpty());
 }
@@ -312,6 +327,6 @@ TEST_F(Unloading, APathWithoutADotThatCountsAsUnloadableIsRefusedByTheLoader)
 TEST_F(Unloading, ModulesWithPerCentSignsInTheirNamesPrintsThemAsTheyAre)
 {
     Load({L"/a/100%s%n.zmb"});
-    UnloadApplications({{L"/a/100%s%n.zmb", true}});
+    Unload({{L"/a/100%s%n.zmb", true}});
     EXPECT_THAT(lines(), ElementsAre(Message(12, L"100%s%n.zmb")));
 }

@@ -25,10 +25,11 @@ const Table kShownExtensions = {
 };
 constexpr char kExtensionSuffix[] = "_EXT";
 constexpr char kCloseButton[] = "IDS_MODRIG_CLOSE_BUTTON";
+constexpr char kNothingChosen[] = "IDS_MODRIG_NOTHING_CHOSEN";
 
 std::set<std::string> everyKey()
 {
-    std::set<std::string> keys = {kCloseButton};
+    std::set<std::string> keys = {kCloseButton, kNothingChosen};
     for (const auto& [key, extensions] : kShownExtensions)
         keys.insert({key, key + kExtensionSuffix});
     return keys;
@@ -73,9 +74,9 @@ protected:
     Table mTexts;
 };
 
-TEST_F(LocalizedStrings, HoldTheThirteenKeysAndNoOther)
+TEST_F(LocalizedStrings, HoldTheFourteenKeysAndNoOther)
 {
-    EXPECT_EQ(keysOf(mTexts).size(), 13U);
+    EXPECT_EQ(keysOf(mTexts).size(), 14U);
     EXPECT_EQ(keysOf(mTexts), everyKey());
 }
 

@@ -12,12 +12,16 @@ namespace
 class Dropping : public OpenDialogTest
 {
 protected:
-    NSDragOperation hover(NSArray* files, NSTableViewDropOperation operation)
+    NSDragOperation hover(NSTableView* table, NSArray* files, NSTableViewDropOperation operation)
     {
-        return [mController tableView:loadedTable()
+        return [mController tableView:table
                          validateDrop:dragOf(files)
                           proposedRow:0
                 proposedDropOperation:operation];
+    }
+    NSDragOperation hover(NSArray* files, NSTableViewDropOperation operation)
+    {
+        return hover(loadedTable(), files, operation);
     }
     BOOL drop(NSTableView* table, NSArray* files, NSInteger row)
     {
@@ -44,6 +48,15 @@ TEST_F(Dropping, OffersToCopyBetweenRowsWhenOneFileCanBeLoaded)
     EXPECT_EQ(NSDragOperationNone, hover(paths({"a.txt", "b.txt"}), NSTableViewDropAbove));
     EXPECT_EQ(NSDragOperationNone, hover([NSArray array], NSTableViewDropAbove));
     EXPECT_EQ(NSDragOperationNone, hover(nil, NSTableViewDropAbove));
+}
+
+TEST_F(Dropping, IsOfferedByWhicheverTableAsks)
+{
+    open();
+    NSTableView* other = [[[NSTableView alloc] init] autorelease];
+    NSTableView* const tables[] = {loadedTable(), historyTable(), other};
+    for (NSTableView* table : tables)
+        EXPECT_EQ(NSDragOperationCopy, hover(table, paths({"b.lsp"}), NSTableViewDropAbove));
 }
 
 TEST_F(Dropping, ShowsNoBoxWhileFilesWithoutAnExtensionHover)
@@ -157,7 +170,7 @@ TEST_F(Dropping, RefusesFiftyOneFilesAndLoadsNone)
 {
     open();
     drop(loadedTable(), manyFiles(51), 0);
-    [box() performDragOperation:dragOf(manyFiles(51))];
+    EXPECT_TRUE([box() performDragOperation:dragOf(manyFiles(51))]);
     EXPECT_THAT(rowsOf(loadedApps()), IsEmpty());
     EXPECT_TRUE(gStartupList.IsEmpty());
     EXPECT_THAT(boxes(), ElementsAre(Message(37, L"50"), Message(37, L"50")));
@@ -202,6 +215,26 @@ TEST_F(Dropping, KeepsTemporaryInternetFilesOutOfTheStartupSuite)
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("net.zmb")));
     EXPECT_THAT(boxes(), ElementsAre(Message(41, file("net.zmb"))));
     EXPECT_THAT(lines(), ElementsAre(Message(8, L"net.zmb")));
+}
+
+TEST_F(Dropping, NamesTheFileThatJoinedTheStartupSuiteWhenTheLastOneCannot)
+{
+    open();
+    host().internet.urlsOfLocalFiles[file("net.zmb")] = L"http://example.org/net.zmb";
+    [box() performDragOperation:dragOf(paths({"one.zmb", "net.zmb"}))];
+    EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2"), Message(10, L"one.zmb")));
+}
+
+TEST_F(Dropping, LoadsALispFileAloneOnTheTableAndAllOfItOnTheStartupSuiteBox)
+{
+    open();
+    drop(loadedTable(), paths({"one.lsp"}), 0);
+    [box() performDragOperation:dragOf(paths({"two.lsp"}))];
+    ASSERT_EQ(6u, host().lisp.queued.size());
+    EXPECT_EQ(L"(load \"" + file("one.lsp") + L"\")", host().lisp.queued[0]);
+    EXPECT_EQ(L"(progn (_INTERNAL-LOAD-ALL-FILE \"" + file("two.lsp") + L"\" nil T T nil)(princ))",
+              host().lisp.queued[3]);
 }
 
 TEST_F(Dropping, StopsSilentlyWhenNoFileIsUsable)

@@ -20,7 +20,54 @@ namespace
 {
 int gDialogsGone = 0;
 int gSuitesGone = 0;
+int gTextsGone = 0;
 } // namespace
+
+// A text whose end is noticed. Whoever copies it keeps it itself.
+@interface CountedText : NSString
+@end
+
+@implementation CountedText
+
+- (NSUInteger)length
+{
+    return 4;
+}
+
+- (unichar)characterAtIndex:(NSUInteger)index
+{
+    return static_cast<unichar>("/a.b"[index]);
+}
+
+- (id)copyWithZone:(NSZone*)zone
+{
+    (void)zone;
+    return [self retain];
+}
+
+// It leads nowhere, and what it is made of it is itself.
+- (NSString*)stringByResolvingSymlinksInPath
+{
+    return self;
+}
+
+- (NSString*)lastPathComponent
+{
+    return self;
+}
+
+- (NSString*)stringByDeletingLastPathComponent
+{
+    return self;
+}
+
+- (void)dealloc
+{
+    ++gTextsGone;
+    [super dealloc];
+}
+
+@end
 
 @interface CountedDialog : ModrigController
 @end
@@ -90,7 +137,7 @@ protected:
     void SetUp() override
     {
         OpenDialogTest::SetUp();
-        gDialogsGone = gSuitesGone = 0;
+        gDialogsGone = gSuitesGone = gTextsGone = 0;
         host().loadedModules.applicationName = L"/host/PlugIns/Modrig.bundle";
     }
     // Runs the dialog in a pool of its own, so that all that is only lent to it is gone afterwards.
@@ -147,6 +194,60 @@ TEST_F(Lifetime, OfTheStartupSuiteDialogEndsWithItsRun)
     [suite release];
     [pool drain];
     EXPECT_EQ(1, gSuitesGone);
+}
+
+TEST_F(Lifetime, OfARowsTextsEndsWithTheRow)
+{
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    CountedText* path = [[CountedText alloc] init];
+    ModrigFilePath* row = [[ModrigFilePath alloc] initWithFilePathName:path];
+    EXPECT_EQ(path, [row filePathName]);
+    EXPECT_EQ(path, [row fileName]);
+    EXPECT_EQ(path, [row filePath]);
+    [path release];
+    [pool drain];
+    EXPECT_EQ(0, gTextsGone);
+    pool = [[NSAutoreleasePool alloc] init];
+    [row release];
+    [pool drain];
+    EXPECT_EQ(1, gTextsGone);
+}
+
+TEST_F(Lifetime, OfWhatADialogHoldsEndsWithTheDialog)
+{
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    CountedDialog* dialog = [[CountedDialog alloc] init];
+    TsUIPersistentStore* store = [[dialog uiPersistentStore] retain];
+    NSMutableArray* files = [[dialog selectedFiles] retain];
+    CountedText* message = [[CountedText alloc] init];
+    [dialog setMessage:message];
+    [message release];
+    EXPECT_EQ(store, [dialog uiPersistentStore]);
+    [dialog release];
+    [pool drain];
+    EXPECT_EQ(1, gDialogsGone);
+    EXPECT_EQ(1, gTextsGone);
+    EXPECT_EQ(1u, [store retainCount]);
+    EXPECT_EQ(1u, [files retainCount]);
+    [store release];
+    [files release];
+}
+
+TEST_F(Lifetime, OfTheRowsEndsWithTheDialog)
+{
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    gHistoryList.AddTail(file("one.zmb"));
+    open();
+    [mController setSaveHistory:YES];
+    selectFiles({"two.zmb"});
+    [mController onLoad:nil];
+    NSArray* rows = [[NSArray alloc] initWithArray:[historyList() arrangedObjects]];
+    close();
+    [pool drain];
+    ASSERT_EQ(2u, [rows count]);
+    for (NSUInteger index = 0; index < [rows count]; ++index)
+        EXPECT_EQ(1u, [[rows objectAtIndex:index] retainCount]) << index;
+    [rows release];
 }
 
 TEST_F(Lifetime, OfTheViewIsSafeBeyondThatOfTheDialog)

@@ -95,6 +95,15 @@ TEST_F(MainDialog, IsTheCurrentControllerWhileItIsOpen)
     EXPECT_EQ(nil, [TsOCModrigUtil getModrigController]);
 }
 
+TEST_F(MainDialog, LetsGoOfItsPanelWhenItCloses)
+{
+    open();
+    ModrigController* controller = [[mController retain] autorelease];
+    EXPECT_EQ(mPanel, [controller valueForKey:@"mOpenPanel"]);
+    close();
+    EXPECT_EQ(nil, [controller valueForKey:@"mOpenPanel"]);
+}
+
 TEST_F(MainDialog, TakesMessagesIntoItsMessageLineOnlyWhileItIsOpen)
 {
     ModrigUtils::ModrigCmdlineMessage(CStdStr(L"before"));
@@ -206,13 +215,70 @@ TEST_F(MainDialog, OnlyMovesIntoTheHostsFolderWhenThatIsAllThatIsSelected)
 
 TEST_F(MainDialog, PassesOverTheHostsFolderAmongOtherFiles)
 {
+    host().registry.setValue(settingsKey(), L"InitialPath", mFolder.path().wstring());
     open();
     selectFiles({"one.zmb"});
     NSString* hostFolder = [[NSBundle mainBundle] bundlePath];
     [[mController selectedFiles]
-        addObject:[[[ModrigFilePath alloc] initWithFilePathName:hostFolder] autorelease]];
+        insertObject:[[[ModrigFilePath alloc] initWithFilePathName:hostFolder] autorelease]
+             atIndex:0];
+    EXPECT_FALSE([mController openTesselFolder]);
     [mController onLoad:nil];
+    EXPECT_EQ(mFolder.path().wstring(), wide([mPanel directory]));
     EXPECT_THAT(lines(), ElementsAre(Message(8, L"one.zmb")));
+}
+
+TEST_F(MainDialog, LoadsEveryFileThoughLoadingChangesWhatIsChosen)
+{
+    open();
+    [mController setSaveHistory:YES];
+    selectFiles({"one.zmb", "two.zmb", "three.zmb"});
+    [mController onLoad:nil];
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb"), file("two.zmb"), file("three.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(9, L"3")));
+}
+
+TEST_F(MainDialog, LoadsLispFilesAlone)
+{
+    open();
+    selectFiles({"one.lsp"});
+    [mController onLoad:nil];
+    EXPECT_EQ(L"(load \"" + file("one.lsp") + L"\")", host().lisp.queued[0]);
+}
+
+TEST_F(MainDialog, LoadsAllOfALispFileThatJoinsTheStartupSuite)
+{
+    fillHistory({"one.lsp"});
+    open();
+    select(historyTable(), {0});
+    [mController onLoadFromHistory:nil];
+    [mController onAddToStartupSuiteFromHistory:nil];
+    ASSERT_EQ(6u, host().lisp.queued.size());
+    EXPECT_EQ(L"(load \"" + file("one.lsp") + L"\")", host().lisp.queued[0]);
+    EXPECT_EQ(L"(progn (_INTERNAL-LOAD-ALL-FILE \"" + file("one.lsp") + L"\" nil T T nil)(princ))",
+              host().lisp.queued[3]);
+}
+
+TEST_F(MainDialog, DoesNotRememberTheFolderWhenItLoadsFromTheHistory)
+{
+    fillHistory({"one.zmb"});
+    open();
+    select(historyTable(), {0});
+    [mController onLoadFromHistory:nil];
+    EXPECT_THAT(lines(), ElementsAre(Message(8, L"one.zmb")));
+    EXPECT_FALSE(setting(L"InitialPath"));
+}
+
+TEST_F(MainDialog, RemembersTheFolderAfterABatchThatEndedEarly)
+{
+    host().registry.setValue(settingsKey(), L"InitialPath", mFolder.path().wstring());
+    open();
+    host().registry.removeValue(settingsKey(), L"InitialPath");
+    host().linker.refuseToLoad(file("bad.zmb"));
+    selectFiles({"bad.zmb", "one.zmb"});
+    [mController onLoad:nil];
+    EXPECT_FALSE(host().linker.isLoaded(file("one.zmb")));
+    EXPECT_EQ(mFolder.path().wstring(), setting(L"InitialPath"));
 }
 
 TEST_F(MainDialog, LoadsSelectedHistoryRowsWithTheLoadButton)
@@ -326,6 +392,41 @@ TEST_F(MainDialog, CountsTwoUnloadedRows)
     EXPECT_THAT(lines(), ElementsAre(Message(13, L"2")));
 }
 
+TEST_F(MainDialog, TakesOutEachRowBeforeItUnloadsTheNext)
+{
+    for (const char* name : {"one.zmb", "two.zmb"})
+        gLoadedAppList.AddTail(loadedModule(name));
+    open();
+    std::vector<std::wstring> rows;
+    std::vector<std::wstring> entries;
+    host().linker.setEntryPoint(file("two.zmb"),
+                                [&](unsigned, void*)
+                                {
+                                    rows = rowsOf(loadedApps());
+                                    entries = Texts(gLoadedAppList);
+                                    return TSRX_RET_OK;
+                                });
+    select(loadedTable(), {0, 1});
+    [mController onUnload:nil];
+    EXPECT_THAT(rows, ElementsAre(file("two.zmb")));
+    EXPECT_THAT(entries, ElementsAre(file("two.zmb")));
+}
+
+TEST_F(MainDialog, PassesOverARowThatCouldNotBeUnloadedWhenItWasMade)
+{
+    host().linker.setLocked(file("locked.zmb"));
+    gLoadedAppList.AddTail(loadedModule("locked.zmb"));
+    gLoadedAppList.AddTail(loadedModule("one.zmb"));
+    open();
+    host().linker.setLocked(file("locked.zmb"), false);
+    [loadedTable() setDelegate:nil]; // which would take the row out of the selection
+    [loadedApps() setSelectionIndexes:[NSIndexSet indexSetWithIndexesInRange:NSMakeRange(0, 2)]];
+    [mController onUnload:nil];
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("locked.zmb")));
+    EXPECT_TRUE(host().linker.isLoaded(file("locked.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(12, L"one.zmb")));
+}
+
 TEST_F(MainDialog, NamesTheLastRowTriedWhenOneOfTwoWasUnloaded)
 {
     gLoadedAppList.AddTail(loadedModule("one.zmb"));
@@ -419,6 +520,23 @@ TEST_F(MainDialog, ScrollsTheHistoryWhenThatShows)
     selectFiles({"last.zmb"});
     [mController onLoad:nil];
     EXPECT_TRUE(NSLocationInRange(60, [historyTable() rowsInRect:[historyTable() visibleRect]]));
+}
+
+TEST_F(MainDialog, ScrollsNowhereWhenAnotherTabShows)
+{
+    for (int index = 0; index < 60; ++index)
+        for (CStringList* list : {&gLoadedAppList, &gHistoryList})
+            list->AddTail(file("tool" + std::to_string(index) + ".lsp"));
+    open();
+    // No view is bound any more that would object to a tab that is not there.
+    [mController setSaveHistory:YES];
+    [mController setValue:[NSNumber numberWithInt:2] forKey:@"tabViewSelectedIndex"];
+    selectFiles({"last.zmb"});
+    [mController onLoad:nil];
+    EXPECT_EQ(61u, rowsOf(loadedApps()).size());
+    for (NSTableView* table : {loadedTable(), historyTable()})
+        EXPECT_TRUE(NSLocationInRange(0, [table rowsInRect:[table visibleRect]]));
+    [mController setTabViewSelectedIndex:kLoadedTab];
 }
 
 TEST_F(MainDialog, ScrollsNowhereAfterAFailure)

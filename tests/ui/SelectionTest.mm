@@ -8,6 +8,44 @@
 #import "ui/ModrigFilePath.h"
 #import "ui/TsOCModrigUtil.h"
 
+// What a panel answers about its selection.
+@interface ChoosingPanel : NSObject
+{
+    NSArray* mPaths;
+}
+- (id)initWithPaths:(NSArray*)paths;
+@end
+
+@implementation ChoosingPanel
+
+- (id)initWithPaths:(NSArray*)paths
+{
+    if ((self = [super init]))
+        mPaths = [paths copy];
+    return self;
+}
+
+- (void)dealloc
+{
+    [mPaths release];
+    [super dealloc];
+}
+
+- (NSArray*)URLs
+{
+    NSMutableArray* urls = [NSMutableArray array];
+    for (NSUInteger index = 0; index < [mPaths count]; ++index)
+        [urls addObject:[NSURL fileURLWithPath:[mPaths objectAtIndex:index]]];
+    return urls;
+}
+
+- (NSArray*)modrigSelectedPaths
+{
+    return mPaths;
+}
+
+@end
+
 using testing::ElementsAre;
 using testing::IsEmpty;
 
@@ -29,6 +67,17 @@ protected:
     {
         const auto rows = rowsOf(loadedApps());
         return std::ranges::find(rows, file(name)) - rows.begin();
+    }
+    // A panel that has the files selected.
+    id panelWith(std::initializer_list<std::string> names)
+    {
+        return [[[ChoosingPanel alloc] initWithPaths:paths(names)] autorelease];
+    }
+    void chooseLisp()
+    {
+        NSArrayController* types = [mController valueForKey:@"fileTypes"];
+        [types setSelectionIndex:3];
+        [mController onFileTypesChanged:types];
     }
     std::vector<std::wstring> selectedFiles()
     {
@@ -112,35 +161,108 @@ TEST_F(Selection, IsNotMadeByAClickOnARowThatCannotBeUnloaded)
     mController = nil;
 }
 
-TEST_F(Selection, StaysThatOfThePanelWhenItsFilesJoinTheHistory)
+TEST_F(Selection, OfTheNewHistoryRowIsWhatLoadLoadsNext)
 {
     open();
     [mController setSaveHistory:YES];
     load({"a.lsp", "b.lsp"});
     EXPECT_THAT(selectionOf(historyList()), ElementsAre(file("b.lsp")));
-    EXPECT_THAT(selectedFiles(), ElementsAre(file("a.lsp"), file("b.lsp")));
+    EXPECT_EQ(1, [historyTable() selectedRow]);
+    EXPECT_TRUE([mController canRemoveHistory]);
+    EXPECT_THAT(selectedFiles(), ElementsAre(file("b.lsp")));
     [mController onLoad:nil];
-    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2"), Message(9, L"2")));
+    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2"), Message(8, L"b.lsp")));
 }
 
-TEST_F(Selection, StaysThatOfThePanelWhenADroppedFileJoinsTheHistory)
+TEST_F(Selection, OfTheNewHistoryRowIsTheSameAfterAClickOnIt)
+{
+    const ModalSteps steps({[this]
+                            {
+                                mController = [TsOCModrigUtil getModrigController];
+                                mPanel = runningPanel();
+                                [mController setSaveHistory:YES];
+                                [mController setTabViewSelectedIndex:1];
+                                load({"a.lsp", "b.lsp"});
+                            },
+                            [this] { clickRow(historyTable(), 1); }, [] {},
+                            [this]
+                            {
+                                EXPECT_THAT(selectedFiles(), ElementsAre(file("b.lsp")));
+                                [mController onLoad:nil];
+                                EXPECT_EQ(Message(8, L"b.lsp"), wide([mController message]));
+                                [mPanel cancel:nil];
+                            }});
+    ModrigUtils::RunModrigDialog();
+    mController = nil;
+}
+
+TEST_F(Selection, InThePanelCountsAgainAfterFilesHaveJoinedTheHistory)
+{
+    open();
+    [mController setSaveHistory:YES];
+    load({"a.lsp", "b.lsp"});
+    [mController panelSelectionDidChange:panelWith({"a.lsp"})];
+    EXPECT_THAT(selectedFiles(), ElementsAre(file("a.lsp")));
+}
+
+TEST_F(Selection, OfTheHistoryRowThatADropMadeReplacesThatOfThePanel)
 {
     open();
     [mController setSaveHistory:YES];
     load({"a.lsp"});
+    [mController panelSelectionDidChange:panelWith({"a.lsp"})];
     drop({"dropped.lsp"}, 0);
+    EXPECT_THAT(selectedFiles(), ElementsAre(file("dropped.lsp")));
+}
+
+TEST_F(Selection, InThePanelStaysWhenNothingJoinsTheHistory)
+{
+    open();
+    [mController setSaveHistory:NO];
+    load({"a.lsp"});
     EXPECT_THAT(selectedFiles(), ElementsAre(file("a.lsp")));
 }
 
-TEST_F(Selection, FollowsTheHistoryWhenItsRowsWereChosen)
+TEST_F(Selection, IsTheLastOneMadeInThePanelOrInTheHistory)
 {
     gHistoryList.AddTail(file("old.lsp"));
     open();
-    [mController setSaveHistory:YES];
-    selectFiles({"other.lsp"});
+    [mController panelSelectionDidChange:panelWith({"a.lsp"})];
     select(historyTable(), {0});
-    drop({"new.lsp"}, 0);
-    EXPECT_EQ(selectionOf(historyList()), selectedFiles());
+    EXPECT_THAT(selectedFiles(), ElementsAre(file("old.lsp")));
+    [mController panelSelectionDidChange:panelWith({"a.lsp"})];
+    EXPECT_THAT(selectedFiles(), ElementsAre(file("a.lsp")));
+    [mController panelSelectionDidChange:panelWith({})];
+    EXPECT_THAT(selectedFiles(), IsEmpty());
+}
+
+TEST_F(Selection, OfTheHistoryOutlivesAnotherFileType)
+{
+    gHistoryList.AddTail(file("old.zmb"));
+    open();
+    select(historyTable(), {0});
+    chooseLisp();
+    EXPECT_THAT(selectedFiles(), ElementsAre(file("old.zmb")));
+    [mController onLoad:nil];
+    EXPECT_THAT(lines(), ElementsAre(Message(8, L"old.zmb")));
+}
+
+TEST_F(Selection, OfTheHistoryIsLoadedWhenThePanelLeavesNothingChosen)
+{
+    gHistoryList.AddTail(file("old.zmb"));
+    open();
+    select(historyTable(), {0});
+    [mController panelSelectionDidChange:panelWith({})];
+    [mController onLoad:nil];
+    EXPECT_THAT(lines(), ElementsAre(Message(8, L"old.zmb")));
+}
+
+TEST_F(Selection, OfNothingIsAnsweredInTheMessageLine)
+{
+    open();
+    [mController onLoad:nil];
+    EXPECT_EQ(L"Select a file in the list above or in the History first.", wide([mController message]));
+    EXPECT_THAT(lines(), IsEmpty());
 }
 
 TEST_F(Selection, OfNewRowsIsOnAgainWhenTheTablesAreFilled)

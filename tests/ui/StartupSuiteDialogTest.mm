@@ -204,6 +204,42 @@ TEST_F(StartupSuiteDialog, KeepsTemporaryInternetFilesOut)
     EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
 }
 
+TEST_F(StartupSuiteDialog, LoadsAllOfALispFile)
+{
+    open();
+    openSuite();
+    [mSuite addFiles:paths({"two.lsp"})];
+    ASSERT_EQ(3u, host().lisp.queued.size());
+    EXPECT_EQ(L"(progn (_INTERNAL-LOAD-ALL-FILE \"" + file("two.lsp") + L"\" nil T T nil)(princ))",
+              host().lisp.queued[0]);
+}
+
+TEST_F(StartupSuiteDialog, PassesOverAFileThatHasARowBeforeItAsksWhereItCameFrom)
+{
+    gStartupList.AddTail(file("net.zmb"));
+    open();
+    openSuite();
+    std::filesystem::create_symlink(mFolder / "net.zmb", mFolder / "link.zmb");
+    host().internet.urlsOfLocalFiles[file("net.zmb")] = L"http://example.org/net.zmb";
+    [mSuite addFiles:paths({"link.zmb"})];
+    EXPECT_TRUE(host().linker.isLoaded(file("net.zmb")));
+    EXPECT_THAT(boxes(), IsEmpty());
+    EXPECT_THAT(rowsOf(rows()), ElementsAre(file("net.zmb")));
+    EXPECT_THAT(Texts(gStartupList), ElementsAre(file("net.zmb")));
+}
+
+TEST_F(StartupSuiteDialog, ScrollsNowhereWhenNothingWasAdded)
+{
+    for (int index = 0; index < 60; ++index)
+        gStartupList.AddTail(file("tool" + std::to_string(index) + ".lsp"));
+    open();
+    openSuite();
+    host().internet.urlsOfLocalFiles[file("net.zmb")] = L"http://example.org/net.zmb";
+    [mSuite addFiles:paths({"net.zmb"})];
+    EXPECT_TRUE(NSLocationInRange(0, [table() rowsInRect:[table() visibleRect]]));
+    EXPECT_FALSE(NSLocationInRange(59, [table() rowsInRect:[table() visibleRect]]));
+}
+
 TEST_F(StartupSuiteDialog, RefusesFiftyOneFiles)
 {
     open();

@@ -7,18 +7,28 @@
 
 namespace ModrigUtils
 {
-void RemoveFromHistory(const std::vector<CStdStr>& paths)
+namespace
 {
-    for (const CStdStr& path : paths)
-        RemoveInSpecificList(path, gHistoryList);
+void RemoveOneByOne(const std::vector<CStdStr>& paths, CStringList& list, const Removing& removing)
+{
+    for (std::size_t index = 0; index < paths.size(); ++index)
+    {
+        removing(index);
+        RemoveInSpecificList(paths[index], list);
+    }
+}
+} // namespace
+
+void RemoveFromHistory(const std::vector<CStdStr>& paths, const Removing& removing)
+{
+    RemoveOneByOne(paths, gHistoryList, removing);
     if (!paths.empty())
         ModrigCmdlineSummary(ModrigMessages::kOneRemovedFromHistory, ModrigMessages::kManyRemovedFromHistory,
                              static_cast<unsigned>(paths.size()), paths.back());
 }
 
-void RemoveFromStartupSuite(const std::vector<CStdStr>& paths)
+void RemoveFromStartupSuite(const std::vector<CStdStr>& paths, const Removing& removing)
 {
-    for (const CStdStr& path : paths)
-        RemoveInSpecificList(path, gStartupList);
+    RemoveOneByOne(paths, gStartupList, removing);
 }
 } // namespace ModrigUtils

@@ -33,8 +33,6 @@ bool HasUnreportedSelection(NSOpenPanel* panel);
 // `elsewhere`: any other folder.
 void FilterPanelAnew(NSOpenPanel* panel, NSURL* elsewhere);
 
-// The path with symbolic links and, where there are any, aliases resolved.
-NSString* ResolveLinksAndAliases(NSString* path);
 // Whether the file exists; `isFolder` then says whether it is a folder.
 bool FileExists(NSString* path, bool& isFolder);
 // Whether its user sees the folder as one file.

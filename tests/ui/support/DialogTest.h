@@ -43,6 +43,8 @@ protected:
 
     // Opens the dialog with what the lists hold now.
     void open();
+    // The same with a controller of a test's own, which is given away.
+    void openWith(ModrigController* controller);
     void close();
 
     ModrigController* mController = nil;

@@ -103,7 +103,12 @@ std::wstring DialogTest::loadedModule(const std::string& name)
 
 void OpenDialogTest::open()
 {
-    mController = [[ModrigController alloc] init];
+    openWith([[ModrigController alloc] init]);
+}
+
+void OpenDialogTest::openWith(ModrigController* controller)
+{
+    mController = controller;
     mPanel = [NSOpenPanel openPanel];
     OpeningDialog opening = {mController, mPanel};
     if (NSString* error = tsuiErrorOf(setUp, &opening))

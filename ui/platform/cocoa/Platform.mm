@@ -35,19 +35,6 @@
 
 namespace ModrigPlatform
 {
-namespace
-{
-// The file that an alias stands for; the path itself for any other file.
-NSString* originalOf(NSString* path)
-{
-    NSURL* url = [NSURL fileURLWithPath:path];
-    NSURL* original = [NSURL URLByResolvingAliasFileAtURL:url
-                                                  options:NSURLBookmarkResolutionWithoutUI
-                                                    error:NULL];
-    return original ? [original path] : path;
-}
-} // namespace
-
 NSOpenPanel* MakeOpenPanel()
 {
     return [NSOpenPanel openPanel];
@@ -105,11 +92,6 @@ void FilterPanelAnew(NSOpenPanel* panel, NSURL* elsewhere)
     [panel setDirectoryURL:folder];
 }
 
-NSString* ResolveLinksAndAliases(NSString* path)
-{
-    return originalOf([path stringByResolvingSymlinksInPath]);
-}
-
 bool FileExists(NSString* path, bool& isFolder)
 {
     FSRef reference;
@@ -126,7 +108,6 @@ bool IsFilePackage(NSString* path)
     return [[NSWorkspace sharedWorkspace] isFilePackageAtPath:path];
 }
 
-// Bindings do it.
 // The bindings do.
 void ShowRows(NSTableView*, NSArrayController*)
 {

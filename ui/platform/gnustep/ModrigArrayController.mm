@@ -3,7 +3,7 @@
 // The toolkit's own controller has no content when it comes from a window file, appends what it should
 // insert, and keeps the selected places instead of the selected objects.
 @interface ModrigArrayController (Content)
-- (void)replaceContent:(NSMutableArray*)content selecting:(NSArray*)wanted;
+- (void)replaceContent:(NSMutableArray*)content selecting:(NSIndexSet*)selection;
 @end
 
 @implementation ModrigArrayController
@@ -23,37 +23,46 @@
     mTable = table;
 }
 
-- (void)replaceContent:(NSMutableArray*)content selecting:(NSArray*)wanted
+- (void)replaceContent:(NSMutableArray*)content selecting:(NSIndexSet*)selection
 {
     [self setContent:content];
     [mTable reloadData];
-    NSMutableIndexSet* selection = [NSMutableIndexSet indexSet];
-    for (NSUInteger index = 0; index < [wanted count]; ++index)
-    {
-        const NSUInteger place = [content indexOfObjectIdenticalTo:[wanted objectAtIndex:index]];
-        if (place != NSNotFound)
-            [selection addIndex:place];
-    }
     [self setSelectionIndexes:selection];
 }
 
 - (NSArray*)selectedObjects
 {
-    NSArray* content = [self content];
-    NSIndexSet* selection = [self selectionIndexes];
-    NSMutableArray* selected = [NSMutableArray array];
-    for (NSUInteger index = 0; index < [content count]; ++index)
-        if ([selection containsIndex:index])
-            [selected addObject:[content objectAtIndex:index]];
-    return selected;
+    return [[self content] objectsAtIndexes:[self selectionIndexes]];
+}
+
+// The selected places after others have been inserted.
+- (NSIndexSet*)selectionAfterInsertionAt:(NSIndexSet*)places
+{
+    NSMutableIndexSet* selection = [[[self selectionIndexes] mutableCopy] autorelease];
+    for (NSUInteger place = [places firstIndex]; place != NSNotFound;
+         place = [places indexGreaterThanIndex:place])
+        if (place <= [selection lastIndex])
+            [selection shiftIndexesStartingAtIndex:place by:1];
+    return selection;
+}
+
+// The selected places after others, or these themselves, have been removed.
+- (NSIndexSet*)selectionAfterRemovalAt:(NSIndexSet*)places
+{
+    NSMutableIndexSet* selection = [[[self selectionIndexes] mutableCopy] autorelease];
+    [selection removeIndexes:places];
+    for (NSUInteger place = [places lastIndex]; place != NSNotFound;
+         place = [places indexLessThanIndex:place])
+        [selection shiftIndexesStartingAtIndex:place + 1 by:-1];
+    return selection;
 }
 
 - (void)insertObjects:(NSArray*)objects atArrangedObjectIndexes:(NSIndexSet*)places
 {
     NSMutableArray* content = [NSMutableArray arrayWithArray:[self content]];
-    NSArray* wanted = [self selectsInsertedObjects] ? objects : [self selectedObjects];
+    NSIndexSet* selection = [self selectsInsertedObjects] ? places : [self selectionAfterInsertionAt:places];
     [content insertObjects:objects atIndexes:places];
-    [self replaceContent:content selecting:wanted];
+    [self replaceContent:content selecting:selection];
 }
 
 - (void)insertObject:(id)object atArrangedObjectIndex:(NSUInteger)place
@@ -76,25 +85,29 @@
 - (void)removeObjects:(NSArray*)objects
 {
     NSSet* removed = [NSSet setWithArray:objects];
-    NSMutableArray* content = [NSMutableArray array];
-    NSArray* selected = [self selectedObjects];
+    NSMutableIndexSet* places = [NSMutableIndexSet indexSet];
     for (NSUInteger index = 0; index < [[self content] count]; ++index)
-        if (id object = [[self content] objectAtIndex:index]; ![removed containsObject:object])
-            [content addObject:object];
-    [self replaceContent:content selecting:selected];
+        if ([removed containsObject:[[self content] objectAtIndex:index]])
+            [places addIndex:index];
+    [self removeObjectsAtArrangedObjectIndexes:places];
 }
 
+// A row that comes from the table itself is found without comparing paths: rows are removed one by one.
 - (void)removeObject:(id)object
 {
-    [self removeObjects:[NSArray arrayWithObject:object]];
+    const NSUInteger place = [[self content] indexOfObjectIdenticalTo:object];
+    if (place == NSNotFound)
+        [self removeObjects:[NSArray arrayWithObject:object]];
+    else
+        [self removeObjectAtArrangedObjectIndex:place];
 }
 
 - (void)removeObjectsAtArrangedObjectIndexes:(NSIndexSet*)places
 {
     NSMutableArray* content = [NSMutableArray arrayWithArray:[self content]];
-    NSArray* selected = [self selectedObjects];
+    NSIndexSet* selection = [self selectionAfterRemovalAt:places];
     [content removeObjectsAtIndexes:places];
-    [self replaceContent:content selecting:selected];
+    [self replaceContent:content selecting:selection];
 }
 
 - (void)removeObjectAtArrangedObjectIndex:(NSUInteger)place

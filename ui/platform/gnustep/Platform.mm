@@ -279,11 +279,6 @@ void FilterPanelAnew(NSOpenPanel* panel, NSURL*)
     tellOfLostSelection(panel);
 }
 
-NSString* ResolveLinksAndAliases(NSString* path)
-{
-    return [path stringByResolvingSymlinksInPath]; // there are no aliases here
-}
-
 bool FileExists(NSString* path, bool& isFolder)
 {
     struct stat status;

@@ -1,0 +1,18 @@
+#include "ui/model/ChosenFiles.h"
+
+namespace ModrigUtils
+{
+bool PanelSelectionCounts(PanelChange change, bool panelIsEmpty, bool chosenInHistory)
+{
+    return change == PanelChange::kChoice || !panelIsEmpty || !chosenInHistory;
+}
+
+LoadSource SourceForLoad(bool filesAreChosen, bool panelHasSelection, bool historyHasSelection)
+{
+    if (filesAreChosen)
+        return LoadSource::kChosenFiles;
+    if (panelHasSelection)
+        return LoadSource::kPanel;
+    return historyHasSelection ? LoadSource::kHistory : LoadSource::kNothing;
+}
+} // namespace ModrigUtils

@@ -1,0 +1,29 @@
+// Which files Load will load. They are chosen in two places, the file panel and the History, and what was
+// chosen last counts.
+#pragma once
+
+namespace ModrigUtils
+{
+// Why the panel's selection has changed: somebody chose, or another file type took files out of sight.
+enum class PanelChange
+{
+    kChoice,
+    kFileType
+};
+
+// Whether the panel's selection is from now on what Load will load. A file type is not a choice of files: when
+// it leaves the panel without any, what is chosen in the History stays chosen.
+bool PanelSelectionCounts(PanelChange change, bool panelIsEmpty, bool chosenInHistory);
+
+enum class LoadSource
+{
+    kChosenFiles,
+    kPanel,
+    kHistory,
+    kNothing
+};
+
+// Where Load takes its files from. When the last change left no file chosen, as removing rows from the History
+// does, what is still selected elsewhere is meant.
+LoadSource SourceForLoad(bool filesAreChosen, bool panelHasSelection, bool historyHasSelection);
+} // namespace ModrigUtils

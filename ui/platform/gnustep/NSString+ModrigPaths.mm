@@ -1,0 +1,10 @@
+#import "ui/NSString+ModrigPaths.h"
+
+@implementation NSString (ModrigPaths)
+
+- (NSString*)stringByResolvingSymlinksAndAliasesInPath
+{
+    return [self stringByResolvingSymlinksInPath]; // there are no aliases here
+}
+
+@end
