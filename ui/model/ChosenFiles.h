@@ -11,8 +11,8 @@ enum class PanelChange
     kFileType
 };
 
-// Whether the panel's selection is from now on what Load will load. A file type is not a choice of files: when
-// it leaves the panel without any, what is chosen in the History stays chosen.
+// Whether the panel's selection is from now on what Load will load. A file type is not a choice of files:
+// when it leaves the panel without any, what is chosen in the History stays chosen.
 bool PanelSelectionCounts(PanelChange change, bool panelIsEmpty, bool chosenInHistory);
 
 enum class LoadSource
@@ -23,7 +23,7 @@ enum class LoadSource
     kNothing
 };
 
-// Where Load takes its files from. When the last change left no file chosen, as removing rows from the History
-// does, what is still selected elsewhere is meant.
+// Where Load takes its files from. When the last change left no file chosen, as removing rows from the
+// History does, what is still selected elsewhere is meant.
 LoadSource SourceForLoad(bool filesAreChosen, bool panelHasSelection, bool historyHasSelection);
 } // namespace ModrigUtils
