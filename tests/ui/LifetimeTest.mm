@@ -6,6 +6,7 @@
 #include <algorithm>
 
 #include "module/DialogBridge.h"
+#include "ui/Paths.h"
 
 #import "ui/ModrigFilePath.h"
 #import "ui/ModrigStartupSuitController.h"
@@ -211,6 +212,13 @@ TEST_F(Lifetime, OfARowsTextsEndsWithTheRow)
     [row release];
     [pool drain];
     EXPECT_EQ(1, gTextsGone);
+}
+
+TEST_F(Lifetime, OfRowsIsThatOfTheArrayTheyComeIn)
+{
+    NSArray* rows = ModrigUtils::RowsFromPaths({CStdStr(L"/none/a.zmb"), CStdStr(L"/none/b.zmb")});
+    for (NSUInteger index = 0; index < 2; ++index)
+        EXPECT_EQ(1u, [[rows objectAtIndex:index] retainCount]);
 }
 
 TEST_F(Lifetime, OfWhatADialogHoldsEndsWithTheDialog)
