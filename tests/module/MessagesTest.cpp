@@ -134,6 +134,17 @@ TEST_F(Messages, CutAPathInABoxAtTheRoomOfFormatting)
     EXPECT_THAT(boxes(), ElementsAre(expected));
 }
 
+TEST_F(Messages, AreShownWholeHoweverLongTheyAre)
+{
+    const std::wstring words(10000, L'w');
+    host().resources.setText(kResourceModuleName, 12, words + L"%s");
+    ModrigCmdlineMessage(12, CStdStr(L"/a/tool.lsp"));
+    ModrigAfxMessageBox(12, CStdStr(L"/a/tool.lsp"));
+    EXPECT_THAT(lines(), ElementsAre(words + L"tool.lsp"));
+    EXPECT_THAT(recordingDialog().messages, ElementsAre(words + L"tool.lsp"));
+    EXPECT_THAT(boxes(), ElementsAre(words + L"/a/tool.lsp"));
+}
+
 TEST_F(Messages, NameTheFileWhenTheCountIsExactlyOneAndCountOtherwise)
 {
     ModrigCmdlineSummary(12, 13, 1, L"/a/tool.zmb");
