@@ -188,6 +188,21 @@ TEST_F(FileValidation, FindsNothingByAPathThatIsTooLongToBeTakenApart)
     EXPECT_EQ(FILE_ATTRIBUTE_NORMAL, mAttributes);
 }
 
+TEST_F(FileValidation, TakesNoOtherFileForOneThatIsTooLongToBeTakenApart)
+{
+    for (const wchar_t* extension : {L"bundle", L"zmb", L"lsp", L"mcp", L"omp", L"rpk", L"qbc"})
+    {
+        host().files.addFile(std::wstring(L"/current/.") + extension);
+        host().files.found[std::wstring(L".") + extension] = std::wstring(L"/search/.") + extension;
+    }
+    for (const std::wstring& path : {L"/x/" + std::wstring(300, L'n') + L".lsp", LongPath(4000, L"tool.lsp")})
+    {
+        EXPECT_EQ(path, Found(path));
+        EXPECT_EQ(INVALID_FILE_ATTRIBUTES, mAttributes);
+    }
+    EXPECT_THAT(host().files.searched, IsEmpty());
+}
+
 TEST_F(FileValidation, NamesAFileInACurrentFolderThatDoesNotFitByItsNameBehindASlash)
 {
     host().files.currentFolder = L"/" + std::wstring(1023, L'c');
