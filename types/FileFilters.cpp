@@ -115,9 +115,8 @@ void ReAdjustFilterString(CStdStr& filter)
 {
     const CStdStr choice = GetRegFileFilterListIndex();
     std::vector<FilterEntry> entries = FilterEntries();
-    const auto chosen =
-        std::find_if(entries.begin(), entries.end(),
-                     [&choice](const FilterEntry& entry) { return IsChosen(entry, choice); });
+    const auto chosen = std::find_if(entries.begin(), entries.end(),
+                                     [&choice](const FilterEntry& entry) { return IsChosen(entry, choice); });
     if (chosen != entries.end())
         std::rotate(entries.begin(), chosen, std::next(chosen));
     filter = CStdStr();

@@ -41,8 +41,7 @@ Parts PartsOf(const std::wstring& path)
     wchar_t directory[1024] = {};
     wchar_t name[256] = {};
     wchar_t extension[256] = {};
-    const int status =
-        _wsplitpath_s(path.c_str(), drive, 3, directory, 1024, name, 256, extension, 256);
+    const int status = _wsplitpath_s(path.c_str(), drive, 3, directory, 1024, name, 256, extension, 256);
     return {std::wstring(drive) + directory, std::wstring(name) + extension, extension, status != 0};
 }
 

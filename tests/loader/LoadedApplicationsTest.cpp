@@ -166,9 +166,9 @@ TEST_F(Rebuilding, AsksForEachPathAndThenForTheModulesOwnName)
     host().loadedModules.namesWithoutPath = {L"one.zmb"};
     PopulateLoadedApps();
     EXPECT_THAT(WithoutBookkeeping(host().journal.entries()),
-                ElementsAre(L"tsedQmbLoaded()",                                               //
-                            L"tsedGetModuleFileName(Modrig.bundle)", L"tsedGetAppName()",     //
-                            L"tsedGetModuleFileName(one.zmb)",                                //
+                ElementsAre(L"tsedQmbLoaded()",                                                  //
+                            L"tsedGetModuleFileName(Modrig.bundle)", L"tsedGetAppName()",        //
+                            L"tsedGetModuleFileName(one.zmb)",                                   //
                             L"tsedGetModuleFileName(two.zmb)", L"tsedGetAppName()", L"curDoc()", //
                             L"loadedApplicationCount()"));
 }

@@ -170,7 +170,8 @@ void watchedDealloc(id self, SEL selector)
     asCode<void (*)(id, SEL)>(gDealloc)(self, selector);
 }
 
-// Replaces a method of the dialog's controller as long as it lives, since the command makes its own controller.
+// Replaces a method of the dialog's controller as long as it lives, since the command makes its own
+// controller.
 class ReplacedMethod
 {
 public:
@@ -204,9 +205,9 @@ public:
     }
 
 private:
-    const ReplacedMethod mInit{@selector(init), watchedInit};
-    const ReplacedMethod mShow{@selector(showModrigDialog), watchedShow};
-    const ReplacedMethod mDealloc{@selector(dealloc), watchedDealloc};
+    const ReplacedMethod mInit { @selector(init), watchedInit };
+    const ReplacedMethod mShow { @selector(showModrigDialog), watchedShow };
+    const ReplacedMethod mDealloc { @selector(dealloc), watchedDealloc };
 };
 } // namespace
 

@@ -160,6 +160,21 @@ TEST_F(MainDialog, StopsAtTheSecondOfThreeFilesWithoutASummary)
     EXPECT_EQ(L"", message());
 }
 
+TEST_F(MainDialog, ShowsApplicationsThatCannotBeLoadedAndSaysSoWhenOneIsChosen)
+{
+    for (const char* name : {"plates.mcp", "survey.rpk"})
+    {
+        const std::wstring chosen = file(name);
+        open();
+        EXPECT_TRUE([mController panel:mPanel shouldShowFilename:path(name)]) << name;
+        selectFiles({name});
+        [mController onLoad:nil];
+        EXPECT_THAT(boxes(), ElementsAre(Message(2, chosen), Message(38, chosen)));
+        close();
+        host().output.boxes.clear();
+    }
+}
+
 TEST_F(MainDialog, SaysThatAFileIsLoadedAlreadyAndAddsNoRow)
 {
     gLoadedAppList.AddTail(loadedModule("one.zmb"));
