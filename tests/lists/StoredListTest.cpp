@@ -79,6 +79,14 @@ protected:
                           { return call.valueName == name; }));
     }
 
+    static std::size_t TimesTheModulesKeyWasMade()
+    {
+        const std::vector<RecordingRegistry::Call> made = host().registry.callsOf(Operation::kCreate);
+        return static_cast<std::size_t>(std::count_if(made.begin(), made.end(),
+                                                      [](const RecordingRegistry::Call& call)
+                                                      { return call.key == host().moduleKey(); }));
+    }
+
     // The writes below the list's key fail for these value names.
     static void FailToWrite(std::vector<std::wstring> names)
     {
@@ -219,6 +227,29 @@ TEST_P(StoredList, EndsAfterTenThousandFailedPassesInARow)
     Read();
     EXPECT_THAT(Texts(list()), ElementsAre(L"/a"));
     EXPECT_EQ(10000u, ReadsOf(2));
+}
+
+TEST_P(StoredList, TakesTheCountForADecimalNumber)
+{
+    for (std::size_t entry = 1; entry <= 12; ++entry)
+        Store(EntryName(entry), L"/" + std::to_wstring(entry));
+    const std::pair<const wchar_t*, std::size_t> counts[] = {{L"010", 10}, {L"0x3", 0}, {L"12", 12}};
+    for (const auto& [text, expected] : counts)
+    {
+        StoreCount(text);
+        Read();
+        EXPECT_EQ(expected, list().GetCount()) << testing::PrintToString(std::wstring(text));
+    }
+}
+
+TEST_P(StoredList, AsksForTheModulesKeyOnceHoweverManyEntriesItHas)
+{
+    Fill(list(), {L"/a", L"/b", L"/c"});
+    Write();
+    EXPECT_EQ(1u, TimesTheModulesKeyWasMade());
+    Read();
+    EXPECT_EQ(2u, TimesTheModulesKeyWasMade());
+    EXPECT_EQ(3u, list().GetCount());
 }
 
 TEST_P(StoredList, DoesNotKeepTheStartWaitingForACountBeyondAllReason)

@@ -140,6 +140,17 @@ TEST_F(PerformingALoad, KeepsAFailureToItselfWhenAskedTo)
     EXPECT_THAT(boxes(), IsEmpty());
 }
 
+TEST_F(PerformingALoad, ReportsAFailureForAnyFlagButZero)
+{
+    host().linker.refuseToLoad(L"/a/tool.zmb");
+    for (const int flag : {-1, 1, 2, -128, 127})
+    {
+        host().output.boxes.clear();
+        EXPECT_EQ(0, Perform(L"/a/tool.zmb", 1, static_cast<signed char>(flag)));
+        EXPECT_THAT(boxes(), ElementsAre(Message(38, L"/a/tool.zmb"))) << flag;
+    }
+}
+
 TEST_F(PerformingALoad, ReportsAPathWithoutADotTwice)
 {
     EXPECT_EQ(0, Perform(L"/a/tool"));

@@ -44,6 +44,20 @@ TEST_F(Messages, ShowTheLineInTheDialogWithoutItsLineFeed)
     EXPECT_THAT(recordingDialog().messages, ElementsAre(Message(12, L"tool.lsp")));
 }
 
+TEST_F(Messages, AreInTheDialogBeforeTheyAreOnTheCommandLine)
+{
+    std::vector<std::wstring> printedMeanwhile;
+    recordingDialog().duringMessage = [&printedMeanwhile]
+    {
+        printedMeanwhile.push_back(printed());
+    };
+    ModrigCmdlineMessage(12, CStdStr(L"/a/tool.lsp"));
+    host().output.printed.clear();
+    ModrigCmdlineMessage(13, 2u);
+    EXPECT_THAT(printedMeanwhile, ElementsAre(L"", L""));
+    EXPECT_THAT(lines(), ElementsAre(Message(13, L"2")));
+}
+
 TEST_F(Messages, PrintNothingWhenATextIsOnlyForTheDialog)
 {
     ModrigCmdlineMessage(CStdStr(L"a hint"));
