@@ -250,6 +250,8 @@ TEST_P(StoredList, AsksForTheModulesKeyOnceHoweverManyEntriesItHas)
     Read();
     EXPECT_EQ(2u, TimesTheModulesKeyWasMade());
     EXPECT_EQ(3u, list().GetCount());
+    Write();
+    EXPECT_EQ(3u, TimesTheModulesKeyWasMade()) << "not for the values that are deleted either";
 }
 
 TEST_P(StoredList, DoesNotKeepTheStartWaitingForACountBeyondAllReason)
