@@ -344,7 +344,7 @@ TEST_F(LoadingACompiledModule, LeavesALockedModuleAndNamesIt)
 TEST_F(LoadingACompiledModule, AnswersFalseWhenTheLinkerCannotUnload)
 {
     host().linker.setLoaded(L"/a/tool.zmb");
-    host().linker.refuseToUnload(L"/a/tool.zmb", L"it stays mapped");
+    host().linker.refuseToUnload(L"/a/tool.zmb", L"it will not go");
     EXPECT_FALSE(LoadQMBFile(L"/a/tool.zmb", 0));
     EXPECT_EQ(1u, host().journal.count(L"unloadModule"));
     EXPECT_THAT(recordingDialog().messages, IsEmpty()) << "the linker has said why itself";

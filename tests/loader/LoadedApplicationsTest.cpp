@@ -341,7 +341,7 @@ TEST_F(Unloading, DoesNotCountARowThatIsNotUnloadableAsTried)
 TEST_F(Unloading, GoesOnBehindAModuleThatDoesNotUnload)
 {
     Load({L"/a/a.zmb", L"/a/b.zmb", L"/a/c.zmb"});
-    host().linker.refuseToUnload(L"/a/a.zmb", L"it stays mapped");
+    host().linker.refuseToUnload(L"/a/a.zmb", L"it will not go");
     EXPECT_THAT(Unload({{L"/a/a.zmb", true}, {L"/a/b.zmb", true}, {L"/a/c.zmb", true}}), ElementsAre(1u, 2u));
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(L"/a/a.zmb"));
     EXPECT_EQ(Message(13, L"2"), lines().back());
