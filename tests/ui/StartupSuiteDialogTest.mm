@@ -20,7 +20,7 @@ constexpr NSInteger kRemove = 1;
 bool isReachedByTab(NSView* wanted, NSWindow* window)
 {
     constexpr int kMostStops = 50;
-    NSView* view = [[window contentView] viewWithTag:NSFileHandlingPanelForm];
+    NSView* view = nameField((NSOpenPanel*)window);
     for (int stop = 0; stop < kMostStops && view && view != wanted; ++stop)
         view = [view nextValidKeyView];
     return view == wanted;
