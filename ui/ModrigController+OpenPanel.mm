@@ -32,7 +32,8 @@
 - (void)placeHelpButtonIn:(NSOpenPanel*)panel
 {
     NSButton* spare = [panel hideExtensionButton];
-    [[spare superview] addSubview:helpButton];
+    // Before the button that stands to its right, for the order of the Tab key.
+    [[spare superview] addSubview:helpButton positioned:NSWindowBelow relativeTo:[panel cancelButton]];
     [helpButton setFrameOrigin:NSMakePoint(NSMinX([spare frame]), NSMinY([[panel okButton] frame]))];
 }
 

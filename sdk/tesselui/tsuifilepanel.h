@@ -1,5 +1,5 @@
-// The panel in which files are chosen. On macOS it is the system's; elsewhere the host brings its own, with the
-// interface of the toolkit's panel.
+// The panel in which files are chosen. On macOS it is the system's; elsewhere the host brings its own, with
+// the interface of the toolkit's panel.
 #pragma once
 
 #import <AppKit/AppKit.h>

@@ -87,8 +87,8 @@ bool isHost(NSString* path)
 - (std::vector<std::string>)pathsOfTyping
 {
     std::vector<std::string> paths = [self typedPaths];
-    std::erase_if(paths, [&](const std::string& path)
-                  { return !fileExists(path) || [self isWalkedThrough:path]; });
+    std::erase_if(paths,
+                  [&](const std::string& path) { return !fileExists(path) || [self isWalkedThrough:path]; });
     return paths;
 }
 

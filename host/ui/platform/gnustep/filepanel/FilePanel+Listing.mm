@@ -42,6 +42,19 @@ Column columnOf(NSString* identifier)
         return Column::kKind;
     return [identifier isEqual:@"date"] ? Column::kDate : Column::kName;
 }
+
+NSString* titleOf(NSString* identifier)
+{
+    switch (columnOf(identifier))
+    {
+    case Column::kKind:
+        return @"Kind";
+    case Column::kDate:
+        return @"Changed";
+    default:
+        return @"Name";
+    }
+}
 } // namespace
 
 @implementation TsUIFilePanel (Listing)
@@ -192,11 +205,20 @@ Column columnOf(NSString* identifier)
 {
     mState->order = afterClickOn(columnOf(identifier), mState->order);
     [self changeRowsBy:@selector(sortRows)];
-    NSString* mark =
-        mState->order.descending ? @"NSDescendingSortIndicator" : @"NSAscendingSortIndicator";
+    [self markSortedColumn];
+}
+
+// In the title: the toolkit's headers have no place for a mark of their own.
+- (void)markSortedColumn
+{
     for (NSTableColumn* column : tsuiEach<NSTableColumn*>([mTable tableColumns]))
-        [mTable setIndicatorImage:[[column identifier] isEqual:identifier] ? [NSImage imageNamed:mark] : nil
-                    inTableColumn:column];
+    {
+        NSString* title = titleOf([column identifier]);
+        const bool isSorted = columnOf([column identifier]) == mState->order.column;
+        NSString* mark = mState->order.descending ? @"  \u25BE" : @"  \u25B4";
+        [[column headerCell] setStringValue:isSorted ? [title stringByAppendingString:mark] : title];
+    }
+    [[mTable headerView] setNeedsDisplay:YES];
 }
 
 - (NSInteger)numberOfRowsInTableView:(NSTableView*)table

@@ -61,7 +61,8 @@ NSTextField* makeLabel(NSString* text, NSRect frame)
 
 NSView* makeRow(NSView* content)
 {
-    NSView* row = [[[NSView alloc] initWithFrame:NSMakeRect(0, 0, NSWidth([content bounds]), 40)] autorelease];
+    NSView* row =
+        [[[NSView alloc] initWithFrame:NSMakeRect(0, 0, NSWidth([content bounds]), 40)] autorelease];
     [row setAutoresizesSubviews:YES];
     [content addSubview:row];
     return row;
@@ -77,10 +78,9 @@ void place(NSView* view, NSView* row, CGFloat x, CGFloat width, CGFloat height, 
     [row addSubview:view];
 }
 
-NSTableColumn* makeColumn(NSString* identifier, NSString* title, CGFloat width, NSCell* cell)
+NSTableColumn* makeColumn(NSString* identifier, CGFloat width, NSCell* cell)
 {
     NSTableColumn* column = [[[NSTableColumn alloc] initWithIdentifier:identifier] autorelease];
-    [[column headerCell] setStringValue:title];
     [[column headerCell] setAlignment:NSLeftTextAlignment];
     [[column headerCell] setFont:[NSFont systemFontOfSize:12]];
     [cell setFont:[NSFont systemFontOfSize:12]];
@@ -124,15 +124,15 @@ NSTextFieldCell* makeTextCell()
     [frame setHasVerticalScroller:YES];
     [frame setHasHorizontalScroller:NO];
     mTable = [[[TsFileTable alloc] initWithFrame:[[frame contentView] bounds]] autorelease];
-    [mTable addTableColumn:makeColumn(@"name", @"Name", 400,
-                                      [[[TsFileNameCell alloc] initTextCell:@""] autorelease])];
-    [mTable addTableColumn:makeColumn(@"kind", @"Kind", 110, makeTextCell())];
-    [mTable addTableColumn:makeColumn(@"date", @"Changed", 150, makeTextCell())];
+    [mTable addTableColumn:makeColumn(@"name", 400, [[[TsFileNameCell alloc] initTextCell:@""] autorelease])];
+    [mTable addTableColumn:makeColumn(@"kind", 110, makeTextCell())];
+    [mTable addTableColumn:makeColumn(@"date", 150, makeTextCell())];
     [mTable setRowHeight:kRowHeight];
     [mTable setAllowsColumnReordering:NO];
     [mTable setAllowsColumnSelection:NO];
     [mTable setAllowsEmptySelection:YES];
     [mTable setDrawsGrid:NO];
+    [self markSortedColumn];
     [mTable setPanel:self];
     [mTable setDataSource:self];
     [mTable setDelegate:self];
@@ -177,7 +177,7 @@ NSTextFieldCell* makeTextCell()
     [mCancel setFrameOrigin:NSMakePoint(right - kButtonWidth - kMargin, 7)];
     for (NSButton* button : {mCancel, mOK})
         [button setAutoresizingMask:NSViewMinXMargin | NSViewMaxYMargin];
-    for (NSButton* button : {spare, mCancel, mOK})
+    for (NSButton* button : {spare, mOK, mCancel})
         [content addSubview:button];
     [self setDefaultButtonCell:[mOK cell]];
 }
@@ -225,7 +225,11 @@ NSTextFieldCell* makeTextCell()
 {
     const NSSize asked = [accessory frame].size;
     mAccessoryHeight = asked.height;
-    [[self contentView] addSubview:accessory];
+    NSView* content = [self contentView];
+    // Before the buttons below it, for the order of the Tab key.
+    [content addSubview:accessory
+             positioned:NSWindowBelow
+             relativeTo:[content viewWithTag:kTsUIFilePanelSpareButton]];
     [accessory setAutoresizingMask:NSViewWidthSizable];
     const CGFloat width = std::max(asked.width, kSmallestWidth);
     const CGFloat smallest = smallestHeight(asked.height);

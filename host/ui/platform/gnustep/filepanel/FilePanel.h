@@ -1,4 +1,5 @@
-// The host's own file panel: a table of the files of one folder, the way to that folder, and a field for names.
+// The host's own file panel: a table of the files of one folder, the way to that folder, and a field for
+// names.
 //
 // It has the interface of the toolkit's panel and none of its inside. What it decides without a window is in
 // the plain files beside it; this class puts them together. Main thread only.
@@ -54,6 +55,7 @@ struct PanelState;
 - (void)listAgain;
 - (void)lookForChanges:(NSTimer*)timer;
 - (void)sortBy:(NSString*)column;
+- (void)markSortedColumn;
 - (BOOL)isListed:(NSString*)path;
 @end
 

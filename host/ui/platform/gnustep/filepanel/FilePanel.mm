@@ -106,8 +106,8 @@ template <class Function> Function windowMethod(SEL selector)
     [self placeParts];
 }
 
-// The folder is read when somebody looks, or when the event that is being handled is over: to be sent away and
-// back costs one question more to the delegate, and nothing of what shows is lost.
+// The folder is read when somebody looks, or when the event that is being handled is over: to be sent away
+// and back costs one question more to the delegate, and nothing of what shows is lost.
 - (void)setDirectory:(NSString*)folder
 {
     mState->wanted = nearestFolder(bytes([folder stringByStandardizingPath]));

@@ -193,8 +193,7 @@ bool isText(unichar character)
     [mLetters appendString:letter];
     const RowSelection selection = [self selection];
     // The same beginning may go on with the row that is selected; another first letter goes to the next one.
-    const std::size_t from =
-        selection.rows.empty() ? 0 : selection.lead + ([mLetters length] == 1 ? 1 : 0);
+    const std::size_t from = selection.rows.empty() ? 0 : selection.lead + ([mLetters length] == 1 ? 1 : 0);
     const NSInteger row = [mPanel rowBeginningWith:mLetters from:from];
     if (row < 0)
         return NSBeep();

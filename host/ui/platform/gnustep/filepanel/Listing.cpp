@@ -37,7 +37,8 @@ std::wstring wideText(const std::string& text)
 std::wstring folded(const std::string& text)
 {
     std::wstring result = wideText(text);
-    std::ranges::transform(result, result.begin(), [](wchar_t character)
+    std::ranges::transform(result, result.begin(),
+                           [](wchar_t character)
                            { return static_cast<wchar_t>(std::towlower(static_cast<wint_t>(character))); });
     return result;
 }
@@ -186,7 +187,8 @@ std::string kindOf(const Entry& entry)
     if (dot == std::string::npos || dot == 0 || dot + 1 == entry.name.size())
         return "File";
     std::string extension = entry.name.substr(dot + 1);
-    std::ranges::transform(extension, extension.begin(), [](unsigned char character)
+    std::ranges::transform(extension, extension.begin(),
+                           [](unsigned char character)
                            { return static_cast<char>(std::toupper(character)); });
     return extension + " file";
 }

@@ -13,8 +13,8 @@ namespace tessel::filepanel
 {
 struct PanelState
 {
-    std::string wanted; // the folder to show
-    std::string folder; // the one that shows
+    std::string wanted;              // the folder to show
+    std::string folder;              // the one that shows
     std::optional<std::string> seen; // its state when it was read
     std::vector<Entry> entries;
     Order order;
@@ -22,10 +22,7 @@ struct PanelState
     bool isTyped = false;            // the name field was used last, not the table
     std::string typed;               // what a person typed there, without its completion
 
-    std::string pathOf(const Entry& entry) const
-    {
-        return (folder == "/" ? "" : folder) + "/" + entry.name;
-    }
+    std::string pathOf(const Entry& entry) const { return (folder == "/" ? "" : folder) + "/" + entry.name; }
 };
 
 inline std::string bytes(NSString* text)

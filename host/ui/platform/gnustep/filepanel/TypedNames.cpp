@@ -71,12 +71,12 @@ std::string completed(const std::string& beginning, const std::vector<std::strin
 {
     if (beginning.empty() || std::ranges::find(names, beginning) != names.end())
         return "";
-    const auto same = std::ranges::find_if(names, [&](const std::string& name)
-                                           { return name.starts_with(beginning); });
+    const auto same =
+        std::ranges::find_if(names, [&](const std::string& name) { return name.starts_with(beginning); });
     if (same != names.end())
         return *same;
-    const auto alike = std::ranges::find_if(names, [&](const std::string& name)
-                                            { return beginsLike(name, beginning); });
+    const auto alike =
+        std::ranges::find_if(names, [&](const std::string& name) { return beginsLike(name, beginning); });
     return alike != names.end() ? *alike : "";
 }
 } // namespace tessel::filepanel
