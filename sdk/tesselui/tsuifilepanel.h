@@ -8,9 +8,9 @@
 
 // Where the panel is the host's own, its buttons are found in its content view by these tags: the default
 // button, the one that cancels, and a hidden one that keeps a place at the start of their row.
-inline constexpr NSInteger kTsUIFilePanelDefaultButton = NSOKButton;
-inline constexpr NSInteger kTsUIFilePanelCancelButton = NSCancelButton;
-inline constexpr NSInteger kTsUIFilePanelSpareButton = 100;
+inline constexpr NSInteger kTsUIFilePanelDefaultButton = 100;
+inline constexpr NSInteger kTsUIFilePanelCancelButton = 101;
+inline constexpr NSInteger kTsUIFilePanelSpareButton = 102;
 
 // A new file panel, autoreleased, which disturbs no other one that is open. `URLs` holds the chosen files, of
 // rows or of typed names; a folder on the way is none. Its delegate decides what is listed
