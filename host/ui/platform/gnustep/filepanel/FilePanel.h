@@ -49,6 +49,7 @@ struct PanelState;
 // Reads the folder that is wanted, unless that is the one that shows; asks the delegate in any case.
 - (void)bringUpToDate;
 - (void)bringUpToDateSoon;
+- (void)cancelPendingWork;
 - (void)forgetPendingWork;
 - (void)listFolder:(NSString*)folder;
 // The same folder again, with its place kept.

@@ -199,6 +199,8 @@ template <class Function> Function windowMethod(SEL selector)
 - (void)validateVisibleColumns
 {
     [self listAgain];
+    mState->isAsked = true;
+    [self bringUpToDateSoon];
 }
 
 - (NSInteger)runModal
