@@ -74,10 +74,15 @@ NSTextField* makeLabel(NSString* text)
     [mPanel validateVisibleColumns];
 }
 
-- (BOOL)isFolder:(NSString*)path
+// A folder, or the host's own package, where the applications are that come with it. Other packages are
+// files.
+- (BOOL)isWalkedThrough:(NSString*)path
 {
     BOOL folder = NO;
-    return [[NSFileManager defaultManager] fileExistsAtPath:path isDirectory:&folder] && folder;
+    if (![[NSFileManager defaultManager] fileExistsAtPath:path isDirectory:&folder] || !folder)
+        return NO;
+    return ![[NSWorkspace sharedWorkspace] isFilePackageAtPath:path] ||
+           [path caseInsensitiveCompare:[[NSBundle mainBundle] bundlePath]] == NSOrderedSame;
 }
 
 - (BOOL)panel:(id)sender shouldShowFilename:(NSString*)path
@@ -88,7 +93,7 @@ NSTextField* makeLabel(NSString* text)
     for (NSString* extension : tsuiEach<NSString*>([[mFilters objectAtIndex:mChosen] fileExtensions]))
         if ([[path pathExtension] caseInsensitiveCompare:extension] == NSOrderedSame)
             return YES;
-    return [self isFolder:path];
+    return [self isWalkedThrough:path];
 }
 
 @end

@@ -1,4 +1,4 @@
-// Files dragged from a program of another toolkit.
+// Files dragged from a program of another toolkit, and from the dialog's own list.
 #include "tests/e2e_dialogs/DialogTest.h"
 
 using testing::HasSubstr;
@@ -81,4 +81,32 @@ TEST_F(DialogDrop, TakesNoneOfFiftyOneFilesIntoTheStartupSuite)
 {
     dropFiftyOne(places::kStartupSuiteBox);
     EXPECT_THAT(stored("Startup"), Not(HasSubstr("many")));
+}
+
+TEST_F(DialogDrop, TakesAFileOfItsOwnListIntoTheStartupSuite)
+{
+    const std::string path = writeLisp("a.lsp");
+    open();
+    mScreen.drag(mDialog, places::file(0), mDialog, places::kStartupSuiteBox);
+    EXPECT_TRUE(prints("a.lsp was added to the Startup Suite.\n"));
+    shoot("added");
+    closeAndEnd();
+    EXPECT_EQ(stored("Startup"), listOf({path}));
+}
+
+TEST_F(DialogDrop, LoadsTwoFilesOfItsOwnListBetweenTheRowsOfTheTable)
+{
+    writeLisp("a.lsp");
+    writeLisp("b.lsp");
+    writeLisp("c.lsp");
+    open();
+    mScreen.doubleClick(mDialog, places::file(2));
+    ASSERT_TRUE(prints(wasLoaded("c.lsp")));
+    click(places::file(0));
+    mScreen.clickHolding("shift", mDialog, places::file(1));
+    const Place row = places::tableRow(0);
+    mScreen.drag(mDialog, places::file(1), mDialog, {row.x, row.y - places::kRowHeight / 2 + 1});
+    EXPECT_TRUE(prints("2 applications were loaded.\n"));
+    shoot("loaded");
+    closeAndEnd();
 }

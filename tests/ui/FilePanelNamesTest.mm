@@ -78,8 +78,8 @@ TEST_F(FilePanelNames, OfNoFileAreToldAndTheRunGoesOn)
          [this] { return boxes().size() == 1; },
          [this]
          {
-             EXPECT_THAT(boxes(), ElementsAre(L"There is no file \"" + (mFolder / "nothing.omp").wstring() +
-                                              L"\"."));
+             EXPECT_THAT(boxes(),
+                         ElementsAre(L"There is no file \"" + (mFolder / "nothing.omp").wstring() + L"\"."));
              EXPECT_TRUE([mPanel isVisible]);
          }});
 }

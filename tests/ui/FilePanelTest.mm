@@ -64,7 +64,9 @@ TEST_F(FilePanelList, TakesRangesWithShiftAndArrowsAndEverythingWithControlA)
 {
     writeFiles({"a.lsp", "b.lsp", "c.lsp"});
     use({[this] { arrow(NSDownArrowFunctionKey); }, [this] { arrow(NSDownArrowFunctionKey, NSShiftKeyMask); },
-         [this] { return chosen() == std::vector{file("a.lsp"), file("b.lsp")}; },
+         [this] {
+             return chosen() == std::vector{file("a.lsp"), file("b.lsp")};
+         },
          [this] { pressKey(mPanel, @"a", NSControlKeyMask); }, [this] { return chosen().size() == 3; }});
 }
 
@@ -98,8 +100,7 @@ TEST_F(FilePanelList, GoesIntoAFolderByDoubleClickAndByReturn)
 TEST_F(FilePanelList, GoesUpWithBackspaceAndAltUpToTheFolderThatItCameFrom)
 {
     writeFiles({"outer/inner/a.lsp", "outer/another/b.lsp"});
-    use({[this] { pressKey(mPanel, @"\177"); },
-         [this] { return folder() == (mFolder / "outer").wstring(); },
+    use({[this] { pressKey(mPanel, @"\177"); }, [this] { return folder() == (mFolder / "outer").wstring(); },
          [this]
          {
              EXPECT_THAT(selectedRows(), ElementsAre(1));

@@ -225,7 +225,7 @@ NSString* titleOf(NSString* identifier)
     {
         NSString* title = titleOf([column identifier]);
         const bool isSorted = columnOf([column identifier]) == mState->order.column;
-        NSString* mark = mState->order.descending ? @"  \u25BE" : @"  \u25B4";
+        NSString* mark = string(mState->order.descending ? "  \u2193" : "  \u2191");
         [[column headerCell] setStringValue:isSorted ? [title stringByAppendingString:mark] : title];
     }
     [[mTable headerView] setNeedsDisplay:YES];

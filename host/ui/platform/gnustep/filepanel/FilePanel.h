@@ -77,7 +77,7 @@ struct PanelState;
 - (void)updateDefaultButton;
 // The row whose name begins with the letters, or -1.
 - (NSInteger)rowBeginningWith:(NSString*)letters from:(std::size_t)row;
-- (void)dragSelectionFrom:(NSView*)view withEvent:(NSEvent*)event;
+- (void)dragSelectionFrom:(NSView*)view;
 @end
 
 // FilePanel+Going.mm: from folder to folder.
