@@ -1,5 +1,5 @@
-// Dragging files from the panel to a view of the same window that takes files. The toolkit's own drags need its
-// pasteboard server, a program beside the host, and do not arrive in a window that runs modally.
+// Dragging files from the panel to a view of the same window that takes files. The toolkit's own drags need
+// its pasteboard server, a program beside the host, and do not arrive in a window that runs modally.
 #pragma once
 
 #import <AppKit/AppKit.h>

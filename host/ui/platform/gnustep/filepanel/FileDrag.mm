@@ -115,8 +115,7 @@ NSView* viewThatTakesFiles(NSWindow* window, NSPoint place)
     if ([view respondsToSelector:@selector(prepareForDragOperation:)] &&
         ![view prepareForDragOperation:(id)self])
         return;
-    if ([view performDragOperation:(id)self] &&
-        [view respondsToSelector:@selector(concludeDragOperation:)])
+    if ([view performDragOperation:(id)self] && [view respondsToSelector:@selector(concludeDragOperation:)])
         [view concludeDragOperation:(id)self];
     [view setNeedsDisplay:YES]; // without what showed where the files would land
 }
