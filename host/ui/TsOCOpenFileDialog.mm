@@ -156,7 +156,6 @@ NSTextField* makeLabel(NSString* text)
     [panel setDelegate:(id)chooser];
     if ([mFileFilters count])
         [panel setAccessoryView:[chooser view]];
-    [panel recalculateKeyViewLoop]; // the choice of the file type is one of the stops of the Tab key
     const bool chosen = [panel runModal] == NSOKButton;
     [mSelectedPathes release];
     mSelectedPathes = [(chosen ? [[panel URLs] valueForKey:@"path"] : [NSArray array]) copy];

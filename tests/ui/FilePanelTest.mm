@@ -280,3 +280,88 @@ TEST_F(FilePanelList, RemembersTheFoldersThatWereUsed)
              EXPECT_EQ((mFolder / "one").wstring(), folder());
          }});
 }
+
+TEST_F(FilePanelList, AsksItsDelegateOnceWhenThatAndTheWayAwayAndBackComeTogether)
+{
+    writeMany(20);
+    int turns = 0;
+    use({[this]
+         {
+             mListener->asked = 0;
+             [mPanel validateVisibleColumns];
+             [mPanel setDirectory:@"/"];
+             [mPanel setDirectory:in("")];
+         },
+         [&] { return ++turns > 3; }, [this] { EXPECT_EQ(20, mListener->asked); }});
+}
+
+TEST_F(FilePanelList, ReadsTheFolderAgainWithF5)
+{
+    writeFiles({"a.lsp", "b.lsp"});
+    use({[this]
+         {
+             mListener->hidden = @"a.lsp";
+             arrow(NSF5FunctionKey);
+         },
+         [this] { return shown() == std::vector<std::wstring>{L"b.lsp"}; }});
+}
+
+TEST_F(FilePanelList, GoesToTheFoldersOnItsButtons)
+{
+    writeFiles({"outer/inner/a.lsp"});
+    use({[this]
+         {
+             ASSERT_TRUE(button(L"outer") && button(L"inner") && button(L"/"));
+             [button(L"outer") performClick:nil];
+             EXPECT_EQ((mFolder / "outer").wstring(), folder());
+             EXPECT_FALSE(button(L"inner"));
+             [button(L"Up") performClick:nil];
+             EXPECT_EQ(mFolder.path().wstring(), folder());
+             [button(L"Home") performClick:nil];
+             EXPECT_EQ(wide(NSHomeDirectory()), folder());
+             [button(L"/") performClick:nil];
+             EXPECT_EQ(L"/", folder());
+         }},
+        "outer/inner");
+}
+
+TEST_F(FilePanelList, ShowsHiddenFilesWithItsSwitch)
+{
+    writeFiles({".hidden.lsp"});
+    use({[this]
+         {
+             [button(L"Hidden files") performClick:nil];
+             EXPECT_THAT(shown(), ElementsAre(L".hidden.lsp"));
+             [button(L"Hidden files") performClick:nil];
+             EXPECT_THAT(shown(), IsEmpty());
+         }});
+}
+
+TEST_F(FilePanelList, IsReachedByTabInTheOrderOfReading)
+{
+    use({[this]
+         {
+             [mPanel makeFirstResponder:table()];
+             [mPanel selectNextKeyView:nil];
+             EXPECT_TRUE([nameField(mPanel) currentEditor] != nil);
+             [mPanel selectKeyViewFollowingView:nameField(mPanel)];
+             EXPECT_EQ(button(L"Hidden files"), [mPanel firstResponder]);
+             [mPanel selectNextKeyView:nil];
+             EXPECT_EQ(button(L"Cancel"), [mPanel firstResponder]);
+             [mPanel selectNextKeyView:nil];
+             EXPECT_EQ(button(L"Up"), [mPanel firstResponder]) << "Open is disabled";
+             [mPanel selectNextKeyView:nil];
+             EXPECT_EQ(button(L"Home"), [mPanel firstResponder]);
+         }});
+}
+
+TEST_F(FilePanelList, StaysWithinTheScreen)
+{
+    NSView* tall = [[[NSView alloc] initWithFrame:NSMakeRect(0, 0, 700, 3000)] autorelease];
+    [mPanel setAccessoryView:tall];
+    use({[this]
+         {
+             const NSRect screen = [[NSScreen mainScreen] visibleFrame];
+             EXPECT_LE(NSHeight([mPanel frame]), NSHeight(screen));
+         }});
+}

@@ -3,12 +3,14 @@
 
 #include "tests/ui/support/DialogTest.h"
 
-// The delegate of the panel: hides the files whose names contain a text, and counts what it is told.
+// The delegate of the panel: hides the files whose names contain a text, and counts what it is told
+// and asked.
 @interface PanelListener : NSObject
 {
 @public
     NSString* hidden;
     int told;
+    int asked;
 }
 @end
 
@@ -31,6 +33,8 @@ protected:
     NSIndexSet* rows() { return [table() selectedRowIndexes]; }
     std::vector<NSUInteger> selectedRows();
     NSInteger firstVisibleRow();
+    // The button that shows this title, on the way to the folder or elsewhere in the panel.
+    NSButton* button(const std::wstring& title);
     void type(NSString* letters);
     NSString* in(const std::string& name) { return text((mFolder / name).wstring()); }
 

@@ -8,6 +8,7 @@
 - (BOOL)panel:(id)panel shouldShowFilename:(NSString*)path
 {
     (void)panel;
+    ++asked;
     return !hidden || [[path lastPathComponent] rangeOfString:hidden].location == NSNotFound;
 }
 
@@ -75,6 +76,24 @@ std::vector<NSUInteger> FilePanelTest::selectedRows()
 NSInteger FilePanelTest::firstVisibleRow()
 {
     return [table() rowAtPoint:[table() visibleRect].origin];
+}
+
+namespace
+{
+NSButton* buttonIn(NSView* view, NSString* title)
+{
+    if ([view isKindOfClass:[NSButton class]] && [[(NSButton*)view title] isEqual:title])
+        return (NSButton*)view;
+    for (NSView* inner : tsuiEach<NSView*>([view subviews]))
+        if (NSButton* found = buttonIn(inner, title))
+            return found;
+    return nil;
+}
+} // namespace
+
+NSButton* FilePanelTest::button(const std::wstring& title)
+{
+    return buttonIn([mPanel contentView], text(title));
 }
 
 void FilePanelTest::type(NSString* letters)
