@@ -71,6 +71,7 @@ protected:
         click({folder});
         pressKey(mPanel, @"\r");
     }
+    bool isIn(const std::filesystem::path& folder) { return wide([mPanel directory]) == folder.wstring(); }
 };
 } // namespace
 
@@ -220,6 +221,7 @@ TEST_F(OpenPanel, TakesAFolderThatIsWalkedThroughForNoSelection)
                                EXPECT_EQ(0u, [[mController selectedFiles] count]);
                                EXPECT_EQ(L"", shownName());
                            },
+                           [this] { return isIn(mFolder / "folder"); },
                            [this]
                            {
                                EXPECT_EQ(0u, [[mController selectedFiles] count]);
@@ -237,8 +239,8 @@ TEST_F(OpenPanel, TakesAFolderThatIsWalkedThroughForNoSelection)
 TEST_F(OpenPanel, RemembersTheFolderThatTheUserWentTo)
 {
     mFolder.write("folder/one.zmb", "");
-    runIn(mFolder.path(), {[this] { enter(L"folder"); }, [this] { click({L"one.zmb"}); },
-                           [this] { [mController onLoad:nil]; }});
+    runIn(mFolder.path(), {[this] { enter(L"folder"); }, [this] { return isIn(mFolder / "folder"); },
+                           [this] { click({L"one.zmb"}); }, [this] { [mController onLoad:nil]; }});
     EXPECT_EQ((mFolder / "folder").wstring(), host().registry.value(kSettings, L"InitialPath"));
 }
 
