@@ -96,6 +96,7 @@ LONG Registry::create(std::wstring_view path, Key from, Key& key)
         if (const LONG status = createChild(parent, part, key); status != ERROR_SUCCESS)
             return status;
     }
+    mOpenedForWriting.insert(key);
     return ERROR_SUCCESS;
 }
 
@@ -125,6 +126,7 @@ LONG Registry::readValue(Key key, std::wstring_view name, std::wstring& data)
 {
     if (!mDatabase)
         return ERROR_FILE_NOT_FOUND;
+    lookInto(key);
     Statement& read = mStatements->readValue;
     const int status = read.bind(key).bind(foldCase(name)).step();
     if (!isRow(status))
@@ -156,6 +158,7 @@ LONG Registry::valueName(Key key, DWORD index, std::wstring& name)
 {
     if (!mDatabase)
         return ERROR_NO_MORE_ITEMS;
+    lookInto(key);
     const bool next = mCursor.key == key && index == mCursor.index + 1;
     Statement& find = next || index == 0 ? mStatements->nextValue : mStatements->valueAt;
     find.bind(key).bind(next ? mCursor.sequence : std::int64_t{index});
@@ -173,6 +176,7 @@ std::vector<Registry::Value> Registry::values(Key key)
     std::vector<Value> found;
     if (!mDatabase)
         return found;
+    lookInto(key);
     Statement& list = mStatements->values;
     list.bind(key);
     while (isRow(list.step()))
@@ -206,6 +210,14 @@ LONG Registry::beginWriting()
     mWrites = 0;
     const int status = mStatements->begin.run();
     return status == SQLITE_DONE ? ERROR_SUCCESS : fail(status, L"written");
+}
+
+// What is seen in a key before it is written must still hold when it is. A lock that cannot be had makes the
+// writes fail, not the look.
+void Registry::lookInto(Key key)
+{
+    if (mOpenedForWriting.contains(key))
+        static_cast<void>(beginWriting());
 }
 
 LONG Registry::finishWrite(int status)
@@ -261,13 +273,26 @@ void Registry::closeHandlesOfLostKeys()
                   });
 }
 
+void Registry::commit()
+{
+    if (mFailure != ERROR_SUCCESS || sqlite3_get_autocommit(mDatabase))
+        return;
+    if (const int status = mStatements->commit.run(); status != SQLITE_DONE)
+        fail(status, L"written");
+}
+
+void Registry::storeSoFar()
+{
+    if (mDatabase)
+        commit();
+}
+
 bool Registry::endOfCommand()
 {
     if (!mDatabase)
         return true;
-    if (mFailure == ERROR_SUCCESS && !sqlite3_get_autocommit(mDatabase))
-        if (const int status = mStatements->commit.run(); status != SQLITE_DONE)
-            fail(status, L"written");
+    commit();
+    mOpenedForWriting.clear();
     if (mFailure == ERROR_SUCCESS)
         return true;
     if (services().commandLine)

@@ -9,6 +9,7 @@
 #include <unistd.h>
 
 #include "host/ui/SessionEnd.h"
+#include "host/ui/Waiting.h"
 
 namespace
 {
@@ -27,6 +28,7 @@ void runAlert(const wchar_t* text, unsigned style)
     [alert setAlertStyle:style & MB_ICONEXCLAMATION ? NSWarningAlertStyle : NSInformationalAlertStyle];
     [alert setIcon:[NSApp applicationIconImage]];
     [alert addButtonWithTitle:@"OK"];
+    const tessel::Question question;
     [alert runModal];
 }
 } // namespace

@@ -5,6 +5,7 @@
 
 #include "host/ui/KeptSignals.h"
 #include "host/ui/SessionEnd.h"
+#include "host/ui/Waiting.h"
 #include "host/ui/platform/Windowing.h"
 
 namespace
@@ -24,6 +25,7 @@ void prepare()
     // The host's own loop waits for the terminal; these two are what the toolkit's would have done first.
     [NSApp finishLaunching];
     tessel::closeWindowsWhenTheSessionEnds();
+    tessel::storeBeforeEachWait();
     [pool drain];
 }
 } // namespace

@@ -19,6 +19,9 @@ void makeWindowsClosable();
 // Lets a window that opens right after another has closed get the keyboard.
 void letNewWindowsHaveTheKeyboard();
 
+// Calls the function whenever a loop is about to wait for an event, on the main thread. Called once.
+void callBeforeEachWait(void (*call)());
+
 // Carries out what the screen still has to show.
 void flushScreen();
 } // namespace tessel::windowing

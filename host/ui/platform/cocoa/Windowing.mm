@@ -1,5 +1,6 @@
 #include "host/ui/platform/Windowing.h"
 
+#include <CoreFoundation/CoreFoundation.h>
 #include <CoreGraphics/CoreGraphics.h>
 
 #include <tesselui/tsuifilepanel.h>
@@ -38,6 +39,25 @@ void makeWindowsClosable()
 
 void letNewWindowsHaveTheKeyboard()
 {
+}
+
+namespace
+{
+void onWait(CFRunLoopObserverRef, CFRunLoopActivity, void* call)
+{
+    reinterpret_cast<void (*)()>(call)();
+}
+} // namespace
+
+// Every run of the loop waits in one of its common modes: events, modal windows, menus.
+void callBeforeEachWait(void (*call)())
+{
+    CFRunLoopObserverContext context = {};
+    context.info = reinterpret_cast<void*>(call);
+    CFRunLoopObserverRef observer =
+        CFRunLoopObserverCreate(nullptr, kCFRunLoopBeforeWaiting, true, 0, onWait, &context);
+    CFRunLoopAddObserver(CFRunLoopGetMain(), observer, kCFRunLoopCommonModes);
+    CFRelease(observer);
 }
 } // namespace tessel::windowing
 
