@@ -224,6 +224,7 @@ std::vector<std::wstring> Host::commandNames() const
     for (const auto& record : allApplicationRecords())
         for (const auto& command : record.commands)
             names.push_back(command.second);
+    mParts->registry->storeSoFar(); // the next command is to read what is stored by then
     std::ranges::sort(names);
     names.erase(std::unique(names.begin(), names.end()), names.end());
     return names;

@@ -53,6 +53,7 @@ Registry::Key Registry::find(std::wstring_view path, Key from)
 {
     if (!mDatabase)
         return kNoKey;
+    beginReading();
     Key key = from;
     while (!path.empty() && key != kNoKey)
     {
@@ -105,6 +106,7 @@ std::vector<std::wstring> Registry::subKeys(Key key)
     std::vector<std::wstring> names;
     if (!mDatabase)
         return names;
+    beginReading();
     Statement& list = mStatements->subKeys;
     list.bind(key);
     while (isRow(list.step()))
@@ -205,11 +207,21 @@ LONG Registry::beginWriting()
         return ERROR_ACCESS_DENIED;
     if (mFailure != ERROR_SUCCESS)
         return mFailure;
-    if (!sqlite3_get_autocommit(mDatabase))
+    if (mWriting)
         return ERROR_SUCCESS;
+    // What was read by now is of a moment that may be over; the writes are to stand on what is stored now.
+    commit();
     mWrites = 0;
     const int status = mStatements->begin.run();
-    return status == SQLITE_DONE ? ERROR_SUCCESS : fail(status, L"written");
+    mWriting = status == SQLITE_DONE;
+    return mWriting ? ERROR_SUCCESS : fail(status, L"written");
+}
+
+// Where this fails, the reading that follows says so.
+void Registry::beginReading()
+{
+    if (sqlite3_get_autocommit(mDatabase))
+        static_cast<void>(mStatements->beginReading.run());
 }
 
 // What is seen in a key before it is written must still hold when it is. A lock that cannot be had makes the
@@ -218,6 +230,7 @@ void Registry::lookInto(Key key)
 {
     if (mOpenedForWriting.contains(key))
         static_cast<void>(beginWriting());
+    beginReading();
 }
 
 LONG Registry::finishWrite(int status)
@@ -246,18 +259,27 @@ bool Registry::isRow(int status)
 LONG Registry::fail(int status, const wchar_t* done)
 {
     if (mFailure != ERROR_SUCCESS)
+    {
+        rollBack();
         return mFailure;
+    }
     mFailure = statusOf(status);
     // Flushing leaves no words behind.
     const bool hasWords = sqlite3_errcode(mDatabase) != SQLITE_OK;
     const char* words = hasWords ? sqlite3_errmsg(mDatabase) : sqlite3_errstr(status);
     mFailureWords = std::wstring(L" could not be ") + done + L": " + toWide(words);
-    // SQLite may have rolled back by itself already.
-    if (!sqlite3_get_autocommit(mDatabase))
-        mStatements->rollback.run();
+    rollBack();
     mCursor = {};
     closeHandlesOfLostKeys();
     return mFailure;
+}
+
+void Registry::rollBack()
+{
+    // SQLite may have rolled back by itself already.
+    if (!sqlite3_get_autocommit(mDatabase))
+        mStatements->rollback.run();
+    mWriting = false;
 }
 
 // The number of a key that was undone is given away again: a handle must not follow it to another key.
@@ -275,10 +297,11 @@ void Registry::closeHandlesOfLostKeys()
 
 void Registry::commit()
 {
-    if (mFailure != ERROR_SUCCESS || sqlite3_get_autocommit(mDatabase))
+    if (sqlite3_get_autocommit(mDatabase))
         return;
     if (const int status = mStatements->commit.run(); status != SQLITE_DONE)
         fail(status, L"written");
+    mWriting = false;
 }
 
 void Registry::storeSoFar()

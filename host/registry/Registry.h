@@ -4,8 +4,10 @@
 // keys and values are enumerated in the order of creation. The first write of a command opens a transaction,
 // or before that its first look into a key that it has opened for writing: what is to be replaced is listed
 // inside. `endOfCommand` commits it, so that what a command stores is stored wholly or not at all, whatever
-// happens to the process and whatever other processes write. Once the store could not be written or read,
-// all that the command wrote is undone and the rest of its writes fail too.
+// happens to the process and whatever other processes write. What a command reads before it writes it reads
+// as it stood at one moment, so that a list which is read value by value is one that somebody stored. Once
+// the store could not be written or read, all that the command wrote is undone and the rest of its writes
+// fail too.
 //
 // Status codes are those of the Windows-style registry calls (wincompat/wintypes.h).
 #pragma once
@@ -73,7 +75,8 @@ public:
     // wrote is undone, one sentence says so, and the answer is false.
     bool endOfCommand();
 
-    // Stores what the command wrote so far. A failure stays the command's, and is told at its end.
+    // Stores what the command wrote so far, and reads as it stands from now on. A failure stays the
+    // command's, and is told at its end.
     void storeSoFar();
 
     // Handles for the registry calls. A handle that is not open is recognised, never followed.
@@ -97,8 +100,10 @@ private:
     Key findChild(Key parent, std::wstring_view name);
     LONG createChild(Key parent, std::wstring_view name, Key& key);
     LONG beginWriting();
+    void beginReading();
     void lookInto(Key key);
     void commit();
+    void rollBack();
     LONG finishWrite(int status);
     bool isRow(int status);
     LONG fail(int status, const wchar_t* done);
@@ -113,7 +118,8 @@ private:
     Cursor mCursor;
     LONG mFailure = ERROR_SUCCESS; // of the running command, its first one
     std::wstring mFailureWords;
-    unsigned mWrites = 0;                      // in the running transaction
+    bool mWriting = false;                     // the running transaction is one that writes
+    unsigned mWrites = 0;                      // in it
     std::unordered_set<Key> mOpenedForWriting; // by the running command
     std::unordered_map<HKEY, Key> mHandles;
     std::uintptr_t mNextHandle;

@@ -143,8 +143,9 @@ TEST_F(TwoHosts, ListsThatCannotBeStoredFailAsAWholeAndAreTold)
                             mSession.folder() / "lock.txt");
         ASSERT_TRUE(comesTrue([&] { return other.output() == "locked\n"; })) << other.output();
         press("Escape");
-        EXPECT_TRUE(prints("The registry " + file +
-                           " could not be written: database is locked. What was stored before is unchanged.\n"))
+        EXPECT_TRUE(
+            prints("The registry " + file +
+                   " could not be written: database is locked. What was stored before is unchanged.\n"))
             << mHost->output();
         EXPECT_THAT(mHost->output(), HasSubstr("Message: A list of applications could not be stored"));
     }

@@ -212,6 +212,27 @@ TEST(SharedRegistry, KeepsAListWholeThatTwoProcessesRewriteByCalls)
     EXPECT_GT(snapshots, kRounds);
 }
 
+TEST(SharedRegistry, IsReadAsItStoodAtOneMomentOfACommand)
+{
+    RegistryHost host;
+    Registry other(host.file());
+    ASSERT_TRUE(other.write(L"A", L"one", L"old"));
+    ASSERT_TRUE(other.write(L"A", L"two", L"old"));
+    ASSERT_TRUE(other.endOfCommand());
+    EXPECT_EQ(host.registry().read(L"A", L"one"), L"old");
+    ASSERT_TRUE(other.write(L"A", L"two", L"new"));
+    ASSERT_TRUE(other.endOfCommand());
+    EXPECT_EQ(host.registry().read(L"A", L"two"), L"old");
+    host.registry().storeSoFar();
+    EXPECT_EQ(host.registry().read(L"A", L"two"), L"new");
+    ASSERT_TRUE(other.write(L"A", L"two", L"newer"));
+    ASSERT_TRUE(other.endOfCommand());
+    EXPECT_TRUE(host.registry().write(L"B", L"name", L"1")) << "although another one has written since";
+    EXPECT_EQ(host.registry().read(L"A", L"two"), L"newer");
+    EXPECT_TRUE(host.registry().endOfCommand());
+    EXPECT_EQ(other.read(L"B", L"name"), L"1");
+}
+
 TEST(SharedRegistry, StoresWhatWasWrittenBeforeAWait)
 {
     RegistryHost host;

@@ -19,8 +19,7 @@ constexpr CFRunLoopActivity kCFRunLoopBeforeWaiting = 1UL << 5;
 extern "C" const struct __CFString* const kCFRunLoopCommonModes;
 extern "C" CFRunLoopObserverRef CFRunLoopObserverCreate(const struct __CFAllocator*, CFOptionFlags activities,
                                                         unsigned char repeats, CFIndex order,
-                                                        CFRunLoopObserverCallBack,
-                                                        CFRunLoopObserverContext*);
+                                                        CFRunLoopObserverCallBack, CFRunLoopObserverContext*);
 extern "C" void CFRunLoopAddObserver(CFRunLoopRef, CFRunLoopObserverRef, const struct __CFString* mode);
 extern "C" CFRunLoopRef CFRunLoopGetMain();
 extern "C" void CFRelease(const void*);
