@@ -50,6 +50,12 @@ TEST_F(StdStr, LoadsTheTextWhenMadeFromAnIdInsteadOfAPointer)
     EXPECT_EQ(L"last", CStdStr(IdAsPointer(65535)).Text());
 }
 
+// Nothing lies at that address, so that reading a text there ends the program; loading one would not.
+TEST_F(StdStr, TakesTheFirstAddressAfterTheIdsForAText)
+{
+    EXPECT_DEATH(CStdStr(IdAsPointer(65536)), "");
+}
+
 TEST_F(StdStr, IsEmptyWhenMadeFromAnIdThatIsMissing)
 {
     EXPECT_TRUE(CStdStr(IdAsPointer(4711)).IsEmpty());
