@@ -190,11 +190,18 @@ TEST_F(StdStr, LoadsATextWholeHoweverLongItIs)
     }
 }
 
-TEST_F(StdStr, FetchesATextOfUsualLengthOnce)
+TEST_F(StdStr, FetchesATextAgainOnlyWhenItFillsTheRoom)
 {
-    CStdStr text;
-    text.Load(15);
-    EXPECT_EQ(1u, host().journal.count(L"loadStringFromWin32ResourceDLL"));
+    const std::pair<std::size_t, std::size_t> fetches[] = {
+        {1, 1}, {4094, 1}, {4095, 2}, {8190, 2}, {8191, 3}};
+    for (const auto& [length, expected] : fetches)
+    {
+        host().resources.setText(kResourceModuleName, 5000, std::wstring(length, L'x'));
+        host().journal.clear();
+        CStdStr text;
+        text.Load(5000);
+        EXPECT_EQ(expected, host().journal.count(L"loadStringFromWin32ResourceDLL")) << length;
+    }
 }
 
 TEST_F(StdStr, LoadsATextThatIsNotEmptyWhateverItsFirstCharacter)
