@@ -25,7 +25,7 @@ std::vector<std::string> listCommands(const std::string& list, const std::string
 }
 } // namespace
 
-DialogTest::DialogTest()
+DialogTest::DialogTest(DisplayKind kind) : mScreen(kind)
 {
     mSession.set("DISPLAY", mScreen.display());
     std::filesystem::create_directories(files());
@@ -64,6 +64,12 @@ std::string DialogTest::runQuietly(const std::vector<std::string>& commands) con
 void DialogTest::setSetting(const std::string& name, const std::string& value) const
 {
     runQuietly({std::string("REGISTRY SET ") + kSettingsKey + " " + name + " " + quoted(value)});
+}
+
+void DialogTest::setToolkitSetting(const std::string& name, const std::string& value) const
+{
+    mSession.folder().write("profile/toolkit/Defaults/NSGlobalDomain.plist",
+                            "{ " + name + " = \"" + value + "\"; }\n");
 }
 
 void DialogTest::storeHistory(const std::vector<std::string>& paths) const
@@ -144,7 +150,9 @@ void DialogTest::typeName(const std::string& name) const
 void DialogTest::shoot(const std::string& step) const
 {
     const auto* test = testing::UnitTest::GetInstance()->current_test_info();
-    mScreen.shoot(std::string(test->test_suite_name()) + "." + test->name() + "-" + step);
+    std::string name = std::string(test->test_suite_name()) + "." + test->name() + "-" + step;
+    std::ranges::replace(name, '/', '.'); // tests with parameters have one in their names
+    mScreen.shoot(name);
 }
 
 bool DialogTest::prints(const std::string& text) const

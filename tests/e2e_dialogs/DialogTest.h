@@ -25,7 +25,7 @@ inline constexpr char kSettingsKey[] = R"(Software\Tessel\R21\Profiles\Default\D
 class DialogTest : public testing::Test
 {
 protected:
-    DialogTest();
+    explicit DialogTest(DisplayKind kind = {});
 
     // The folder that the dialog opens in, and what lies there: Lisp that prints "<name> runs".
     std::filesystem::path files() const { return mSession.folder() / "files"; }
@@ -36,6 +36,8 @@ protected:
     // Runs commands in a host that loads nothing, before or after the one with the dialog.
     std::string runQuietly(const std::vector<std::string>& commands) const;
     void setSetting(const std::string& name, const std::string& value) const;
+    // A setting of the toolkit, as the profile keeps it.
+    void setToolkitSetting(const std::string& name, const std::string& value) const;
     void storeHistory(const std::vector<std::string>& paths) const;
     void storeSuite(const std::vector<std::string>& paths) const;
     // The stored list as REGISTRY LIST shows it.

@@ -34,7 +34,7 @@ std::string inShellQuotes(const std::string& text)
 }
 } // namespace
 
-Screen::Screen()
+Screen::Screen(DisplayKind kind) : mDisplay(kind)
 {
     mWindowManager = std::make_unique<Program>(std::vector<std::string>{"openbox"}, environment(),
                                                mFolder / "window-manager.txt");
@@ -140,6 +140,21 @@ void Screen::text(const std::string& text) const
 void Screen::clickCloseButton(const std::string& window, int width) const
 {
     run("xdotool" + moveTo(window, {width - kCloseButtonInward, 0}) + "mousemove_relative -- 0 -11" + kPress);
+}
+
+void Screen::setResource(const std::string& lines) const
+{
+    run("xprop -root -format RESOURCE_MANAGER 8s -set RESOURCE_MANAGER " + inShellQuotes(lines));
+}
+
+std::string Screen::sizeOf(const std::string& window) const
+{
+    const std::string geometry = run("xdotool getwindowgeometry " + window);
+    const std::string label = "Geometry: ";
+    const std::size_t start = geometry.find(label);
+    return start == std::string::npos
+               ? std::string()
+               : geometry.substr(start + label.size(), geometry.find('\n', start) - start - label.size());
 }
 
 void Screen::shoot(const std::string& name) const

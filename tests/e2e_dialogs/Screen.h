@@ -19,7 +19,7 @@ struct Place
 class Screen
 {
 public:
-    Screen();
+    explicit Screen(DisplayKind kind = {});
 
     const std::string& display() const { return mDisplay.name(); }
     std::vector<std::string> environment() const;
@@ -47,6 +47,12 @@ public:
     void text(const std::string& text) const;
     // The button in the title bar of a window of this width.
     void clickCloseButton(const std::string& window, int width) const;
+
+    // What the desktop tells its programs: lines of X resources.
+    void setResource(const std::string& lines) const;
+
+    // Width and height of the window's inside: "750x770".
+    std::string sizeOf(const std::string& window) const;
 
     // A picture of the whole screen.
     void shoot(const std::string& name) const;

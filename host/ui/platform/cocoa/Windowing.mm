@@ -14,7 +14,12 @@ bool displayIsReachable()
     return session != nil;
 }
 
-// The platform's own look, and its own file drops.
+// A program of the platform has its settings by its bundle identifier, in a place that the system gives it.
+void keepSettingsIn(NSString*)
+{
+}
+
+// The platform's own look and behaviour.
 void chooseLook()
 {
 }
@@ -24,20 +29,11 @@ void completeLook()
     [NSApp setActivationPolicy:NSApplicationActivationPolicyRegular];
 }
 
-void acceptFileDrops()
+void completeBehaviour()
 {
 }
 
 void flushScreen()
-{
-}
-
-// No window of the platform is ended from outside, and a new one has the keyboard.
-void makeWindowsClosable()
-{
-}
-
-void letNewWindowsHaveTheKeyboard()
 {
 }
 

@@ -8,7 +8,7 @@
 
 #include <tesselui/tsuieach.h>
 
-#include "host/ui/platform/Windowing.h"
+#include "host/ui/platform/gnustep/Behaviour.h"
 #include "host/ui/platform/gnustep/DisplayProbe.h"
 #include "host/ui/platform/gnustep/DropSelection.h"
 #include "host/ui/platform/gnustep/StandIn.h"

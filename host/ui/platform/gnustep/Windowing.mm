@@ -4,7 +4,9 @@
 
 #include <dlfcn.h>
 
+#include "host/ui/platform/gnustep/Behaviour.h"
 #include "host/ui/platform/gnustep/DisplayProbe.h"
+#include "host/ui/platform/gnustep/Settings.h"
 #include "host/ui/platform/gnustep/Theme.h"
 
 namespace tessel::windowing
@@ -34,11 +36,6 @@ NSString* const kPlainFontRoles[] = {@"NSFont",        @"NSUserFont",    @"NSCon
                                      @"NSLabelFont",   @"NSMenuFont",    @"NSMessageFont",
                                      @"NSPaletteFont", @"NSToolTipsFont"};
 NSString* const kBoldFontRoles[] = {@"NSBoldFont", @"NSTitleBarFont"};
-
-void setDefaults(NSDictionary* defaults)
-{
-    [[NSUserDefaults standardUserDefaults] registerDefaults:defaults];
-}
 } // namespace
 
 bool displayIsReachable()
@@ -55,9 +52,19 @@ void chooseLook()
     [look setObject:@"NSMacintoshInterfaceStyle"
              forKey:@"NSScrollViewInterfaceStyle"]; // scrollers on the right
     // Without a window manager nobody else draws title bars, and the toolkit would wait for what never comes.
-    if (!probeDisplay().hasWindowManager)
+    const DisplayFacts display = probeDisplay();
+    if (!display.hasWindowManager)
         [look setObject:@"NO" forKey:@"GSBackHandlesWindowDecorations"];
-    setDefaults(look);
+    [look setObject:[NSString stringWithFormat:@"%g", scaleFor(display.dotsPerInch)] forKey:@"GSScaleFactor"];
+    suggestSettings(look);
+}
+
+void completeBehaviour()
+{
+    acceptFileDrops();
+    makeWindowsClosable();
+    letNewWindowsHaveTheKeyboard();
+    keepScrollersSteady();
 }
 
 void completeLook()
@@ -71,7 +78,7 @@ void completeLook()
         [choice setObject:@"Inter-Regular" forKey:role];
     for (NSString* role : kBoldFontRoles)
         [choice setObject:@"Inter-Bold" forKey:role];
-    setDefaults(choice);
+    suggestSettings(choice);
 }
 
 void flushScreen()

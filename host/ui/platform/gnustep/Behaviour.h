@@ -1,0 +1,18 @@
+// How windows behave here where the toolkit alone would have them behave otherwise. Each is called once, when
+// the application object has been made, before the first window.
+#pragma once
+
+namespace tessel::windowing
+{
+// Takes files that are dragged here from other programs.
+void acceptFileDrops();
+
+// Lets every window be closed by its frame: file panels are cancelled then, message boxes answered.
+void makeWindowsClosable();
+
+// Lets a window that opens right after another has closed get the keyboard.
+void letNewWindowsHaveTheKeyboard();
+
+// Lets scrollers that hide by themselves come and go at any scale.
+void keepScrollersSteady();
+} // namespace tessel::windowing
