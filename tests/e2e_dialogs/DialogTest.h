@@ -18,7 +18,7 @@
 inline constexpr char kDialog[] = "Load/Unload Applications";
 inline constexpr char kSuiteDialog[] = "Startup Suite";
 inline constexpr char kAddPanel[] = "Add to Startup Suite";
-inline constexpr char kMessageBox[] = "Alert"; // the toolkit's title
+inline constexpr char kMessageBox[] = "Tessel";
 inline constexpr char kDialogsKey[] = R"(Software\Tessel\R21\Profiles\Default\Dialogs\Modrig)";
 inline constexpr char kSettingsKey[] = R"(Software\Tessel\R21\Profiles\Default\DialogSettings\Modrig)";
 

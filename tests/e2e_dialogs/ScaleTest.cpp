@@ -8,7 +8,10 @@ constexpr int kDialogHeight = 770;
 
 std::string scaledSize(double scale)
 {
-    const auto scaled = [scale](int length) { return std::to_string(static_cast<int>(length * scale)); };
+    const auto scaled = [scale](int length)
+    {
+        return std::to_string(static_cast<int>(length * scale));
+    };
     return scaled(places::kDialogWidth) + "x" + scaled(kDialogHeight);
 }
 
@@ -26,10 +29,7 @@ protected:
 class DialogResolution : public DialogTest, public testing::WithParamInterface<std::pair<int, double>>
 {
 protected:
-    DialogResolution()
-        : DialogTest({.width = 2600, .height = 2500, .dotsPerInch = GetParam().first})
-    {
-    }
+    DialogResolution() : DialogTest({.width = 2600, .height = 2500, .dotsPerInch = GetParam().first}) {}
 };
 } // namespace
 

@@ -2,6 +2,8 @@
 
 #include <cstdio>
 #include <filesystem>
+#include <ios>
+#include <sstream>
 #include <stdexcept>
 
 #include <unistd.h>
@@ -155,6 +157,51 @@ std::string Screen::sizeOf(const std::string& window) const
     return start == std::string::npos
                ? std::string()
                : geometry.substr(start + label.size(), geometry.find('\n', start) - start - label.size());
+}
+
+std::string Screen::property(const std::string& window, const std::string& name) const
+{
+    const std::string line = run("xprop -notype -id " + window + " " + name);
+    for (const std::string& start : {name + " = ", name + ": "})
+        if (line.starts_with(start))
+            return line.substr(start.size(), line.find('\n') - start.size());
+    return {};
+}
+
+bool Screen::isOver(const std::string& upper, const std::string& lower) const
+{
+    const std::string fromBelow = run("xprop -root _NET_CLIENT_LIST_STACKING") + ",";
+    const auto place = [&](const std::string& window)
+    {
+        std::ostringstream hexadecimal;
+        hexadecimal << " 0x" << std::hex << std::stoul(window);
+        return fromBelow.find(hexadecimal.str());
+    };
+    return place(upper) != std::string::npos && place(lower) < place(upper);
+}
+
+Place Screen::middleOf(const std::string& window) const
+{
+    int left = 0;
+    int top = 0;
+    int width = 0;
+    int height = 0;
+    const std::string report = run("xwininfo -id " + window);
+    const auto number = [&](const std::string& label, int& value)
+    {
+        if (const std::size_t place = report.find(label); place != std::string::npos)
+            value = std::stoi(report.substr(place + label.size()));
+    };
+    number("Absolute upper-left X:", left);
+    number("Absolute upper-left Y:", top);
+    number("Width:", width);
+    number("Height:", height);
+    return {left + width / 2, top + height / 2};
+}
+
+void Screen::minimize(const std::string& window) const
+{
+    run("xdotool windowminimize " + window);
 }
 
 void Screen::shoot(const std::string& name) const

@@ -54,6 +54,14 @@ public:
     // Width and height of the window's inside: "750x770".
     std::string sizeOf(const std::string& window) const;
 
+    // What the window tells the desktop: the value of a property, as xprop prints it; empty when it has none.
+    std::string property(const std::string& window, const std::string& name) const;
+    // Whether the one window is nearer to the user.
+    bool isOver(const std::string& upper, const std::string& lower) const;
+    // The middle of the window's inside, on the screen.
+    Place middleOf(const std::string& window) const;
+    void minimize(const std::string& window) const;
+
     // A picture of the whole screen.
     void shoot(const std::string& name) const;
     // What a piece of the window around the place looks like: equal as long as no pixel of it changes.

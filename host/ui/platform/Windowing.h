@@ -21,6 +21,9 @@ void completeBehaviour();
 // Calls the function whenever a loop is about to wait for an event, on the main thread. Called once.
 void callBeforeEachWait(void (*call)());
 
+// Shows a message of the host, with the sign of a warning or of mere information, until it is answered.
+void runMessage(NSString* text, bool warning);
+
 // Carries out what the screen still has to show.
 void flushScreen();
 } // namespace tessel::windowing

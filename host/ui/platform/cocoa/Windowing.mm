@@ -33,6 +33,16 @@ void completeBehaviour()
 {
 }
 
+void runMessage(NSString* text, bool warning)
+{
+    NSAlert* alert = [[[NSAlert alloc] init] autorelease];
+    [alert setMessageText:@"Tessel"];
+    [alert setInformativeText:text];
+    [alert setAlertStyle:warning ? NSWarningAlertStyle : NSInformationalAlertStyle];
+    [alert addButtonWithTitle:@"OK"];
+    [alert runModal];
+}
+
 void flushScreen()
 {
 }

@@ -13,6 +13,9 @@ void makeWindowsClosable();
 // Lets a window that opens right after another has closed get the keyboard.
 void letNewWindowsHaveTheKeyboard();
 
+// Keeps a modal window over the one that it came from, in its middle, and all of them within reach.
+void keepModalWindowsInFront();
+
 // Lets scrollers that hide by themselves come and go at any scale.
 void keepScrollersSteady();
 } // namespace tessel::windowing

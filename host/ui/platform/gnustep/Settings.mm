@@ -1,6 +1,7 @@
-// The toolkit keeps settings, and lists of what it has found, in the home of the person that the system knows,
-// whatever HOME says: a trial with a profile of its own would change them for every program of the toolkit.
-// Here they lie in the profile. What the person has set for all programs counts as before, but is only read.
+// The toolkit keeps settings, and lists of what it has found, in the home of the person that the system
+// knows, whatever HOME says: a trial with a profile of its own would change them for every program of the
+// toolkit. Here they lie in the profile. What the person has set for all programs counts as before, but is
+// only read.
 #include "host/ui/platform/gnustep/Settings.h"
 
 #include "host/ui/platform/Windowing.h"

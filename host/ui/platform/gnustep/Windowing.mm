@@ -64,6 +64,7 @@ void completeBehaviour()
     acceptFileDrops();
     makeWindowsClosable();
     letNewWindowsHaveTheKeyboard();
+    keepModalWindowsInFront();
     keepScrollersSteady();
 }
 
