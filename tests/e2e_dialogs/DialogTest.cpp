@@ -7,7 +7,6 @@ using testing::HasSubstr;
 namespace
 {
 constexpr char kDragWindow[] = "Files to drag";
-constexpr Place kDragButton{50, 30};
 
 std::string quoted(const std::string& text)
 {
@@ -170,14 +169,24 @@ void DialogTest::dismissMessageBox() const
     EXPECT_TRUE(mScreen.waitUntilGone(kMessageBox));
 }
 
-void DialogTest::dragFiles(const std::vector<std::string>& paths, Place place,
-                           const std::function<void()>& effect) const
+std::unique_ptr<Program> DialogTest::dragSource(const std::vector<std::string>& paths) const
 {
     std::vector<std::string> arguments = {"/usr/bin/python3", DRAG_SOURCE};
     arguments.insert(arguments.end(), paths.begin(), paths.end());
-    const Program source(arguments, mScreen.environment(), mSession.folder() / "drag.txt");
-    const std::string window = mScreen.waitForWindow(kDragWindow);
-    ASSERT_FALSE(window.empty()) << source.output();
+    return std::make_unique<Program>(arguments, mScreen.environment(), mSession.folder() / "drag.txt");
+}
+
+std::string DialogTest::dragWindow() const
+{
+    return mScreen.waitForWindow(kDragWindow);
+}
+
+void DialogTest::dragFiles(const std::vector<std::string>& paths, Place place,
+                           const std::function<void()>& effect) const
+{
+    const auto source = dragSource(paths);
+    const std::string window = dragWindow();
+    ASSERT_FALSE(window.empty()) << source->output();
     mScreen.drag(window, kDragButton, mDialog, place);
     shoot("dropped");
     effect();

@@ -22,6 +22,8 @@ inline constexpr char kMessageBox[] = "Tessel";
 inline constexpr char kDialogsKey[] = R"(Software\Tessel\R21\Profiles\Default\Dialogs\Modrig)";
 inline constexpr char kSettingsKey[] = R"(Software\Tessel\R21\Profiles\Default\DialogSettings\Modrig)";
 
+inline constexpr Place kDragButton{50, 30}; // in the window that files are dragged from
+
 class DialogTest : public testing::Test
 {
 protected:
@@ -70,6 +72,9 @@ protected:
     // the effect has been waited for.
     void dragFiles(const std::vector<std::string>& paths, Place place,
                    const std::function<void()>& effect) const;
+    // The program that files are dragged from, at the left upper edge of the screen.
+    std::unique_ptr<Program> dragSource(const std::vector<std::string>& paths) const;
+    std::string dragWindow() const;
 
     Screen mScreen;
     HostSession mSession;

@@ -110,3 +110,78 @@ TEST_F(DialogDrop, LoadsTwoFilesOfItsOwnListBetweenTheRowsOfTheTable)
     shoot("loaded");
     closeAndEnd();
 }
+
+TEST_F(DialogDrop, IsTakenAnywhereInTheEmptyPartOfTheTableAfterThePointerCameOverTheRows)
+{
+    const auto paths = writeManyLisp(5);
+    open();
+    dragFiles({paths[0], paths[1]}, kTable, [this] { EXPECT_TRUE(prints("2 applications were loaded.\n")); });
+    for (const int file : {2, 3, 4})
+    {
+        const auto source = dragSource({paths[static_cast<std::size_t>(file)]});
+        mScreen.dragOver(dragWindow(), kDragButton, mDialog, places::tableRow(0));
+        for (int row = 1; row <= 3 + file / 2; ++row)
+            mScreen.moveOn(mDialog, {places::tableRow(row).x, places::tableRow(row).y + 3 * file});
+        shoot("hovering-" + std::to_string(file));
+        mScreen.letGo();
+        EXPECT_TRUE(prints(wasLoaded("many" + std::to_string(file + 1) + ".lsp")));
+    }
+    closeAndEnd();
+}
+
+TEST_F(DialogDrop, IsTakenBetweenTwoRows)
+{
+    const auto paths = writeManyLisp(3);
+    open();
+    dragFiles({paths[0], paths[1]}, kTable, [this] { EXPECT_TRUE(prints("2 applications were loaded.\n")); });
+    const Place between{places::tableRow(1).x, places::tableRow(1).y - places::kRowHeight / 2};
+    dragFiles({paths[2]}, between, [this] { EXPECT_TRUE(prints(wasLoaded("many3.lsp"))); });
+    shoot("between");
+    closeAndEnd();
+}
+
+TEST_F(DialogDrop, IsNotTakenByADialogBehindAMessageBox)
+{
+    mSession.folder().write("files/aaa.zmb", "no module");
+    const auto paths = writeManyLisp(1);
+    open();
+    click(places::file(0));
+    click(places::kLoad);
+    ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty());
+    dragFiles(paths, {kTable.x, kTable.y + 80}, [this] { shoot("refused"); });
+    dragFiles(paths, {places::kStartupSuiteBox.x, places::kStartupSuiteBox.y + 20}, [] {});
+    dismissMessageBox();
+    EXPECT_THAT(closeAndEnd(), Not(HasSubstr("many1.lsp")));
+}
+
+TEST_F(DialogDrop, LetsItsSourceGoBeforeAMessageBoxIsAnswered)
+{
+    const auto paths = writeManyLisp(51);
+    open();
+    auto source = dragSource(paths);
+    mScreen.drag(dragWindow(), kDragButton, mDialog, kTable);
+    ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty());
+    EXPECT_TRUE(comesTrue([&] { return source->output().find("has ended") != std::string::npos; }));
+    EXPECT_FALSE(mScreen.window(kMessageBox).empty());
+    source.reset(); // and it may end
+    dismissMessageBox();
+    EXPECT_THAT(closeAndEnd(), Not(HasSubstr("X-Windows")));
+}
+
+TEST_F(DialogDrop, IsShownByTheStartupSuiteBoxWhileItWouldBeTaken)
+{
+    const auto paths = writeManyLisp(1);
+    open();
+    const Place edge{places::kStartupSuiteBox.x, places::kStartupSuiteBox.y + 20};
+    const std::string before = look(edge);
+    auto source = dragSource(paths);
+    mScreen.dragOver(dragWindow(), kDragButton, mDialog, {edge.x, edge.y + 30});
+    shoot("hovering");
+    EXPECT_NE(look(edge), before);
+    mScreen.letGo();
+    EXPECT_TRUE(prints("many1.lsp was added to the Startup Suite.\n"));
+    EXPECT_TRUE(comesTrue([&] { return look(edge) == before; }));
+    shoot("taken");
+    source.reset(); // which gives the keyboard back
+    closeAndEnd();
+}

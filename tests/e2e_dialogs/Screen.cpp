@@ -115,12 +115,28 @@ void Screen::doubleClick(const std::string& window, Place place) const
 
 void Screen::drag(const std::string& fromWindow, Place from, const std::string& toWindow, Place to) const
 {
+    dragOver(fromWindow, from, toWindow, to);
+    letGo();
+}
+
+void Screen::moveOn(const std::string& window, Place to) const
+{
+    run("xdotool" + moveTo(window, to) + "sleep 0.2 mousemove_relative 1 1 sleep 0.3");
+}
+
+void Screen::letGo() const
+{
+    run("xdotool mouseup 1");
+}
+
+void Screen::dragOver(const std::string& fromWindow, Place from, const std::string& toWindow, Place to) const
+{
     const auto step = [](int pixels)
     {
         return " sleep 0.1 mousemove_relative " + std::to_string(pixels) + " " + std::to_string(pixels);
     };
     run("xdotool" + moveTo(fromWindow, from) + "sleep 0.2 mousedown 1 sleep 0.2" + step(20) + step(30) +
-        moveTo(toWindow, to) + "sleep 0.3" + step(2) + " sleep 0.5 mouseup 1");
+        moveTo(toWindow, to) + "sleep 0.3" + step(2) + " sleep 0.5");
 }
 
 void Screen::choose(const std::string& window, Place menu, Place item) const

@@ -39,6 +39,10 @@ public:
     void doubleClick(const std::string& window, Place place) const;
     // Presses at one place and releases at another, with time for the drag to be noticed on the way.
     void drag(const std::string& fromWindow, Place from, const std::string& toWindow, Place to) const;
+    // The same in two steps, to look at what is shown while the mouse hovers.
+    void dragOver(const std::string& fromWindow, Place from, const std::string& toWindow, Place to) const;
+    void moveOn(const std::string& window, Place to) const;
+    void letGo() const;
 
     // Opens a menu and lets go over one of its items.
     void choose(const std::string& window, Place menu, Place item) const;

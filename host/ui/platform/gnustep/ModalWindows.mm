@@ -124,7 +124,6 @@ void keepModalWindowsInFront()
     toolkitEndModalSession = standInFor("NSApplication", @selector(endModalSession:), endModalSession);
     toolkitOrderWindow = standInFor("XGServer", @selector(orderwindow:::), orderWindow);
     toolkitSetWindowLevel = standInFor("XGServer", @selector(setwindowlevel::), setWindowLevel);
-    toolkitPerformMiniaturize =
-        standInFor("NSWindow", @selector(performMiniaturize:), performMiniaturize);
+    toolkitPerformMiniaturize = standInFor("NSWindow", @selector(performMiniaturize:), performMiniaturize);
 }
 } // namespace tessel::windowing

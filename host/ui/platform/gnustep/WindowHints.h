@@ -1,5 +1,6 @@
-// What the desktop is told about a window (Extended Window Manager Hints, Inter-Client Communication Conventions). Windows are numbers
-// of the X display, as the toolkit hands them out, 0 is none; the display is the toolkit's own connection.
+// What the desktop is told about a window (Extended Window Manager Hints, Inter-Client Communication
+// Conventions). Windows are numbers of the X display, as the toolkit hands them out, 0 is none; the display
+// is the toolkit's own connection.
 #pragma once
 
 namespace tessel::windowing
