@@ -14,7 +14,7 @@ namespace
 {
 bool gPrepared = false;
 
-NSString* settingsFolder()
+NSString* toolkitFolder()
 {
     const TsDbHostApplicationServices* services = tsdbHostApplicationServices();
     NSString* profile = wcharToNSString(services ? services->profileFolder() : L"");
@@ -25,7 +25,7 @@ void prepare()
 {
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
     const tessel::KeptSignals signals; // the display's backend would take Ctrl-C and the wish to end
-    tessel::windowing::keepSettingsIn(settingsFolder());
+    tessel::windowing::prepareToolkit(toolkitFolder());
     tessel::windowing::chooseLook();
     [NSApplication sharedApplication];
     tessel::windowing::completeLook();

@@ -8,8 +8,9 @@ namespace tessel::windowing
 // Whether a display answers.
 bool displayIsReachable();
 
-// Before anything else: the folder (a path that need not exist) in which the toolkit keeps what it remembers.
-void keepSettingsIn(NSString* folder);
+// Before anything else: the folder (a path that need not exist) in which the toolkit keeps what it remembers
+// and what it complains about.
+void prepareToolkit(NSString* folder);
 
 // Before the application object is made: the look that is read once.
 void chooseLook();

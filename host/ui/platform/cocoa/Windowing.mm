@@ -14,8 +14,9 @@ bool displayIsReachable()
     return session != nil;
 }
 
-// A program of the platform has its settings by its bundle identifier, in a place that the system gives it.
-void keepSettingsIn(NSString*)
+// A program of the platform has its settings by its bundle identifier, and its log, where the system keeps
+// them.
+void prepareToolkit(NSString*)
 {
 }
 

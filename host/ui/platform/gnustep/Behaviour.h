@@ -1,9 +1,12 @@
-// How windows behave here where the toolkit alone would have them behave otherwise. Each is called once, when
-// the application object has been made, before the first window.
+// How the toolkit behaves here where left alone it would behave otherwise. Each is called once: the first
+// before the application object is made, the others after it, before the first window.
 #pragma once
 
 namespace tessel::windowing
 {
+// Lets the programs that the toolkit starts for itself end when this one does.
+void endHelperProgramsWithTheSession();
+
 // Takes files that are dragged here from other programs.
 void acceptFileDrops();
 

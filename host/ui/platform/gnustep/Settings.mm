@@ -4,7 +4,7 @@
 // only read.
 #include "host/ui/platform/gnustep/Settings.h"
 
-#include "host/ui/platform/Windowing.h"
+#include <fstream>
 
 namespace tessel::windowing
 {
@@ -14,7 +14,10 @@ NSString* const kSettingsPlace = @"GNUSTEP_USER_DEFAULTS_DIR";
 NSString* const kLibraryPlace = @"GNUSTEP_USER_DIR_LIBRARY";
 NSString* const kSettingsOfAllPrograms = @"NSGlobalDomain.plist";
 
+constexpr std::streamoff kLongestLog = 1 << 20;
+
 NSDictionary* gPersonalSettings;
+NSString* gLog;
 
 NSDictionary* readPersonalSettings(NSDictionary* places)
 {
@@ -22,6 +25,17 @@ NSDictionary* readPersonalSettings(NSDictionary* places)
     NSString* folder = [home stringByAppendingPathComponent:[places objectForKey:kSettingsPlace]];
     return [NSDictionary
         dictionaryWithContentsOfFile:[folder stringByAppendingPathComponent:kSettingsOfAllPrograms]];
+}
+
+void writeToLog(NSString* message)
+{
+    [[NSFileManager defaultManager] createDirectoryAtPath:[gLog stringByDeletingLastPathComponent]
+                              withIntermediateDirectories:YES
+                                               attributes:nil
+                                                    error:nullptr];
+    std::ofstream log([gLog fileSystemRepresentation], std::ios::app);
+    if (log.tellp() < kLongestLog)
+        log << [message UTF8String];
 }
 } // namespace
 
@@ -33,6 +47,13 @@ void keepSettingsIn(NSString* folder)
     [places setObject:[folder stringByAppendingPathComponent:@"Library"] forKey:kLibraryPlace];
     GNUstepConfig(places);
     [NSUserDefaults resetStandardUserDefaults]; // where somebody has asked them already
+}
+
+// Nothing of it is for the person at the prompt, who did not ask and cannot answer.
+void keepComplaintsIn(NSString* folder)
+{
+    gLog = [[folder stringByAppendingPathComponent:@"log.txt"] copy];
+    _NSLog_printf_handler = writeToLog;
 }
 
 void suggestSettings(NSDictionary* settings)

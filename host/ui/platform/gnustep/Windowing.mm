@@ -43,6 +43,13 @@ bool displayIsReachable()
     return probeDisplay().reachable;
 }
 
+void prepareToolkit(NSString* folder)
+{
+    keepSettingsIn(folder);
+    keepComplaintsIn(folder);
+    endHelperProgramsWithTheSession();
+}
+
 void chooseLook()
 {
     NSMutableDictionary* look = [NSMutableDictionary dictionary];
