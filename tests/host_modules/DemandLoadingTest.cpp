@@ -30,7 +30,7 @@ protected:
     }
 
     tessel::Registry mRegistry{mFolder / "registry.db"};
-    tessel::ApplicationServices mApplication;
+    tessel::ApplicationServices mApplication{L"/profile"};
     tessel::DemandLoading mDemand{mFolder / "PlugIns"};
 };
 
