@@ -6,6 +6,7 @@
 
 #include "host/Services.h"
 #include "host/app/Layout.h"
+#include "host/app/platform/ToolkitPlaces.h"
 #include "host/commands/BuiltIn.h"
 #include "host/commands/CommandStack.h"
 #include "host/console/Console.h"
@@ -74,6 +75,8 @@ bool Host::start()
     const AutoreleasePool pool;
     if (anotherRuns() || !prepareProfileFolder())
         return false;
+    // The applications that are loaded next may bring Objective-C along.
+    static_cast<void>(keepToolkitFilesIn(mOptions.profileFolder / kToolkitFolder));
     services().commandLine = &mCommandLine;
     services().endRequest = &mEndRequest;
     mParts = std::make_unique<Parts>();

@@ -5,6 +5,7 @@
 #include <tesselui/tsuidisplay.h>
 #include <wincompat/winstring.h>
 
+#include "host/app/platform/ToolkitPlaces.h"
 #include "host/ui/KeptSignals.h"
 #include "host/ui/SessionEnd.h"
 #include "host/ui/Waiting.h"
@@ -18,7 +19,7 @@ NSString* toolkitFolder()
 {
     const TsDbHostApplicationServices* services = tsdbHostApplicationServices();
     NSString* profile = wcharToNSString(services ? services->profileFolder() : L"");
-    return [profile stringByAppendingPathComponent:@"toolkit"];
+    return [profile stringByAppendingPathComponent:[NSString stringWithUTF8String:tessel::kToolkitFolder]];
 }
 
 void prepare()

@@ -2,6 +2,8 @@
 
 #include <cstdlib>
 
+#include "host/app/platform/ToolkitPlaces.h"
+
 namespace tessel
 {
 std::filesystem::path personalDataHome()
@@ -9,5 +11,11 @@ std::filesystem::path personalDataHome()
     const char* home = std::getenv("HOME");
     return home && *home ? std::filesystem::path(home) / "Library/Application Support"
                          : std::filesystem::path();
+}
+
+// The system keeps what belongs to the program under the program's name.
+std::string keepToolkitFilesIn(const std::string&)
+{
+    return {};
 }
 } // namespace tessel

@@ -1,31 +1,22 @@
-// The toolkit keeps settings, and lists of what it has found, in the home of the person that the system
-// knows, whatever HOME says: a trial with a profile of its own would change them for every program of the
-// toolkit. Here they lie in the profile. What the person has set for all programs counts as before, but is
-// only read.
+// What the person has set for all programs of the toolkit counts here too, but is only read: what this
+// program remembers lies in the profile.
 #include "host/ui/platform/gnustep/Settings.h"
 
 #include <fstream>
+#include <string>
+
+#include "host/app/platform/ToolkitPlaces.h"
 
 namespace tessel::windowing
 {
 namespace
 {
-NSString* const kSettingsPlace = @"GNUSTEP_USER_DEFAULTS_DIR";
-NSString* const kLibraryPlace = @"GNUSTEP_USER_DIR_LIBRARY";
 NSString* const kSettingsOfAllPrograms = @"NSGlobalDomain.plist";
 
 constexpr std::streamoff kLongestLog = 1 << 20;
 
 NSDictionary* gPersonalSettings;
 NSString* gLog;
-
-NSDictionary* readPersonalSettings(NSDictionary* places)
-{
-    NSString* home = [[[NSProcessInfo processInfo] environment] objectForKey:@"HOME"];
-    NSString* folder = [home stringByAppendingPathComponent:[places objectForKey:kSettingsPlace]];
-    return [NSDictionary
-        dictionaryWithContentsOfFile:[folder stringByAppendingPathComponent:kSettingsOfAllPrograms]];
-}
 
 void writeToLog(NSString* message)
 {
@@ -41,12 +32,10 @@ void writeToLog(NSString* message)
 
 void keepSettingsIn(NSString* folder)
 {
-    NSMutableDictionary* places = [[GNUstepConfig(nil) mutableCopy] autorelease];
-    gPersonalSettings = [readPersonalSettings(places) retain];
-    [places setObject:[folder stringByAppendingPathComponent:@"Defaults"] forKey:kSettingsPlace];
-    [places setObject:[folder stringByAppendingPathComponent:@"Library"] forKey:kLibraryPlace];
-    GNUstepConfig(places);
-    [NSUserDefaults resetStandardUserDefaults]; // where somebody has asked them already
+    const std::string personal = keepToolkitFilesIn([folder fileSystemRepresentation]);
+    NSString* file = [[NSString stringWithUTF8String:personal.c_str()]
+        stringByAppendingPathComponent:kSettingsOfAllPrograms];
+    gPersonalSettings = [[NSDictionary alloc] initWithContentsOfFile:file];
 }
 
 // Nothing of it is for the person at the prompt, who did not ask and cannot answer.
