@@ -1,11 +1,12 @@
 // The classes that the host offers for windows, as far as they need no user.
 #include "tests/ui/support/DialogTest.h"
+#include "tests/ui/support/Pictures.h"
 
 #import <tesselui/TsOCFileFilter.h>
 #import <tesselui/TsUIPersistentStore.h>
 #include <tesselui/tsuierrors.h>
 
-#include "host/ui/platform/gnustep/ThemeSegments.h"
+#include "host/ui/platform/gnustep/ThemeButtons.h"
 
 using testing::ElementsAre;
 
@@ -110,22 +111,9 @@ TEST(ToolkitErrors, AreAnsweredAsText)
     EXPECT_EQ(nil, tsuiErrorOf(returnQuietly, nullptr));
 }
 
-namespace
-{
-// What the control looks like on the screen.
-NSData* pictureOf(NSView* view)
-{
-    [view lockFocus];
-    NSBitmapImageRep* picture =
-        [[[NSBitmapImageRep alloc] initWithFocusedViewRect:[view bounds]] autorelease];
-    [view unlockFocus];
-    return [picture TIFFRepresentation];
-}
-} // namespace
-
 TEST_F(Segments, LookDisabledWhenTheyAre)
 {
-    tessel::windowing::drawSegmentsAsButtons();
+    tessel::windowing::completeButtons();
     NSWindow* window = [[[NSWindow alloc] initWithContentRect:NSMakeRect(0, 0, 100, 40)
                                                     styleMask:NSBorderlessWindowMask
                                                       backing:NSBackingStoreBuffered
