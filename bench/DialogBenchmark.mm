@@ -4,6 +4,7 @@
 #include <tessel/tsrxlinker.h>
 #include <tesselui/tsuidisplay.h>
 #include <tesselui/tsuieach.h>
+#include <tesselui/tsuifilepanel.h>
 
 #include <cstdlib>
 #include <exception>
@@ -17,7 +18,6 @@
 #include "bench/Session.h"
 #include "module/Globals.h"
 #include "tests/ui/support/VirtualDisplay.h"
-#include "ui/platform/Platform.h"
 
 #import <AppKit/AppKit.h>
 
@@ -45,7 +45,7 @@ void fillHistory(std::size_t count)
 class OpenDialog
 {
 public:
-    OpenDialog() : mController([[ModrigController alloc] init]), mPanel(ModrigPlatform::MakeOpenPanel())
+    OpenDialog() : mController([[ModrigController alloc] init]), mPanel(tsuiMakeFilePanel())
     {
         [mController setupOpenPanel:mPanel];
     }

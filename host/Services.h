@@ -12,6 +12,7 @@ class CommandLine;         // host/console: where the host's text goes
 class CommandStack;        // host/commands
 class Document;            // host/documents
 class DynamicLinker;       // host/linker
+class EndRequest;          // host/console: whether the session is to end
 class FileSearch;          // host/filesearch
 class Help;                // host/help
 class LispInterpreter;     // host/lisp
@@ -24,6 +25,7 @@ class SystemVariables;     // host/sysvars
 struct Services
 {
     CommandLine* commandLine = nullptr;
+    EndRequest* endRequest = nullptr;
     Registry* registry = nullptr;
     SystemVariables* variables = nullptr;
     CallingApplication* callingApplication = nullptr;

@@ -6,7 +6,8 @@
 namespace ModrigUtils
 {
 // Whether the list has an entry for the application at the path: the same folder and file name in any case,
-// or, for object-database modules (.omp), the same file name wherever it lies.
+// or, for object-database modules (.omp), the same file name wherever it lies. A path that is too long to be
+// taken apart stands for itself only.
 bool FoundinSpecificList(const CStdStr& path, const CStringList& list);
 
 bool FoundinStartupList(const CStdStr& path);

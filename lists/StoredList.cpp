@@ -1,6 +1,7 @@
 #include "lists/StoredList.h"
 
 #include <cwchar>
+#include <utility>
 
 #include "lists/ListMembership.h"
 #include "lists/ProfileRegistry.h"
@@ -22,6 +23,44 @@ CStdStr EntryName(const StoredListNames& names, long index)
     name.Fmt(names.entryFormat, index);
     return name;
 }
+
+// Reads the numbered values one after the other, in as many passes as the list's count says. The number moves
+// on only after a value that was read: a pass that fails is spent, and the next asks for the same value. So a
+// list ends at its first gap, numbers after the gap, left over from a longer list, never come back, and a
+// fault that passes costs the passes it took and no more.
+class EntryReader
+{
+public:
+    EntryReader(const StoredListNames& names, CStdStr subKey, long passes)
+        : mNames(names), mSubKey(std::move(subKey)), mPassesLeft(passes), mName(EntryName(names, mIndex))
+    {
+    }
+
+    // The next entry, or false at the end.
+    bool Read(CStdStr& path)
+    {
+        for (int failures = 0; mPassesLeft > 0 && failures < kMostFailuresInARow; ++failures)
+        {
+            --mPassesLeft;
+            if (!ReadModrigRegString(HKEY_CURRENT_USER, mSubKey, mName, path))
+                continue;
+            mName = EntryName(mNames, ++mIndex);
+            return true;
+        }
+        return false;
+    }
+
+private:
+    // A gap does not close while it is looked at. A damaged count, which may be anything, must not keep the
+    // host from starting.
+    static constexpr int kMostFailuresInARow = 10000;
+
+    const StoredListNames& mNames;
+    const CStdStr mSubKey;
+    long mPassesLeft;
+    long mIndex = 1;
+    CStdStr mName;
+};
 
 // The leading decimal digits; 0 when there are none.
 long ReadCount(const CStdStr& text)
@@ -67,16 +106,9 @@ void ReadStoredList(const StoredListNames& names, CStringList& list,
     CStdStr stored;
     if (!ReadModrigRegString(HKEY_CURRENT_USER, subKey, names.count, stored))
         return;
-    const long count = ReadCount(stored);
-    long index = 1;
-    for (long pass = 0; pass < count; ++pass)
+    EntryReader entries(names, subKey, ReadCount(stored));
+    for (CStdStr path; entries.Read(path);)
     {
-        CStdStr path;
-        // The index advances only behind a value that was read: the list ends at the first gap, and numbers
-        // behind a gap, left over from a longer list, never come back.
-        if (!ReadModrigRegString(HKEY_CURRENT_USER, subKey, EntryName(names, index), path))
-            return;
-        ++index;
         if (FoundinSpecificList(path, list))
             continue;
         list.AddTail(path);

@@ -57,21 +57,24 @@ void KeepMacroProjectsOnly()
         RemoveInSpecificList(path, gLoadedAppList);
 }
 
-void AddModule(const TsResultBuffer& entry, const CStdStr& ownName)
+void AddModule(const TsResultBuffer& entry)
 {
     wchar_t path[kModulePathSize] = {};
     if (tsedGetModuleFileName(entry.value.string, path, kModulePathSize) != 0)
         return;
+    const CStdStr ownName = SplitPath(CStdStr(tsedGetAppName())).FileName();
     if (!IsNamed(entry, ownName))
         AddUnlessFound(CStdStr(std::wstring(path)));
 }
 
-void AddModules(const TsResultBuffer* modules)
+// False when the host reports no module at all.
+bool AddModules()
 {
-    const CStdStr ownName = SplitPath(CStdStr(tsedGetAppName())).FileName();
-    for (const TsResultBuffer* entry = modules; entry; entry = entry->next)
+    const ResultBufferList modules(tsedQmbLoaded());
+    for (const TsResultBuffer* entry = modules.get(); entry; entry = entry->next)
         if (entry->type == TS_STRING)
-            AddModule(*entry, ownName);
+            AddModule(*entry);
+    return modules != nullptr;
 }
 
 void AddDocumentApplications()
@@ -86,13 +89,10 @@ void AddDocumentApplications()
 void PopulateLoadedApps()
 {
     KeepMacroProjectsOnly();
-    const ResultBufferList modules(tsedQmbLoaded());
     // A host that reports no module at all is taken to have nothing to report: the document is not asked
     // either.
-    if (!modules)
-        return;
-    AddModules(modules.get());
-    AddDocumentApplications();
+    if (AddModules())
+        AddDocumentApplications();
 }
 
 bool ApplicationIsLoaded(CStdStr path)

@@ -10,9 +10,23 @@
 namespace
 {
 constexpr std::uintptr_t kLargestResourceId = 65535;
-constexpr int kLongestResourceText = 4096;
+constexpr std::size_t kRoomForUsualText = 4096;
 constexpr std::size_t kFormattingRoom = 1023;
 constexpr std::wstring_view kWhiteSpace = L" \t\n\r\f\v";
+
+// The host cuts a text to the room it is given and does not say so: one that fills the room is fetched again
+// with more.
+std::wstring ResourceText(unsigned id, HMODULE module)
+{
+    for (std::size_t room = kRoomForUsualText;; room *= 2)
+    {
+        std::vector<wchar_t> buffer(room);
+        const int copied = loadStringFromWin32ResourceDLL(module, id, buffer.data(), static_cast<int>(room));
+        const std::size_t length = copied > 0 ? static_cast<std::size_t>(copied) : 0;
+        if (length + 1 < room)
+            return std::wstring(buffer.data(), length);
+    }
+}
 } // namespace
 
 CStdStr::CStdStr(const wchar_t* text)
@@ -88,10 +102,10 @@ bool CStdStr::HasDot() const
 
 bool CStdStr::Load(unsigned id, HMODULE module)
 {
-    std::vector<wchar_t> buffer(kLongestResourceText);
-    if (loadStringFromWin32ResourceDLL(module, id, buffer.data(), kLongestResourceText) <= 0)
+    const std::wstring text = ResourceText(id, module);
+    if (text.empty())
         return false;
-    mText = buffer.data();
+    mText = text;
     return true;
 }
 

@@ -43,4 +43,6 @@ inline constexpr unsigned kLoadFailed = 38;   // full path
 inline constexpr unsigned kUrlNotFetched = 39;
 inline constexpr unsigned kTemporaryInternetFile = 41; // full path
 inline constexpr unsigned kAlreadyLoaded = 48;         // file name
+
+inline constexpr unsigned kDialogFailed = 60; // the toolkit's own words
 } // namespace ModrigMessages

@@ -2,18 +2,26 @@
 
 HINSTANCE CTemporaryResourceOverride::m_hInstanceDefault = nullptr;
 
-CTemporaryResourceOverride::CTemporaryResourceOverride(HINSTANCE resources) : mbActive(resources != nullptr)
+namespace
 {
-    if (!mbActive)
-        return;
-    mhPrevious = AfxGetResourceHandle();
-    if (mhPrevious != resources)
+// Stands in the field of an object that was made with a null handle and so has nothing to restore: an address
+// of our own, which no module has. Null would not do, it is what is current before anybody has chosen.
+HINSTANCE NothingToRestore()
+{
+    return reinterpret_cast<HINSTANCE>(&CTemporaryResourceOverride::m_hInstanceDefault);
+}
+} // namespace
+
+CTemporaryResourceOverride::CTemporaryResourceOverride(HINSTANCE resources)
+    : mhPrevious(resources ? AfxGetResourceHandle() : NothingToRestore())
+{
+    if (resources && mhPrevious != resources)
         AfxSetResourceHandle(resources);
 }
 
 CTemporaryResourceOverride::~CTemporaryResourceOverride()
 {
-    if (mbActive && AfxGetResourceHandle() != mhPrevious)
+    if (mhPrevious != NothingToRestore() && AfxGetResourceHandle() != mhPrevious)
         AfxSetResourceHandle(mhPrevious);
 }
 

@@ -27,6 +27,6 @@ public:
     static HINSTANCE m_hInstanceDefault;
 
 private:
-    const bool mbActive;
-    HINSTANCE mhPrevious = nullptr;
+    // The handle that was current when the object was made.
+    HINSTANCE mhPrevious;
 };

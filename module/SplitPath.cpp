@@ -6,9 +6,9 @@
 
 SplitPath::SplitPath(const CStdStr& path)
 {
-    // A failure has emptied all four, which is what every caller works with.
-    static_cast<void>(_wsplitpath_s(path.c_str(), mDrive, kDriveSize, mFolder, kFolderSize, mName, kNameSize,
-                                    mExtension, kExtensionSize));
+    if (_wsplitpath_s(path.c_str(), mDrive, kDriveSize, mFolder, kFolderSize, mName, kNameSize, mExtension,
+                      kExtensionSize) != 0)
+        mTooLong = path;
 }
 
 CStdStr SplitPath::FileName() const
@@ -25,7 +25,8 @@ bool SplitPath::HasExtension(std::wstring_view extension) const
 // equal one by one; the same goes for drive and folder.
 bool SplitPath::SameFileName(const SplitPath& other) const
 {
-    return EqualIgnoringCase(mName, other.mName) && EqualIgnoringCase(mExtension, other.mExtension);
+    return EqualIgnoringCase(mName, other.mName) && EqualIgnoringCase(mExtension, other.mExtension) &&
+           mTooLong.EqualsNoCase(other.mTooLong);
 }
 
 bool SplitPath::SameFolder(const SplitPath& other) const
@@ -35,7 +36,7 @@ bool SplitPath::SameFolder(const SplitPath& other) const
 
 std::size_t SplitPath::FileNameHash() const
 {
-    return HashIgnoringCase(mExtension, HashIgnoringCase(mName));
+    return HashIgnoringCase(mTooLong.Text(), HashIgnoringCase(mExtension, HashIgnoringCase(mName)));
 }
 
 std::size_t SplitPath::PathHash() const

@@ -6,11 +6,13 @@
 #include "module/CStdStr.h"
 
 // The parts as `_wsplitpath_s` gives them in buffers of 3, 1024, 256 and 256 characters. When one part does
-// not fit, all are empty.
+// not fit, the path is too long: all parts are empty, and only the same whole path has the same file name.
 class SplitPath
 {
 public:
     explicit SplitPath(const CStdStr& path);
+
+    bool IsTooLong() const { return !mTooLong.IsEmpty(); }
 
     std::wstring_view Name() const { return mName; }
     // With its dot.
@@ -39,4 +41,5 @@ private:
     wchar_t mFolder[kFolderSize];
     wchar_t mName[kNameSize];
     wchar_t mExtension[kExtensionSize];
+    CStdStr mTooLong; // the whole path when it could not be taken apart, else empty
 };

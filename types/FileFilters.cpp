@@ -78,16 +78,19 @@ FilterEntry ParseEntry(const CStdStr& text)
     return {text.Left(bar), KnownPatterns(text.Mid(bar + 1).Text())};
 }
 
-std::vector<FilterEntry> UsableEntries()
+std::vector<FilterEntry> FilterEntries()
 {
     std::vector<FilterEntry> entries;
     for (const CStdStr& text : FilterTexts())
-    {
-        FilterEntry entry = ParseEntry(text);
-        if (!entry.patterns.IsEmpty())
-            entries.push_back(std::move(entry));
-    }
+        if (!text.IsEmpty())
+            entries.push_back(ParseEntry(text));
     return entries;
+}
+
+// Nothing chosen is no choice, not even of an entry that describes nothing.
+bool IsChosen(const FilterEntry& entry, const CStdStr& choice)
+{
+    return !choice.IsEmpty() && entry.description.EqualsNoCase(choice);
 }
 } // namespace
 
@@ -111,10 +114,9 @@ bool SetRegFileFilterListIndex(const CStdStr& filter)
 void ReAdjustFilterString(CStdStr& filter)
 {
     const CStdStr choice = GetRegFileFilterListIndex();
-    std::vector<FilterEntry> entries = UsableEntries();
-    const auto chosen =
-        std::find_if(entries.begin(), entries.end(),
-                     [&choice](const FilterEntry& entry) { return entry.description.EqualsNoCase(choice); });
+    std::vector<FilterEntry> entries = FilterEntries();
+    const auto chosen = std::find_if(entries.begin(), entries.end(),
+                                     [&choice](const FilterEntry& entry) { return IsChosen(entry, choice); });
     if (chosen != entries.end())
         std::rotate(entries.begin(), chosen, std::next(chosen));
     filter = CStdStr();

@@ -11,9 +11,9 @@ CStdStr GetRegFileFilterListIndex();
 // Remembers the description of the chosen filter. A failure is told in message box 24.
 bool SetRegFileFilterListIndex(const CStdStr& filter);
 
-// Replaces the string with the module's own filters, "description|*.a;*.b|" one behind the other, every entry
-// followed by a "|", the last one too. The remembered choice comes first; only extensions of the application
-// types table remain, and an entry left without any is dropped, since an empty pattern list would end the
-// string for whoever reads it.
+// Replaces the string with the module's own filters, "description|*.a;*.b|" one after the other, every entry
+// followed by a "|", the last one too. The remembered choice comes first. Only extensions of the application
+// types table remain; an entry left without any keeps its place and its description, so that whoever counts
+// the entries finds the one that was meant.
 void ReAdjustFilterString(CStdStr& filter);
 } // namespace ModrigUtils

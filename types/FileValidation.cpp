@@ -90,7 +90,11 @@ DWORD ValidateFileExists(CStdStr& path)
     const DWORD attributes = GetFileAttributesW(path.c_str());
     if (attributes != INVALID_FILE_ATTRIBUTES)
         return attributes;
-    const std::vector<CStdStr> names = CandidateNames(SplitPath(path));
+    const SplitPath split(path);
+    // Its name is not known then, and must not be taken for an empty one, which other files answer to.
+    if (split.IsTooLong())
+        return INVALID_FILE_ATTRIBUTES;
+    const std::vector<CStdStr> names = CandidateNames(split);
     const DWORD found = FindInCurrentFolder(names, path);
     return found != INVALID_FILE_ATTRIBUTES ? found : FindOnSearchPath(names, path);
 }

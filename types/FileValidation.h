@@ -12,7 +12,7 @@ bool IsValidFileForModrig(const CStdStr& path);
 // The attributes of the file, or INVALID_FILE_ATTRIBUTES when it is not found. A file that is missing where
 // the path says is looked for by its name, first in the current folder, then along the host's search path; a
 // name without an extension is tried with that of every application kind in table order. `path` becomes the
-// path of the file found.
+// path of the file found. A path that is too long to be taken apart is found where it says or not at all.
 DWORD ValidateFileExists(CStdStr& path);
 
 // Whether the file is a local copy of one from the internet, which may be gone at the next start.

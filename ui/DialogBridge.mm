@@ -9,22 +9,36 @@
 #import "ui/ModrigController.h"
 #import "ui/TsOCModrigUtil.h"
 
+#include "module/MessageIds.h"
 #include "ui/Paths.h"
 
 namespace
 {
-void RunDialog(void*)
+// The controller goes out through the pointer, so that it can be released also when showing it fails.
+void RunDialog(void* controller)
 {
-    ModrigController* controller = [[[ModrigController alloc] init] autorelease];
-    [controller showModrigDialog];
+    ModrigController*& dialog = *static_cast<ModrigController**>(controller);
+    dialog = [[ModrigController alloc] init];
+    [dialog showModrigDialog];
 }
 
 // What went wrong in the toolkit ends the dialog, not the host.
 void SayWhatFailed(NSString* error)
 {
     const CStdStr reason = ModrigUtils::PathFromString(error);
-    tsutPrintf(L"The Load/Unload Applications dialog was closed by an error of the toolkit: %s.\n",
-               reason.c_str());
+    CStdStr text;
+    text.Format(ModrigMessages::kDialogFailed, reason.c_str());
+    tsutPrintf(L"%s\n", text.c_str());
+}
+
+void ShowDialog()
+{
+    ModrigController* controller = nil;
+    NSString* error = tsuiErrorOf(RunDialog, &controller);
+    // Before the pool is drained: what the controller lends out while it goes belongs into that pool.
+    [controller release];
+    if (error)
+        SayWhatFailed(error);
 }
 } // namespace
 
@@ -39,8 +53,7 @@ void RunModrigDialog()
 {
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
     if (tsuiPrepareWindows())
-        if (NSString* error = tsuiErrorOf(RunDialog, nullptr))
-            SayWhatFailed(error);
+        ShowDialog();
     [pool drain];
     tsuiFinishWindows();
 }

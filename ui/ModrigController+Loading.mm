@@ -1,6 +1,7 @@
 #import "ui/ModrigController.h"
 
 #include <tesselui/tsuieach.h>
+#include <tesselui/tsuifilepanel.h>
 
 #import "ui/ModrigFilePath.h"
 #import "ui/ModrigStartupSuitController.h"
@@ -11,7 +12,6 @@
 #include "ui/Settings.h"
 #include "ui/model/ChosenFiles.h"
 #include "ui/model/LoadBatch.h"
-#include "ui/platform/Platform.h"
 
 namespace
 {
@@ -41,7 +41,7 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
 // selected.
 - (void)chooseWhatIsStillSelected
 {
-    const bool panelHasSelection = [ModrigPlatform::SelectedPaths(mOpenPanel) count] > 0;
+    const bool panelHasSelection = [[mOpenPanel URLs] count] > 0;
     const bool historyHasSelection = [[historyList selectedObjects] count] > 0;
     switch (ModrigUtils::SourceForLoad([mSelectedFiles count] > 0, panelHasSelection, historyHasSelection))
     {
@@ -61,15 +61,15 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
 - (IBAction)onLoad:(id)sender
 {
     (void)sender;
-    if (ModrigPlatform::HasUnreportedSelection(mOpenPanel))
-        [self panelSelectionDidChange:mOpenPanel];
+    if ([mSelectedFiles count] == 0 && tsuiTellOfMissingFile(mOpenPanel))
+        return;
     [self chooseWhatIsStillSelected];
     if ([self openTesselFolder])
         return;
     [self loadApps:mSelectedFiles successedApps:nil addToStartupSuit:NO];
     [[self uiPersistentStore] putControlString:kSettingsGroup
                                        control:kInitialPathSetting
-                                         value:ModrigPlatform::ShownFolder(mOpenPanel)];
+                                         value:[mOpenPanel directory]];
 }
 
 - (IBAction)onStartupSuits:(id)sender

@@ -32,7 +32,8 @@
 - (void)placeHelpButtonIn:(NSOpenPanel*)panel
 {
     NSButton* spare = [panel hideExtensionButton];
-    [[spare superview] addSubview:helpButton];
+    // Before the button that stands to its right, for the order of the Tab key.
+    [[spare superview] addSubview:helpButton positioned:NSWindowBelow relativeTo:[panel cancelButton]];
     [helpButton setFrameOrigin:NSMakePoint(NSMinX([spare frame]), NSMinY([[panel okButton] frame]))];
 }
 
@@ -44,7 +45,6 @@
 
 - (void)setupOpenPanel:(NSOpenPanel*)panel
 {
-    ModrigPlatform::TakePanel(panel);
     mOpenPanel = panel;
     [panel setDelegate:(id)self];
     [panel setAllowsMultipleSelection:YES];
@@ -55,7 +55,7 @@
     CStdStr title;
     title.Load(ModrigMessages::kOpenPanelTitle);
     [panel setTitle:ModrigUtils::StringFromPath(title)];
-    ModrigPlatform::ShowFolder(panel, [self initialFolder]);
+    [panel setDirectory:[self initialFolder]];
     ModrigPlatform::ShowRows(loadedAppsTableView, loadedApps);
     ModrigPlatform::ShowRows(historyListTableView, historyList);
     [self populateFileTypes];
@@ -74,7 +74,6 @@
     [panel setDelegate:nil];
     [panel setAccessoryView:nil];
     [helpButton removeFromSuperview];
-    ModrigPlatform::GiveBackPanel(panel);
 }
 
 - (TsOCFileFilter*)selectedFilter
@@ -93,6 +92,15 @@
     [self onFileTypesChanged:nil];
 }
 
+// The system's panel asks again about the files of a folder that it comes to: it is sent away and back.
+- (void)filterPanelAgain
+{
+    [mOpenPanel validateVisibleColumns];
+    NSURL* folder = [[[mOpenPanel directoryURL] retain] autorelease];
+    [mOpenPanel setDirectoryURL:[[NSBundle bundleForClass:[self class]] bundleURL]];
+    [mOpenPanel setDirectoryURL:folder];
+}
+
 // The pop-up sends itself; nobody has chosen anything when the dialog fills it.
 - (IBAction)onFileTypesChanged:(id)sender
 {
@@ -103,7 +111,7 @@
         ModrigUtils::SetRegFileFilterListIndex(ModrigUtils::PathFromString([filter description]));
     NSArray* chosen = [[mSelectedFiles copy] autorelease];
     const bool chosenInHistory = [self historyIsChosen];
-    ModrigPlatform::FilterPanelAnew(mOpenPanel, [[NSBundle bundleForClass:[self class]] bundleURL]);
+    [self filterPanelAgain];
     if (!ModrigUtils::PanelSelectionCounts(ModrigUtils::PanelChange::kFileType, [mSelectedFiles count] == 0,
                                            chosenInHistory))
         [mSelectedFiles setArray:chosen];
@@ -127,8 +135,8 @@
 - (void)panelSelectionDidChange:(id)panel
 {
     [mSelectedFiles removeAllObjects];
-    [mSelectedFiles addObjectsFromArray:ModrigUtils::RowsFromPaths(ModrigUtils::PathsFromStrings(
-                                            ModrigPlatform::SelectedPaths(panel)))];
+    NSArray* paths = [[panel URLs] valueForKey:@"path"];
+    [mSelectedFiles addObjectsFromArray:ModrigUtils::RowsFromPaths(ModrigUtils::PathsFromStrings(paths))];
 }
 
 - (void)openPanelOK:(id)sender
@@ -143,7 +151,7 @@
     NSString* path = [[mSelectedFiles objectAtIndex:0] filePathName];
     if (![self isTesselFolder:path])
         return NO;
-    ModrigPlatform::ShowFolder(mOpenPanel, path);
+    [mOpenPanel setDirectory:path];
     return YES;
 }
 

@@ -1,5 +1,7 @@
 #import "ui/ModrigController.h"
 
+#include <tesselui/tsuifilepanel.h>
+
 #import "ui/ModrigStartupSuiteBox.h"
 #import "ui/TsOCModrigUtil.h"
 
@@ -10,7 +12,6 @@
 #include "ui/Detaching.h"
 #include "ui/Settings.h"
 #include "ui/model/LoadBatch.h"
-#include "ui/platform/Platform.h"
 
 @implementation ModrigController
 
@@ -59,7 +60,7 @@
     // At once, and not only when all else is set up: closing stores them, after a failure too.
     [self readSettings];
     ModrigUtils::PopulateLoadedApps();
-    NSOpenPanel* panel = ModrigPlatform::MakeOpenPanel();
+    NSOpenPanel* panel = tsuiMakeFilePanel();
     @try
     {
         [self setupOpenPanel:panel];

@@ -75,6 +75,7 @@ bool Host::start()
     if (anotherRuns() || !prepareProfileFolder())
         return false;
     services().commandLine = &mCommandLine;
+    services().endRequest = &mEndRequest;
     mParts = std::make_unique<Parts>();
     makeStore();
     makeApplicationParts();
@@ -144,7 +145,7 @@ void Host::makeUserParts()
 void Host::addCommands()
 {
     CommandStack& commands = mParts->commands;
-    addSessionCommands(commands, {[this] { mEnding = true; },
+    addSessionCommands(commands, {[this] { mEndRequest.make(); },
                                   [this](const std::filesystem::path& script)
                                   {
                                       return runScript(script);
@@ -209,6 +210,12 @@ void Host::interrupt() noexcept
 {
     if (LispInterpreter* lisp = mInterruptible)
         lisp->interrupt();
+}
+
+void Host::requestEnd() noexcept
+{
+    mEndRequest.make();
+    interrupt();
 }
 
 std::vector<std::wstring> Host::commandNames() const

@@ -17,6 +17,7 @@
 
 #include "host/app/Export.h"
 #include "host/console/CommandLine.h"
+#include "host/console/EndRequest.h"
 #include "host/console/LineRunner.h"
 
 namespace tessel
@@ -51,8 +52,12 @@ public:
     // Unloads every application, stores the registry, and takes the parts down.
     void end();
 
-    bool isEnding() const override { return mEnding; }
+    bool isEnding() const override { return mEndRequest.isMade(); }
     void interrupt() noexcept override;
+    void requestEnd() noexcept override;
+
+    // Can be read from when the session is to end (see EndRequest).
+    int endRequest() const { return mEndRequest.descriptor(); }
 
     CommandLine& commandLine() { return mCommandLine; }
 
@@ -74,7 +79,7 @@ private:
     CommandLine mCommandLine;
     std::unique_ptr<Parts> mParts;
     std::atomic<LispInterpreter*> mInterruptible = nullptr; // read by a signal handler
-    bool mEnding = false;
+    EndRequest mEndRequest;
     int mScriptDepth = 0;
 };
 } // namespace tessel

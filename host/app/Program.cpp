@@ -4,7 +4,7 @@
 #include <csignal>
 #include <cstdio>
 #include <cstring>
-#include <iostream>
+#include <istream>
 #include <string_view>
 
 #include <langinfo.h>
@@ -15,8 +15,10 @@
 #include "host/app/Options.h"
 #include "host/app/Version.h"
 #include "host/console/Console.h"
+#include "host/console/EndSignals.h"
 #include "host/console/InterruptKey.h"
 #include "host/console/LineEditor.h"
+#include "host/console/PipedInput.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -25,6 +27,7 @@ namespace
 {
 constexpr int kAllWell = 0;
 constexpr int kSomethingFailed = 1;
+constexpr int kEndedBySignal = 128; // and the signal's number, as shells have it
 
 constexpr char kHistoryFile[] = "history";
 
@@ -63,10 +66,10 @@ int runBatch(Host& host, const Options& options)
     return allWell ? kAllWell : kSomethingFailed;
 }
 
-int converse(Host& host, const std::filesystem::path& profileFolder, const InterruptKey& interruptKey)
+int converse(Host& host, const std::filesystem::path& profileFolder, InputSource source)
 {
     LineEditor editor(
-        profileFolder / kHistoryFile, [&host] { return host.commandNames(); }, interruptKey.wakeUp());
+        profileFolder / kHistoryFile, [&host] { return host.commandNames(); }, source);
     Console(host.commandLine(), host).converse(editor);
     return kAllWell;
 }
@@ -75,9 +78,12 @@ int runSession(Host& host, const Options& options, const InterruptKey& interrupt
 {
     if (options.isBatch())
         return runBatch(host, options);
+    const InputSource source(interruptKey.wakeUp(), host.endRequest());
     if (isatty(STDIN_FILENO))
-        return converse(host, options.profileFolder, interruptKey);
-    return Console(host.commandLine(), host).runLines(std::cin) ? kAllWell : kSomethingFailed;
+        return converse(host, options.profileFolder, source);
+    PipedInput bytes(source);
+    std::istream lines(&bytes);
+    return Console(host.commandLine(), host).runLines(lines) ? kAllWell : kSomethingFailed;
 }
 
 int runHost(Options options)
@@ -86,12 +92,13 @@ int runHost(Options options)
         options.profileFolder = personalFolder();
     Host host({options.profileFolder, options.safe, writeToStandardOutput});
     const InterruptKey interruptKey(host); // applications that load at start may run away too
+    const EndSignals endSignals(host);
     greet(host.commandLine());
     if (!host.start())
         return kSomethingFailed;
     const int status = runSession(host, options, interruptKey);
     host.end();
-    return status;
+    return EndSignals::received() == 0 ? status : kEndedBySignal + EndSignals::received();
 }
 } // namespace
 

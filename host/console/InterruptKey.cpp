@@ -39,7 +39,6 @@ InterruptKey::InterruptKey(LineRunner& runner)
             makeIndependent(end);
     mReadEnd = ends[0];
     theWriteEnd = ends[1];
-    // Without SA_RESTART: a script that is read from a terminal's pipe is to wake up, too.
     struct sigaction action
     {
     };

@@ -27,7 +27,7 @@ void showCandidates(const std::vector<std::wstring>& candidates)
 
 struct LineEditor::Terminal
 {
-    Terminal(const std::filesystem::path& file, Names names, int interruptKey);
+    Terminal(const std::filesystem::path& file, Names names, InputSource source);
     ~Terminal();
     Terminal(const Terminal&) = delete;
     Terminal& operator=(const Terminal&) = delete;
@@ -53,8 +53,8 @@ struct LineEditor::Terminal
     HistEventW event{};
 };
 
-LineEditor::Terminal::Terminal(const std::filesystem::path& file, Names names, int interruptKey)
-    : historyFile(file.string()), commandNames(std::move(names)), input(interruptKey),
+LineEditor::Terminal::Terminal(const std::filesystem::path& file, Names names, InputSource source)
+    : historyFile(file.string()), commandNames(std::move(names)), input(source),
       editLine(el_init("Tessel", stdin, stdout, stderr)), history(history_winit())
 {
     history_w(history, &event, H_SETSIZE, kHistoryLines);
@@ -116,8 +116,8 @@ void LineEditor::Terminal::remember(const wchar_t* line)
         history_w(history, &event, H_ENTER, line);
 }
 
-LineEditor::LineEditor(const std::filesystem::path& historyFile, Names names, int interruptKey)
-    : mTerminal(std::make_unique<Terminal>(historyFile, std::move(names), interruptKey))
+LineEditor::LineEditor(const std::filesystem::path& historyFile, Names names, InputSource source)
+    : mTerminal(std::make_unique<Terminal>(historyFile, std::move(names), source))
 {
 }
 

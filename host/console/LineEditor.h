@@ -7,6 +7,8 @@
 #include <string>
 #include <vector>
 
+#include "host/console/InputSource.h"
+
 namespace tessel
 {
 class LineEditor
@@ -15,9 +17,8 @@ public:
     using Names = std::function<std::vector<std::wstring>()>;
 
     // Reads standard input and writes standard output. The history is read from the file, if there is one,
-    // and stored there at the end. `names`: what the Tab key completes. `interruptKey`: a descriptor that can
-    // be read from when Ctrl-C was pressed.
-    LineEditor(const std::filesystem::path& historyFile, Names names, int interruptKey);
+    // and stored there at the end. `names`: what the Tab key completes.
+    LineEditor(const std::filesystem::path& historyFile, Names names, InputSource source);
     ~LineEditor();
     LineEditor(const LineEditor&) = delete;
     LineEditor& operator=(const LineEditor&) = delete;
@@ -26,7 +27,7 @@ public:
     {
         kLine,
         kInterrupted, // Ctrl-C
-        kEnd          // Ctrl-D on an empty line, or the terminal has gone
+        kEnd          // Ctrl-D on an empty line, the terminal has gone, or the session is to end
     };
 
     // Waits for a line; `line` is set for kLine only, without its line break.

@@ -17,10 +17,12 @@ public:
     // False when it was unknown or failed; a sentence has then been said.
     virtual bool run(const std::wstring& input) = 0;
 
-    // Whether a command has asked for the end of the session.
+    // Whether the session is to end.
     virtual bool isEnding() const = 0;
 
-    // Stops the Lisp that is running, if any is. Called from a signal handler.
+    // Both are called from a signal handler. The first stops the Lisp that is running, if any is; the second
+    // ends the session as soon as what is running has come back.
     virtual void interrupt() noexcept = 0;
+    virtual void requestEnd() noexcept = 0;
 };
 } // namespace tessel

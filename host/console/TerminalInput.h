@@ -1,7 +1,7 @@
-// Characters from standard input, or the news that the interrupt key was pressed.
+// Characters from standard input, or the news that there is something else to do.
 #pragma once
 
-#include <optional>
+#include "host/console/InputSource.h"
 
 namespace tessel
 {
@@ -12,22 +12,20 @@ public:
     {
         kCharacter,
         kInterrupted,
-        kEnd
+        kEnd // of the input, or of the session
     };
 
-    // `wakeUp`: a non-blocking descriptor that can be read from when the key was pressed; -1 for none.
-    explicit TerminalInput(int wakeUp) : mWakeUp(wakeUp) {}
+    explicit TerminalInput(InputSource source) : mSource(source) {}
 
     // Waits for a character in the encoding of the locale; what is no character becomes U+FFFD.
     Outcome read(wchar_t& character);
 
     // Forgets what was pressed before now.
-    void forgetInterrupts();
+    void forgetInterrupts() const { mSource.forgetInterrupts(); }
 
 private:
-    Outcome waitForByte() const;
-    std::optional<char> readByte() const;
+    Outcome readByte(char& byte) const;
 
-    int mWakeUp;
+    InputSource mSource;
 };
 } // namespace tessel

@@ -38,6 +38,14 @@ std::wstring fullPathOf(const wchar_t* path)
     return failed ? full : toWide(folder.native()) + kSeparator + full;
 }
 
+// Where the path leads through all links; itself where nothing stands.
+std::wstring realPathOf(const std::wstring& path)
+{
+    std::error_code failed;
+    const auto real = std::filesystem::canonical(toUtf8(path), failed);
+    return failed ? path : toWide(real.native());
+}
+
 std::wstring nameIn(const std::wstring& path)
 {
     return path.substr(path.rfind(kSeparator) + 1);
@@ -61,16 +69,12 @@ std::wstring whyNotLoadable(const ModuleFile& file, const RegularFile& program)
     return std::wstring(whyNotMappable(program.size(), read));
 }
 
-std::unique_ptr<Module> open(const std::wstring& path, const ModuleFile& file, const FileIdentity& identity,
-                             bool resolveNow, std::wstring& whyNot)
+std::unique_ptr<Module> open(const ModuleFile& file, bool resolveNow, std::wstring& whyNot)
 {
     auto module = std::make_unique<Module>();
     module->library = ModuleLibrary::open(file, resolveNow, whyNot);
     if (!module->library)
         return nullptr;
-    module->path = path;
-    module->name = nameIn(path);
-    module->identity = identity;
     module->entryPoint = module->library->entryPoint();
     return module;
 }
@@ -106,13 +110,20 @@ bool DynamicLinker::load(const std::wstring& path, bool resolveNow, std::wstring
         return answerForKnown(*known, whyNot);
     const ModuleFile file = moduleFileAt(toUtf8(path));
     const RegularFile program(file.program);
-    if (const Module* known = program.isOpen() ? mModules.withIdentity(program.identity()) : nullptr)
-        return answerForKnown(*known, whyNot);
+    const std::wstring realPath = realPathOf(path);
+    if (const Module* loaded = known(realPath, program))
+        return answerForKnown(*loaded, whyNot);
     whyNot = whyNotLoadable(file, program);
     if (!whyNot.empty())
         return false;
-    auto opened = open(path, file, program.identity(), resolveNow, whyNot);
-    return opened && start(mModules.add(std::move(opened)), whyNot);
+    auto opened = open(file, resolveNow, whyNot);
+    if (!opened)
+        return false;
+    opened->path = path;
+    opened->realPath = realPath;
+    opened->name = nameIn(path);
+    opened->identity = program.identity();
+    return start(mModules.add(std::move(opened)), whyNot);
 }
 
 bool DynamicLinker::answerForKnown(const Module& module, std::wstring& whyNot) const
@@ -131,10 +142,8 @@ bool DynamicLinker::start(Module& module, std::wstring& whyNot)
         mModules.putInService(module);
         return true;
     }
-    services().commands->removeCommandsOf(module.path);
     // Why it was not loaded is what a person needs to know; whether it is still mapped matters to nobody.
-    module.library->close();
-    mModules.remove(module);
+    static_cast<void>(takeOut(module));
     return false;
 }
 
@@ -163,15 +172,21 @@ bool DynamicLinker::send(Module& module, unsigned message, std::wstring& whyNot)
 
 bool DynamicLinker::unloadModule(const wchar_t* path, bool sayWhyNot)
 {
+    const std::wstring fullPath = fullPathOf(path);
+    Module* module = find(path);
     std::wstring whyNot;
-    if (unload(find(path), whyNot))
-        return true;
-    if (sayWhyNot)
-        say(fullPathOf(path), L"is not unloaded: ", whyNot);
-    return false;
+    if (!isFreeToGo(module, whyNot) || !send(*module, TSRX_MSG_UNLOAD, whyNot))
+    {
+        if (sayWhyNot)
+            say(fullPath, L"is not unloaded: ", whyNot);
+        return false;
+    }
+    if (!takeOut(*module) && sayWhyNot)
+        say(fullPath, L"is out of service; ", L"its code stays in memory until the session ends");
+    return true;
 }
 
-bool DynamicLinker::unload(Module* module, std::wstring& whyNot)
+bool DynamicLinker::isFreeToGo(const Module* module, std::wstring& whyNot) const
 {
     if (!module || !module->inService)
         whyNot = L"it is not loaded";
@@ -179,14 +194,16 @@ bool DynamicLinker::unload(Module* module, std::wstring& whyNot)
         whyNot = L"it is locked";
     else if (services().callingApplication->isAtWork(module->path))
         whyNot = L"it is at work";
-    else if (send(*module, TSRX_MSG_UNLOAD, whyNot))
-    {
-        services().commands->removeCommandsOf(module->path);
-        if (!module->library->close())
-            whyNot = L"it is out of service, but the system keeps its library mapped";
-        mModules.remove(*module);
-    }
     return whyNot.empty();
+}
+
+// False when the system keeps the library mapped.
+bool DynamicLinker::takeOut(Module& module)
+{
+    services().commands->removeCommandsOf(module.path);
+    const bool closed = module.library->close();
+    mModules.remove(module);
+    return closed;
 }
 
 Module* DynamicLinker::find(const wchar_t* path) const
@@ -195,6 +212,13 @@ Module* DynamicLinker::find(const wchar_t* path) const
     if (Module* module = mModules.withPath(fullPath))
         return module;
     const RegularFile program(moduleFileAt(toUtf8(fullPath)).program);
+    return known(realPathOf(fullPath), program);
+}
+
+Module* DynamicLinker::known(const std::wstring& realPath, const RegularFile& program) const
+{
+    if (Module* module = mModules.withPath(realPath))
+        return module;
     return program.isOpen() ? mModules.withIdentity(program.identity()) : nullptr;
 }
 

@@ -2,11 +2,12 @@
 //
 // Which application it is, is decided by the file, not by how its path is spelled: a link to a loaded file is
 // loaded too. What a bundle maps is its program, so a bundle and the program inside it are the same
-// application.
+// application. A file that was replaced since it was loaded, as every build does, is told by where its path
+// and the loaded one lead.
 //
-// An application that has answered message 2 is out of service even if the system keeps its library mapped:
-// it has given everything back, so it is listed no more and its commands are gone. `unloadModule` then
-// answers false and says so, and a later load sends message 1 to the library that is still there.
+// An application that has answered message 2 is unloaded even if the system keeps its library mapped: it has
+// given everything back, so it is listed no more and its commands are gone. That its code stays in memory is
+// said, and a later load sends message 1 to the library that is still there.
 #pragma once
 
 #include <optional>
@@ -53,9 +54,11 @@ private:
     bool load(const std::wstring& path, bool resolveNow, std::wstring& whyNot);
     bool answerForKnown(const Module& module, std::wstring& whyNot) const;
     bool start(Module& module, std::wstring& whyNot);
-    bool unload(Module* module, std::wstring& whyNot);
+    bool isFreeToGo(const Module* module, std::wstring& whyNot) const;
+    bool takeOut(Module& module);
     bool send(Module& module, unsigned message, std::wstring& whyNot) const;
     Module* find(const wchar_t* path) const;
+    Module* known(const std::wstring& realPath, const RegularFile& program) const;
 
     LoadedModules mModules;
     bool mEnding = false;

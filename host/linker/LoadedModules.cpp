@@ -20,6 +20,7 @@ Module& LoadedModules::add(std::unique_ptr<Module> module)
     Module& added = *module;
     mByHandle[&added] = std::move(module);
     mByPath[added.path] = &added;
+    mByPath[added.realPath] = &added;
     mByIdentity[added.identity] = &added;
     return added;
 }
@@ -44,6 +45,7 @@ void LoadedModules::remove(Module& module)
         std::erase(mInService, &module);
     }
     mByPath.erase(module.path);
+    mByPath.erase(module.realPath);
     mByIdentity.erase(module.identity);
     mByHandle.erase(&module);
 }

@@ -18,8 +18,9 @@ namespace tessel
 // One application. Its address is the handle that its entry point receives.
 struct Module
 {
-    std::wstring path; // full, as it was first asked for
-    std::wstring name; // the file name with its extension
+    std::wstring path;     // full, as it was first asked for
+    std::wstring realPath; // where that led through all links
+    std::wstring name;     // the file name with its extension
     FileIdentity identity;
     std::unique_ptr<ModuleLibrary> library;
     TsRxEntryPoint entryPoint = nullptr;
@@ -37,7 +38,7 @@ public:
     // Forgets it; the reference ends here.
     void remove(Module& module);
 
-    // Each answers null when there is none.
+    // Each answers null when there is none. A path is the one asked for or the real one.
     Module* withPath(const std::wstring& path) const;
     Module* withIdentity(const FileIdentity& identity) const;
     Module* withHandle(const void* handle) const;

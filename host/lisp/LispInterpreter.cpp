@@ -6,6 +6,7 @@
 
 #include "host/Services.h"
 #include "host/console/CommandLine.h"
+#include "host/console/EndRequest.h"
 #include "host/documents/Document.h"
 #include "host/lisp/LispMachine.h"
 
@@ -25,6 +26,11 @@ LispSurroundings surroundings(const LispInterpreter::Options& options)
                 if (services().document)
                     services().document->add(path);
             }};
+}
+
+bool isToEnd()
+{
+    return services().endRequest && services().endRequest->isMade();
 }
 } // namespace
 
@@ -52,7 +58,7 @@ bool LispInterpreter::runQueue()
         return true;
     mRunningQueue = true;
     bool allRan = true;
-    while (!mQueue.empty())
+    while (!mQueue.empty() && !isToEnd())
     {
         const std::wstring expression = std::move(mQueue.front());
         mQueue.pop_front();

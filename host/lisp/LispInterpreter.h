@@ -44,8 +44,8 @@ public:
     void queue(std::wstring expression);
 
     // Evaluates what is queued, in order, and what is queued meanwhile after that. An error is said in one
-    // line, and does not keep the next expression from running. Called within itself it does nothing. False
-    // when an expression failed.
+    // line, and does not keep the next expression from running. Called within itself it does nothing, and
+    // when the session is to end nothing more. False when an expression failed.
     bool runQueue();
 
     // Whether nothing is queued and nothing runs.

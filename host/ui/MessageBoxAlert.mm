@@ -8,6 +8,8 @@
 
 #include <unistd.h>
 
+#include "host/ui/SessionEnd.h"
+
 namespace
 {
 constexpr int kNotShown = 0;
@@ -34,7 +36,7 @@ int tsuiShowMessageBox(const wchar_t* text, unsigned style, void* parent)
     (void)parent; // the box is modal for the whole program, over whatever window is in front
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
     int answer = kNotShown;
-    if (somebodyIsThere() && tsuiHasDisplay() && tsuiPrepareWindows())
+    if (somebodyIsThere() && tsuiHasDisplay() && tsuiPrepareWindows() && !tessel::sessionIsToEnd())
     {
         runAlert(text, style);
         answer = IDOK;

@@ -3,8 +3,7 @@
 #import <tesselui/TsOCFileFilter.h>
 
 #include <tesselui/tsuieach.h>
-
-#include "host/ui/platform/Windowing.h"
+#include <tesselui/tsuifilepanel.h>
 
 namespace
 {
@@ -72,7 +71,7 @@ NSTextField* makeLabel(NSString* text)
 - (void)onChoice:(id)sender
 {
     mChosen = static_cast<NSUInteger>([sender indexOfSelectedItem]);
-    tessel::windowing::filterAnew(mPanel);
+    [mPanel validateVisibleColumns];
 }
 
 - (BOOL)isFolder:(NSString*)path
@@ -138,12 +137,14 @@ NSTextField* makeLabel(NSString* text)
     if (mTitle)
         [panel setTitle:mTitle];
     [panel setAllowsMultipleSelection:mAllowsMultipleSelection];
-    tessel::windowing::showFilesOf(panel, mInitialPath);
+    [panel setCanChooseDirectories:NO];
+    if (mInitialPath)
+        [panel setDirectory:mInitialPath];
 }
 
 - (NSInteger)runModal
 {
-    NSOpenPanel* panel = tessel::windowing::makeOpenPanel();
+    NSOpenPanel* panel = tsuiMakeFilePanel();
     [self prepare:panel];
     TsOCFileTypeChooser* chooser = [[[TsOCFileTypeChooser alloc] initWithPanel:panel
                                                                        filters:mFileFilters] autorelease];
@@ -153,7 +154,7 @@ NSTextField* makeLabel(NSString* text)
     [panel recalculateKeyViewLoop]; // the choice of the file type is one of the stops of the Tab key
     const bool chosen = [panel runModal] == NSOKButton;
     [mSelectedPathes release];
-    mSelectedPathes = [(chosen ? tessel::windowing::chosenPaths(panel) : [NSArray array]) copy];
+    mSelectedPathes = [(chosen ? [[panel URLs] valueForKey:@"path"] : [NSArray array]) copy];
     [panel setDelegate:nil];
     [panel setAccessoryView:nil];
     return chosen ? NSOKButton : 0;

@@ -3,6 +3,8 @@
 #include <tessel/tsformat.h>
 #include <tesselui/tsuidisplay.h>
 
+#include "host/ui/KeptSignals.h"
+#include "host/ui/SessionEnd.h"
 #include "host/ui/platform/Windowing.h"
 
 namespace
@@ -12,6 +14,7 @@ bool gPrepared = false;
 void prepare()
 {
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    const tessel::KeptSignals signals; // the display's backend would take Ctrl-C and the wish to end
     tessel::windowing::chooseLook();
     [NSApplication sharedApplication];
     tessel::windowing::completeLook();
@@ -20,6 +23,7 @@ void prepare()
     tessel::windowing::letNewWindowsHaveTheKeyboard();
     // The host's own loop waits for the terminal; these two are what the toolkit's would have done first.
     [NSApp finishLaunching];
+    tessel::closeWindowsWhenTheSessionEnds();
     [pool drain];
 }
 } // namespace

@@ -27,8 +27,10 @@ public:
     virtual bool loadModule(const wchar_t* path, bool sayWhyNot, bool resolveNow) = 0;
 
     // Sends message 2 to the application loaded from the path and takes it out of the process. False, with a
-    // line on the command line when `sayWhyNot`, if it is not loaded, is locked, answers an error, or if the
-    // system keeps the library mapped.
+    // line on the command line when `sayWhyNot`, if it is not loaded, is locked, or answers an error. Where
+    // the system keeps the library mapped (one that brings Objective-C classes, for instance), the
+    // application is out of service and its commands are gone, which is true as well: the line then says that
+    // its code stays in memory. A later load sends message 1 to that code, whatever the file holds by then.
     virtual bool unloadModule(const wchar_t* path, bool sayWhyNot) = 0;
 
     // Whether the application loaded from the path may not be unloaded. False for a path that is not loaded.

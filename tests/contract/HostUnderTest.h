@@ -19,7 +19,8 @@ enum class ContractModule
     kRefusesToUnload,
     kLocksItself,
     kRegistersItself,
-    kTellsItsName
+    kTellsItsName,
+    kStaysMapped // does what kTellsItsName does; the system never takes its library out of the process
 };
 
 class HostUnderTest

@@ -106,6 +106,47 @@ TEST_F(LinkerContract, SendsMessageTwoToWhatItUnloads)
     EXPECT_EQ(seenTimes(L"<message 1>"), 2u);
 }
 
+TEST_F(LinkerContract, TakesWhatStaysMappedOutOfServiceAndSaysSo)
+{
+    const std::wstring path = host->makeModule(L"tool.zmb", ContractModule::kStaysMapped);
+    EXPECT_TRUE(load(path));
+    const std::size_t before = host->seen().size();
+    EXPECT_TRUE(unload(path));
+    const std::wstring told = host->seen().substr(before);
+    EXPECT_TRUE(told.starts_with(L"<message 2 to " + path + L">\n")) << told;
+    EXPECT_EQ(countOf(told, L"\n"), 2u) << told;
+    EXPECT_EQ(countOf(told, path), 2u) << told;
+    EXPECT_TRUE(contains(told, L"memory")) << told;
+    EXPECT_THAT(loadedNames(), IsEmpty());
+    EXPECT_EQ(pathOf(L"tool.zmb"), L"untouched");
+    EXPECT_FALSE(host->type(L"CONTRACTNAME"));
+    EXPECT_FALSE(linker->unloadModule(path.c_str(), false));
+}
+
+TEST_F(LinkerContract, SaysNothingOfWhatStaysMappedWhenNotAskedTo)
+{
+    const std::wstring path = host->makeModule(L"tool.zmb", ContractModule::kStaysMapped);
+    EXPECT_TRUE(load(path));
+    const std::size_t before = host->seen().size();
+    EXPECT_TRUE(linker->unloadModule(path.c_str(), false));
+    EXPECT_EQ(host->seen().substr(before), L"<message 2 to " + path + L">\n");
+}
+
+TEST_F(LinkerContract, PutsWhatStayedMappedBackIntoService)
+{
+    const std::wstring path = host->makeModule(L"tool.zmb", ContractModule::kStaysMapped);
+    EXPECT_TRUE(load(path));
+    EXPECT_TRUE(unload(path));
+    EXPECT_TRUE(load(path));
+    EXPECT_EQ(seenTimes(L"<message 1 to " + path + L">"), 2u);
+    EXPECT_THAT(loadedNames(), ElementsAre(L"tool.zmb"));
+    EXPECT_EQ(pathOf(L"tool.zmb"), path);
+    EXPECT_TRUE(host->type(L"CONTRACTNAME"));
+    EXPECT_EQ(seenTimes(L"<command of " + path + L">"), 1u);
+    EXPECT_TRUE(unload(path));
+    EXPECT_EQ(seenTimes(L"<message 2 to " + path + L">"), 2u);
+}
+
 TEST_F(LinkerContract, DoesNotUnloadWhatIsNotLoaded)
 {
     const std::wstring path = host->makeModule(L"tool.zmb", ContractModule::kPlain);

@@ -22,6 +22,7 @@ RecordingLinker::EntryPoint entryPoint(ContractModule behaviour)
     case ContractModule::kRegistersItself:
         return registersItself;
     case ContractModule::kTellsItsName:
+    case ContractModule::kStaysMapped:
         return tellsItsName;
     default:
         return plain;
@@ -69,6 +70,8 @@ public:
     std::wstring makeModule(const std::wstring& name, ContractModule behaviour) override
     {
         recordingHost().linker.setEntryPoint(kFolder + name, entryPoint(behaviour));
+        if (behaviour == ContractModule::kStaysMapped)
+            recordingHost().linker.keepMapped(kFolder + name);
         return kFolder + name;
     }
 

@@ -37,6 +37,8 @@ const char* libraryOf(ContractModule behaviour)
         return CONTRACT_MODULE_registersItself;
     case ContractModule::kTellsItsName:
         return CONTRACT_MODULE_tellsItsName;
+    case ContractModule::kStaysMapped:
+        return CONTRACT_MODULE_staysMapped;
     default:
         return CONTRACT_MODULE_plain;
     }

@@ -44,15 +44,33 @@ TEST(EntryPointOfModrig, StartsAgainAfterTheHostHasUnloadedIt)
     storeSuite(session, {fixtureModule("Good.zmb"), lispFixture("good.lsp")});
     const auto result = session.run({"UNLOAD Modrig.bundle", "MODRIG", "LOAD " + modrigBundle(), "MODRIG"});
     const std::string loadedLisp = std::string("good.lsp: loaded\n") + kLispReady;
-    // A library of Objective-C classes cannot be taken out of a process, and the host says so.
-    EXPECT_EQ(result.output,
-              kBanner + ("Good.zmb: message 1\n" + loadedLisp) + "Command: UNLOAD Modrig.bundle\n" +
-                  "The application \"" + modrigBundle() +
-                  "\" is not unloaded: it is out of service, but the system keeps its library mapped.\n" +
-                  "Command: MODRIG\nTessel cannot open a window: there is no display.\n" + loadedLisp +
-                  "Command: LOAD " + modrigBundle() + "\n" + modrigBundle() + " is loaded.\n" +
-                  "Command: MODRIG\nTessel cannot open a window: there is no display.\n" +
-                  "Good.zmb: message 2\n");
+    // The code of Objective-C classes cannot be taken out of a process, and the host says so.
+    EXPECT_EQ(
+        result.output,
+        kBanner + ("Good.zmb: message 1\n" + loadedLisp) + "Command: UNLOAD Modrig.bundle\n" +
+            "The application \"" + modrigBundle() +
+            "\" is out of service; its code stays in memory until the session ends.\n" + modrigBundle() +
+            " is unloaded.\nCommand: MODRIG\nTessel cannot open a window: there is no display.\n" +
+            loadedLisp + "Command: LOAD " + modrigBundle() + "\n" + modrigBundle() + " is loaded.\n" +
+            "Command: MODRIG\nTessel cannot open a window: there is no display.\n" + "Good.zmb: message 2\n");
+}
+
+// Its code is still in memory then: the command must be gone all the same.
+TEST(EntryPointOfModrig, HasNoCommandBetweenAnUnloadAndALoad)
+{
+    const HostSession session;
+    const auto result = session.run(
+        {"UNLOAD Modrig.bundle", "APPS", "MODRIG", "_MODRIG", "LOAD " + modrigBundle(), "APPS", "_MODRIG"});
+    EXPECT_EQ(
+        result.output,
+        kBanner + std::string("Command: UNLOAD Modrig.bundle\nThe application \"") + modrigBundle() +
+            "\" is out of service; its code stays in memory until the session ends.\n" + modrigBundle() +
+            " is unloaded.\nCommand: APPS\nNo application is loaded.\n"
+            "Command: MODRIG\nUnknown command \"MODRIG\". Type HELP for the list of commands.\n"
+            "Command: _MODRIG\nUnknown command \"_MODRIG\". Type HELP for the list of commands.\n"
+            "Command: LOAD " +
+            modrigBundle() + "\n" + modrigBundle() + " is loaded.\nCommand: APPS\n" + listed(modrigBundle()) +
+            "Command: _MODRIG\nTessel cannot open a window: there is no display.\n");
 }
 
 TEST(EntryPointOfModrig, IgnoresMessagesThatItDoesNotKnow)

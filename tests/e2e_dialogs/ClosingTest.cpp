@@ -27,6 +27,30 @@ TEST_F(DialogClosing, ByTheWindowsCloseButtonLeavesAHostThatGoesOn)
     EXPECT_THAT(end(), HasSubstr("Command: VERSION\nTessel R21"));
 }
 
+TEST_F(DialogClosing, LeavesAModuleThatCanBeUnloadedAndLoadedAgain)
+{
+    const std::string first = writeLisp("a.lsp");
+    setSetting("SaveHistory", "1");
+    open();
+    click(places::file(0));
+    click(places::kLoad);
+    EXPECT_TRUE(prints(wasLoaded("a.lsp")));
+    press("Escape");
+    EXPECT_TRUE(mScreen.waitUntilGone(kDialog));
+    mHost->type("UNLOAD Modrig.bundle");
+    EXPECT_TRUE(prints("Modrig.bundle is unloaded."));
+    mHost->type(std::string("LOAD ") + MODRIG_BUNDLE);
+    EXPECT_TRUE(prints("Modrig.bundle is loaded."));
+    openAgain();
+    click(places::kHistoryTab);
+    mScreen.doubleClick(mDialog, places::tableRow(0));
+    EXPECT_TRUE(comesTrue(
+        [&] { return mHost->output().rfind(wasLoaded("a.lsp")) > mHost->output().find("is unloaded."); }));
+    shoot("loaded-again");
+    closeAndEnd();
+    EXPECT_EQ(stored("History"), "NumHistory = 1\n1History = " + first + "\n");
+}
+
 TEST_F(DialogClosing, RemembersTheTabAndTheCheckBox)
 {
     const std::string first = writeLisp("a.lsp");

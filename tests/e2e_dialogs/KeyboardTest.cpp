@@ -5,18 +5,16 @@ using testing::HasSubstr;
 
 namespace
 {
-// How often Tab is pressed to get to a control from the name field, where the keyboard is when the dialog
-// opens. Between Close and the file types it stops at the browser and at its columns. What is disabled is
-// left out.
-constexpr int kTabsToHelp = 1;
-constexpr int kTabsToClose = 2;
-constexpr int kTabsToColumns = 4;
-constexpr int kTabsToAddToHistory = 6;
-constexpr int kTabsToTable = 8;
-constexpr int kTabsToContents = 9; // with nothing selected in the table
+// How often Tab is pressed to get to a control from the list of files, where the keyboard is when the dialog
+// opens. On the way are the name field and the switch for hidden files. What is disabled is left out.
+constexpr int kTabsToAddToHistory = 4;
+constexpr int kTabsToLoad = 5;
+constexpr int kTabsToTable = 6;
+constexpr int kTabsToContents = 7; // with nothing selected in the table
+constexpr int kTabsToHelp = 8;
+constexpr int kTabsToClose = 9;
 
-// From the columns to Load, and from the table to what is under it when a row is selected.
-constexpr int kTabsFromColumnsToLoad = 3;
+// From the table to what is under it when a row is selected.
 constexpr int kTabsToFirstButton = 1; // Unload, or Load from the History
 constexpr int kTabsToAddToStartupSuite = 2;
 constexpr int kTabsToRemove = 3;
@@ -24,7 +22,6 @@ constexpr int kTabsToRemove = 3;
 // In the Startup Suite's window.
 constexpr int kTabsToSuiteHelp = 2;
 constexpr int kTabsToSuiteClose = 3;
-constexpr int kTabsToBrowserOfAddPanel = 6;
 } // namespace
 
 class DialogKeyboard : public DialogTest
@@ -100,10 +97,8 @@ TEST_F(DialogKeyboard, LoadsAFileThatTheArrowKeysChose)
     writeLisp("a.lsp");
     writeLisp("b.lsp");
     open();
-    press("Tab", kTabsToColumns);
-    press("Right"); // from the folder to its first file
-    press("Down");
-    pressAt(kTabsFromColumnsToLoad, "load");
+    press("Down", 2);
+    pressAt(kTabsToLoad, "load");
     EXPECT_TRUE(prints(wasLoaded("b.lsp")));
     shoot("loaded");
     closeAndEnd();
@@ -190,10 +185,8 @@ TEST_F(DialogKeyboard, AddsToTheStartupSuiteWithInsert)
     const std::string panel = mScreen.waitForWindow(kAddPanel);
     ASSERT_FALSE(panel.empty());
     ASSERT_TRUE(mScreen.waitUntilActive(panel));
-    mScreen.text(file); // takes the panel to the folder
-    press("Tab", kTabsToBrowserOfAddPanel);
-    press("Right"); // from the folder to its first file
-    shoot("selected");
+    mScreen.text(file);
+    shoot("typed");
     press("Return");
     EXPECT_TRUE(mScreen.waitUntilGone(kAddPanel));
     EXPECT_TRUE(prints(wasLoaded("a.lsp")));

@@ -67,11 +67,22 @@ void Program::closeInput()
     mInput = -1;
 }
 
+void Program::signal(int number) const
+{
+    kill(mProcess, number);
+}
+
+std::optional<int> Program::waitForEnd()
+{
+    int status = 0;
+    if (!comesTrue([&] { return waitpid(mProcess, &status, WNOHANG) == mProcess; }))
+        return std::nullopt;
+    mProcess = -1;
+    return WIFEXITED(status) ? WEXITSTATUS(status) : -WTERMSIG(status);
+}
+
 bool Program::endsByItself()
 {
     closeInput();
-    const bool ended = comesTrue([this] { return waitpid(mProcess, nullptr, WNOHANG) == mProcess; });
-    if (ended)
-        mProcess = -1;
-    return ended;
+    return waitForEnd().has_value();
 }

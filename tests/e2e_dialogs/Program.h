@@ -2,6 +2,7 @@
 #pragma once
 
 #include <filesystem>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -23,6 +24,13 @@ public:
 
     // What it has printed up to now.
     std::string output() const;
+
+    // Sends it a signal.
+    void signal(int number) const;
+
+    // Waits until it ends, with its input still open; its exit status (of a program that a signal ended:
+    // minus the signal's number), or nothing when it has not ended after the time limit.
+    std::optional<int> waitForEnd();
 
     // Lets it read the end of its input and waits until it ends; false when it has not after the time limit.
     bool endsByItself();

@@ -96,6 +96,11 @@ void Screen::click(const std::string& window, Place place) const
     run("xdotool" + moveTo(window, place) + kPress);
 }
 
+void Screen::press(const std::string& window, Place place) const
+{
+    run("xdotool" + moveTo(window, place) + "mousedown 1 sleep 0.4");
+}
+
 void Screen::clickHolding(const std::string& key, const std::string& window, Place place) const
 {
     run("xdotool keydown " + key + moveTo(window, place) + kPress + "keyup " + key);

@@ -33,6 +33,8 @@ public:
 
     // Presses and releases the mouse button, slowly enough for the toolkit.
     void click(const std::string& window, Place place) const;
+    // Presses the button and keeps it down: a menu stays open.
+    void press(const std::string& window, Place place) const;
     void clickHolding(const std::string& key, const std::string& window, Place place) const;
     void doubleClick(const std::string& window, Place place) const;
     // Presses at one place and releases at another, with time for the drag to be noticed on the way.

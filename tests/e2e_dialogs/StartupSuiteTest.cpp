@@ -44,8 +44,9 @@ TEST_F(DialogStartupSuite, TakesAFileThatTheNextStartLoads)
     const std::string panel = mScreen.waitForWindow(kAddPanel);
     ASSERT_FALSE(panel.empty());
     ASSERT_TRUE(mScreen.waitUntilActive(panel));
-    mScreen.text(file); // takes the panel to the folder
-    mScreen.click(panel, places::kFirstFileToAdd);
+    mScreen.text(files().string());
+    mScreen.key("Return"); // goes to the folder
+    mScreen.click(panel, places::file(0));
     shoot("selected");
     mScreen.key("Return");
     EXPECT_TRUE(mScreen.waitUntilGone(kAddPanel));

@@ -31,6 +31,7 @@ public:
     }
     bool isEnding() const override { return mEnding; }
     void interrupt() noexcept override {}
+    void requestEnd() noexcept override {}
 
     std::vector<std::wstring> inputs;
 

@@ -1,12 +1,31 @@
 #include "tests/host_modules/HostWithModules.h"
 
 #include <algorithm>
+#include <fstream>
 #include <iterator>
+#include <vector>
 
 #include <tessel/tsed.h>
 
 class Unloading : public HostWithModules
 {
+protected:
+    // Where the file is mapped: the lines that the system has about it.
+    static std::vector<std::string> mappingsOf(const std::filesystem::path& file)
+    {
+        std::ifstream maps("/proc/self/maps");
+        std::vector<std::string> lines;
+        for (std::string line; std::getline(maps, line);)
+            if (line.ends_with(file.native()))
+                lines.push_back(line);
+        return lines;
+    }
+
+    static std::string staysInMemory(const std::filesystem::path& path)
+    {
+        return "The application \"" + path.native() +
+               "\" is out of service; its code stays in memory until the session ends.\n";
+    }
 };
 
 TEST_F(Unloading, SendsMessage2AndTakesTheLibraryOut)
@@ -23,13 +42,87 @@ TEST_F(Unloading, SendsMessage2AndTakesTheLibraryOut)
     EXPECT_EQ(names(), L"");
 }
 
-TEST_F(Unloading, FindsTheApplicationThroughALink)
+// Two paths of one application, whichever of them it was loaded by.
+class UnloadingThroughLinks : public Unloading
 {
-    const auto path = fixture("Good.zmb");
-    std::filesystem::create_symlink(path, mFolder / "link.zmb");
-    load(path);
-    EXPECT_TRUE(unload(mFolder / "link.zmb"));
-    EXPECT_EQ(names(), L"");
+protected:
+    static std::wstring wide(const std::filesystem::path& path) { return tessel::toWide(path.native()); }
+
+    // Copies the fixture, with a link to it, and loads it by one of the two.
+    void loadLinked(const std::string& name, bool byLink)
+    {
+        real = fixture(name, "real/" + name);
+        link = mFolder / ("link" + real.extension().native());
+        std::filesystem::create_symlink(real, link);
+        EXPECT_TRUE(load(byLink ? link : real));
+        output();
+    }
+
+    // As every build does: another file at the same path.
+    void replace() const
+    {
+        const auto next = mFolder / "next";
+        std::filesystem::copy_file(real, next);
+        std::filesystem::rename(next, real);
+    }
+
+    void expectKnownBy(const std::filesystem::path& path)
+    {
+        EXPECT_TRUE(mLinker.isModuleLoaded(wide(path).c_str()));
+        EXPECT_TRUE(mLinker.isModuleLocked(wide(path).c_str()));
+        EXPECT_FALSE(unload(path));
+        EXPECT_EQ(output(), notUnloaded(path, "it is locked"));
+        EXPECT_TRUE(load(path)) << "a second load";
+        EXPECT_EQ(output(), "");
+    }
+
+    std::filesystem::path real;
+    std::filesystem::path link;
+};
+
+TEST_F(UnloadingThroughLinks, AnswersForEitherPath)
+{
+    for (const bool byLink : {false, true})
+    {
+        loadLinked("LocksItself.zmb", byLink);
+        expectKnownBy(real);
+        expectKnownBy(link);
+        mCommands.run(L"UNLOCK");
+        EXPECT_FALSE(mLinker.isModuleLocked(wide(byLink ? real : link).c_str()));
+        EXPECT_TRUE(unload(byLink ? real : link));
+        EXPECT_EQ(names(), L"");
+        std::filesystem::remove(link);
+        std::filesystem::remove(real);
+    }
+}
+
+TEST_F(UnloadingThroughLinks, AnswersForEitherPathOfABundle)
+{
+    for (const bool byLink : {false, true})
+    {
+        loadLinked("Good.bundle", byLink);
+        EXPECT_TRUE(mLinker.isModuleLoaded(wide(byLink ? real : link).c_str()));
+        EXPECT_TRUE(unload(byLink ? real : link));
+        EXPECT_EQ(names(), L"");
+        std::filesystem::remove(link);
+        std::filesystem::remove_all(real);
+    }
+}
+
+TEST_F(UnloadingThroughLinks, AnswersForEitherPathOfAFileThatWasReplaced)
+{
+    for (const bool byLink : {false, true})
+    {
+        loadLinked("LocksItself.zmb", byLink);
+        replace();
+        expectKnownBy(real);
+        expectKnownBy(link);
+        mCommands.run(L"UNLOCK");
+        EXPECT_TRUE(unload(byLink ? real : link));
+        EXPECT_EQ(names(), L"");
+        std::filesystem::remove(link);
+        std::filesystem::remove(real);
+    }
 }
 
 TEST_F(Unloading, TakesTheCommandsAlong)
@@ -92,24 +185,67 @@ TEST_F(Unloading, KeepsAnApplicationWhileOneOfItsCommandsRuns)
     EXPECT_EQ(names(), L"Command.zmb ");
 }
 
-TEST_F(Unloading, AnswersTruthfullyWhenTheSystemKeepsTheLibraryMapped)
+TEST_F(Unloading, TakesOutOfServiceWhatTheSystemKeepsMapped)
 {
     for (const char* name : {"StaysMapped.zmb", "Classes.bundle"})
     {
         const auto path = fixture(name);
+        const auto program = name == std::string("StaysMapped.zmb") ? path : path / "Classes";
         load(path);
         output();
-        EXPECT_FALSE(unload(path));
-        EXPECT_EQ(output(),
-                  name + std::string(": message 2\n") +
-                      notUnloaded(path, "it is out of service, but the system keeps its library mapped"));
-        EXPECT_TRUE(isMapped(name == std::string("StaysMapped.zmb") ? path : path / "Classes"));
+        EXPECT_TRUE(unload(path));
+        EXPECT_EQ(output(), name + std::string(": message 2\n") + staysInMemory(path));
+        EXPECT_TRUE(isMapped(program));
         EXPECT_EQ(names(), L"");
-        EXPECT_TRUE(load(path));
-        EXPECT_EQ(output().find(name + std::string(": message 1\n")), 0U);
-        EXPECT_EQ(names(), tessel::toWide(name) + L" ");
-        unload(path);
+        EXPECT_FALSE(unload(path));
+        EXPECT_EQ(output(), notUnloaded(path, "it is not loaded"));
     }
+}
+
+TEST_F(Unloading, PutsBackIntoServiceWhatStayedMappedWithoutMappingItAgain)
+{
+    for (const char* name : {"StaysMapped.zmb", "Classes.bundle"})
+    {
+        const auto path = fixture(name);
+        const auto program = name == std::string("StaysMapped.zmb") ? path : path / "Classes";
+        load(path);
+        const std::string firstLoad = output();
+        const auto mappings = mappingsOf(program);
+        EXPECT_FALSE(mappings.empty());
+        EXPECT_TRUE(unload(path));
+        output();
+        EXPECT_TRUE(load(path));
+        EXPECT_EQ(output(), firstLoad);
+        EXPECT_EQ(names(), tessel::toWide(name) + L" ");
+        EXPECT_EQ(mappingsOf(program), mappings);
+        EXPECT_TRUE(unload(path));
+        output();
+    }
+}
+
+TEST_F(Unloading, SaysNothingOfWhatStaysMappedWhenNotAskedTo)
+{
+    const auto path = fixture("StaysMapped.zmb");
+    load(path);
+    output();
+    EXPECT_TRUE(mLinker.unloadModule(tessel::toWide(path.native()).c_str(), false));
+    EXPECT_EQ(output(), "StaysMapped.zmb: message 2\n");
+}
+
+TEST_F(Unloading, OfTwoModulesThatShareANameTakesTheOneAtThePath)
+{
+    const auto first = fixture("Command.zmb", "first/Command.zmb");
+    const auto second = fixture("Good.zmb", "second/Command.zmb");
+    EXPECT_TRUE(load(first));
+    EXPECT_TRUE(load(second));
+    EXPECT_TRUE(unload(second));
+    EXPECT_TRUE(mLinker.isModuleLoaded(tessel::toWide(first.native()).c_str()));
+    EXPECT_FALSE(mLinker.isModuleLoaded(tessel::toWide(second.native()).c_str()));
+    EXPECT_FALSE(mCommands.names().empty());
+    EXPECT_TRUE(load(second));
+    EXPECT_TRUE(unload(first));
+    EXPECT_TRUE(mCommands.names().empty());
+    EXPECT_TRUE(mLinker.isModuleLoaded(tessel::toWide(second.native()).c_str()));
 }
 
 TEST_F(Unloading, EndsEverythingInReverseOrderWhenTheHostEnds)

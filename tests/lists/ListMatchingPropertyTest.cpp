@@ -32,6 +32,7 @@ struct Parts
     std::wstring folder; // drive and directory
     std::wstring name;   // file name and extension
     std::wstring extension;
+    bool tooLong = false;
 };
 
 Parts PartsOf(const std::wstring& path)
@@ -40,8 +41,8 @@ Parts PartsOf(const std::wstring& path)
     wchar_t directory[1024] = {};
     wchar_t name[256] = {};
     wchar_t extension[256] = {};
-    _wsplitpath_s(path.c_str(), drive, 3, directory, 1024, name, 256, extension, 256);
-    return {std::wstring(drive) + directory, std::wstring(name) + extension, extension};
+    const int status = _wsplitpath_s(path.c_str(), drive, 3, directory, 1024, name, 256, extension, 256);
+    return {std::wstring(drive) + directory, std::wstring(name) + extension, extension, status != 0};
 }
 
 // From the head, entry by entry.
@@ -51,6 +52,12 @@ bool WalkFinds(const std::wstring& path, const Paths& list)
     for (const std::wstring& text : list)
     {
         const Parts entry = PartsOf(text);
+        if (entry.tooLong || target.tooLong)
+        {
+            if (SameText(text, path))
+                return true;
+            continue;
+        }
         const bool byNameAlone = SameText(entry.extension, L"bundle") || SameText(entry.extension, L".omp");
         if (SameText(entry.name, target.name) && (byNameAlone || SameText(entry.folder, target.folder)))
             return true;

@@ -72,15 +72,33 @@ TEST_F(ListMembership, ComparesNamesWithBlanksQuotesAndPerCentSignsLetterByLette
     EXPECT_FALSE(Found(L"/a/tool.lsp ", {L"/a/tool.lsp"}));
 }
 
-TEST_F(ListMembership, TakesTwoPathsThatAreTooLongToBeTakenApartForTheSame)
+TEST_F(ListMembership, TakesAPathThatIsTooLongToBeTakenApartForNothingButItself)
 {
     const std::wstring one = LongPath(4000, L"one.lsp");
-    const std::wstring other = LongPath(4000, L"other.zmb");
     CStringList list;
     list.AddTail(CStdStr(one));
-    EXPECT_TRUE(FoundinSpecificList(CStdStr(other), list));
+    EXPECT_TRUE(FoundinSpecificList(CStdStr(one), list));
+    EXPECT_TRUE(FoundinSpecificList(CStdStr(LongPath(4000, L"ONE.LSP")), list));
+    for (const std::wstring& other : {LongPath(4000, L"two.lsp"), LongPath(4001, L"one.lsp"),
+                                      std::wstring(L"/a/one.lsp"), std::wstring()})
+        EXPECT_FALSE(FoundinSpecificList(CStdStr(other), list));
+}
+
+TEST_F(ListMembership, TakesNoPathThatIsTooLongForAnObjectDatabaseModuleOfAnotherFolder)
+{
+    const std::wstring path = L"/a/" + std::wstring(300, L'n') + L".omp";
+    CStringList list;
+    list.AddTail(CStdStr(path));
+    EXPECT_TRUE(FoundinSpecificList(CStdStr(path), list));
+    EXPECT_FALSE(FoundinSpecificList(CStdStr(L"/b/" + std::wstring(300, L'n') + L".omp"), list));
+}
+
+TEST_F(ListMembership, TakesNoEntryThatIsTooLongForAnEmptyPath)
+{
+    CStringList list;
+    Fill(list, {L""});
+    EXPECT_FALSE(FoundinSpecificList(CStdStr(LongPath(4000, L"one.lsp")), list));
     EXPECT_TRUE(FoundinSpecificList(L"", list));
-    EXPECT_FALSE(FoundinSpecificList(L"/a/one.lsp", list));
 }
 
 TEST_F(ListMembership, AsksTheListThatItIsNamedAfter)

@@ -299,6 +299,93 @@ TEST_F(ProfileRegistry, ListsANameOf1023CharactersWhole)
     EXPECT_THAT(Texts(names), ElementsAre(name, L"next"));
 }
 
+TEST_F(ProfileRegistry, OpensAKeyForReadingWithNothingReserved)
+{
+    CStdStr data;
+    Read(L"name", data);
+    CStringList names;
+    EnumModrigRegString(HKEY_CURRENT_USER, kKey, names);
+    const std::vector<RecordingRegistry::Call> opened = registry().callsOf(Operation::kOpen);
+    ASSERT_EQ(2u, opened.size());
+    for (const RecordingRegistry::Call& call : opened)
+    {
+        EXPECT_EQ(0u, call.reserved);
+        EXPECT_EQ(0x20019u, call.access);
+    }
+}
+
+TEST_F(ProfileRegistry, MakesAKeyWithoutClassOptionsOrSecurityAndAsksForNoMoreThanTheKey)
+{
+    Write(L"name", L"data");
+    Delete(L"name");
+    const std::vector<RecordingRegistry::Call> made = registry().callsOf(Operation::kCreate);
+    ASSERT_EQ(2u, made.size());
+    for (const RecordingRegistry::Call& call : made)
+    {
+        EXPECT_EQ(0u, call.reserved);
+        EXPECT_FALSE(call.keyClass.has_value());
+        EXPECT_EQ(0u, call.options);
+        EXPECT_EQ(0x20006u, call.access);
+        EXPECT_FALSE(call.hasSecurity);
+        EXPECT_FALSE(call.asksForDisposition);
+    }
+}
+
+TEST_F(ProfileRegistry, AsksForAStringOfUpTo4096Bytes)
+{
+    registry().makeKey(kKey);
+    CStdStr data;
+    Read(L"name", data);
+    const std::vector<RecordingRegistry::Call> reads = registry().callsOf(Operation::kRead);
+    ASSERT_EQ(1u, reads.size());
+    EXPECT_EQ(REG_SZ, reads.front().type);
+    EXPECT_EQ(4096u, reads.front().size);
+    EXPECT_EQ(0u, reads.front().reserved);
+}
+
+TEST_F(ProfileRegistry, AsksForEachNameWithRoomFor1024CharactersAndForNothingElse)
+{
+    registry().setValue(kKey, L"first and longer", L"data");
+    registry().setValue(kKey, L"second", L"data");
+    CStringList names;
+    EnumModrigRegString(HKEY_CURRENT_USER, kKey, names);
+    const std::vector<RecordingRegistry::Call> asked = registry().callsOf(Operation::kEnumerate);
+    ASSERT_EQ(3u, asked.size());
+    for (const RecordingRegistry::Call& call : asked)
+    {
+        EXPECT_EQ(1024u, call.size) << "the room is told anew each time";
+        EXPECT_FALSE(call.asksForData);
+    }
+}
+
+TEST_F(ProfileRegistry, WorksBelowTheRootThatItIsGiven)
+{
+    registry().setValue(L"Other\\Settings", L"name", L"below the other");
+    registry().setValue(L"Settings", L"name", L"below the user");
+    HKEY other = nullptr;
+    ASSERT_EQ(ERROR_SUCCESS, RegOpenKeyExW(HKEY_CURRENT_USER, L"Other", 0, KEY_READ, &other));
+    CStdStr data;
+    EXPECT_TRUE(ReadModrigRegString(other, L"Settings", L"name", data));
+    EXPECT_EQ(L"below the other", data.Text());
+    EXPECT_TRUE(WriteModrigRegString(other, L"Settings", L"second", L"written"));
+    EXPECT_EQ(L"written", registry().value(L"Other\\Settings", L"second"));
+    CStringList names;
+    EXPECT_TRUE(EnumModrigRegString(other, L"Settings", names));
+    EXPECT_THAT(Texts(names), ElementsAre(L"name", L"second"));
+    EXPECT_TRUE(DeleteModrigRegString(other, L"Settings", L"name"));
+    EXPECT_FALSE(registry().value(L"Other\\Settings", L"name").has_value());
+    EXPECT_EQ(L"below the user", registry().value(L"Settings", L"name"));
+    RegCloseKey(other);
+}
+
+TEST_F(RememberedFolder, IsEmptyWhenAnEmptyOneIsStored)
+{
+    registry().setValue(host().moduleKey(), L"MainDialog", L"");
+    CStdStr directory(L"/where/it/was");
+    EXPECT_TRUE(Recall(1, directory));
+    EXPECT_EQ(L"", directory.Text());
+}
+
 TEST_F(RememberedFolder, IsKeptForEachDialogByItself)
 {
     EXPECT_TRUE(Remember(1, L"/apps/main"));

@@ -1,6 +1,8 @@
 // What the Startup Suite and the History have in common: how they stand in the registry.
 #include "lists/StoredList.h"
 
+#include <algorithm>
+
 #include "lists/History.h"
 #include "lists/StartupSuite.h"
 #include "module/Globals.h"
@@ -55,6 +57,35 @@ protected:
         return host().registry.value(Key(), name);
     }
     static std::vector<std::wstring> StoredNames() { return host().registry.valueNames(Key()); }
+
+    // The first reads of the entry fail, as many as that; the ones after them go their way.
+    static void FailFirstReadsOf(std::size_t entry, unsigned count)
+    {
+        host().registry.failWhen(
+            [name = EntryName(entry), left = count](const RecordingRegistry::Call& call) mutable
+            {
+                if (left == 0 || call.operation != Operation::kRead || call.valueName != name)
+                    return ERROR_SUCCESS;
+                --left;
+                return ERROR_ACCESS_DENIED;
+            });
+    }
+    static std::size_t ReadsOf(std::size_t entry)
+    {
+        const std::vector<RecordingRegistry::Call> reads = host().registry.callsOf(Operation::kRead);
+        return static_cast<std::size_t>(
+            std::count_if(reads.begin(), reads.end(),
+                          [name = EntryName(entry)](const RecordingRegistry::Call& call)
+                          { return call.valueName == name; }));
+    }
+
+    static std::size_t TimesTheModulesKeyWasMade()
+    {
+        const std::vector<RecordingRegistry::Call> made = host().registry.callsOf(Operation::kCreate);
+        return static_cast<std::size_t>(std::count_if(made.begin(), made.end(),
+                                                      [](const RecordingRegistry::Call& call)
+                                                      { return call.key == host().moduleKey(); }));
+    }
 
     // The writes below the list's key fail for these value names.
     static void FailToWrite(std::vector<std::wstring> names)
@@ -157,12 +188,79 @@ TEST_P(StoredList, TakesTheLeadingDigitsOfTheCount)
     }
 }
 
+TEST_P(StoredList, LosesOneEntryToOnePassingFaultAndNotAllAfterIt)
+{
+    StoreCount(L"4");
+    StoreEntries({L"/a", L"/b", L"/c", L"/d"});
+    FailFirstReadsOf(2, 1);
+    Read();
+    EXPECT_THAT(Texts(list()), ElementsAre(L"/a", L"/b", L"/c")) << "the pass that failed is spent";
+    EXPECT_EQ(2u, ReadsOf(2));
+    EXPECT_EQ(0u, ReadsOf(4));
+}
+
+TEST_P(StoredList, SpendsEveryPassOfTheCountOnAGap)
+{
+    StoreCount(L"7");
+    StoreEntries({L"/a", L"/b"});
+    Read();
+    EXPECT_THAT(Texts(list()), ElementsAre(L"/a", L"/b"));
+    EXPECT_EQ(5u, ReadsOf(3));
+    EXPECT_EQ(0u, ReadsOf(4));
+}
+
+TEST_P(StoredList, IsReadOnAfterAsManyFailedPassesInARowAsItBearsWith)
+{
+    StoreCount(L"20001");
+    StoreEntries({L"/a", L"/b"});
+    FailFirstReadsOf(1, 9999);
+    Read();
+    EXPECT_THAT(Texts(list()), ElementsAre(L"/a", L"/b"));
+    EXPECT_EQ(10000u, ReadsOf(3)) << "the count of failed passes begins again after an entry";
+}
+
+TEST_P(StoredList, EndsAfterTenThousandFailedPassesInARow)
+{
+    StoreCount(L"20000");
+    StoreEntries({L"/a", L"/b"});
+    FailFirstReadsOf(2, 10000);
+    Read();
+    EXPECT_THAT(Texts(list()), ElementsAre(L"/a"));
+    EXPECT_EQ(10000u, ReadsOf(2));
+}
+
+TEST_P(StoredList, TakesTheCountForADecimalNumber)
+{
+    for (std::size_t entry = 1; entry <= 12; ++entry)
+        Store(EntryName(entry), L"/" + std::to_wstring(entry));
+    const std::pair<const wchar_t*, std::size_t> counts[] = {{L"010", 10}, {L"0x3", 0}, {L"12", 12}};
+    for (const auto& [text, expected] : counts)
+    {
+        StoreCount(text);
+        Read();
+        EXPECT_EQ(expected, list().GetCount()) << testing::PrintToString(std::wstring(text));
+    }
+}
+
+TEST_P(StoredList, AsksForTheModulesKeyOnceHoweverManyEntriesItHas)
+{
+    Fill(list(), {L"/a", L"/b", L"/c"});
+    Write();
+    EXPECT_EQ(1u, TimesTheModulesKeyWasMade());
+    Read();
+    EXPECT_EQ(2u, TimesTheModulesKeyWasMade());
+    EXPECT_EQ(3u, list().GetCount());
+    Write();
+    EXPECT_EQ(3u, TimesTheModulesKeyWasMade()) << "not for the values that are deleted either";
+}
+
 TEST_P(StoredList, DoesNotKeepTheStartWaitingForACountBeyondAllReason)
 {
     StoreCount(L"99999999999999999999999");
     StoreEntries({L"/a", L"/b"});
     Read();
     EXPECT_THAT(Texts(list()), ElementsAre(L"/a", L"/b"));
+    EXPECT_EQ(10000u, ReadsOf(3));
 }
 
 TEST_P(StoredList, IsReadFromDirectlyBelowTheUserWithoutAProfile)

@@ -140,6 +140,17 @@ TEST_F(PerformingALoad, KeepsAFailureToItselfWhenAskedTo)
     EXPECT_THAT(boxes(), IsEmpty());
 }
 
+TEST_F(PerformingALoad, ReportsAFailureForAnyFlagButZero)
+{
+    host().linker.refuseToLoad(L"/a/tool.zmb");
+    for (const int flag : {-1, 1, 2, -128, 127})
+    {
+        host().output.boxes.clear();
+        EXPECT_EQ(0, Perform(L"/a/tool.zmb", 1, static_cast<signed char>(flag)));
+        EXPECT_THAT(boxes(), ElementsAre(Message(38, L"/a/tool.zmb"))) << flag;
+    }
+}
+
 TEST_F(PerformingALoad, ReportsAPathWithoutADotTwice)
 {
     EXPECT_EQ(0, Perform(L"/a/tool"));
@@ -333,7 +344,7 @@ TEST_F(LoadingACompiledModule, LeavesALockedModuleAndNamesIt)
 TEST_F(LoadingACompiledModule, AnswersFalseWhenTheLinkerCannotUnload)
 {
     host().linker.setLoaded(L"/a/tool.zmb");
-    host().linker.refuseToUnload(L"/a/tool.zmb", L"it stays mapped");
+    host().linker.refuseToUnload(L"/a/tool.zmb", L"it will not go");
     EXPECT_FALSE(LoadQMBFile(L"/a/tool.zmb", 0));
     EXPECT_EQ(1u, host().journal.count(L"unloadModule"));
     EXPECT_THAT(recordingDialog().messages, IsEmpty()) << "the linker has said why itself";

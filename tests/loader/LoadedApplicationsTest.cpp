@@ -2,6 +2,7 @@
 
 #include "module/Globals.h"
 #include "tests/module/ModuleTest.h"
+#include "tests/support/recording/RecordingLoans.h"
 
 using namespace ModrigUtils;
 using testing::ElementsAre;
@@ -122,7 +123,11 @@ TEST_F(Rebuilding, PassesOverAModuleWithoutAPath)
     host().loadedModules.add(L"/a/one.zmb");
     host().loadedModules.add(L"/a/two.zmb");
     host().loadedModules.namesWithoutPath = {L"one.zmb"};
-    EXPECT_THAT(Rebuilt(), ElementsAre(L"/a/two.zmb"));
+    for (const int status : {TS_ERROR, 1, -1})
+    {
+        host().loadedModules.failure = status;
+        EXPECT_THAT(Rebuilt(), ElementsAre(L"/a/two.zmb")) << status;
+    }
     EXPECT_THAT(boxes(), IsEmpty());
     EXPECT_THAT(lines(), IsEmpty());
 }
@@ -144,6 +149,39 @@ TEST_F(Rebuilding, AddsNoModuleThatTheListHoldsAlready)
     host().loadedModules.add(L"t.bundle", L"/a/t.bundle");
     host().loadedModules.add(L"u.bundle", L"/b/t.bundle");
     EXPECT_THAT(Rebuilt(), ElementsAre(L"/a/one.zmb", L"/a/tool.omp", L"/a/t.bundle", L"/b/t.bundle"));
+}
+
+TEST_F(Rebuilding, ListsOneOfTwoModulesThatShareTheirNameSinceTheHostGivesThePathOfTheFirstForBoth)
+{
+    host().loadedModules.add(L"/a/one.zmb");
+    host().loadedModules.add(L"/b/one.zmb");
+    EXPECT_THAT(Rebuilt(), ElementsAre(L"/a/one.zmb"));
+    EXPECT_THAT(Rebuilt(), ElementsAre(L"/a/one.zmb"));
+}
+
+TEST_F(Rebuilding, AsksForEachPathAndThenForTheModulesOwnName)
+{
+    host().loadedModules.add(L"/a/one.zmb");
+    host().loadedModules.add(L"/a/two.zmb");
+    host().loadedModules.namesWithoutPath = {L"one.zmb"};
+    PopulateLoadedApps();
+    EXPECT_THAT(WithoutBookkeeping(host().journal.entries()),
+                ElementsAre(L"tsedQmbLoaded()",                                                  //
+                            L"tsedGetModuleFileName(Modrig.bundle)", L"tsedGetAppName()",        //
+                            L"tsedGetModuleFileName(one.zmb)",                                   //
+                            L"tsedGetModuleFileName(two.zmb)", L"tsedGetAppName()", L"curDoc()", //
+                            L"loadedApplicationCount()"));
+}
+
+TEST_F(Rebuilding, GivesTheHostsListBackBeforeItAsksTheDocument)
+{
+    std::vector<std::string> out = {"not asked"};
+    host().document.whenAskedFor = [&out]
+    {
+        out = recording_loans::outstanding();
+    };
+    PopulateLoadedApps();
+    EXPECT_THAT(out, IsEmpty());
 }
 
 TEST_F(Rebuilding, AddsTheDocumentsApplicationsBehindTheModulesAsTheyAreNamed)
@@ -303,7 +341,7 @@ TEST_F(Unloading, DoesNotCountARowThatIsNotUnloadableAsTried)
 TEST_F(Unloading, GoesOnBehindAModuleThatDoesNotUnload)
 {
     Load({L"/a/a.zmb", L"/a/b.zmb", L"/a/c.zmb"});
-    host().linker.refuseToUnload(L"/a/a.zmb", L"it stays mapped");
+    host().linker.refuseToUnload(L"/a/a.zmb", L"it will not go");
     EXPECT_THAT(Unload({{L"/a/a.zmb", true}, {L"/a/b.zmb", true}, {L"/a/c.zmb", true}}), ElementsAre(1u, 2u));
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(L"/a/a.zmb"));
     EXPECT_EQ(Message(13, L"2"), lines().back());

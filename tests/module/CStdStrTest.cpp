@@ -172,6 +172,37 @@ TEST_F(StdStr, KeepsItsValueWhenTheTextToLoadIsMissingOrEmpty)
     EXPECT_EQ(L"before", text.Text());
 }
 
+TEST_F(StdStr, LoadsATextWholeHoweverLongItIs)
+{
+    for (const std::size_t length : {1u, 4094u, 4095u, 4096u, 8191u, 8192u, 65535u, 100000u})
+    {
+        const std::wstring whole = std::wstring(length - 1, L'x') + L'.';
+        host().resources.setText(kResourceModuleName, 5000, whole);
+        CStdStr text;
+        EXPECT_TRUE(text.Load(5000)) << length;
+        EXPECT_EQ(whole, text.Text()) << length;
+    }
+}
+
+TEST_F(StdStr, FetchesATextOfUsualLengthOnce)
+{
+    CStdStr text;
+    text.Load(15);
+    EXPECT_EQ(1u, host().journal.count(L"loadStringFromWin32ResourceDLL"));
+}
+
+TEST_F(StdStr, LoadsATextThatIsNotEmptyWhateverItsFirstCharacter)
+{
+    const std::wstring whole(L"\0after", 6);
+    host().resources.setText(kResourceModuleName, 5000, whole);
+    CStdStr text(L"before");
+    EXPECT_TRUE(text.Load(5000));
+    EXPECT_EQ(whole, text.Text());
+    host().resources.setText(kResourceModuleName, 5000, std::wstring(1, L'\0'));
+    EXPECT_TRUE(text.Load(5000));
+    EXPECT_EQ(1u, text.GetLength());
+}
+
 TEST_F(StdStr, FormatsByTheTextOfAnId)
 {
     CStdStr text;

@@ -40,6 +40,19 @@ protected:
     void* mHandle = nullptr;
 };
 
+// Looks, when the module is registered, which resource module it knows.
+class LookingLinker : public RecordingLinker
+{
+public:
+    bool registerApplication(void* application) override
+    {
+        resourcesSeen.push_back(recordingHost().resources.nameOf(hModrigRes));
+        return RecordingLinker::registerApplication(application);
+    }
+
+    std::vector<std::wstring> resourcesSeen;
+};
+
 class UpdateRegistry : public ModuleTest
 {
 protected:
@@ -88,6 +101,30 @@ TEST_F(EntryPoint, ReadsTheStartupSuiteBeforeTheHistory)
     EXPECT_THAT(opened, ElementsAre(L"Startup", L"History"));
 }
 
+TEST_F(EntryPoint, HasReadTheHistoryBeforeItRegistersTheCommand)
+{
+    std::vector<bool> registered;
+    host().registry.failWhen(
+        [&registered](const RecordingRegistry::Call& call)
+        {
+            if (call.key == host().moduleKey() + L"\\History")
+                registered.push_back(host().commands.has(L"LOCALNAME"));
+            return ERROR_SUCCESS;
+        });
+    Send(kLoadMessage);
+    EXPECT_THAT(registered, testing::Contains(false));
+    EXPECT_THAT(registered, testing::Not(testing::Contains(true)));
+    EXPECT_TRUE(host().commands.has(L"LOCALNAME"));
+}
+
+TEST_F(EntryPoint, KnowsItsResourceModuleWhenItTellsTheLinker)
+{
+    LookingLinker linker;
+    host().services.set(TSRX_DYNAMIC_LINKER, &linker);
+    Send(kLoadMessage);
+    EXPECT_THAT(linker.resourcesSeen, ElementsAre(kResourceModuleName));
+}
+
 TEST_F(EntryPoint, ReadsBothListsFromTheRegistry)
 {
     StoreStartupSuite({L"/apps/a.lsp", L"/apps/b.zmb"});
@@ -118,6 +155,19 @@ TEST_F(EntryPoint, AnswersAnErrorAndDoesNothingWhenItIsLoadedASecondTime)
     EXPECT_THAT(host().journal.entries(), IsEmpty());
     EXPECT_TRUE(gStartupList.IsEmpty());
     EXPECT_EQ(1u, host().commands.added.size());
+}
+
+TEST_F(EntryPoint, KeepsTheStaleHandleWhenItAnswersAnError)
+{
+    Send(kLoadMessage);
+    const HMODULE before = hModrigRes;
+    EXPECT_EQ(3, Send(kLoadMessage));
+    EXPECT_EQ(before, hModrigRes);
+    Send(kUnloadMessage);
+    host().resources.removeModule(kResourceModuleName);
+    EXPECT_EQ(3, Send(kLoadMessage));
+    EXPECT_NE(nullptr, before);
+    EXPECT_EQ(before, hModrigRes);
 }
 
 TEST_F(EntryPoint, LoadsAgainAfterAnUnload)
@@ -227,6 +277,7 @@ TEST_F(EntryPoint, TakesTheCommandsNamesFromItsOwnModuleWhateverIsCurrent)
     initApp();
     ASSERT_EQ(1u, host().commands.added.size());
     EXPECT_EQ(L"OWN_GROUP", host().commands.added.front().group);
+    EXPECT_EQ(L"OWN_GLOBAL", host().commands.added.front().globalName);
     EXPECT_EQ(L"OWN", host().commands.added.front().localName);
 }
 

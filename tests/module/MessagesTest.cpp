@@ -44,6 +44,20 @@ TEST_F(Messages, ShowTheLineInTheDialogWithoutItsLineFeed)
     EXPECT_THAT(recordingDialog().messages, ElementsAre(Message(12, L"tool.lsp")));
 }
 
+TEST_F(Messages, AreInTheDialogBeforeTheyAreOnTheCommandLine)
+{
+    std::vector<std::wstring> printedMeanwhile;
+    recordingDialog().duringMessage = [&printedMeanwhile]
+    {
+        printedMeanwhile.push_back(printed());
+    };
+    ModrigCmdlineMessage(12, CStdStr(L"/a/tool.lsp"));
+    host().output.printed.clear();
+    ModrigCmdlineMessage(13, 2u);
+    EXPECT_THAT(printedMeanwhile, ElementsAre(L"", L""));
+    EXPECT_THAT(lines(), ElementsAre(Message(13, L"2")));
+}
+
 TEST_F(Messages, PrintNothingWhenATextIsOnlyForTheDialog)
 {
     ModrigCmdlineMessage(CStdStr(L"a hint"));
@@ -132,6 +146,17 @@ TEST_F(Messages, CutAPathInABoxAtTheRoomOfFormatting)
     ModrigAfxMessageBox(38, CStdStr(path));
     const std::wstring expected = Message(38, path).substr(0, std::wstring(L"[38] %s").size() + 1023);
     EXPECT_THAT(boxes(), ElementsAre(expected));
+}
+
+TEST_F(Messages, AreShownWholeHoweverLongTheyAre)
+{
+    const std::wstring words(10000, L'w');
+    host().resources.setText(kResourceModuleName, 12, words + L"%s");
+    ModrigCmdlineMessage(12, CStdStr(L"/a/tool.lsp"));
+    ModrigAfxMessageBox(12, CStdStr(L"/a/tool.lsp"));
+    EXPECT_THAT(lines(), ElementsAre(words + L"tool.lsp"));
+    EXPECT_THAT(recordingDialog().messages, ElementsAre(words + L"tool.lsp"));
+    EXPECT_THAT(boxes(), ElementsAre(words + L"/a/tool.lsp"));
 }
 
 TEST_F(Messages, NameTheFileWhenTheCountIsExactlyOneAndCountOtherwise)

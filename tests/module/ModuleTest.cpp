@@ -7,7 +7,8 @@
 
 namespace
 {
-constexpr unsigned kMessagesWithArgument[] = {2, 3, 8, 9, 10, 11, 12, 13, 19, 24, 35, 36, 37, 38, 39, 41, 48};
+constexpr unsigned kMessagesWithArgument[] = {2,  3,  8,  9,  10, 11, 12, 13, 19,
+                                              24, 35, 36, 37, 38, 39, 41, 48, 60};
 
 RecordingResources::Texts TestTexts()
 {

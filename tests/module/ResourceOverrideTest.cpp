@@ -59,6 +59,26 @@ TEST_F(ResourceOverride, LeavesEverythingAsItIsForANullHandle)
     EXPECT_THAT(host().journal.entries(), IsEmpty());
 }
 
+TEST_F(ResourceOverride, LeavesAloneWhatSomebodyElseChangesWhileItHoldsANullHandle)
+{
+    {
+        const CTemporaryResourceOverride texts(nullptr);
+        host().resources.current = mModule;
+    }
+    EXPECT_EQ(mModule, host().resources.current);
+    EXPECT_THAT(host().journal.entries(), IsEmpty());
+}
+
+TEST_F(ResourceOverride, HasOneFieldTheHandleBefore)
+{
+    struct WithOneHandle
+    {
+        virtual ~WithOneHandle() = default;
+        HINSTANCE before;
+    };
+    EXPECT_EQ(sizeof(WithOneHandle), sizeof(CTemporaryResourceOverride));
+}
+
 TEST_F(ResourceOverride, SetsNothingWhenTheModuleIsCurrentAlready)
 {
     {

@@ -1,6 +1,7 @@
 #include "module/SplitPath.h"
 
 #include <string>
+#include <vector>
 
 #include <gtest/gtest.h>
 
@@ -14,6 +15,13 @@ SplitPath Split(const std::wstring& path)
 std::wstring Repeat(std::size_t count, wchar_t character)
 {
     return std::wstring(count, character);
+}
+
+// The folder, the name, the extension does not fit.
+std::vector<std::wstring> TooLongPaths()
+{
+    return {L"/" + Repeat(1022, L'f') + L"/gear.lsp", L"/a/" + Repeat(256, L'n') + L".lsp",
+            L"/a/gear." + Repeat(255, L'x'), L"/b/gear." + Repeat(255, L'x')};
 }
 } // namespace
 
@@ -81,17 +89,50 @@ TEST(SplitPath, FitsTheLongestPartsThatItHasRoomFor)
 
 TEST(SplitPath, IsEmptyAsAWholeWhenOnePartDoesNotFit)
 {
-    const std::wstring tooLong[] = {
-        L"/" + Repeat(1022, L'f') + L"/gear.lsp",
-        L"/a/" + Repeat(256, L'n') + L".lsp",
-        L"/a/gear." + Repeat(255, L'x'),
-    };
-    for (const std::wstring& path : tooLong)
+    for (const std::wstring& path : TooLongPaths())
     {
         const SplitPath split = Split(path);
+        EXPECT_TRUE(split.IsTooLong());
         EXPECT_EQ(L"", split.Name());
         EXPECT_EQ(L"", split.Extension());
         EXPECT_TRUE(split.FileName().IsEmpty());
         EXPECT_TRUE(split.SameFolder(Split(L"gear.lsp"))) << "the folder is empty too";
     }
+}
+
+TEST(SplitPath, IsNotTooLongWhenItsPartsFitOrAreEmpty)
+{
+    EXPECT_FALSE(Split(L"").IsTooLong());
+    EXPECT_FALSE(Split(L"/a/").IsTooLong());
+    EXPECT_FALSE(Split(L"/" + Repeat(1021, L'f') + L"/" + Repeat(255, L'n') + L".lsp").IsTooLong());
+}
+
+TEST(SplitPath, HasTheFileNameOfNothingButItselfWhenItIsTooLong)
+{
+    const std::vector<std::wstring> paths = TooLongPaths();
+    for (const std::wstring& path : paths)
+    {
+        const SplitPath split = Split(path);
+        EXPECT_FALSE(split.SameFileName(Split(L"")));
+        EXPECT_FALSE(Split(L"").SameFileName(split));
+        for (const std::wstring& other : paths)
+            EXPECT_EQ(path == other, split.SameFileName(Split(other)));
+    }
+}
+
+TEST(SplitPath, IsTheSameInAnyCaseAlsoWhenItIsTooLong)
+{
+    const SplitPath left = Split(L"/Ä/" + Repeat(256, L'n') + L".lsp");
+    const SplitPath right = Split(L"/ä/" + Repeat(256, L'N') + L".LSP");
+    EXPECT_TRUE(left.SameFileName(right));
+    EXPECT_EQ(left.FileNameHash(), right.FileNameHash());
+    EXPECT_EQ(left.PathHash(), right.PathHash());
+}
+
+TEST(SplitPath, TellsPathsThatAreTooLongApartByTheirHashes)
+{
+    const SplitPath left = Split(L"/a/" + Repeat(256, L'n') + L".lsp");
+    const SplitPath right = Split(L"/b/" + Repeat(256, L'n') + L".lsp");
+    EXPECT_NE(left.FileNameHash(), right.FileNameHash());
+    EXPECT_NE(left.PathHash(), right.PathHash());
 }

@@ -16,7 +16,7 @@ using Table = std::map<std::string, std::string>;
 
 // Every key, in the order of the file types in the panel, and the extensions that each shows.
 const Table kShownExtensions = {
-    {"IDS_MODRIG_TESSEL_APPS", "bundle;zmb;lsp;omp;qbc"},
+    {"IDS_MODRIG_TESSEL_APPS", "bundle;zmb;lsp;omp;qbc;rpk;mcp"},
     {"IDS_MODRIG_QMB_APPS", "bundle"},
     {"IDS_MODRIG_ZMB_APPS", "zmb"},
     {"IDS_MODRIG_LSP_APPS", "lsp"},
@@ -104,13 +104,17 @@ TEST_F(LocalizedStrings, NameTheExtensionsThatAFilterShowsWithoutDotsOrStars)
         EXPECT_EQ(mTexts.at(key + kExtensionSuffix), extensions) << key;
 }
 
-TEST_F(LocalizedStrings, ShowOnlyWhatTheModuleCanLoad)
+TEST_F(LocalizedStrings, ShowEveryKindOfApplicationInTheFirstFilterAndNothingElse)
 {
-    for (const std::string& extension : parts(mTexts.at("IDS_MODRIG_TESSEL_APPS_EXT")))
+    std::set<std::string> kinds;
+    for (const CExtInfo& kind : sExtInfo)
     {
-        const int type = ModrigUtils::FileType(CStdStr(std::wstring(extension.begin(), extension.end())));
-        EXPECT_TRUE(type == kCompiledModule || type == kLispFile) << extension;
+        const std::wstring extension = kind.mExtension;
+        kinds.insert(std::string(extension.begin(), extension.end()));
     }
+    const std::vector<std::string> shown = parts(mTexts.at("IDS_MODRIG_TESSEL_APPS_EXT"));
+    EXPECT_EQ(std::set<std::string>(shown.begin(), shown.end()), kinds);
+    EXPECT_EQ(shown.size(), kinds.size());
 }
 
 TEST_F(LocalizedStrings, DescribeEveryFilterDifferently)

@@ -58,6 +58,7 @@ const std::vector<Message> kMessages = {
     {"kUrlNotFetched", kUrlNotFetched, kNone},
     {"kTemporaryInternetFile", kTemporaryInternetFile, kOneText},
     {"kAlreadyLoaded", kAlreadyLoaded, kOneText},
+    {"kDialogFailed", kDialogFailed, kOneText},
 };
 
 const std::map<unsigned, std::wstring> kFilterPatterns = {

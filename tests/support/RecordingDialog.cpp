@@ -13,6 +13,8 @@ namespace ModrigUtils
 void SetDialogMessage(const CStdStr& text)
 {
     recordingDialog().messages.push_back(text.Text());
+    if (recordingDialog().duringMessage)
+        recordingDialog().duringMessage();
 }
 
 void RunModrigDialog()

@@ -11,6 +11,7 @@ struct RecordingDialog
 {
     // The texts of the message line, in order.
     std::vector<std::wstring> messages;
+    std::function<void()> duringMessage; // what happens while one is shown
 
     int runs = 0;
     std::function<void()> duringRun; // what the user does while the dialog is open

@@ -72,11 +72,12 @@ TEST_F(HostWithoutCompiledLisp, CountsTheirFilesAmongThoseThatCannotBeFoundNotLo
     EXPECT_FALSE(IsAppUnloadAble(L"/a/tool.qbc"));
 }
 
-TEST_F(HostWithoutCompiledLisp, OffersNoFilterForThem)
+TEST_F(HostWithoutCompiledLisp, TakesTheirPatternsOutOfTheFilters)
 {
     host().resources.setText(kResourceModuleName, 29, L"Compiled Lisp|*.qbc");
     host().resources.setText(kResourceModuleName, 46, L"Packaged Lisp|*.rpk;*.lsp");
     CStdStr filter;
     ReAdjustFilterString(filter);
-    EXPECT_EQ(L"R21 Tessel|*.bundle;*.LSP|Bundles|*.bundle|Packaged Lisp|*.lsp|", filter.Text());
+    EXPECT_EQ(L"R21 Tessel|*.bundle;*.LSP|Bundles|*.bundle|Compiled Lisp||Packaged Lisp|*.lsp|",
+              filter.Text());
 }

@@ -80,12 +80,47 @@ TEST_F(FileFilters, KeepOnlyPatternsOfApplications)
     EXPECT_EQ(std::wstring(kFirst) + L"Some|*.zmb;*.OMP|", Readjusted());
 }
 
-TEST_F(FileFilters, DropAnEntryWithoutAnyPatternLeft)
+TEST_F(FileFilters, KeepThePlaceAndTheDescriptionOfAnEntryWithoutAnyPatternLeft)
 {
     SetText(26, L"Programs|*.exe;*.dll");
-    SetText(27, L"No patterns|");
-    SetText(28, L"No bar");
-    EXPECT_EQ(kFirst, Readjusted());
+    SetText(51, L"No patterns|");
+    SetText(27, L"No bar");
+    SetText(28, L"Objects|*.omp");
+    EXPECT_EQ(std::wstring(kFirst) + L"Programs||No patterns||No bar||Objects|*.omp|", Readjusted());
+}
+
+TEST_F(FileFilters, PutAChosenEntryFirstAlsoWithoutAnyPatternLeft)
+{
+    SetText(26, L"Programs|*.exe");
+    Choose(L"Programs");
+    EXPECT_EQ(std::wstring(L"Programs||") + kFirst, Readjusted());
+}
+
+TEST_F(FileFilters, DropEmptyEntriesOnly)
+{
+    SetText(26, L"");
+    SetText(51, L"|");
+    SetText(27, L"|*.lsp");
+    EXPECT_EQ(std::wstring(kFirst) + L"|||*.lsp|", Readjusted());
+}
+
+TEST_F(FileFilters, AreInTheOrderOfTheTableWhenNothingWasChosenAlsoWithAnEntryThatDescribesNothing)
+{
+    SetText(26, L"|*.bundle");
+    for (const bool chosen : {false, true})
+    {
+        if (chosen)
+            Choose(L"");
+        EXPECT_EQ(std::wstring(kFirst) + L"|*.bundle|", Readjusted());
+    }
+}
+
+TEST_F(FileFilters, EndTheDescriptionAtTheFirstBar)
+{
+    SetText(26, L"Bundles|*.bundle;*.zmb|*.lsp");
+    EXPECT_EQ(std::wstring(kFirst) + kBundles, Readjusted()) << "no kind is called \"zmb|*.lsp\"";
+    Choose(L"Bundles");
+    EXPECT_EQ(std::wstring(kBundles) + kFirst, Readjusted());
 }
 
 TEST_F(FileFilters, FollowTheOrderOfTheTableAndNotOfTheNumbers)

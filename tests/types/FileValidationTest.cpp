@@ -188,6 +188,39 @@ TEST_F(FileValidation, FindsNothingByAPathThatIsTooLongToBeTakenApart)
     EXPECT_EQ(FILE_ATTRIBUTE_NORMAL, mAttributes);
 }
 
+TEST_F(FileValidation, FitsTheLongestPathThatTheSearchCanFind)
+{
+    const std::wstring longest = LongPath(1023, L"tool.lsp");
+    host().files.addFile(longest, 0x21);
+    host().files.found[L"tool.lsp"] = longest;
+    EXPECT_EQ(longest, Found(L"/x/tool.lsp"));
+    EXPECT_EQ(0x21u, mAttributes);
+    host().files.found[L"tool.lsp"] = LongPath(1024, L"tool.lsp");
+    EXPECT_EQ(L"/x/tool.lsp", Found(L"/x/tool.lsp"));
+    EXPECT_EQ(INVALID_FILE_ATTRIBUTES, mAttributes);
+}
+
+TEST_F(FileValidation, HasRoomFor1024CharactersOfTheUrlThatAFileIsACopyOf)
+{
+    static_cast<void>(IsTempInternetFile(L"/cache/tool.lsp"));
+    EXPECT_THAT(host().internet.rooms, ElementsAre(1024u));
+}
+
+TEST_F(FileValidation, TakesNoOtherFileForOneThatIsTooLongToBeTakenApart)
+{
+    for (const wchar_t* extension : {L"bundle", L"zmb", L"lsp", L"mcp", L"omp", L"rpk", L"qbc"})
+    {
+        host().files.addFile(std::wstring(L"/current/.") + extension);
+        host().files.found[std::wstring(L".") + extension] = std::wstring(L"/search/.") + extension;
+    }
+    for (const std::wstring& path : {L"/x/" + std::wstring(300, L'n') + L".lsp", LongPath(4000, L"tool.lsp")})
+    {
+        EXPECT_EQ(path, Found(path));
+        EXPECT_EQ(INVALID_FILE_ATTRIBUTES, mAttributes);
+    }
+    EXPECT_THAT(host().files.searched, IsEmpty());
+}
+
 TEST_F(FileValidation, NamesAFileInACurrentFolderThatDoesNotFitByItsNameBehindASlash)
 {
     host().files.currentFolder = L"/" + std::wstring(1023, L'c');
@@ -285,4 +318,14 @@ TEST_F(UrlValidation, DoesNothingForAnEmptyPathOrWithoutTheHostsServices)
     host().applicationServices.exist = false;
     EXPECT_EQ(L"http://example.test/tool.lsp/", Validated(L"http://example.test/tool.lsp/"));
     EXPECT_THAT(boxes(), IsEmpty());
+}
+
+TEST_F(UrlValidation, FitsTheLongestPathOfALocalCopy)
+{
+    const std::wstring url = L"http://example.test/tool.lsp";
+    host().applicationServices.remotes[url] = {TS_FROM_CACHE, LongPath(1023, L"tool.lsp")};
+    EXPECT_EQ(LongPath(1023, L"tool.lsp"), Validated(url));
+    host().applicationServices.remotes[url] = {TS_FROM_CACHE, LongPath(1024, L"tool.lsp")};
+    EXPECT_EQ(url, Validated(url));
+    EXPECT_THAT(boxes(), ElementsAre(L"[39] %s"));
 }

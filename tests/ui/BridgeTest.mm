@@ -25,6 +25,13 @@ protected:
             extensions.push_back(wide([[filter fileExtensions] objectAtIndex:index]));
         return extensions;
     }
+    static std::vector<std::wstring> descriptionsOf(NSArray* filters)
+    {
+        std::vector<std::wstring> descriptions;
+        for (NSUInteger index = 0; index < [filters count]; ++index)
+            descriptions.push_back(wide([[filters objectAtIndex:index] description]));
+        return descriptions;
+    }
 };
 } // namespace
 
@@ -103,14 +110,24 @@ TEST_F(Bridge, OffersSixFiltersInTheirOrderWhateverIsStored)
     NSMutableArray* filters = [NSMutableArray arrayWithObject:@"kept"];
     [TsOCModrigUtil populateModrigFileFilter:filters];
     ASSERT_EQ(7u, [filters count]);
-    EXPECT_THAT(extensionsOf([filters objectAtIndex:1]), testing::Contains(L"lsp"));
+    EXPECT_EQ(L"kept", wide([filters objectAtIndex:0]));
+    EXPECT_THAT(extensionsOf([filters objectAtIndex:1]),
+                ElementsAre(L"bundle", L"zmb", L"lsp", L"omp", L"qbc", L"rpk", L"mcp"));
     EXPECT_THAT(extensionsOf([filters objectAtIndex:2]), ElementsAre(L"bundle"));
     EXPECT_THAT(extensionsOf([filters objectAtIndex:3]), ElementsAre(L"zmb"));
     EXPECT_THAT(extensionsOf([filters objectAtIndex:4]), ElementsAre(L"lsp"));
     EXPECT_THAT(extensionsOf([filters objectAtIndex:5]), ElementsAre(L"omp"));
     EXPECT_THAT(extensionsOf([filters objectAtIndex:6]), ElementsAre(L"qbc"));
-    for (NSUInteger index = 1; index < 7; ++index)
-        EXPECT_LT(0u, [[[filters objectAtIndex:index] description] length]);
+}
+
+TEST_F(Bridge, DescribesEachFilterByTheTextThatBelongsToItsExtensions)
+{
+    NSMutableArray* filters = [NSMutableArray array];
+    [TsOCModrigUtil populateModrigFileFilter:filters];
+    EXPECT_THAT(descriptionsOf(filters),
+                ElementsAre(L"All Tessel applications", L"Extension modules (*.bundle)",
+                            L"Core modules (*.zmb)", L"Lisp source (*.lsp)",
+                            L"Object-database modules (*.omp)", L"Compiled Lisp (*.qbc)"));
 }
 
 TEST_F(Bridge, AnswersTheKeyForATextThatIsMissing)

@@ -157,6 +157,16 @@ TEST_F(Dropping, IgnoresFilesOnAnyOtherTable)
     EXPECT_FALSE(host().linker.isLoaded(file("one.zmb")));
 }
 
+TEST_F(Dropping, OnTheHistoryTableEndsInsertingAtARowAndOnAnyOtherDoesNot)
+{
+    open();
+    [mController setValue:[NSNumber numberWithInt:3] forKey:@"mInsertRow"];
+    drop([[[NSTableView alloc] init] autorelease], paths({"one.zmb"}), 0);
+    EXPECT_EQ(3, [[mController valueForKey:@"mInsertRow"] intValue]);
+    drop(historyTable(), paths({"one.zmb"}), 0);
+    EXPECT_EQ(-1, [[mController valueForKey:@"mInsertRow"] intValue]);
+}
+
 TEST_F(Dropping, TakesFiftyFiles)
 {
     open();

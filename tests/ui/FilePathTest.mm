@@ -5,6 +5,7 @@
 #include <wincompat/winstring.h>
 
 #include <filesystem>
+#include <set>
 
 @interface SpecialFilePath : ModrigFilePath
 @end
@@ -154,4 +155,12 @@ TEST_F(FilePath, HasTheHashOfEveryPathThatItEquals)
         }
     }
     EXPECT_LT(0x1F80, equal);
+}
+
+TEST_F(FilePath, HasAHashThatTellsMostPathsApart)
+{
+    std::set<NSUInteger> hashes;
+    for (int number = 0; number < 1000; ++number)
+        hashes.insert([make([NSString stringWithFormat:@"/none/tool%d.zmb", number]) hash]);
+    EXPECT_LT(990u, hashes.size());
 }

@@ -5,7 +5,12 @@
 
 #include <algorithm>
 
+#import <objc/runtime.h>
+
 #include "module/DialogBridge.h"
+#include "module/EntryPoint.h"
+#include "module/ResourceOverride.h"
+#include "ui/Paths.h"
 
 #import "ui/ModrigFilePath.h"
 #import "ui/ModrigStartupSuitController.h"
@@ -122,6 +127,100 @@ int gTextsGone = 0;
 
 @end
 
+// Lies in the pool that is current where it is made, and writes down when that one is drained.
+@interface PoolWitness : NSObject
+@end
+
+namespace
+{
+std::vector<std::wstring> gOrder;
+bool gShowingFails = false;
+
+IMP gInit = nullptr;
+IMP gDealloc = nullptr;
+
+// A method's code has no type of its own in the runtime.
+template <class To, class From> To asCode(From function)
+{
+    return reinterpret_cast<To>(reinterpret_cast<void*>(function));
+}
+
+void lieInThePool()
+{
+    [[[PoolWitness alloc] init] autorelease];
+}
+
+id watchedInit(id self, SEL selector)
+{
+    lieInThePool();
+    return asCode<id (*)(id, SEL)>(gInit)(self, selector);
+}
+
+void watchedShow(id, SEL)
+{
+    lieInThePool();
+    gOrder.push_back(L"shown");
+    if (gShowingFails)
+        [NSException raise:NSGenericException format:@"no %%s more"];
+}
+
+void watchedDealloc(id self, SEL selector)
+{
+    gOrder.push_back(L"controller gone");
+    asCode<void (*)(id, SEL)>(gDealloc)(self, selector);
+}
+
+// Replaces a method of the dialog's controller as long as it lives, since the command makes its own
+// controller.
+class ReplacedMethod
+{
+public:
+    template <class Function>
+    ReplacedMethod(SEL selector, Function replacement)
+        : mMethod(class_getInstanceMethod([ModrigController class], selector)),
+          mBefore(method_setImplementation(mMethod, asCode<IMP>(replacement)))
+    {
+    }
+    ~ReplacedMethod() { method_setImplementation(mMethod, mBefore); }
+    ReplacedMethod(const ReplacedMethod&) = delete;
+    ReplacedMethod& operator=(const ReplacedMethod&) = delete;
+
+    IMP before() const { return mBefore; }
+
+private:
+    Method mMethod;
+    IMP mBefore;
+};
+
+// The command with a dialog that is over at once.
+class WatchedCommand
+{
+public:
+    explicit WatchedCommand(bool fails)
+    {
+        gOrder.clear();
+        gShowingFails = fails;
+        gInit = mInit.before();
+        gDealloc = mDealloc.before();
+    }
+
+private:
+    const ReplacedMethod mInit { @selector(init), watchedInit };
+    const ReplacedMethod mShow { @selector(showModrigDialog), watchedShow };
+    const ReplacedMethod mDealloc { @selector(dealloc), watchedDealloc };
+};
+} // namespace
+
+@implementation PoolWitness
+
+- (void)dealloc
+{
+    gOrder.push_back(L"pool drained, texts of " + recordingHost().resources.nameOf(AfxGetResourceHandle()));
+    [super dealloc];
+}
+
+@end
+
 namespace
 {
 const std::wstring kSettings = L"Software\\Tessel\\R21\\Profiles\\Default\\DialogSettings\\Modrig";
@@ -211,6 +310,13 @@ TEST_F(Lifetime, OfARowsTextsEndsWithTheRow)
     [row release];
     [pool drain];
     EXPECT_EQ(1, gTextsGone);
+}
+
+TEST_F(Lifetime, OfRowsIsThatOfTheArrayTheyComeIn)
+{
+    NSArray* rows = ModrigUtils::RowsFromPaths({CStdStr(L"/none/a.zmb"), CStdStr(L"/none/b.zmb")});
+    for (NSUInteger index = 0; index < 2; ++index)
+        EXPECT_EQ(1u, [[rows objectAtIndex:index] retainCount]);
 }
 
 TEST_F(Lifetime, OfWhatADialogHoldsEndsWithTheDialog)
@@ -305,4 +411,27 @@ TEST_F(Lifetime, EndsWithTheStartupSuiteStoredThenTheHistoryThenTheModulesRecord
     EXPECT_LT(history, record);
     ASSERT_NE(calls.end(), record);
     EXPECT_EQ(L"writeToRegistry(TesselModrig, 6, false, true)", *record);
+}
+
+TEST_F(Lifetime, OfTheCommandReleasesTheControllerThenDrainsThePoolThenGivesTheTextsBack)
+{
+    CTemporaryResourceOverride::SetDefaultResource(0, kResourceModuleName);
+    host().resources.addModule(L"other.dll", {});
+    const HMODULE other = host().resources.load(L"other.dll");
+    host().resources.current = other;
+    const std::wstring drained = std::wstring(L"pool drained, texts of ") + kResourceModuleName;
+    for (const bool fails : {false, true})
+    {
+        const WatchedCommand watched(fails);
+        ModrigUtils::ModrigCreate();
+        EXPECT_THAT(gOrder, ElementsAre(L"shown", L"controller gone", drained, drained)) << fails;
+        EXPECT_EQ(other, host().resources.current);
+    }
+}
+
+TEST_F(Lifetime, OfADialogThatTheToolkitEndsIsToldInATextOfTheModule)
+{
+    const WatchedCommand watched(true);
+    ModrigUtils::RunModrigDialog();
+    EXPECT_EQ(Message(60, L"NSGenericException: no %s more") + L"\n", host().output.printed);
 }

@@ -160,6 +160,21 @@ TEST_F(MainDialog, StopsAtTheSecondOfThreeFilesWithoutASummary)
     EXPECT_EQ(L"", message());
 }
 
+TEST_F(MainDialog, ShowsApplicationsThatCannotBeLoadedAndSaysSoWhenOneIsChosen)
+{
+    for (const char* name : {"plates.mcp", "survey.rpk"})
+    {
+        const std::wstring chosen = file(name);
+        open();
+        EXPECT_TRUE([mController panel:mPanel shouldShowFilename:path(name)]) << name;
+        selectFiles({name});
+        [mController onLoad:nil];
+        EXPECT_THAT(boxes(), ElementsAre(Message(2, chosen), Message(38, chosen)));
+        close();
+        host().output.boxes.clear();
+    }
+}
+
 TEST_F(MainDialog, SaysThatAFileIsLoadedAlreadyAndAddsNoRow)
 {
     gLoadedAppList.AddTail(loadedModule("one.zmb"));
@@ -506,8 +521,7 @@ TEST_F(MainDialog, ScrollsTheShownTableToTheNewRow)
     open();
     selectFiles({"last.zmb"});
     [mController onLoad:nil];
-    const NSRect visible = [loadedTable() visibleRect];
-    EXPECT_TRUE(NSLocationInRange(60, [loadedTable() rowsInRect:visible]));
+    EXPECT_TRUE(NSContainsRect([loadedTable() visibleRect], [loadedTable() rectOfRow:60]));
 }
 
 TEST_F(MainDialog, ScrollsTheHistoryWhenThatShows)
@@ -519,7 +533,7 @@ TEST_F(MainDialog, ScrollsTheHistoryWhenThatShows)
     [mController setSaveHistory:YES];
     selectFiles({"last.zmb"});
     [mController onLoad:nil];
-    EXPECT_TRUE(NSLocationInRange(60, [historyTable() rowsInRect:[historyTable() visibleRect]]));
+    EXPECT_TRUE(NSContainsRect([historyTable() visibleRect], [historyTable() rectOfRow:60]));
 }
 
 TEST_F(MainDialog, ScrollsNowhereWhenAnotherTabShows)

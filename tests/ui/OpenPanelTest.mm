@@ -52,25 +52,10 @@ protected:
     {
         return [mController panel:mPanel shouldShowFilename:text(path.wstring())];
     }
-    NSBrowser* browser() { return [[mPanel contentView] viewWithTag:NSFileHandlingPanelBrowser]; }
-    std::vector<std::wstring> shownFiles()
-    {
-        std::vector<std::wstring> names;
-        NSMatrix* column = [browser() matrixInColumn:[browser() lastColumn]];
-        for (NSInteger row = 0; row < [column numberOfRows]; ++row)
-            names.push_back(wide([[column cellAtRow:row column:0] stringValue]));
-        return names;
-    }
+    std::vector<std::wstring> shownFiles() { return filesShownIn(mPanel); }
     std::wstring selectedFile() { return wide([[[mController selectedFiles] objectAtIndex:0] filePathName]); }
-    NSForm* form() { return [[mPanel contentView] viewWithTag:NSFileHandlingPanelForm]; }
-    std::wstring shownName() { return wide([[form() cellAtIndex:0] stringValue]); }
-    void typeName(NSString* name)
-    {
-        [mPanel makeFirstResponder:nil];
-        [form() selectTextAtIndex:0];
-        [[form() currentEditor] selectAll:nil];
-        [(NSTextView*)[form() currentEditor] insertText:name];
-    }
+    std::wstring shownName() { return wide([nameField(mPanel) stringValue]); }
+    void typeName(NSString* name) { typeNameInto(mPanel, name); }
     std::vector<std::wstring> selectedFiles()
     {
         std::vector<std::wstring> files;
@@ -78,44 +63,30 @@ protected:
             files.push_back(wide([[[mController selectedFiles] objectAtIndex:index] filePathName]));
         return files;
     }
-    // Clicks files in the last column, the first alone and the others added to it.
-    void click(std::initializer_list<const wchar_t*> names)
+    void click(std::initializer_list<const wchar_t*> names) { selectFilesIn(mPanel, names); }
+    // Selects the folder and presses Return.
+    void enter(const wchar_t* folder)
     {
-        NSMatrix* column = [browser() matrixInColumn:[browser() lastColumn]];
-        [column deselectAllCells];
-        for (NSInteger row = 0; row < [column numberOfRows]; ++row)
-            for (const wchar_t* name : names)
-                if (wide([[column cellAtRow:row column:0] stringValue]) == name)
-                    [column highlightCell:YES atRow:row column:0], [column selectCellAtRow:row column:0];
-        [browser() doClick:column];
+        click({folder});
+        pressKey(mPanel, @"\r");
     }
 };
 } // namespace
 
-TEST_F(OpenPanel, ReplacesThePanelsButtonsAndGivesThemBack)
+TEST_F(OpenPanel, ReplacesThePanelsButtons)
 {
-    NSOpenPanel* panel = [NSOpenPanel openPanel];
+    open();
+    NSOpenPanel* panel = [[mPanel retain] autorelease];
     NSButton* ok = [panel okButton];
     NSButton* cancel = [panel cancelButton];
-    const NSRect okFrame = [ok frame];
-    const CGFloat width = [panel frame].size.width;
-    const NSRect cancelFrame = [cancel frame];
-    const std::wstring cancelTitle = wide([cancel title]);
-    const SEL action = [ok action];
-    open();
+    ASSERT_TRUE(ok && cancel);
     EXPECT_TRUE([ok isHidden]);
     EXPECT_EQ(mController, [ok target]);
     EXPECT_TRUE(sel_isEqual(@selector(openPanelOK:), [ok action]));
     EXPECT_EQ(L"Close", wide([cancel title]));
     EXPECT_TRUE(NSEqualRects([ok frame], [cancel frame]));
+    EXPECT_NE(nil, [panel accessoryView]);
     close();
-    EXPECT_FALSE([ok isHidden]);
-    EXPECT_NE(mController, [ok target]);
-    EXPECT_TRUE(sel_isEqual(action, [ok action]));
-    EXPECT_TRUE(NSEqualRects(okFrame, [ok frame]));
-    EXPECT_EQ(width, [panel frame].size.width);
-    EXPECT_EQ(cancelTitle, wide([cancel title]));
-    EXPECT_TRUE(NSEqualRects(cancelFrame, [cancel frame]));
     EXPECT_EQ(nil, [panel accessoryView]);
     EXPECT_EQ(nil, [panel delegate]);
 }
@@ -244,7 +215,9 @@ TEST_F(OpenPanel, TakesAFolderThatIsWalkedThroughForNoSelection)
     runIn(mFolder.path(), {[this]
                            {
                                selectFiles({"old.lsp"});
-                               click({L"folder"});
+                               enter(L"folder");
+                               EXPECT_EQ(0u, [[mController selectedFiles] count]);
+                               EXPECT_EQ(L"", shownName());
                            },
                            [this]
                            {
@@ -263,7 +236,7 @@ TEST_F(OpenPanel, TakesAFolderThatIsWalkedThroughForNoSelection)
 TEST_F(OpenPanel, RemembersTheFolderThatTheUserWentTo)
 {
     mFolder.write("folder/one.zmb", "");
-    runIn(mFolder.path(), {[this] { click({L"folder"}); }, [this] { click({L"one.zmb"}); },
+    runIn(mFolder.path(), {[this] { enter(L"folder"); }, [this] { click({L"one.zmb"}); },
                            [this] { [mController onLoad:nil]; }});
     EXPECT_EQ((mFolder / "folder").wstring(), host().registry.value(kSettings, L"InitialPath"));
 }
@@ -344,14 +317,16 @@ TEST_F(OpenPanel, LoadsNothingForATypedNameOfNoFile)
     runIn(mFolder.path(), {[this] { click({L"one.zmb"}); },
                            [this]
                            {
-                               for (NSString* name : {@"zz.zmb", @"folder"})
-                               {
-                                   typeName(name);
-                                   [mController onLoad:nil];
-                                   EXPECT_THAT(selectedFiles(), IsEmpty());
-                               }
-                               EXPECT_FALSE(host().linker.isLoaded(file("one.zmb")));
+                               typeName(@"folder");
+                               [mController onLoad:nil];
+                               EXPECT_THAT(selectedFiles(), IsEmpty());
                                EXPECT_THAT(boxes(), IsEmpty());
+                               typeName(@"zz.zmb");
+                               [mController onLoad:nil];
+                               EXPECT_THAT(selectedFiles(), IsEmpty());
+                               EXPECT_FALSE(host().linker.isLoaded(file("one.zmb")));
+                               EXPECT_THAT(boxes(), ElementsAre(L"There is no file \"" +
+                                                                (mFolder / "zz.zmb").wstring() + L"\"."));
                            }});
 }
 

@@ -39,11 +39,6 @@
     return urls;
 }
 
-- (NSArray*)modrigSelectedPaths
-{
-    return mPaths;
-}
-
 @end
 
 using testing::ElementsAre;

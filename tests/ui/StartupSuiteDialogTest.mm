@@ -20,7 +20,7 @@ constexpr NSInteger kRemove = 1;
 bool isReachedByTab(NSView* wanted, NSWindow* window)
 {
     constexpr int kMostStops = 50;
-    NSView* view = [[window contentView] viewWithTag:NSFileHandlingPanelForm];
+    NSView* view = nameField((NSOpenPanel*)window);
     for (int stop = 0; stop < kMostStops && view && view != wanted; ++stop)
         view = [view nextValidKeyView];
     return view == wanted;
@@ -271,7 +271,7 @@ TEST_F(StartupSuiteDialog, ScrollsToTheNewRow)
     open();
     openSuite();
     [mSuite addFiles:paths({"last.zmb"})];
-    EXPECT_TRUE(NSLocationInRange(60, [table() rowsInRect:[table() visibleRect]]));
+    EXPECT_TRUE(NSContainsRect([table() visibleRect], [table() rectOfRow:60]));
 }
 
 TEST_F(StartupSuiteDialog, OpensItsHelpPage)
@@ -314,6 +314,7 @@ TEST_F(StartupSuiteDialog, RunsOverTheMainDialogAndStoresTheShortenedSuiteWhenBo
     ModrigUtils::RunModrigDialog();
     EXPECT_EQ(L"1", host().registry.value(host().moduleKey() + L"\\Startup", L"NumStartup"));
     EXPECT_EQ(file("two.lsp"), host().registry.value(host().moduleKey() + L"\\Startup", L"1Startup"));
+    EXPECT_EQ(1u, [mSuite retainCount]); // the test's own
 }
 
 TEST_F(StartupSuiteDialog, ChoosesFilesInTheHostsFolderWhateverTheOtherDialogRemembers)

@@ -5,33 +5,11 @@
 
 namespace ModrigPlatform
 {
-// The file panel for a run of the dialog.
-NSOpenPanel* MakeOpenPanel();
-
-// Makes the panel ready to become the dialog. It may be shared with the rest of the program: its own state is
-// kept, and given back afterwards.
-void TakePanel(NSOpenPanel* panel);
-void GiveBackPanel(NSOpenPanel* panel);
-
 // Makes the panel's accessory view as wide as the panel, at any size of it.
 void FitAccessoryView(NSView* view);
 
 // Lets Tab walk through everything that the window shows now.
 void UpdateKeyViews(NSWindow* window);
-
-// The folder that the panel shows, moving it to another one, and the paths selected in it. A folder that is
-// only walked through is not selected. The panel's delegate hears of a selection that is lost on the way.
-NSString* ShownFolder(NSOpenPanel* panel);
-void ShowFolder(NSOpenPanel* panel, NSString* folder);
-NSArray* SelectedPaths(NSOpenPanel* panel);
-
-// Whether the panel has another selection than `SelectedPaths` answered last, and its delegate has not been
-// told: the user has typed a name.
-bool HasUnreportedSelection(NSOpenPanel* panel);
-
-// Asks the panel's delegate again which files to show, and tells it when that ends the selection.
-// `elsewhere`: any other folder.
-void FilterPanelAnew(NSOpenPanel* panel, NSURL* elsewhere);
 
 // Whether the file exists; `isFolder` then says whether it is a folder.
 bool FileExists(NSString* path, bool& isFolder);

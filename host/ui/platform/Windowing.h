@@ -21,16 +21,4 @@ void letNewWindowsHaveTheKeyboard();
 
 // Carries out what the screen still has to show.
 void flushScreen();
-
-// A file panel of its own, which disturbs no other one that is open.
-NSOpenPanel* makeOpenPanel();
-
-// Asks the panel's delegate again which files to show.
-void filterAnew(NSOpenPanel* panel);
-
-// The paths of the chosen files, as strings.
-NSArray* chosenPaths(NSOpenPanel* panel);
-
-// Opens the panel in a folder (nil: where it likes), for choosing files only.
-void showFilesOf(NSOpenPanel* panel, NSString* folder);
 } // namespace tessel::windowing

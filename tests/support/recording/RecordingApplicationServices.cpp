@@ -69,6 +69,7 @@ bool RecordingInternet::IsRemoteFile(const wchar_t* localPath, wchar_t* url, std
 {
     recordingHost().journal.add(L"IsRemoteFile", {localPath});
     asked.push_back(orEmpty(localPath));
+    rooms.push_back(capacity);
     const auto remote = urlsOfLocalFiles.find(asked.back());
     if (remote == urlsOfLocalFiles.end())
         return false;

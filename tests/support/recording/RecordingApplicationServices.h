@@ -56,6 +56,8 @@ public:
     std::map<std::wstring, std::wstring> urlsOfLocalFiles;
     // The paths that were asked about, in order.
     mutable std::vector<std::wstring> asked;
+    // The room that each caller had for the URL, in characters.
+    mutable std::vector<std::size_t> rooms;
 
     bool IsRemoteFile(const wchar_t* localPath, wchar_t* url, std::size_t capacity) const override;
 

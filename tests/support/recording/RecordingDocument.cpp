@@ -19,5 +19,7 @@ const wchar_t* RecordingDocument::loadedApplicationName(int index) const
 TsApDocument* curDoc()
 {
     recordingHost().journal.add(L"curDoc");
+    if (recordingHost().document.whenAskedFor)
+        recordingHost().document.whenAskedFor();
     return recordingHost().document.exists ? &recordingHost().document : nullptr;
 }

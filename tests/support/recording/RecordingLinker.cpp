@@ -52,6 +52,11 @@ void RecordingLinker::allow(const std::wstring& path)
     refuseToUnload(path, {});
 }
 
+void RecordingLinker::keepMapped(const std::wstring& path)
+{
+    application(path).staysMapped = true;
+}
+
 void RecordingLinker::setEntryPoint(const std::wstring& path, EntryPoint entryPoint)
 {
     application(path).entryPoint = std::move(entryPoint);
@@ -90,7 +95,11 @@ bool RecordingLinker::unloadModule(const wchar_t* path, bool sayWhyNot)
 {
     recordingHost().journal.add(L"unloadModule", {path, sayWhyNot});
     calls.push_back({Call::Operation::kUnload, path, sayWhyNot, false});
-    return report(L"unload", path, unload(application(path)), sayWhyNot);
+    Application& leaving = application(path);
+    const bool unloaded = report(L"unload", path, unload(leaving), sayWhyNot);
+    if (unloaded && leaving.staysMapped && sayWhyNot)
+        recordingHost().output.say(std::wstring(path) + L" stays in memory.");
+    return unloaded;
 }
 
 bool RecordingLinker::isModuleLocked(const wchar_t* path) const

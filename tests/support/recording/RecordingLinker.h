@@ -36,8 +36,10 @@ public:
     void setLocked(const std::wstring& path, bool locked = true);
     // From now on the path does not load (or unload), for this reason, until `allow`.
     void refuseToLoad(const std::wstring& path, const std::wstring& reason = L"there is no such file");
-    void refuseToUnload(const std::wstring& path, const std::wstring& reason = L"it stays mapped");
+    void refuseToUnload(const std::wstring& path, const std::wstring& reason = L"it will not go");
     void allow(const std::wstring& path);
+    // From now on an unload takes the path out of service, and says that its code stays in memory.
+    void keepMapped(const std::wstring& path);
     // From now on only paths that were given an entry point load; of the others there is no such file.
     void loadOnlyKnown() { mLoadsAnything = false; }
     // Called with message 1 during a load and message 2 during an unload, as a real entry point is; while it
@@ -67,6 +69,7 @@ private:
         bool loading = false; // its load message is running
         bool loaded = false;
         bool locked = false;
+        bool staysMapped = false;
     };
 
     Application& application(const std::wstring& path);

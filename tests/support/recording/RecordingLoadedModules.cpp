@@ -63,7 +63,7 @@ int tsedGetModuleFileName(const wchar_t* moduleName, wchar_t* path, std::size_t 
 {
     recordingHost().journal.add(L"tsedGetModuleFileName", {moduleName});
     const std::wstring* found = recordingHost().loadedModules.pathOf(moduleName);
-    return found && copyText(*found, path, capacity) ? 0 : TS_ERROR;
+    return found && copyText(*found, path, capacity) ? 0 : recordingHost().loadedModules.failure;
 }
 
 const wchar_t* tsedGetAppName()

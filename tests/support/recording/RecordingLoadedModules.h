@@ -6,6 +6,8 @@
 #include <string>
 #include <vector>
 
+#include <tessel/tsdefs.h>
+
 #include "tests/support/recording/RecordingValue.h"
 
 class RecordingLoadedModules
@@ -20,6 +22,7 @@ public:
 
     bool reportsNothing = false;             // the list is null, whatever is loaded
     std::set<std::wstring> namesWithoutPath; // `tsedGetModuleFileName` fails for these names (exact)
+    int failure = TS_ERROR;                  // and answers this
 
     // What `tsedGetAppName` answers. The recording linker and command stack set it for the length of the
     // calls that they make; a test that calls an entry point itself sets it first.

@@ -193,49 +193,47 @@ std::vector<RecordingRegistry::Call> RecordingRegistry::callsOf(Operation operat
     return found;
 }
 
-LONG RecordingRegistry::open(HKEY root, const wchar_t* subKey, DWORD access, HKEY* result)
+LONG RecordingRegistry::open(Call call, HKEY root, const wchar_t* subKey, HKEY* result)
 {
-    std::wstring path;
-    if (const LONG status = resolve(root, subKey, path); status != ERROR_SUCCESS)
+    call.operation = Operation::kOpen;
+    if (const LONG status = resolve(root, subKey, call.key); status != ERROR_SUCCESS)
         return status;
-    const LONG status = record({.operation = Operation::kOpen, .key = path, .access = access});
-    if (status != ERROR_SUCCESS)
+    if (const LONG status = record(call); status != ERROR_SUCCESS)
         return status;
-    if (!find(path))
+    if (!find(call.key))
         return ERROR_FILE_NOT_FOUND;
-    *result = newHandle(path);
+    *result = newHandle(call.key);
     return ERROR_SUCCESS;
 }
 
-LONG RecordingRegistry::create(HKEY root, const wchar_t* subKey, DWORD access, HKEY* result,
-                               DWORD* disposition)
+LONG RecordingRegistry::create(Call call, HKEY root, const wchar_t* subKey, HKEY* result, DWORD* disposition)
 {
-    std::wstring path;
-    if (const LONG status = resolve(root, subKey, path); status != ERROR_SUCCESS)
+    call.operation = Operation::kCreate;
+    if (const LONG status = resolve(root, subKey, call.key); status != ERROR_SUCCESS)
         return status;
-    const LONG status = record({.operation = Operation::kCreate, .key = path, .access = access});
-    if (status != ERROR_SUCCESS)
+    if (const LONG status = record(call); status != ERROR_SUCCESS)
         return status;
     if (disposition)
-        *disposition = find(path) ? kKeyWasThere : kKeyWasMade;
-    findOrMake(path);
-    *result = newHandle(path);
+        *disposition = find(call.key) ? kKeyWasThere : kKeyWasMade;
+    findOrMake(call.key);
+    *result = newHandle(call.key);
     return ERROR_SUCCESS;
 }
 
-LONG RecordingRegistry::enumerate(HKEY key, DWORD index, wchar_t* name, DWORD* nameLength, DWORD* type,
+LONG RecordingRegistry::enumerate(Call call, HKEY key, wchar_t* name, DWORD* nameLength, DWORD* type,
                                   BYTE* data, DWORD* dataSize)
 {
     const std::wstring* path = openPath(key);
     if (!path)
         return ERROR_INVALID_HANDLE;
-    const LONG status = record({.operation = Operation::kEnumerate, .key = *path, .index = index});
-    if (status != ERROR_SUCCESS)
+    call.operation = Operation::kEnumerate;
+    call.key = *path;
+    if (const LONG status = record(call); status != ERROR_SUCCESS)
         return status;
     const Key* found = find(*path);
-    if (!found || index >= found->values.size())
+    if (!found || call.index >= found->values.size())
         return ERROR_NO_MORE_ITEMS;
-    const Key::Value& value = found->values[index];
+    const Key::Value& value = found->values[call.index];
     if (*nameLength <= value.name.size())
         return ERROR_MORE_DATA;
     std::wmemcpy(name, value.name.c_str(), value.name.size() + 1);
@@ -269,17 +267,18 @@ LONG RecordingRegistry::close(HKEY key)
     return status;
 }
 
-LONG RecordingRegistry::read(HKEY key, const wchar_t* name, DWORD* type, void* data, DWORD* size)
+LONG RecordingRegistry::read(Call call, HKEY key, const wchar_t* name, DWORD* type, void* data, DWORD* size)
 {
     const std::wstring* path = openPath(key);
     if (!path)
         return ERROR_INVALID_HANDLE;
-    const std::wstring valueName = name ? name : L"";
-    const LONG status = record({.operation = Operation::kRead, .key = *path, .valueName = valueName});
-    if (status != ERROR_SUCCESS)
+    call.operation = Operation::kRead;
+    call.key = *path;
+    call.valueName = name ? name : L"";
+    if (const LONG status = record(call); status != ERROR_SUCCESS)
         return status;
     const Key* found = find(*path);
-    const Key::Value* value = found ? found->find(valueName) : nullptr;
+    const Key::Value* value = found ? found->find(call.valueName) : nullptr;
     return value ? copyData(value->data, type, data, size) : ERROR_FILE_NOT_FOUND;
 }
 

@@ -37,6 +37,16 @@ public:
         std::wstring data = {};      // where the call writes
         DWORD access = 0;            // where the call opens or creates
         DWORD index = 0;             // where the call enumerates
+
+        // What callers mostly leave out, as the call was given it.
+        DWORD reserved = 0;
+        std::optional<std::wstring> keyClass = {};
+        DWORD options = 0;
+        bool hasSecurity = false;
+        bool asksForDisposition = false;
+        DWORD type = 0;           // where the call reads
+        DWORD size = 0;           // of the buffer: characters of a name, bytes of data
+        bool asksForData = false; // where the call enumerates: type, data or size of the value too
     };
 
     RecordingRegistry();
@@ -67,14 +77,14 @@ public:
     const std::vector<Call>& calls() const { return mCalls; }
     std::vector<Call> callsOf(Operation operation) const;
 
-    // What the SDK's functions do.
-    LONG open(HKEY root, const wchar_t* subKey, DWORD access, HKEY* result);
-    LONG create(HKEY root, const wchar_t* subKey, DWORD access, HKEY* result, DWORD* disposition);
-    LONG enumerate(HKEY key, DWORD index, wchar_t* name, DWORD* nameLength, DWORD* type, BYTE* data,
+    // What the SDK's functions do. Where there is a `call`, it brings the arguments that are only remembered.
+    LONG open(Call call, HKEY root, const wchar_t* subKey, HKEY* result);
+    LONG create(Call call, HKEY root, const wchar_t* subKey, HKEY* result, DWORD* disposition);
+    LONG enumerate(Call call, HKEY key, wchar_t* name, DWORD* nameLength, DWORD* type, BYTE* data,
                    DWORD* dataSize);
     LONG remove(HKEY key, const wchar_t* name);
     LONG close(HKEY key);
-    LONG read(HKEY key, const wchar_t* name, DWORD* type, void* data, DWORD* size);
+    LONG read(Call call, HKEY key, const wchar_t* name, DWORD* type, void* data, DWORD* size);
     LONG write(HKEY key, const wchar_t* name, const wchar_t* data);
 
 private:

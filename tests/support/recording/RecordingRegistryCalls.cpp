@@ -3,21 +3,28 @@
 
 #include "tests/support/RecordingHost.h"
 
-LONG RegOpenKeyExW(HKEY root, const wchar_t* subKey, DWORD, DWORD access, HKEY* result)
+LONG RegOpenKeyExW(HKEY root, const wchar_t* subKey, DWORD reserved, DWORD access, HKEY* result)
 {
-    return recordingHost().registry.open(root, subKey, access, result);
+    return recordingHost().registry.open({.access = access, .reserved = reserved}, root, subKey, result);
 }
 
-LONG RegCreateKeyEx(HKEY root, const wchar_t* subKey, DWORD, const wchar_t*, DWORD, DWORD access, const void*,
-                    HKEY* result, DWORD* disposition)
+LONG RegCreateKeyEx(HKEY root, const wchar_t* subKey, DWORD reserved, const wchar_t* keyClass, DWORD options,
+                    DWORD access, const void* security, HKEY* result, DWORD* disposition)
 {
-    return recordingHost().registry.create(root, subKey, access, result, disposition);
+    RecordingRegistry::Call call = {.access = access, .reserved = reserved, .options = options};
+    if (keyClass)
+        call.keyClass = keyClass;
+    call.hasSecurity = security != nullptr;
+    call.asksForDisposition = disposition != nullptr;
+    return recordingHost().registry.create(call, root, subKey, result, disposition);
 }
 
-LONG RegEnumValueW(HKEY key, DWORD index, wchar_t* name, DWORD* nameLength, DWORD*, DWORD* type, BYTE* data,
-                   DWORD* dataSize)
+LONG RegEnumValueW(HKEY key, DWORD index, wchar_t* name, DWORD* nameLength, DWORD* reserved, DWORD* type,
+                   BYTE* data, DWORD* dataSize)
 {
-    return recordingHost().registry.enumerate(key, index, name, nameLength, type, data, dataSize);
+    RecordingRegistry::Call call = {.index = index, .size = *nameLength};
+    call.asksForData = reserved || type || data || dataSize;
+    return recordingHost().registry.enumerate(call, key, name, nameLength, type, data, dataSize);
 }
 
 LONG RegDeleteValueW(HKEY key, const wchar_t* name)
@@ -30,9 +37,12 @@ LONG RegCloseKey(HKEY key)
     return recordingHost().registry.close(key);
 }
 
-LONG tsRegGetValue(HKEY key, const wchar_t* name, DWORD, DWORD* type, void* data, DWORD* size)
+LONG tsRegGetValue(HKEY key, const wchar_t* name, DWORD reserved, DWORD* type, void* data, DWORD* size)
 {
-    return recordingHost().registry.read(key, name, type, data, size);
+    RecordingRegistry::Call call = {.reserved = reserved};
+    call.type = type ? *type : 0;
+    call.size = size ? *size : 0;
+    return recordingHost().registry.read(call, key, name, type, data, size);
 }
 
 LONG tsudRegSetString(HKEY key, const wchar_t* name, const wchar_t* data)

@@ -19,3 +19,8 @@ TsRxSysRegistry* tsrxSysRegistry()
 {
     return &recordingHost().services;
 }
+
+int tsrxEndRequest()
+{
+    return recordingHost().services.endRequest;
+}

@@ -109,11 +109,21 @@ private:
 // The panel of the main dialog that is running.
 NSOpenPanel* runningPanel();
 
+// The parts of a file panel.
+NSTableView* fileTable(NSOpenPanel* panel);
+NSTextField* nameField(NSOpenPanel* panel);
+// What its table shows in its first column.
+std::vector<std::wstring> filesShownIn(NSOpenPanel* panel);
+// Selects the files of these names in its table, as the keyboard does.
+void selectFilesIn(NSOpenPanel* panel, std::initializer_list<const wchar_t*> names);
+// Types into its name field in place of what stands there.
+void typeNameInto(NSOpenPanel* panel, NSString* name);
+
 // A click of the mouse on a row of a table that shows.
-void clickRow(NSTableView* table, NSInteger row);
+void clickRow(NSTableView* table, NSInteger row, NSUInteger modifiers = 0, NSInteger clicks = 1);
 
 // A key, as the window that has the keyboard gets it.
-void pressKey(NSWindow* window, NSString* characters);
+void pressKey(NSWindow* window, NSString* characters, NSUInteger modifiers = 0);
 
 // A drag of files, as a drop target sees it.
 id<NSDraggingInfo> dragOf(NSArray* paths);

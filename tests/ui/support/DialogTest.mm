@@ -1,8 +1,11 @@
 #include "tests/ui/support/DialogTest.h"
 
+#include <tesselui/tsuieach.h>
 #include <tesselui/tsuierrors.h>
+#include <tesselui/tsuifilepanel.h>
 #include <wincompat/winstring.h>
 
+#include <algorithm>
 #include <cstdlib>
 #include <iostream>
 
@@ -109,7 +112,7 @@ void OpenDialogTest::open()
 void OpenDialogTest::openWith(ModrigController* controller)
 {
     mController = controller;
-    mPanel = [NSOpenPanel openPanel];
+    mPanel = [tsuiMakeFilePanel() retain];
     OpeningDialog opening = {mController, mPanel};
     if (NSString* error = tsuiErrorOf(setUp, &opening))
         FAIL() << [error UTF8String];
@@ -122,6 +125,8 @@ void OpenDialogTest::close()
     [mController cleanOpenPanel:mPanel];
     [mController release];
     mController = nil;
+    [mPanel release];
+    mPanel = nil;
 }
 
 void OpenDialogTest::TearDown()
@@ -223,7 +228,81 @@ NSOpenPanel* runningPanel()
     return [[TsOCModrigUtil getModrigController] valueForKey:@"mOpenPanel"];
 }
 
-void clickRow(NSTableView* table, NSInteger row)
+namespace
+{
+// The first view of that class that is not in the panel's accessory view.
+NSView* partOf(NSView* view, Class wanted, NSView* accessory)
+{
+    if ([view isKindOfClass:wanted])
+        return view;
+    for (NSView* inner : tsuiEach<NSView*>([view subviews]))
+        if (inner != accessory)
+            if (NSView* found = partOf(inner, wanted, accessory))
+                return found;
+    return nil;
+}
+
+bool isEditable(NSView* view)
+{
+    return [view isKindOfClass:[NSTextField class]] && [(NSTextField*)view isEditable];
+}
+
+NSView* editableIn(NSView* view, NSView* accessory)
+{
+    if (isEditable(view))
+        return view;
+    for (NSView* inner : tsuiEach<NSView*>([view subviews]))
+        if (inner != accessory)
+            if (NSView* found = editableIn(inner, accessory))
+                return found;
+    return nil;
+}
+} // namespace
+
+NSTableView* fileTable(NSOpenPanel* panel)
+{
+    return (NSTableView*)partOf([panel contentView], [NSTableView class], [panel accessoryView]);
+}
+
+NSTextField* nameField(NSOpenPanel* panel)
+{
+    return (NSTextField*)editableIn([panel contentView], [panel accessoryView]);
+}
+
+std::vector<std::wstring> filesShownIn(NSOpenPanel* panel)
+{
+    std::vector<std::wstring> names;
+    NSTableView* table = fileTable(panel);
+    NSTableColumn* column = [[table tableColumns] objectAtIndex:0];
+    for (NSInteger row = 0; row < [table numberOfRows]; ++row)
+        names.push_back(wide([[table dataSource] tableView:table objectValueForTableColumn:column row:row]));
+    return names;
+}
+
+void selectFilesIn(NSOpenPanel* panel, std::initializer_list<const wchar_t*> names)
+{
+    const auto shown = filesShownIn(panel);
+    NSMutableIndexSet* rows = [NSMutableIndexSet indexSet];
+    for (const wchar_t* name : names)
+    {
+        const auto found = std::ranges::find(shown, name);
+        if (found == shown.end())
+            ADD_FAILURE() << "not shown: " << tessel::toUtf8(name);
+        else
+            [rows addIndex:static_cast<NSUInteger>(found - shown.begin())];
+    }
+    [panel makeFirstResponder:fileTable(panel)];
+    [fileTable(panel) selectRowIndexes:rows byExtendingSelection:NO];
+}
+
+void typeNameInto(NSOpenPanel* panel, NSString* name)
+{
+    [panel makeFirstResponder:nil];
+    [nameField(panel) selectText:nil];
+    [(NSTextView*)[nameField(panel) currentEditor] insertText:name];
+}
+
+void clickRow(NSTableView* table, NSInteger row, NSUInteger modifiers, NSInteger clicks)
 {
     NSWindow* window = [table window];
     const NSRect place = [table rectOfRow:row];
@@ -231,21 +310,21 @@ void clickRow(NSTableView* table, NSInteger row)
     for (const NSEventType type : {NSLeftMouseDown, NSLeftMouseUp})
         [NSApp postEvent:[NSEvent mouseEventWithType:type
                                             location:point
-                                       modifierFlags:0
+                                       modifierFlags:modifiers
                                            timestamp:0
                                         windowNumber:[window windowNumber]
                                              context:[window graphicsContext]
                                          eventNumber:0
-                                          clickCount:1
+                                          clickCount:clicks
                                             pressure:1]
                  atStart:NO];
 }
 
-void pressKey(NSWindow* window, NSString* characters)
+void pressKey(NSWindow* window, NSString* characters, NSUInteger modifiers)
 {
     [NSApp postEvent:[NSEvent keyEventWithType:NSKeyDown
                                             location:NSZeroPoint
-                                       modifierFlags:0
+                                       modifierFlags:modifiers
                                            timestamp:0
                                         windowNumber:[window windowNumber]
                                              context:[window graphicsContext]

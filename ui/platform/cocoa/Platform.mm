@@ -35,19 +35,6 @@
 
 namespace ModrigPlatform
 {
-NSOpenPanel* MakeOpenPanel()
-{
-    return [NSOpenPanel openPanel];
-}
-
-// Every panel is a new one here.
-void TakePanel(NSOpenPanel*)
-{
-}
-void GiveBackPanel(NSOpenPanel*)
-{
-}
-
 // The panel sizes the frame around the view, which has to hand its size on.
 void FitAccessoryView(NSView* view)
 {
@@ -61,35 +48,6 @@ void FitAccessoryView(NSView* view)
 // The platform follows what shows.
 void UpdateKeyViews(NSWindow*)
 {
-}
-
-NSString* ShownFolder(NSOpenPanel* panel)
-{
-    return [[panel directoryURL] path];
-}
-
-void ShowFolder(NSOpenPanel* panel, NSString* folder)
-{
-    [panel setDirectory:folder];
-}
-
-NSArray* SelectedPaths(NSOpenPanel* panel)
-{
-    return [[panel URLs] valueForKey:@"path"];
-}
-
-bool HasUnreportedSelection(NSOpenPanel*)
-{
-    return false;
-}
-
-// The panel filters again when it comes to a folder, so it is sent away and back.
-void FilterPanelAnew(NSOpenPanel* panel, NSURL* elsewhere)
-{
-    [panel validateVisibleColumns];
-    NSURL* folder = [[[panel directoryURL] retain] autorelease];
-    [panel setDirectoryURL:elsewhere];
-    [panel setDirectoryURL:folder];
 }
 
 bool FileExists(NSString* path, bool& isFolder)

@@ -2,6 +2,8 @@
 
 #include <CoreGraphics/CoreGraphics.h>
 
+#include <tesselui/tsuifilepanel.h>
+
 namespace tessel::windowing
 {
 bool displayIsReachable()
@@ -37,26 +39,16 @@ void makeWindowsClosable()
 void letNewWindowsHaveTheKeyboard()
 {
 }
+} // namespace tessel::windowing
 
-NSOpenPanel* makeOpenPanel()
+// The system's panel, a new one at each call.
+NSOpenPanel* tsuiMakeFilePanel()
 {
     return [NSOpenPanel openPanel];
 }
 
-void filterAnew(NSOpenPanel* panel)
+// The system's panel has no field for names.
+bool tsuiTellOfMissingFile(NSOpenPanel*)
 {
-    [panel validateVisibleColumns];
+    return false;
 }
-
-NSArray* chosenPaths(NSOpenPanel* panel)
-{
-    return [[panel URLs] valueForKey:@"path"];
-}
-
-void showFilesOf(NSOpenPanel* panel, NSString* folder)
-{
-    [panel setCanChooseDirectories:NO];
-    if (folder)
-        [panel setDirectoryURL:[NSURL fileURLWithPath:folder]];
-}
-} // namespace tessel::windowing

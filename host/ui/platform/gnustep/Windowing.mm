@@ -2,9 +2,6 @@
 
 #import <GNUstepGUI/GSDisplayServer.h>
 
-#include <tesselui/tsuieach.h>
-#include <tesselui/tsuierrors.h>
-
 #include <dlfcn.h>
 
 #include "host/ui/platform/gnustep/DisplayProbe.h"
@@ -42,29 +39,6 @@ void setDefaults(NSDictionary* defaults)
 {
     [[NSUserDefaults standardUserDefaults] registerDefaults:defaults];
 }
-// The browser raises an exception when a folder that it shows, /tmp, say, changes under it. It has the new
-// state the next time. What still does not work then shows on the screen.
-constexpr int kMostTries = 5;
-
-void persist(void (*change)(void*), void* argument)
-{
-    for (int tries = 0; tries < kMostTries && tsuiErrorOf(change, argument); ++tries)
-        ;
-}
-
-struct PanelFolder
-{
-    NSOpenPanel* panel;
-    NSString* folder;
-};
-
-void openFolder(void* wanted)
-{
-    const auto* place = static_cast<PanelFolder*>(wanted);
-    [place->panel setCanChooseDirectories:NO];
-    if (place->folder)
-        [place->panel setDirectory:place->folder];
-}
 } // namespace
 
 bool displayIsReachable()
@@ -80,7 +54,6 @@ void chooseLook()
     [look setObject:@"NSWindows95InterfaceStyle" forKey:@"NSMenuInterfaceStyle"];
     [look setObject:@"NSMacintoshInterfaceStyle"
              forKey:@"NSScrollViewInterfaceStyle"]; // scrollers on the right
-    [look setObject:@"NSMacintoshInterfaceStyle" forKey:@"NSBrowserInterfaceStyle"];
     // Without a window manager nobody else draws title bars, and the toolkit would wait for what never comes.
     if (!probeDisplay().hasWindowManager)
         [look setObject:@"NO" forKey:@"GSBackHandlesWindowDecorations"];
@@ -105,60 +78,4 @@ void flushScreen()
 {
     completeRequests([GSCurrentServer() serverDevice]);
 }
-
-NSOpenPanel* makeOpenPanel()
-{
-    // +openPanel answers one object for the whole program, which may be open already.
-    return [[[NSOpenPanel alloc] init] autorelease];
-}
-
-void showFilesOf(NSOpenPanel* panel, NSString* folder)
-{
-    PanelFolder wanted = {panel, folder};
-    persist(openFolder, &wanted);
-}
 } // namespace tessel::windowing
-
-// The panel's own idea of its folder does not follow the browser, which is asked instead.
-@interface NSSavePanel (TsBrowser)
-- (NSString*)tsShownFolder;
-- (NSArray*)tsChosenPaths;
-- (void)tsFilterAnew;
-@end
-
-@implementation NSSavePanel (TsBrowser)
-
-- (NSString*)tsShownFolder
-{
-    return [[_browser pathToColumn:[_browser lastColumn]] stringByStandardizingPath];
-}
-
-- (NSArray*)tsChosenPaths
-{
-    NSMutableArray* paths = [NSMutableArray array];
-    for (NSBrowserCell* cell : tsuiEach<NSBrowserCell*>([_browser selectedCells]))
-        if ([cell isLeaf])
-            [paths addObject:[[self tsShownFolder] stringByAppendingPathComponent:[cell stringValue]]];
-    return paths;
-}
-
-// -validateVisibleColumns would empty the columns of the browser.
-- (void)tsFilterAnew
-{
-    NSString* folder = [[[self tsShownFolder] retain] autorelease];
-    [_browser loadColumnZero];
-    [_browser setPath:folder];
-    [_okButton setEnabled:NO];
-}
-
-@end
-
-NSArray* tessel::windowing::chosenPaths(NSOpenPanel* panel)
-{
-    return [panel tsChosenPaths];
-}
-
-void tessel::windowing::filterAnew(NSOpenPanel* panel)
-{
-    persist([](void* shown) { [static_cast<NSOpenPanel*>(shown) tsFilterAnew]; }, panel);
-}

@@ -1,0 +1,46 @@
+#include "host/console/EndSignals.h"
+
+namespace tessel
+{
+namespace
+{
+// A signal handler can be given nothing.
+LineRunner* theRunner = nullptr;
+volatile std::sig_atomic_t theSignal = 0;
+
+// Both may come together, and a terminal that closes may send its own twice: none of them means more hurry.
+void onSignal(int signal)
+{
+    if (theSignal == 0)
+        theSignal = signal;
+    theRunner->requestEnd();
+}
+} // namespace
+
+EndSignals::EndSignals(LineRunner& runner)
+{
+    theRunner = &runner;
+    theSignal = 0;
+    struct sigaction action = {};
+    action.sa_handler = onSignal;
+    sigemptyset(&action.sa_mask);
+    for (std::size_t index = 0; index < kSignals.size(); ++index)
+    {
+        sigaction(kSignals[index], &action, &mPrevious[index]);
+        // Who starts a program so that it outlives its terminal means it.
+        if (mPrevious[index].sa_handler == SIG_IGN)
+            sigaction(kSignals[index], &mPrevious[index], nullptr);
+    }
+}
+
+EndSignals::~EndSignals()
+{
+    for (std::size_t index = 0; index < kSignals.size(); ++index)
+        sigaction(kSignals[index], &mPrevious[index], nullptr);
+}
+
+int EndSignals::received()
+{
+    return theSignal;
+}
+} // namespace tessel

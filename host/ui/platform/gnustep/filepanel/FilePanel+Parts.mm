@@ -1,0 +1,253 @@
+#include <algorithm>
+
+#include <tesselui/tsuieach.h>
+#include <tesselui/tsuifilepanel.h>
+
+#import "host/ui/platform/gnustep/filepanel/FileNameCell.h"
+#import "host/ui/platform/gnustep/filepanel/FilePanel.h"
+#import "host/ui/platform/gnustep/filepanel/FileTable.h"
+#include "host/ui/platform/gnustep/filepanel/Layout.h"
+#import "host/ui/platform/gnustep/filepanel/PathBar.h"
+
+using namespace tessel::filepanel;
+
+// Places its parts by the panel's own rule whenever its size changes.
+@interface TsFilePanelView : NSView
+@end
+
+@implementation TsFilePanelView
+
+- (void)resizeSubviewsWithOldSize:(NSSize)size
+{
+    [super resizeSubviewsWithOldSize:size];
+    [(TsUIFilePanel*)[self window] placeParts];
+}
+
+@end
+
+namespace
+{
+constexpr CGFloat kMargin = 8;
+constexpr CGFloat kControlHeight = 26;
+constexpr CGFloat kButtonWidth = 90;
+constexpr CGFloat kSmallestWidth = 560;
+constexpr CGFloat kListBeyondSmallest = 190; // points, in the size that the panel opens in
+constexpr CGFloat kRowHeight = 20;
+constexpr CGFloat kFontSize = 13;
+
+NSButton* makeButton(NSString* title, id target, SEL action)
+{
+    NSButton* button = [[[NSButton alloc] initWithFrame:NSMakeRect(0, 0, kButtonWidth, 28)] autorelease];
+    [button setTitle:title];
+    [button setBezelStyle:NSRoundedBezelStyle];
+    [button setFont:[NSFont systemFontOfSize:kFontSize]];
+    [button setTarget:target];
+    [button setAction:action];
+    return button;
+}
+
+NSTextField* makeLabel(NSString* text, NSRect frame)
+{
+    NSTextField* label = [[[NSTextField alloc] initWithFrame:frame] autorelease];
+    [label setStringValue:text];
+    [label setFont:[NSFont systemFontOfSize:kFontSize]];
+    [label setEditable:NO];
+    [label setSelectable:NO];
+    [label setBordered:NO];
+    [label setBezeled:NO];
+    [label setDrawsBackground:NO];
+    return label;
+}
+
+NSView* makeRow(NSView* content)
+{
+    NSView* row =
+        [[[NSView alloc] initWithFrame:NSMakeRect(0, 0, NSWidth([content bounds]), 40)] autorelease];
+    [row setAutoresizesSubviews:YES];
+    [content addSubview:row];
+    return row;
+}
+
+// In the middle of its row; `fromRight`: `x` is the distance of its right edge from the row's.
+void place(NSView* view, NSView* row, CGFloat x, CGFloat width, CGFloat height, bool fromRight = false)
+{
+    const NSRect bounds = [row bounds];
+    const CGFloat left = fromRight ? NSWidth(bounds) - x - width : x;
+    [view setFrame:NSMakeRect(left, (NSHeight(bounds) - height) / 2, width, height)];
+    [view setAutoresizingMask:fromRight ? NSViewMinXMargin : NSViewMaxXMargin];
+    [row addSubview:view];
+}
+
+NSTableColumn* makeColumn(NSString* identifier, CGFloat width, NSCell* cell)
+{
+    NSTableColumn* column = [[[NSTableColumn alloc] initWithIdentifier:identifier] autorelease];
+    [[column headerCell] setAlignment:NSLeftTextAlignment];
+    [[column headerCell] setFont:[NSFont systemFontOfSize:12]];
+    [cell setFont:[NSFont systemFontOfSize:12]];
+    [cell setLineBreakMode:NSLineBreakByTruncatingTail];
+    [column setDataCell:cell];
+    [column setEditable:NO];
+    [column setMinWidth:60];
+    [column setWidth:width];
+    return column;
+}
+
+NSTextFieldCell* makeTextCell()
+{
+    return [[[NSTextFieldCell alloc] initTextCell:@""] autorelease];
+}
+} // namespace
+
+@implementation TsUIFilePanel (Parts)
+
+- (void)makeWayRowIn:(NSView*)row
+{
+    place(makeButton(@"Up", self, @selector(goUp:)), row, kMargin, 56, kControlHeight);
+    place(makeButton(@"Home", self, @selector(goHome:)), row, kMargin + 60, 66, kControlHeight);
+    mRecent = [[[NSPopUpButton alloc] initWithFrame:NSMakeRect(0, 0, 100, 26) pullsDown:YES] autorelease];
+    [mRecent setFont:[NSFont systemFontOfSize:kFontSize]];
+    [mRecent setTarget:self];
+    [mRecent setAction:@selector(goToRecent:)];
+    [mRecent setToolTip:@"The folders used last"];
+    const CGFloat left = kMargin + 132;
+    mWay = [[[TsPathBar alloc] initWithFrame:NSZeroRect] autorelease];
+    [mWay setTarget:self action:@selector(goToStep:)];
+    place(mWay, row, left, NSWidth([row bounds]) - left - 100 - 2 * kMargin, kControlHeight);
+    [mWay setAutoresizingMask:NSViewWidthSizable];
+    place(mRecent, row, kMargin, 100, kControlHeight, true);
+}
+
+- (void)makeListIn:(NSView*)content
+{
+    NSScrollView* frame = [[[NSScrollView alloc] initWithFrame:NSMakeRect(0, 0, 700, 200)] autorelease];
+    [frame setBorderType:NSBezelBorder];
+    [frame setHasVerticalScroller:YES];
+    [frame setHasHorizontalScroller:NO];
+    mTable = [[[TsFileTable alloc] initWithFrame:[[frame contentView] bounds]] autorelease];
+    [mTable addTableColumn:makeColumn(@"name", 400, [[[TsFileNameCell alloc] initTextCell:@""] autorelease])];
+    [mTable addTableColumn:makeColumn(@"kind", 110, makeTextCell())];
+    [mTable addTableColumn:makeColumn(@"date", 150, makeTextCell())];
+    [mTable setRowHeight:kRowHeight];
+    [mTable setAllowsColumnReordering:NO];
+    [mTable setAllowsColumnSelection:NO];
+    [mTable setAllowsEmptySelection:YES];
+    [mTable setDrawsGrid:NO];
+    [self markSortedColumn];
+    [mTable setPanel:self];
+    [mTable setDataSource:self];
+    [mTable setDelegate:self];
+    [frame setDocumentView:mTable];
+    [content addSubview:frame];
+}
+
+- (void)makeNameRowIn:(NSView*)row
+{
+    place(makeLabel(@"Name:", NSZeroRect), row, 16, 48, 18);
+    mName = [[[NSTextField alloc] initWithFrame:NSZeroRect] autorelease];
+    [mName setFont:[NSFont systemFontOfSize:kFontSize]];
+    [mName setDelegate:(id)self];
+    [[mName cell] setSendsActionOnEndEditing:NO];
+    [[mName cell] setScrollable:YES];
+    place(mName, row, 66, NSWidth([row bounds]) - 66 - 130 - kMargin, 24);
+    [mName setAutoresizingMask:NSViewWidthSizable];
+    mHidden = [[[NSButton alloc] initWithFrame:NSZeroRect] autorelease];
+    [mHidden setButtonType:NSSwitchButton];
+    [mHidden setTitle:@"Hidden files"];
+    [mHidden setFont:[NSFont systemFontOfSize:kFontSize]];
+    [mHidden setTarget:self];
+    [mHidden setAction:@selector(toggleHidden:)];
+    place(mHidden, row, kMargin, 118, 20, true);
+}
+
+// Straight in the content view: whoever uses the panel puts a button of its own beside them.
+- (void)makeButtonsIn:(NSView*)content
+{
+    const CGFloat right = NSWidth([content bounds]) - kMargin - kButtonWidth;
+    mOK = makeButton(@"Open", self, @selector(ok:));
+    [mOK setTag:kTsUIFilePanelDefaultButton];
+    [mOK setKeyEquivalent:@"\r"];
+    mCancel = makeButton(@"Cancel", self, @selector(cancel:));
+    [mCancel setTag:kTsUIFilePanelCancelButton];
+    NSButton* spare = makeButton(@"", nil, nullptr);
+    [spare setTag:kTsUIFilePanelSpareButton];
+    [spare setHidden:YES];
+    [spare setFrameOrigin:NSMakePoint(kMargin, 7)];
+    [spare setAutoresizingMask:NSViewMaxXMargin | NSViewMaxYMargin];
+    [mOK setFrameOrigin:NSMakePoint(right, 7)];
+    [mCancel setFrameOrigin:NSMakePoint(right - kButtonWidth - kMargin, 7)];
+    for (NSButton* button : {mCancel, mOK})
+        [button setAutoresizingMask:NSViewMinXMargin | NSViewMaxYMargin];
+    for (NSButton* button : {spare, mOK, mCancel})
+        [content addSubview:button];
+    [self setDefaultButtonCell:[mOK cell]];
+}
+
+- (void)makeParts
+{
+    NSView* content = [[[TsFilePanelView alloc] initWithFrame:[[self contentView] frame]] autorelease];
+    [self setContentView:content];
+    [self makeWayRowIn:makeRow(content)];
+    [self makeListIn:content];
+    [self makeNameRowIn:makeRow(content)];
+    [self makeButtonsIn:content];
+    [self setContentMinSize:NSMakeSize(kSmallestWidth, smallestHeight(0))];
+    [self placeParts];
+}
+
+// The names get what the other columns leave. The toolkit counts the space between columns as part of them.
+- (void)fitColumns
+{
+    const CGFloat available = NSWidth([[[mTable enclosingScrollView] contentView] bounds]);
+    CGFloat others = 0;
+    for (NSTableColumn* column : tsuiEach<NSTableColumn*>([mTable tableColumns]))
+        others += [column width];
+    NSTableColumn* name = [[mTable tableColumns] objectAtIndex:0];
+    [name setWidth:std::max([name minWidth], [name width] + available - others)];
+}
+
+- (void)placeParts
+{
+    const NSSize size = [[self contentView] bounds].size;
+    const Layout layout = layoutFor(size.height, mAccessoryHeight);
+    const auto put = [&](NSView* view, Extent extent, CGFloat margin)
+    { [view setFrame:NSMakeRect(margin, extent.bottom, size.width - 2 * margin, extent.height)]; };
+    put([mWay superview], layout.ways, 0);
+    put([mTable enclosingScrollView], layout.list, kMargin);
+    put([mName superview], layout.name, 0);
+    if (mAccessory)
+        put(mAccessory, layout.accessory, 0);
+    [self fitColumns];
+    [[self contentView] setNeedsDisplay:YES];
+}
+
+// The list keeps its usual height above the view.
+- (void)growFor:(NSView*)accessory
+{
+    const NSSize asked = [accessory frame].size;
+    mAccessoryHeight = asked.height;
+    NSView* content = [self contentView];
+    // Before the buttons below it, for the order of the Tab key.
+    [content addSubview:accessory
+             positioned:NSWindowBelow
+             relativeTo:[content viewWithTag:kTsUIFilePanelSpareButton]];
+    [accessory setAutoresizingMask:NSViewWidthSizable];
+    const CGFloat width = std::max(asked.width, kSmallestWidth);
+    const CGFloat smallest = smallestHeight(asked.height);
+    [self setContentMinSize:NSMakeSize(width, smallest)];
+    const CGFloat shown = NSWidth([[self contentView] bounds]);
+    [self setContentSize:NSMakeSize(std::max(shown, width), smallest + kListBeyondSmallest)];
+}
+
+// No higher and no wider than the screen, and in its middle.
+- (void)fitOnScreen
+{
+    const NSRect screen = [[NSScreen mainScreen] visibleFrame];
+    NSRect frame = [self frame];
+    frame.size.width = std::min(NSWidth(frame), NSWidth(screen));
+    frame.size.height = std::min(NSHeight(frame), NSHeight(screen));
+    frame.origin.x = NSMidX(screen) - NSWidth(frame) / 2;
+    frame.origin.y = NSMidY(screen) - NSHeight(frame) / 2;
+    [self setFrame:NSIntegralRect(frame) display:NO];
+}
+
+@end

@@ -1,0 +1,93 @@
+// The host's own file panel: a table of the files of one folder, the way to that folder, and a field for
+// names.
+//
+// It has the interface of the toolkit's panel and none of its inside. What it decides without a window is in
+// the plain files beside it; this class puts them together. Main thread only.
+#pragma once
+
+#import <AppKit/AppKit.h>
+
+#include <cstddef>
+
+@class TsFileTable;
+@class TsPathBar;
+
+namespace tessel::filepanel
+{
+struct PanelState;
+}
+
+@interface TsUIFilePanel : NSOpenPanel <NSTableViewDataSource, NSTableViewDelegate>
+{
+    tessel::filepanel::PanelState* mState;
+    TsFileTable* mTable;
+    TsPathBar* mWay;
+    NSPopUpButton* mRecent;
+    NSTextField* mName;
+    NSButton* mHidden;
+    NSButton* mOK;
+    NSButton* mCancel;
+    NSView* mAccessory;
+    CGFloat mAccessoryHeight; // what it asked for when it came
+    NSTimer* mWatch;
+    NSInteger mUpdates; // more than 0 while rows are selected by the panel itself
+    BOOL mChoosesFolders;
+    BOOL mChoosesSeveral;
+}
+@end
+
+// FilePanel+Parts.mm
+@interface TsUIFilePanel (Parts)
+- (void)makeParts;
+- (void)placeParts;
+- (void)growFor:(NSView*)accessory;
+- (void)fitOnScreen;
+@end
+
+// FilePanel+Listing.mm: what the table lists.
+@interface TsUIFilePanel (Listing)
+// Reads the folder that is wanted, unless that is the one that shows; asks the delegate in any case.
+- (void)bringUpToDate;
+- (void)bringUpToDateSoon;
+- (void)forgetPendingWork;
+- (void)listFolder:(NSString*)folder;
+// The same folder again, with its place kept.
+- (void)listAgain;
+- (void)lookForChanges:(NSTimer*)timer;
+- (void)sortBy:(NSString*)column;
+- (void)markSortedColumn;
+- (BOOL)isListed:(NSString*)path;
+@end
+
+// FilePanel+Choosing.mm: which files are chosen, by rows or by typed names.
+@interface TsUIFilePanel (Choosing)
+- (void)rowsWereChosen;
+- (void)chooseTyped;
+// Chooses again after the list has changed.
+- (void)chooseAgain;
+- (void)showSelectedRows:(NSIndexSet*)rows;
+- (NSString*)typedText;
+- (void)beginTyping:(NSString*)text;
+// What double-click and Return do.
+- (void)takeDefaultAction;
+// Goes into the folder that is all that is selected or typed, and answers whether there is one.
+- (BOOL)goIntoFolder;
+- (BOOL)tellOfMissingFile;
+- (void)updateDefaultButton;
+// The row whose name begins with the letters, or -1.
+- (NSInteger)rowBeginningWith:(NSString*)letters from:(std::size_t)row;
+- (void)dragSelectionFrom:(NSView*)view withEvent:(NSEvent*)event;
+@end
+
+// FilePanel+Going.mm: from folder to folder.
+@interface TsUIFilePanel (Going)
+- (void)goTo:(NSString*)folder;
+- (IBAction)goUp:(id)sender;
+- (IBAction)goHome:(id)sender;
+- (IBAction)goToStep:(id)sender;
+- (IBAction)goToRecent:(id)sender;
+- (IBAction)toggleHidden:(id)sender;
+- (BOOL)takeKey:(NSEvent*)event;
+- (void)showRecentFolders;
+- (void)rememberFolder;
+@end

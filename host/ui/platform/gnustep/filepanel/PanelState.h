@@ -1,0 +1,38 @@
+// What the file panel knows, without its window.
+#pragma once
+
+#import <Foundation/Foundation.h>
+
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "host/ui/platform/gnustep/filepanel/Listing.h"
+
+namespace tessel::filepanel
+{
+struct PanelState
+{
+    std::string wanted;              // the folder to show
+    std::string folder;              // the one that shows
+    std::optional<std::string> seen; // its state when it was read
+    std::vector<Entry> entries;
+    Order order;
+    std::vector<std::string> chosen; // paths
+    bool isTyped = false;            // the name field was used last, not the table
+    std::string typed;               // what a person typed there, without its completion
+
+    std::string pathOf(const Entry& entry) const { return (folder == "/" ? "" : folder) + "/" + entry.name; }
+};
+
+inline std::string bytes(NSString* text)
+{
+    const char* utf8 = [text UTF8String];
+    return utf8 ? utf8 : "";
+}
+
+inline NSString* string(const std::string& bytes)
+{
+    return [NSString stringWithUTF8String:bytes.c_str()];
+}
+} // namespace tessel::filepanel

@@ -1,0 +1,23 @@
+// The panel in which files are chosen. On macOS it is the system's; elsewhere the host brings its own, with
+// the interface of the toolkit's panel.
+#pragma once
+
+#import <AppKit/AppKit.h>
+
+#include "../tessel/tsdefs.h"
+
+// Where the panel is the host's own, its buttons are found in its content view by these tags: the default
+// button, the one that cancels, and a hidden one that keeps a place at the start of their row.
+inline constexpr NSInteger kTsUIFilePanelDefaultButton = NSOKButton;
+inline constexpr NSInteger kTsUIFilePanelCancelButton = NSCancelButton;
+inline constexpr NSInteger kTsUIFilePanelSpareButton = 100;
+
+// A new file panel, autoreleased, which disturbs no other one that is open. `URLs` holds the chosen files, of
+// rows or of typed names; a folder on the way is none. Its delegate decides what is listed
+// (`panel:shouldShowFilename:`) and hears of every choice (`panelSelectionDidChange:`).
+// `validateVisibleColumns` asks it again, and keeps folder, selection and place. `runModal` ends with
+// NSOKButton unless the default button has been given another target.
+TESSEL_API NSOpenPanel* tsuiMakeFilePanel();
+
+// Tells the person in a message box when what stands in the name field names no file; answers whether it did.
+TESSEL_API bool tsuiTellOfMissingFile(NSOpenPanel* panel);

@@ -1,0 +1,138 @@
+// Ctrl-C, and the wish of the system that the program ends, once windows have been there.
+#include <csignal>
+
+#include "tests/e2e/HostTerminal.h"
+#include "tests/e2e_dialogs/DialogTest.h"
+
+namespace
+{
+class DialogSignals : public DialogTest
+{
+protected:
+    // Loads a file, so that there is something to store; answers its path.
+    std::string loadOne()
+    {
+        const std::string path = writeLisp("a.lsp");
+        setSetting("SaveHistory", "1");
+        open();
+        click(places::file(0));
+        click(places::kLoad);
+        EXPECT_TRUE(prints(wasLoaded("a.lsp")));
+        return path;
+    }
+
+    void expectGoodEnd(int signal, const std::string& path)
+    {
+        mHost->signal(signal);
+        EXPECT_EQ(mHost->waitForEnd(), 128 + signal) << mHost->output();
+        EXPECT_EQ(stored("History"), "NumHistory = 1\n1History = " + path + "\n");
+        EXPECT_EQ(storedSetting("SaveHistory"), "1\n");
+    }
+};
+} // namespace
+
+TEST_F(DialogSignals, EndAHostWithItsDialogOpen)
+{
+    for (const int signal : {SIGTERM, SIGHUP})
+        expectGoodEnd(signal, loadOne());
+}
+
+TEST_F(DialogSignals, EndAHostWithWindowsOverItsDialog)
+{
+    const std::string path = loadOne();
+    click(places::kContents);
+    const std::string suite = mScreen.waitForWindow(kSuiteDialog);
+    ASSERT_FALSE(suite.empty());
+    ASSERT_TRUE(mScreen.waitUntilActive(suite));
+    mScreen.click(suite, places::kAdd);
+    ASSERT_FALSE(mScreen.waitForWindow(kAddPanel).empty());
+    expectGoodEnd(SIGTERM, path);
+}
+
+TEST_F(DialogSignals, EndAHostWithAMessageBoxOverItsDialog)
+{
+    mSession.folder().write("files/broken.zmb", "no module");
+    const std::string path = loadOne();
+    click(places::file(1));
+    click(places::kLoad);
+    ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty());
+    expectGoodEnd(SIGTERM, path);
+}
+
+TEST_F(DialogSignals, EndAHostThatShowsAListOfFileTypes)
+{
+    const std::string path = loadOne();
+    mScreen.press(mDialog, places::kFileTypes);
+    shoot("choosing");
+    expectGoodEnd(SIGTERM, path);
+}
+
+TEST_F(DialogSignals, EndAHostThatReadsFromAPipeAfterItsDialog)
+{
+    open();
+    mScreen.key("Escape");
+    EXPECT_TRUE(mScreen.waitUntilGone(kDialog));
+    mHost->signal(SIGTERM);
+    EXPECT_EQ(mHost->waitForEnd(), 128 + SIGTERM) << mHost->output();
+}
+
+TEST_F(DialogSignals, LetAHostReadOnFromAPipeAfterCtrlC)
+{
+    open();
+    mScreen.key("Escape");
+    EXPECT_TRUE(mScreen.waitUntilGone(kDialog));
+    mHost->signal(SIGINT);
+    mHost->type("(+ 30 12)");
+    EXPECT_TRUE(prints("\n42\n"));
+    mHost->signal(SIGINT);
+    EXPECT_THAT(end(), testing::HasSubstr("Command: QUIT"));
+}
+
+TEST_F(DialogSignals, StopLispAndClearTheLineAfterADialogToo)
+{
+    HostTerminal terminal(mSession);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("MODRIG\r");
+    mDialog = mScreen.waitForWindow(kDialog);
+    ASSERT_FALSE(mDialog.empty()) << terminal.screen();
+    ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
+    mScreen.key("Escape");
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("(progn (princ \"be\") (princ \"gun\") (loop))\r");
+    ASSERT_TRUE(terminal.shows("begun")) << terminal.screen();
+    terminal.type(kControlC);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("rubbish");
+    ASSERT_TRUE(terminal.shows("rubbish")) << terminal.screen();
+    terminal.type(kControlC);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("(+ 30 12)\r");
+    EXPECT_TRUE(terminal.shows("\n42")) << terminal.screen();
+    kill(terminal.process(), SIGTERM);
+    EXPECT_EQ(terminal.waitForEnd(), 128 + SIGTERM);
+}
+
+// At a terminal a message box is a window, and may be the first one.
+TEST_F(DialogSignals, EndAHostAfterAMessageBoxOfItsStart)
+{
+    storeSuite({mSession.folder().write("broken.zmb", "no module").string()});
+    HostTerminal terminal(mSession);
+    ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty()) << terminal.screen();
+    mScreen.key("Return");
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("(loop)\r");
+    terminal.type(kControlC);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    kill(terminal.process(), SIGTERM);
+    EXPECT_EQ(terminal.waitForEnd(), 128 + SIGTERM);
+}
+
+TEST_F(DialogSignals, EndAHostThatShowsAMessageBoxOfItsStart)
+{
+    storeSuite({mSession.folder().write("broken.zmb", "no module").string(),
+                mSession.folder().write("second.zmb", "no module").string()});
+    HostTerminal terminal(mSession);
+    ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty()) << terminal.screen();
+    kill(terminal.process(), SIGTERM);
+    EXPECT_EQ(terminal.waitForEnd(), 128 + SIGTERM);
+}

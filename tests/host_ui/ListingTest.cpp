@@ -1,0 +1,148 @@
+#include <gmock/gmock.h>
+
+#include "host/ui/platform/gnustep/filepanel/Listing.h"
+#include "tests/support/TemporaryFolder.h"
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+using testing::UnorderedElementsAre;
+using namespace tessel::filepanel;
+
+namespace
+{
+std::vector<std::string> namesOf(const std::vector<Entry>& entries)
+{
+    std::vector<std::string> names;
+    for (const Entry& entry : entries)
+        names.push_back(entry.name);
+    return names;
+}
+
+Entry file(const std::string& name, std::time_t changed = 0)
+{
+    return {name, sortKey(name), false, false, changed};
+}
+
+Entry folder(const std::string& name)
+{
+    return {name, sortKey(name), true, false, 0};
+}
+
+std::vector<std::string> sorted(std::vector<Entry> entries, Order order)
+{
+    sortEntries(entries, order);
+    return namesOf(entries);
+}
+} // namespace
+
+TEST(Listing, HoldsTheFilesOfTheFolderAndHiddenOnesWhenAsked)
+{
+    const TemporaryFolder place;
+    place.write("a.lsp", "");
+    place.write(".hidden.lsp", "");
+    place.write("sub/inside.lsp", "");
+    EXPECT_THAT(namesOf(readFolder(place.path(), false)), UnorderedElementsAre("a.lsp", "sub"));
+    EXPECT_THAT(namesOf(readFolder(place.path(), true)),
+                UnorderedElementsAre("a.lsp", ".hidden.lsp", "sub"));
+    EXPECT_THAT(readFolder(place / "gone", true), IsEmpty());
+}
+
+TEST(Listing, KnowsFoldersAndLinksToThem)
+{
+    const TemporaryFolder place;
+    place.write("sub/inside.lsp", "");
+    place.write("a.lsp", "");
+    std::filesystem::create_symlink(place / "sub", place / "link");
+    std::filesystem::create_symlink(place / "gone", place / "broken");
+    for (const Entry& entry : readFolder(place.path(), false))
+        EXPECT_EQ(entry.name == "sub" || entry.name == "link", entry.isFolder) << entry.name;
+}
+
+TEST(Listing, IsSortedByNameWhateverTheCaseAndNumbersByTheirValue)
+{
+    EXPECT_THAT(sorted({file("b.lsp"), file("file10"), file("A.lsp"), file("file9"), file("file009a")}, {}),
+                ElementsAre("A.lsp", "b.lsp", "file9", "file009a", "file10"));
+}
+
+TEST(Listing, HasFoldersFirstInEveryOrder)
+{
+    for (const Column column : {Column::kName, Column::kKind, Column::kDate})
+        for (const bool descending : {false, true})
+            EXPECT_EQ("zoo", sorted({file("a.lsp"), folder("zoo"), file("b.lsp")}, {column, descending})[0]);
+    Entry package = folder("a.bundle");
+    package.isPackage = true;
+    EXPECT_THAT(sorted({package, folder("zoo")}, {}), ElementsAre("zoo", "a.bundle"));
+}
+
+TEST(Listing, IsSortedByKindAndByDateWithNamesAmongEquals)
+{
+    const std::vector<Entry> files = {file("b.zmb", 5), file("c.lsp", 1), file("a.zmb", 5)};
+    EXPECT_THAT(sorted(files, {Column::kKind, false}), ElementsAre("c.lsp", "a.zmb", "b.zmb"));
+    EXPECT_THAT(sorted(files, {Column::kDate, false}), ElementsAre("c.lsp", "a.zmb", "b.zmb"));
+    EXPECT_THAT(sorted(files, {Column::kDate, true}), ElementsAre("a.zmb", "b.zmb", "c.lsp"));
+    EXPECT_THAT(sorted(files, {Column::kName, true}), ElementsAre("c.lsp", "b.zmb", "a.zmb"));
+}
+
+TEST(Listing, TurnsItsOrderRoundWithTheSecondClickOnAHeader)
+{
+    Order order = afterClickOn(Column::kDate, {});
+    EXPECT_EQ(Column::kDate, order.column);
+    EXPECT_FALSE(order.descending);
+    order = afterClickOn(Column::kDate, order);
+    EXPECT_TRUE(order.descending);
+    EXPECT_FALSE(afterClickOn(Column::kDate, order).descending);
+    EXPECT_FALSE(afterClickOn(Column::kName, order).descending);
+}
+
+TEST(Listing, NamesKinds)
+{
+    EXPECT_EQ("LSP file", kindOf(file("a.lsp")));
+    EXPECT_EQ("File", kindOf(file("README")));
+    EXPECT_EQ("File", kindOf(file(".profile")));
+    EXPECT_EQ("File", kindOf(file("a.")));
+    EXPECT_EQ("Folder", kindOf(folder("sub.lsp")));
+    Entry package = folder("a.bundle");
+    package.isPackage = true;
+    EXPECT_EQ("Package", kindOf(package));
+}
+
+TEST(Listing, ShowsOddNamesInOneLine)
+{
+    EXPECT_EQ("a\\nb\\x1B.lsp", shownName("a\nb\x1B.lsp"));
+    EXPECT_EQ("Grün.lsp", shownName("Grün.lsp"));
+    EXPECT_TRUE(isUtf8("Grün \U0001F600.lsp"));
+    EXPECT_FALSE(isUtf8("bad\xE9.lsp"));
+    EXPECT_FALSE(isUtf8("cut\xC3"));
+    EXPECT_FALSE(isUtf8("\xC0\xAF"));
+}
+
+TEST(Listing, FindsTheRowOfTheFirstLettersAndGoesRound)
+{
+    const std::vector<Entry> files = {file("alpha"), file("beta"), file("Bravo"), file("charlie")};
+    EXPECT_EQ(1u, rowBeginningLike(files, "b", 0));
+    EXPECT_EQ(2u, rowBeginningLike(files, "b", 2));
+    EXPECT_EQ(1u, rowBeginningLike(files, "b", 3));
+    EXPECT_EQ(2u, rowBeginningLike(files, "BR", 0));
+    EXPECT_EQ(std::nullopt, rowBeginningLike(files, "x", 0));
+    EXPECT_EQ(std::nullopt, rowBeginningLike({}, "x", 0));
+}
+
+TEST(Listing, KeepsThePlaceOfARowThatGoes)
+{
+    const std::vector<Entry> before = {file("a"), file("b"), file("c"), file("d")};
+    EXPECT_EQ(2u, rowInPlaceOf(before, 1, {file("a"), file("aa"), file("b"), file("d")}));
+    EXPECT_EQ(1u, rowInPlaceOf(before, 1, {file("a"), file("c"), file("d")})) << "the next one that is left";
+    EXPECT_EQ(0u, rowInPlaceOf(before, 3, {file("a")}));
+    EXPECT_EQ(0u, rowInPlaceOf(before, 3, {}));
+}
+
+TEST(Listing, NoticesWhatComesIntoItsFolder)
+{
+    const TemporaryFolder place;
+    const auto before = stateOf(place.path());
+    EXPECT_EQ(before, stateOf(place.path()));
+    std::filesystem::last_write_time(place.path(), std::filesystem::file_time_type::clock::now() -
+                                                       std::chrono::hours(1));
+    EXPECT_NE(before, stateOf(place.path()));
+    EXPECT_EQ(std::nullopt, stateOf(place / "gone"));
+}
