@@ -10,8 +10,8 @@ inline constexpr int kRowHeight = 20;
 // The main dialog
 inline constexpr int kDialogWidth = 750;
 inline constexpr Place kFileTypes{230, 375};
-inline constexpr Place kAddToHistory{385, 375};
-inline constexpr Place kLoad{676, 375};
+inline constexpr Place kAddToHistory{632, 405};
+inline constexpr Place kLoad{640, 376};
 inline constexpr Place kLoadedTab{100, 410};
 inline constexpr Place kHistoryTab{214, 410};
 inline constexpr Place kUnload{475, 631};

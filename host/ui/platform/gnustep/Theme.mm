@@ -20,13 +20,22 @@ NSBundle* chosenTheme(NSString* lightTheme)
         bundleWithPath:isDark ? [beside stringByAppendingPathComponent:@"TesselDark.theme"] : lightTheme];
 }
 
+// Low four bits: no rounding of how far letters stand apart. Rounded for one pixel a point, they would run into
+// each other on a screen of two. The next four: no other change of their shapes.
+constexpr int kFontHinting = 0x11;
+
+void registerDefault(id value, NSString* key)
+{
+    [[NSUserDefaults standardUserDefaults] registerDefaults:[NSDictionary dictionaryWithObject:value
+                                                                                        forKey:key]];
+}
+
 void use(NSBundle* bundle)
 {
     GSTheme* theme = [[[TesselTheme alloc] initWithBundle:bundle] autorelease];
     [GSTheme setTheme:theme];
     // Whenever a user default changes, the toolkit goes back to the theme that the defaults name.
-    [[NSUserDefaults standardUserDefaults] registerDefaults:[NSDictionary dictionaryWithObject:[theme name]
-                                                                                        forKey:@"GSTheme"]];
+    registerDefault([theme name], @"GSTheme");
     NSString* resources = [bundle resourcePath];
     sharpenControls(resources);
     useFileIcons(resources);
@@ -39,8 +48,10 @@ void useTheme(NSString* folder)
     NSBundle* bundle = folder ? chosenTheme(folder) : nil;
     if (!bundle)
         return;
+    registerDefault([NSNumber numberWithInt:kFontHinting], @"GSFontHinting");
     use(bundle);
     completeButtons();
+    completePopUps();
     completeTables();
     completeToolTips();
     showWhereTheKeyboardIs();

@@ -3,6 +3,7 @@
 
 #include <tesselui/tsuieach.h>
 
+#include "host/ui/platform/gnustep/ThemePictures.h"
 #import "host/ui/platform/gnustep/filepanel/FileNameCell.h"
 #import "host/ui/platform/gnustep/filepanel/FilePanel.h"
 #import "host/ui/platform/gnustep/filepanel/FileTable.h"
@@ -29,11 +30,9 @@ NSString* dateText(std::time_t date)
     return [NSString stringWithUTF8String:text];
 }
 
-TsFileIcon iconOf(const Entry& entry)
+NSImage* iconOf(const Entry& entry)
 {
-    if (!entry.isFolder)
-        return TsDocumentIcon;
-    return entry.isPackage ? TsPackageIcon : TsFolderIcon;
+    return tessel::windowing::iconOfFile(string(entry.name), entry.isFolder);
 }
 
 Column columnOf(NSString* identifier)
@@ -215,7 +214,7 @@ NSString* titleOf(NSString* identifier)
     {
         NSString* title = titleOf([column identifier]);
         const bool isSorted = columnOf([column identifier]) == mState->order.column;
-        NSString* mark = mState->order.descending ? @"  \u25BE" : @"  \u25B4";
+        NSString* mark = string(mState->order.descending ? "  \u2193" : "  \u2191");
         [[column headerCell] setStringValue:isSorted ? [title stringByAppendingString:mark] : title];
     }
     [[mTable headerView] setNeedsDisplay:YES];
