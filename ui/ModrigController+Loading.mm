@@ -43,7 +43,7 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
 {
     const bool panelHasSelection = [[mOpenPanel URLs] count] > 0;
     const bool historyHasSelection = [[historyList selectedObjects] count] > 0;
-    switch (ModrigUtils::SourceForLoad([mSelectedFiles count] > 0, panelHasSelection, historyHasSelection))
+    switch (ModrigUtils::SourceWithoutChoice(panelHasSelection, historyHasSelection))
     {
     case ModrigUtils::LoadSource::kPanel:
         return [self panelSelectionDidChange:mOpenPanel];
@@ -53,17 +53,18 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
         NSBeep();
         self.message = [TsOCModrigUtil modrigLoadString:@"IDS_MODRIG_NOTHING_CHOSEN"];
         return;
-    case ModrigUtils::LoadSource::kChosenFiles:
-        return;
     }
 }
 
 - (IBAction)onLoad:(id)sender
 {
     (void)sender;
-    if ([mSelectedFiles count] == 0 && tsuiTellOfMissingFile(mOpenPanel))
-        return;
-    [self chooseWhatIsStillSelected];
+    if ([mSelectedFiles count] == 0)
+    {
+        if (tsuiTellOfMissingFile(mOpenPanel))
+            return;
+        [self chooseWhatIsStillSelected];
+    }
     if ([self openTesselFolder])
         return;
     [self loadApps:mSelectedFiles successedApps:nil addToStartupSuit:NO];

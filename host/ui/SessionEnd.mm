@@ -50,8 +50,8 @@ NSEvent* releaseOfTheMouse()
 
 - (NSArray*)modes
 {
-    return [NSArray arrayWithObjects:NSModalPanelRunLoopMode, NSEventTrackingRunLoopMode,
-                                     NSDefaultRunLoopMode, nil];
+    return [NSArray
+        arrayWithObjects:NSModalPanelRunLoopMode, NSEventTrackingRunLoopMode, NSDefaultRunLoopMode, nil];
 }
 
 - (void)watch:(int)descriptor

@@ -8,9 +8,9 @@
 
 // Where the panel is the host's own, its buttons are found in its content view by these tags: the default
 // button, the one that cancels, and a hidden one that keeps a place at the start of their row.
-inline constexpr NSInteger kTsUIFilePanelDefaultButton = NSOKButton;
-inline constexpr NSInteger kTsUIFilePanelCancelButton = NSCancelButton;
-inline constexpr NSInteger kTsUIFilePanelSpareButton = 100;
+inline constexpr NSInteger kTsUIFilePanelDefaultButton = 100;
+inline constexpr NSInteger kTsUIFilePanelCancelButton = 101;
+inline constexpr NSInteger kTsUIFilePanelSpareButton = 102;
 
 // What an accessory view implements that can be less high than it comes: on a low screen the host's own panel makes
 // it so, after its list has given way, down to this height in points.

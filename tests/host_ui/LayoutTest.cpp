@@ -11,8 +11,7 @@ constexpr double kAccessory = 336;
 void expectStacked(const Layout& layout, double height)
 {
     double edge = 0;
-    for (const Extent& extent :
-         {layout.buttons, layout.accessory, layout.name, layout.list, layout.ways})
+    for (const Extent& extent : {layout.buttons, layout.accessory, layout.name, layout.list, layout.ways})
     {
         EXPECT_EQ(edge, extent.bottom);
         edge += extent.height;

@@ -42,8 +42,7 @@ TEST(Listing, HoldsTheFilesOfTheFolderAndHiddenOnesWhenAsked)
     place.write(".hidden.lsp", "");
     place.write("sub/inside.lsp", "");
     EXPECT_THAT(namesOf(readFolder(place.path(), false)), UnorderedElementsAre("a.lsp", "sub"));
-    EXPECT_THAT(namesOf(readFolder(place.path(), true)),
-                UnorderedElementsAre("a.lsp", ".hidden.lsp", "sub"));
+    EXPECT_THAT(namesOf(readFolder(place.path(), true)), UnorderedElementsAre("a.lsp", ".hidden.lsp", "sub"));
     EXPECT_THAT(readFolder(place / "gone", true), IsEmpty());
 }
 
@@ -141,8 +140,8 @@ TEST(Listing, NoticesWhatComesIntoItsFolder)
     const TemporaryFolder place;
     const auto before = stateOf(place.path());
     EXPECT_EQ(before, stateOf(place.path()));
-    std::filesystem::last_write_time(place.path(), std::filesystem::file_time_type::clock::now() -
-                                                       std::chrono::hours(1));
+    std::filesystem::last_write_time(place.path(),
+                                     std::filesystem::file_time_type::clock::now() - std::chrono::hours(1));
     EXPECT_NE(before, stateOf(place.path()));
     EXPECT_EQ(std::nullopt, stateOf(place / "gone"));
 }

@@ -7,10 +7,8 @@ bool PanelSelectionCounts(PanelChange change, bool panelIsEmpty, bool chosenInHi
     return change == PanelChange::kChoice || !panelIsEmpty || !chosenInHistory;
 }
 
-LoadSource SourceForLoad(bool filesAreChosen, bool panelHasSelection, bool historyHasSelection)
+LoadSource SourceWithoutChoice(bool panelHasSelection, bool historyHasSelection)
 {
-    if (filesAreChosen)
-        return LoadSource::kChosenFiles;
     if (panelHasSelection)
         return LoadSource::kPanel;
     return historyHasSelection ? LoadSource::kHistory : LoadSource::kNothing;

@@ -17,13 +17,12 @@ bool PanelSelectionCounts(PanelChange change, bool panelIsEmpty, bool chosenInHi
 
 enum class LoadSource
 {
-    kChosenFiles,
     kPanel,
     kHistory,
     kNothing
 };
 
-// Where Load takes its files from. When the last change left no file chosen, as removing rows from the
-// History does, what is still selected elsewhere is meant.
-LoadSource SourceForLoad(bool filesAreChosen, bool panelHasSelection, bool historyHasSelection);
+// Where Load takes its files from when the last change left none chosen, as removing rows from the History
+// does: what is still selected elsewhere is meant.
+LoadSource SourceWithoutChoice(bool panelHasSelection, bool historyHasSelection);
 } // namespace ModrigUtils

@@ -27,17 +27,10 @@ TEST(ChosenFiles, AreThoseThatTheFileTypeLeavesSelected)
     EXPECT_TRUE(PanelSelectionCounts(PanelChange::kFileType, false, false));
 }
 
-TEST(ChosenFiles, AreLoadedWhateverElseIsSelected)
-{
-    for (const bool panel : {false, true})
-        for (const bool history : {false, true})
-            EXPECT_EQ(LoadSource::kChosenFiles, SourceForLoad(true, panel, history));
-}
-
 TEST(ChosenFiles, AreWhatIsStillSelectedWhenNoneAreLeft)
 {
-    EXPECT_EQ(LoadSource::kPanel, SourceForLoad(false, true, false));
-    EXPECT_EQ(LoadSource::kPanel, SourceForLoad(false, true, true));
-    EXPECT_EQ(LoadSource::kHistory, SourceForLoad(false, false, true));
-    EXPECT_EQ(LoadSource::kNothing, SourceForLoad(false, false, false));
+    EXPECT_EQ(LoadSource::kPanel, SourceWithoutChoice(true, false));
+    EXPECT_EQ(LoadSource::kPanel, SourceWithoutChoice(true, true));
+    EXPECT_EQ(LoadSource::kHistory, SourceWithoutChoice(false, true));
+    EXPECT_EQ(LoadSource::kNothing, SourceWithoutChoice(false, false));
 }
