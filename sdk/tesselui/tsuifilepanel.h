@@ -12,8 +12,8 @@ inline constexpr NSInteger kTsUIFilePanelDefaultButton = 100;
 inline constexpr NSInteger kTsUIFilePanelCancelButton = 101;
 inline constexpr NSInteger kTsUIFilePanelSpareButton = 102;
 
-// What an accessory view implements that can be less high than it comes: on a low screen the host's own panel makes
-// it so, after its list has given way, down to this height in points.
+// What an accessory view implements that can be less high than it comes: on a low screen the host's own panel
+// makes it so, after its list has given way, down to this height in points.
 @protocol TsUILowAccessory
 - (CGFloat)tsuiSmallestHeight;
 @end

@@ -1,5 +1,5 @@
-// Whether every window can be seen, reached and read, at its smallest, its usual and a large size, in this language
-// and in one whose words are half as long again. The program is run at several scales.
+// Whether every window can be seen, reached and read, at its smallest, its usual and a large size, in this
+// language and in one whose words are half as long again. The program is run at several scales.
 #include "tests/ui/support/DialogTest.h"
 #include "tests/ui/support/LayoutCheck.h"
 
@@ -19,6 +19,13 @@ namespace
 const NSSize kLarge = {1600, 1000};
 const NSSize kLowScreen = {800, 600};
 constexpr CGFloat kTitleBar = 24;
+
+// Not the window: the display of the tests is small at the scales of high resolutions, and would limit it.
+void resize(NSWindow* window, NSSize size)
+{
+    [[window contentView] setFrameSize:size];
+    [[window contentView] display];
+}
 
 // A piece of a window of its own, whose faults are known.
 class LayoutCheck : public testing::Test
@@ -80,8 +87,7 @@ private:
         const NSSize usual = [[window contentView] frame].size;
         for (const NSSize size : {kLarge, [window contentMinSize], usual})
         {
-            [window setContentSize:size];
-            [window display];
+            resize(window, size);
             EXPECT_THAT(layoutFaults([window contentView]), IsEmpty())
                 << language << ", " << size.width << " by " << size.height;
         }
@@ -164,11 +170,12 @@ TEST_F(Layout, OfTheMainDialogFitsALowScreen)
 TEST_F(Layout, OfTheMainDialogKeepsTheTablesAsLongAsTheListOfFilesCanGiveWay)
 {
     open();
+    const NSSize usual = {740, 728};
+    resize(mPanel, usual);
     const CGFloat table = NSHeight([[loadedTable() enclosingScrollView] frame]);
-    const NSSize usual = [[mPanel contentView] frame].size;
-    [mPanel setContentSize:NSMakeSize(usual.width, usual.height - 150)];
+    resize(mPanel, NSMakeSize(usual.width, usual.height - 150));
     EXPECT_EQ(table, NSHeight([[loadedTable() enclosingScrollView] frame]));
-    [mPanel setContentSize:[mPanel contentMinSize]];
+    resize(mPanel, [mPanel contentMinSize]);
     EXPECT_LT(NSHeight([[loadedTable() enclosingScrollView] frame]), table);
     EXPECT_GT(NSHeight([[loadedTable() enclosingScrollView] frame]), 90);
 }
@@ -199,13 +206,21 @@ TEST_F(Layout, OfTheAddPanelHasRoomForEverything)
 TEST_F(Layout, OfAMessageBoxHasRoomForEverything)
 {
     open();
-    const ModalSteps steps({[] { tsuiShowMessageBox(L"/a/folder/module.bundle could not be loaded.", 0, nullptr); },
+    const wchar_t* text = L"/a/folder/module.bundle could not be loaded.";
+    const ModalSteps steps({[text] { tsuiShowMessageBox(text, 0, nullptr); },
                             [this]
                             {
                                 EXPECT_NE(mPanel, [NSApp modalWindow]);
                                 EXPECT_THAT(layoutFaults([[NSApp modalWindow] contentView]), IsEmpty());
                                 [NSApp stopModal];
                             },
-                            [] { [NSApp stopModal]; }});
+                            // The box's run has to be over before its window's can end.
+                            [this]
+                            {
+                                if ([NSApp modalWindow] != mPanel)
+                                    return false;
+                                [NSApp stopModal];
+                                return true;
+                            }});
     [NSApp runModalForWindow:mPanel];
 }

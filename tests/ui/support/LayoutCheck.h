@@ -6,8 +6,8 @@
 #include <string>
 #include <vector>
 
-// What is wrong below the view, a sentence each: controls that overlap or stand outside of what they are in, texts
-// for which there is no room.
+// What is wrong below the view, a sentence each: controls that overlap or stand outside of what they are in,
+// texts for which there is no room.
 std::vector<std::string> layoutFaults(NSView* view);
 
 // Makes every text below the view half as long again, as it is in other languages.

@@ -8,12 +8,12 @@ namespace
 {
 using Faults = std::vector<std::string>;
 
-constexpr CGFloat kTolerance = 1;      // of a point: frames are rounded to pixels
-constexpr CGFloat kButtonPadding = 6;  // on each side of a title
-constexpr CGFloat kSwitchWidth = 20;   // of the box before its title
-constexpr CGFloat kPopUpPadding = 28;  // the arrow, and the space around it and the title
-constexpr CGFloat kHeaderPadding = 6;  // of a column's title
-constexpr CGFloat kTabPadding = 28;    // of the label of a tab
+constexpr CGFloat kTolerance = 1;     // of a point: frames are rounded to pixels
+constexpr CGFloat kButtonPadding = 6; // on each side of a title
+constexpr CGFloat kSwitchWidth = 20;  // of the box before its title
+constexpr CGFloat kPopUpPadding = 28; // the arrow, and the space around it and the title
+constexpr CGFloat kHeaderPadding = 6; // of a column's title
+constexpr CGFloat kTabPadding = 28;   // of the label of a tab
 constexpr CGFloat kTabStart = 20;
 
 std::string nameOf(NSView* view)
@@ -31,7 +31,8 @@ std::string nameOf(NSView* view)
 
 CGFloat widthOf(NSString* text, NSFont* font)
 {
-    return [text sizeWithAttributes:[NSDictionary dictionaryWithObject:font forKey:NSFontAttributeName]].width;
+    return
+        [text sizeWithAttributes:[NSDictionary dictionaryWithObject:font forKey:NSFontAttributeName]].width;
 }
 
 CGFloat heightOf(NSString* text, NSFont* font, CGFloat width)
@@ -81,8 +82,7 @@ void checkLabel(Faults& faults, NSTextField* label)
 {
     const NSSize available = [label frame].size;
     if (![[label cell] wraps])
-        return needsWidth(faults, label, [label stringValue],
-                          widthOf([label stringValue], [label font]),
+        return needsWidth(faults, label, [label stringValue], widthOf([label stringValue], [label font]),
                           available.width);
     const CGFloat needed = heightOf([label stringValue], [label font], available.width + kTolerance);
     if (needed > available.height + kTolerance)
@@ -214,7 +214,8 @@ void lengthenText(NSView* view)
 // A word of letters: patterns as "(*.lsp)" and names of files stay as they are in every language.
 bool isWord(NSString* word)
 {
-    return [word rangeOfString:@"*"].location == NSNotFound && [word rangeOfString:@"/"].location == NSNotFound;
+    return
+        [word rangeOfString:@"*"].location == NSNotFound && [word rangeOfString:@"/"].location == NSNotFound;
 }
 } // namespace
 

@@ -74,8 +74,8 @@ CheckSpace toolkitCheckSpace;
 using SetFrameSize = void (*)(id, SEL, NSSize);
 SetFrameSize toolkitSetFrameSize;
 
-// Asked whenever the size changes, from the first one on. The buttons would take clicks where nothing is drawn;
-// a knob and its track are what people expect.
+// Asked whenever the size changes, from the first one on. The buttons would take clicks where nothing is
+// drawn; a knob and its track are what people expect.
 void checkSpace(id scroller, SEL selector)
 {
     if ([scroller arrowsPosition] != NSScrollerArrowsNone)

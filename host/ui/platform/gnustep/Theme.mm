@@ -20,8 +20,8 @@ NSBundle* chosenTheme(NSString* lightTheme)
         bundleWithPath:isDark ? [beside stringByAppendingPathComponent:@"TesselDark.theme"] : lightTheme];
 }
 
-// Low four bits: no rounding of how far letters stand apart. Rounded for one pixel a point, they would run into
-// each other on a screen of two. The next four: no other change of their shapes.
+// Low four bits: no rounding of how far letters stand apart. Rounded for one pixel a point, they would run
+// into each other on a screen of two. The next four: no other change of their shapes.
 constexpr int kFontHinting = 0x11;
 
 void registerDefault(id value, NSString* key)

@@ -1,4 +1,5 @@
-// Pictures that are sharp on screens of one, two and three pixels a point: name.png, name@2x.png, name@3x.png.
+// Pictures that are sharp on screens of one, two and three pixels a point: name.png, name@2x.png,
+// name@3x.png.
 #pragma once
 
 #import <AppKit/AppKit.h>

@@ -1,5 +1,5 @@
-// The toolkit starts the title of a pop-up button at its very edge, and has an arrow of another kind for a list of
-// actions than for a choice. Drawn here instead.
+// The toolkit starts the title of a pop-up button at its very edge, and has an arrow of another kind for a
+// list of actions than for a choice. Drawn here instead.
 #include "host/ui/platform/gnustep/StandIn.h"
 #include "host/ui/platform/gnustep/ThemeButtons.h"
 

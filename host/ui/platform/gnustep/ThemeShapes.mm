@@ -154,8 +154,8 @@ void drawScrollKnob(NSRect knob, bool horizontal)
 {
     if (NSIsEmptyRect(knob))
         return;
-    const NSRect shape =
-        horizontal ? NSInsetRect(knob, kBorderWidth, kKnobInset) : NSInsetRect(knob, kKnobInset, kBorderWidth);
+    const NSRect shape = horizontal ? NSInsetRect(knob, kBorderWidth, kKnobInset)
+                                    : NSInsetRect(knob, kKnobInset, kBorderWidth);
     [themeColor(@"scrollKnobColor") set];
     [rounded(shape, kKnobCorner) fill];
 }

@@ -1,5 +1,5 @@
-// The toolkit makes the window of a tool tip as wide as its text, and then wraps the text in something narrower:
-// the last words are missing. Drawn here instead, with room around.
+// The toolkit makes the window of a tool tip as wide as its text, and then wraps the text in something
+// narrower: the last words are missing. Drawn here instead, with room around.
 #include <algorithm>
 #include <cmath>
 
@@ -32,8 +32,8 @@ void setText(id view, SEL selector, NSAttributedString* text)
                                                     attributes:lookOfTips()] autorelease]);
 }
 
-// The toolkit has measured the text without room around it: the window grows to the right and down, and stays on
-// the screen.
+// The toolkit has measured the text without room around it: the window grows to the right and down, and stays
+// on the screen.
 void setFrame(id window, SEL selector, NSRect frame, BOOL display)
 {
     const NSSize text = [[[window contentView] valueForKey:@"text"] size];

@@ -248,7 +248,8 @@ NSTextFieldCell* makeTextCell()
     const CGFloat width = std::max(asked.width, kSmallestWidth);
     [self setContentMinSize:NSMakeSize(width, smallestHeight([self smallestHeightOf:accessory]))];
     const CGFloat shown = NSWidth([[self contentView] bounds]);
-    [self setContentSize:NSMakeSize(std::max(shown, width), smallestHeight(asked.height) + kListBeyondSmallest)];
+    [self setContentSize:NSMakeSize(std::max(shown, width),
+                                    smallestHeight(asked.height) + kListBeyondSmallest)];
 }
 
 // No higher and no wider than the screen, and in its middle.
