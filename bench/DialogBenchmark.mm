@@ -8,6 +8,8 @@
 
 #include <cstdlib>
 #include <exception>
+#include <filesystem>
+#include <fstream>
 #include <functional>
 #include <iostream>
 #include <optional>
@@ -31,6 +33,8 @@ constexpr std::size_t kFewEntries = 1'000;
 constexpr std::size_t kManyEntries = 10'000;
 constexpr std::size_t kFewFiles = 10;
 constexpr std::size_t kManyFiles = 50;
+constexpr std::size_t kFewListed = 2'000;
+constexpr std::size_t kManyListed = 20'000;
 constexpr int kRepetitions = 15;
 
 void fillHistory(std::size_t count)
@@ -39,6 +43,17 @@ void fillHistory(std::size_t count)
     for (std::size_t i = 0; i < count; ++i)
         gHistoryList.AddTail(L"/home/user/Applications/library" + std::to_wstring(i / 100) + L"/tool" +
                              std::to_wstring(i) + L".lsp");
+}
+
+// Of the first table that is not in the accessory view; 0 without one.
+NSUInteger rowsOfTableIn(NSView* view, NSView* accessory)
+{
+    if ([view isKindOfClass:[NSTableView class]])
+        return static_cast<NSUInteger>([(NSTableView*)view numberOfRows]);
+    for (NSView* inner : tsuiEach<NSView*>([view subviews]))
+        if (const NSUInteger rows = inner == accessory ? 0 : rowsOfTableIn(inner, accessory))
+            return rows;
+    return 0;
 }
 
 // The main dialog in its panel, set up as for a run, without the run.
@@ -58,6 +73,8 @@ public:
     OpenDialog& operator=(const OpenDialog&) = delete;
 
     ModrigController* controller() const { return mController; }
+    NSOpenPanel* panel() const { return mPanel; }
+    NSUInteger filesShown() const { return rowsOfTableIn([mPanel contentView], [mPanel accessoryView]); }
     NSUInteger rows(NSString* table) const
     {
         return [[[mController valueForKey:table] arrangedObjects] count];
@@ -200,6 +217,53 @@ double dropFiles(std::size_t files)
     return all ? seconds : -1;
 }
 
+// A folder of so many Lisp files, made when it is not there yet.
+NSString* folderOfFiles(std::size_t count)
+{
+    const auto folder = bench::workFolder() / ("listed" + std::to_string(count));
+    if (std::filesystem::create_directories(folder))
+        for (std::size_t i = 0; i < count; ++i)
+            std::ofstream(folder / ("tool" + std::to_string(i) + ".lsp")).put('(');
+    return ModrigUtils::StringFromPath(CStdStr(bench::wide(folder)));
+}
+
+// Shows the folder in the dialog's panel, which asks the controller about every file.
+double listFolder(std::size_t files)
+{
+    NSString* folder = folderOfFiles(files);
+    const OpenDialog dialog;
+    const double seconds = secondsInPool(
+        [&]
+        {
+            [dialog.panel() setDirectory:folder];
+            [dialog.panel() URLs];
+        });
+    return dialog.filesShown() == files ? seconds : -1;
+}
+
+// What the toolkit takes to name the files of the folder and to tell the folders among them.
+double nameFiles(std::size_t files)
+{
+    NSString* folder = folderOfFiles(files);
+    NSFileManager* manager = [NSFileManager defaultManager];
+    std::size_t found = 0;
+    const double seconds = secondsInPool(
+        [&]
+        {
+            BOOL isFolder = NO;
+            for (NSString* name : tsuiEach<NSString*>([manager contentsOfDirectoryAtPath:folder error:NULL]))
+                if ([manager fileExistsAtPath:[folder stringByAppendingPathComponent:name]
+                                  isDirectory:&isFolder])
+                    ++found;
+        });
+    return found == files ? seconds : -1;
+}
+
+std::string listing(std::size_t files)
+{
+    return "list a folder of " + std::to_string(files) + " files";
+}
+
 std::string opening(std::size_t entries)
 {
     return "open tables, History of " + std::to_string(entries);
@@ -220,6 +284,13 @@ void addBenchmarks()
     measure(bound, [] { return giveToBoundController(kManyEntries); });
     for (const std::size_t files : {kFewFiles, kManyFiles})
         measure(dropping(files), [files] { return dropFiles(files); });
+    const std::string naming = "name the files of a folder of 20000";
+    for (const std::size_t files : {kFewListed, kManyListed})
+        measure(listing(files), [files] { return listFolder(files); });
+    measure(naming, [] { return nameFiles(kManyListed); });
+    bench::addRatio({listing(kManyListed) + " / naming them", listing(kManyListed), naming, 3});
+    bench::addRatio({"list, cost per file of 20000 / of 2000", listing(kManyListed), listing(kFewListed), 2,
+                     kManyListed, kFewListed});
     bench::addRatio({opening(kManyEntries) + " / bare array controller", opening(kManyEntries), bare, 2});
     bench::addRatio(
         {opening(kManyEntries) + " / the same with a table bound", opening(kManyEntries), bound, 2});

@@ -10,7 +10,7 @@ namespace ModrigUtils
 {
 namespace
 {
-// A compiled module is asked for once; a Lisp file is evaluated anew at every start. Whatever else stands in
+// A compiled module is asked for once; a Lisp file is evaluated again at every start. Whatever else stands in
 // the Suite goes to the loader too, which says what is wrong with it.
 void LoadStartupApplication(const CStdStr& path)
 {

@@ -10,7 +10,7 @@ namespace ModrigUtils
 inline constexpr bool kSayWhyNot = true;
 inline constexpr bool kResolveNow = true;
 
-// The linker service, looked up anew for every call of it: what loading runs may replace it. Null in a host
+// The linker service, looked up again for every call of it: what loading runs may replace it. Null in a host
 // without one.
 TsRxDynamicLinker* HostLinker();
 

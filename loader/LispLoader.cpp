@@ -21,7 +21,7 @@ CStdStr ConcatenateLisp(const wchar_t* before, const CStdStr& middle, const wcha
     return CStdStr(before) + middle + CStdStr(after);
 }
 
-// Where slashes are rewritten from: behind the second backslash among the first four characters, or from the
+// Where slashes are rewritten from: after the second backslash among the first four characters, or from the
 // head. The two are counted, not looked for side by side: a path with backslashes at 1 and 3 counts as well.
 std::size_t EndOfNetworkPrefix(const std::wstring& path)
 {
@@ -32,7 +32,7 @@ std::size_t EndOfNetworkPrefix(const std::wstring& path)
     return 0;
 }
 
-// A double quote would end the Lisp string early and let the rest of a file's name run as code. One behind a
+// A double quote would end the Lisp string early and let the rest of a file's name run as code. One after a
 // backslash that escapes it already is left alone: one more would escape the backslash instead.
 std::wstring EscapeQuotes(const std::wstring& text)
 {

@@ -42,7 +42,7 @@ public:
     CStdStr& TrimLeft(wchar_t character);
     CStdStr& TrimRight(wchar_t character);
 
-    // The text behind the last dot of the whole string, folders included: what the module takes for the
+    // The text after the last dot of the whole string, folders included: what the module takes for the
     // extension of an application file. Empty without a dot; `HasDot` tells the difference.
     CStdStr AfterLastDot() const;
     bool HasDot() const;

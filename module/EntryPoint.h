@@ -1,4 +1,4 @@
-// The module's life: what the host calls, and the start-up behind it.
+// The module's life: what the host calls, and the start-up that follows.
 #pragma once
 
 #include <tessel/tsrx.h>

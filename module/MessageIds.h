@@ -1,4 +1,4 @@
-// The ids of the texts in the resource module ModrigRes.dll. The comment behind each says what its one
+// The ids of the texts in the resource module ModrigRes.dll. The comment after each says what its one
 // placeholder stands for, if it has one.
 #pragma once
 

@@ -40,6 +40,6 @@ const CExtInfo* FindExtension(const CStdStr& ext);
 // The kind that goes with an extension given without its dot, in any case; kNoApplication when there is none.
 int FileType(CStdStr ext);
 
-// The kind of the file at the path, by the text behind the path's last dot.
+// The kind of the file at the path, by the text after the path's last dot.
 int FileTypeOfPath(const CStdStr& path);
 } // namespace ModrigUtils

@@ -42,11 +42,14 @@ NSDragOperation operationFor(id<NSDraggingInfo> info)
                  proposedRow:(NSInteger)row
        proposedDropOperation:(NSTableViewDropOperation)operation
 {
-    (void)table;
-    (void)row;
-    if (operation == NSTableViewDropOn)
+    // Below the rows a toolkit may propose the table as a whole, which is no row.
+    const bool belowTheRows = row < 0 && table == loadedAppsTableView;
+    if (operation == NSTableViewDropOn && !belowTheRows)
         return NSDragOperationNone;
-    return operationFor(info);
+    const NSDragOperation accepted = operationFor(info);
+    if (belowTheRows && accepted != NSDragOperationNone)
+        [table setDropRow:[table numberOfRows] dropOperation:NSTableViewDropAbove];
+    return accepted;
 }
 
 // NO in any case: the rows appear as the files are loaded, and the table has nothing to show of its own.

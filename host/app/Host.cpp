@@ -44,7 +44,7 @@ std::wstring wideText(const std::filesystem::path& path)
 struct Host::Parts
 {
     Layout layout = runningLayout();
-    ApplicationServices application;
+    std::optional<ApplicationServices> application;
     std::optional<Registry> registry;
     std::optional<SystemVariables> variables;
     CallingApplication callingApplication;
@@ -111,11 +111,11 @@ bool Host::prepareProfileFolder()
 // What is stored, and what is read from it before any application can ask.
 void Host::makeStore()
 {
-    services().application = &mParts->application;
+    services().application = &mParts->application.emplace(wideText(mOptions.profileFolder));
     services().registry = &mParts->registry.emplace(mOptions.profileFolder / kRegistryFile);
     if (const std::wstring& problem = mParts->registry->problem(); !problem.empty())
         mCommandLine.say(problem);
-    ensureCurrentProfile(*mParts->registry, mParts->application.productRegistryRoot());
+    ensureCurrentProfile(*mParts->registry, mParts->application->productRegistryRoot());
     services().variables = &mParts->variables.emplace();
     services().removingTsLisp = mParts->variables->number(kRemovingTsLisp) != 0;
 }
@@ -224,6 +224,7 @@ std::vector<std::wstring> Host::commandNames() const
     for (const auto& record : allApplicationRecords())
         for (const auto& command : record.commands)
             names.push_back(command.second);
+    mParts->registry->storeSoFar(); // the next command is to read what is stored by then
     std::ranges::sort(names);
     names.erase(std::unique(names.begin(), names.end()), names.end());
     return names;

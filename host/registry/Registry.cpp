@@ -53,6 +53,7 @@ Registry::Key Registry::find(std::wstring_view path, Key from)
 {
     if (!mDatabase)
         return kNoKey;
+    beginReading();
     Key key = from;
     while (!path.empty() && key != kNoKey)
     {
@@ -96,6 +97,7 @@ LONG Registry::create(std::wstring_view path, Key from, Key& key)
         if (const LONG status = createChild(parent, part, key); status != ERROR_SUCCESS)
             return status;
     }
+    mOpenedForWriting.insert(key);
     return ERROR_SUCCESS;
 }
 
@@ -104,6 +106,7 @@ std::vector<std::wstring> Registry::subKeys(Key key)
     std::vector<std::wstring> names;
     if (!mDatabase)
         return names;
+    beginReading();
     Statement& list = mStatements->subKeys;
     list.bind(key);
     while (isRow(list.step()))
@@ -125,6 +128,7 @@ LONG Registry::readValue(Key key, std::wstring_view name, std::wstring& data)
 {
     if (!mDatabase)
         return ERROR_FILE_NOT_FOUND;
+    lookInto(key);
     Statement& read = mStatements->readValue;
     const int status = read.bind(key).bind(foldCase(name)).step();
     if (!isRow(status))
@@ -156,6 +160,7 @@ LONG Registry::valueName(Key key, DWORD index, std::wstring& name)
 {
     if (!mDatabase)
         return ERROR_NO_MORE_ITEMS;
+    lookInto(key);
     const bool next = mCursor.key == key && index == mCursor.index + 1;
     Statement& find = next || index == 0 ? mStatements->nextValue : mStatements->valueAt;
     find.bind(key).bind(next ? mCursor.sequence : std::int64_t{index});
@@ -173,6 +178,7 @@ std::vector<Registry::Value> Registry::values(Key key)
     std::vector<Value> found;
     if (!mDatabase)
         return found;
+    lookInto(key);
     Statement& list = mStatements->values;
     list.bind(key);
     while (isRow(list.step()))
@@ -201,11 +207,30 @@ LONG Registry::beginWriting()
         return ERROR_ACCESS_DENIED;
     if (mFailure != ERROR_SUCCESS)
         return mFailure;
-    if (!sqlite3_get_autocommit(mDatabase))
+    if (mWriting)
         return ERROR_SUCCESS;
+    // What was read by now is of a moment that may be over; the writes are to stand on what is stored now.
+    commit();
     mWrites = 0;
     const int status = mStatements->begin.run();
-    return status == SQLITE_DONE ? ERROR_SUCCESS : fail(status, L"written");
+    mWriting = status == SQLITE_DONE;
+    return mWriting ? ERROR_SUCCESS : fail(status, L"written");
+}
+
+// Where this fails, the reading that follows says so.
+void Registry::beginReading()
+{
+    if (sqlite3_get_autocommit(mDatabase))
+        static_cast<void>(mStatements->beginReading.run());
+}
+
+// What is seen in a key before it is written must still hold when it is. A lock that cannot be had makes the
+// writes fail, not the look.
+void Registry::lookInto(Key key)
+{
+    if (mOpenedForWriting.contains(key))
+        static_cast<void>(beginWriting());
+    beginReading();
 }
 
 LONG Registry::finishWrite(int status)
@@ -234,18 +259,27 @@ bool Registry::isRow(int status)
 LONG Registry::fail(int status, const wchar_t* done)
 {
     if (mFailure != ERROR_SUCCESS)
+    {
+        rollBack();
         return mFailure;
+    }
     mFailure = statusOf(status);
     // Flushing leaves no words behind.
     const bool hasWords = sqlite3_errcode(mDatabase) != SQLITE_OK;
     const char* words = hasWords ? sqlite3_errmsg(mDatabase) : sqlite3_errstr(status);
     mFailureWords = std::wstring(L" could not be ") + done + L": " + toWide(words);
-    // SQLite may have rolled back by itself already.
-    if (!sqlite3_get_autocommit(mDatabase))
-        mStatements->rollback.run();
+    rollBack();
     mCursor = {};
     closeHandlesOfLostKeys();
     return mFailure;
+}
+
+void Registry::rollBack()
+{
+    // SQLite may have rolled back by itself already.
+    if (!sqlite3_get_autocommit(mDatabase))
+        mStatements->rollback.run();
+    mWriting = false;
 }
 
 // The number of a key that was undone is given away again: a handle must not follow it to another key.
@@ -261,13 +295,27 @@ void Registry::closeHandlesOfLostKeys()
                   });
 }
 
+void Registry::commit()
+{
+    if (sqlite3_get_autocommit(mDatabase))
+        return;
+    if (const int status = mStatements->commit.run(); status != SQLITE_DONE)
+        fail(status, L"written");
+    mWriting = false;
+}
+
+void Registry::storeSoFar()
+{
+    if (mDatabase)
+        commit();
+}
+
 bool Registry::endOfCommand()
 {
     if (!mDatabase)
         return true;
-    if (mFailure == ERROR_SUCCESS && !sqlite3_get_autocommit(mDatabase))
-        if (const int status = mStatements->commit.run(); status != SQLITE_DONE)
-            fail(status, L"written");
+    commit();
+    mOpenedForWriting.clear();
     if (mFailure == ERROR_SUCCESS)
         return true;
     if (services().commandLine)

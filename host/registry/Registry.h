@@ -1,10 +1,13 @@
 // The registry: hierarchical keys with string values in one SQLite file per user.
 //
 // Names compare without regard to case (simple case folding) and keep the spelling they were created with;
-// keys and values are enumerated in the order of creation. The first write of a command opens a transaction
-// and `endOfCommand` commits it, so that what a command stores is stored wholly or not at all, whatever
-// happens to the process. Once the store could not be written or read, all that the command wrote is undone
-// and the rest of its writes fail too.
+// keys and values are enumerated in the order of creation. The first write of a command opens a transaction,
+// or before that its first look into a key that it has opened for writing: what is to be replaced is listed
+// inside. `endOfCommand` commits it, so that what a command stores is stored wholly or not at all, whatever
+// happens to the process and whatever other processes write. What a command reads before it writes it reads
+// as it stood at one moment, so that a list which is read value by value is one that somebody stored. Once
+// the store could not be written or read, all that the command wrote is undone and the rest of its writes
+// fail too.
 //
 // Status codes are those of the Windows-style registry calls (wincompat/wintypes.h).
 #pragma once
@@ -18,6 +21,7 @@
 #include <string>
 #include <string_view>
 #include <unordered_map>
+#include <unordered_set>
 #include <vector>
 
 struct sqlite3;
@@ -49,6 +53,8 @@ public:
 
     // Paths are relative to `from`; the parts are separated by one backslash, empty parts are passed over.
     Key find(std::wstring_view path, Key from = kRoot);
+    // Opens the key for writing, and makes it if need be. A key that is there already locks nobody out: it is
+    // the way in which everybody makes sure of a key before reading below it.
     LONG create(std::wstring_view path, Key from, Key& key);
     std::vector<std::wstring> subKeys(Key key);
     // Removes the key, its values and everything below it.
@@ -68,6 +74,10 @@ public:
     // Stores what the command wrote. When that or something before it failed, everything that the command
     // wrote is undone, one sentence says so, and the answer is false.
     bool endOfCommand();
+
+    // Stores what the command wrote so far, and reads as it stands from now on. A failure stays the
+    // command's, and is told at its end.
+    void storeSoFar();
 
     // Handles for the registry calls. A handle that is not open is recognised, never followed.
     HKEY openHandle(Key key);
@@ -90,6 +100,10 @@ private:
     Key findChild(Key parent, std::wstring_view name);
     LONG createChild(Key parent, std::wstring_view name, Key& key);
     LONG beginWriting();
+    void beginReading();
+    void lookInto(Key key);
+    void commit();
+    void rollBack();
     LONG finishWrite(int status);
     bool isRow(int status);
     LONG fail(int status, const wchar_t* done);
@@ -104,7 +118,9 @@ private:
     Cursor mCursor;
     LONG mFailure = ERROR_SUCCESS; // of the running command, its first one
     std::wstring mFailureWords;
-    unsigned mWrites = 0; // in the running transaction
+    bool mWriting = false;                     // the running transaction is one that writes
+    unsigned mWrites = 0;                      // in it
+    std::unordered_set<Key> mOpenedForWriting; // by the running command
     std::unordered_map<HKEY, Key> mHandles;
     std::uintptr_t mNextHandle;
 };

@@ -1,4 +1,5 @@
 // The Windows-style registry calls, on the running host's registry.
+#include <tessel/tssession.h>
 #include <wincompat/winreg.h>
 
 #include <cstring>
@@ -130,4 +131,15 @@ LONG tsudRegSetString(HKEY key, const wchar_t* name, const wchar_t* data)
     const Target target = targetOf(key);
     return target ? target.registry->writeValue(target.key, orEmpty(name), orEmpty(data))
                   : ERROR_INVALID_HANDLE;
+}
+
+void tsrxBeforeWaiting(bool actionIsOver)
+{
+    Registry* registry = tessel::services().registry;
+    if (!registry)
+        return;
+    if (actionIsOver)
+        static_cast<void>(registry->endOfCommand()); // it says by itself what could not be stored
+    else
+        registry->storeSoFar();
 }

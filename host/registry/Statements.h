@@ -15,7 +15,7 @@ struct Registry::Statements
 {
     Statement findKey, keyExists, insertKey, deleteKey, subKeys;
     Statement readValue, writeValue, deleteValue, values, nextValue, valueAt;
-    Statement begin, commit, rollback;
+    Statement begin, beginReading, commit, rollback;
 
     int prepare(sqlite3* database)
     {
@@ -33,6 +33,7 @@ struct Registry::Statements
             {nextValue, "SELECT seq,name FROM value WHERE key=? AND seq>? ORDER BY seq LIMIT 1"},
             {valueAt, "SELECT seq,name FROM value WHERE key=? ORDER BY seq LIMIT 1 OFFSET ?"},
             {begin, "BEGIN IMMEDIATE"},
+            {beginReading, "BEGIN"},
             {commit, "COMMIT"},
             {rollback, "ROLLBACK"}};
         for (const auto& [statement, sql] : all)

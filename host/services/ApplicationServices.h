@@ -1,6 +1,9 @@
 // What the host is, and the road to remote files.
 #pragma once
 
+#include <string>
+#include <utility>
+
 #include <tessel/tshostservices.h>
 
 namespace tessel
@@ -8,10 +11,16 @@ namespace tessel
 class ApplicationServices : public TsDbHostApplicationServices
 {
 public:
+    explicit ApplicationServices(std::wstring profileFolder) : mProfileFolder(std::move(profileFolder)) {}
+
     const wchar_t* productRegistryRoot() const override;
+    const wchar_t* profileFolder() const override { return mProfileFolder.c_str(); }
     const wchar_t* product() const override;
     bool isUrl(const wchar_t* text) const override;
     int fetchRemoteFile(const wchar_t* url, wchar_t* localPath, std::size_t capacity,
                         bool ignoreCache) override;
+
+private:
+    std::wstring mProfileFolder;
 };
 } // namespace tessel

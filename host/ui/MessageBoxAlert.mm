@@ -9,6 +9,8 @@
 #include <unistd.h>
 
 #include "host/ui/SessionEnd.h"
+#include "host/ui/Waiting.h"
+#include "host/ui/platform/Windowing.h"
 
 namespace
 {
@@ -18,27 +20,17 @@ bool somebodyIsThere()
 {
     return [NSApp modalWindow] != nil || isatty(STDIN_FILENO);
 }
-
-void runAlert(const wchar_t* text, unsigned style)
-{
-    NSAlert* alert = [[[NSAlert alloc] init] autorelease];
-    [alert setMessageText:@"Tessel"];
-    [alert setInformativeText:wcharToNSString(text)];
-    [alert setAlertStyle:style & MB_ICONEXCLAMATION ? NSWarningAlertStyle : NSInformationalAlertStyle];
-    [alert setIcon:[NSApp applicationIconImage]];
-    [alert addButtonWithTitle:@"OK"];
-    [alert runModal];
-}
 } // namespace
 
 int tsuiShowMessageBox(const wchar_t* text, unsigned style, void* parent)
 {
-    (void)parent; // the box is modal for the whole program, over whatever window is in front
+    (void)parent; // the box is modal for the whole program, over whatever window is modal already
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
     int answer = kNotShown;
     if (somebodyIsThere() && tsuiHasDisplay() && tsuiPrepareWindows() && !tessel::sessionIsToEnd())
     {
-        runAlert(text, style);
+        const tessel::Question question;
+        tessel::windowing::runMessage(wcharToNSString(text), style & MB_ICONEXCLAMATION);
         answer = IDOK;
         if (![NSApp modalWindow])
             tsuiFinishWindows();

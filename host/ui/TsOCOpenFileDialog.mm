@@ -77,10 +77,15 @@ NSTextField* makeLabel(NSString* text)
     [mPanel validateVisibleColumns];
 }
 
-- (BOOL)isFolder:(NSString*)path
+// A folder, or the host's own package, where the applications are that come with it. Other packages are
+// files.
+- (BOOL)isWalkedThrough:(NSString*)path
 {
     BOOL folder = NO;
-    return [[NSFileManager defaultManager] fileExistsAtPath:path isDirectory:&folder] && folder;
+    if (![[NSFileManager defaultManager] fileExistsAtPath:path isDirectory:&folder] || !folder)
+        return NO;
+    return ![[NSWorkspace sharedWorkspace] isFilePackageAtPath:path] ||
+           [path caseInsensitiveCompare:[[NSBundle mainBundle] bundlePath]] == NSOrderedSame;
 }
 
 - (BOOL)panel:(id)sender shouldShowFilename:(NSString*)path
@@ -91,7 +96,7 @@ NSTextField* makeLabel(NSString* text)
     for (NSString* extension : tsuiEach<NSString*>([[mFilters objectAtIndex:mChosen] fileExtensions]))
         if ([[path pathExtension] caseInsensitiveCompare:extension] == NSOrderedSame)
             return YES;
-    return [self isFolder:path];
+    return [self isWalkedThrough:path];
 }
 
 @end
@@ -154,7 +159,6 @@ NSTextField* makeLabel(NSString* text)
     [panel setDelegate:(id)chooser];
     if ([mFileFilters count])
         [panel setAccessoryView:[chooser view]];
-    [panel recalculateKeyViewLoop]; // the choice of the file type is one of the stops of the Tab key
     const bool chosen = [panel runModal] == NSOKButton;
     [mSelectedPathes release];
     mSelectedPathes = [(chosen ? [[panel URLs] valueForKey:@"path"] : [NSArray array]) copy];

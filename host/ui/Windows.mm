@@ -1,29 +1,39 @@
 #import <AppKit/AppKit.h>
 
 #include <tessel/tsformat.h>
+#include <tessel/tshostservices.h>
 #include <tesselui/tsuidisplay.h>
+#include <wincompat/winstring.h>
 
 #include "host/ui/KeptSignals.h"
 #include "host/ui/SessionEnd.h"
+#include "host/ui/Waiting.h"
 #include "host/ui/platform/Windowing.h"
 
 namespace
 {
 bool gPrepared = false;
 
+NSString* toolkitFolder()
+{
+    const TsDbHostApplicationServices* services = tsdbHostApplicationServices();
+    NSString* profile = wcharToNSString(services ? services->profileFolder() : L"");
+    return [profile stringByAppendingPathComponent:@"toolkit"];
+}
+
 void prepare()
 {
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
     const tessel::KeptSignals signals; // the display's backend would take Ctrl-C and the wish to end
+    tessel::windowing::prepareToolkit(toolkitFolder());
     tessel::windowing::chooseLook();
     [NSApplication sharedApplication];
     tessel::windowing::completeLook();
-    tessel::windowing::acceptFileDrops();
-    tessel::windowing::makeWindowsClosable();
-    tessel::windowing::letNewWindowsHaveTheKeyboard();
+    tessel::windowing::completeBehaviour();
     // The host's own loop waits for the terminal; these two are what the toolkit's would have done first.
     [NSApp finishLaunching];
     tessel::closeWindowsWhenTheSessionEnds();
+    tessel::storeBeforeEachWait();
     [pool drain];
 }
 } // namespace

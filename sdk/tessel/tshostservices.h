@@ -15,6 +15,10 @@ public:
     // "Software\\Tessel\\R21" for release 21. Valid as long as the host runs.
     virtual const wchar_t* productRegistryRoot() const = 0;
 
+    // The folder in which the host keeps everything that lasts, as a full path; it exists. An application or
+    // a toolkit that needs a place of its own makes a folder in it. Valid as long as the host runs.
+    virtual const wchar_t* profileFolder() const = 0;
+
     // The product's name as a person reads it: "Tessel".
     virtual const wchar_t* product() const = 0;
 

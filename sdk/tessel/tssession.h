@@ -1,10 +1,20 @@
-// The session as a whole: whether it is about to end.
+// The session as a whole: whether it is about to end, and where it waits for the person in front of it.
+//
+// For whoever runs a loop of their own that waits for a person; the dialogs' windows do what is said here by
+// themselves.
 #pragma once
 
 #include "tsdefs.h"
 
 // A descriptor that can be read from as soon as the session is to end: the person has left it, or the system
-// asks the program to end. -1 outside of a session. Whoever runs a loop of their own waits for it, too, does
-// not begin anything new when it speaks, and returns soon; the dialogs' windows do so by themselves. It is
-// the host's: nobody reads from it or closes it.
+// asks the program to end. -1 outside of a session. A loop waits for it, too, does not begin anything new
+// when it speaks, and returns soon. It is the host's: nobody reads from it or closes it.
 TESSEL_API int tsrxEndRequest();
+
+// Called before each wait for the person. What was written to the registry since the last call, or since the
+// command began, is stored now, so that no other session has to wait for somebody who has gone to lunch.
+//
+// `actionIsOver`: when something could not be stored, one sentence says so, and what is written from now on
+// is tried again. Otherwise the wait is a question in the midst of an action, and a failure lasts: what is
+// left of the action is not stored without what it belongs to.
+TESSEL_API void tsrxBeforeWaiting(bool actionIsOver);

@@ -60,6 +60,11 @@ TEST_F(ServicesContract, NamesTheProductAndItsKey)
     EXPECT_STREQ(services->productRegistryRoot(), L"Software\\Tessel\\R21");
 }
 
+TEST_F(ServicesContract, NamesTheFolderOfTheProfileByItsFullPath)
+{
+    EXPECT_EQ(tsdbHostApplicationServices()->profileFolder()[0], L'/');
+}
+
 TEST_F(ServicesContract, HasACurrentProfileFromItsFirstStart)
 {
     const std::wstring profiles =

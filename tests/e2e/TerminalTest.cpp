@@ -22,6 +22,19 @@ TEST(Terminal, CompletesTheNameOfACommandWithTab)
     EXPECT_TRUE(terminal.shows("Tessel R21")) << terminal.screen();
 }
 
+// Completing a name reads the registry, and what it has read is no part of the command that is being typed.
+TEST(Terminal, ReadsWhatAnotherSessionStoredWhileALineWasTyped)
+{
+    const HostSession session;
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("regis\t");
+    ASSERT_TRUE(terminal.shows("REGISTRY ")) << terminal.screen();
+    ASSERT_EQ(session.start({"--safe", "-c", "REGISTRY SET Software\\Mine name stored"}).exitStatus, 0);
+    terminal.type("GET Software\\Mine name\r");
+    EXPECT_TRUE(terminal.shows("\nstored")) << terminal.screen();
+}
+
 TEST(Terminal, ShowsTheNamesToChooseFrom)
 {
     HostSession session;

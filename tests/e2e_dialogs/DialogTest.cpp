@@ -7,7 +7,6 @@ using testing::HasSubstr;
 namespace
 {
 constexpr char kDragWindow[] = "Files to drag";
-constexpr Place kDragButton{50, 30};
 
 std::string quoted(const std::string& text)
 {
@@ -25,7 +24,7 @@ std::vector<std::string> listCommands(const std::string& list, const std::string
 }
 } // namespace
 
-DialogTest::DialogTest()
+DialogTest::DialogTest(DisplayKind kind) : mScreen(kind)
 {
     mSession.set("DISPLAY", mScreen.display());
     std::filesystem::create_directories(files());
@@ -64,6 +63,12 @@ std::string DialogTest::runQuietly(const std::vector<std::string>& commands) con
 void DialogTest::setSetting(const std::string& name, const std::string& value) const
 {
     runQuietly({std::string("REGISTRY SET ") + kSettingsKey + " " + name + " " + quoted(value)});
+}
+
+void DialogTest::setToolkitSetting(const std::string& name, const std::string& value) const
+{
+    mSession.folder().write("profile/toolkit/Defaults/NSGlobalDomain.plist",
+                            "{ " + name + " = \"" + value + "\"; }\n");
 }
 
 void DialogTest::storeHistory(const std::vector<std::string>& paths) const
@@ -144,7 +149,9 @@ void DialogTest::typeName(const std::string& name) const
 void DialogTest::shoot(const std::string& step) const
 {
     const auto* test = testing::UnitTest::GetInstance()->current_test_info();
-    mScreen.shoot(std::string(test->test_suite_name()) + "." + test->name() + "-" + step);
+    std::string name = std::string(test->test_suite_name()) + "." + test->name() + "-" + step;
+    std::ranges::replace(name, '/', '.'); // tests with parameters have one in their names
+    mScreen.shoot(name);
 }
 
 bool DialogTest::prints(const std::string& text) const
@@ -162,14 +169,24 @@ void DialogTest::dismissMessageBox() const
     EXPECT_TRUE(mScreen.waitUntilGone(kMessageBox));
 }
 
-void DialogTest::dragFiles(const std::vector<std::string>& paths, Place place,
-                           const std::function<void()>& effect) const
+std::unique_ptr<Program> DialogTest::dragSource(const std::vector<std::string>& paths) const
 {
     std::vector<std::string> arguments = {"/usr/bin/python3", DRAG_SOURCE};
     arguments.insert(arguments.end(), paths.begin(), paths.end());
-    const Program source(arguments, mScreen.environment(), mSession.folder() / "drag.txt");
-    const std::string window = mScreen.waitForWindow(kDragWindow);
-    ASSERT_FALSE(window.empty()) << source.output();
+    return std::make_unique<Program>(arguments, mScreen.environment(), mSession.folder() / "drag.txt");
+}
+
+std::string DialogTest::dragWindow() const
+{
+    return mScreen.waitForWindow(kDragWindow);
+}
+
+void DialogTest::dragFiles(const std::vector<std::string>& paths, Place place,
+                           const std::function<void()>& effect) const
+{
+    const auto source = dragSource(paths);
+    const std::string window = dragWindow();
+    ASSERT_FALSE(window.empty()) << source->output();
     mScreen.drag(window, kDragButton, mDialog, place);
     shoot("dropped");
     effect();

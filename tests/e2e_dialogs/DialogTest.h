@@ -18,14 +18,16 @@
 inline constexpr char kDialog[] = "Load/Unload Applications";
 inline constexpr char kSuiteDialog[] = "Startup Suite";
 inline constexpr char kAddPanel[] = "Add to Startup Suite";
-inline constexpr char kMessageBox[] = "Alert"; // the toolkit's title
+inline constexpr char kMessageBox[] = "Tessel";
 inline constexpr char kDialogsKey[] = R"(Software\Tessel\R21\Profiles\Default\Dialogs\Modrig)";
 inline constexpr char kSettingsKey[] = R"(Software\Tessel\R21\Profiles\Default\DialogSettings\Modrig)";
+
+inline constexpr Place kDragButton{50, 30}; // in the window that files are dragged from
 
 class DialogTest : public testing::Test
 {
 protected:
-    DialogTest();
+    explicit DialogTest(DisplayKind kind = {});
 
     // The folder that the dialog opens in, and what lies there: Lisp that prints "<name> runs".
     std::filesystem::path files() const { return mSession.folder() / "files"; }
@@ -36,6 +38,8 @@ protected:
     // Runs commands in a host that loads nothing, before or after the one with the dialog.
     std::string runQuietly(const std::vector<std::string>& commands) const;
     void setSetting(const std::string& name, const std::string& value) const;
+    // A setting of the toolkit, as the profile keeps it.
+    void setToolkitSetting(const std::string& name, const std::string& value) const;
     void storeHistory(const std::vector<std::string>& paths) const;
     void storeSuite(const std::vector<std::string>& paths) const;
     // The stored list as REGISTRY LIST shows it.
@@ -68,6 +72,9 @@ protected:
     // the effect has been waited for.
     void dragFiles(const std::vector<std::string>& paths, Place place,
                    const std::function<void()>& effect) const;
+    // The program that files are dragged from, at the left upper edge of the screen.
+    std::unique_ptr<Program> dragSource(const std::vector<std::string>& paths) const;
+    std::string dragWindow() const;
 
     Screen mScreen;
     HostSession mSession;

@@ -1,4 +1,4 @@
-// Files dragged from a program of another toolkit.
+// Files dragged from a program of another toolkit, and from the dialog's own list.
 #include "tests/e2e_dialogs/DialogTest.h"
 
 using testing::HasSubstr;
@@ -81,4 +81,107 @@ TEST_F(DialogDrop, TakesNoneOfFiftyOneFilesIntoTheStartupSuite)
 {
     dropFiftyOne(places::kStartupSuiteBox);
     EXPECT_THAT(stored("Startup"), Not(HasSubstr("many")));
+}
+
+TEST_F(DialogDrop, TakesAFileOfItsOwnListIntoTheStartupSuite)
+{
+    const std::string path = writeLisp("a.lsp");
+    open();
+    mScreen.drag(mDialog, places::file(0), mDialog, places::kStartupSuiteBox);
+    EXPECT_TRUE(prints("a.lsp was added to the Startup Suite.\n"));
+    shoot("added");
+    closeAndEnd();
+    EXPECT_EQ(stored("Startup"), listOf({path}));
+}
+
+TEST_F(DialogDrop, LoadsTwoFilesOfItsOwnListBetweenTheRowsOfTheTable)
+{
+    writeLisp("a.lsp");
+    writeLisp("b.lsp");
+    writeLisp("c.lsp");
+    open();
+    mScreen.doubleClick(mDialog, places::file(2));
+    ASSERT_TRUE(prints(wasLoaded("c.lsp")));
+    click(places::file(0));
+    mScreen.clickHolding("shift", mDialog, places::file(1));
+    const Place row = places::tableRow(0);
+    mScreen.drag(mDialog, places::file(1), mDialog, {row.x, row.y - places::kRowHeight / 2 + 1});
+    EXPECT_TRUE(prints("2 applications were loaded.\n"));
+    shoot("loaded");
+    closeAndEnd();
+}
+
+TEST_F(DialogDrop, IsTakenAnywhereInTheEmptyPartOfTheTableAfterThePointerCameOverTheRows)
+{
+    const auto paths = writeManyLisp(5);
+    open();
+    dragFiles({paths[0], paths[1]}, kTable, [this] { EXPECT_TRUE(prints("2 applications were loaded.\n")); });
+    for (const int file : {2, 3, 4})
+    {
+        const auto source = dragSource({paths[static_cast<std::size_t>(file)]});
+        mScreen.dragOver(dragWindow(), kDragButton, mDialog, places::tableRow(0));
+        for (int row = 1; row <= 3 + file / 2; ++row)
+            mScreen.moveOn(mDialog, {places::tableRow(row).x, places::tableRow(row).y + 3 * file});
+        shoot("hovering-" + std::to_string(file));
+        mScreen.letGo();
+        EXPECT_TRUE(prints(wasLoaded("many" + std::to_string(file + 1) + ".lsp")));
+    }
+    closeAndEnd();
+}
+
+TEST_F(DialogDrop, IsTakenBetweenTwoRows)
+{
+    const auto paths = writeManyLisp(3);
+    open();
+    dragFiles({paths[0], paths[1]}, kTable, [this] { EXPECT_TRUE(prints("2 applications were loaded.\n")); });
+    const Place between{places::tableRow(1).x, places::tableRow(1).y - places::kRowHeight / 2};
+    dragFiles({paths[2]}, between, [this] { EXPECT_TRUE(prints(wasLoaded("many3.lsp"))); });
+    shoot("between");
+    closeAndEnd();
+}
+
+TEST_F(DialogDrop, IsNotTakenByADialogBehindAMessageBox)
+{
+    mSession.folder().write("files/aaa.zmb", "no module");
+    const auto paths = writeManyLisp(1);
+    open();
+    click(places::file(0));
+    click(places::kLoad);
+    ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty());
+    dragFiles(paths, {kTable.x, kTable.y + 80}, [this] { shoot("refused"); });
+    dragFiles(paths, {places::kStartupSuiteBox.x, places::kStartupSuiteBox.y + 20}, [] {});
+    dismissMessageBox();
+    EXPECT_THAT(closeAndEnd(), Not(HasSubstr("many1.lsp")));
+}
+
+TEST_F(DialogDrop, LetsItsSourceGoBeforeAMessageBoxIsAnswered)
+{
+    const auto paths = writeManyLisp(51);
+    open();
+    auto source = dragSource(paths);
+    mScreen.drag(dragWindow(), kDragButton, mDialog, kTable);
+    ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty());
+    EXPECT_TRUE(comesTrue([&] { return source->output().find("has ended") != std::string::npos; }));
+    EXPECT_FALSE(mScreen.window(kMessageBox).empty());
+    source.reset(); // and it may end
+    dismissMessageBox();
+    EXPECT_THAT(closeAndEnd(), Not(HasSubstr("X-Windows")));
+}
+
+TEST_F(DialogDrop, IsShownByTheStartupSuiteBoxWhileItWouldBeTaken)
+{
+    const auto paths = writeManyLisp(1);
+    open();
+    const Place edge{places::kStartupSuiteBox.x, places::kStartupSuiteBox.y + 20};
+    const std::string before = look(edge);
+    auto source = dragSource(paths);
+    mScreen.dragOver(dragWindow(), kDragButton, mDialog, {edge.x, edge.y + 30});
+    shoot("hovering");
+    EXPECT_NE(look(edge), before);
+    mScreen.letGo();
+    EXPECT_TRUE(prints("many1.lsp was added to the Startup Suite.\n"));
+    EXPECT_TRUE(comesTrue([&] { return look(edge) == before; }));
+    shoot("taken");
+    source.reset(); // which gives the keyboard back
+    closeAndEnd();
 }

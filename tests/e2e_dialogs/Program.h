@@ -22,6 +22,8 @@ public:
     // Gives it a line to read.
     void type(const std::string& line) const;
 
+    pid_t process() const { return mProcess; }
+
     // What it has printed up to now.
     std::string output() const;
 

@@ -2,6 +2,8 @@
 
 #include <cstdio>
 #include <filesystem>
+#include <ios>
+#include <sstream>
 #include <stdexcept>
 
 #include <unistd.h>
@@ -34,7 +36,7 @@ std::string inShellQuotes(const std::string& text)
 }
 } // namespace
 
-Screen::Screen()
+Screen::Screen(DisplayKind kind) : mDisplay(kind)
 {
     mWindowManager = std::make_unique<Program>(std::vector<std::string>{"openbox"}, environment(),
                                                mFolder / "window-manager.txt");
@@ -113,12 +115,28 @@ void Screen::doubleClick(const std::string& window, Place place) const
 
 void Screen::drag(const std::string& fromWindow, Place from, const std::string& toWindow, Place to) const
 {
+    dragOver(fromWindow, from, toWindow, to);
+    letGo();
+}
+
+void Screen::moveOn(const std::string& window, Place to) const
+{
+    run("xdotool" + moveTo(window, to) + "sleep 0.2 mousemove_relative 1 1 sleep 0.3");
+}
+
+void Screen::letGo() const
+{
+    run("xdotool mouseup 1");
+}
+
+void Screen::dragOver(const std::string& fromWindow, Place from, const std::string& toWindow, Place to) const
+{
     const auto step = [](int pixels)
     {
         return " sleep 0.1 mousemove_relative " + std::to_string(pixels) + " " + std::to_string(pixels);
     };
     run("xdotool" + moveTo(fromWindow, from) + "sleep 0.2 mousedown 1 sleep 0.2" + step(20) + step(30) +
-        moveTo(toWindow, to) + "sleep 0.3" + step(2) + " sleep 0.5 mouseup 1");
+        moveTo(toWindow, to) + "sleep 0.3" + step(2) + " sleep 0.5");
 }
 
 void Screen::choose(const std::string& window, Place menu, Place item) const
@@ -140,6 +158,66 @@ void Screen::text(const std::string& text) const
 void Screen::clickCloseButton(const std::string& window, int width) const
 {
     run("xdotool" + moveTo(window, {width - kCloseButtonInward, 0}) + "mousemove_relative -- 0 -11" + kPress);
+}
+
+void Screen::setResource(const std::string& lines) const
+{
+    run("xprop -root -format RESOURCE_MANAGER 8s -set RESOURCE_MANAGER " + inShellQuotes(lines));
+}
+
+std::string Screen::sizeOf(const std::string& window) const
+{
+    const std::string geometry = run("xdotool getwindowgeometry " + window);
+    const std::string label = "Geometry: ";
+    const std::size_t start = geometry.find(label);
+    return start == std::string::npos
+               ? std::string()
+               : geometry.substr(start + label.size(), geometry.find('\n', start) - start - label.size());
+}
+
+std::string Screen::property(const std::string& window, const std::string& name) const
+{
+    const std::string line = run("xprop -notype -id " + window + " " + name);
+    for (const std::string& start : {name + " = ", name + ": "})
+        if (line.starts_with(start))
+            return line.substr(start.size(), line.find('\n') - start.size());
+    return {};
+}
+
+bool Screen::isOver(const std::string& upper, const std::string& lower) const
+{
+    const std::string fromBelow = run("xprop -root _NET_CLIENT_LIST_STACKING") + ",";
+    const auto place = [&](const std::string& window)
+    {
+        std::ostringstream hexadecimal;
+        hexadecimal << " 0x" << std::hex << std::stoul(window);
+        return fromBelow.find(hexadecimal.str());
+    };
+    return place(upper) != std::string::npos && place(lower) < place(upper);
+}
+
+Place Screen::middleOf(const std::string& window) const
+{
+    int left = 0;
+    int top = 0;
+    int width = 0;
+    int height = 0;
+    const std::string report = run("xwininfo -id " + window);
+    const auto number = [&](const std::string& label, int& value)
+    {
+        if (const std::size_t place = report.find(label); place != std::string::npos)
+            value = std::stoi(report.substr(place + label.size()));
+    };
+    number("Absolute upper-left X:", left);
+    number("Absolute upper-left Y:", top);
+    number("Width:", width);
+    number("Height:", height);
+    return {left + width / 2, top + height / 2};
+}
+
+void Screen::minimize(const std::string& window) const
+{
+    run("xdotool windowminimize " + window);
 }
 
 void Screen::shoot(const std::string& name) const

@@ -19,7 +19,7 @@ struct Place
 class Screen
 {
 public:
-    Screen();
+    explicit Screen(DisplayKind kind = {});
 
     const std::string& display() const { return mDisplay.name(); }
     std::vector<std::string> environment() const;
@@ -39,6 +39,10 @@ public:
     void doubleClick(const std::string& window, Place place) const;
     // Presses at one place and releases at another, with time for the drag to be noticed on the way.
     void drag(const std::string& fromWindow, Place from, const std::string& toWindow, Place to) const;
+    // The same in two steps, to look at what is shown while the mouse hovers.
+    void dragOver(const std::string& fromWindow, Place from, const std::string& toWindow, Place to) const;
+    void moveOn(const std::string& window, Place to) const;
+    void letGo() const;
 
     // Opens a menu and lets go over one of its items.
     void choose(const std::string& window, Place menu, Place item) const;
@@ -47,6 +51,20 @@ public:
     void text(const std::string& text) const;
     // The button in the title bar of a window of this width.
     void clickCloseButton(const std::string& window, int width) const;
+
+    // What the desktop tells its programs: lines of X resources.
+    void setResource(const std::string& lines) const;
+
+    // Width and height of the window's inside: "750x770".
+    std::string sizeOf(const std::string& window) const;
+
+    // What the window tells the desktop: the value of a property, as xprop prints it; empty when it has none.
+    std::string property(const std::string& window, const std::string& name) const;
+    // Whether the one window is nearer to the user.
+    bool isOver(const std::string& upper, const std::string& lower) const;
+    // The middle of the window's inside, on the screen.
+    Place middleOf(const std::string& window) const;
+    void minimize(const std::string& window) const;
 
     // A picture of the whole screen.
     void shoot(const std::string& name) const;

@@ -16,7 +16,7 @@ class ApplicationServices : public testing::Test
 {
 protected:
     RemoteHost host;
-    tessel::ApplicationServices services;
+    tessel::ApplicationServices services{L"/profile"};
     HttpServer server{[](const std::string&)
                       {
                           return HttpServer::Answer{httpAnswer("200 OK", "1"), "", {}};
@@ -28,6 +28,7 @@ TEST_F(ApplicationServices, TellWhatTheHostIs)
 {
     EXPECT_STREQ(services.productRegistryRoot(), L"Software\\Tessel\\R21");
     EXPECT_STREQ(services.product(), L"Tessel");
+    EXPECT_STREQ(services.profileFolder(), L"/profile");
     EXPECT_EQ(tsdbHostApplicationServices(), nullptr);
     tessel::services().application = &services;
     EXPECT_EQ(tsdbHostApplicationServices(), &services);

@@ -49,7 +49,7 @@ protected:
     }
 
     RegistryHost host;
-    tessel::ApplicationServices application;
+    tessel::ApplicationServices application{L"/profile"};
     tessel::CommandStack commands;
     tessel::CallingApplication calls;
     std::optional<tessel::CallingApplication::Scope> call;

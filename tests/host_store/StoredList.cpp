@@ -2,12 +2,18 @@
 
 #include <algorithm>
 #include <string_view>
+#include <vector>
+
+#include <sqlite3.h>
+
+#include "host/text/Unicode.h"
 
 using tessel::Registry;
 
+const wchar_t* const kListKey = L"Software\\Tessel\\R21\\Profiles\\Default\\Dialogs\\Modrig\\History";
+
 namespace
 {
-constexpr const wchar_t* kKey = L"Software\\Tessel\\R21\\Profiles\\Default\\Dialogs\\Modrig\\History";
 constexpr const wchar_t* kCount = L"NumHistory";
 constexpr int kTorn = -1;
 
@@ -25,7 +31,7 @@ std::wstring entryData(int generation, int number, std::size_t length)
 
 bool removeOld(Registry& registry)
 {
-    const Registry::Key key = registry.find(kKey);
+    const Registry::Key key = registry.find(kListKey);
     if (key == Registry::kNoKey)
         return true;
     for (const auto& value : registry.values(key))
@@ -41,22 +47,9 @@ bool isEntry(const Registry::Value& value, int generation, int number)
     return value.name == entryName(number) && data.starts_with(start) &&
            data.substr(start.size()).find_first_not_of(L'x') == data.npos;
 }
-} // namespace
 
-bool rewriteList(Registry& registry, int generation, int count, std::size_t entryLength)
+int generationOf(const std::vector<Registry::Value>& values)
 {
-    if (!removeOld(registry))
-        return false;
-    for (int number = 1; number <= count; ++number)
-        if (!registry.write(kKey, entryName(number), entryData(generation, number, entryLength)))
-            return false;
-    return registry.write(kKey, kCount, std::to_wstring(generation) + L" " + std::to_wstring(count));
-}
-
-int generationOf(Registry& registry)
-{
-    const Registry::Key key = registry.find(kKey);
-    const auto values = key == Registry::kNoKey ? std::vector<Registry::Value>() : registry.values(key);
     if (values.empty())
         return 0;
     if (values.back().name != kCount)
@@ -70,4 +63,44 @@ int generationOf(Registry& registry)
         if (!isEntry(values[i], generation, static_cast<int>(i) + 1))
             return kTorn;
     return generation;
+}
+} // namespace
+
+bool rewriteList(Registry& registry, int generation, int count, std::size_t entryLength)
+{
+    return removeOld(registry) && writeList(registry, generation, count, entryLength);
+}
+
+bool writeList(Registry& registry, int generation, int count, std::size_t entryLength)
+{
+    for (int number = 1; number <= count; ++number)
+        if (!registry.write(kListKey, entryName(number), entryData(generation, number, entryLength)))
+            return false;
+    return registry.write(kListKey, kCount, std::to_wstring(generation) + L" " + std::to_wstring(count));
+}
+
+int generationOf(Registry& registry)
+{
+    const Registry::Key key = registry.find(kListKey);
+    return generationOf(key == Registry::kNoKey ? std::vector<Registry::Value>() : registry.values(key));
+}
+
+int generationInOneLook(const std::filesystem::path& file)
+{
+    sqlite3* database = nullptr;
+    sqlite3_stmt* values = nullptr;
+    sqlite3_open(file.c_str(), &database);
+    constexpr const char* kValues = "SELECT value.name, data FROM value JOIN key ON key.id = value.key"
+                                    " WHERE key.fold = 'history' ORDER BY seq";
+    sqlite3_prepare_v2(database, kValues, -1, &values, nullptr);
+    const auto text = [&values](int column)
+    {
+        return tessel::toWide(reinterpret_cast<const char*>(sqlite3_column_text(values, column)));
+    };
+    std::vector<Registry::Value> found;
+    while (sqlite3_step(values) == SQLITE_ROW)
+        found.push_back({text(0), text(1)});
+    sqlite3_finalize(values);
+    sqlite3_close(database);
+    return generationOf(found);
 }

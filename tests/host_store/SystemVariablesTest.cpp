@@ -27,7 +27,7 @@ protected:
     }
 
     RegistryHost host;
-    tessel::ApplicationServices application;
+    tessel::ApplicationServices application{L"/profile"};
     std::unique_ptr<SystemVariables> variables;
 };
 } // namespace

@@ -50,6 +50,12 @@ TEST_F(StdStr, LoadsTheTextWhenMadeFromAnIdInsteadOfAPointer)
     EXPECT_EQ(L"last", CStdStr(IdAsPointer(65535)).Text());
 }
 
+// Nothing lies at that address, so that reading a text there ends the program; loading one would not.
+TEST_F(StdStr, TakesTheFirstAddressAfterTheIdsForAText)
+{
+    EXPECT_DEATH(CStdStr(IdAsPointer(65536)), "");
+}
+
 TEST_F(StdStr, IsEmptyWhenMadeFromAnIdThatIsMissing)
 {
     EXPECT_TRUE(CStdStr(IdAsPointer(4711)).IsEmpty());
@@ -184,11 +190,18 @@ TEST_F(StdStr, LoadsATextWholeHoweverLongItIs)
     }
 }
 
-TEST_F(StdStr, FetchesATextOfUsualLengthOnce)
+TEST_F(StdStr, FetchesATextAgainOnlyWhenItFillsTheRoom)
 {
-    CStdStr text;
-    text.Load(15);
-    EXPECT_EQ(1u, host().journal.count(L"loadStringFromWin32ResourceDLL"));
+    const std::pair<std::size_t, std::size_t> fetches[] = {
+        {1, 1}, {4094, 1}, {4095, 2}, {8190, 2}, {8191, 3}};
+    for (const auto& [length, expected] : fetches)
+    {
+        host().resources.setText(kResourceModuleName, 5000, std::wstring(length, L'x'));
+        host().journal.clear();
+        CStdStr text;
+        text.Load(5000);
+        EXPECT_EQ(expected, host().journal.count(L"loadStringFromWin32ResourceDLL")) << length;
+    }
 }
 
 TEST_F(StdStr, LoadsATextThatIsNotEmptyWhateverItsFirstCharacter)

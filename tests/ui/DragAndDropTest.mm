@@ -97,6 +97,42 @@ TEST_F(Dropping, IsRefusedOnARow)
     EXPECT_EQ(NSDragOperationNone, hover(paths({"b.lsp"}), NSTableViewDropOn));
 }
 
+TEST_F(Dropping, IsTakenBelowTheRowsAsAtTheEnd)
+{
+    for (const char* name : {"m0.zmb", "m1.zmb"})
+        gLoadedAppList.AddTail(loadedModule(name));
+    open();
+    const auto below = [this](NSTableView* table, NSArray* files)
+    {
+        return [mController tableView:table
+                         validateDrop:dragOf(files)
+                          proposedRow:-1
+                proposedDropOperation:NSTableViewDropOn];
+    };
+    EXPECT_EQ(NSDragOperationCopy, below(loadedTable(), paths({"b.lsp"})));
+    EXPECT_EQ(NSDragOperationNone, below(loadedTable(), paths({"b.txt"})));
+    EXPECT_EQ(NSDragOperationNone, below(historyTable(), paths({"b.lsp"})));
+    drop(loadedTable(), paths({"b.lsp"}), 2);
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("m0.zmb"), file("m1.zmb"), file("b.lsp")));
+}
+
+TEST_F(Dropping, IsSignedByTheStartupSuiteBoxAsLongAsItWouldBeTaken)
+{
+    open();
+    const NSUInteger parts = [[[box() superview] subviews] count];
+    const auto signs = [&] { return [[[box() superview] subviews] count] - parts; };
+    [box() draggingEntered:dragOf(paths({"a.txt"}))];
+    EXPECT_EQ(0u, signs());
+    [box() draggingEntered:dragOf(paths({"b.lsp"}))];
+    [box() draggingEntered:dragOf(paths({"b.lsp"}))];
+    EXPECT_EQ(1u, signs());
+    [box() draggingExited:dragOf(paths({"b.lsp"}))];
+    EXPECT_EQ(0u, signs());
+    [box() draggingEntered:dragOf(paths({"b.lsp"}))];
+    [box() performDragOperation:dragOf(paths({"b.lsp"}))];
+    EXPECT_EQ(0u, signs());
+}
+
 TEST_F(Dropping, IsOfferedByTheStartupSuiteBoxForOneFileThatCanBeLoaded)
 {
     open();

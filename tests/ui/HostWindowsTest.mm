@@ -4,8 +4,10 @@
 
 #import <tesselui/TsOCFileFilter.h>
 #import <tesselui/TsUIPersistentStore.h>
+#include <tesselui/tsuidisplay.h>
 #include <tesselui/tsuierrors.h>
 
+#include "host/ui/MessageBoxAlert.h"
 #include "host/ui/platform/gnustep/ThemeButtons.h"
 
 using testing::ElementsAre;
@@ -109,6 +111,65 @@ TEST(ToolkitErrors, AreAnsweredAsText)
 {
     EXPECT_EQ(L"NSRangeException: beyond the last row", wide(tsuiErrorOf(raise, nullptr)));
     EXPECT_EQ(nil, tsuiErrorOf(returnQuietly, nullptr));
+}
+
+namespace
+{
+class Waiting : public DialogTest
+{
+protected:
+    static void stop() { [NSApp stopModal]; }
+
+    // Runs a window modally, until a step stops it; what the host was told at each wait, up to its end.
+    std::vector<bool> waitsOf(const std::vector<ModalStep>& actions)
+    {
+        NSWindow* window = [[[NSWindow alloc] initWithContentRect:NSMakeRect(0, 0, 100, 40)
+                                                        styleMask:NSTitledWindowMask
+                                                          backing:NSBackingStoreBuffered
+                                                            defer:NO] autorelease];
+        [window setReleasedWhenClosed:NO];
+        const ModalSteps steps(actions);
+        [NSApp runModalForWindow:window];
+        [window orderOut:nil];
+        return host().services.waits;
+    }
+};
+} // namespace
+
+TEST_F(Waiting, OfAModalWindowEndsTheActionBefore)
+{
+    std::vector<bool> before;
+    const auto waits = waitsOf({[&] { before = host().services.waits; }, stop});
+    EXPECT_THAT(before, testing::Each(true));
+    EXPECT_GE(before.size(), 1u) << "before the first action";
+    EXPECT_GT(waits.size(), before.size()) << "after it";
+    EXPECT_THAT(waits, testing::Each(true));
+}
+
+TEST_F(Waiting, OfAMessageBoxIsWithinAnAction)
+{
+    std::vector<bool> inBox;
+    const auto waits = waitsOf({[&]
+                                {
+                                    host().services.waits.clear();
+                                    tsuiShowMessageBox(L"A question.", 0, nullptr);
+                                },
+                                [&]
+                                {
+                                    inBox = host().services.waits;
+                                    stop();
+                                },
+                                [] {}, stop});
+    EXPECT_THAT(inBox, testing::Each(false));
+    EXPECT_GE(inBox.size(), 1u);
+    EXPECT_TRUE(waits.back()) << "the box has been answered, and the action is over";
+}
+
+TEST_F(Waiting, OutsideOfModalWindowsTellsTheHostNothing)
+{
+    host().services.waits.clear();
+    tsuiFinishWindows();
+    EXPECT_THAT(host().services.waits, testing::IsEmpty());
 }
 
 TEST_F(Segments, LookDisabledWhenTheyAre)

@@ -2,6 +2,7 @@
 
 #include <objc/runtime.h>
 
+#include "host/text/Unicode.h"
 #include "module/DialogBridge.h"
 
 #import "ui/ModrigFilePath.h"
@@ -70,6 +71,7 @@ protected:
         click({folder});
         pressKey(mPanel, @"\r");
     }
+    bool isIn(const std::filesystem::path& folder) { return wide([mPanel directory]) == folder.wstring(); }
 };
 } // namespace
 
@@ -219,6 +221,7 @@ TEST_F(OpenPanel, TakesAFolderThatIsWalkedThroughForNoSelection)
                                EXPECT_EQ(0u, [[mController selectedFiles] count]);
                                EXPECT_EQ(L"", shownName());
                            },
+                           [this] { return isIn(mFolder / "folder"); },
                            [this]
                            {
                                EXPECT_EQ(0u, [[mController selectedFiles] count]);
@@ -236,8 +239,8 @@ TEST_F(OpenPanel, TakesAFolderThatIsWalkedThroughForNoSelection)
 TEST_F(OpenPanel, RemembersTheFolderThatTheUserWentTo)
 {
     mFolder.write("folder/one.zmb", "");
-    runIn(mFolder.path(), {[this] { enter(L"folder"); }, [this] { click({L"one.zmb"}); },
-                           [this] { [mController onLoad:nil]; }});
+    runIn(mFolder.path(), {[this] { enter(L"folder"); }, [this] { return isIn(mFolder / "folder"); },
+                           [this] { click({L"one.zmb"}); }, [this] { [mController onLoad:nil]; }});
     EXPECT_EQ((mFolder / "folder").wstring(), host().registry.value(kSettings, L"InitialPath"));
 }
 
@@ -342,4 +345,40 @@ TEST_F(OpenPanel, LoadsSelectedFilesInItsOwnOrder)
                                [mController panelSelectionDidChange:mPanel];
                                EXPECT_THAT(selectedFiles(), ElementsAre(file("a.zmb"), file("c.zmb")));
                            }});
+}
+
+TEST_F(OpenPanel, MovesIntoTheHostsFolderVisiblyWithLoad)
+{
+    NSString* host = [[NSBundle mainBundle] bundlePath];
+    const std::wstring name = wide([host lastPathComponent]);
+    runIn(tessel::toUtf8(wide([host stringByDeletingLastPathComponent])),
+          {[&]
+           {
+               click({name.c_str()});
+               EXPECT_THAT(selectedFiles(), ElementsAre(wide(host)));
+               [mController onLoad:nil];
+           },
+           // What lies in the program's folder there are folders only.
+           [&] { return shownFiles() == std::vector<std::wstring>{L"Resources"}; },
+           [&] { EXPECT_EQ(wide(host), wide([mPanel directory])); }});
+}
+
+TEST_F(OpenPanel, ShowsTheSameFolderForEveryTypeAlsoInAPackageThatOneHides)
+{
+    mFolder.write("tool.bundle/inner.lsp", "");
+    const std::wstring package = (mFolder / "tool.bundle").wstring();
+    runIn(package, {[this] { choose(kLispFilter); },
+                    [&]
+                    {
+                        EXPECT_EQ(package, wide([mPanel directory]));
+                        EXPECT_THAT(shownFiles(), ElementsAre(L"inner.lsp"));
+                        choose(kBundleFilter);
+                    },
+                    [&]
+                    {
+                        EXPECT_EQ(package, wide([mPanel directory]));
+                        EXPECT_THAT(shownFiles(), IsEmpty());
+                        choose(kLispFilter);
+                    },
+                    [&] { EXPECT_THAT(shownFiles(), ElementsAre(L"inner.lsp")); }});
 }

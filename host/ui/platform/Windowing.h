@@ -8,16 +8,22 @@ namespace tessel::windowing
 // Whether a display answers.
 bool displayIsReachable();
 
+// Before anything else: the folder (a path that need not exist) in which the toolkit keeps what it remembers
+// and what it complains about.
+void prepareToolkit(NSString* folder);
+
 // Before the application object is made: the look that is read once.
 void chooseLook();
 
-// After it is made, before the first window.
+// After it is made, before the first window: the look of the windows, and how they behave.
 void completeLook();
-void acceptFileDrops();
-// Lets every window be closed by its frame: file panels are cancelled then, message boxes answered.
-void makeWindowsClosable();
-// Lets a window that opens right after another has closed get the keyboard.
-void letNewWindowsHaveTheKeyboard();
+void completeBehaviour();
+
+// Calls the function whenever a loop is about to wait for an event, on the main thread. Called once.
+void callBeforeEachWait(void (*call)());
+
+// Shows a message of the host, with the sign of a warning or of mere information, until it is answered.
+void runMessage(NSString* text, bool warning);
 
 // Carries out what the screen still has to show.
 void flushScreen();

@@ -19,6 +19,11 @@ const wchar_t* RecordingApplicationServices::productRegistryRoot() const
     return registryRoot.c_str();
 }
 
+const wchar_t* RecordingApplicationServices::profileFolder() const
+{
+    return folderOfProfile.c_str();
+}
+
 const wchar_t* RecordingApplicationServices::product() const
 {
     return productName.c_str();

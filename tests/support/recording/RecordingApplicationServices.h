@@ -15,6 +15,7 @@ public:
     bool exist = true; // false: `tsdbHostApplicationServices` answers null
 
     std::wstring registryRoot = L"Software\\Tessel\\R21";
+    std::wstring folderOfProfile = L"/recorded-profile"; // of no disk
     std::wstring productName = L"Tessel";
 
     struct Remote
@@ -38,6 +39,7 @@ public:
     mutable std::vector<std::wstring> askedForUrl;
 
     const wchar_t* productRegistryRoot() const override;
+    const wchar_t* profileFolder() const override;
     const wchar_t* product() const override;
     bool isUrl(const wchar_t* text) const override; // http:// or https:// and something behind it
     int fetchRemoteFile(const wchar_t* url, wchar_t* localPath, std::size_t capacity,

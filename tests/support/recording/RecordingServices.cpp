@@ -24,3 +24,8 @@ int tsrxEndRequest()
 {
     return recordingHost().services.endRequest;
 }
+
+void tsrxBeforeWaiting(bool actionIsOver)
+{
+    recordingHost().services.waits.push_back(actionIsOver);
+}

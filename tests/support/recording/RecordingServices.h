@@ -15,7 +15,8 @@ public:
     void miss(const std::wstring& name) { set(name, nullptr); }
     void set(const std::wstring& name, TsRxObject* object) { mObjects[name] = object; }
 
-    int endRequest = -1; // tsrxEndRequest; the descriptor stays the caller's
+    int endRequest = -1;     // tsrxEndRequest; the descriptor stays the caller's
+    std::vector<bool> waits; // the calls of tsrxBeforeWaiting, and whether an action was over
 
     // The names asked for, in order.
     mutable std::vector<std::wstring> asked;

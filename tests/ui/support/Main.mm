@@ -4,6 +4,9 @@
 
 #include <gtest/gtest.h>
 
+#include "host/text/Unicode.h"
+#include "tests/support/RecordingHost.h"
+#include "tests/support/TemporaryFolder.h"
 #include "tests/ui/support/VirtualDisplay.h"
 
 #include <tesselui/tsuidisplay.h>
@@ -17,6 +20,8 @@ try
     const VirtualDisplay display;
     setenv("DISPLAY", display.name().c_str(), 1);
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    const TemporaryFolder profile;
+    recordingHost().applicationServices.folderOfProfile = tessel::toWide(profile.path().string());
     if (!tsuiPrepareWindows())
         return EXIT_FAILURE;
     const int result = RUN_ALL_TESTS();

@@ -5,12 +5,19 @@
 
 #include <sys/types.h>
 
+struct DisplayKind
+{
+    int width = 1280;
+    int height = 1024;
+    int dotsPerInch = 96;
+};
+
 // Runs an X server of its own on a free display while the object lives.
 class VirtualDisplay
 {
 public:
     // Throws std::runtime_error when the server does not start.
-    VirtualDisplay();
+    explicit VirtualDisplay(DisplayKind kind = {});
     ~VirtualDisplay();
     VirtualDisplay(const VirtualDisplay&) = delete;
     VirtualDisplay& operator=(const VirtualDisplay&) = delete;

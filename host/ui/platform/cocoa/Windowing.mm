@@ -1,5 +1,6 @@
 #include "host/ui/platform/Windowing.h"
 
+#include <CoreFoundation/CoreFoundation.h>
 #include <CoreGraphics/CoreGraphics.h>
 
 #include <tesselui/tsuifilepanel.h>
@@ -13,7 +14,13 @@ bool displayIsReachable()
     return session != nil;
 }
 
-// The platform's own look, and its own file drops.
+// A program of the platform has its settings by its bundle identifier, and its log, where the system keeps
+// them.
+void prepareToolkit(NSString*)
+{
+}
+
+// The platform's own look and behaviour.
 void chooseLook()
 {
 }
@@ -23,21 +30,41 @@ void completeLook()
     [NSApp setActivationPolicy:NSApplicationActivationPolicyRegular];
 }
 
-void acceptFileDrops()
+void completeBehaviour()
 {
+}
+
+void runMessage(NSString* text, bool warning)
+{
+    NSAlert* alert = [[[NSAlert alloc] init] autorelease];
+    [alert setMessageText:@"Tessel"];
+    [alert setInformativeText:text];
+    [alert setAlertStyle:warning ? NSWarningAlertStyle : NSInformationalAlertStyle];
+    [alert addButtonWithTitle:@"OK"];
+    [alert runModal];
 }
 
 void flushScreen()
 {
 }
 
-// No window of the platform is ended from outside, and a new one has the keyboard.
-void makeWindowsClosable()
+namespace
 {
+void onWait(CFRunLoopObserverRef, CFRunLoopActivity, void* call)
+{
+    reinterpret_cast<void (*)()>(call)();
 }
+} // namespace
 
-void letNewWindowsHaveTheKeyboard()
+// Every run of the loop waits in one of its common modes: events, modal windows, menus.
+void callBeforeEachWait(void (*call)())
 {
+    CFRunLoopObserverContext context = {};
+    context.info = reinterpret_cast<void*>(call);
+    CFRunLoopObserverRef observer =
+        CFRunLoopObserverCreate(nullptr, kCFRunLoopBeforeWaiting, true, 0, onWait, &context);
+    CFRunLoopAddObserver(CFRunLoopGetMain(), observer, kCFRunLoopCommonModes);
+    CFRelease(observer);
 }
 } // namespace tessel::windowing
 

@@ -1,5 +1,8 @@
 #include "host/ui/platform/gnustep/DisplayProbe.h"
 
+#include <algorithm>
+#include <cmath>
+#include <cstdlib>
 #include <memory>
 
 #include <X11/Xatom.h>
@@ -9,6 +12,10 @@ namespace tessel::windowing
 {
 namespace
 {
+constexpr double kUsualDotsPerInch = 96;
+constexpr double kLargestScale = 3;
+constexpr double kMillimetersPerInch = 25.4;
+
 struct CloseDisplay
 {
     void operator()(Display* display) const { XCloseDisplay(display); }
@@ -32,14 +39,31 @@ bool hasWindowManager(Display* display)
         XFree(data);
     return status == Success && count == 1;
 }
+
+double dotsPerInch(Display* display)
+{
+    if (const char* wanted = XGetDefault(display, "Xft", "dpi"))
+        if (const double dots = std::strtod(wanted, nullptr); dots > 0)
+            return dots;
+    const int screen = DefaultScreen(display);
+    const int millimeters = DisplayHeightMM(display, screen);
+    return millimeters > 0 ? DisplayHeight(display, screen) * kMillimetersPerInch / millimeters : 0;
+}
 } // namespace
+
+double scaleFor(double dotsPerInch)
+{
+    return std::clamp(std::round(dotsPerInch / kUsualDotsPerInch * 4) / 4, 1.0, kLargestScale);
+}
 
 DisplayFacts probeDisplay()
 {
     const OpenDisplay display(XOpenDisplay(nullptr));
     if (!display)
         return {};
-    return {.reachable = true, .hasWindowManager = hasWindowManager(display.get())};
+    return {.reachable = true,
+            .hasWindowManager = hasWindowManager(display.get()),
+            .dotsPerInch = dotsPerInch(display.get())};
 }
 
 void completeRequests(void* display)

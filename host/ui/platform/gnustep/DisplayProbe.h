@@ -7,7 +7,11 @@ struct DisplayFacts
 {
     bool reachable = false;
     bool hasWindowManager = false;
+    double dotsPerInch = 0; // that the desktop wants text to be drawn for; the screen's, when it says nothing
 };
+
+// How much larger than usual everything is to be, in quarters, for a screen of this resolution: from 1 to 3.
+double scaleFor(double dotsPerInch);
 
 // Connects to the display that DISPLAY names, looks, and disconnects.
 DisplayFacts probeDisplay();

@@ -88,6 +88,11 @@ std::string fetchDraggedUris()
     return {};
 }
 
+unsigned long windowEntered(const void* event)
+{
+    return static_cast<const XEvent*>(event)->xclient.window;
+}
+
 void announceDropTarget(unsigned long window)
 {
     const Connection& x = connection();

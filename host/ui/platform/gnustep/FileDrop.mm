@@ -1,6 +1,6 @@
 // Makes file drops from other programs arrive. The toolkit's X backend announces a version of the protocol
 // that other programs no longer speak, and never fetches their data; both are put right here, by standing in
-// for two of its methods. Where a later backend has no such methods, nothing is changed.
+// for some of its methods. Where a later backend has no such methods, nothing is changed.
 #import <AppKit/AppKit.h>
 #import <GNUstepGUI/GSDisplayServer.h>
 
@@ -8,7 +8,7 @@
 
 #include <tesselui/tsuieach.h>
 
-#include "host/ui/platform/Windowing.h"
+#include "host/ui/platform/gnustep/Behaviour.h"
 #include "host/ui/platform/gnustep/DisplayProbe.h"
 #include "host/ui/platform/gnustep/DropSelection.h"
 #include "host/ui/platform/gnustep/StandIn.h"
@@ -90,8 +90,27 @@ namespace
 {
 using DragEntered = void (*)(id, SEL, void*);
 using ResetDragTypes = void (*)(id, SEL, id);
+using SendEvent = void (*)(id, SEL, NSEvent*);
+using PostDragEvent = void (*)(id, SEL, NSEvent*);
 DragEntered toolkitDragEntered;
 ResetDragTypes toolkitResetDragTypes;
+SendEvent toolkitSendEvent;
+PostDragEvent toolkitPostDragEvent;
+
+// While what was dropped is dealt with, its source has heard that all is done.
+bool gSourceIsDismissed = false;
+
+unsigned long deviceOf(NSWindow* window)
+{
+    return reinterpret_cast<unsigned long>([GSServerForWindow(window) windowDevice:[window windowNumber]]);
+}
+
+// A window behind the one that waits for an answer takes nothing.
+bool isOutOfReach(unsigned long window)
+{
+    NSWindow* modal = [NSApp modalWindow];
+    return modal && deviceOf(modal) != window;
+}
 
 // The backend's method for the entering of a drag, whose source may be another program.
 void dragEntered(id view, SEL selector, void* event)
@@ -100,7 +119,7 @@ void dragEntered(id view, SEL selector, void* event)
     const Ivar variable = class_getInstanceVariable([view class], "dragPasteboard");
     if (!variable)
         return;
-    const std::string uris = fetchDraggedUris();
+    const std::string uris = isOutOfReach(windowEntered(event)) ? std::string() : fetchDraggedUris();
     id dropped = [[TsDroppedFiles alloc] initWithUriList:[NSString stringWithUTF8String:uris.c_str()]];
     [object_getIvar(view, variable) release];
     object_setIvar(view, variable, dropped);
@@ -113,10 +132,54 @@ void resetDragTypes(id server, SEL selector, id window)
     GSDisplayServer* display = GSServerForWindow(window);
     if (!display)
         return;
-    const auto device = reinterpret_cast<unsigned long>([display windowDevice:[window windowNumber]]);
     // The toolkit's own announcement has to be there first, or it would undo this one.
     completeRequests([display serverDevice]);
-    announceDropTarget(device);
+    announceDropTarget(deviceOf(window));
+}
+
+bool isDragEvent(NSEvent* event, short kind)
+{
+    return [event type] == NSAppKitDefined && [event subtype] == kind;
+}
+
+// The answer to the source that its drop has been dealt with.
+NSEvent* finishedEvent(NSEvent* drop)
+{
+    return [NSEvent otherEventWithType:NSAppKitDefined
+                              location:[drop locationInWindow]
+                         modifierFlags:0
+                             timestamp:0
+                          windowNumber:[drop windowNumber]
+                               context:[drop context]
+                               subtype:GSAppKitDraggingFinished
+                                 data1:[drop data1]
+                                 data2:0];
+}
+
+// The names of the files have been fetched when the drag came, and nothing else is wanted of its source. It
+// is answered before the files are loaded: that may end in a message box, and a program that waits for an
+// answer to its drop holds the mouse of the whole desktop.
+void sendEvent(id window, SEL selector, NSEvent* event)
+{
+    id dragged = isDragEvent(event, GSAppKitDraggingDrop) ? [GSServerForWindow(window) dragInfo] : nil;
+    if (![[dragged draggingPasteboard] isKindOfClass:[TsDroppedFiles class]])
+        return toolkitSendEvent(window, selector, event);
+    toolkitPostDragEvent(dragged, @selector(postDragEvent:), finishedEvent(event));
+    gSourceIsDismissed = true;
+    @try
+    {
+        toolkitSendEvent(window, selector, event);
+    }
+    @finally
+    {
+        gSourceIsDismissed = false;
+    }
+}
+
+void postDragEvent(id dragged, SEL selector, NSEvent* event)
+{
+    if (!gSourceIsDismissed || !isDragEvent(event, GSAppKitDraggingFinished))
+        toolkitPostDragEvent(dragged, selector, event);
 }
 
 } // namespace
@@ -124,6 +187,8 @@ void resetDragTypes(id server, SEL selector, id window)
 void acceptFileDrops()
 {
     toolkitDragEntered = standInFor("XGDragView", @selector(setupDragInfoFromXEvent:), dragEntered);
+    toolkitSendEvent = standInFor("NSWindow", @selector(sendEvent:), sendEvent);
+    toolkitPostDragEvent = standInFor("XGDragView", @selector(postDragEvent:), postDragEvent);
     toolkitResetDragTypes = standInFor("XGServer", @selector(_resetDragTypesForWindow:), resetDragTypes);
 }
 } // namespace tessel::windowing

@@ -4,7 +4,9 @@
 
 #include <dlfcn.h>
 
+#include "host/ui/platform/gnustep/Behaviour.h"
 #include "host/ui/platform/gnustep/DisplayProbe.h"
+#include "host/ui/platform/gnustep/Settings.h"
 #include "host/ui/platform/gnustep/Theme.h"
 
 namespace tessel::windowing
@@ -34,16 +36,18 @@ NSString* const kPlainFontRoles[] = {@"NSFont",        @"NSUserFont",    @"NSCon
                                      @"NSLabelFont",   @"NSMenuFont",    @"NSMessageFont",
                                      @"NSPaletteFont", @"NSToolTipsFont"};
 NSString* const kBoldFontRoles[] = {@"NSBoldFont", @"NSTitleBarFont"};
-
-void setDefaults(NSDictionary* defaults)
-{
-    [[NSUserDefaults standardUserDefaults] registerDefaults:defaults];
-}
 } // namespace
 
 bool displayIsReachable()
 {
     return probeDisplay().reachable;
+}
+
+void prepareToolkit(NSString* folder)
+{
+    keepSettingsIn(folder);
+    keepComplaintsIn(folder);
+    endHelperProgramsWithTheSession();
 }
 
 void chooseLook()
@@ -55,9 +59,20 @@ void chooseLook()
     [look setObject:@"NSMacintoshInterfaceStyle"
              forKey:@"NSScrollViewInterfaceStyle"]; // scrollers on the right
     // Without a window manager nobody else draws title bars, and the toolkit would wait for what never comes.
-    if (!probeDisplay().hasWindowManager)
+    const DisplayFacts display = probeDisplay();
+    if (!display.hasWindowManager)
         [look setObject:@"NO" forKey:@"GSBackHandlesWindowDecorations"];
-    setDefaults(look);
+    [look setObject:[NSString stringWithFormat:@"%g", scaleFor(display.dotsPerInch)] forKey:@"GSScaleFactor"];
+    suggestSettings(look);
+}
+
+void completeBehaviour()
+{
+    acceptFileDrops();
+    makeWindowsClosable();
+    letNewWindowsHaveTheKeyboard();
+    keepModalWindowsInFront();
+    keepScrollersSteady();
 }
 
 void completeLook()
@@ -71,7 +86,7 @@ void completeLook()
         [choice setObject:@"Inter-Regular" forKey:role];
     for (NSString* role : kBoldFontRoles)
         [choice setObject:@"Inter-Bold" forKey:role];
-    setDefaults(choice);
+    suggestSettings(choice);
 }
 
 void flushScreen()

@@ -5,6 +5,7 @@
 #include <tessel/tsmessagebox.h>
 #include <wincompat/winstring.h>
 
+#import "host/ui/platform/gnustep/filepanel/FileDrag.h"
 #import "host/ui/platform/gnustep/filepanel/FilePanel.h"
 #import "host/ui/platform/gnustep/filepanel/FileTable.h"
 #include "host/ui/platform/gnustep/filepanel/PanelState.h"
@@ -277,22 +278,14 @@ bool isHost(NSString* path)
     return found ? static_cast<NSInteger>(*found) : -1;
 }
 
-- (void)dragSelectionFrom:(NSView*)view withEvent:(NSEvent*)event
+- (void)dragSelectionFrom:(NSView*)view
 {
     NSArray* paths = [self filenames];
     if ([paths count] == 0)
         return;
-    NSPasteboard* pasteboard = [NSPasteboard pasteboardWithName:NSDragPboard];
-    [pasteboard declareTypes:[NSArray arrayWithObject:NSFilenamesPboardType] owner:nil];
-    [pasteboard setPropertyList:paths forType:NSFilenamesPboardType];
-    NSImage* image = [[[NSImage alloc] initWithSize:NSMakeSize(24, 24)] autorelease];
-    [view dragImage:image
-                 at:[view convertPoint:[event locationInWindow] fromView:nil]
-             offset:NSZeroSize
-              event:event
-         pasteboard:pasteboard
-             source:view
-          slideBack:NO];
+    TsFileDrag* drag = [[TsFileDrag alloc] initWithPaths:paths from:view];
+    [drag run];
+    [drag release];
 }
 
 @end

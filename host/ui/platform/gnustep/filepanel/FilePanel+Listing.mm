@@ -164,26 +164,36 @@ NSString* titleOf(NSString* identifier)
 
 - (void)bringUpToDate
 {
+    if (mState->wanted == mState->folder)
+        return;
     [self forgetPendingWork];
-    if (mState->wanted != mState->folder)
-        [self listFolder:string(mState->wanted)];
+    [self listFolder:string(mState->wanted)];
 }
 
+// Who has the delegate asked again, and sends the panel away and back as well, means one question.
 - (void)finishPendingWork
 {
-    if (mState->wanted == mState->folder)
-        [self listAgain];
-    else
+    const bool isAsked = mState->isAsked;
+    mState->isAsked = false;
+    if (mState->wanted != mState->folder)
         [self bringUpToDate];
+    else if (!isAsked)
+        [self listAgain];
 }
 
 - (void)bringUpToDateSoon
 {
-    [self forgetPendingWork];
+    [self cancelPendingWork];
     [self performSelector:@selector(finishPendingWork) withObject:nil afterDelay:0 inModes:runningModes()];
 }
 
 - (void)forgetPendingWork
+{
+    [self cancelPendingWork];
+    mState->isAsked = false;
+}
+
+- (void)cancelPendingWork
 {
     [NSObject cancelPreviousPerformRequestsWithTarget:self selector:@selector(finishPendingWork) object:nil];
 }

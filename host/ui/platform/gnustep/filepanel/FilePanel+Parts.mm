@@ -256,6 +256,10 @@ NSTextFieldCell* makeTextCell()
 - (void)fitOnScreen
 {
     const NSRect screen = [[NSScreen mainScreen] visibleFrame];
+    const NSSize inside = [self contentRectForFrameRect:screen].size;
+    const NSSize least = [self contentMinSize];
+    [self setContentMinSize:NSMakeSize(std::min(least.width, inside.width),
+                                       std::min(least.height, inside.height))];
     NSRect frame = [self frame];
     frame.size.width = std::min(NSWidth(frame), NSWidth(screen));
     frame.size.height = std::min(NSHeight(frame), NSHeight(screen));

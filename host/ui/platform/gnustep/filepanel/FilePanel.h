@@ -49,6 +49,7 @@ struct PanelState;
 // Reads the folder that is wanted, unless that is the one that shows; asks the delegate in any case.
 - (void)bringUpToDate;
 - (void)bringUpToDateSoon;
+- (void)cancelPendingWork;
 - (void)forgetPendingWork;
 - (void)listFolder:(NSString*)folder;
 // The same folder again, with its place kept.
@@ -76,7 +77,7 @@ struct PanelState;
 - (void)updateDefaultButton;
 // The row whose name begins with the letters, or -1.
 - (NSInteger)rowBeginningWith:(NSString*)letters from:(std::size_t)row;
-- (void)dragSelectionFrom:(NSView*)view withEvent:(NSEvent*)event;
+- (void)dragSelectionFrom:(NSView*)view;
 @end
 
 // FilePanel+Going.mm: from folder to folder.

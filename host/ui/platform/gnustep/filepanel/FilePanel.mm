@@ -199,6 +199,8 @@ template <class Function> Function windowMethod(SEL selector)
 - (void)validateVisibleColumns
 {
     [self listAgain];
+    mState->isAsked = true;
+    [self bringUpToDateSoon];
 }
 
 - (NSInteger)runModal
@@ -207,6 +209,7 @@ template <class Function> Function windowMethod(SEL selector)
     [self updateDefaultButton];
     [self showRecentFolders];
     [self fitOnScreen];
+    [self recalculateKeyViewLoop];
     [self makeFirstResponder:mTable];
     mWatch = [NSTimer timerWithTimeInterval:kSecondsBetweenLooks
                                      target:self

@@ -116,7 +116,7 @@ bool isText(unichar character)
     if (!waits)
         [self clickRow:row keys:keys];
     if ([self becomesDrag:event])
-        return [mPanel dragSelectionFrom:self withEvent:event];
+        return [mPanel dragSelectionFrom:self];
     if (waits)
         [self clickRow:row keys:keys];
     if ([event clickCount] == 2)

@@ -19,6 +19,7 @@ struct PanelState
     std::vector<Entry> entries;
     Order order;
     std::vector<std::string> chosen; // paths
+    bool isAsked = false;            // the delegate has been asked again while this event is handled
     bool isTyped = false;            // the name field was used last, not the table
     std::string typed;               // what a person typed there, without its completion
 

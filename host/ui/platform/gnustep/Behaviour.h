@@ -1,0 +1,24 @@
+// How the toolkit behaves here where left alone it would behave otherwise. Each is called once: the first
+// before the application object is made, the others after it, before the first window.
+#pragma once
+
+namespace tessel::windowing
+{
+// Lets the programs that the toolkit starts for itself end when this one does.
+void endHelperProgramsWithTheSession();
+
+// Takes files that are dragged here from other programs.
+void acceptFileDrops();
+
+// Lets every window be closed by its frame: file panels are cancelled then, message boxes answered.
+void makeWindowsClosable();
+
+// Lets a window that opens right after another has closed get the keyboard.
+void letNewWindowsHaveTheKeyboard();
+
+// Keeps a modal window over the one that it came from, in its middle, and all of them within reach.
+void keepModalWindowsInFront();
+
+// Lets scrollers that hide by themselves come and go at any scale.
+void keepScrollersSteady();
+} // namespace tessel::windowing

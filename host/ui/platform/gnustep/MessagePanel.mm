@@ -1,0 +1,175 @@
+// The toolkit's own alert says "Alert" in its title, leaves hardly any room around its text, and shows the
+// program's icon for a warning. A message is shown in a panel of our own instead.
+#import <AppKit/AppKit.h>
+
+#include <algorithm>
+
+#include "host/ui/platform/Windowing.h"
+#include "host/ui/platform/gnustep/TesselTheme.h"
+
+using tessel::windowing::themeColor;
+
+namespace
+{
+constexpr CGFloat kMargin = 22;
+constexpr CGFloat kIconSize = 44;
+constexpr CGFloat kIconGap = 18;
+constexpr CGFloat kWidestText = 440;
+constexpr CGFloat kNarrowestText = 220;
+constexpr CGFloat kTextHeightAllowed = 10000;
+constexpr CGFloat kFieldPadding = 6; // of a field around its text
+constexpr CGFloat kFontSize = 13;
+const NSSize kButtonSize = {88, 28};
+constexpr unichar kEscape = 033;
+
+NSBezierPath* triangleIn(NSRect frame)
+{
+    NSBezierPath* path = [NSBezierPath bezierPath];
+    [path moveToPoint:NSMakePoint(NSMidX(frame), NSMaxY(frame))];
+    [path lineToPoint:NSMakePoint(NSMaxX(frame), NSMinY(frame))];
+    [path lineToPoint:NSMakePoint(NSMinX(frame), NSMinY(frame))];
+    [path closePath];
+    [path setLineJoinStyle:NSRoundLineJoinStyle];
+    return path;
+}
+} // namespace
+
+// The sign at the left: an exclamation mark for a warning, else an i.
+@interface TsMessageSign : NSView
+{
+    BOOL mWarning;
+}
+- (id)initWithFrame:(NSRect)frame warning:(BOOL)warning;
+@end
+
+@implementation TsMessageSign
+
+- (id)initWithFrame:(NSRect)frame warning:(BOOL)warning
+{
+    if ((self = [super initWithFrame:frame]))
+        mWarning = warning;
+    return self;
+}
+
+- (void)drawMark:(NSString*)mark centeredAt:(NSPoint)center
+{
+    NSDictionary* look =
+        [NSDictionary dictionaryWithObjectsAndKeys:[NSFont boldSystemFontOfSize:24], NSFontAttributeName,
+                                                   themeColor(mWarning ? @"warningTextColor" : @"accentTextColor"),
+                                                   NSForegroundColorAttributeName, nil];
+    const NSSize size = [mark sizeWithAttributes:look];
+    [mark drawAtPoint:NSMakePoint(center.x - size.width / 2, center.y - size.height / 2) withAttributes:look];
+}
+
+- (void)drawRect:(NSRect)dirty
+{
+    (void)dirty;
+    const NSRect frame = NSInsetRect([self bounds], 4, 4);
+    NSBezierPath* shape = mWarning ? triangleIn(frame) : [NSBezierPath bezierPathWithOvalInRect:frame];
+    NSColor* fill = themeColor(mWarning ? @"warningColor" : @"accentColor");
+    [fill set];
+    [shape setLineWidth:5]; // rounds the corners
+    [shape fill];
+    [shape stroke];
+    [self drawMark:mWarning ? @"!" : @"i"
+        centeredAt:NSMakePoint(NSMidX(frame), NSMidY(frame) - (mWarning ? NSHeight(frame) / 8 : 0))];
+}
+
+@end
+
+@interface TsMessagePanel : NSPanel
+- (id)initWithText:(NSString*)text warning:(BOOL)warning;
+@end
+
+@implementation TsMessagePanel
+
+- (NSTextField*)fieldFor:(NSString*)text
+{
+    NSTextField* field = [[[NSTextField alloc] initWithFrame:NSZeroRect] autorelease];
+    [field setFont:[NSFont systemFontOfSize:kFontSize]];
+    [field setStringValue:text];
+    [field setEditable:NO];
+    [field setSelectable:NO];
+    [field setBezeled:NO];
+    [field setBordered:NO];
+    [field setDrawsBackground:NO];
+    [[field cell] setWraps:YES];
+    const NSSize size = [[field attributedStringValue]
+                            boundingRectWithSize:NSMakeSize(kWidestText - kFieldPadding, kTextHeightAllowed)
+                                         options:NSStringDrawingUsesLineFragmentOrigin]
+                            .size;
+    [field setFrameSize:NSMakeSize(std::clamp(size.width + kFieldPadding, kNarrowestText, kWidestText),
+                                   size.height + kFieldPadding)];
+    return field;
+}
+
+- (NSButton*)answerAt:(NSPoint)origin
+{
+    NSButton* button = [[[NSButton alloc]
+        initWithFrame:NSMakeRect(origin.x, origin.y, kButtonSize.width, kButtonSize.height)] autorelease];
+    [button setTitle:@"OK"];
+    [button setBezelStyle:NSRoundedBezelStyle];
+    [button setKeyEquivalent:@"\r"];
+    [button setTarget:self];
+    [button setAction:@selector(answer:)];
+    return button;
+}
+
+- (id)initWithText:(NSString*)text warning:(BOOL)warning
+{
+    NSTextField* field = [self fieldFor:text];
+    const NSSize words = [field frame].size;
+    const CGFloat height = std::max(words.height, kIconSize);
+    const NSRect content = NSMakeRect(0, 0, 2 * kMargin + kIconSize + kIconGap + words.width,
+                                      3 * kMargin + kButtonSize.height + height);
+    self = [super initWithContentRect:content
+                            styleMask:NSTitledWindowMask | NSClosableWindowMask
+                              backing:NSBackingStoreBuffered
+                                defer:NO];
+    if (!self)
+        return nil;
+    [self setTitle:@"Tessel"];
+    [self setReleasedWhenClosed:NO];
+    const CGFloat middle = 2 * kMargin + kButtonSize.height + height / 2;
+    [field setFrameOrigin:NSMakePoint(kMargin + kIconSize + kIconGap, middle - words.height / 2)];
+    NSRect sign = NSMakeRect(kMargin, middle - kIconSize / 2, kIconSize, kIconSize);
+    [[self contentView] addSubview:[[[TsMessageSign alloc] initWithFrame:sign warning:warning] autorelease]];
+    [[self contentView] addSubview:field];
+    NSButton* button = [self answerAt:NSMakePoint(NSWidth(content) - kMargin - kButtonSize.width, kMargin)];
+    [[self contentView] addSubview:button];
+    [self setInitialFirstResponder:button];
+    return self;
+}
+
+- (void)answer:(id)sender
+{
+    (void)sender;
+    [NSApp stopModal];
+}
+
+- (BOOL)windowShouldClose:(id)sender
+{
+    [self answer:sender];
+    return NO;
+}
+
+- (void)keyDown:(NSEvent*)event
+{
+    NSString* characters = [event characters];
+    if ([characters length] == 1 && [characters characterAtIndex:0] == kEscape)
+        [self answer:nil];
+    else
+        [super keyDown:event];
+}
+
+@end
+
+void tessel::windowing::runMessage(NSString* text, bool warning)
+{
+    TsMessagePanel* panel = [[TsMessagePanel alloc] initWithText:text warning:warning];
+    if (![NSApp modalWindow])
+        [panel center];
+    [NSApp runModalForWindow:panel];
+    [panel orderOut:nil];
+    [panel release];
+}

@@ -1,0 +1,148 @@
+// Windows that wait for an answer, over those that they came from.
+#include "tests/e2e_dialogs/DialogTest.h"
+
+#include <ios>
+#include <sstream>
+
+using testing::HasSubstr;
+using testing::Not;
+
+namespace
+{
+constexpr Place kEmptyPlaceOfDialog{300, 750}; // that no window over the dialog reaches
+constexpr Place kEmptyPlaceOfSuite{200, 345};
+constexpr int kFrame = 20; // by which the middles of two windows may differ
+
+class ModalWindows : public DialogTest
+{
+protected:
+    void openSuite()
+    {
+        open();
+        click(places::kContents);
+        mSuite = mScreen.waitForWindow(kSuiteDialog);
+        ASSERT_FALSE(mSuite.empty());
+        ASSERT_TRUE(mScreen.waitUntilActive(mSuite));
+    }
+
+    std::string openMessageBox()
+    {
+        mSession.folder().write("files/broken.zmb", "no module");
+        open();
+        click(places::file(0));
+        click(places::kLoad);
+        const std::string box = mScreen.waitForWindow(kMessageBox);
+        EXPECT_TRUE(mScreen.waitUntilActive(box));
+        return box;
+    }
+
+    void expectBelongsTo(const std::string& owner, const std::string& window) const
+    {
+        std::ostringstream id;
+        id << "window id # 0x" << std::hex << std::stoul(owner);
+        EXPECT_EQ(mScreen.property(window, "WM_TRANSIENT_FOR"), id.str());
+        EXPECT_EQ(mScreen.property(window, "_NET_WM_WINDOW_TYPE"), "_NET_WM_WINDOW_TYPE_DIALOG");
+        EXPECT_EQ(mScreen.property(window, "_NET_WM_STATE"), "_NET_WM_STATE_MODAL");
+        EXPECT_NEAR(mScreen.middleOf(window).x, mScreen.middleOf(owner).x, kFrame);
+        EXPECT_NEAR(mScreen.middleOf(window).y, mScreen.middleOf(owner).y, kFrame);
+    }
+
+    void expectStaysOver(const std::string& owner, Place place, const std::string& window) const
+    {
+        mScreen.click(owner, place);
+        shoot("clicked-behind");
+        EXPECT_TRUE(mScreen.isOver(window, owner));
+        EXPECT_TRUE(mScreen.waitUntilActive(window));
+    }
+
+    std::string mSuite;
+};
+} // namespace
+
+TEST_F(ModalWindows, AMessageBoxBelongsToTheDialogAndStaysOverIt)
+{
+    const std::string box = openMessageBox();
+    expectBelongsTo(mDialog, box);
+    expectStaysOver(mDialog, kEmptyPlaceOfDialog, box);
+    dismissMessageBox();
+    closeAndEnd();
+}
+
+TEST_F(ModalWindows, AMessageBoxIsAnsweredByEscapeAndByItsButton)
+{
+    openMessageBox();
+    mScreen.key("Escape");
+    EXPECT_TRUE(mScreen.waitUntilGone(kMessageBox));
+    ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
+    click(places::kLoad);
+    const std::string box = mScreen.waitForWindow(kMessageBox);
+    ASSERT_TRUE(mScreen.waitUntilActive(box));
+    const std::string size = mScreen.sizeOf(box);
+    const int width = std::stoi(size);
+    const int height = std::stoi(size.substr(size.find('x') + 1));
+    mScreen.click(box, {width - 60, height - 36});
+    EXPECT_TRUE(mScreen.waitUntilGone(kMessageBox));
+    closeAndEnd();
+}
+
+TEST_F(ModalWindows, TheButtonThatOpenedAMessageBoxIsDrawnReleased)
+{
+    mSession.folder().write("files/broken.zmb", "no module");
+    open();
+    click(places::file(0));
+    const Place besideItsText{places::kLoad.x + 20, places::kLoad.y};
+    const std::string before = look(besideItsText);
+    click(places::kLoad);
+    const std::string box = mScreen.waitForWindow(kMessageBox);
+    ASSERT_TRUE(mScreen.waitUntilActive(box));
+    shoot("released");
+    EXPECT_EQ(look(besideItsText), before);
+    dismissMessageBox();
+    closeAndEnd();
+}
+
+TEST_F(ModalWindows, TheStartupSuiteBelongsToTheDialogAndStaysOverIt)
+{
+    openSuite();
+    expectBelongsTo(mDialog, mSuite);
+    expectStaysOver(mDialog, kEmptyPlaceOfDialog, mSuite);
+    mScreen.key("Escape");
+    EXPECT_TRUE(mScreen.waitUntilGone(kSuiteDialog));
+    closeAndEnd();
+}
+
+TEST_F(ModalWindows, TheAddPanelBelongsToTheStartupSuiteAndStaysOverBoth)
+{
+    openSuite();
+    mScreen.click(mSuite, places::kAdd);
+    const std::string panel = mScreen.waitForWindow(kAddPanel);
+    ASSERT_TRUE(mScreen.waitUntilActive(panel));
+    expectBelongsTo(mSuite, panel);
+    expectStaysOver(mSuite, kEmptyPlaceOfSuite, panel);
+    expectStaysOver(mDialog, kEmptyPlaceOfDialog, panel);
+    mScreen.key("Escape");
+    EXPECT_TRUE(mScreen.waitUntilGone(kAddPanel));
+    ASSERT_TRUE(mScreen.waitUntilActive(mSuite));
+    mScreen.key("Escape");
+    EXPECT_TRUE(mScreen.waitUntilGone(kSuiteDialog));
+    closeAndEnd();
+}
+
+TEST_F(ModalWindows, TheDialogIsInTheTaskBarAndTellsItsProcess)
+{
+    open();
+    EXPECT_THAT(mScreen.property(mDialog, "_NET_WM_STATE"), Not(HasSubstr("SKIP")));
+    EXPECT_EQ(mScreen.property(mDialog, "_NET_WM_WINDOW_TYPE"), "_NET_WM_WINDOW_TYPE_NORMAL");
+    EXPECT_EQ(mScreen.property(mDialog, "_NET_WM_PID"), std::to_string(mHost->process()));
+    EXPECT_THAT(mScreen.property(mDialog, "WM_CLIENT_MACHINE"), Not(testing::IsEmpty()));
+    closeAndEnd();
+}
+
+TEST_F(ModalWindows, TheDialogComesBackWhenItIsMinimized)
+{
+    open();
+    mScreen.minimize(mDialog);
+    EXPECT_TRUE(comesTrue([&] { return mScreen.window(kDialog) == mDialog; }));
+    shoot("back");
+    closeAndEnd();
+}

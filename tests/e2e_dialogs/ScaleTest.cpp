@@ -1,0 +1,86 @@
+// Dialogs on screens of any resolution.
+#include "tests/e2e_dialogs/DialogTest.h"
+
+namespace
+{
+constexpr DisplayKind kLargeDisplay{.width = 2600, .height = 2500};
+constexpr int kDialogHeight = 770;
+
+std::string scaledSize(double scale)
+{
+    const auto scaled = [scale](int length)
+    {
+        return std::to_string(static_cast<int>(length * scale));
+    };
+    return scaled(places::kDialogWidth) + "x" + scaled(kDialogHeight);
+}
+
+Place scaledPlace(Place place, double scale)
+{
+    return {static_cast<int>(place.x * scale), static_cast<int>(place.y * scale)};
+}
+
+class DialogScale : public DialogTest, public testing::WithParamInterface<double>
+{
+protected:
+    DialogScale() : DialogTest(kLargeDisplay) {}
+};
+
+class DialogResolution : public DialogTest, public testing::WithParamInterface<std::pair<int, double>>
+{
+protected:
+    DialogResolution() : DialogTest({.width = 2600, .height = 2500, .dotsPerInch = GetParam().first}) {}
+};
+} // namespace
+
+TEST_P(DialogScale, OpensLargerAndAnswersClicks)
+{
+    const double scale = GetParam();
+    storeHistory(writeManyLisp(30)); // more than fit: the table gets a scroller
+    setToolkitSetting("GSScaleFactor", std::to_string(scale));
+    open();
+    EXPECT_EQ(mScreen.sizeOf(mDialog), scaledSize(scale));
+    click(scaledPlace(places::kHistoryTab, scale));
+    click(scaledPlace(places::tableRow(1), scale));
+    click(scaledPlace(places::kLoadFromHistory, scale));
+    EXPECT_TRUE(prints(wasLoaded("many2.lsp")));
+    shoot("loaded");
+    closeAndEnd();
+}
+
+INSTANTIATE_TEST_SUITE_P(Quarters, DialogScale, testing::Values(1, 1.25, 1.5, 1.75, 2, 2.5, 3));
+
+TEST_P(DialogResolution, GivesTheScaleWhenNoneIsSet)
+{
+    open();
+    EXPECT_EQ(mScreen.sizeOf(mDialog), scaledSize(GetParam().second));
+    closeAndEnd();
+}
+
+TEST_P(DialogResolution, GivesWayToAScaleThatIsSet)
+{
+    setToolkitSetting("GSScaleFactor", "1");
+    open();
+    EXPECT_EQ(mScreen.sizeOf(mDialog), scaledSize(1));
+    closeAndEnd();
+}
+
+TEST_P(DialogResolution, GivesWayToAScaleThatIsSetForAllProgramsOfTheToolkit)
+{
+    mSession.folder().write("home/GNUstep/Defaults/NSGlobalDomain.plist", "{ GSScaleFactor = 1.75; }\n");
+    open();
+    EXPECT_EQ(mScreen.sizeOf(mDialog), scaledSize(1.75));
+    closeAndEnd();
+}
+
+TEST_P(DialogResolution, GivesWayToTheResolutionThatTheDesktopWants)
+{
+    mScreen.setResource("Xft.dpi:\t120\n");
+    open();
+    EXPECT_EQ(mScreen.sizeOf(mDialog), scaledSize(1.25));
+    closeAndEnd();
+}
+
+INSTANTIATE_TEST_SUITE_P(DotsPerInch, DialogResolution,
+                         testing::Values(std::pair{72, 1.0}, std::pair{100, 1.0}, std::pair{144, 1.5},
+                                         std::pair{192, 2.0}));

@@ -1,0 +1,68 @@
+// What the toolkit brings along: programs of its own, settings, complaints.
+#include "tests/e2e_dialogs/DialogTest.h"
+
+#include <fstream>
+#include <iterator>
+
+using testing::HasSubstr;
+using testing::Not;
+
+namespace
+{
+constexpr std::chrono::seconds kSoon{4};
+
+std::string contentOf(const std::filesystem::path& path)
+{
+    std::ifstream file(path, std::ios::binary);
+    return {std::istreambuf_iterator<char>(file), {}};
+}
+
+class DialogToolkit : public DialogTest
+{
+protected:
+    // Programs that serve the toolkit of this session only: they find one another by that folder.
+    void haveHelpersOfItsOwn() { mSession.set("TEMP", mSession.folder().path().string()); }
+
+    int helpers() const
+    {
+        int count = 0;
+        const std::string own = "TEMP=" + mSession.folder().path().string();
+        for (const auto& process : std::filesystem::directory_iterator("/proc"))
+        {
+            const std::string name = contentOf(process.path() / "comm");
+            if ((name == "gpbs\n" || name == "gdnc\n") &&
+                contentOf(process.path() / "environ").find(own) != std::string::npos)
+                ++count;
+        }
+        return count;
+    }
+};
+} // namespace
+
+TEST_F(DialogToolkit, HasHelperProgramsThatEndWithTheSession)
+{
+    haveHelpersOfItsOwn();
+    open();
+    EXPECT_GE(helpers(), 1);
+    closeAndEnd();
+    EXPECT_TRUE(comesTrue([this] { return helpers() == 0; }, kSoon)) << helpers();
+}
+
+TEST_F(DialogToolkit, HasHelperProgramsThatEndWithASessionThatIsKilled)
+{
+    haveHelpersOfItsOwn();
+    open();
+    EXPECT_GE(helpers(), 1);
+    mHost.reset();
+    EXPECT_TRUE(comesTrue([this] { return helpers() == 0; }, kSoon)) << helpers();
+}
+
+TEST_F(DialogToolkit, ComplainsIntoALogOfTheProfile)
+{
+    mSession.folder().write("profile/toolkit/Defaults/NSGlobalDomain.plist",
+                            "{ \"GNU-Debug\" = (NSScrollView); }\n"); // makes it talk
+    open();
+    const std::string output = closeAndEnd();
+    EXPECT_THAT(output, Not(HasSubstr("reflectScrolledClipView")));
+    EXPECT_THAT(contentOf(mSession.profile() / "toolkit" / "log.txt"), HasSubstr("reflectScrolledClipView"));
+}
