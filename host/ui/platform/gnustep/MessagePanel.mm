@@ -53,10 +53,10 @@ NSBezierPath* triangleIn(NSRect frame)
 
 - (void)drawMark:(NSString*)mark centeredAt:(NSPoint)center
 {
-    NSDictionary* look =
-        [NSDictionary dictionaryWithObjectsAndKeys:[NSFont boldSystemFontOfSize:24], NSFontAttributeName,
-                                                   themeColor(mWarning ? @"warningTextColor" : @"accentTextColor"),
-                                                   NSForegroundColorAttributeName, nil];
+    NSDictionary* look = [NSDictionary
+        dictionaryWithObjectsAndKeys:[NSFont boldSystemFontOfSize:24], NSFontAttributeName,
+                                     themeColor(mWarning ? @"warningTextColor" : @"accentTextColor"),
+                                     NSForegroundColorAttributeName, nil];
     const NSSize size = [mark sizeWithAttributes:look];
     [mark drawAtPoint:NSMakePoint(center.x - size.width / 2, center.y - size.height / 2) withAttributes:look];
 }

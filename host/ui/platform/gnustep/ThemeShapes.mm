@@ -75,14 +75,14 @@ void drawRing(NSRect ring, CGFloat corner, NSColor* color)
 
 void drawFocusRing(NSRect frame)
 {
-    drawRing(NSInsetRect(NSIntegralRect(frame), 1, 1), kCorner, [NSColor keyboardFocusIndicatorColor]);
+    drawRing(NSInsetRect(frame, 1, 1), kCorner, [NSColor keyboardFocusIndicatorColor]);
 }
 
 void drawButtonShape(NSRect shape, ButtonLook look)
 {
     drawRounded(shape, kCorner, themeColor(faceOf(look)), themeColor(edgeOf(look)));
     if (look.hasFocus && look.isDefault)
-        drawRing(NSInsetRect(NSIntegralRect(shape), 3, 3), kCorner - 2, themeColor(@"accentTextColor"));
+        drawRing(NSInsetRect(shape, 3, 3), kCorner - 2, themeColor(@"accentTextColor"));
     else if (look.hasFocus)
         drawFocusRing(shape);
 }
