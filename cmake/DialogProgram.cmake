@@ -15,4 +15,15 @@ function(make_dialog_program target name)
       VERBATIM)
     target_sources(${target} PRIVATE "${place}")
   endforeach()
+  if(NOT APPLE)
+    foreach(theme Tessel TesselDark) # the host's look, which is measured and timed as well
+      add_custom_command(
+        OUTPUT "${app}/Resources/${theme}.theme"
+        COMMAND ${CMAKE_COMMAND} -E create_symlink
+          "${TESSEL_APP_RESOURCES}/${theme}.theme" "${app}/Resources/${theme}.theme"
+        VERBATIM)
+      target_sources(${target} PRIVATE "${app}/Resources/${theme}.theme")
+    endforeach()
+    add_dependencies(${target} tessel_theme_light tessel_theme_dark)
+  endif()
 endfunction()

@@ -4,5 +4,12 @@
 
 #import <AppKit/AppKit.h>
 
-@interface ModrigDialogView : NSView
+#include <tesselui/tsuifilepanel.h>
+
+@interface ModrigDialogView : NSView <TsUILowAccessory>
+{
+    IBOutlet NSTextField* fileTypesLabel;
+    IBOutlet NSPopUpButton* fileTypesChoice;
+}
+
 @end

@@ -1,11 +1,15 @@
 #import "ui/ModrigDialogView.h"
 
+#include <cmath>
+
 #import "ui/ModrigController.h"
 #import "ui/TsOCModrigUtil.h"
 
 namespace
 {
 constexpr NSInteger kTabs = 2;
+constexpr CGFloat kSmallestHeight = 280; // a table of four rows, and the whole text of the Startup Suite box
+constexpr CGFloat kGap = 6;
 
 // The tab that the key stands for, or -1.
 NSInteger tabOf(NSEvent* event)
@@ -19,6 +23,36 @@ NSInteger tabOf(NSEvent* event)
 } // namespace
 
 @implementation ModrigDialogView
+
+- (CGFloat)tsuiSmallestHeight
+{
+    return kSmallestHeight;
+}
+
+// The choice of file types gets what its label leaves, whose text is longer in some languages than in others.
+- (void)placeFileTypes
+{
+    const CGFloat width = std::ceil([[fileTypesLabel cell] cellSize].width);
+    NSRect label = [fileTypesLabel frame];
+    NSRect choice = [fileTypesChoice frame];
+    const CGFloat right = NSMaxX(choice);
+    label.size.width = width;
+    choice.origin.x = NSMaxX(label) + kGap;
+    choice.size.width = right - NSMinX(choice);
+    [fileTypesLabel setFrame:label];
+    [fileTypesChoice setFrame:choice];
+}
+
+- (void)awakeFromNib
+{
+    [self placeFileTypes];
+}
+
+- (void)resizeSubviewsWithOldSize:(NSSize)size
+{
+    [super resizeSubviewsWithOldSize:size];
+    [self placeFileTypes];
+}
 
 - (BOOL)performKeyEquivalent:(NSEvent*)event
 {

@@ -10,7 +10,7 @@ constexpr CGFloat kRingCorner = 6;
 
 NSColor* acceptingColor()
 {
-    return [NSColor colorWithCalibratedRed:0.184 green:0.435 blue:0.871 alpha:1];
+    return [NSColor keyboardFocusIndicatorColor];
 }
 } // namespace
 

@@ -8,13 +8,15 @@
 namespace
 {
 const NSRect kFilterBar = {{0, 0}, {420, 44}};
-const NSRect kFilterLabel = {{16, 14}, {80, 18}};
-const NSRect kFilterChoice = {{100, 10}, {304, 26}};
+const NSRect kFilterLabel = {{16, 14}, {72, 18}}; // in line with the panel's name field
+const NSRect kFilterChoice = {{92, 10}, {320, 26}};
+constexpr CGFloat kFontSize = 13;
 
 NSTextField* makeLabel(NSString* text)
 {
     NSTextField* label = [[[NSTextField alloc] initWithFrame:kFilterLabel] autorelease];
     [label setStringValue:text];
+    [label setFont:[NSFont systemFontOfSize:kFontSize]];
     [label setEditable:NO];
     [label setSelectable:NO];
     [label setBordered:NO];
@@ -56,6 +58,7 @@ NSTextField* makeLabel(NSString* text)
 - (NSView*)view
 {
     NSPopUpButton* choice = [[[NSPopUpButton alloc] initWithFrame:kFilterChoice pullsDown:NO] autorelease];
+    [choice setFont:[NSFont systemFontOfSize:kFontSize]];
     for (TsOCFileFilter* filter : tsuiEach<TsOCFileFilter*>(mFilters))
         [choice addItemWithTitle:[filter description]];
     [choice setTarget:self];

@@ -12,6 +12,12 @@ inline constexpr NSInteger kTsUIFilePanelDefaultButton = 100;
 inline constexpr NSInteger kTsUIFilePanelCancelButton = 101;
 inline constexpr NSInteger kTsUIFilePanelSpareButton = 102;
 
+// What an accessory view implements that can be less high than it comes: on a low screen the host's own panel
+// makes it so, after its list has given way, down to this height in points.
+@protocol TsUILowAccessory
+- (CGFloat)tsuiSmallestHeight;
+@end
+
 // A new file panel, autoreleased, which disturbs no other one that is open. `URLs` holds the chosen files, of
 // rows or of typed names; a folder on the way is none. Its delegate decides what is listed
 // (`panel:shouldShowFilename:`) and hears of every choice (`panelSelectionDidChange:`).

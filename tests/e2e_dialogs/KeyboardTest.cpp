@@ -7,8 +7,8 @@ namespace
 {
 // How often Tab is pressed to get to a control from the list of files, where the keyboard is when the dialog
 // opens. On the way are the name field and the switch for hidden files. What is disabled is left out.
-constexpr int kTabsToAddToHistory = 4;
-constexpr int kTabsToLoad = 5;
+constexpr int kTabsToLoad = 4;
+constexpr int kTabsToAddToHistory = 5;
 constexpr int kTabsToTable = 6;
 constexpr int kTabsToContents = 7; // with nothing selected in the table
 constexpr int kTabsToHelp = 8;

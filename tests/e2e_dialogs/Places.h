@@ -10,8 +10,8 @@ inline constexpr int kRowHeight = 20;
 // The main dialog
 inline constexpr int kDialogWidth = 750;
 inline constexpr Place kFileTypes{230, 375};
-inline constexpr Place kAddToHistory{385, 375};
-inline constexpr Place kLoad{676, 375};
+inline constexpr Place kAddToHistory{575, 405};
+inline constexpr Place kLoad{640, 376};
 inline constexpr Place kLoadedTab{100, 410};
 inline constexpr Place kHistoryTab{214, 410};
 inline constexpr Place kUnload{475, 631};
@@ -30,7 +30,7 @@ inline constexpr Place kAdd{30, 330};
 inline constexpr Place kRemove{67, 330};
 inline constexpr Place kSuiteHelp{386, 330};
 inline constexpr Place kCloseSuite{496, 330};
-inline constexpr Place kFirstSuiteRow{80, 77};
+inline constexpr Place kFirstSuiteRow{80, 89};
 
 // A row of the table that shows, and of the list of files; that of the Add panel stands in the same place.
 constexpr Place tableRow(int row)

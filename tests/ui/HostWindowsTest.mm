@@ -1,5 +1,6 @@
 // The classes that the host offers for windows, as far as they need no user.
 #include "tests/ui/support/DialogTest.h"
+#include "tests/ui/support/Pictures.h"
 
 #import <tesselui/TsOCFileFilter.h>
 #import <tesselui/TsUIPersistentStore.h>
@@ -7,7 +8,7 @@
 #include <tesselui/tsuierrors.h>
 
 #include "host/ui/MessageBoxAlert.h"
-#include "host/ui/platform/gnustep/ThemeSegments.h"
+#include "host/ui/platform/gnustep/ThemeButtons.h"
 
 using testing::ElementsAre;
 
@@ -171,22 +172,9 @@ TEST_F(Waiting, OutsideOfModalWindowsTellsTheHostNothing)
     EXPECT_THAT(host().services.waits, testing::IsEmpty());
 }
 
-namespace
-{
-// What the control looks like on the screen.
-NSData* pictureOf(NSView* view)
-{
-    [view lockFocus];
-    NSBitmapImageRep* picture =
-        [[[NSBitmapImageRep alloc] initWithFocusedViewRect:[view bounds]] autorelease];
-    [view unlockFocus];
-    return [picture TIFFRepresentation];
-}
-} // namespace
-
 TEST_F(Segments, LookDisabledWhenTheyAre)
 {
-    tessel::windowing::drawSegmentsAsButtons();
+    tessel::windowing::completeButtons();
     NSWindow* window = [[[NSWindow alloc] initWithContentRect:NSMakeRect(0, 0, 100, 40)
                                                     styleMask:NSBorderlessWindowMask
                                                       backing:NSBackingStoreBuffered

@@ -5,6 +5,9 @@
 #include <algorithm>
 
 #include "host/ui/platform/Windowing.h"
+#include "host/ui/platform/gnustep/TesselTheme.h"
+
+using tessel::windowing::themeColor;
 
 namespace
 {
@@ -18,11 +21,6 @@ constexpr CGFloat kFieldPadding = 6; // of a field around its text
 constexpr CGFloat kFontSize = 13;
 const NSSize kButtonSize = {88, 28};
 constexpr unichar kEscape = 033;
-
-NSColor* color(CGFloat red, CGFloat green, CGFloat blue)
-{
-    return [NSColor colorWithCalibratedRed:red green:green blue:blue alpha:1];
-}
 
 NSBezierPath* triangleIn(NSRect frame)
 {
@@ -55,10 +53,10 @@ NSBezierPath* triangleIn(NSRect frame)
 
 - (void)drawMark:(NSString*)mark centeredAt:(NSPoint)center
 {
-    NSDictionary* look =
-        [NSDictionary dictionaryWithObjectsAndKeys:[NSFont boldSystemFontOfSize:24], NSFontAttributeName,
-                                                   mWarning ? color(0.25, 0.18, 0) : [NSColor whiteColor],
-                                                   NSForegroundColorAttributeName, nil];
+    NSDictionary* look = [NSDictionary
+        dictionaryWithObjectsAndKeys:[NSFont boldSystemFontOfSize:24], NSFontAttributeName,
+                                     themeColor(mWarning ? @"warningTextColor" : @"accentTextColor"),
+                                     NSForegroundColorAttributeName, nil];
     const NSSize size = [mark sizeWithAttributes:look];
     [mark drawAtPoint:NSMakePoint(center.x - size.width / 2, center.y - size.height / 2) withAttributes:look];
 }
@@ -68,7 +66,7 @@ NSBezierPath* triangleIn(NSRect frame)
     (void)dirty;
     const NSRect frame = NSInsetRect([self bounds], 4, 4);
     NSBezierPath* shape = mWarning ? triangleIn(frame) : [NSBezierPath bezierPathWithOvalInRect:frame];
-    NSColor* fill = mWarning ? color(0.98, 0.76, 0.18) : color(0.184, 0.435, 0.871);
+    NSColor* fill = themeColor(mWarning ? @"warningColor" : @"accentColor");
     [fill set];
     [shape setLineWidth:5]; // rounds the corners
     [shape fill];

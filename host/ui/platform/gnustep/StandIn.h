@@ -18,4 +18,18 @@ Function standInFor(const char* className, SEL selector, Function replacement)
     return reinterpret_cast<Function>(
         reinterpret_cast<void*>(method_setImplementation(method, reinterpret_cast<IMP>(untyped))));
 }
+
+// The same for a method that the class inherits: the classes that it inherits from keep it.
+template <class Function>
+Function overrideIn(const char* className, SEL selector, Function replacement)
+{
+    const Class target = objc_getClass(className);
+    const Method inherited = class_getInstanceMethod(target, selector);
+    if (!inherited)
+        return nullptr;
+    const auto untyped = reinterpret_cast<void*>(replacement);
+    const auto toolkits = reinterpret_cast<void*>(method_getImplementation(inherited));
+    class_addMethod(target, selector, reinterpret_cast<IMP>(untyped), method_getTypeEncoding(inherited));
+    return reinterpret_cast<Function>(toolkits);
+}
 } // namespace tessel::windowing

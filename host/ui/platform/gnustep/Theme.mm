@@ -1,141 +1,59 @@
 #include "host/ui/platform/gnustep/Theme.h"
 
-#import <GNUstepGUI/GSTheme.h>
+#include "host/ui/platform/gnustep/Appearance.h"
+#include "host/ui/platform/gnustep/TesselTheme.h"
+#include "host/ui/platform/gnustep/ThemeButtons.h"
+#include "host/ui/platform/gnustep/ThemeFocus.h"
+#include "host/ui/platform/gnustep/ThemePictures.h"
 
-#include <tesselui/tsuieach.h>
-
-#include "host/ui/platform/gnustep/ThemeSegments.h"
-#include "host/ui/platform/gnustep/ThemeShapes.h"
-
-using namespace tessel::windowing;
-
-// The toolkit asks its theme to draw what it shows; what is not overridden here keeps the toolkit's look.
-@interface TesselTheme : GSTheme
-@end
-
-@implementation TesselTheme
-
-- (void)drawButton:(NSRect)frame
-                in:(NSCell*)cell
-              view:(NSView*)view
-             style:(int)style
-             state:(GSThemeControlState)state
+namespace tessel::windowing
 {
-    (void)cell;
-    (void)view;
-    const bool pressed = state == GSThemeHighlightedState || state == GSThemeHighlightedFirstResponderState ||
-                         state == GSThemeSelectedState || state == GSThemeSelectedFirstResponderState;
-    const NSRect shape = style == NSRoundedBezelStyle ? NSInsetRect(frame, 1, 2) : NSInsetRect(frame, 1, 1);
-    drawButtonShape(shape, pressed, state == GSThemeDisabledState);
+namespace
+{
+// The theme for light desktops, or the one for dark ones beside it.
+NSBundle* chosenTheme(NSString* lightTheme)
+{
+    NSString* setting = [[NSUserDefaults standardUserDefaults] stringForKey:@"TesselAppearance"];
+    const bool isDark = chosenAppearance(setting ? [setting UTF8String] : "") == Appearance::kDark;
+    NSString* beside = [lightTheme stringByDeletingLastPathComponent];
+    return [NSBundle
+        bundleWithPath:isDark ? [beside stringByAppendingPathComponent:@"TesselDark.theme"] : lightTheme];
 }
 
-- (void)drawFocusFrame:(NSRect)frame view:(NSView*)view
+// Low four bits: no rounding of how far letters stand apart. Rounded for one pixel a point, they would run
+// into each other on a screen of two. The next four: no other change of their shapes.
+constexpr int kFontHinting = 0x11;
+
+void registerDefault(id value, NSString* key)
 {
-    (void)view;
-    drawFocusRing(NSInsetRect(frame, -1, -1));
+    [[NSUserDefaults standardUserDefaults] registerDefaults:[NSDictionary dictionaryWithObject:value
+                                                                                        forKey:key]];
 }
 
-- (NSRect)drawDarkBezel:(NSRect)border withClip:(NSRect)clip
+void use(NSBundle* bundle)
 {
-    (void)clip;
-    return drawBorder(border);
-}
-
-- (NSRect)drawGrayBezel:(NSRect)border withClip:(NSRect)clip
-{
-    (void)clip;
-    return drawBorder(border);
-}
-
-- (NSRect)drawWhiteBezel:(NSRect)border withClip:(NSRect)clip
-{
-    (void)clip;
-    return drawBorder(border);
-}
-
-- (NSRect)drawGroove:(NSRect)border withClip:(NSRect)clip
-{
-    (void)clip;
-    return drawBorder(border);
-}
-
-- (void)drawTableHeaderCell:(NSTableHeaderCell*)cell
-                  withFrame:(NSRect)frame
-                     inView:(NSView*)view
-                      state:(GSThemeControlState)state
-{
-    (void)cell;
-    (void)view;
-    (void)state;
-    drawHeader(frame);
-}
-
-- (void)drawTableCornerView:(NSView*)view withClip:(NSRect)clip
-{
-    (void)clip;
-    drawHeader([view bounds]);
-}
-
-- (void)drawBrowserHeaderCell:(NSTableHeaderCell*)cell withFrame:(NSRect)frame inView:(NSView*)view
-{
-    (void)cell;
-    (void)view;
-    drawHeader(frame);
-}
-
-- (void)drawTabViewRect:(NSRect)rect
-                 inView:(NSView*)view
-              withItems:(NSArray*)items
-           selectedItem:(NSTabViewItem*)selected
-{
-    (void)rect;
-    const NSRect bounds = [view bounds];
-    const bool flipped = [view isFlipped];
-    drawTabPane(tabPaneOf(bounds, flipped));
-    NSRect tab = NSMakeRect(NSMinX(bounds) + kTabStart,
-                            flipped ? NSMinY(bounds) : NSMaxY(bounds) - kTabHeight, 0, kTabHeight);
-    for (NSTabViewItem* item : tsuiEach<NSTabViewItem*>(items))
-    {
-        tab.size.width = [item sizeOfLabel:NO].width + 2 * kTabPadding;
-        [item _setTabState:item == selected ? NSSelectedTab : NSBackgroundTab];
-        if (item == selected)
-            drawTab(tab, flipped);
-        [item drawLabel:NO inRect:NSInsetRect(tab, kTabPadding, 0)];
-        tab.origin.x += tab.size.width;
-    }
-}
-
-- (NSRect)tabViewContentRectForBounds:(NSRect)bounds tabViewType:(NSTabViewType)type tabView:(NSTabView*)view
-{
-    return type == NSTopTabsBezelBorder ? NSInsetRect(tabPaneOf(bounds, [view isFlipped]), 2, 2) : bounds;
-}
-
-- (void)drawScrollerRect:(NSRect)rect
-                  inView:(NSView*)view
-                 hitPart:(NSScrollerPart)part
-            isHorizontal:(BOOL)horizontal
-{
-    (void)rect;
-    (void)part;
-    NSScroller* scroller = (NSScroller*)view;
-    drawScrollTrack([view bounds], horizontal);
-    if ([scroller isEnabled])
-        drawScrollKnob([scroller rectForPart:NSScrollerKnob], horizontal);
-}
-
-@end
-
-void tessel::windowing::useTheme(NSString* folder)
-{
-    NSBundle* bundle = folder ? [NSBundle bundleWithPath:folder] : nil;
-    if (!bundle)
-        return;
     GSTheme* theme = [[[TesselTheme alloc] initWithBundle:bundle] autorelease];
     [GSTheme setTheme:theme];
-    drawSegmentsAsButtons();
     // Whenever a user default changes, the toolkit goes back to the theme that the defaults name.
-    [[NSUserDefaults standardUserDefaults] registerDefaults:[NSDictionary dictionaryWithObject:[theme name]
-                                                                                        forKey:@"GSTheme"]];
-    NSString* icon = [bundle pathForResource:@"Tessel" ofType:@"png"];
-    [NSApp setApplicationIconImage:[[[NSImage alloc] initWithContentsOfFile:icon] autorelease]];
+    registerDefault([theme name], @"GSTheme");
+    NSString* resources = [bundle resourcePath];
+    sharpenControls(resources);
+    useFileIcons(resources);
+    [NSApp setApplicationIconImage:pictureIn(resources, @"Tessel")];
 }
+} // namespace
+
+void useTheme(NSString* folder)
+{
+    NSBundle* bundle = folder ? chosenTheme(folder) : nil;
+    if (!bundle)
+        return;
+    registerDefault([NSNumber numberWithInt:kFontHinting], @"GSFontHinting");
+    use(bundle);
+    completeButtons();
+    completePopUps();
+    completeTables();
+    completeToolTips();
+    showWhereTheKeyboardIs();
+}
+} // namespace tessel::windowing

@@ -1,27 +1,22 @@
 #include "host/ui/platform/gnustep/ThemeShapes.h"
 
+#include "host/ui/platform/gnustep/TesselTheme.h"
+
 namespace tessel::windowing
 {
 namespace
 {
 constexpr CGFloat kCorner = 5;
 constexpr CGFloat kBorderWidth = 2;
+constexpr CGFloat kFocusWidth = 2;
 constexpr CGFloat kKnobInset = 4;
+constexpr CGFloat kKnobCorner = 4;
 constexpr CGFloat kTabMark = 2; // the line that marks the selected tab
-
-NSColor* gray(CGFloat white)
-{
-    return [NSColor colorWithCalibratedRed:white - 0.012 green:white - 0.004 blue:white alpha:1];
-}
-
-NSColor* accent()
-{
-    return [NSColor colorWithCalibratedRed:0.184 green:0.435 blue:0.871 alpha:1];
-}
+constexpr CGFloat kMenuInset = 2;
 
 NSColor* lineColor()
 {
-    return gray(0.78);
+    return themeColor(@"lineColor");
 }
 
 // A line drawn between pixels is two pixels wide and pale.
@@ -50,20 +45,46 @@ void fill(NSRect rect, NSColor* color)
     NSRectFill(rect);
 }
 
+NSString* faceOf(ButtonLook look)
+{
+    if (look.disabled)
+        return @"disabledButtonColor";
+    if (look.isDefault)
+        return look.pressed ? @"pressedDefaultButtonColor" : @"accentColor";
+    return look.pressed ? @"pressedButtonColor" : @"buttonColor";
+}
+
+NSString* edgeOf(ButtonLook look)
+{
+    if (look.disabled)
+        return @"faintLineColor";
+    return look.isDefault ? @"pressedDefaultButtonColor" : @"lineColor";
+}
 } // namespace
 
-void drawButtonShape(NSRect shape, bool pressed, bool disabled)
+namespace
 {
-    NSColor* face = pressed ? gray(0.86) : [NSColor whiteColor];
-    drawRounded(shape, kCorner, disabled ? gray(0.95) : face, disabled ? gray(0.86) : lineColor());
+void drawRing(NSRect ring, CGFloat corner, NSColor* color)
+{
+    NSBezierPath* path = rounded(ring, corner);
+    [path setLineWidth:kFocusWidth];
+    [color set];
+    [path stroke];
 }
+} // namespace
 
 void drawFocusRing(NSRect frame)
 {
-    NSBezierPath* ring = rounded(onPixels(frame), kCorner);
-    [ring setLineWidth:2];
-    [[accent() colorWithAlphaComponent:0.6] set];
-    [ring stroke];
+    drawRing(NSInsetRect(frame, 1, 1), kCorner, [NSColor keyboardFocusIndicatorColor]);
+}
+
+void drawButtonShape(NSRect shape, ButtonLook look)
+{
+    drawRounded(shape, kCorner, themeColor(faceOf(look)), themeColor(edgeOf(look)));
+    if (look.hasFocus && look.isDefault)
+        drawRing(NSInsetRect(shape, 3, 3), kCorner - 2, themeColor(@"accentTextColor"));
+    else if (look.hasFocus)
+        drawFocusRing(shape);
 }
 
 NSRect drawBorder(NSRect frame)
@@ -75,12 +96,27 @@ NSRect drawBorder(NSRect frame)
     return NSInsetRect(frame, kBorderWidth, kBorderWidth);
 }
 
+void drawHeaderBackground(NSRect frame)
+{
+    fill(frame, [NSColor headerColor]);
+    fill(NSMakeRect(NSMinX(frame), NSMaxY(frame) - 1, NSWidth(frame), 1), lineColor());
+}
+
 void drawHeader(NSRect frame)
 {
-    fill(frame, gray(0.925));
-    [lineColor() set];
-    NSRectFill(NSMakeRect(NSMaxX(frame) - 1, NSMinY(frame) + 4, 1, NSHeight(frame) - 8));
-    NSRectFill(NSMakeRect(NSMinX(frame), NSMaxY(frame) - 1, NSWidth(frame), 1));
+    drawHeaderBackground(frame);
+    fill(NSMakeRect(NSMaxX(frame) - 1, NSMinY(frame) + 4, 1, NSHeight(frame) - 8), lineColor());
+}
+
+void drawPane(NSRect pane)
+{
+    drawRounded(pane, kCorner, themeColor(@"paneColor"), lineColor());
+}
+
+// Half of it stands above the pane, the other half in it.
+void drawTitlePlate(NSRect frame)
+{
+    fill(frame, [NSColor windowBackgroundColor]);
 }
 
 NSRect tabPaneOf(NSRect bounds, bool flipped)
@@ -91,11 +127,6 @@ NSRect tabPaneOf(NSRect bounds, bool flipped)
     return bounds;
 }
 
-void drawTabPane(NSRect pane)
-{
-    drawRounded(pane, kCorner, gray(0.975), lineColor());
-}
-
 void drawTab(NSRect tab, bool flipped)
 {
     NSRect shape = tab;
@@ -104,26 +135,41 @@ void drawTab(NSRect tab, bool flipped)
         shape.origin.y -= kCorner;
     [NSGraphicsContext saveGraphicsState];
     NSRectClip(tab);
-    drawRounded(shape, kCorner, gray(0.975), lineColor());
+    drawPane(shape);
     [NSGraphicsContext restoreGraphicsState];
     const CGFloat top = flipped ? NSMinY(tab) : NSMaxY(tab) - kTabMark;
-    fill(NSMakeRect(NSMinX(tab) + kCorner, top, NSWidth(tab) - 2 * kCorner, kTabMark), accent());
+    fill(NSMakeRect(NSMinX(tab) + kCorner, top, NSWidth(tab) - 2 * kCorner, kTabMark),
+         themeColor(@"accentColor"));
 }
 
 void drawScrollTrack(NSRect bounds, bool horizontal)
 {
-    fill(bounds, gray(0.965));
+    fill(bounds, themeColor(@"scrollTrackColor"));
     fill(horizontal ? NSMakeRect(NSMinX(bounds), NSMaxY(bounds) - 1, NSWidth(bounds), 1)
                     : NSMakeRect(NSMinX(bounds), NSMinY(bounds), 1, NSHeight(bounds)),
-         gray(0.88));
+         themeColor(@"faintLineColor"));
 }
 
 void drawScrollKnob(NSRect knob, bool horizontal)
 {
     if (NSIsEmptyRect(knob))
         return;
-    const NSRect shape = horizontal ? NSInsetRect(knob, 1, kKnobInset) : NSInsetRect(knob, kKnobInset, 1);
-    [gray(0.73) set];
-    [rounded(shape, 4) fill];
+    const NSRect shape = horizontal ? NSInsetRect(knob, kBorderWidth, kKnobInset)
+                                    : NSInsetRect(knob, kKnobInset, kBorderWidth);
+    [themeColor(@"scrollKnobColor") set];
+    [rounded(shape, kKnobCorner) fill];
+}
+
+void drawMenuBackground(NSRect frame)
+{
+    fill(frame, [NSColor controlBackgroundColor]);
+    [lineColor() set];
+    NSFrameRect(frame);
+}
+
+void drawMenuSelection(NSRect frame)
+{
+    [[NSColor selectedMenuItemColor] set];
+    [rounded(NSInsetRect(frame, kMenuInset, 0), kKnobCorner) fill];
 }
 } // namespace tessel::windowing

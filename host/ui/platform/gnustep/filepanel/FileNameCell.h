@@ -1,18 +1,11 @@
-// The cell of a file's name, with its icon: drawn, and so sharp at every scale.
+// The cell of a file's name, with its icon.
 #pragma once
 
 #import <AppKit/AppKit.h>
 
-enum TsFileIcon
-{
-    TsFolderIcon,
-    TsPackageIcon,
-    TsDocumentIcon
-};
-
 @interface TsFileNameCell : NSTextFieldCell
 {
-    TsFileIcon mIcon;
+    NSImage* mIcon; // not retained: the icons of the family last as long as the program
 }
-- (void)setFileIcon:(TsFileIcon)icon;
+- (void)setFileIcon:(NSImage*)icon;
 @end

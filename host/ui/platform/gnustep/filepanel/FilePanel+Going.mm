@@ -111,7 +111,7 @@ void storeRecentFolders(const std::vector<std::string>& folders)
 - (void)showRecentFolders
 {
     [mRecent removeAllItems];
-    [mRecent addItemWithTitle:@"  Recent"]; // the title of the button itself
+    [mRecent addItemWithTitle:@"Recent"]; // the title of the button itself
     for (const std::string& folder : recentFolders())
     {
         [mRecent addItemWithTitle:string(shownName(folder))];

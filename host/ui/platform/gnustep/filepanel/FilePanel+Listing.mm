@@ -3,6 +3,7 @@
 
 #include <tesselui/tsuieach.h>
 
+#include "host/ui/platform/gnustep/ThemePictures.h"
 #import "host/ui/platform/gnustep/filepanel/FileNameCell.h"
 #import "host/ui/platform/gnustep/filepanel/FilePanel.h"
 #import "host/ui/platform/gnustep/filepanel/FileTable.h"
@@ -29,11 +30,9 @@ NSString* dateText(std::time_t date)
     return [NSString stringWithUTF8String:text];
 }
 
-TsFileIcon iconOf(const Entry& entry)
+NSImage* iconOf(const Entry& entry)
 {
-    if (!entry.isFolder)
-        return TsDocumentIcon;
-    return entry.isPackage ? TsPackageIcon : TsFolderIcon;
+    return tessel::windowing::iconOfFile(string(entry.name), entry.isFolder);
 }
 
 Column columnOf(NSString* identifier)

@@ -30,9 +30,12 @@ namespace
 constexpr CGFloat kMargin = 8;
 constexpr CGFloat kControlHeight = 26;
 constexpr CGFloat kButtonWidth = 90;
+constexpr CGFloat kFieldPlace = 92; // from the left edge
+constexpr CGFloat kSwitchWidth = 150;
 constexpr CGFloat kSmallestWidth = 560;
 constexpr CGFloat kListBeyondSmallest = 190; // points, in the size that the panel opens in
 constexpr CGFloat kRowHeight = 20;
+constexpr CGFloat kDateWidth = 150;
 constexpr CGFloat kFontSize = 13;
 
 NSButton* makeButton(NSString* title, id target, SEL action)
@@ -103,13 +106,13 @@ NSTextFieldCell* makeTextCell()
 - (void)makeWayRowIn:(NSView*)row
 {
     place(makeButton(@"Up", self, @selector(goUp:)), row, kMargin, 56, kControlHeight);
-    place(makeButton(@"Home", self, @selector(goHome:)), row, kMargin + 60, 66, kControlHeight);
+    place(makeButton(@"Home", self, @selector(goHome:)), row, kMargin + 60, 84, kControlHeight);
     mRecent = [[[NSPopUpButton alloc] initWithFrame:NSMakeRect(0, 0, 100, 26) pullsDown:YES] autorelease];
     [mRecent setFont:[NSFont systemFontOfSize:kFontSize]];
     [mRecent setTarget:self];
     [mRecent setAction:@selector(goToRecent:)];
     [mRecent setToolTip:@"The folders used last"];
-    const CGFloat left = kMargin + 132;
+    const CGFloat left = kMargin + 150;
     mWay = [[[TsPathBar alloc] initWithFrame:NSZeroRect] autorelease];
     [mWay setTarget:self action:@selector(goToStep:)];
     place(mWay, row, left, NSWidth([row bounds]) - left - 100 - 2 * kMargin, kControlHeight);
@@ -127,6 +130,10 @@ NSTextFieldCell* makeTextCell()
     [mTable addTableColumn:makeColumn(@"name", 400, [[[TsFileNameCell alloc] initTextCell:@""] autorelease])];
     [mTable addTableColumn:makeColumn(@"kind", 110, makeTextCell())];
     [mTable addTableColumn:makeColumn(@"date", 150, makeTextCell())];
+    // The toolkit would take from the last column first, and give to it, whatever it needs.
+    NSTableColumn* date = [mTable tableColumnWithIdentifier:@"date"];
+    [date setMinWidth:kDateWidth];
+    [date setMaxWidth:kDateWidth];
     [mTable setRowHeight:kRowHeight];
     [mTable setAllowsColumnReordering:NO];
     [mTable setAllowsColumnSelection:NO];
@@ -142,13 +149,13 @@ NSTextFieldCell* makeTextCell()
 
 - (void)makeNameRowIn:(NSView*)row
 {
-    place(makeLabel(@"Name:", NSZeroRect), row, 16, 48, 18);
+    place(makeLabel(@"Name:", NSZeroRect), row, 16, 72, 18);
     mName = [[[NSTextField alloc] initWithFrame:NSZeroRect] autorelease];
     [mName setFont:[NSFont systemFontOfSize:kFontSize]];
     [mName setDelegate:(id)self];
     [[mName cell] setSendsActionOnEndEditing:NO];
     [[mName cell] setScrollable:YES];
-    place(mName, row, 66, NSWidth([row bounds]) - 66 - 130 - kMargin, 24);
+    place(mName, row, kFieldPlace, NSWidth([row bounds]) - kFieldPlace - kSwitchWidth - 2 * kMargin, 24);
     [mName setAutoresizingMask:NSViewWidthSizable];
     mHidden = [[[NSButton alloc] initWithFrame:NSZeroRect] autorelease];
     [mHidden setButtonType:NSSwitchButton];
@@ -156,7 +163,7 @@ NSTextFieldCell* makeTextCell()
     [mHidden setFont:[NSFont systemFontOfSize:kFontSize]];
     [mHidden setTarget:self];
     [mHidden setAction:@selector(toggleHidden:)];
-    place(mHidden, row, kMargin, 118, 20, true);
+    place(mHidden, row, kMargin, kSwitchWidth, 20, true);
 }
 
 // Straight in the content view: whoever uses the panel puts a button of its own beside them.
@@ -220,6 +227,13 @@ NSTextFieldCell* makeTextCell()
     [[self contentView] setNeedsDisplay:YES];
 }
 
+- (CGFloat)smallestHeightOf:(NSView*)accessory
+{
+    if ([accessory respondsToSelector:@selector(tsuiSmallestHeight)])
+        return [(id<TsUILowAccessory>)accessory tsuiSmallestHeight];
+    return NSHeight([accessory frame]);
+}
+
 // The list keeps its usual height above the view.
 - (void)growFor:(NSView*)accessory
 {
@@ -232,10 +246,10 @@ NSTextFieldCell* makeTextCell()
              relativeTo:[content viewWithTag:kTsUIFilePanelSpareButton]];
     [accessory setAutoresizingMask:NSViewWidthSizable];
     const CGFloat width = std::max(asked.width, kSmallestWidth);
-    const CGFloat smallest = smallestHeight(asked.height);
-    [self setContentMinSize:NSMakeSize(width, smallest)];
+    [self setContentMinSize:NSMakeSize(width, smallestHeight([self smallestHeightOf:accessory]))];
     const CGFloat shown = NSWidth([[self contentView] bounds]);
-    [self setContentSize:NSMakeSize(std::max(shown, width), smallest + kListBeyondSmallest)];
+    [self setContentSize:NSMakeSize(std::max(shown, width),
+                                    smallestHeight(asked.height) + kListBeyondSmallest)];
 }
 
 // No higher and no wider than the screen, and in its middle.

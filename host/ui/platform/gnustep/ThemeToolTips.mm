@@ -1,0 +1,68 @@
+// The toolkit makes the window of a tool tip as wide as its text, and then wraps the text in something
+// narrower: the last words are missing. Drawn here instead, with room around.
+#include <algorithm>
+#include <cmath>
+
+#include "host/ui/platform/gnustep/StandIn.h"
+#include "host/ui/platform/gnustep/TesselTheme.h"
+
+namespace tessel::windowing
+{
+namespace
+{
+constexpr CGFloat kPadding = 6;
+
+using SetText = void (*)(id, SEL, NSAttributedString*);
+SetText toolkitSetText;
+
+using SetFrame = void (*)(id, SEL, NSRect, BOOL);
+SetFrame toolkitSetFrame;
+
+NSDictionary* lookOfTips()
+{
+    return [NSDictionary dictionaryWithObjectsAndKeys:[NSFont toolTipsFontOfSize:0], NSFontAttributeName,
+                                                      [NSColor controlTextColor],
+                                                      NSForegroundColorAttributeName, nil];
+}
+
+void setText(id view, SEL selector, NSAttributedString* text)
+{
+    toolkitSetText(view, selector,
+                   [[[NSAttributedString alloc] initWithString:[text string]
+                                                    attributes:lookOfTips()] autorelease]);
+}
+
+// The toolkit has measured the text without room around it: the window grows to the right and down, and stays
+// on the screen.
+void setFrame(id window, SEL selector, NSRect frame, BOOL display)
+{
+    const NSSize text = [[[window contentView] valueForKey:@"text"] size];
+    const NSRect screen = [[NSScreen mainScreen] frame];
+    const CGFloat top = NSMaxY(frame);
+    frame.size = NSMakeSize(std::ceil(text.width) + 2 * kPadding, std::ceil(text.height) + kPadding);
+    frame.origin.x = std::max(NSMinX(screen), std::min(NSMinX(frame), NSMaxX(screen) - NSWidth(frame)));
+    frame.origin.y = std::max(NSMinY(screen), top - NSHeight(frame));
+    toolkitSetFrame(window, selector, frame, display);
+}
+
+void drawTip(id view, SEL, NSRect)
+{
+    const NSRect bounds = [view bounds];
+    [[NSColor toolTipColor] set];
+    NSRectFill(bounds);
+    [themeColor(@"lineColor") set];
+    NSFrameRect(bounds);
+    NSAttributedString* text = [view valueForKey:@"text"];
+    [text drawAtPoint:NSMakePoint(NSMinX(bounds) + kPadding, NSMinY(bounds) + kPadding / 2)];
+}
+} // namespace
+
+void completeToolTips()
+{
+    if (toolkitSetText)
+        return;
+    toolkitSetText = standInFor("GSTTView", @selector(setText:), setText);
+    standInFor("GSTTView", @selector(drawRect:), drawTip);
+    toolkitSetFrame = overrideIn("GSTTPanel", @selector(setFrame:display:), setFrame);
+}
+} // namespace tessel::windowing
