@@ -35,6 +35,8 @@ constexpr std::size_t kFewFiles = 10;
 constexpr std::size_t kManyFiles = 50;
 constexpr std::size_t kFewListed = 2'000;
 constexpr std::size_t kManyListed = 20'000;
+constexpr std::size_t kSomeRows = 500;
+constexpr std::size_t kManyRows = 5'000;
 constexpr int kRepetitions = 15;
 
 void fillHistory(std::size_t count)
@@ -264,6 +266,21 @@ std::string listing(std::size_t files)
     return "list a folder of " + std::to_string(files) + " files";
 }
 
+// Load with all rows of the History selected, each of which gets a row among the loaded applications.
+double loadHistory(std::size_t entries)
+{
+    fillHistory(entries);
+    gLoadedAppList.RemoveAll();
+    const OpenDialog dialog;
+    [dialog.controller() setSaveHistory:YES];
+    NSArray* files = [[dialog.controller() valueForKey:@"historyList"] arrangedObjects];
+    const double seconds =
+        secondsInPool([&] { [dialog.controller() loadApps:files successedApps:nil addToStartupSuit:NO]; });
+    const bool all = dialog.rows(@"loadedApps") == entries;
+    gLoadedAppList.RemoveAll();
+    return all ? seconds : -1;
+}
+
 std::string opening(std::size_t entries)
 {
     return "open tables, History of " + std::to_string(entries);
@@ -272,6 +289,11 @@ std::string opening(std::size_t entries)
 std::string dropping(std::size_t files)
 {
     return "drop " + std::to_string(files) + " files";
+}
+
+std::string loading(std::size_t entries)
+{
+    return "load " + std::to_string(entries) + " rows of the History";
 }
 
 void addBenchmarks()
@@ -291,6 +313,8 @@ void addBenchmarks()
     bench::addRatio({listing(kManyListed) + " / naming them", listing(kManyListed), naming, 3});
     bench::addRatio({"list, cost per file of 20000 / of 2000", listing(kManyListed), listing(kFewListed), 2,
                      kManyListed, kFewListed});
+    for (const std::size_t entries : {kSomeRows, kManyRows})
+        measure(loading(entries), [entries] { return loadHistory(entries); });
     bench::addRatio({opening(kManyEntries) + " / bare array controller", opening(kManyEntries), bare, 2});
     bench::addRatio(
         {opening(kManyEntries) + " / the same with a table bound", opening(kManyEntries), bound, 2});
@@ -298,6 +322,8 @@ void addBenchmarks()
                      opening(kFewEntries), 1.5, kManyEntries, kFewEntries});
     bench::addRatio({"drop, cost per file of 50 / of 10", dropping(kManyFiles), dropping(kFewFiles), 1.5,
                      kManyFiles, kFewFiles});
+    bench::addRatio({"load the History, cost per row of 5000 / of 500", loading(kManyRows),
+                     loading(kSomeRows), 1.5, kManyRows, kSomeRows});
 }
 } // namespace
 

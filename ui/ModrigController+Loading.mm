@@ -3,11 +3,13 @@
 #include <tesselui/tsuieach.h>
 #include <tesselui/tsuifilepanel.h>
 
+#import "ui/ModrigArrayController.h"
 #import "ui/ModrigFilePath.h"
 #import "ui/ModrigStartupSuitController.h"
 #import "ui/TsOCModrigUtil.h"
 
 #include "module/Messages.h"
+#include "ui/LongLoad.h"
 #include "ui/Paths.h"
 #include "ui/Settings.h"
 #include "ui/model/ChosenFiles.h"
@@ -18,13 +20,15 @@ namespace
 constexpr NSInteger kLoadedApplicationsTab = 0;
 constexpr NSInteger kHistoryTab = 1;
 
-// Unless the table has a row for that file already.
-void insertRow(ModrigFilePath* row, NSArrayController* rows, int insertRow)
+// Answers NO when the table has a row for that file already.
+BOOL insertRow(ModrigFilePath* row, NSArrayController* table, int insertRow)
 {
-    NSArray* present = [rows arrangedObjects];
-    if (![present containsObject:row])
-        [rows insertObject:row
-            atArrangedObjectIndex:ModrigUtils::RowForInsertion(insertRow, [present count])];
+    auto* rows = (ModrigArrayController*)table;
+    if ([rows holds:row])
+        return NO;
+    const NSUInteger count = [[rows arrangedObjects] count];
+    [rows insertObject:row atArrangedObjectIndex:ModrigUtils::RowForInsertion(insertRow, count)];
+    return YES;
 }
 
 void scrollToLastRow(NSTableView* table, NSArrayController* rows)
@@ -91,15 +95,16 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
 
 - (void)addRowsFor:(NSString*)path
 {
+    // Thousands of files may be loaded in one go.
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
     ModrigFilePath* row = [[[ModrigFilePath alloc] initWithFilePathName:path] autorelease];
-    insertRow(row, loadedApps, mInsertRow);
     // A row that comes in the place of the selected one does not count as a change of the selection.
-    [self keepToUnloadableRows];
-    if (!mbSaveHistory)
-        return;
-    insertRow(row, historyList, mInsertRow);
+    if (insertRow(row, loadedApps, mInsertRow))
+        [self keepToUnloadableRows];
     // New rows come selected, and not every toolkit tells of that.
-    [self chooseFromHistory];
+    if (mbSaveHistory && insertRow(row, historyList, mInsertRow))
+        [self chooseFromHistory];
+    [pool drain];
 }
 
 - (void)showLastRow
@@ -114,6 +119,8 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
        successedApps:(NSMutableArray*)successedApps
     addToStartupSuit:(BOOL)addToStartupSuit
 {
+    if ([files count] == 0)
+        return;
     // A copy: what is loaded may change the selection that the files come from.
     NSArray* batchFiles = [[files copy] autorelease];
     ModrigUtils::LoadBatch batch;
@@ -124,6 +131,8 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
     batch.succeeded = [=](std::size_t index) { [successedApps addObject:[batchFiles objectAtIndex:index]]; };
     batch.added = [=](std::size_t index)
     { [self addRowsFor:[[batchFiles objectAtIndex:index] filePathName]]; };
+    ModrigUtils::LongLoad load(self, batch.files.size());
+    batch.isStopped = [&load](std::size_t done) { return load.IsStopped(done); };
     if (ModrigUtils::RunLoadBatch(batch) > 0 && mInsertRow == ModrigUtils::kAppendRow)
         [self showLastRow];
 }

@@ -38,6 +38,11 @@ bool LoadFile(const LoadBatch& batch, std::size_t index, Progress& progress)
     return true;
 }
 
+bool IsStopped(const LoadBatch& batch, const Progress& progress)
+{
+    return progress.processed > 0 && batch.isStopped && batch.isStopped(progress.processed);
+}
+
 void SaySummary(const Progress& progress)
 {
     const unsigned one =
@@ -55,6 +60,8 @@ unsigned RunLoadBatch(const LoadBatch& batch)
     {
         if (batch.files[index].isHostFolder)
             continue;
+        if (IsStopped(batch, progress))
+            return progress.added;
         // What follows may depend on the file that failed: nothing more is tried.
         if (!LoadFile(batch, index, progress))
             return 0;

@@ -24,11 +24,16 @@ struct LoadBatch
     // loaded, and the tables want a row.
     std::function<void(std::size_t index)> succeeded;
     std::function<void(std::size_t index)> added;
+
+    // Asked between two files, with how many are done; may be empty. True ends the batch there, and nothing
+    // is said about it: who has stopped it knows.
+    std::function<bool(std::size_t done)> isStopped;
 };
 
 // Loads the files in order. The first that is not loaded ends the batch; the user has then been told about
 // that file, and nothing is said about the others. A batch that gets to its end says what it did.
-// Answers how many files were newly loaded by a batch that got to its end; 0 for one that did not.
+// Answers how many files were newly loaded by a batch that got to its end or was stopped; 0 for one that
+// failed.
 unsigned RunLoadBatch(const LoadBatch& batch);
 
 inline constexpr int kAppendRow = -1;

@@ -119,6 +119,31 @@ TEST_F(LoadingABatch, CallsAFileLoadedBeforeItTriesTheNext)
     EXPECT_THAT(mAdded, ElementsAre(0, 1));
 }
 
+TEST_F(LoadingABatch, EndsBetweenTwoFilesWhenItIsStopped)
+{
+    std::vector<std::size_t> asked;
+    mBatch.isStopped = [&](std::size_t done)
+    {
+        asked.push_back(done);
+        return done == 2;
+    };
+    EXPECT_EQ(2u, Load({L"/a/one.zmb", L"/a/two.zmb", L"/a/three.zmb"}));
+    EXPECT_THAT(asked, ElementsAre(1, 2));
+    EXPECT_THAT(mAdded, ElementsAre(0, 1));
+    EXPECT_FALSE(host().linker.isLoaded(L"/a/three.zmb"));
+    EXPECT_THAT(lines(), IsEmpty());
+}
+
+TEST_F(LoadingABatch, IsNotStoppedAfterItsLastFile)
+{
+    mBatch.isStopped = [](std::size_t done)
+    {
+        return done == 2;
+    };
+    EXPECT_EQ(2u, Load({L"/a/one.zmb", L"/a/two.zmb"}));
+    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2")));
+}
+
 TEST(RowForInsertion, IsTheEndWhenNothingWasDropped)
 {
     EXPECT_EQ(5u, RowForInsertion(kAppendRow, 5));

@@ -1,18 +1,8 @@
 #include <CoreServices/CoreServices.h>
 
-#import "ui/ModrigArrayController.h"
 #import "ui/NSSavePanel+ModrigRuntime.h"
 
 #include "ui/platform/Platform.h"
-
-@implementation ModrigArrayController
-
-- (void)setTable:(NSTableView*)table
-{
-    mTable = table;
-}
-
-@end
 
 @implementation NSSavePanel (ModrigRuntime)
 

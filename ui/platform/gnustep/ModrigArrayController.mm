@@ -3,7 +3,7 @@
 // The toolkit's own controller has no content when it comes from a window file, appends what it should
 // insert, and keeps the selected places instead of the selected objects.
 @interface ModrigArrayController (Content)
-- (void)replaceContent:(NSMutableArray*)content selecting:(NSIndexSet*)selection;
+- (void)showContentSelecting:(NSIndexSet*)selection;
 @end
 
 @implementation ModrigArrayController
@@ -18,15 +18,30 @@
     return self;
 }
 
+- (void)dealloc
+{
+    [mKnown release];
+    [super dealloc];
+}
+
 - (void)setTable:(NSTableView*)table
 {
     mTable = table;
 }
 
-- (void)replaceContent:(NSMutableArray*)content selecting:(NSIndexSet*)selection
+// What is neither sorted nor filtered needs no second array, which would be made again for every row.
+- (id)arrangedObjects
 {
-    [self setContent:content];
-    [mTable reloadData];
+    return mTable ? [self content] : [super arrangedObjects];
+}
+
+// A table asks its data source for the rows; what is bound to them has to be told.
+- (void)showContentSelecting:(NSIndexSet*)selection
+{
+    if (mTable)
+        [mTable reloadData];
+    else
+        [self setContent:[NSMutableArray arrayWithArray:[self content]]];
     [self setSelectionIndexes:selection];
 }
 
@@ -59,10 +74,10 @@
 
 - (void)insertObjects:(NSArray*)objects atArrangedObjectIndexes:(NSIndexSet*)places
 {
-    NSMutableArray* content = [NSMutableArray arrayWithArray:[self content]];
     NSIndexSet* selection = [self selectsInsertedObjects] ? places : [self selectionAfterInsertionAt:places];
-    [content insertObjects:objects atIndexes:places];
-    [self replaceContent:content selecting:selection];
+    [[self content] insertObjects:objects atIndexes:places];
+    [self noteAdded:objects];
+    [self showContentSelecting:selection];
 }
 
 - (void)insertObject:(id)object atArrangedObjectIndex:(NSUInteger)place
@@ -104,10 +119,10 @@
 
 - (void)removeObjectsAtArrangedObjectIndexes:(NSIndexSet*)places
 {
-    NSMutableArray* content = [NSMutableArray arrayWithArray:[self content]];
     NSIndexSet* selection = [self selectionAfterRemovalAt:places];
-    [content removeObjectsAtIndexes:places];
-    [self replaceContent:content selecting:selection];
+    [self noteRemoved:[[self content] objectsAtIndexes:places]];
+    [[self content] removeObjectsAtIndexes:places];
+    [self showContentSelecting:selection];
 }
 
 - (void)removeObjectAtArrangedObjectIndex:(NSUInteger)place
