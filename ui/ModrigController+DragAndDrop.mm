@@ -92,6 +92,7 @@ NSDragOperation operationFor(id<NSDraggingInfo> info)
 
 - (void)dropFiles:(NSArray*)paths atRow:(NSInteger)row addToStartupList:(BOOL)addToStartupList
 {
+    [self clearMessage];
     if (ModrigUtils::RefuseTooManyFiles([paths count]))
         return;
     NSArray* files =

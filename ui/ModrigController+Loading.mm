@@ -121,6 +121,7 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
 {
     if ([files count] == 0)
         return;
+    [self clearMessage];
     // A copy: what is loaded may change the selection that the files come from.
     NSArray* batchFiles = [[files copy] autorelease];
     ModrigUtils::LoadBatch batch;

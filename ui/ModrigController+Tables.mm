@@ -29,6 +29,13 @@ std::vector<ModrigUtils::UnloadCandidate> unloadCandidates(NSArray* rows)
     return candidates;
 }
 
+// A header sends the action of its table too, and so does the empty part of some.
+bool clickMissedTheRows(NSTableView* table)
+{
+    const NSEventType type = [[NSApp currentEvent] type];
+    return (type == NSLeftMouseDown || type == NSLeftMouseUp) && [table clickedRow] < 0;
+}
+
 bool hasSelection(NSArrayController* rows)
 {
     return [[rows selectedObjects] count] > 0;
@@ -131,7 +138,7 @@ bool hasSelection(NSArrayController* rows)
 
 - (IBAction)onDoubleClickHistoryTableView:(id)sender
 {
-    if (sender == historyListTableView)
+    if (sender == historyListTableView && !clickMissedTheRows(historyListTableView))
         [self onLoadFromHistory:sender];
 }
 
@@ -151,6 +158,7 @@ bool hasSelection(NSArrayController* rows)
     NSArray* rows = [[[historyList selectedObjects] copy] autorelease];
     if ([rows count] == 0)
         return;
+    [self clearMessage];
     ModrigUtils::RemoveFromHistory(ModrigUtils::PathsFromRows(rows),
                                    ModrigUtils::RemovingRows(rows, historyList));
 }
@@ -161,6 +169,7 @@ bool hasSelection(NSArrayController* rows)
     NSArray* rows = [[[loadedApps selectedObjects] copy] autorelease];
     if ([rows count] == 0)
         return;
+    [self clearMessage];
     ModrigUtils::UnloadApplications(unloadCandidates(rows), ModrigUtils::RemovingRows(rows, loadedApps));
 }
 

@@ -49,6 +49,9 @@
 - (void)onInit;
 - (void)onFinish;
 
+// An action begins: what an earlier one has said is no answer to it.
+- (void)clearMessage;
+
 - (TsUIPersistentStore*)uiPersistentStore;
 
 @end

@@ -41,6 +41,12 @@
     [super dealloc];
 }
 
+// An empty text, and none: a field that is bound to nothing says so.
+- (void)clearMessage
+{
+    self.message = @"";
+}
+
 - (TsUIPersistentStore*)uiPersistentStore
 {
     if (!mpUIPersistentStore)

@@ -113,6 +113,7 @@ unichar keyOf(NSEvent* event)
     NSArray* rows = [[[startupApps selectedObjects] copy] autorelease];
     if ([rows count] == 0)
         return;
+    [[TsOCModrigUtil getModrigController] clearMessage];
     ModrigUtils::RemoveFromStartupSuite(ModrigUtils::PathsFromRows(rows),
                                         ModrigUtils::RemovingRows(rows, startupApps));
 }
@@ -141,6 +142,7 @@ unichar keyOf(NSEvent* event)
 
 - (void)addFiles:(NSArray*)paths
 {
+    [[TsOCModrigUtil getModrigController] clearMessage];
     if (ModrigUtils::RefuseTooManyFiles([paths count]))
         return;
     NSArray* files =

@@ -122,6 +122,7 @@ void OpenDialogTest::close()
 {
     if (!mController)
         return;
+    [mPanel orderOut:nil]; // the panel is shared, and a test may have shown it
     [mController cleanOpenPanel:mPanel];
     [mController release];
     mController = nil;
