@@ -11,6 +11,7 @@
 
 #include "module/MessageIds.h"
 #include "ui/Paths.h"
+#include "ui/model/ShownText.h"
 
 namespace
 {
@@ -46,7 +47,7 @@ namespace ModrigUtils
 {
 void SetDialogMessage(const CStdStr& text)
 {
-    [[TsOCModrigUtil getModrigController] setMessage:StringFromPath(text)];
+    [[TsOCModrigUtil getModrigController] setMessage:StringFromPath(ShownText(text))];
 }
 
 void RunModrigDialog()

@@ -5,6 +5,8 @@
 
 #import "ui/ModrigFilePath.h"
 
+#include "ui/model/ShownText.h"
+
 namespace ModrigUtils
 {
 std::vector<CStdStr> PathsFromStrings(NSArray* strings)
@@ -45,7 +47,8 @@ id ValueInRow(NSArrayController* rows, NSTableColumn* column, NSInteger row)
     NSArray* all = [rows arrangedObjects];
     if (row < 0 || static_cast<NSUInteger>(row) >= [all count])
         return nil;
-    return [[all objectAtIndex:static_cast<NSUInteger>(row)] valueForKey:[column identifier]];
+    NSString* value = [[all objectAtIndex:static_cast<NSUInteger>(row)] valueForKey:[column identifier]];
+    return StringFromPath(ShownText(PathFromString(value)));
 }
 
 CStdStr PathFromString(NSString* text)

@@ -9,6 +9,7 @@
 #include "host/ui/KeptSignals.h"
 #include "host/ui/SessionEnd.h"
 #include "host/ui/Waiting.h"
+#include "host/ui/platform/Scripts.h"
 #include "host/ui/platform/Windowing.h"
 
 namespace
@@ -31,6 +32,7 @@ void prepare()
     [NSApplication sharedApplication];
     tessel::windowing::completeLook();
     tessel::windowing::completeBehaviour();
+    tessel::windowing::showEveryScript();
     // The host's own loop waits for the terminal; these two are what the toolkit's would have done first.
     [NSApp finishLaunching];
     tessel::closeWindowsWhenTheSessionEnds();

@@ -1,0 +1,9 @@
+#include "host/ui/platform/Scripts.h"
+
+namespace tessel::windowing
+{
+// The platform does.
+void showEveryScript()
+{
+}
+} // namespace tessel::windowing
