@@ -3,6 +3,7 @@
 #include <tesselui/tsuieach.h>
 
 #import "ui/ModrigFilePath.h"
+#import "ui/ModrigTableView.h"
 #import "ui/TsOCModrigUtil.h"
 
 #include "loader/LoadedApplications.h"
@@ -62,6 +63,51 @@ bool hasSelection(NSArrayController* rows)
     if (table == loadedAppsTableView)
         return loadedApps;
     return table == historyListTableView ? historyList : nil;
+}
+
+- (ModrigUtils::TableKind)kindOfTable:(NSTableView*)table
+{
+    return table == loadedAppsTableView ? ModrigUtils::TableKind::kLoadedApplications
+                                        : ModrigUtils::TableKind::kHistory;
+}
+
+- (void)perform:(ModrigUtils::TableAction)action inTable:(NSTableView*)table
+{
+    switch (action)
+    {
+    case ModrigUtils::TableAction::kLoad:
+        return [self onLoadFromHistory:table];
+    case ModrigUtils::TableAction::kAddToStartupSuite:
+        return [self onAddToStartupSuiteFromHistory:table];
+    case ModrigUtils::TableAction::kRemove:
+        return [self onRemove:table];
+    case ModrigUtils::TableAction::kUnload:
+        return [self onUnload:table];
+    default:
+        return;
+    }
+}
+
+- (void)tableView:(NSTableView*)table
+    willDisplayCell:(id)cell
+     forTableColumn:(NSTableColumn*)column
+                row:(NSInteger)row
+{
+    [(ModrigTableView*)table prepareCell:cell forColumn:column row:row];
+}
+
+- (NSString*)tableView:(NSTableView*)table
+        toolTipForCell:(NSCell*)cell
+                  rect:(NSRectPointer)rect
+           tableColumn:(NSTableColumn*)column
+                   row:(NSInteger)row
+         mouseLocation:(NSPoint)place
+{
+    (void)cell;
+    (void)rect;
+    (void)column;
+    (void)place;
+    return [(ModrigTableView*)table tipForRow:row];
 }
 
 - (NSInteger)numberOfRowsInTableView:(NSTableView*)table

@@ -3,6 +3,7 @@
 #include <tesselui/tsuifilepanel.h>
 
 #import "ui/ModrigStartupSuiteBox.h"
+#import "ui/ModrigTableView.h"
 #import "ui/TsOCModrigUtil.h"
 
 #include "lists/History.h"
@@ -10,6 +11,7 @@
 #include "loader/LoadedApplications.h"
 #include "module/EntryPoint.h"
 #include "ui/Detaching.h"
+#include "ui/Layout.h"
 #include "ui/Settings.h"
 #include "ui/model/LoadBatch.h"
 
@@ -81,10 +83,29 @@
     }
 }
 
+- (void)restoreLayout
+{
+    TsUIPersistentStore* settings = [self uiPersistentStore];
+    ModrigUtils::RestoreFrame([[self view] window], settings, kWindowSetting);
+    ModrigUtils::RestoreColumns(loadedAppsTableView, settings, kLoadedColumnSetting);
+    ModrigUtils::RestoreColumns(historyListTableView, settings, kHistoryColumnSetting);
+}
+
+- (void)storeLayout
+{
+    TsUIPersistentStore* settings = [self uiPersistentStore];
+    ModrigUtils::StoreFrame([[self view] window], settings, kWindowSetting);
+    ModrigUtils::StoreColumns(loadedAppsTableView, settings, kLoadedColumnSetting);
+    ModrigUtils::StoreColumns(historyListTableView, settings, kHistoryColumnSetting);
+}
+
 - (void)onInit
 {
     [self readSettings];
     [TsOCModrigUtil setModrigController:self];
+    [ModrigTableView adopt:loadedAppsTableView];
+    [ModrigTableView adopt:historyListTableView];
+    [helpButton setKeyEquivalent:ModrigUtils::HelpKey()];
     NSArray* files = [NSArray arrayWithObject:NSFilenamesPboardType];
     [loadedAppsTableView registerForDraggedTypes:files];
     [startupSuiteBox registerForDraggedTypes:files];
@@ -92,6 +113,7 @@
     [historyListTableView setDataSource:self];
     [historyListTableView setTarget:self];
     [historyListTableView setDoubleAction:@selector(onDoubleClickHistoryTableView:)];
+    [self restoreLayout];
 }
 
 - (void)storeSettings
@@ -110,6 +132,7 @@
     [loadedAppsTableView setDataSource:nil];
     [historyListTableView setDataSource:nil];
     [self storeSettings];
+    [self storeLayout];
     [TsOCModrigUtil setModrigController:nil];
     [historyListTableView setDoubleAction:nullptr];
     ModrigUtils::DetachFrom(self, [self view]);

@@ -1,16 +1,20 @@
 #import "ui/ModrigStartupSuitController.h"
 
 #import <tesselui/TsOCOpenFileDialog.h>
+#import <tesselui/TsUIPersistentStore.h>
 #include <tesselui/tsuieach.h>
 
 #import "ui/ModrigController.h"
 #import "ui/ModrigFilePath.h"
+#import "ui/ModrigTableView.h"
 #import "ui/TsOCModrigUtil.h"
 
 #include "module/Globals.h"
 #include "module/MessageIds.h"
 #include "module/Messages.h"
+#include "ui/Layout.h"
 #include "ui/Paths.h"
+#include "ui/Settings.h"
 #include "ui/model/FileIntake.h"
 #include "ui/model/ListRemoval.h"
 #include "ui/platform/Platform.h"
@@ -19,12 +23,6 @@ namespace
 {
 constexpr NSInteger kAddSegment = 0;
 constexpr NSInteger kRemoveSegment = 1;
-
-unichar keyOf(NSEvent* event)
-{
-    NSString* characters = [event charactersIgnoringModifiers];
-    return [characters length] == 1 ? [characters characterAtIndex:0] : 0;
-}
 } // namespace
 
 @interface ModrigStartupSuitController (Segments)
@@ -46,7 +44,10 @@ unichar keyOf(NSEvent* event)
 - (void)doInit
 {
     ModrigPlatform::CompleteSegments(segmentedControl);
-    [startupTableView sizeLastColumnToFit];
+    [ModrigTableView adopt:startupTableView];
+    TsUIPersistentStore* settings = [[[TsUIPersistentStore alloc] init] autorelease];
+    ModrigUtils::RestoreFrame([self window], settings, kSuiteWindowSetting);
+    ModrigUtils::RestoreColumns(startupTableView, settings, kSuiteColumnSetting);
     ModrigPlatform::ShowRows(startupTableView, startupApps);
     [TsOCModrigUtil fill:startupApps withPathNames:ModrigUtils::StringsFromList(gStartupList)];
     [self enableRemove:NO];
@@ -60,6 +61,9 @@ unichar keyOf(NSEvent* event)
 
 - (void)doClean
 {
+    TsUIPersistentStore* settings = [[[TsUIPersistentStore alloc] init] autorelease];
+    ModrigUtils::StoreFrame([self window], settings, kSuiteWindowSetting);
+    ModrigUtils::StoreColumns(startupTableView, settings, kSuiteColumnSetting);
 }
 
 - (IBAction)onSegmentedButton:(id)sender
@@ -75,20 +79,13 @@ unichar keyOf(NSEvent* event)
     }
 }
 
-// What the segmented control does, for the keyboard.
+// Wherever in the window the keyboard is: the table's keys, and the one for help.
 - (void)keyDown:(NSEvent*)event
 {
-    switch (keyOf(event))
-    {
-    case NSInsertFunctionKey:
-        return [self onAdd];
-    case NSDeleteFunctionKey:
-    case NSDeleteCharacter:
-    case NSBackspaceCharacter:
-        return [self onRemove];
-    default:
-        return [super keyDown:event];
-    }
+    if ([[event charactersIgnoringModifiers] isEqual:ModrigUtils::HelpKey()])
+        return [self help:nil];
+    if (![(ModrigTableView*)startupTableView takeKey:event])
+        [super keyDown:event];
 }
 
 - (void)onAdd

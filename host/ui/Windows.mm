@@ -10,6 +10,7 @@
 #include "host/ui/SessionEnd.h"
 #include "host/ui/Waiting.h"
 #include "host/ui/platform/Scripts.h"
+#include "host/ui/platform/TextKeys.h"
 #include "host/ui/platform/Windowing.h"
 
 namespace
@@ -33,6 +34,7 @@ void prepare()
     tessel::windowing::completeLook();
     tessel::windowing::completeBehaviour();
     tessel::windowing::showEveryScript();
+    tessel::windowing::takeTextKeys();
     // The host's own loop waits for the terminal; these two are what the toolkit's would have done first.
     [NSApp finishLaunching];
     tessel::closeWindowsWhenTheSessionEnds();

@@ -29,6 +29,18 @@ constexpr char kExtensionSuffix[] = "_EXT";
 const std::map<std::string, std::vector<std::string>> kTexts = {
     {"IDS_MODRIG_CLOSE_BUTTON", {}},
     {"IDS_MODRIG_NOTHING_CHOSEN", {}},
+    {"IDS_MODRIG_MENU_LOAD", {}},
+    {"IDS_MODRIG_MENU_UNLOAD", {}},
+    {"IDS_MODRIG_MENU_ADD", {}},
+    {"IDS_MODRIG_MENU_ADD_TO_STARTUP_SUITE", {}},
+    {"IDS_MODRIG_MENU_REMOVE", {}},
+    {"IDS_MODRIG_MENU_MOVE_UP", {}},
+    {"IDS_MODRIG_MENU_MOVE_DOWN", {}},
+    {"IDS_MODRIG_MENU_COPY_PATH", {}},
+    {"IDS_MODRIG_MENU_SHOW_IN_FOLDER", {}},
+    {"IDS_MODRIG_ROW_MISSING", {}},
+    {"IDS_MODRIG_ROW_LOCKED", {}},
+    {"IDS_MODRIG_ROW_NEVER_UNLOADED", {}},
     {"IDS_MODRIG_LOADING", {"%u", "%u"}},
     {"IDS_MODRIG_LOADING_STOPPED", {"%u", "%u"}},
 };

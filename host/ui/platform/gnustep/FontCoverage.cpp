@@ -8,7 +8,8 @@ namespace tessel::windowing
 {
 namespace
 {
-template <class Object, void (*Destroy)(Object*)> struct Destroying
+template <class Object, void (*Destroy)(Object*)>
+struct Destroying
 {
     void operator()(Object* object) const { Destroy(object); }
 };

@@ -1,0 +1,38 @@
+// A table of the dialogs as a person expects one: keys, a menu on its rows, going to a row by its first
+// letters. What can be done with the rows is its owner's: its delegate.
+#pragma once
+
+#import <AppKit/AppKit.h>
+
+#include "ui/model/TableActions.h"
+
+namespace ModrigUtils
+{
+// The key that opens a help page, as buttons have it.
+NSString* HelpKey();
+} // namespace ModrigUtils
+
+@interface ModrigTableView : NSTableView
+
+// Makes a table of a window file one of these.
++ (void)adopt:(NSTableView*)table;
+
+// Does what the key stands for, and answers NO when it stands for nothing here. A key that cannot act beeps.
+- (BOOL)takeKey:(NSEvent*)event;
+
+// The owner's rows have come to the screen or left it: shown names are shortened, grey where the row is of no
+// use. To be called by the owner as its delegate method of that name.
+- (void)prepareCell:(id)cell forColumn:(NSTableColumn*)column row:(NSInteger)row;
+// What the tip of a row says: its whole path, and why it is grey.
+- (NSString*)tipForRow:(NSInteger)row;
+
+@end
+
+@interface NSObject (ModrigTableOwner)
+
+- (ModrigUtils::TableKind)kindOfTable:(NSTableView*)table;
+- (NSArrayController*)rowsOf:(NSTableView*)table;
+// Actions that are the owner's: all but copying, showing and selecting.
+- (void)perform:(ModrigUtils::TableAction)action inTable:(NSTableView*)table;
+
+@end

@@ -1,0 +1,29 @@
+#include "ui/platform/Desktop.h"
+
+namespace ModrigPlatform
+{
+bool IsCommand(NSEvent* event)
+{
+    return [event modifierFlags] & NSCommandKeyMask;
+}
+
+bool IsAlternate(NSEvent* event)
+{
+    return [event modifierFlags] & NSAlternateKeyMask;
+}
+
+NSEvent* ClickOnTable(NSEvent* event)
+{
+    return event;
+}
+
+void ShowInFolder(NSString* path)
+{
+    [[NSWorkspace sharedWorkspace] selectFile:path inFileViewerRootedAtPath:@""];
+}
+
+bool ShortensTexts()
+{
+    return true;
+}
+} // namespace ModrigPlatform
