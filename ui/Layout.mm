@@ -47,8 +47,6 @@ void RestoreColumns(NSTableView* table, TsUIPersistentStore* settings, NSString*
 
 void StoreColumns(NSTableView* table, TsUIPersistentStore* settings, NSString* name)
 {
-    [settings putControlInt:kSettingsGroup
-                    control:name
-                      value:static_cast<int>([firstColumnOf(table) width])];
+    [settings putControlInt:kSettingsGroup control:name value:static_cast<int>([firstColumnOf(table) width])];
 }
 } // namespace ModrigUtils

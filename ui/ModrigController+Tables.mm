@@ -93,7 +93,8 @@ bool hasSelection(NSArrayController* rows)
      forTableColumn:(NSTableColumn*)column
                 row:(NSInteger)row
 {
-    [(ModrigTableView*)table prepareCell:cell forColumn:column row:row];
+    (void)column;
+    [(ModrigTableView*)table prepareCell:cell row:row];
 }
 
 - (NSString*)tableView:(NSTableView*)table

@@ -61,7 +61,8 @@ std::vector<std::size_t> indexesOf(NSIndexSet* rows)
     if ([places count] == 0)
         return NSBeep();
     [startupTableView selectRowIndexes:places byExtendingSelection:NO];
-    [startupTableView scrollRowToVisible:static_cast<NSInteger>(up ? [places firstIndex] : [places lastIndex])];
+    [startupTableView
+        scrollRowToVisible:static_cast<NSInteger>(up ? [places firstIndex] : [places lastIndex])];
 }
 
 - (void)perform:(ModrigUtils::TableAction)action inTable:(NSTableView*)table
@@ -87,7 +88,8 @@ std::vector<std::size_t> indexesOf(NSIndexSet* rows)
      forTableColumn:(NSTableColumn*)column
                 row:(NSInteger)row
 {
-    [(ModrigTableView*)table prepareCell:cell forColumn:column row:row];
+    (void)column;
+    [(ModrigTableView*)table prepareCell:cell row:row];
 }
 
 - (NSString*)tableView:(NSTableView*)table

@@ -20,9 +20,8 @@ NSString* HelpKey();
 // Does what the key stands for, and answers NO when it stands for nothing here. A key that cannot act beeps.
 - (BOOL)takeKey:(NSEvent*)event;
 
-// The owner's rows have come to the screen or left it: shown names are shortened, grey where the row is of no
-// use. To be called by the owner as its delegate method of that name.
-- (void)prepareCell:(id)cell forColumn:(NSTableColumn*)column row:(NSInteger)row;
+// Makes the text of a row grey that is of no use: what the owner does before a cell is drawn.
+- (void)prepareCell:(id)cell row:(NSInteger)row;
 // What the tip of a row says: its whole path, and why it is grey.
 - (NSString*)tipForRow:(NSInteger)row;
 

@@ -7,6 +7,7 @@
 #include <optional>
 
 #import "ui/ModrigFilePath.h"
+#import "ui/ModrigNameCell.h"
 #import "ui/TsOCModrigUtil.h"
 
 #include "types/ApplicationTypes.h"
@@ -21,8 +22,6 @@ using ModrigUtils::TableAction;
 
 namespace
 {
-constexpr CGFloat kCellMargin = 8; // what a cell leaves free around its text
-
 NSString* titleOf(TableAction action)
 {
     switch (action)
@@ -53,7 +52,8 @@ ModrigUtils::TableKey keyOf(NSEvent* event)
     constexpr wchar_t kLastControlCharacter = 0x1A;
     NSString* characters = [event charactersIgnoringModifiers];
     ModrigUtils::TableKey key = {[characters length] == 1 ? wchar_t([characters characterAtIndex:0]) : L'\0',
-                                 ModrigPlatform::IsCommand(event), ModrigPlatform::IsAlternate(event)};
+                                 ModrigPlatform::IsCommand(event),
+                                 ModrigPlatform::IsAlternate(event)};
     // Some displays send Control-A as the first of the control characters.
     if (key.command && key.character > 0 && key.character <= kLastControlCharacter)
         key.character = static_cast<wchar_t>(key.character + L'a' - 1);
@@ -105,6 +105,8 @@ NSString* ModrigUtils::HelpKey()
 + (void)adopt:(NSTableView*)table
 {
     object_setClass(table, [ModrigTableView class]);
+    for (NSTableColumn* column : tsuiEach<NSTableColumn*>([table tableColumns]))
+        [ModrigNameCell adoptIn:column];
     NSView* frame = [[table enclosingScrollView] contentView];
     [frame setPostsFrameChangedNotifications:YES];
     [[NSNotificationCenter defaultCenter] addObserver:table
@@ -206,7 +208,8 @@ NSString* ModrigUtils::HelpKey()
 
 - (BOOL)takeKey:(NSEvent*)event
 {
-    const TableAction action = ModrigUtils::ActionForKey([(id)[self delegate] kindOfTable:self], keyOf(event));
+    const TableAction action =
+        ModrigUtils::ActionForKey([(id)[self delegate] kindOfTable:self], keyOf(event));
     if (action == TableAction::kNone)
         return NO;
     [self perform:action on:[self selectedRowIndexes]];
@@ -245,17 +248,17 @@ NSString* ModrigUtils::HelpKey()
 {
     if (action == TableAction::kNone)
         return (NSMenuItem*)[NSMenuItem separatorItem];
-    NSMenuItem* item =
-        [[[NSMenuItem alloc] initWithTitle:[TsOCModrigUtil modrigLoadString:titleOf(action)]
-                                    action:@selector(performMenuItem:)
-                             keyEquivalent:@""] autorelease];
+    NSMenuItem* item = [[[NSMenuItem alloc] initWithTitle:[TsOCModrigUtil modrigLoadString:titleOf(action)]
+                                                   action:@selector(performMenuItem:)
+                                            keyEquivalent:@""] autorelease];
     [item setTarget:self];
     [item setTag:static_cast<NSInteger>(action)];
     [item setRepresentedObject:rows];
     return item;
 }
 
-// A row that can be selected is, by the click that opens its menu; the menu is then one for all selected rows.
+// A row that can be selected is, by the click that opens its menu; the menu is then one for all selected
+// rows.
 - (NSIndexSet*)rowsPointedAt:(NSInteger)row
 {
     if (row < 0)
@@ -281,24 +284,39 @@ NSString* ModrigUtils::HelpKey()
     return ModrigUtils::StateOf([(id)[self delegate] kindOfTable:self], factsOf(file));
 }
 
-- (void)shortenTextOf:(NSCell*)cell to:(CGFloat)width
-{
-    NSDictionary* font = [NSDictionary dictionaryWithObject:[cell font] forKey:NSFontAttributeName];
-    const CStdStr shown = ModrigUtils::Shortened(
-        ModrigUtils::PathFromString([cell stringValue]), [=](const CStdStr& text)
-        { return [ModrigUtils::StringFromPath(text) sizeWithAttributes:font].width <= width; });
-    [cell setStringValue:ModrigUtils::StringFromPath(shown)];
-}
-
-- (void)prepareCell:(id)cell forColumn:(NSTableColumn*)column row:(NSInteger)row
+- (void)prepareCell:(id)cell row:(NSInteger)row
 {
     ModrigFilePath* file = [self fileInRow:row];
     if (!file)
         return;
     const bool isGrey = [self stateOfFile:file] != ModrigUtils::RowState::kUsable;
     [cell setTextColor:isGrey ? [NSColor disabledControlTextColor] : [NSColor controlTextColor]];
-    if (!ModrigPlatform::ShortensTexts())
-        [self shortenTextOf:cell to:[column width] - kCellMargin];
+}
+
+// One tip for each row that shows. This is called whenever others do.
+- (void)resetCursorRects
+{
+    [super resetCursorRects];
+    if (ModrigPlatform::TablesShowTips())
+        return;
+    [self removeAllToolTips];
+    const NSRange shown = [self rowsInRect:[self visibleRect]];
+    for (NSUInteger row = shown.location; row < NSMaxRange(shown); ++row)
+        [self addToolTipRect:[self rectOfRow:static_cast<NSInteger>(row)] owner:self userData:nullptr];
+}
+
+- (void)reloadData
+{
+    [super reloadData];
+    [[self window] invalidateCursorRectsForView:self];
+}
+
+- (NSString*)view:(NSView*)view stringForToolTip:(NSToolTipTag)tag point:(NSPoint)place userData:(void*)data
+{
+    (void)view;
+    (void)tag;
+    (void)data;
+    return [self tipForRow:[self rowAtPoint:place]];
 }
 
 - (NSString*)tipForRow:(NSInteger)row

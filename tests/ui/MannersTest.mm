@@ -3,6 +3,7 @@
 #include "tests/ui/support/Events.h"
 
 #import "ui/ModrigFilePath.h"
+#import "ui/ModrigNameCell.h"
 #import "ui/ModrigTableView.h"
 #import "ui/TsOCModrigUtil.h"
 
@@ -306,7 +307,7 @@ TEST_F(Manners, DrawMissingFilesInGreyAndLongNamesWithAnEllipsis)
     EXPECT_EQ([NSColor controlTextColor], [cellOf(0) textColor]);
     EXPECT_EQ(L"a.lsp", wide([cellOf(0) stringValue]));
     EXPECT_EQ([NSColor disabledControlTextColor], [cellOf(1) textColor]);
-    const std::wstring shown = wide([cellOf(2) stringValue]);
+    const std::wstring shown = wide([(ModrigNameCell*)cellOf(2) textIn:170]);
     EXPECT_EQ(L'…', shown.back());
     EXPECT_LT(shown.size(), 40u);
 }
@@ -341,4 +342,13 @@ TEST_F(Manners, AreRememberedForTheWindowAndItsColumns)
     open();
     EXPECT_TRUE(NSEqualRects(frame, [mPanel frame])) << [NSStringFromRect([mPanel frame]) UTF8String];
     EXPECT_EQ(231, [[[historyTable() tableColumns] objectAtIndex:0] width]);
+}
+
+TEST_F(Manners, ShowTheTipOfARowWhenThePointerRestsOnIt)
+{
+    openHistory({"a.lsp", "b.lsp"});
+    const std::size_t before = events::windowsOnTheScreen();
+    events::movePointerTo(historyTable(), events::middleOf([historyTable() rectOfRow:1]));
+    EXPECT_TRUE(events::comesTrue([&] { return events::windowsOnTheScreen() > before; }));
+    events::movePointerTo([mPanel contentView], NSMakePoint(1, 1));
 }

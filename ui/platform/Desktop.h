@@ -9,13 +9,15 @@ namespace ModrigPlatform
 bool IsCommand(NSEvent* event);
 bool IsAlternate(NSEvent* event);
 
-// The click as the toolkit's tables have to see it, for Shift to take a range of rows and the key for commands
-// single ones.
+// The click as the toolkit's tables have to see it, for Shift to take a range of rows and the key for
+// commands single ones.
 NSEvent* ClickOnTable(NSEvent* event);
 
 // Shows the file where it lies, in the program that the desktop has for folders.
 void ShowInFolder(NSString* path);
 
-// Whether the toolkit shortens what does not fit into a cell by itself.
-bool ShortensTexts();
+// Whether the toolkit's tables shorten what does not fit into a cell, and ask their delegates for the tips of
+// cells.
+bool TablesShortenTexts();
+bool TablesShowTips();
 } // namespace ModrigPlatform

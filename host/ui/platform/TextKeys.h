@@ -3,7 +3,7 @@
 
 namespace tessel::windowing
 {
-// From now on the platform's keys for selecting all, copying, pasting, cutting and undoing work in every field
-// where a text is typed or can be selected.
+// From now on the platform's keys for selecting all, copying, pasting, cutting and undoing work in every
+// field where a text is typed or can be selected.
 void takeTextKeys();
 } // namespace tessel::windowing

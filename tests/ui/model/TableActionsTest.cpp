@@ -64,10 +64,9 @@ TEST(TableMenu, HasWhatTheButtonsDoAndThePathOfTheRow)
     EXPECT_THAT(MenuOf(kHistory),
                 ElementsAre(TableAction::kLoad, TableAction::kAddToStartupSuite, TableAction::kRemove,
                             TableAction::kNone, TableAction::kCopyPath, TableAction::kShowInFolder));
-    EXPECT_THAT(MenuOf(kSuite),
-                ElementsAre(TableAction::kMoveUp, TableAction::kMoveDown, TableAction::kNone,
-                            TableAction::kAdd, TableAction::kRemove, TableAction::kNone,
-                            TableAction::kCopyPath, TableAction::kShowInFolder));
+    EXPECT_THAT(MenuOf(kSuite), ElementsAre(TableAction::kMoveUp, TableAction::kMoveDown, TableAction::kNone,
+                                            TableAction::kAdd, TableAction::kRemove, TableAction::kNone,
+                                            TableAction::kCopyPath, TableAction::kShowInFolder));
 }
 
 TEST(TableActions, NeedASelectionUnlessTheyMakeOne)
@@ -75,8 +74,8 @@ TEST(TableActions, NeedASelectionUnlessTheyMakeOne)
     const TableState empty;
     const TableState unselected = {.rows = 3};
     const TableState selected = {.rows = 3, .selected = 1};
-    for (const TableAction action : {TableAction::kLoad, TableAction::kUnload, TableAction::kRemove,
-                                     TableAction::kAddToStartupSuite})
+    for (const TableAction action :
+         {TableAction::kLoad, TableAction::kUnload, TableAction::kRemove, TableAction::kAddToStartupSuite})
     {
         EXPECT_FALSE(IsPossible(action, unselected));
         EXPECT_TRUE(IsPossible(action, selected));

@@ -3,6 +3,8 @@
 
 #import <AppKit/AppKit.h>
 
+#include <functional>
+
 namespace events
 {
 // Clicks there, in the view's coordinates, so many times as one double or triple click is.
@@ -11,6 +13,15 @@ void click(NSView* view, NSPoint place, unsigned modifiers = 0, int clicks = 1);
 void clickRow(NSTableView* table, NSInteger row, unsigned modifiers = 0, int clicks = 1);
 
 void press(NSWindow* window, NSString* characters, unsigned modifiers = 0);
+
+// Moves the pointer there, in the view's coordinates.
+void movePointerTo(NSView* view, NSPoint place);
+
+// How many windows the display shows, tips and menus among them.
+std::size_t windowsOnTheScreen();
+
+// Goes on until the condition holds; answers false when it does not in some seconds.
+bool comesTrue(const std::function<bool()>& condition);
 
 // Deals with everything that waits for the program.
 void pump();

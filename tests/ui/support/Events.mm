@@ -1,5 +1,10 @@
 #include "tests/ui/support/Events.h"
 
+#import <GNUstepGUI/GSDisplayServer.h>
+
+#include <X11/Xlib.h>
+
+#include <algorithm>
 #include <initializer_list>
 
 namespace events
@@ -27,6 +32,51 @@ void pump()
                                                   inMode:NSDefaultRunLoopMode
                                                  dequeue:YES])
         [NSApp sendEvent:event];
+}
+
+void movePointerTo(NSView* view, NSPoint place)
+{
+    const NSPoint point = [[view window] convertBaseToScreen:[view convertPoint:place toView:nil]];
+    auto* display = static_cast<Display*>([GSCurrentServer() serverDevice]);
+    const int top = static_cast<int>(NSHeight([[NSScreen mainScreen] frame]) - point.y);
+    // A pointer that rests has come from somewhere.
+    for (const int step : {-1, 0})
+    {
+        XWarpPointer(display, None, DefaultRootWindow(display), 0, 0, 0, 0, static_cast<int>(point.x) + step,
+                     top + step);
+        XSync(display, False);
+    }
+    pump();
+}
+
+std::size_t windowsOnTheScreen()
+{
+    auto* display = static_cast<Display*>([GSCurrentServer() serverDevice]);
+    Window root = 0;
+    Window parent = 0;
+    Window* windows = nullptr;
+    unsigned count = 0;
+    XQueryTree(display, DefaultRootWindow(display), &root, &parent, &windows, &count);
+    const auto isShown = [display](Window window)
+    {
+        XWindowAttributes attributes;
+        return XGetWindowAttributes(display, window, &attributes) && attributes.map_state == IsViewable;
+    };
+    const auto shown = std::count_if(windows, windows + count, isShown);
+    XFree(windows);
+    return static_cast<std::size_t>(shown);
+}
+
+bool comesTrue(const std::function<bool()>& condition)
+{
+    NSDate* end = [NSDate dateWithTimeIntervalSinceNow:8];
+    while (!condition() && [end timeIntervalSinceNow] > 0)
+    {
+        [[NSRunLoop currentRunLoop] runMode:NSDefaultRunLoopMode
+                                 beforeDate:[NSDate dateWithTimeIntervalSinceNow:0.05]];
+        pump();
+    }
+    return condition();
 }
 
 void click(NSView* view, NSPoint place, unsigned modifiers, int clicks)

@@ -22,7 +22,12 @@ void ShowInFolder(NSString* path)
     [[NSWorkspace sharedWorkspace] selectFile:path inFileViewerRootedAtPath:@""];
 }
 
-bool ShortensTexts()
+bool TablesShortenTexts()
+{
+    return true;
+}
+
+bool TablesShowTips()
 {
     return true;
 }

@@ -45,7 +45,12 @@ void ShowInFolder(NSString* path)
     [NSTask launchedTaskWithLaunchPath:@"/usr/bin/env" arguments:arguments];
 }
 
-bool ShortensTexts()
+bool TablesShortenTexts()
+{
+    return false;
+}
+
+bool TablesShowTips()
 {
     return false;
 }
