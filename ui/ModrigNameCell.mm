@@ -24,9 +24,7 @@ constexpr CGFloat kMargin = 8; // what a cell leaves free around its text
 {
     NSDictionary* font = [NSDictionary dictionaryWithObject:[self font] forKey:NSFontAttributeName];
     const auto fits = [=](const CStdStr& text)
-    {
-        return [ModrigUtils::StringFromPath(text) sizeWithAttributes:font].width <= width - kMargin;
-    };
+    { return [ModrigUtils::StringFromPath(text) sizeWithAttributes:font].width <= width - kMargin; };
     return ModrigUtils::StringFromPath(
         ModrigUtils::Shortened(ModrigUtils::PathFromString([self stringValue]), fits));
 }

@@ -12,6 +12,7 @@
 #include "host/linker/CallingApplication.h"
 #include "host/linker/ImageCheck.h"
 #include "host/linker/ObjectiveCGuard.h"
+#include "host/messagebox/MessageBox.h"
 #include "host/text/Unicode.h"
 
 bool TsRxDynamicLinker::isKindOf(const wchar_t* className) const
@@ -94,6 +95,8 @@ bool DynamicLinker::loadModule(const wchar_t* path, bool sayWhyNot, bool resolve
     std::wstring whyNot;
     if (load(fullPath, resolveNow, whyNot))
         return true;
+    if (auto* box = services().messageBox)
+        box->explain(fullPath, whyNot + L".");
     if (sayWhyNot)
         say(fullPath, L"is not loaded: ", whyNot);
     return false;

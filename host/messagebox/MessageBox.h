@@ -11,17 +11,33 @@ namespace tessel
 class MessageBox : public VqHostMessageBox
 {
 public:
+    struct Box
+    {
+        std::wstring text;
+        std::wstring detail; // why, in the words of the part that knows; often empty
+        unsigned style = 0;
+        void* parent = nullptr;
+    };
+
     // Shows a box and answers the button's code, or 0 when it cannot. Must not throw.
-    using Presenter = std::function<int(const std::wstring& text, unsigned style, void* parent)>;
+    using Presenter = std::function<int(const Box& box)>;
 
     // From now on boxes are shown by the presenter, and as text where it cannot; an empty one brings the
     // text back.
     void setPresenter(Presenter presenter);
 
-    // As text: "Message: ..." on lines of its own, and the first button counts as chosen.
+    // Why something went wrong with the file: the detail of the next box, if that names the file.
+    void explain(const std::wstring& path, const std::wstring& why);
+
+    // As text, without the detail, which has been said on the command line by then: "Message: ..." on lines
+    // of its own, and the first button counts as chosen.
     int show(const wchar_t* text, unsigned style, void* parent) override;
 
 private:
+    std::wstring takeDetailFor(const std::wstring& text);
+
     Presenter mPresenter;
+    std::wstring mExplainedPath;
+    std::wstring mWhy;
 };
 } // namespace tessel

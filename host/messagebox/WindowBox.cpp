@@ -11,7 +11,7 @@ namespace
 constexpr char kLibrary[] = TESSEL_WINDOWS_LIBRARY; // the file's name on this platform
 constexpr char kShowBox[] = "tsuiShowMessageBox";
 
-using ShowBox = int (*)(const wchar_t* text, unsigned style, void* parent);
+using ShowBox = int (*)(const wchar_t* text, const wchar_t* detail, unsigned style, void* parent);
 
 // Kept loaded to the end: a toolkit cannot be taken out of a process.
 ShowBox findShowBox(const std::filesystem::path& library)
@@ -23,10 +23,10 @@ ShowBox findShowBox(const std::filesystem::path& library)
 
 MessageBox::Presenter windowBoxes(const std::filesystem::path& libraryFolder)
 {
-    return [library = libraryFolder / kLibrary](const std::wstring& text, unsigned style, void* parent)
+    return [library = libraryFolder / kLibrary](const MessageBox::Box& box)
     {
         static const ShowBox showBox = hasDisplay() ? findShowBox(library) : nullptr;
-        return showBox ? showBox(text.c_str(), style, parent) : 0;
+        return showBox ? showBox(box.text.c_str(), box.detail.c_str(), box.style, box.parent) : 0;
     };
 }
 } // namespace tessel

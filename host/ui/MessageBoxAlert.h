@@ -3,6 +3,8 @@
 
 #include <tessel/tsdefs.h>
 
-// Shows the box and answers the button's code, or 0 when it was not shown: there is no display, or nobody to
-// answer (a script runs and no window of the host is open).
-extern "C" TESSEL_API int tsuiShowMessageBox(const wchar_t* text, unsigned style, void* parent);
+// Shows the box, with the detail below the text unless it is empty, and answers the button's code, or 0 when
+// it was not shown: there is no display, or nobody to answer (a script runs and no window of the host is
+// open).
+extern "C" TESSEL_API int tsuiShowMessageBox(const wchar_t* text, const wchar_t* detail, unsigned style,
+                                             void* parent);

@@ -22,7 +22,7 @@ bool somebodyIsThere()
 }
 } // namespace
 
-int tsuiShowMessageBox(const wchar_t* text, unsigned style, void* parent)
+int tsuiShowMessageBox(const wchar_t* text, const wchar_t* detail, unsigned style, void* parent)
 {
     (void)parent; // the box is modal for the whole program, over whatever window is modal already
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
@@ -30,7 +30,7 @@ int tsuiShowMessageBox(const wchar_t* text, unsigned style, void* parent)
     if (somebodyIsThere() && tsuiHasDisplay() && tsuiPrepareWindows() && !tessel::sessionIsToEnd())
     {
         const tessel::Question question;
-        tessel::windowing::runMessage(wcharToNSString(text), style & MB_ICONEXCLAMATION);
+        tessel::windowing::runMessage(wcharToNSString(text), wcharToNSString(detail), style & MB_ICONEXCLAMATION);
         answer = IDOK;
         if (![NSApp modalWindow])
             tsuiFinishWindows();

@@ -1,5 +1,7 @@
 #include <gtest/gtest.h>
 
+#include <vector>
+
 #include "host/messagebox/MessageBox.h"
 #include "tests/host_app/HostParts.h"
 
@@ -21,10 +23,10 @@ TEST(MessageBox, IsShownByThePresenterWhenThereIsOne)
     std::wstring seen;
     unsigned seenStyle = 0;
     box.setPresenter(
-        [&](const std::wstring& text, unsigned style, void*)
+        [&](const tessel::MessageBox::Box& shown)
         {
-            seen = text;
-            seenStyle = style;
+            seen = shown.text;
+            seenStyle = shown.style;
             return 7;
         });
     EXPECT_EQ(box.show(L"text", 48, nullptr), 7);
@@ -40,9 +42,37 @@ TEST(MessageBox, IsTextWhereThePresenterCannotShowIt)
 {
     CapturedOutput output;
     tessel::MessageBox box;
-    box.setPresenter([](const std::wstring&, unsigned, void*) { return 0; });
+    box.setPresenter([](const tessel::MessageBox::Box&) { return 0; });
     EXPECT_EQ(box.show(L"text", MB_OK, nullptr), IDOK);
     EXPECT_EQ(output.text(), "Message: text\n");
+}
+
+TEST(MessageBox, SaysInItsDetailWhatIsKnownOfTheFileThatItNames)
+{
+    CapturedOutput output;
+    tessel::MessageBox box;
+    std::vector<std::wstring> details;
+    box.setPresenter(
+        [&](const tessel::MessageBox::Box& shown)
+        {
+            details.push_back(shown.detail);
+            return IDOK;
+        });
+    box.explain(L"/a/tool.zmb", L"it has no entry point.");
+    box.show(L"/a/tool.zmb was not loaded.", 48, nullptr);
+    box.show(L"/a/tool.zmb was not loaded.", 48, nullptr);
+    box.explain(L"/a/tool.zmb", L"it has no entry point.");
+    box.show(L"/a/other.zmb was not loaded.", 48, nullptr);
+    EXPECT_EQ(details, (std::vector<std::wstring>{L"it has no entry point.", L"", L""}));
+}
+
+TEST(MessageBox, LeavesTheDetailToTheCommandLineWithoutADisplay)
+{
+    CapturedOutput output;
+    tessel::MessageBox box;
+    box.explain(L"/a/tool.zmb", L"it has no entry point.");
+    box.show(L"/a/tool.zmb was not loaded.", 48, nullptr);
+    EXPECT_EQ(output.text(), "Message: /a/tool.zmb was not loaded.\n");
 }
 
 TEST(MessageBox, IsThereEvenWithoutAHost)

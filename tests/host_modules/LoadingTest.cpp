@@ -1,3 +1,4 @@
+#include "host/messagebox/MessageBox.h"
 #include "tests/host_modules/HostWithModules.h"
 
 #include <sys/stat.h>
@@ -58,6 +59,26 @@ TEST_F(Loading, AnswersTrueAtOnceForAFileThatIsLoadedHoweverItsPathIsSpelled)
         EXPECT_TRUE(load(other)) << other;
     EXPECT_EQ(output(), "");
     EXPECT_EQ(names(), L"Good.zmb Good.bundle ");
+}
+
+TEST_F(Loading, ExplainsAFailureInTheBoxThatNamesTheFile)
+{
+    tessel::MessageBox box;
+    std::wstring detail;
+    box.setPresenter(
+        [&](const tessel::MessageBox::Box& shown)
+        {
+            detail = shown.detail;
+            return IDOK;
+        });
+    tessel::services().messageBox = &box;
+    const auto path = mFolder / "missing.zmb";
+    EXPECT_FALSE(load(path));
+    const std::string said = output();
+    box.show((tessel::toWide(path.native()) + L" was not loaded.").c_str(), MB_OK, nullptr);
+    EXPECT_FALSE(detail.empty());
+    EXPECT_EQ(said,
+              "The application \"" + path.native() + "\" is not loaded: " + tessel::toUtf8(detail) + "\n");
 }
 
 TEST_F(Loading, TakesARelativePathFromTheCurrentFolder)

@@ -23,7 +23,8 @@ void completeBehaviour();
 void callBeforeEachWait(void (*call)());
 
 // Shows a message of the host, with the sign of a warning or of mere information, until it is answered.
-void runMessage(NSString* text, bool warning);
+// `detail` (or an empty text) says why, in smaller type that can be selected and copied.
+void runMessage(NSString* text, NSString* detail, bool warning);
 
 // Carries out what the screen still has to show.
 void flushScreen();

@@ -34,11 +34,12 @@ void completeBehaviour()
 {
 }
 
-void runMessage(NSString* text, bool warning)
+void runMessage(NSString* text, NSString* detail, bool warning)
 {
     NSAlert* alert = [[[NSAlert alloc] init] autorelease];
-    [alert setMessageText:@"Tessel"];
-    [alert setInformativeText:text];
+    // The system sets the second text in smaller type, and lets it be selected.
+    [alert setMessageText:[detail length] ? text : @"Tessel"];
+    [alert setInformativeText:[detail length] ? detail : text];
     [alert setAlertStyle:warning ? NSWarningAlertStyle : NSInformationalAlertStyle];
     [alert addButtonWithTitle:@"OK"];
     [alert runModal];

@@ -19,6 +19,8 @@ constexpr CGFloat kNarrowestText = 220;
 constexpr CGFloat kTextHeightAllowed = 10000;
 constexpr CGFloat kFieldPadding = 6; // of a field around its text
 constexpr CGFloat kFontSize = 13;
+constexpr CGFloat kDetailFontSize = 11;
+constexpr CGFloat kDetailGap = 10;
 const NSSize kButtonSize = {88, 28};
 constexpr unichar kEscape = 033;
 
@@ -78,15 +80,15 @@ NSBezierPath* triangleIn(NSRect frame)
 @end
 
 @interface TsMessagePanel : NSPanel
-- (id)initWithText:(NSString*)text warning:(BOOL)warning;
+- (id)initWithText:(NSString*)text detail:(NSString*)detail warning:(BOOL)warning;
 @end
 
 @implementation TsMessagePanel
 
-- (NSTextField*)fieldFor:(NSString*)text
+- (NSTextField*)fieldFor:(NSString*)text size:(CGFloat)fontSize
 {
     NSTextField* field = [[[NSTextField alloc] initWithFrame:NSZeroRect] autorelease];
-    [field setFont:[NSFont systemFontOfSize:kFontSize]];
+    [field setFont:[NSFont systemFontOfSize:fontSize]];
     [field setStringValue:text];
     [field setEditable:NO];
     [field setSelectable:NO];
@@ -103,6 +105,26 @@ NSBezierPath* triangleIn(NSRect frame)
     return field;
 }
 
+// The text, with the detail under it, in a view as large as they are.
+- (NSView*)wordsFor:(NSString*)text detail:(NSString*)detail
+{
+    NSView* words = [[[NSView alloc] initWithFrame:NSZeroRect] autorelease];
+    NSTextField* first = [self fieldFor:text size:kFontSize];
+    NSSize size = [first frame].size;
+    if ([detail length])
+    {
+        NSTextField* second = [self fieldFor:detail size:kDetailFontSize];
+        [second setSelectable:YES];
+        [words addSubview:second];
+        [first setFrameOrigin:NSMakePoint(0, NSHeight([second frame]) + kDetailGap)];
+        size.width = std::max(size.width, NSWidth([second frame]));
+        size.height = NSMaxY([first frame]);
+    }
+    [words setFrameSize:size];
+    [words addSubview:first];
+    return words;
+}
+
 - (NSButton*)answerAt:(NSPoint)origin
 {
     NSButton* button = [[[NSButton alloc]
@@ -115,12 +137,12 @@ NSBezierPath* triangleIn(NSRect frame)
     return button;
 }
 
-- (id)initWithText:(NSString*)text warning:(BOOL)warning
+- (id)initWithText:(NSString*)text detail:(NSString*)detail warning:(BOOL)warning
 {
-    NSTextField* field = [self fieldFor:text];
-    const NSSize words = [field frame].size;
-    const CGFloat height = std::max(words.height, kIconSize);
-    const NSRect content = NSMakeRect(0, 0, 2 * kMargin + kIconSize + kIconGap + words.width,
+    NSView* words = [self wordsFor:text detail:detail];
+    const NSSize size = [words frame].size;
+    const CGFloat height = std::max(size.height, kIconSize);
+    const NSRect content = NSMakeRect(0, 0, 2 * kMargin + kIconSize + kIconGap + size.width,
                                       3 * kMargin + kButtonSize.height + height);
     self = [super initWithContentRect:content
                             styleMask:NSTitledWindowMask | NSClosableWindowMask
@@ -131,10 +153,10 @@ NSBezierPath* triangleIn(NSRect frame)
     [self setTitle:@"Tessel"];
     [self setReleasedWhenClosed:NO];
     const CGFloat middle = 2 * kMargin + kButtonSize.height + height / 2;
-    [field setFrameOrigin:NSMakePoint(kMargin + kIconSize + kIconGap, middle - words.height / 2)];
+    [words setFrameOrigin:NSMakePoint(kMargin + kIconSize + kIconGap, middle - size.height / 2)];
     NSRect sign = NSMakeRect(kMargin, middle - kIconSize / 2, kIconSize, kIconSize);
     [[self contentView] addSubview:[[[TsMessageSign alloc] initWithFrame:sign warning:warning] autorelease]];
-    [[self contentView] addSubview:field];
+    [[self contentView] addSubview:words];
     NSButton* button = [self answerAt:NSMakePoint(NSWidth(content) - kMargin - kButtonSize.width, kMargin)];
     [[self contentView] addSubview:button];
     [self setInitialFirstResponder:button];
@@ -164,9 +186,9 @@ NSBezierPath* triangleIn(NSRect frame)
 
 @end
 
-void tessel::windowing::runMessage(NSString* text, bool warning)
+void tessel::windowing::runMessage(NSString* text, NSString* detail, bool warning)
 {
-    TsMessagePanel* panel = [[TsMessagePanel alloc] initWithText:text warning:warning];
+    TsMessagePanel* panel = [[TsMessagePanel alloc] initWithText:text detail:detail warning:warning];
     if (![NSApp modalWindow])
         [panel center];
     [NSApp runModalForWindow:panel];
