@@ -30,7 +30,8 @@ int tsuiShowMessageBox(const wchar_t* text, const wchar_t* detail, unsigned styl
     if (somebodyIsThere() && tsuiHasDisplay() && tsuiPrepareWindows() && !tessel::sessionIsToEnd())
     {
         const tessel::Question question;
-        tessel::windowing::runMessage(wcharToNSString(text), wcharToNSString(detail), style & MB_ICONEXCLAMATION);
+        tessel::windowing::runMessage(wcharToNSString(text), wcharToNSString(detail),
+                                      style & MB_ICONEXCLAMATION);
         answer = IDOK;
         if (![NSApp modalWindow])
             tsuiFinishWindows();

@@ -152,7 +152,7 @@ TEST_F(Waiting, OfAMessageBoxIsWithinAnAction)
     const auto waits = waitsOf({[&]
                                 {
                                     host().services.waits.clear();
-                                    tsuiShowMessageBox(L"A question.", 0, nullptr);
+                                    tsuiShowMessageBox(L"A question.", L"", 0, nullptr);
                                 },
                                 [&]
                                 {

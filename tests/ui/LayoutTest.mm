@@ -207,7 +207,7 @@ TEST_F(Layout, OfAMessageBoxHasRoomForEverything)
 {
     open();
     const wchar_t* text = L"/a/folder/module.bundle could not be loaded.";
-    const ModalSteps steps({[text] { tsuiShowMessageBox(text, 0, nullptr); },
+    const ModalSteps steps({[text] { tsuiShowMessageBox(text, L"", 0, nullptr); },
                             [this]
                             {
                                 EXPECT_NE(mPanel, [NSApp modalWindow]);

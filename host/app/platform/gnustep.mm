@@ -1,6 +1,6 @@
-// The toolkit keeps settings, and lists of what it has found, in the home of the person that the system knows,
-// whatever HOME says: a trial with a profile of its own would change them for every program of the toolkit, and a
-// program that was killed with their lock would keep all others waiting for it.
+// The toolkit keeps settings, and lists of what it has found, in the home of the person that the system
+// knows, whatever HOME says: a trial with a profile of its own would change them for every program of the
+// toolkit, and a program that was killed with their lock would keep all others waiting for it.
 #import <Foundation/Foundation.h>
 
 #include "host/app/platform/ToolkitPlaces.h"
