@@ -40,7 +40,7 @@ TEST_F(DialogEdges, AMessageBoxThatIsClosedByItsFrameIsAnswered)
     const std::string box = mScreen.waitForWindow(kMessageBox);
     ASSERT_FALSE(box.empty());
     ASSERT_TRUE(mScreen.waitUntilActive(box));
-    mScreen.key("alt+F4");
+    mScreen.clickCloseButton(box, std::stoi(mScreen.sizeOf(box)));
     EXPECT_TRUE(mScreen.waitUntilGone(kMessageBox));
     ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
     shoot("answered");
