@@ -5,9 +5,11 @@
 #import <tesselui/TsOCFileFilter.h>
 #import <tesselui/TsUIPersistentStore.h>
 #include <tesselui/tsuidisplay.h>
+#include <tesselui/tsuieach.h>
 #include <tesselui/tsuierrors.h>
 
 #include "host/ui/MessageBoxAlert.h"
+#include "host/ui/platform/Windowing.h"
 #include "host/ui/platform/gnustep/ThemeButtons.h"
 
 using testing::ElementsAre;
@@ -19,6 +21,10 @@ class FileFilter : public DialogTest
 };
 
 class Segments : public DialogTest
+{
+};
+
+class MessageBoxes : public DialogTest
 {
 };
 
@@ -163,6 +169,26 @@ TEST_F(Waiting, OfAMessageBoxIsWithinAnAction)
     EXPECT_THAT(inBox, testing::Each(false));
     EXPECT_GE(inBox.size(), 1u);
     EXPECT_TRUE(waits.back()) << "the box has been answered, and the action is over";
+}
+
+TEST_F(MessageBoxes, SayWhyInSmallerTypeThatCanBeSelected)
+{
+    std::vector<NSTextField*> fields;
+    const ModalSteps steps({[&]
+                            {
+                                NSView* words =
+                                    [[[[NSApp modalWindow] contentView] subviews] objectAtIndex:1];
+                                for (NSTextField* field : tsuiEach<NSTextField*>([words subviews]))
+                                    fields.push_back([[field retain] autorelease]);
+                                [NSApp stopModal];
+                            }});
+    tessel::windowing::runMessage(@"It failed.", @"There is no such file.", true);
+    ASSERT_EQ(2u, fields.size());
+    EXPECT_EQ(L"There is no such file.", wide([fields[0] stringValue]));
+    EXPECT_EQ(L"It failed.", wide([fields[1] stringValue]));
+    EXPECT_LT([[fields[0] font] pointSize], [[fields[1] font] pointSize]);
+    EXPECT_TRUE([fields[0] isSelectable]);
+    EXPECT_LE(NSMaxY([fields[0] frame]), NSMinY([fields[1] frame]));
 }
 
 TEST_F(Waiting, OutsideOfModalWindowsTellsTheHostNothing)

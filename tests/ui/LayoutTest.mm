@@ -207,7 +207,10 @@ TEST_F(Layout, OfAMessageBoxHasRoomForEverything)
 {
     open();
     const wchar_t* text = L"/a/folder/module.bundle could not be loaded.";
-    const ModalSteps steps({[text] { tsuiShowMessageBox(text, L"", 0, nullptr); },
+    const wchar_t* detail =
+        L"/a/folder/module.bundle: a library that it needs, libhorizon.so.4, is not on this "
+        L"computer, or none of the folders where libraries are looked for holds it.";
+    const ModalSteps steps({[=] { tsuiShowMessageBox(text, detail, 0, nullptr); },
                             [this]
                             {
                                 EXPECT_NE(mPanel, [NSApp modalWindow]);
