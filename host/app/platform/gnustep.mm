@@ -11,8 +11,15 @@ namespace
 {
 NSString* const kSettingsPlace = @"GNUSTEP_USER_DEFAULTS_DIR";
 NSString* const kLibraryPlace = @"GNUSTEP_USER_DIR_LIBRARY";
-// Ours: what the first of them was, which also says that the places have been moved.
+// Ours: what the first of them was, which also says that the places have been moved. A key that the toolkit
+// does not know has to stand in its list of further keys.
 NSString* const kPersonalPlace = @"TESSEL_PERSONAL_DEFAULTS_DIR";
+NSString* const kFurtherKeys = @"GNUSTEP_EXTRA";
+
+NSString* withKey(NSString* keys, NSString* key)
+{
+    return [keys length] ? [keys stringByAppendingFormat:@",%@", key] : key;
+}
 } // namespace
 
 std::string keepToolkitFilesIn(const std::string& folder)
@@ -23,6 +30,7 @@ std::string keepToolkitFilesIn(const std::string& folder)
     {
         NSString* root = [NSString stringWithUTF8String:folder.c_str()];
         [places setObject:[places objectForKey:kSettingsPlace] forKey:kPersonalPlace];
+        [places setObject:withKey([places objectForKey:kFurtherKeys], kPersonalPlace) forKey:kFurtherKeys];
         [places setObject:[root stringByAppendingPathComponent:@"Defaults"] forKey:kSettingsPlace];
         [places setObject:[root stringByAppendingPathComponent:@"Library"] forKey:kLibraryPlace];
         GNUstepConfig(places);
