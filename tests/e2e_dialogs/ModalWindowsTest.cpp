@@ -9,7 +9,7 @@ using testing::Not;
 
 namespace
 {
-constexpr Place kEmptyPlaceOfDialog{300, 750}; // that no window over the dialog reaches
+constexpr Place kEmptyPlaceOfDialog{400, 708}; // that no window over the dialog reaches
 constexpr Place kEmptyPlaceOfSuite{200, 345};
 constexpr int kFrame = 20; // by which the middles of two windows may differ
 
