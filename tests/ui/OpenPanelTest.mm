@@ -382,3 +382,52 @@ TEST_F(OpenPanel, ShowsTheSameFolderForEveryTypeAlsoInAPackageThatOneHides)
                     },
                     [&] { EXPECT_THAT(shownFiles(), ElementsAre(L"inner.lsp")); }});
 }
+
+TEST_F(OpenPanel, MovesIntoTheHostsFolderWithReturnAndWithADoubleClick)
+{
+    NSString* host = [[NSBundle mainBundle] bundlePath];
+    NSString* outside = [host stringByDeletingLastPathComponent];
+    const std::wstring name = wide([host lastPathComponent]);
+    const auto isInside = [&] { return wide([mPanel directory]) == wide(host); };
+    runIn(tessel::toUtf8(wide(outside)),
+          {[&] { click({name.c_str()}); }, [&] { pressKey(mPanel, @"\r"); }, [&] { return isInside(); },
+           [&] { [mPanel setDirectory:outside]; }, [&] { click({name.c_str()}); },
+           [&] { clickRow(fileTable(mPanel), [fileTable(mPanel) selectedRow], 0, 2); },
+           [&] { return isInside(); }});
+    EXPECT_THAT(lines(), IsEmpty());
+    EXPECT_THAT(boxes(), IsEmpty());
+}
+
+TEST_F(OpenPanel, KeepsWhatIsChosenInTheHistoryWhenATypeHidesItsOwnFile)
+{
+    for (const char* name : {"one.lsp", "two.zmb", "old.zmb"})
+        file(name);
+    gHistoryList.AddTail(CStdStr(file("old.zmb")));
+    runIn(mFolder.path(), {[this] { click({L"two.zmb"}); },
+                           [this]
+                           {
+                               select(historyTable(), {0});
+                               choose(kLispFilter);
+                               EXPECT_EQ(L"", shownName());
+                               EXPECT_THAT(selectedFiles(), ElementsAre(file("old.zmb")));
+                               [mController onLoad:nil];
+                               EXPECT_TRUE(host().linker.isLoaded(file("old.zmb")));
+                               EXPECT_FALSE(host().linker.isLoaded(file("two.zmb")));
+                           }});
+}
+
+TEST_F(OpenPanel, LoadsTheFileThatItStillShowsAsSelectedAfterARemovalFromTheHistory)
+{
+    for (const char* name : {"two.zmb", "old.zmb"})
+        file(name);
+    gHistoryList.AddTail(CStdStr(file("old.zmb")));
+    runIn(mFolder.path(), {[this] { click({L"two.zmb"}); },
+                           [this]
+                           {
+                               select(historyTable(), {0});
+                               [mController onRemove:nil];
+                               EXPECT_THAT(selectedFiles(), IsEmpty());
+                               [mController onLoad:nil];
+                               EXPECT_TRUE(host().linker.isLoaded(file("two.zmb")));
+                           }});
+}
