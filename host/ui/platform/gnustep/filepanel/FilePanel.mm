@@ -217,9 +217,9 @@ template <class Function> Function windowMethod(SEL selector)
                                    userInfo:nil
                                     repeats:YES];
     [[NSRunLoop currentRunLoop] addTimer:mWatch forMode:NSModalPanelRunLoopMode];
-    [self makeKeyAndOrderFront:self];
     @try
     {
+        // It comes to the front by this, and not before: only then is it known which window it belongs to.
         return [NSApp runModalForWindow:self];
     }
     @finally
