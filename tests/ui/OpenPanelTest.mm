@@ -159,6 +159,16 @@ TEST_F(OpenPanel, ShowsFilesOfTheFilterAndFolders)
     EXPECT_FALSE(shows(mFolder / "a.LSP"));
 }
 
+TEST_F(OpenPanel, ShowsEveryPackageWhereItTreatsThemAsFolders)
+{
+    mFolder.write("Other.app/inside.txt", "");
+    open();
+    choose(kLispFilter);
+    EXPECT_FALSE(shows(mFolder / "Other.app"));
+    [mPanel setTreatsFilePackagesAsDirectories:YES];
+    EXPECT_TRUE(shows(mFolder / "Other.app"));
+}
+
 TEST_F(OpenPanel, ShowsTheHostItself)
 {
     open();
