@@ -66,3 +66,13 @@ TEST_F(DialogToolkit, ComplainsIntoALogOfTheProfile)
     EXPECT_THAT(output, Not(HasSubstr("reflectScrolledClipView")));
     EXPECT_THAT(contentOf(mSession.profile() / "toolkit" / "log.txt"), HasSubstr("reflectScrolledClipView"));
 }
+
+// A lock in the person's home, left by a program that was killed, would hold up every start.
+TEST(ToolkitWithoutWindows, LocksItsSettingsInTheProfileFromTheFirstApplicationOn)
+{
+    const HostSession session;
+    const auto settings = session.profile() / "toolkit/Defaults";
+    std::filesystem::create_directories(settings); // where there is none, it locks nothing
+    EXPECT_EQ(session.run({"APPS"}).exitStatus, 0);
+    EXPECT_TRUE(std::filesystem::exists(settings / ".lck"));
+}
