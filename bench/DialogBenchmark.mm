@@ -18,14 +18,14 @@
 #include "bench/Child.h"
 #include "bench/Ratios.h"
 #include "bench/Session.h"
-#include "module/Globals.h"
-#include "tests/ui/support/VirtualDisplay.h"
+#include "modrig/lists/Globals.h"
+#include "tests/dialogs/support/VirtualDisplay.h"
 
 #import <AppKit/AppKit.h>
 
-#import "ui/ModrigController.h"
-#import "ui/ModrigFilePath.h"
-#import "ui/Paths.h"
+#import "modrig/dialogs/ModrigController.h"
+#import "modrig/dialogs/ModrigFilePath.h"
+#import "modrig/dialogs/Paths.h"
 
 namespace
 {

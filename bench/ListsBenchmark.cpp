@@ -12,10 +12,10 @@
 #include "bench/Child.h"
 #include "bench/Ratios.h"
 #include "bench/Session.h"
-#include "lists/History.h"
-#include "lists/ListMembership.h"
-#include "lists/ProfileRegistry.h"
-#include "module/Globals.h"
+#include "modrig/lists/Globals.h"
+#include "modrig/lists/History.h"
+#include "modrig/lists/ListMembership.h"
+#include "modrig/profile/ProfileRegistry.h"
 
 namespace
 {

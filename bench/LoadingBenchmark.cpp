@@ -14,8 +14,8 @@
 #include "bench/Child.h"
 #include "bench/Ratios.h"
 #include "bench/Session.h"
-#include "loader/ApplicationLoader.h"
-#include "module/Globals.h"
+#include "modrig/lists/Globals.h"
+#include "modrig/loader/ApplicationLoader.h"
 
 namespace
 {

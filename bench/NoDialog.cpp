@@ -1,5 +1,6 @@
 // The road to the dialogs, for benchmarks that open none.
-#include "module/DialogBridge.h"
+#include "modrig/messages/MessageLine.h"
+#include "modrig/module/DialogBridge.h"
 
 namespace ModrigUtils
 {

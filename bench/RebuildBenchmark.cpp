@@ -12,9 +12,9 @@
 #include "bench/Child.h"
 #include "bench/Ratios.h"
 #include "bench/Session.h"
-#include "loader/LoadedApplications.h"
-#include "module/Globals.h"
-#include "types/FileValidation.h"
+#include "modrig/lists/Globals.h"
+#include "modrig/loader/LoadedApplications.h"
+#include "modrig/types/FileValidation.h"
 
 namespace
 {

@@ -4,10 +4,10 @@
 #include <filesystem>
 
 #include "host/Services.h"
-#include "host/console/CommandLine.h"
-#include "host/linker/ModuleLibrary.h"
+#include "host/applications/ModuleLibrary.h"
 #include "host/lisp/LispInterpreter.h"
 #include "host/registry/Registry.h"
+#include "host/text/CommandLine.h"
 
 int main(int argc, char** argv)
 {

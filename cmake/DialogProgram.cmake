@@ -6,7 +6,7 @@ function(make_dialog_program target name)
   set_target_properties(${target} PROPERTIES
     RUNTIME_OUTPUT_DIRECTORY "${app}" OUTPUT_NAME ${name} LINKER_LANGUAGE OBJCXX)
   foreach(resource Modrig.xib ModrigStartupSuit.xib en.lproj/Localizable.strings)
-    set(source "${CMAKE_SOURCE_DIR}/resources/${resource}")
+    set(source "${CMAKE_SOURCE_DIR}/modrig/resources/${resource}")
     set(place "${app}/Resources/${resource}")
     add_custom_command(
       OUTPUT "${place}"

@@ -9,8 +9,7 @@ function(add_static_checks target)
   endif()
   get_target_property(sources ${target} SOURCES)
   get_target_property(folder ${target} SOURCE_DIR)
-  file(GLOB_RECURSE headers CONFIGURE_DEPENDS "${CMAKE_SOURCE_DIR}/sdk/*.h" "${CMAKE_SOURCE_DIR}/module/*.h"
-       "${CMAKE_SOURCE_DIR}/types/*.h" "${CMAKE_SOURCE_DIR}/lists/*.h" "${CMAKE_SOURCE_DIR}/loader/*.h"
+  file(GLOB_RECURSE headers CONFIGURE_DEPENDS "${CMAKE_SOURCE_DIR}/sdk/*.h" "${CMAKE_SOURCE_DIR}/modrig/*.h"
        "${CMAKE_SOURCE_DIR}/host/*.h")
   foreach(source IN LISTS sources)
     cmake_path(ABSOLUTE_PATH source BASE_DIRECTORY "${folder}" NORMALIZE)

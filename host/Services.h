@@ -6,21 +6,21 @@
 
 namespace tessel
 {
-class ApplicationServices; // host/services: TsDbHostApplicationServices
-class CallingApplication;  // host/linker: whose entry point or command is running
-class CommandLine;         // host/console: where the host's text goes
+class ApplicationServices; // host/app: TsDbHostApplicationServices
+class CallingApplication;  // host/commands: whose entry point or command is running
+class CommandLine;         // host/text: where the host's text goes
 class CommandStack;        // host/commands
-class Document;            // host/documents
-class DynamicLinker;       // host/linker
-class EndRequest;          // host/console: whether the session is to end
-class FileSearch;          // host/filesearch
-class Help;                // host/help
+class Document;            // host/applications
+class DynamicLinker;       // host/applications
+class EndRequest;          // host/commands: whether the session is to end
+class FileSearch;          // host/files
+class Help;                // host/messages
 class LispInterpreter;     // host/lisp
-class MessageBox;          // host/messagebox
+class MessageBox;          // host/messages
 class Registry;            // host/registry
-class RemoteFiles;         // host/remote
+class RemoteFiles;         // host/files
 class ResourceModules;     // host/resources
-class SystemVariables;     // host/sysvars
+class SystemVariables;     // host/registry
 
 struct Services
 {

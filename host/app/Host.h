@@ -16,9 +16,9 @@
 #include <vector>
 
 #include "host/app/Export.h"
-#include "host/console/CommandLine.h"
-#include "host/console/EndRequest.h"
+#include "host/commands/EndRequest.h"
 #include "host/console/LineRunner.h"
+#include "host/text/CommandLine.h"
 
 namespace tessel
 {

@@ -4,7 +4,7 @@
 
 #include <CLI/CLI.hpp>
 
-#include "host/app/Version.h"
+#include "host/text/Version.h"
 
 namespace tessel
 {

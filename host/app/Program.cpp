@@ -13,13 +13,13 @@
 #include "host/app/Host.h"
 #include "host/app/Layout.h"
 #include "host/app/Options.h"
-#include "host/app/Version.h"
 #include "host/console/Console.h"
 #include "host/console/EndSignals.h"
 #include "host/console/InterruptKey.h"
 #include "host/console/LineEditor.h"
 #include "host/console/PipedInput.h"
 #include "host/text/Unicode.h"
+#include "host/text/Version.h"
 
 namespace tessel
 {

@@ -4,8 +4,8 @@
 #include <tessel/tsrx.h>
 
 #include "host/Services.h"
+#include "host/applications/DynamicLinker.h"
 #include "host/commands/CommandStack.h"
-#include "host/linker/DynamicLinker.h"
 
 namespace tessel
 {

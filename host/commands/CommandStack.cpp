@@ -5,9 +5,9 @@
 #include <exception>
 
 #include "host/Services.h"
+#include "host/commands/CallingApplication.h"
 #include "host/commands/Command.h"
-#include "host/console/CommandLine.h"
-#include "host/linker/CallingApplication.h"
+#include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
 
 bool TsEdCommandStack::isKindOf(const wchar_t* className) const

@@ -7,9 +7,9 @@
 #include <string>
 #include <string_view>
 
-#include "host/console/CommandLine.h"
 #include "host/console/InputAssembler.h"
 #include "host/console/LineRunner.h"
+#include "host/text/CommandLine.h"
 
 namespace tessel
 {

@@ -5,10 +5,10 @@
 #include <tessel/tsdefs.h>
 
 #include "host/Services.h"
-#include "host/console/CommandLine.h"
-#include "host/console/EndRequest.h"
-#include "host/documents/Document.h"
+#include "host/applications/Document.h"
+#include "host/commands/EndRequest.h"
 #include "host/lisp/LispMachine.h"
+#include "host/text/CommandLine.h"
 
 namespace tessel
 {

@@ -5,8 +5,8 @@
 #include <algorithm>
 
 #include "host/Services.h"
-#include "host/console/CommandLine.h"
 #include "host/registry/Statements.h"
+#include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
 
 namespace tessel

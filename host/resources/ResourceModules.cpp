@@ -5,9 +5,9 @@
 #include <utility>
 
 #include "host/Services.h"
-#include "host/console/CommandLine.h"
-#include "host/linker/Bundle.h"
-#include "host/linker/CallingApplication.h"
+#include "host/commands/CallingApplication.h"
+#include "host/platform/Bundle.h"
+#include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
 
 namespace tessel

@@ -9,7 +9,7 @@
 
 #include <wincompat/winres.h>
 
-#include "host/linker/RegularFile.h"
+#include "host/platform/RegularFile.h"
 #include "host/resources/PeResources.h"
 
 namespace tessel

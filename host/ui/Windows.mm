@@ -5,7 +5,7 @@
 #include <tesselui/tsuidisplay.h>
 #include <wincompat/winstring.h>
 
-#include "host/app/platform/ToolkitPlaces.h"
+#include "host/platform/ToolkitPlaces.h"
 #include "host/ui/KeptSignals.h"
 #include "host/ui/SessionEnd.h"
 #include "host/ui/Waiting.h"

@@ -5,9 +5,9 @@
 #include <string>
 #include <vector>
 
+#include "tests/dialogs/support/VirtualDisplay.h"
 #include "tests/e2e_dialogs/Program.h"
 #include "tests/support/TemporaryFolder.h"
-#include "tests/ui/support/VirtualDisplay.h"
 
 // A place in a window, from its left and its upper edge.
 struct Place

@@ -6,7 +6,7 @@
 
 #include <elf.h>
 
-#include "host/linker/ImageCheck.h"
+#include "host/applications/ImageCheck.h"
 
 namespace
 {

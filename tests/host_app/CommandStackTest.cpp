@@ -2,8 +2,8 @@
 
 #include <stdexcept>
 
+#include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
-#include "host/linker/CallingApplication.h"
 #include "tests/host_app/HostParts.h"
 
 using tessel::CallingApplication;

@@ -2,7 +2,7 @@
 
 #include <tessel/tsed.h>
 
-#include "host/help/Help.h"
+#include "host/messages/Help.h"
 #include "tests/host_app/HostParts.h"
 #include "tests/support/TemporaryFolder.h"
 

@@ -4,7 +4,7 @@
 #include <string>
 
 #include "host/Services.h"
-#include "host/console/CommandLine.h"
+#include "host/text/CommandLine.h"
 
 class CapturedOutput
 {

@@ -2,7 +2,7 @@
 
 #include <vector>
 
-#include "host/messagebox/MessageBox.h"
+#include "host/messages/MessageBox.h"
 #include "tests/host_app/HostParts.h"
 
 TEST(MessageBox, IsTextWithTheFirstButtonChosenWithoutADisplay)

@@ -9,9 +9,9 @@
 #include <tessel/tsed.h>
 
 #include "host/Services.h"
-#include "host/console/CommandLine.h"
-#include "host/documents/Document.h"
+#include "host/applications/Document.h"
 #include "host/lisp/LispInterpreter.h"
+#include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
 
 // Small enough to be filled quickly.

@@ -11,8 +11,8 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
-#include "host/linker/ImageCheck.h"
-#include "host/linker/RegularFile.h"
+#include "host/applications/ImageCheck.h"
+#include "host/platform/RegularFile.h"
 
 namespace
 {

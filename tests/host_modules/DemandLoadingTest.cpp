@@ -1,9 +1,9 @@
-#include "host/demandload/DemandLoading.h"
+#include "host/applications/DemandLoading.h"
 
 #include <tessel/tsappinfo.h>
 
+#include "host/app/ApplicationServices.h"
 #include "host/registry/Registry.h"
-#include "host/services/ApplicationServices.h"
 #include "tests/host_modules/HostWithModules.h"
 
 using tessel::toWide;

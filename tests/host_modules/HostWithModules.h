@@ -7,11 +7,11 @@
 #include <gtest/gtest.h>
 
 #include "host/Services.h"
+#include "host/applications/DynamicLinker.h"
+#include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
-#include "host/console/CommandLine.h"
-#include "host/linker/CallingApplication.h"
-#include "host/linker/DynamicLinker.h"
 #include "host/resources/ResourceModules.h"
+#include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
 #include "tests/support/TemporaryFolder.h"
 

@@ -1,4 +1,4 @@
-#include "host/messagebox/MessageBox.h"
+#include "host/messages/MessageBox.h"
 #include "tests/host_modules/HostWithModules.h"
 
 #include <sys/stat.h>

@@ -1,4 +1,4 @@
-#include "host/services/ApplicationServices.h"
+#include "host/app/ApplicationServices.h"
 
 #include <gmock/gmock.h>
 

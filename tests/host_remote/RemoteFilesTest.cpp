@@ -1,4 +1,4 @@
-#include "host/remote/RemoteFiles.h"
+#include "host/files/RemoteFiles.h"
 
 #include <gmock/gmock.h>
 

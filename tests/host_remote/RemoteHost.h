@@ -8,7 +8,7 @@
 #include <string>
 
 #include "host/Services.h"
-#include "host/remote/RemoteFiles.h"
+#include "host/files/RemoteFiles.h"
 #include "host/text/Unicode.h"
 #include "tests/host_app/HostParts.h"
 #include "tests/support/TemporaryFolder.h"

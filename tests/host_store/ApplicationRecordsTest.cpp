@@ -1,4 +1,4 @@
-#include "host/registry/ApplicationRecords.h"
+#include "host/applications/ApplicationRecords.h"
 
 #include <gmock/gmock.h>
 
@@ -6,9 +6,9 @@
 
 #include <tessel/tsappinfo.h>
 
+#include "host/app/ApplicationServices.h"
+#include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
-#include "host/linker/CallingApplication.h"
-#include "host/services/ApplicationServices.h"
 #include "tests/host_store/RegistryHost.h"
 
 using testing::ElementsAre;

@@ -1,4 +1,4 @@
-#include "host/documents/Document.h"
+#include "host/applications/Document.h"
 
 #include <gtest/gtest.h>
 

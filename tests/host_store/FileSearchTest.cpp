@@ -1,4 +1,4 @@
-#include "host/filesearch/FileSearch.h"
+#include "host/files/FileSearch.h"
 
 #include <gtest/gtest.h>
 
@@ -7,7 +7,7 @@
 #include <tessel/tsed.h>
 
 #include "host/Services.h"
-#include "host/sysvars/SystemVariables.h"
+#include "host/registry/SystemVariables.h"
 #include "host/text/Unicode.h"
 #include "tests/host_store/CurrentFolder.h"
 #include "tests/support/TemporaryFolder.h"

@@ -1,10 +1,10 @@
-#include "host/sysvars/SystemVariables.h"
+#include "host/registry/SystemVariables.h"
 
 #include <gmock/gmock.h>
 
 #include <tessel/tsed.h>
 
-#include "host/services/ApplicationServices.h"
+#include "host/app/ApplicationServices.h"
 #include "tests/host_store/RegistryHost.h"
 
 using tessel::SystemVariables;

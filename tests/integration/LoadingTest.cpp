@@ -3,7 +3,7 @@
 
 #include <gmock/gmock.h>
 
-#include "module/Globals.h"
+#include "modrig/lists/Globals.h"
 
 using testing::Contains;
 using testing::ElementsAre;

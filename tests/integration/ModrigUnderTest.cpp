@@ -3,14 +3,15 @@
 #include <algorithm>
 #include <utility>
 
-#include "lists/History.h"
-#include "lists/StartupSuite.h"
-#include "loader/ApplicationLoader.h"
-#include "loader/LoadedApplications.h"
-#include "module/DialogBridge.h"
-#include "module/EntryPoint.h"
-#include "module/Globals.h"
-#include "types/FileValidation.h"
+#include "modrig/lists/Globals.h"
+#include "modrig/lists/History.h"
+#include "modrig/loader/ApplicationLoader.h"
+#include "modrig/loader/LoadedApplications.h"
+#include "modrig/loader/StartupSuite.h"
+#include "modrig/messages/MessageLine.h"
+#include "modrig/module/DialogBridge.h"
+#include "modrig/module/EntryPoint.h"
+#include "modrig/types/FileValidation.h"
 
 namespace ModrigUnderTest
 {

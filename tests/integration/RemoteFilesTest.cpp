@@ -7,7 +7,7 @@
 #include <gmock/gmock.h>
 
 #include "host/Services.h"
-#include "host/remote/RemoteFiles.h"
+#include "host/files/RemoteFiles.h"
 #include "tests/support/HttpServer.h"
 
 using testing::AllOf;

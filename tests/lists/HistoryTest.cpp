@@ -1,7 +1,7 @@
-#include "lists/History.h"
+#include "modrig/lists/History.h"
 
-#include "module/Globals.h"
-#include "tests/module/ModuleTest.h"
+#include "modrig/lists/Globals.h"
+#include "tests/support/ModuleTest.h"
 
 using testing::ElementsAre;
 using testing::IsEmpty;

@@ -10,7 +10,7 @@
 #include <gtest/gtest.h>
 #include <unicode/uchar.h>
 
-#include "lists/ListMembership.h"
+#include "modrig/lists/ListMembership.h"
 
 namespace
 {

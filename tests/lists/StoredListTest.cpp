@@ -1,12 +1,12 @@
 // What the Startup Suite and the History have in common: how they stand in the registry.
-#include "lists/StoredList.h"
+#include "modrig/lists/StoredList.h"
 
 #include <algorithm>
 
-#include "lists/History.h"
-#include "lists/StartupSuite.h"
-#include "module/Globals.h"
-#include "tests/module/ModuleTest.h"
+#include "modrig/lists/Globals.h"
+#include "modrig/lists/History.h"
+#include "modrig/loader/StartupSuite.h"
+#include "tests/support/ModuleTest.h"
 
 using testing::ElementsAre;
 using testing::IsEmpty;

@@ -1,6 +1,6 @@
-#include "loader/HostLinker.h"
+#include "modrig/loader/HostLinker.h"
 
-#include "tests/module/ModuleTest.h"
+#include "tests/support/ModuleTest.h"
 
 using testing::ElementsAre;
 

@@ -1,7 +1,7 @@
-#include "loader/ApplicationLoader.h"
+#include "modrig/loader/ApplicationLoader.h"
 
-#include "module/Globals.h"
-#include "tests/module/ModuleTest.h"
+#include "modrig/lists/Globals.h"
+#include "tests/support/ModuleTest.h"
 
 using namespace ModrigUtils;
 using testing::ElementsAre;

@@ -1,7 +1,7 @@
-#include "loader/LoadedApplications.h"
+#include "modrig/loader/LoadedApplications.h"
 
-#include "module/Globals.h"
-#include "tests/module/ModuleTest.h"
+#include "modrig/lists/Globals.h"
+#include "tests/support/ModuleTest.h"
 #include "tests/support/recording/RecordingLoans.h"
 
 using namespace ModrigUtils;

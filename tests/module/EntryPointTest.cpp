@@ -1,10 +1,10 @@
-#include "module/EntryPoint.h"
+#include "modrig/module/EntryPoint.h"
 
 #include <tessel/tsappinfo.h>
 
-#include "module/Globals.h"
-#include "module/ResourceOverride.h"
-#include "tests/module/ModuleTest.h"
+#include "modrig/lists/Globals.h"
+#include "modrig/messages/ResourceOverride.h"
+#include "tests/support/ModuleTest.h"
 
 using testing::ElementsAre;
 using testing::IsEmpty;

@@ -4,11 +4,11 @@
 #include <set>
 #include <sstream>
 
-#include "module/Globals.h"
+#include "modrig/lists/Globals.h"
+#include "modrig/types/ApplicationTypes.h"
 #include "tests/resources/SourceText.h"
 #include "tests/resources/StringsFile.h"
 #include "tests/support/TemporaryFolder.h"
-#include "types/ApplicationTypes.h"
 
 namespace
 {

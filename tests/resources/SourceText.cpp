@@ -19,9 +19,8 @@ std::string moduleSources()
 {
     const std::set<std::filesystem::path> kCode = {".h", ".cpp", ".mm"};
     std::string sources;
-    for (const char* folder : {"module", "types", "lists", "loader", "ui"})
-        for (const auto& entry : std::filesystem::recursive_directory_iterator(sourceRoot() / folder))
-            if (kCode.contains(entry.path().extension()))
-                sources += readFile(entry.path());
+    for (const auto& entry : std::filesystem::recursive_directory_iterator(sourceRoot() / "modrig"))
+        if (kCode.contains(entry.path().extension()))
+            sources += readFile(entry.path());
     return sources;
 }

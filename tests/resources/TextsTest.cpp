@@ -5,11 +5,11 @@
 
 #include <tessel/tsformat.h>
 
-#include "module/Globals.h"
-#include "module/MessageIds.h"
+#include "modrig/lists/Globals.h"
+#include "modrig/messages/MessageIds.h"
+#include "modrig/types/ApplicationTypes.h"
 #include "tests/resources/ResourceTexts.h"
 #include "tests/resources/SourceText.h"
-#include "types/ApplicationTypes.h"
 
 namespace
 {
@@ -74,7 +74,7 @@ const std::map<unsigned, std::wstring> kFilterPatterns = {
 
 std::map<std::string, unsigned> constantsOfTheHeader()
 {
-    const std::string header = readFile(sourceRoot() / "module" / "MessageIds.h");
+    const std::string header = readFile(sourceRoot() / "modrig/messages/MessageIds.h");
     const std::regex definition(R"(\bconstexpr\s+unsigned\s+(k\w+)\s*=\s*(\d+)\s*;)");
     std::map<std::string, unsigned> constants;
     for (std::sregex_iterator match(header.begin(), header.end(), definition), end; match != end; ++match)

@@ -1,6 +1,7 @@
 #include "tests/support/RecordingDialog.h"
 
-#include "module/DialogBridge.h"
+#include "modrig/messages/MessageLine.h"
+#include "modrig/module/DialogBridge.h"
 
 RecordingDialog& recordingDialog()
 {

@@ -1,9 +1,9 @@
-#include "types/ApplicationTypes.h"
+#include "modrig/types/ApplicationTypes.h"
 
 #include <cstddef>
 #include <type_traits>
 
-#include "tests/module/ModuleTest.h"
+#include "tests/support/ModuleTest.h"
 
 using ModrigUtils::FileType;
 using ModrigUtils::FileTypeOfPath;

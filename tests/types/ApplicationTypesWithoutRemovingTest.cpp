@@ -1,10 +1,10 @@
 // In a host that does not load compiled and packaged Lisp.
-#include "loader/ApplicationLoader.h"
-#include "loader/LoadedApplications.h"
-#include "tests/module/ModuleTest.h"
-#include "types/ApplicationTypes.h"
-#include "types/FileFilters.h"
-#include "types/FileValidation.h"
+#include "modrig/loader/ApplicationLoader.h"
+#include "modrig/loader/LoadedApplications.h"
+#include "modrig/types/ApplicationTypes.h"
+#include "modrig/types/FileFilters.h"
+#include "modrig/types/FileValidation.h"
+#include "tests/support/ModuleTest.h"
 
 using namespace ModrigUtils;
 using testing::ElementsAre;

@@ -1,6 +1,6 @@
-#include "types/FileFilters.h"
+#include "modrig/types/FileFilters.h"
 
-#include "tests/module/ModuleTest.h"
+#include "tests/support/ModuleTest.h"
 
 using namespace ModrigUtils;
 using testing::ElementsAre;

@@ -1,6 +1,6 @@
-#include "types/FileValidation.h"
+#include "modrig/types/FileValidation.h"
 
-#include "tests/module/ModuleTest.h"
+#include "tests/support/ModuleTest.h"
 
 using namespace ModrigUtils;
 using testing::ElementsAre;

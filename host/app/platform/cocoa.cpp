@@ -2,8 +2,6 @@
 
 #include <cstdlib>
 
-#include "host/app/platform/ToolkitPlaces.h"
-
 namespace tessel
 {
 std::filesystem::path personalDataHome()
@@ -11,11 +9,5 @@ std::filesystem::path personalDataHome()
     const char* home = std::getenv("HOME");
     return home && *home ? std::filesystem::path(home) / "Library/Application Support"
                          : std::filesystem::path();
-}
-
-// The system keeps what belongs to the program under the program's name.
-std::string keepToolkitFilesIn(const std::string&)
-{
-    return {};
 }
 } // namespace tessel

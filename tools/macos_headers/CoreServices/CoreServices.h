@@ -1,4 +1,4 @@
-// What ui/platform/cocoa uses of CoreServices: declarations enough for compiling it elsewhere.
+// What modrig/dialogs/platform/cocoa uses of CoreServices: declarations enough for compiling it elsewhere.
 #pragma once
 
 using UInt8 = unsigned char;

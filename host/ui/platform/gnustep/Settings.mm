@@ -5,7 +5,7 @@
 #include <fstream>
 #include <string>
 
-#include "host/app/platform/ToolkitPlaces.h"
+#include "host/platform/ToolkitPlaces.h"
 
 namespace tessel::windowing
 {

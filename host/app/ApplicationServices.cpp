@@ -1,0 +1,63 @@
+#include "host/app/ApplicationServices.h"
+
+#include <algorithm>
+#include <cwchar>
+#include <string>
+#include <string_view>
+
+#include "host/Services.h"
+#include "host/files/RemoteFiles.h"
+#include "host/text/CommandLine.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+const wchar_t* ApplicationServices::productRegistryRoot() const
+{
+    return L"Software\\Tessel\\R21";
+}
+
+const wchar_t* ApplicationServices::product() const
+{
+    return L"Tessel";
+}
+
+bool ApplicationServices::isUrl(const wchar_t* text) const
+{
+    constexpr std::wstring_view kSchemes[] = {L"http://", L"https://"};
+    const std::wstring_view url = text ? text : L"";
+    return std::any_of(std::begin(kSchemes), std::end(kSchemes),
+                       [url](std::wstring_view scheme) {
+                           return url.size() > scheme.size() &&
+                                  equalIgnoringCase(url.substr(0, scheme.size()), scheme);
+                       });
+}
+
+int ApplicationServices::fetchRemoteFile(const wchar_t* url, wchar_t* localPath, std::size_t capacity,
+                                         bool ignoreCache)
+{
+    if (!services().remote)
+        return TS_FETCH_FAILED;
+    if (!isUrl(url))
+    {
+        services().commandLine->say(L"\"" + std::wstring(url ? url : L"") +
+                                    L"\" is no http or https address.");
+        return TS_FETCH_FAILED;
+    }
+    if (!localPath || capacity == 0)
+    {
+        services().commandLine->say(
+            std::wstring(url) + L" could not be fetched: there is no room for the path of its local copy.");
+        return TS_FETCH_FAILED;
+    }
+    const RemoteFiles::Copy copy = services().remote->fetch(url, capacity - 1, ignoreCache);
+    if (copy.status != TS_FETCH_FAILED)
+        std::wmemcpy(localPath, copy.path.c_str(), copy.path.size() + 1);
+    return copy.status;
+}
+} // namespace tessel
+
+TsDbHostApplicationServices* tsdbHostApplicationServices()
+{
+    return tessel::services().application;
+}

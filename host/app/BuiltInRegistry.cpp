@@ -1,0 +1,105 @@
+// REGISTRY: looks into the registry and changes it, so that scripts can prepare and inspect what applications
+// keep there.
+#include <string>
+
+#include "host/Services.h"
+#include "host/app/BuiltIn.h"
+#include "host/app/BuiltInSupport.h"
+#include "host/registry/Registry.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr wchar_t kCommand[] = L"REGISTRY";
+
+// The arguments behind the name of what is to be done. A name that is left out is the unnamed value's.
+using Arguments = CommandStack::Arguments;
+
+std::wstring at(const Arguments& arguments, std::size_t index)
+{
+    return index < arguments.size() ? arguments[index] : L"";
+}
+
+bool failAt(const std::wstring& path, const std::wstring& reason)
+{
+    return fail(L"The registry key \"" + path + L"\" " + reason + L".");
+}
+
+std::wstring writeFailure(LONG status)
+{
+    const std::wstring& problem = services().registry->problem();
+    return L"cannot be written: " + (problem.empty() ? L"error " + std::to_wstring(status) : problem);
+}
+
+bool list(const std::wstring& path)
+{
+    Registry& registry = *services().registry;
+    const auto key = registry.find(path);
+    if (key == Registry::kNoKey)
+        return failAt(path, L"does not exist");
+    for (const auto& name : registry.subKeys(key))
+        sayLine(L"[" + name + L"]");
+    for (const auto& value : registry.values(key))
+        sayLine((value.name.empty() ? L"(unnamed)" : value.name) + L" = " + value.data);
+    return true;
+}
+
+bool get(const std::wstring& path, const std::wstring& name)
+{
+    const auto data = services().registry->read(path, name);
+    if (!data)
+        return failAt(path, L"has no value \"" + name + L"\"");
+    sayLine(*data);
+    return true;
+}
+
+// A key alone is made; with a name, the value is stored.
+bool set(const std::wstring& path, const Arguments& arguments)
+{
+    Registry& registry = *services().registry;
+    Registry::Key key = Registry::kNoKey;
+    LONG status = registry.create(path, Registry::kRoot, key);
+    if (status == ERROR_SUCCESS && arguments.size() > 2)
+        status = registry.writeValue(key, at(arguments, 2), at(arguments, 3));
+    return status == ERROR_SUCCESS || failAt(path, writeFailure(status));
+}
+
+// A key alone goes with everything below it; with a name, only the value.
+bool remove(const std::wstring& path, const Arguments& arguments)
+{
+    Registry& registry = *services().registry;
+    const auto key = registry.find(path);
+    if (key == Registry::kNoKey)
+        return failAt(path, L"does not exist");
+    const LONG status =
+        arguments.size() > 2 ? registry.removeValue(key, at(arguments, 2)) : registry.removeKey(key);
+    if (status == ERROR_FILE_NOT_FOUND)
+        return failAt(path, L"has no value \"" + at(arguments, 2) + L"\"");
+    return status == ERROR_SUCCESS || failAt(path, writeFailure(status));
+}
+
+bool registryCommand(const Arguments& arguments)
+{
+    const std::wstring action = at(arguments, 0);
+    const std::wstring path = at(arguments, 1);
+    if (equalIgnoringCase(action, L"LIST") && arguments.size() <= 2)
+        return list(path);
+    if (equalIgnoringCase(action, L"GET") && (arguments.size() == 2 || arguments.size() == 3))
+        return get(path, at(arguments, 2));
+    if (equalIgnoringCase(action, L"SET") && (arguments.size() == 2 || arguments.size() == 4))
+        return set(path, arguments);
+    if (equalIgnoringCase(action, L"DELETE") && (arguments.size() == 2 || arguments.size() == 3))
+        return remove(path, arguments);
+    return failWithUsage(kCommand);
+}
+} // namespace
+
+void addRegistryCommands(CommandStack& commands)
+{
+    commands.addBuiltIn({L"Settings", kCommand, L"LIST|GET|SET|DELETE key [name] [data]",
+                         L"Works on the registry, below HKEY_CURRENT_USER"},
+                        registryCommand);
+}
+} // namespace tessel

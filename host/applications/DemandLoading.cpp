@@ -1,0 +1,98 @@
+#include "host/applications/DemandLoading.h"
+
+#include <algorithm>
+#include <array>
+#include <set>
+#include <utility>
+
+#include <tessel/tsappinfo.h>
+
+#include "host/Services.h"
+#include "host/applications/ApplicationRecords.h"
+#include "host/applications/DynamicLinker.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr bool kSayWhyNot = true;
+constexpr bool kResolveNow = true;
+constexpr wchar_t kGlobalNameMark = L'_';
+constexpr std::array<std::wstring_view, 3> kApplicationExtensions = {L".bundle", L".zmb", L".omp"};
+
+bool load(const std::wstring& path)
+{
+    return services().linker->loadModule(path.c_str(), kSayWhyNot, kResolveNow);
+}
+
+bool isApplication(const std::filesystem::path& path)
+{
+    const std::wstring extension = toWide(path.extension().native());
+    return std::ranges::any_of(kApplicationExtensions,
+                               [&](std::wstring_view known) { return equalIgnoringCase(extension, known); });
+}
+
+// The path without links and detours; as it stands when it cannot be followed.
+std::filesystem::path resolved(const std::filesystem::path& path)
+{
+    std::error_code failed;
+    auto result = std::filesystem::weakly_canonical(path, failed);
+    return failed ? path : result;
+}
+
+bool lists(const ApplicationRecord& record, std::wstring_view typedName)
+{
+    const bool isGlobal = typedName.starts_with(kGlobalNameMark);
+    const std::wstring_view globalName = isGlobal ? typedName.substr(1) : typedName;
+    return std::ranges::any_of(record.commands,
+                               [&](const auto& command) {
+                                   return equalIgnoringCase(command.first, globalName) ||
+                                          equalIgnoringCase(command.second, typedName);
+                               });
+}
+
+bool isDue(const ApplicationRecord& record, std::wstring_view command)
+{
+    return (record.loadReasons & TSRX_LOAD_ON_COMMAND) != 0 && lists(record, command) &&
+           !services().linker->isModuleLoaded(record.module.c_str());
+}
+} // namespace
+
+DemandLoading::DemandLoading(std::filesystem::path plugInsFolder) : mPlugInsFolder(std::move(plugInsFolder))
+{
+}
+
+void DemandLoading::loadAtStart() const
+{
+    // Asked before anything is loaded: what is loaded may write a record of its own.
+    const auto plugIns = unrecordedPlugIns();
+    for (const auto& record : allApplicationRecords())
+        if ((record.loadReasons & TSRX_LOAD_AT_HOST_START) != 0)
+            load(record.module);
+    for (const auto& plugIn : plugIns)
+        load(toWide(plugIn.native()));
+}
+
+std::vector<std::filesystem::path> DemandLoading::unrecordedPlugIns() const
+{
+    std::set<std::filesystem::path> recorded;
+    for (const auto& record : allApplicationRecords())
+        recorded.insert(resolved(toUtf8(record.module)));
+    std::vector<std::filesystem::path> result;
+    std::error_code failed; // without a PlugIns folder there are no plug-ins
+    for (std::filesystem::directory_iterator entry(mPlugInsFolder, failed), end; !failed && entry != end;
+         entry.increment(failed))
+        if (isApplication(entry->path()) && !recorded.contains(resolved(entry->path())))
+            result.push_back(entry->path());
+    std::ranges::sort(result);
+    return result;
+}
+
+bool DemandLoading::loadForCommand(std::wstring_view name) const
+{
+    const auto records = allApplicationRecords();
+    return std::ranges::any_of(records, [&](const ApplicationRecord& record)
+                               { return isDue(record, name) && load(record.module); });
+}
+} // namespace tessel

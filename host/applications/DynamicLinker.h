@@ -1,0 +1,66 @@
+// The host's dynamic linker: loads compiled applications, calls their entry points and takes them out again.
+//
+// Which application it is, is decided by the file, not by how its path is spelled: a link to a loaded file is
+// loaded too. What a bundle maps is its program, so a bundle and the program inside it are the same
+// application. A file that was replaced since it was loaded, as every build does, is told by where its path
+// and the loaded one lead.
+//
+// An application that has answered message 2 is unloaded even if the system keeps its library mapped: it has
+// given everything back, so it is listed no more and its commands are gone. That its code stays in memory is
+// said, and a later load sends message 1 to the library that is still there.
+#pragma once
+
+#include <optional>
+#include <string>
+#include <vector>
+
+#include <tessel/tsrxlinker.h>
+
+#include "host/applications/LoadedModules.h"
+
+namespace tessel
+{
+class DynamicLinker : public TsRxDynamicLinker
+{
+public:
+    struct LoadedModule
+    {
+        std::wstring path; // full
+        std::wstring name; // the file name with its extension
+        bool locked = false;
+    };
+
+    bool registerApplication(void* application) override;
+    bool loadModule(const wchar_t* path, bool sayWhyNot, bool resolveNow) override;
+    // An application of which a call has not returned yet stays, too: its code is needed.
+    bool unloadModule(const wchar_t* path, bool sayWhyNot) override;
+    bool isModuleLocked(const wchar_t* path) const override;
+    bool setApplicationLocked(void* application, bool locked) override;
+
+    // Whether the application at the path is in service.
+    bool isModuleLoaded(const wchar_t* path) const;
+
+    // What is in service, in the order in which it was loaded.
+    std::vector<LoadedModule> loadedModules() const;
+
+    // The full path of the first loaded application of that name, in any case; empty when there is none.
+    std::wstring pathOfModule(const std::wstring& name) const;
+
+    // The host ends: message 2 to everything, the last loaded first, whether locked or not. The libraries
+    // stay mapped until the process ends, and nothing can be loaded any more.
+    void unloadAll();
+
+private:
+    bool load(const std::wstring& path, bool resolveNow, std::wstring& whyNot);
+    bool answerForKnown(const Module& module, std::wstring& whyNot) const;
+    bool start(Module& module, std::wstring& whyNot);
+    bool isFreeToGo(const Module* module, std::wstring& whyNot) const;
+    bool takeOut(Module& module);
+    bool send(Module& module, unsigned message, std::wstring& whyNot) const;
+    Module* find(const wchar_t* path) const;
+    Module* known(const std::wstring& realPath, const RegularFile& program) const;
+
+    LoadedModules mModules;
+    bool mEnding = false;
+};
+} // namespace tessel

@@ -1,0 +1,73 @@
+#include "host/applications/LoadedModules.h"
+
+#include <utility>
+
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+Module* find(const auto& index, const auto& key)
+{
+    const auto found = index.find(key);
+    return found == index.end() ? nullptr : &*found->second;
+}
+} // namespace
+
+Module& LoadedModules::add(std::unique_ptr<Module> module)
+{
+    Module& added = *module;
+    mByHandle[&added] = std::move(module);
+    mByPath[added.path] = &added;
+    mByPath[added.realPath] = &added;
+    mByIdentity[added.identity] = &added;
+    return added;
+}
+
+void LoadedModules::putInService(Module& module)
+{
+    if (module.inService)
+        return;
+    module.inService = true;
+    mInService.push_back(&module);
+    mByName[foldCase(module.name)].push_back(&module);
+}
+
+void LoadedModules::remove(Module& module)
+{
+    if (module.inService)
+    {
+        const auto named = mByName.find(foldCase(module.name));
+        std::erase(named->second, &module);
+        if (named->second.empty())
+            mByName.erase(named);
+        std::erase(mInService, &module);
+    }
+    mByPath.erase(module.path);
+    mByPath.erase(module.realPath);
+    mByIdentity.erase(module.identity);
+    mByHandle.erase(&module);
+}
+
+Module* LoadedModules::withPath(const std::wstring& path) const
+{
+    return find(mByPath, path);
+}
+
+Module* LoadedModules::withIdentity(const FileIdentity& identity) const
+{
+    return find(mByIdentity, identity);
+}
+
+Module* LoadedModules::withHandle(const void* handle) const
+{
+    return find(mByHandle, handle);
+}
+
+const Module* LoadedModules::named(const std::wstring& name) const
+{
+    const auto found = mByName.find(foldCase(name));
+    return found == mByName.end() ? nullptr : found->second.front();
+}
+} // namespace tessel

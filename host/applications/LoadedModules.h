@@ -1,0 +1,58 @@
+// The compiled applications that the host knows: those in service, and those whose load message still runs.
+#pragma once
+
+#include <cstddef>
+#include <map>
+#include <memory>
+#include <string>
+#include <unordered_map>
+#include <vector>
+
+#include <tessel/tsrx.h>
+
+#include "host/applications/ModuleLibrary.h"
+#include "host/platform/RegularFile.h"
+
+namespace tessel
+{
+// One application. Its address is the handle that its entry point receives.
+struct Module
+{
+    std::wstring path;     // full, as it was first asked for
+    std::wstring realPath; // where that led through all links
+    std::wstring name;     // the file name with its extension
+    FileIdentity identity;
+    std::unique_ptr<ModuleLibrary> library;
+    TsRxEntryPoint entryPoint = nullptr;
+    bool inService = false;
+    bool locked = false;
+};
+
+class LoadedModules
+{
+public:
+    // Takes the application in, not in service yet.
+    Module& add(std::unique_ptr<Module> module);
+    // It counts as loaded from now on. A second call does nothing.
+    void putInService(Module& module);
+    // Forgets it; the reference ends here.
+    void remove(Module& module);
+
+    // Each answers null when there is none. A path is the one asked for or the real one.
+    Module* withPath(const std::wstring& path) const;
+    Module* withIdentity(const FileIdentity& identity) const;
+    Module* withHandle(const void* handle) const;
+    // The first loaded of those in service that share a name, in any case of letters.
+    const Module* named(const std::wstring& name) const;
+
+    // In the order in which they came into service.
+    const std::vector<Module*>& inService() const { return mInService; }
+
+private:
+    std::unordered_map<const void*, std::unique_ptr<Module>> mByHandle;
+    std::unordered_map<std::wstring, Module*> mByPath;
+    std::map<FileIdentity, Module*> mByIdentity;
+    std::unordered_map<std::wstring, std::vector<Module*>> mByName; // folded; in order of service
+    std::vector<Module*> mInService;
+};
+} // namespace tessel

@@ -1,0 +1,41 @@
+// The SDK's functions about loaded modules.
+#include <algorithm>
+#include <string>
+
+#include <tessel/tsed.h>
+
+#include "host/Services.h"
+#include "host/applications/DynamicLinker.h"
+
+namespace
+{
+constexpr int kFound = 0;
+constexpr int kNotFound = 1;
+} // namespace
+
+TsResultBuffer* tsedQmbLoaded()
+{
+    TsResultBuffer* list = nullptr;
+    TsResultBuffer** end = &list;
+    const auto* linker = tessel::services().linker;
+    if (!linker)
+        return nullptr;
+    for (const auto& module : linker->loadedModules())
+    {
+        *end = tsutBuildList({TsRbValue::String(module.name.c_str())});
+        end = &(*end)->next;
+    }
+    return list;
+}
+
+int tsedGetModuleFileName(const wchar_t* moduleName, wchar_t* path, std::size_t capacity)
+{
+    const auto* linker = tessel::services().linker;
+    if (!linker || !moduleName || !path)
+        return kNotFound;
+    const std::wstring found = linker->pathOfModule(moduleName);
+    if (found.empty() || found.size() >= capacity)
+        return kNotFound;
+    std::copy_n(found.c_str(), found.size() + 1, path);
+    return kFound;
+}

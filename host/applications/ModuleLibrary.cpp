@@ -1,0 +1,103 @@
+#include "host/applications/ModuleLibrary.h"
+
+#include <utility>
+
+#include <dlfcn.h>
+
+#include "host/applications/platform/ObjectiveCRuntime.h"
+#include "host/platform/Bundle.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr const char* kEntryPointName = "tsrxEntryPoint";
+
+// The linker begins with the path, which the sentence around its words names already.
+std::wstring linkersWords(const std::string& program)
+{
+    const char* error = dlerror();
+    std::string words = error ? error : "the system does not say why";
+    const std::string start = program + ": ";
+    return toWide(words.starts_with(start) ? words.substr(start.size()) : words);
+}
+
+void* map(const std::string& program, bool resolveNow)
+{
+    return dlopen(program.c_str(), (resolveNow ? RTLD_NOW : RTLD_LAZY) | RTLD_LOCAL);
+}
+
+// A handle of its own for a library that is mapped, or null.
+void* mappedLibrary(const std::string& program)
+{
+    return dlopen(program.c_str(), RTLD_NOLOAD | RTLD_LAZY);
+}
+
+bool isMapped(const std::string& program)
+{
+    void* handle = mappedLibrary(program);
+    return handle && dlclose(handle) == 0;
+}
+} // namespace
+
+ModuleFile moduleFileAt(std::string path)
+{
+    ModuleFile file;
+    file.isBundle = isBundlePath(path);
+    file.path = std::move(path);
+    file.program = file.isBundle ? programOfBundle(file.path, file.whyNoProgram) : file.path;
+    return file;
+}
+
+ModuleLibrary::ModuleLibrary(ModuleFile file, void* handle, bool byPlatform)
+    : mFile(std::move(file)), mHandle(handle), mByPlatform(byPlatform)
+{
+}
+
+std::unique_ptr<ModuleLibrary> ModuleLibrary::open(const ModuleFile& file, bool resolveNow,
+                                                   std::wstring& whyNot)
+{
+    if (file.isBundle && needsBundleLoading(file.program))
+        return openBundle(file, resolveNow, whyNot);
+    if (void* handle = map(file.program, resolveNow))
+        return std::unique_ptr<ModuleLibrary>(new ModuleLibrary(file, handle, false));
+    whyNot = linkersWords(file.program);
+    return nullptr;
+}
+
+std::unique_ptr<ModuleLibrary> ModuleLibrary::openBundle(const ModuleFile& file, bool resolveNow,
+                                                         std::wstring& whyNot)
+{
+    void* handle = loadBundle(file.path) ? mappedLibrary(file.program) : nullptr;
+    if (!handle)
+    {
+        // The platform keeps the reason to itself; the system's linker has the same one.
+        if (!map(file.program, true))
+            whyNot = linkersWords(file.program);
+        else
+            whyNot = L"the platform does not accept it as a bundle";
+        return nullptr;
+    }
+    if (const std::string missing = resolveNow ? firstUnresolvedFunction(handle) : ""; !missing.empty())
+    {
+        whyNot = L"undefined symbol: " + toWide(missing);
+        return nullptr;
+    }
+    return std::unique_ptr<ModuleLibrary>(new ModuleLibrary(file, handle, true));
+}
+
+TsRxEntryPoint ModuleLibrary::entryPoint() const
+{
+    return reinterpret_cast<TsRxEntryPoint>(dlsym(mHandle, kEntryPointName));
+}
+
+bool ModuleLibrary::close()
+{
+    if (mByPlatform)
+        unloadBundle(mFile.path);
+    if (mustStayMapped(mHandle))
+        return false;
+    return dlclose(mHandle) == 0 && !isMapped(mFile.program);
+}
+} // namespace tessel

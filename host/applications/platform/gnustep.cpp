@@ -1,0 +1,83 @@
+// GNUstep's bundles are never unloaded, and its runtime has no way to forget a class. So what brings no
+// Objective-C is loaded and unloaded as the plain library it is, and what brings some stays.
+#include "host/applications/platform/ObjectiveCRuntime.h"
+
+#include <fstream>
+#include <iterator>
+#include <string_view>
+
+#include <dlfcn.h>
+#include <link.h>
+
+namespace tessel
+{
+namespace
+{
+// What every compiled Objective-C file calls to make its classes and categories known.
+constexpr std::string_view kRegistration = "__objc_exec_class";
+
+const link_map* linkMapOf(void* library)
+{
+    link_map* map = nullptr;
+    return dlinfo(library, RTLD_DI_LINKMAP, &map) == 0 ? map : nullptr;
+}
+
+// An entry of the mapped library's dynamic section; 0 when it is not there.
+ElfW(Addr) dynamicEntry(const link_map& map, ElfW(Sxword) tag)
+{
+    for (const auto* entry = map.l_ld; entry->d_tag != DT_NULL; ++entry)
+        if (entry->d_tag == tag)
+            return entry->d_un.d_ptr;
+    return 0;
+}
+
+// The index behind the last symbol that the library only refers to: these stand in front of those that it
+// defines, which the hash table begins with.
+std::uint32_t endOfReferences(const link_map& map)
+{
+    const auto* hash = reinterpret_cast<const std::uint32_t*>(dynamicEntry(map, DT_GNU_HASH));
+    return hash ? hash[1] : 0;
+}
+
+bool isMissing(void* library, const ElfW(Sym) & symbol, const char* name)
+{
+    if (symbol.st_shndx != SHN_UNDEF || ELF64_ST_BIND(symbol.st_info) == STB_WEAK)
+        return false;
+    return !dlsym(library, name) && !dlsym(RTLD_DEFAULT, name);
+}
+} // namespace
+
+bool needsBundleLoading(const std::string& program)
+{
+    std::ifstream file(program, std::ios::binary);
+    const std::string content(std::istreambuf_iterator<char>(file), {});
+    return content.find(kRegistration) != content.npos;
+}
+
+bool mustStayMapped(void* library)
+{
+    const link_map* map = linkMapOf(library);
+    if (!map)
+        return true;
+    const auto* names = reinterpret_cast<const char*>(dynamicEntry(*map, DT_STRTAB));
+    if (!names)
+        return true;
+    return std::string_view(names, dynamicEntry(*map, DT_STRSZ)).find(kRegistration) !=
+           std::string_view::npos;
+}
+
+std::string firstUnresolvedFunction(void* library)
+{
+    const link_map* map = linkMapOf(library);
+    if (!map)
+        return {};
+    const auto* symbols = reinterpret_cast<const ElfW(Sym)*>(dynamicEntry(*map, DT_SYMTAB));
+    const auto* names = reinterpret_cast<const char*>(dynamicEntry(*map, DT_STRTAB));
+    if (!symbols || !names)
+        return {};
+    for (std::uint32_t i = 1; i < endOfReferences(*map); ++i) // the first symbol is no symbol
+        if (const char* name = names + symbols[i].st_name; isMissing(library, symbols[i], name))
+            return name;
+    return {};
+}
+} // namespace tessel

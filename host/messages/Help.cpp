@@ -1,0 +1,54 @@
+#include "host/messages/Help.h"
+
+#include <utility>
+
+#include <tessel/tsed.h>
+
+#include "host/Services.h"
+#include "host/text/CommandLine.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr wchar_t kFirstPage[] = L"index";
+
+// A topic is a name and no path: it must not lead out of the book.
+bool isTopicName(const std::wstring& topic)
+{
+    return topic.find_first_of(L"/\\") == topic.npos && topic.find(L'\0') == topic.npos;
+}
+
+bool isFile(const std::filesystem::path& path)
+{
+    std::error_code notThere;
+    return std::filesystem::is_regular_file(path, notThere);
+}
+} // namespace
+
+Help::Help(std::filesystem::path book, Browser browser) : mBook(std::move(book)), mBrowser(std::move(browser))
+{
+}
+
+bool Help::show(const std::wstring& topic, const std::filesystem::path& otherBook)
+{
+    CommandLine& commandLine = *services().commandLine;
+    const std::wstring name = topic.empty() ? kFirstPage : topic;
+    const auto page = (otherBook.empty() ? mBook : otherBook) / (toUtf8(name) + ".html");
+    if (!isTopicName(name) || !isFile(page))
+    {
+        commandLine.say(L"There is no help on \"" + name + L"\".");
+        return false;
+    }
+    const bool shown = mBrowser(page);
+    commandLine.say((shown ? L"The help opens in the browser: " : L"Help: ") + toWide(page.string()));
+    return true;
+}
+} // namespace tessel
+
+bool tsedHelp(const wchar_t* file, const wchar_t* topic, int)
+{
+    auto* help = tessel::services().help;
+    return help && help->show(topic ? topic : L"", file ? tessel::toUtf8(file) : "");
+}

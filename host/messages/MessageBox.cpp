@@ -1,0 +1,46 @@
+#include "host/messages/MessageBox.h"
+
+#include <utility>
+
+#include "host/Services.h"
+#include "host/text/CommandLine.h"
+
+namespace tessel
+{
+void MessageBox::setPresenter(Presenter presenter)
+{
+    mPresenter = std::move(presenter);
+}
+
+void MessageBox::explain(const std::wstring& path, const std::wstring& why)
+{
+    mExplainedPath = path;
+    mWhy = why;
+}
+
+// What is not used now is about something else than the box after it.
+std::wstring MessageBox::takeDetailFor(const std::wstring& text)
+{
+    const std::wstring path = std::exchange(mExplainedPath, {});
+    const std::wstring why = std::exchange(mWhy, {});
+    return !path.empty() && text.find(path) != std::wstring::npos ? why : std::wstring();
+}
+
+int MessageBox::show(const wchar_t* text, unsigned style, void* parent)
+{
+    const std::wstring message = text ? text : L"";
+    const std::wstring detail = takeDetailFor(message);
+    if (const int answer = mPresenter ? mPresenter({message, detail, style, parent}) : 0)
+        return answer;
+    if (auto* commandLine = services().commandLine)
+        commandLine->say(L"Message: " + message);
+    return IDOK; // every style begins with the button OK
+}
+} // namespace tessel
+
+VqHostMessageBox* VqHostMessageBox::simple()
+{
+    static tessel::MessageBox withoutHost; // never null, not even while the host starts or ends
+    auto* running = tessel::services().messageBox;
+    return running ? running : &withoutHost;
+}

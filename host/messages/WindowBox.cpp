@@ -1,0 +1,32 @@
+#include "host/messages/WindowBox.h"
+
+#include <dlfcn.h>
+
+#include "host/messages/platform/Desktop.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr char kLibrary[] = TESSEL_WINDOWS_LIBRARY; // the file's name on this platform
+constexpr char kShowBox[] = "tsuiShowMessageBox";
+
+using ShowBox = int (*)(const wchar_t* text, const wchar_t* detail, unsigned style, void* parent);
+
+// Kept loaded to the end: a toolkit cannot be taken out of a process.
+ShowBox findShowBox(const std::filesystem::path& library)
+{
+    void* windows = dlopen(library.c_str(), RTLD_NOW | RTLD_LOCAL);
+    return windows ? reinterpret_cast<ShowBox>(dlsym(windows, kShowBox)) : nullptr;
+}
+} // namespace
+
+MessageBox::Presenter windowBoxes(const std::filesystem::path& libraryFolder)
+{
+    return [library = libraryFolder / kLibrary](const MessageBox::Box& box)
+    {
+        static const ShowBox showBox = hasDisplay() ? findShowBox(library) : nullptr;
+        return showBox ? showBox(box.text.c_str(), box.detail.c_str(), box.style, box.parent) : 0;
+    };
+}
+} // namespace tessel

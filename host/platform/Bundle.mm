@@ -1,0 +1,67 @@
+#include "host/platform/Bundle.h"
+
+#import <Foundation/Foundation.h>
+
+#include <algorithm>
+#include <filesystem>
+
+#include "host/platform/AutoreleasePool.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr std::string_view kBundleSuffix = ".bundle";
+
+NSBundle* bundleAt(const std::string& folder)
+{
+    NSString* path = [NSString stringWithUTF8String:folder.c_str()];
+    return path ? [NSBundle bundleWithPath:path] : nil;
+}
+
+char lowerAscii(char character)
+{
+    return character >= 'A' && character <= 'Z' ? static_cast<char>(character - 'A' + 'a') : character;
+}
+} // namespace
+
+bool isBundlePath(std::string_view path)
+{
+    if (path.size() < kBundleSuffix.size())
+        return false;
+    return std::ranges::equal(path.substr(path.size() - kBundleSuffix.size()), kBundleSuffix, {}, lowerAscii);
+}
+
+std::string programOfBundle(const std::string& folder, std::wstring& whyNot)
+{
+    const AutoreleasePool pool;
+    std::error_code failed;
+    if (!std::filesystem::exists(folder, failed))
+        return {};
+    NSBundle* bundle = bundleAt(folder);
+    if (bundle &&
+        !std::filesystem::equivalent([[bundle bundlePath] fileSystemRepresentation], folder, failed))
+    {
+        // GNUstep answers with the bundle that it has opened before under the same identifier.
+        whyNot = L"the bundle \"" + toWide([[bundle bundlePath] UTF8String]) + L"\" has the same identifier";
+        return {};
+    }
+    NSString* program = [bundle executablePath];
+    if (!program)
+        whyNot = L"the bundle holds no program for this system";
+    return program ? [program fileSystemRepresentation] : "";
+}
+
+bool loadBundle(const std::string& folder)
+{
+    const AutoreleasePool pool;
+    return [bundleAt(folder) load] == YES;
+}
+
+void unloadBundle(const std::string& folder)
+{
+    const AutoreleasePool pool;
+    [bundleAt(folder) unload];
+}
+} // namespace tessel

@@ -1,0 +1,45 @@
+#include "host/text/CommandLine.h"
+
+#include <utility>
+#include <vector>
+
+#include <tessel/tsformat.h>
+
+#include "host/Services.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+CommandLine::CommandLine(Sink write) : mWrite(std::move(write))
+{
+}
+
+void CommandLine::print(std::wstring_view text)
+{
+    if (text.empty())
+        return;
+    mWrite(toUtf8(text));
+    const auto lastBreak = text.find_last_of(L"\r\n");
+    if (lastBreak != text.npos)
+        mOpenLine.clear();
+    mOpenLine += text.substr(lastBreak == text.npos ? 0 : lastBreak + 1);
+}
+
+void CommandLine::say(std::wstring_view sentence)
+{
+    if (!atLineStart())
+        print(L"\n");
+    print(sentence);
+    print(L"\n");
+}
+} // namespace tessel
+
+int tsutPrintfArguments(const wchar_t* format, const TsFormatArgument* arguments, std::size_t count)
+{
+    const std::size_t length = tsutFormatArguments(nullptr, 0, format, arguments, count);
+    std::vector<wchar_t> text(length + 1);
+    tsutFormatArguments(text.data(), text.size(), format, arguments, count);
+    if (auto* commandLine = tessel::services().commandLine)
+        commandLine->print({text.data(), length});
+    return static_cast<int>(length);
+}

@@ -1,0 +1,73 @@
+#include "modrig/base/CStringList.h"
+
+#include "modrig/base/SplitPath.h"
+
+namespace
+{
+// Object-database modules are the same application wherever they lie. The extension of a split path begins
+// with its dot, so that "bundle" is never equal and bundles are told apart by their folders too: users keep
+// several versions of a bundle in different folders, and adding the dot would make them one.
+bool IsKnownByFileNameAlone(const SplitPath& entry)
+{
+    return entry.HasExtension(L"bundle") || entry.HasExtension(L".omp");
+}
+
+std::size_t MatchingHash(const SplitPath& entry)
+{
+    return IsKnownByFileNameAlone(entry) ? entry.FileNameHash() : entry.PathHash();
+}
+} // namespace
+
+bool MatchesEntry(const SplitPath& entry, const SplitPath& target)
+{
+    if (!entry.SameFileName(target))
+        return false;
+    return IsKnownByFileNameAlone(entry) || entry.SameFolder(target);
+}
+
+void CStringList::AddTail(const CStdStr& text)
+{
+    const auto entry = mEntries.insert(mEntries.end(), Entry{text, mNextPlace++});
+    mIndex.emplace(MatchingHash(SplitPath(text)), entry);
+}
+
+void CStringList::RemoveAll()
+{
+    mIndex.clear();
+    mEntries.clear();
+}
+
+bool CStringList::RemoveFirstNoCase(const CStdStr& text)
+{
+    // Texts that are equal without regard to case are split alike, so that all of them stand under one hash.
+    auto [candidate, last] = mIndex.equal_range(MatchingHash(SplitPath(text)));
+    auto first = mIndex.end();
+    for (; candidate != last; ++candidate)
+    {
+        const bool earlier = first == mIndex.end() || candidate->second->place < first->second->place;
+        if (earlier && candidate->second->text.EqualsNoCase(text))
+            first = candidate;
+    }
+    if (first == mIndex.end())
+        return false;
+    mEntries.erase(first->second);
+    mIndex.erase(first);
+    return true;
+}
+
+bool CStringList::HoldsApplication(const CStdStr& path) const
+{
+    if (IsEmpty())
+        return false;
+    const SplitPath target(path);
+    return HoldsUnder(target.PathHash(), target) || HoldsUnder(target.FileNameHash(), target);
+}
+
+bool CStringList::HoldsUnder(std::size_t hash, const SplitPath& target) const
+{
+    auto [candidate, last] = mIndex.equal_range(hash);
+    for (; candidate != last; ++candidate)
+        if (MatchesEntry(SplitPath(candidate->second->text), target))
+            return true;
+    return false;
+}

@@ -1,0 +1,141 @@
+#import "modrig/dialogs/ModrigController.h"
+
+#include <tesselui/tsuieach.h>
+#include <tesselui/tsuifilepanel.h>
+
+#import "modrig/dialogs/ModrigArrayController.h"
+#import "modrig/dialogs/ModrigFilePath.h"
+#import "modrig/dialogs/ModrigStartupSuitController.h"
+#import "modrig/dialogs/TsOCModrigUtil.h"
+
+#include "modrig/dialogs/LongLoad.h"
+#include "modrig/dialogs/Paths.h"
+#include "modrig/dialogs/Settings.h"
+#include "modrig/dialogs/model/ChosenFiles.h"
+#include "modrig/loader/LoadBatch.h"
+#include "modrig/messages/Messages.h"
+
+namespace
+{
+constexpr NSInteger kLoadedApplicationsTab = 0;
+constexpr NSInteger kHistoryTab = 1;
+
+// Answers NO when the table has a row for that file already.
+BOOL insertRow(ModrigFilePath* row, NSArrayController* table, int insertRow)
+{
+    auto* rows = (ModrigArrayController*)table;
+    if ([rows holds:row])
+        return NO;
+    const NSUInteger count = [[rows arrangedObjects] count];
+    [rows insertObject:row atArrangedObjectIndex:ModrigUtils::RowForInsertion(insertRow, count)];
+    return YES;
+}
+
+void scrollToLastRow(NSTableView* table, NSArrayController* rows)
+{
+    const NSUInteger count = [[rows arrangedObjects] count];
+    if (count > 0)
+        [table scrollRowToVisible:static_cast<NSInteger>(count - 1)];
+}
+} // namespace
+
+@implementation ModrigController (Loading)
+
+// Removing rows from the History, say, leaves nothing chosen while the panel still shows its files as
+// selected.
+- (void)chooseWhatIsStillSelected
+{
+    const bool panelHasSelection = [[mOpenPanel URLs] count] > 0;
+    const bool historyHasSelection = [[historyList selectedObjects] count] > 0;
+    switch (ModrigUtils::SourceWithoutChoice(panelHasSelection, historyHasSelection))
+    {
+    case ModrigUtils::LoadSource::kPanel:
+        return [self panelSelectionDidChange:mOpenPanel];
+    case ModrigUtils::LoadSource::kHistory:
+        return [self chooseFromHistory];
+    case ModrigUtils::LoadSource::kNothing:
+        NSBeep();
+        self.message = [TsOCModrigUtil modrigLoadString:@"IDS_MODRIG_NOTHING_CHOSEN"];
+        return;
+    }
+}
+
+- (IBAction)onLoad:(id)sender
+{
+    (void)sender;
+    if ([mSelectedFiles count] == 0)
+    {
+        if (tsuiTellOfMissingFile(mOpenPanel))
+            return;
+        [self chooseWhatIsStillSelected];
+    }
+    if ([self openTesselFolder])
+        return;
+    [self loadApps:mSelectedFiles successedApps:nil addToStartupSuit:NO];
+    [[self uiPersistentStore] putControlString:kSettingsGroup
+                                       control:kInitialPathSetting
+                                         value:[mOpenPanel directory]];
+}
+
+- (IBAction)onStartupSuits:(id)sender
+{
+    (void)sender;
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    ModrigStartupSuitController* suite = [[ModrigStartupSuitController alloc] init];
+    [suite showModalWindowCenterOfParent:[[self view] window]];
+    [suite release];
+    [pool drain];
+}
+
+- (IBAction)onHelp:(id)sender
+{
+    (void)sender;
+    ModrigUtils::OnCommandHelp(ModrigUtils::kMainDialogHelp);
+}
+
+- (void)addRowsFor:(NSString*)path
+{
+    // Thousands of files may be loaded in one go.
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    ModrigFilePath* row = [[[ModrigFilePath alloc] initWithFilePathName:path] autorelease];
+    // A row that comes in the place of the selected one does not count as a change of the selection.
+    if (insertRow(row, loadedApps, mInsertRow))
+        [self keepToUnloadableRows];
+    // New rows come selected, and not every toolkit tells of that.
+    if (mbSaveHistory && insertRow(row, historyList, mInsertRow))
+        [self chooseFromHistory];
+    [pool drain];
+}
+
+- (void)showLastRow
+{
+    if (tabViewSelectedIndex == kLoadedApplicationsTab)
+        scrollToLastRow(loadedAppsTableView, loadedApps);
+    else if (tabViewSelectedIndex == kHistoryTab)
+        scrollToLastRow(historyListTableView, historyList);
+}
+
+- (void)loadApps:(NSArray*)files
+       successedApps:(NSMutableArray*)successedApps
+    addToStartupSuit:(BOOL)addToStartupSuit
+{
+    if ([files count] == 0)
+        return;
+    [self clearMessage];
+    // A copy: what is loaded may change the selection that the files come from.
+    NSArray* batchFiles = [[files copy] autorelease];
+    ModrigUtils::LoadBatch batch;
+    for (ModrigFilePath* file : tsuiEach<ModrigFilePath*>(batchFiles))
+        batch.files.push_back({[file path], static_cast<bool>([self isTesselFolder:[file filePathName]])});
+    batch.saveHistory = mbSaveHistory;
+    batch.loadAll = addToStartupSuit;
+    batch.succeeded = [=](std::size_t index) { [successedApps addObject:[batchFiles objectAtIndex:index]]; };
+    batch.added = [=](std::size_t index)
+    { [self addRowsFor:[[batchFiles objectAtIndex:index] filePathName]]; };
+    ModrigUtils::LongLoad load(self, batch.files.size());
+    batch.isStopped = [&load](std::size_t done) { return load.IsStopped(done); };
+    if (ModrigUtils::RunLoadBatch(batch) > 0 && mInsertRow == ModrigUtils::kAppendRow)
+        [self showLastRow];
+}
+
+@end

@@ -1,0 +1,163 @@
+#import "modrig/dialogs/ModrigController.h"
+
+#import <tesselui/TsOCFileFilter.h>
+#include <tesselui/tsuieach.h>
+
+#import "modrig/dialogs/ModrigFilePath.h"
+#import "modrig/dialogs/NSSavePanel+ModrigRuntime.h"
+#import "modrig/dialogs/NSString+ModrigPaths.h"
+#import "modrig/dialogs/TsOCModrigUtil.h"
+
+#include "modrig/dialogs/Paths.h"
+#include "modrig/dialogs/Settings.h"
+#include "modrig/dialogs/model/ChosenFiles.h"
+#include "modrig/dialogs/model/FileVisibility.h"
+#include "modrig/dialogs/platform/Platform.h"
+#include "modrig/messages/MessageIds.h"
+#include "modrig/types/FileFilters.h"
+
+@implementation ModrigController (OpenPanel)
+
+// The panel stays open when files are loaded: its default button is out of sight, and loads.
+- (void)setupButtonsOf:(NSOpenPanel*)panel
+{
+    NSButton* ok = [panel okButton];
+    [ok setHidden:YES];
+    [ok setTarget:self];
+    [ok setAction:@selector(openPanelOK:)];
+    [[panel cancelButton] setFrame:[ok frame]];
+    [[panel cancelButton] setTitle:[TsOCModrigUtil modrigLoadString:@"IDS_MODRIG_CLOSE_BUTTON"]];
+}
+
+- (void)placeHelpButtonIn:(NSOpenPanel*)panel
+{
+    NSButton* spare = [panel hideExtensionButton];
+    // Before the button that stands to its right, for the order of the Tab key.
+    [[spare superview] addSubview:helpButton positioned:NSWindowBelow relativeTo:[panel cancelButton]];
+    [helpButton setFrameOrigin:NSMakePoint(NSMinX([spare frame]), NSMinY([[panel okButton] frame]))];
+}
+
+- (NSString*)initialFolder
+{
+    NSString* stored = [[self uiPersistentStore] getControlString:kSettingsGroup control:kInitialPathSetting];
+    return [stored length] ? stored : [[NSBundle mainBundle] bundlePath];
+}
+
+- (void)setupOpenPanel:(NSOpenPanel*)panel
+{
+    mOpenPanel = panel;
+    [panel setDelegate:(id)self];
+    [panel setAllowsMultipleSelection:YES];
+    [self setupButtonsOf:panel];
+    [panel setAccessoryView:[self view]];
+    [self placeHelpButtonIn:panel];
+    ModrigPlatform::FitAccessoryView([self view]);
+    CStdStr title;
+    title.Load(ModrigMessages::kOpenPanelTitle);
+    [panel setTitle:ModrigUtils::StringFromPath(title)];
+    [panel setDirectory:[self initialFolder]];
+    ModrigPlatform::ShowRows(loadedAppsTableView, loadedApps);
+    ModrigPlatform::ShowRows(historyListTableView, historyList);
+    [self populateFileTypes];
+    [self populateLoadedApplications];
+    [self populateHistoryList];
+    [self onInit];
+    [loadedAppsTableView sizeLastColumnToFit];
+    [historyListTableView sizeLastColumnToFit];
+    ModrigPlatform::UpdateKeyViews(panel);
+}
+
+- (void)cleanOpenPanel:(NSOpenPanel*)panel
+{
+    mOpenPanel = nil;
+    [self onFinish];
+    [panel setDelegate:nil];
+    [panel setAccessoryView:nil];
+    [helpButton removeFromSuperview];
+}
+
+- (TsOCFileFilter*)selectedFilter
+{
+    NSArray* filters = [fileTypes arrangedObjects];
+    const NSUInteger index = [fileTypes selectionIndex];
+    return index < [filters count] ? [filters objectAtIndex:index] : nil;
+}
+
+- (void)populateFileTypes
+{
+    NSMutableArray* filters = [NSMutableArray array];
+    [TsOCModrigUtil populateModrigFileFilter:filters];
+    [fileTypes addObjects:filters];
+    [fileTypes setSelectionIndex:0];
+    [self onFileTypesChanged:nil];
+}
+
+// The system's panel asks again about the files of a folder that it comes to: it is sent away and back.
+- (void)filterPanelAgain
+{
+    [mOpenPanel validateVisibleColumns];
+    NSURL* folder = [[[mOpenPanel directoryURL] retain] autorelease];
+    [mOpenPanel setDirectoryURL:[[NSBundle bundleForClass:[self class]] bundleURL]];
+    [mOpenPanel setDirectoryURL:folder];
+}
+
+// The pop-up sends itself; nobody has chosen anything when the dialog fills it.
+- (IBAction)onFileTypesChanged:(id)sender
+{
+    TsOCFileFilter* filter = [self selectedFilter];
+    if (!filter)
+        return;
+    if (sender)
+        ModrigUtils::SetRegFileFilterListIndex(ModrigUtils::PathFromString([filter description]));
+    NSArray* chosen = [[mSelectedFiles copy] autorelease];
+    const bool chosenInHistory = [self historyIsChosen];
+    [self filterPanelAgain];
+    if (!ModrigUtils::PanelSelectionCounts(ModrigUtils::PanelChange::kFileType, [mSelectedFiles count] == 0,
+                                           chosenInHistory))
+        [mSelectedFiles setArray:chosen];
+}
+
+- (BOOL)panel:(id)panel shouldShowFilename:(NSString*)name
+{
+    TsOCFileFilter* filter = [self selectedFilter];
+    if (!filter)
+        return NO;
+    NSString* path = [name stringByResolvingSymlinksAndAliasesInPath];
+    ModrigUtils::PanelFile file;
+    file.exists = ModrigPlatform::FileExists(path, file.isFolder);
+    file.isPackage = file.isFolder && ModrigPlatform::IsFilePackage(path);
+    file.extension = ModrigUtils::PathFromString([path pathExtension]);
+    file.isHostFolder = [self isTesselFolder:path];
+    return ModrigUtils::IsShownInPanel(file, [panel treatsFilePackagesAsDirectories],
+                                       ModrigUtils::PathsFromStrings([filter fileExtensions]));
+}
+
+- (void)panelSelectionDidChange:(id)panel
+{
+    [mSelectedFiles removeAllObjects];
+    NSArray* paths = [[panel URLs] valueForKey:@"path"];
+    [mSelectedFiles addObjectsFromArray:ModrigUtils::RowsFromPaths(ModrigUtils::PathsFromStrings(paths))];
+}
+
+- (void)openPanelOK:(id)sender
+{
+    [self onLoad:sender];
+}
+
+- (BOOL)openTesselFolder
+{
+    if ([mSelectedFiles count] != 1)
+        return NO;
+    NSString* path = [[mSelectedFiles objectAtIndex:0] filePathName];
+    if (![self isTesselFolder:path])
+        return NO;
+    [mOpenPanel setDirectory:path];
+    return YES;
+}
+
+- (BOOL)isTesselFolder:(NSString*)path
+{
+    return path && [path caseInsensitiveCompare:[[NSBundle mainBundle] bundlePath]] == NSOrderedSame;
+}
+
+@end

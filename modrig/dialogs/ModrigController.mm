@@ -1,0 +1,142 @@
+#import "modrig/dialogs/ModrigController.h"
+
+#include <tesselui/tsuifilepanel.h>
+
+#import "modrig/dialogs/ModrigStartupSuiteBox.h"
+#import "modrig/dialogs/ModrigTableView.h"
+#import "modrig/dialogs/TsOCModrigUtil.h"
+
+#include "modrig/dialogs/Detaching.h"
+#include "modrig/dialogs/Layout.h"
+#include "modrig/dialogs/Settings.h"
+#include "modrig/lists/History.h"
+#include "modrig/loader/LoadBatch.h"
+#include "modrig/loader/LoadedApplications.h"
+#include "modrig/loader/StartupSuite.h"
+#include "modrig/module/EntryPoint.h"
+
+@implementation ModrigController
+
+@synthesize selectedFiles = mSelectedFiles;
+@synthesize saveHistory = mbSaveHistory;
+@synthesize tabViewSelectedIndex;
+@synthesize canUnloadApp;
+@synthesize canRemoveHistory;
+@synthesize message;
+
+- (id)init
+{
+    self = [super initWithNibName:@"Modrig" bundle:[NSBundle bundleForClass:[ModrigController class]]];
+    if (!self)
+        return nil;
+    mSelectedFiles = [[NSMutableArray alloc] init];
+    mInsertRow = ModrigUtils::kAppendRow;
+    message = @"";
+    return self;
+}
+
+- (void)dealloc
+{
+    [mpUIPersistentStore release];
+    self.selectedFiles = nil;
+    self.message = nil;
+    [super dealloc];
+}
+
+// An empty text, and none: a field that is bound to nothing says so.
+- (void)clearMessage
+{
+    self.message = @"";
+}
+
+- (TsUIPersistentStore*)uiPersistentStore
+{
+    if (!mpUIPersistentStore)
+        mpUIPersistentStore = [[TsUIPersistentStore alloc] init];
+    return mpUIPersistentStore;
+}
+
+- (void)readSettings
+{
+    TsUIPersistentStore* settings = [self uiPersistentStore];
+    self.saveHistory = [settings getControlState:kSettingsGroup control:kSaveHistorySetting] != 0;
+    self.tabViewSelectedIndex = [settings getControlInt:kSettingsGroup control:kLastTabSetting];
+}
+
+- (void)showModrigDialog
+{
+    // At once, and not only when all else is set up: closing stores them, after a failure too.
+    [self readSettings];
+    ModrigUtils::PopulateLoadedApps();
+    NSOpenPanel* panel = tsuiMakeFilePanel();
+    @try
+    {
+        [self setupOpenPanel:panel];
+        [panel runModal];
+    }
+    @finally
+    {
+        [self cleanOpenPanel:panel];
+        ModrigUtils::WriteStartupFilesToRegistry();
+        ModrigUtils::WriteHistoryFilesToRegistry();
+        ModrigUtils::updateRegistry();
+    }
+}
+
+- (void)restoreLayout
+{
+    TsUIPersistentStore* settings = [self uiPersistentStore];
+    ModrigUtils::RestoreFrame([[self view] window], settings, kWindowSetting);
+    ModrigUtils::RestoreColumns(loadedAppsTableView, settings, kLoadedColumnSetting);
+    ModrigUtils::RestoreColumns(historyListTableView, settings, kHistoryColumnSetting);
+}
+
+- (void)storeLayout
+{
+    TsUIPersistentStore* settings = [self uiPersistentStore];
+    ModrigUtils::StoreFrame([[self view] window], settings, kWindowSetting);
+    ModrigUtils::StoreColumns(loadedAppsTableView, settings, kLoadedColumnSetting);
+    ModrigUtils::StoreColumns(historyListTableView, settings, kHistoryColumnSetting);
+}
+
+- (void)onInit
+{
+    [self readSettings];
+    [TsOCModrigUtil setModrigController:self];
+    [ModrigTableView adopt:loadedAppsTableView];
+    [ModrigTableView adopt:historyListTableView];
+    [helpButton setKeyEquivalent:ModrigUtils::HelpKey()];
+    NSArray* files = [NSArray arrayWithObject:NSFilenamesPboardType];
+    [loadedAppsTableView registerForDraggedTypes:files];
+    [startupSuiteBox registerForDraggedTypes:files];
+    [loadedAppsTableView setDataSource:self];
+    [historyListTableView setDataSource:self];
+    [historyListTableView setTarget:self];
+    [historyListTableView setDoubleAction:@selector(onDoubleClickHistoryTableView:)];
+    [self restoreLayout];
+}
+
+- (void)storeSettings
+{
+    TsUIPersistentStore* settings = [self uiPersistentStore];
+    [settings putControlState:kSettingsGroup control:kSaveHistorySetting state:self.saveHistory];
+    [settings putControlInt:kSettingsGroup
+                    control:kLastTabSetting
+                      value:static_cast<int>(self.tabViewSelectedIndex)];
+}
+
+- (void)onFinish
+{
+    [startupSuiteBox unregisterDraggedTypes];
+    [loadedAppsTableView unregisterDraggedTypes];
+    [loadedAppsTableView setDataSource:nil];
+    [historyListTableView setDataSource:nil];
+    [self storeSettings];
+    [self storeLayout];
+    [TsOCModrigUtil setModrigController:nil];
+    [historyListTableView setDoubleAction:nullptr];
+    ModrigUtils::DetachFrom(self, [self view]);
+    ModrigUtils::DetachFrom(self, helpButton); // which has left the view for the panel's button row
+}
+
+@end

@@ -1,0 +1,66 @@
+#import "modrig/dialogs/ModrigDialogView.h"
+
+#include <cmath>
+
+#import "modrig/dialogs/ModrigController.h"
+#import "modrig/dialogs/TsOCModrigUtil.h"
+
+namespace
+{
+constexpr NSInteger kTabs = 2;
+constexpr CGFloat kSmallestHeight = 280; // a table of four rows, and the whole text of the Startup Suite box
+constexpr CGFloat kGap = 6;
+
+// The tab that the key stands for, or -1.
+NSInteger tabOf(NSEvent* event)
+{
+    NSString* characters = [event charactersIgnoringModifiers];
+    if (!([event modifierFlags] & NSCommandKeyMask) || [characters length] != 1)
+        return -1;
+    const NSInteger tab = [characters characterAtIndex:0] - '1';
+    return tab < kTabs ? tab : -1;
+}
+} // namespace
+
+@implementation ModrigDialogView
+
+- (CGFloat)tsuiSmallestHeight
+{
+    return kSmallestHeight;
+}
+
+// The choice of file types gets what its label leaves, whose text is longer in some languages than in others.
+- (void)placeFileTypes
+{
+    const CGFloat width = std::ceil([[fileTypesLabel cell] cellSize].width);
+    NSRect label = [fileTypesLabel frame];
+    NSRect choice = [fileTypesChoice frame];
+    const CGFloat right = NSMaxX(choice);
+    label.size.width = width;
+    choice.origin.x = NSMaxX(label) + kGap;
+    choice.size.width = right - NSMinX(choice);
+    [fileTypesLabel setFrame:label];
+    [fileTypesChoice setFrame:choice];
+}
+
+- (void)awakeFromNib
+{
+    [self placeFileTypes];
+}
+
+- (void)resizeSubviewsWithOldSize:(NSSize)size
+{
+    [super resizeSubviewsWithOldSize:size];
+    [self placeFileTypes];
+}
+
+- (BOOL)performKeyEquivalent:(NSEvent*)event
+{
+    const NSInteger tab = tabOf(event);
+    if (tab < 0)
+        return [super performKeyEquivalent:event];
+    [[TsOCModrigUtil getModrigController] setTabViewSelectedIndex:tab];
+    return YES;
+}
+
+@end

@@ -1,0 +1,37 @@
+// One row of a table of the dialogs: an application file.
+#pragma once
+
+#import <Foundation/Foundation.h>
+
+#include "modrig/base/CStdStr.h"
+
+@interface ModrigFilePath : NSObject
+{
+    NSString* mFilePathName;
+    NSString* mFileName;
+    NSString* mFilePath;
+    BOOL mUnloadable;
+}
+
+// The full path with symbolic links resolved: what the row stands for.
+@property (nonatomic, readonly) NSString* filePathName;
+// File name and folder of the path as it was given.
+@property (nonatomic, readonly) NSString* fileName;
+@property (nonatomic, readonly) NSString* filePath;
+// Whether the application could be unloaded when the row was made.
+@property (nonatomic, readonly) BOOL unloadable;
+
+// With nil all texts are nil, and `unloadable` is NO. A path without a dot: message 2.
+- (id)initWithFilePathName:(NSString*)path;
+
+// The same for a path that has no symbolic links in it, which is then not looked at on the disk.
+- (id)initWithResolvedPath:(NSString*)path;
+
+// `filePathName` as the module's logic takes it.
+- (CStdStr)path;
+
+// Whether both stand for the same file; case does not matter.
+- (BOOL)isEqual:(id)other;
+- (NSUInteger)hash;
+
+@end

@@ -1,0 +1,40 @@
+#import "modrig/dialogs/ModrigNameCell.h"
+
+#include <objc/runtime.h>
+
+#include "modrig/dialogs/Paths.h"
+#include "modrig/dialogs/model/RowLook.h"
+#include "modrig/dialogs/platform/Desktop.h"
+
+namespace
+{
+constexpr CGFloat kMargin = 8; // what a cell leaves free around its text
+}
+
+@implementation ModrigNameCell
+
+// The window file knows the toolkit's cells only. This class adds no variables of its own.
++ (void)adoptIn:(NSTableColumn*)column
+{
+    if (!ModrigPlatform::TablesShortenTexts())
+        object_setClass([column dataCell], [ModrigNameCell class]);
+}
+
+- (NSString*)textIn:(CGFloat)width
+{
+    NSDictionary* font = [NSDictionary dictionaryWithObject:[self font] forKey:NSFontAttributeName];
+    const auto fits = [=](const CStdStr& text)
+    { return [ModrigUtils::StringFromPath(text) sizeWithAttributes:font].width <= width - kMargin; };
+    return ModrigUtils::StringFromPath(
+        ModrigUtils::Shortened(ModrigUtils::PathFromString([self stringValue]), fits));
+}
+
+- (void)drawInteriorWithFrame:(NSRect)frame inView:(NSView*)view
+{
+    NSString* whole = [[[self stringValue] copy] autorelease];
+    [self setStringValue:[self textIn:NSWidth(frame)]];
+    [super drawInteriorWithFrame:frame inView:view];
+    [self setStringValue:whole];
+}
+
+@end

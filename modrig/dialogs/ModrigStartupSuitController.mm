@@ -1,0 +1,170 @@
+#import "modrig/dialogs/ModrigStartupSuitController.h"
+
+#import <tesselui/TsOCOpenFileDialog.h>
+#import <tesselui/TsUIPersistentStore.h>
+#include <tesselui/tsuieach.h>
+
+#import "modrig/dialogs/ModrigController.h"
+#import "modrig/dialogs/ModrigFilePath.h"
+#import "modrig/dialogs/ModrigTableView.h"
+#import "modrig/dialogs/TsOCModrigUtil.h"
+
+#include "modrig/dialogs/Layout.h"
+#include "modrig/dialogs/Paths.h"
+#include "modrig/dialogs/Settings.h"
+#include "modrig/dialogs/platform/Platform.h"
+#include "modrig/lists/Globals.h"
+#include "modrig/lists/ListRemoval.h"
+#include "modrig/loader/FileIntake.h"
+#include "modrig/messages/MessageIds.h"
+#include "modrig/messages/Messages.h"
+
+namespace
+{
+constexpr NSInteger kAddSegment = 0;
+constexpr NSInteger kRemoveSegment = 1;
+} // namespace
+
+@interface ModrigStartupSuitController (Segments)
+- (void)enableRemove:(BOOL)enabled;
+@end
+
+@implementation ModrigStartupSuitController
+
+- (NSString*)windowNibName
+{
+    return @"ModrigStartupSuit";
+}
+
+- (id)init
+{
+    return [super init];
+}
+
+- (void)doInit
+{
+    ModrigPlatform::CompleteSegments(segmentedControl);
+    [ModrigTableView adopt:startupTableView];
+    TsUIPersistentStore* settings = [[[TsUIPersistentStore alloc] init] autorelease];
+    ModrigUtils::RestoreFrame([self window], settings, kSuiteWindowSetting);
+    ModrigUtils::RestoreColumns(startupTableView, settings, kSuiteColumnSetting);
+    ModrigPlatform::ShowRows(startupTableView, startupApps);
+    [TsOCModrigUtil fill:startupApps withPathNames:ModrigUtils::StringsFromList(gStartupList)];
+    [self enableRemove:NO];
+}
+
+- (void)enableRemove:(BOOL)enabled
+{
+    [segmentedControl setEnabled:enabled forSegment:kRemoveSegment];
+    [segmentedControl setNeedsDisplay:YES]; // not every toolkit draws the segment anew by itself
+}
+
+- (void)doClean
+{
+    TsUIPersistentStore* settings = [[[TsUIPersistentStore alloc] init] autorelease];
+    ModrigUtils::StoreFrame([self window], settings, kSuiteWindowSetting);
+    ModrigUtils::StoreColumns(startupTableView, settings, kSuiteColumnSetting);
+}
+
+- (IBAction)onSegmentedButton:(id)sender
+{
+    switch (ModrigPlatform::TakeSegmentClick(sender))
+    {
+    case kAddSegment:
+        return [self onAdd];
+    case kRemoveSegment:
+        return [self onRemove];
+    default:
+        return;
+    }
+}
+
+// Wherever in the window the keyboard is: the table's keys, and the one for help.
+- (void)keyDown:(NSEvent*)event
+{
+    if ([[event charactersIgnoringModifiers] isEqual:ModrigUtils::HelpKey()])
+        return [self help:nil];
+    if (![(ModrigTableView*)startupTableView takeKey:event])
+        [super keyDown:event];
+}
+
+- (void)onAdd
+{
+    NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    TsOCOpenFileDialog* dialog = [[[TsOCOpenFileDialog alloc] init] autorelease];
+    CStdStr title;
+    title.Load(ModrigMessages::kStartupSuitePanelTitle);
+    [dialog setTitle:ModrigUtils::StringFromPath(title)];
+    [dialog setInitialPath:[[NSBundle mainBundle] bundlePath]];
+    [dialog setAllowsMultipleSelection:YES];
+    NSMutableArray* filters = [NSMutableArray array];
+    [TsOCModrigUtil populateModrigFileFilter:filters];
+    [dialog setFileFilters:filters];
+    if ([dialog runModal] == NSOKButton)
+        [self addFiles:[dialog selectedPathes]];
+    [pool drain];
+}
+
+- (void)onRemove
+{
+    NSArray* rows = [[[startupApps selectedObjects] copy] autorelease];
+    if ([rows count] == 0)
+        return;
+    [[TsOCModrigUtil getModrigController] clearMessage];
+    ModrigUtils::RemoveFromStartupSuite(ModrigUtils::PathsFromRows(rows),
+                                        ModrigUtils::RemovingRows(rows, startupApps));
+}
+
+- (NSInteger)numberOfRowsInTableView:(NSTableView*)table
+{
+    (void)table;
+    return static_cast<NSInteger>([[startupApps arrangedObjects] count]);
+}
+
+- (id)tableView:(NSTableView*)table objectValueForTableColumn:(NSTableColumn*)column row:(NSInteger)row
+{
+    (void)table;
+    return ModrigUtils::ValueInRow(startupApps, column, row);
+}
+
+- (BOOL)addToSuite:(ModrigFilePath*)file
+{
+    if ([[startupApps arrangedObjects] containsObject:file] ||
+        ModrigUtils::RefuseTemporaryInternetFile([file path]))
+        return NO;
+    [startupApps addObject:file];
+    gStartupList.AddTail([file path]);
+    return YES;
+}
+
+- (void)addFiles:(NSArray*)paths
+{
+    [[TsOCModrigUtil getModrigController] clearMessage];
+    if (ModrigUtils::RefuseTooManyFiles([paths count]))
+        return;
+    NSArray* files =
+        ModrigUtils::RowsFromPaths(ModrigUtils::FilesNewToStartupSuite(ModrigUtils::PathsFromStrings(paths)));
+    NSMutableArray* loaded = [NSMutableArray array];
+    [[TsOCModrigUtil getModrigController] loadApps:files successedApps:loaded addToStartupSuit:YES];
+    NSUInteger added = 0;
+    for (ModrigFilePath* file : tsuiEach<ModrigFilePath*>(loaded))
+        added += [self addToSuite:file];
+    if (added > 0)
+        [startupTableView scrollRowToVisible:[self numberOfRowsInTableView:startupTableView] - 1];
+}
+
+- (void)tableViewSelectionDidChange:(NSNotification*)notification
+{
+    if ([notification object] != startupTableView)
+        return;
+    ModrigPlatform::AdoptTableSelection(startupTableView, startupApps);
+    [self enableRemove:[[startupApps selectedObjects] count] > 0];
+}
+
+- (IBAction)help:(id)sender
+{
+    (void)sender;
+    ModrigUtils::OnCommandHelp(ModrigUtils::kStartupSuiteHelp);
+}
+
+@end

@@ -1,0 +1,37 @@
+// A table of the dialogs as a person expects one: keys, a menu on its rows, going to a row by its first
+// letters. What can be done with the rows is its owner's: its delegate.
+#pragma once
+
+#import <AppKit/AppKit.h>
+
+#include "modrig/dialogs/model/TableActions.h"
+
+namespace ModrigUtils
+{
+// The key that opens a help page, as buttons have it.
+NSString* HelpKey();
+} // namespace ModrigUtils
+
+@interface ModrigTableView : NSTableView
+
+// Makes a table of a window file one of these.
++ (void)adopt:(NSTableView*)table;
+
+// Does what the key stands for, and answers NO when it stands for nothing here. A key that cannot act beeps.
+- (BOOL)takeKey:(NSEvent*)event;
+
+// Makes the text of a row grey that is of no use: what the owner does before a cell is drawn.
+- (void)prepareCell:(id)cell row:(NSInteger)row;
+// What the tip of a row says: its whole path, and why it is grey.
+- (NSString*)tipForRow:(NSInteger)row;
+
+@end
+
+@interface NSObject (ModrigTableOwner)
+
+- (ModrigUtils::TableKind)kindOfTable:(NSTableView*)table;
+- (NSArrayController*)rowsOf:(NSTableView*)table;
+// Actions that are the owner's: all but copying, showing and selecting.
+- (void)perform:(ModrigUtils::TableAction)action inTable:(NSTableView*)table;
+
+@end

@@ -1,0 +1,335 @@
+#import "modrig/dialogs/ModrigTableView.h"
+
+#include <objc/runtime.h>
+#include <tesselui/tsuieach.h>
+
+#include <algorithm>
+#include <optional>
+
+#import "modrig/dialogs/ModrigFilePath.h"
+#import "modrig/dialogs/ModrigNameCell.h"
+#import "modrig/dialogs/TsOCModrigUtil.h"
+
+#include "modrig/dialogs/Paths.h"
+#include "modrig/dialogs/model/RowLook.h"
+#include "modrig/dialogs/model/ShownText.h"
+#include "modrig/dialogs/model/TypedLetters.h"
+#include "modrig/dialogs/platform/Desktop.h"
+#include "modrig/dialogs/platform/Platform.h"
+#include "modrig/types/ApplicationTypes.h"
+
+using ModrigUtils::TableAction;
+
+namespace
+{
+NSString* titleOf(TableAction action)
+{
+    switch (action)
+    {
+    case TableAction::kLoad:
+        return @"IDS_MODRIG_MENU_LOAD";
+    case TableAction::kUnload:
+        return @"IDS_MODRIG_MENU_UNLOAD";
+    case TableAction::kAdd:
+        return @"IDS_MODRIG_MENU_ADD";
+    case TableAction::kAddToStartupSuite:
+        return @"IDS_MODRIG_MENU_ADD_TO_STARTUP_SUITE";
+    case TableAction::kRemove:
+        return @"IDS_MODRIG_MENU_REMOVE";
+    case TableAction::kMoveUp:
+        return @"IDS_MODRIG_MENU_MOVE_UP";
+    case TableAction::kMoveDown:
+        return @"IDS_MODRIG_MENU_MOVE_DOWN";
+    case TableAction::kShowInFolder:
+        return @"IDS_MODRIG_MENU_SHOW_IN_FOLDER";
+    default:
+        return @"IDS_MODRIG_MENU_COPY_PATH";
+    }
+}
+
+ModrigUtils::TableKey keyOf(NSEvent* event)
+{
+    constexpr wchar_t kLastControlCharacter = 0x1A;
+    NSString* characters = [event charactersIgnoringModifiers];
+    ModrigUtils::TableKey key = {[characters length] == 1 ? wchar_t([characters characterAtIndex:0]) : L'\0',
+                                 ModrigPlatform::IsCommand(event),
+                                 ModrigPlatform::IsAlternate(event)};
+    // Some displays send Control-A as the first of the control characters.
+    if (key.command && key.character > 0 && key.character <= kLastControlCharacter)
+        key.character = static_cast<wchar_t>(key.character + L'a' - 1);
+    return key;
+}
+
+// One person types, in one table at a time.
+ModrigUtils::TypedLetters& typedLetters()
+{
+    static ModrigUtils::TypedLetters letters;
+    return letters;
+}
+
+bool isLetter(ModrigUtils::TableKey key, ModrigUtils::TypedLetters::Time now)
+{
+    constexpr wchar_t kFirstFunctionKey = 0xF700;
+    if (key.command || key.alternate || key.character >= kFirstFunctionKey || key.character == 0x7F)
+        return false;
+    return key.character > L' ' || (key.character == L' ' && typedLetters().IsTyping(now));
+}
+
+ModrigUtils::RowFacts factsOf(ModrigFilePath* row)
+{
+    ModrigUtils::RowFacts facts;
+    bool isFolder = false;
+    facts.exists = ModrigPlatform::FileExists([row filePathName], isFolder);
+    facts.unloadable = [row unloadable];
+    facts.isCompiledModule = ModrigUtils::FileTypeOfPath([row path]) == kCompiledModule;
+    return facts;
+}
+
+void copyToPasteboard(NSString* text)
+{
+    NSPasteboard* pasteboard = [NSPasteboard generalPasteboard];
+    [pasteboard declareTypes:[NSArray arrayWithObject:NSStringPboardType] owner:nil];
+    [pasteboard setString:text forType:NSStringPboardType];
+}
+} // namespace
+
+NSString* ModrigUtils::HelpKey()
+{
+    const unichar key = NSF1FunctionKey;
+    return [NSString stringWithCharacters:&key length:1];
+}
+
+@implementation ModrigTableView
+
+// The window file knows the toolkit's tables only. This class adds no variables of its own.
++ (void)adopt:(NSTableView*)table
+{
+    object_setClass(table, [ModrigTableView class]);
+    for (NSTableColumn* column : tsuiEach<NSTableColumn*>([table tableColumns]))
+        [ModrigNameCell adoptIn:column];
+    NSView* frame = [[table enclosingScrollView] contentView];
+    [frame setPostsFrameChangedNotifications:YES];
+    [[NSNotificationCenter defaultCenter] addObserver:table
+                                             selector:@selector(fillFrame:)
+                                                 name:NSViewFrameDidChangeNotification
+                                               object:frame];
+}
+
+- (void)dealloc
+{
+    [[NSNotificationCenter defaultCenter] removeObserver:self];
+    [super dealloc];
+}
+
+// To the edge of what shows of the table: the toolkit's own looks at the table, which may have grown already.
+- (void)sizeLastColumnToFit
+{
+    const NSInteger last = [self numberOfColumns] - 1;
+    if (last < 0 || ![self superview])
+        return;
+    NSTableColumn* column = [[self tableColumns] objectAtIndex:static_cast<NSUInteger>(last)];
+    const CGFloat more = NSWidth([[self superview] bounds]) - NSMaxX([self rectOfColumn:last]);
+    if (more != 0)
+        [column setWidth:std::max([column minWidth], [column width] + more)];
+}
+
+// At every size the columns take all the width that there is.
+- (void)fillFrame:(NSNotification*)notification
+{
+    (void)notification;
+    [self sizeLastColumnToFit];
+}
+
+- (ModrigFilePath*)fileInRow:(NSInteger)row
+{
+    NSArray* rows = [[(id)[self delegate] rowsOf:self] arrangedObjects];
+    if (row < 0 || static_cast<NSUInteger>(row) >= [rows count])
+        return nil;
+    return [rows objectAtIndex:static_cast<NSUInteger>(row)];
+}
+
+- (ModrigUtils::TableState)stateWith:(NSIndexSet*)rows
+{
+    NSIndexSet* selected = [self selectedRowIndexes];
+    const auto last = static_cast<NSUInteger>([self numberOfRows] - 1);
+    return {static_cast<std::size_t>([self numberOfRows]), [selected count], [rows count],
+            [selected containsIndex:0] != NO, [selected containsIndex:last] != NO};
+}
+
+- (void)copyPathsOf:(NSIndexSet*)rows
+{
+    NSMutableArray* paths = [NSMutableArray array];
+    for (NSUInteger row = [rows firstIndex]; row != NSNotFound; row = [rows indexGreaterThanIndex:row])
+        [paths addObject:[[self fileInRow:static_cast<NSInteger>(row)] filePathName]];
+    copyToPasteboard([paths componentsJoinedByString:@"\n"]);
+}
+
+// The toolkit selects none at all when one of them must not be selected.
+- (void)selectEveryRow
+{
+    NSMutableIndexSet* rows = [NSMutableIndexSet indexSet];
+    for (NSInteger row = 0; row < [self numberOfRows]; ++row)
+        if ([(id)[self delegate] tableView:self shouldSelectRow:row])
+            [rows addIndex:static_cast<NSUInteger>(row)];
+    [self selectRowIndexes:rows byExtendingSelection:NO];
+}
+
+- (void)perform:(TableAction)action on:(NSIndexSet*)rows
+{
+    if (!ModrigUtils::IsPossible(action, [self stateWith:rows]))
+        return NSBeep();
+    switch (action)
+    {
+    case TableAction::kSelectAll:
+        return [self selectEveryRow];
+    case TableAction::kCopyPath:
+        return [self copyPathsOf:rows];
+    case TableAction::kShowInFolder:
+        return ModrigPlatform::ShowInFolder(
+            [[self fileInRow:static_cast<NSInteger>([rows firstIndex])] filePathName]);
+    default:
+        return [(id)[self delegate] perform:action inTable:self];
+    }
+}
+
+- (void)goToRowBeginningWith:(const CStdStr&)letters
+{
+    const NSInteger selected = [self selectedRow];
+    const auto row = ModrigUtils::RowBeginningWith(
+        letters, static_cast<std::size_t>([self numberOfRows]),
+        selected < 0 ? std::nullopt : std::optional<std::size_t>(selected),
+        [self](std::size_t index)
+        { return ModrigUtils::PathFromString([[self fileInRow:static_cast<NSInteger>(index)] fileName]); });
+    if (!row)
+        return NSBeep();
+    [self selectRowIndexes:[NSIndexSet indexSetWithIndex:*row] byExtendingSelection:NO];
+    [self scrollRowToVisible:static_cast<NSInteger>(*row)];
+}
+
+- (BOOL)takeKey:(NSEvent*)event
+{
+    const TableAction action =
+        ModrigUtils::ActionForKey([(id)[self delegate] kindOfTable:self], keyOf(event));
+    if (action == TableAction::kNone)
+        return NO;
+    [self perform:action on:[self selectedRowIndexes]];
+    return YES;
+}
+
+- (void)keyDown:(NSEvent*)event
+{
+    const ModrigUtils::TableKey key = keyOf(event);
+    const auto now = std::chrono::steady_clock::now();
+    if ([self takeKey:event])
+        return;
+    if (isLetter(key, now))
+        [self goToRowBeginningWith:typedLetters().Add(key.character, now)];
+    else
+        [super keyDown:event];
+}
+
+- (void)mouseDown:(NSEvent*)event
+{
+    [super mouseDown:ModrigPlatform::ClickOnTable(event)];
+}
+
+- (void)performMenuItem:(NSMenuItem*)item
+{
+    [self perform:static_cast<TableAction>([item tag]) on:[item representedObject]];
+}
+
+- (BOOL)validateMenuItem:(NSMenuItem*)item
+{
+    return ModrigUtils::IsPossible(static_cast<TableAction>([item tag]),
+                                   [self stateWith:[item representedObject]]);
+}
+
+- (NSMenuItem*)menuItemFor:(TableAction)action rows:(NSIndexSet*)rows
+{
+    if (action == TableAction::kNone)
+        return (NSMenuItem*)[NSMenuItem separatorItem];
+    NSMenuItem* item = [[[NSMenuItem alloc] initWithTitle:[TsOCModrigUtil modrigLoadString:titleOf(action)]
+                                                   action:@selector(performMenuItem:)
+                                            keyEquivalent:@""] autorelease];
+    [item setTarget:self];
+    [item setTag:static_cast<NSInteger>(action)];
+    [item setRepresentedObject:rows];
+    return item;
+}
+
+// A row that can be selected is, by the click that opens its menu; the menu is then one for all selected
+// rows.
+- (NSIndexSet*)rowsPointedAt:(NSInteger)row
+{
+    if (row < 0)
+        return [NSIndexSet indexSet];
+    NSIndexSet* clicked = [NSIndexSet indexSetWithIndex:static_cast<NSUInteger>(row)];
+    if (![self isRowSelected:row] && [(id)[self delegate] tableView:self shouldSelectRow:row])
+        [self selectRowIndexes:clicked byExtendingSelection:NO];
+    return [self isRowSelected:row] ? [self selectedRowIndexes] : clicked;
+}
+
+- (NSMenu*)menuForEvent:(NSEvent*)event
+{
+    const NSPoint place = [self convertPoint:[event locationInWindow] fromView:nil];
+    NSIndexSet* rows = [self rowsPointedAt:[self rowAtPoint:place]];
+    NSMenu* menu = [[[NSMenu alloc] initWithTitle:@""] autorelease];
+    for (const TableAction action : ModrigUtils::MenuOf([(id)[self delegate] kindOfTable:self]))
+        [menu addItem:[self menuItemFor:action rows:rows]];
+    return menu;
+}
+
+- (ModrigUtils::RowState)stateOfFile:(ModrigFilePath*)file
+{
+    return ModrigUtils::StateOf([(id)[self delegate] kindOfTable:self], factsOf(file));
+}
+
+- (void)prepareCell:(id)cell row:(NSInteger)row
+{
+    ModrigFilePath* file = [self fileInRow:row];
+    if (!file)
+        return;
+    const bool isGrey = [self stateOfFile:file] != ModrigUtils::RowState::kUsable;
+    [cell setTextColor:isGrey ? [NSColor disabledControlTextColor] : [NSColor controlTextColor]];
+}
+
+// One tip for each row that shows. This is called whenever others do.
+- (void)resetCursorRects
+{
+    [super resetCursorRects];
+    if (ModrigPlatform::TablesShowTips())
+        return;
+    [self removeAllToolTips];
+    const NSRange shown = [self rowsInRect:[self visibleRect]];
+    for (NSUInteger row = shown.location; row < NSMaxRange(shown); ++row)
+        [self addToolTipRect:[self rectOfRow:static_cast<NSInteger>(row)] owner:self userData:nullptr];
+}
+
+- (void)reloadData
+{
+    [super reloadData];
+    [[self window] invalidateCursorRectsForView:self];
+}
+
+- (NSString*)view:(NSView*)view stringForToolTip:(NSToolTipTag)tag point:(NSPoint)place userData:(void*)data
+{
+    (void)view;
+    (void)tag;
+    (void)data;
+    return [self tipForRow:[self rowAtPoint:place]];
+}
+
+- (NSString*)tipForRow:(NSInteger)row
+{
+    ModrigFilePath* file = [self fileInRow:row];
+    if (!file)
+        return nil;
+    NSString* path = ModrigUtils::StringFromPath(ModrigUtils::ShownText([file path]));
+    const char* reason = ModrigUtils::ReasonKey([self stateOfFile:file]);
+    if (!reason)
+        return path;
+    NSString* why = [TsOCModrigUtil modrigLoadString:[NSString stringWithUTF8String:reason]];
+    return [NSString stringWithFormat:@"%@\n%@", path, why];
+}
+
+@end

@@ -1,0 +1,31 @@
+// Paths and rows between the dialogs and the module's logic.
+#pragma once
+
+#import <AppKit/AppKit.h>
+
+#include <functional>
+#include <vector>
+
+#include "modrig/base/CStdStr.h"
+#include "modrig/base/CStringList.h"
+
+namespace ModrigUtils
+{
+// Of strings.
+std::vector<CStdStr> PathsFromStrings(NSArray* strings);
+// Of `ModrigFilePath` rows.
+std::vector<CStdStr> PathsFromRows(NSArray* rows);
+
+// New rows for the paths, links not resolved before their names are taken.
+NSArray* RowsFromPaths(const std::vector<CStdStr>& paths);
+
+// Removes the row of an index from the table. Neither array may go before the function does.
+std::function<void(std::size_t index)> RemovingRows(NSArray* rows, NSArrayController* table);
+
+// What a column shows of a row; nil for a row that is not there.
+id ValueInRow(NSArrayController* rows, NSTableColumn* column, NSInteger row);
+
+CStdStr PathFromString(NSString* text);
+NSString* StringFromPath(const CStdStr& path);
+NSArray* StringsFromList(const CStringList& list);
+} // namespace ModrigUtils

@@ -1,0 +1,106 @@
+#import "modrig/dialogs/TsOCModrigUtil.h"
+
+#import <tesselui/TsOCFileFilter.h>
+#include <tesselui/tsuieach.h>
+#include <wincompat/winfile.h>
+#include <wincompat/winstring.h>
+
+#import "modrig/dialogs/ModrigController.h"
+#import "modrig/dialogs/ModrigFilePath.h"
+
+#include "modrig/types/FileValidation.h"
+
+namespace
+{
+ModrigController* gModrigController = nil;
+
+// Each has a description under the key, and extensions under the key followed by "_EXT".
+NSString* const kFilterKeys[] = {@"IDS_MODRIG_TESSEL_APPS", @"IDS_MODRIG_QMB_APPS", @"IDS_MODRIG_ZMB_APPS",
+                                 @"IDS_MODRIG_LSP_APPS",    @"IDS_MODRIG_OMP_APPS", @"IDS_MODRIG_QBC_APPS"};
+
+CStdStr wide(NSString* text)
+{
+    return CStdStr(NSStringToWstring(text));
+}
+} // namespace
+
+@implementation TsOCModrigUtil
+
++ (void)setModrigController:(ModrigController*)controller
+{
+    [controller retain];
+    [gModrigController release];
+    gModrigController = controller;
+}
+
++ (ModrigController*)getModrigController
+{
+    return gModrigController;
+}
+
++ (void)addPathName:(NSString*)path toArrayController:(NSArrayController*)controller
+{
+    [self addPathNames:[NSArray arrayWithObject:path] toArrayController:controller];
+}
+
++ (void)addPathNames:(NSArray*)paths toArrayController:(NSArrayController*)controller
+{
+    NSMutableSet* known = [NSMutableSet setWithArray:[controller arrangedObjects]];
+    NSMutableArray* rows = [NSMutableArray array];
+    for (NSString* path : tsuiEach<NSString*>(paths))
+    {
+        ModrigFilePath* row =
+            [[ModrigFilePath alloc] initWithResolvedPath:[path stringByResolvingSymlinksInPath]];
+        const NSUInteger before = [known count];
+        [known addObject:row];
+        if ([known count] > before)
+            [rows addObject:row];
+        [row release];
+    }
+    if ([rows count])
+        [controller addObjects:rows];
+}
+
++ (void)fill:(NSArrayController*)controller withPathNames:(NSArray*)paths
+{
+    [controller setSelectsInsertedObjects:NO];
+    [self addPathNames:paths toArrayController:controller];
+    [controller setSelectsInsertedObjects:YES];
+}
+
++ (NSString*)modrigLoadString:(NSString*)key
+{
+    NSBundle* bundle = [NSBundle bundleForClass:[TsOCModrigUtil class]];
+    return [bundle localizedStringForKey:key value:@"" table:nil];
+}
+
++ (void)populateModrigFileFilter:(NSMutableArray*)filters
+{
+    for (NSString* key : kFilterKeys)
+    {
+        NSString* description = [self modrigLoadString:key];
+        NSString* extensions = [self modrigLoadString:[key stringByAppendingString:@"_EXT"]];
+        [filters addObject:[[[TsOCFileFilter alloc] initWithDescription:description
+                                                           extensionStr:extensions] autorelease]];
+    }
+}
+
++ (BOOL)isValidFileForModrig:(NSString*)path
+{
+    return ModrigUtils::IsValidFileForModrig(wide(path));
+}
+
++ (NSString*)validateFileExists:(NSString*)path
+{
+    CStdStr found = wide(path);
+    if (ModrigUtils::ValidateFileExists(found) == INVALID_FILE_ATTRIBUTES)
+        return nil;
+    return wcharToNSString(found.c_str());
+}
+
++ (BOOL)isTempInternetFile:(NSString*)path
+{
+    return ModrigUtils::IsTempInternetFile(wide(path));
+}
+
+@end

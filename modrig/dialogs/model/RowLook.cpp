@@ -1,0 +1,54 @@
+#include "modrig/dialogs/model/RowLook.h"
+
+#include <string>
+
+namespace ModrigUtils
+{
+namespace
+{
+constexpr wchar_t kEllipsis = 0x2026;
+
+CStdStr Beginning(const CStdStr& text, std::size_t length)
+{
+    return CStdStr(text.Text().substr(0, length) + kEllipsis);
+}
+} // namespace
+
+RowState StateOf(TableKind kind, const RowFacts& facts)
+{
+    if (kind != TableKind::kLoadedApplications)
+        return facts.exists ? RowState::kUsable : RowState::kMissing;
+    if (facts.unloadable)
+        return RowState::kUsable;
+    return facts.isCompiledModule ? RowState::kLocked : RowState::kNeverUnloaded;
+}
+
+const char* ReasonKey(RowState state)
+{
+    switch (state)
+    {
+    case RowState::kMissing:
+        return "IDS_MODRIG_ROW_MISSING";
+    case RowState::kLocked:
+        return "IDS_MODRIG_ROW_LOCKED";
+    case RowState::kNeverUnloaded:
+        return "IDS_MODRIG_ROW_NEVER_UNLOADED";
+    default:
+        return nullptr;
+    }
+}
+
+CStdStr Shortened(const CStdStr& text, const std::function<bool(const CStdStr&)>& fits)
+{
+    if (fits(text))
+        return text;
+    std::size_t fitting = 0;
+    std::size_t tooLong = text.Text().size();
+    while (tooLong - fitting > 1)
+    {
+        const std::size_t middle = fitting + (tooLong - fitting) / 2;
+        (fits(Beginning(text, middle)) ? fitting : tooLong) = middle;
+    }
+    return Beginning(text, fitting);
+}
+} // namespace ModrigUtils

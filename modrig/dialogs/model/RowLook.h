@@ -1,0 +1,35 @@
+// How a row of a table looks, and what its tip says.
+#pragma once
+
+#include <functional>
+
+#include "modrig/base/CStdStr.h"
+#include "modrig/dialogs/model/TableActions.h"
+
+namespace ModrigUtils
+{
+enum class RowState
+{
+    kUsable,
+    kMissing,      // there is no such file
+    kLocked,       // a module that may not be unloaded
+    kNeverUnloaded // an application of a kind that cannot be unloaded
+};
+
+struct RowFacts
+{
+    bool exists = false;
+    bool unloadable = false;
+    bool isCompiledModule = false;
+};
+
+// All but usable rows are shown in grey.
+RowState StateOf(TableKind kind, const RowFacts& facts);
+
+// The key of the text that says why a row is grey; null for one that is not.
+const char* ReasonKey(RowState state);
+
+// The text itself when it fits, or as much of its beginning as fits with an ellipsis after it. `fits` answers
+// whether a text does; a shorter one does when a longer one does.
+CStdStr Shortened(const CStdStr& text, const std::function<bool(const CStdStr&)>& fits);
+} // namespace ModrigUtils

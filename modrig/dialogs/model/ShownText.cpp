@@ -1,0 +1,45 @@
+#include "modrig/dialogs/model/ShownText.h"
+
+#include <algorithm>
+#include <string>
+
+namespace ModrigUtils
+{
+namespace
+{
+constexpr wchar_t kFirstVisible = L' ';
+constexpr wchar_t kDelete = 0x7F;
+
+bool IsVisible(wchar_t character)
+{
+    return character >= kFirstVisible && character != kDelete;
+}
+
+std::wstring EscapeFor(wchar_t character)
+{
+    constexpr wchar_t kDigits[] = L"0123456789ABCDEF";
+    switch (character)
+    {
+    case L'\n':
+        return L"\\n";
+    case L'\r':
+        return L"\\r";
+    case L'\t':
+        return L"\\t";
+    default:
+        return {L'\\', L'x', kDigits[character >> 4], kDigits[character & 0xF]};
+    }
+}
+} // namespace
+
+CStdStr ShownText(const CStdStr& text)
+{
+    const std::wstring& all = text.Text();
+    if (std::all_of(all.begin(), all.end(), IsVisible))
+        return text;
+    std::wstring shown;
+    for (const wchar_t character : all)
+        shown += IsVisible(character) ? std::wstring(1, character) : EscapeFor(character);
+    return CStdStr(shown);
+}
+} // namespace ModrigUtils

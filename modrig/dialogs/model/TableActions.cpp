@@ -1,0 +1,96 @@
+#include "modrig/dialogs/model/TableActions.h"
+
+namespace ModrigUtils
+{
+namespace
+{
+bool IsDelete(wchar_t character)
+{
+    return character == kForwardDeleteKey || character == kDeleteKey || character == kBackspaceKey;
+}
+
+TableAction CommandFor(wchar_t character)
+{
+    switch (character)
+    {
+    case L'a':
+        return TableAction::kSelectAll;
+    case L'c':
+        return TableAction::kCopyPath;
+    default:
+        return TableAction::kNone;
+    }
+}
+
+TableAction MoveFor(wchar_t character)
+{
+    if (character == kUpKey)
+        return TableAction::kMoveUp;
+    return character == kDownKey ? TableAction::kMoveDown : TableAction::kNone;
+}
+} // namespace
+
+std::vector<TableAction> MenuOf(TableKind kind)
+{
+    std::vector<TableAction> menu;
+    switch (kind)
+    {
+    case TableKind::kLoadedApplications:
+        menu = {TableAction::kUnload};
+        break;
+    case TableKind::kHistory:
+        menu = {TableAction::kLoad, TableAction::kAddToStartupSuite, TableAction::kRemove};
+        break;
+    case TableKind::kStartupSuite:
+        menu = {TableAction::kMoveUp, TableAction::kMoveDown, TableAction::kNone, TableAction::kAdd,
+                TableAction::kRemove};
+        break;
+    }
+    menu.insert(menu.end(), {TableAction::kNone, TableAction::kCopyPath, TableAction::kShowInFolder});
+    return menu;
+}
+
+TableAction ActionForKey(TableKind kind, TableKey key)
+{
+    const bool isSuite = kind == TableKind::kStartupSuite;
+    if (key.command)
+        return CommandFor(key.character);
+    if (key.alternate)
+        return isSuite ? MoveFor(key.character) : TableAction::kNone;
+    if (IsDelete(key.character) && kind != TableKind::kLoadedApplications)
+        return TableAction::kRemove;
+    return key.character == kInsertKey && isSuite ? TableAction::kAdd : TableAction::kNone;
+}
+
+bool IsPossible(TableAction action, const TableState& state)
+{
+    switch (action)
+    {
+    case TableAction::kNone:
+        return false;
+    case TableAction::kAdd:
+        return true;
+    case TableAction::kSelectAll:
+        return state.rows > 0;
+    case TableAction::kCopyPath:
+    case TableAction::kShowInFolder:
+        return state.pointedAt > 0;
+    case TableAction::kMoveUp:
+        return state.selected > 0 && !state.firstIsSelected;
+    case TableAction::kMoveDown:
+        return state.selected > 0 && !state.lastIsSelected;
+    default:
+        return state.selected > 0;
+    }
+}
+
+std::vector<RowMove> MovesOf(const std::vector<std::size_t>& selected, std::size_t rows, bool up)
+{
+    std::vector<RowMove> moves;
+    if (selected.empty() || (up ? selected.front() == 0 : selected.back() + 1 == rows))
+        return moves;
+    for (const std::size_t row : selected)
+        moves.insert(up ? moves.end() : moves.begin(), {row, up ? row - 1 : row + 1});
+    return moves;
+}
+} // namespace ModrigUtils

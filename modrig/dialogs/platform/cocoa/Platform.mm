@@ -1,0 +1,76 @@
+#include <CoreServices/CoreServices.h>
+
+#import "modrig/dialogs/NSSavePanel+ModrigRuntime.h"
+
+#include "modrig/dialogs/platform/Platform.h"
+
+@implementation NSSavePanel (ModrigRuntime)
+
+- (NSButton*)okButton
+{
+    return [self valueForKey:@"_okButton"];
+}
+
+- (NSButton*)cancelButton
+{
+    return [self valueForKey:@"_cancelButton"];
+}
+
+- (NSButton*)hideExtensionButton
+{
+    return [self valueForKey:@"_hideExtensionButton"];
+}
+
+@end
+
+namespace ModrigPlatform
+{
+// The panel sizes the frame around the view, which has to hand its size on.
+void FitAccessoryView(NSView* view)
+{
+    [view setAutoresizingMask:[view autoresizingMask] | NSViewWidthSizable];
+    NSView* frame = [view superview];
+    [frame setAutoresizesSubviews:YES];
+    [view setFrameOrigin:NSZeroPoint];
+    [frame resizeSubviewsWithOldSize:[view frame].size];
+}
+
+// The platform follows what shows.
+void UpdateKeyViews(NSWindow*)
+{
+}
+
+bool FileExists(NSString* path, bool& isFolder)
+{
+    FSRef reference;
+    Boolean folder = false;
+    const auto text = reinterpret_cast<const UInt8*>([path UTF8String]);
+    if (FSPathMakeRef(text, &reference, &folder) != noErr)
+        return false;
+    isFolder = folder;
+    return true;
+}
+
+bool IsFilePackage(NSString* path)
+{
+    return [[NSWorkspace sharedWorkspace] isFilePackageAtPath:path];
+}
+
+// The bindings do.
+void ShowRows(NSTableView*, NSArrayController*)
+{
+}
+
+void AdoptTableSelection(NSTableView*, NSArrayController*)
+{
+}
+
+void CompleteSegments(NSSegmentedControl*)
+{
+}
+
+NSInteger TakeSegmentClick(NSSegmentedControl* segments)
+{
+    return [segments selectedSegment];
+}
+} // namespace ModrigPlatform

@@ -1,0 +1,21 @@
+// What the module owns for its whole lifetime. Main thread only.
+//
+// All of it is defined in Globals.cpp, in the order of construction: the application types table, then the
+// three lists. Everything exists before the host first calls the entry point.
+#pragma once
+
+#include "modrig/base/CStringList.h"
+
+extern CStringList gLoadedAppList; // applications believed loaded
+extern CStringList gStartupList;   // the Startup Suite
+extern CStringList gHistoryList;   // files loaded before
+
+// The host's Lisp development environment has been loaded. The module only clears and reads it; other code of
+// the process sets it through the exported symbol.
+extern "C" TESSEL_EXPORT bool gbOrreryLoaded;
+
+// The resource module, as the last load message found it; stale once it has been released.
+extern HMODULE hModrigRes;
+
+// Ends the description of the module in the host's record of applications.
+extern const wchar_t* const kpszCmdModule;

@@ -1,0 +1,40 @@
+#include "modrig/lists/ListMembership.h"
+
+#include "modrig/base/SplitPath.h"
+#include "modrig/lists/Globals.h"
+
+namespace ModrigUtils
+{
+bool FoundinSpecificList(const CStdStr& path, const CStringList& list)
+{
+    return list.HoldsApplication(path);
+}
+
+bool FoundinStartupList(const CStdStr& path)
+{
+    return FoundinSpecificList(path, gStartupList);
+}
+
+bool FoundinHistoryList(const CStdStr& path)
+{
+    return FoundinSpecificList(path, gHistoryList);
+}
+
+bool FoundinLoadedList(const CStdStr& path)
+{
+    return FoundinSpecificList(path, gLoadedAppList);
+}
+
+bool IsALispAppFoundinList(const CStdStr& path)
+{
+    const SplitPath split(path);
+    const bool lisp =
+        split.HasExtension(L".lsp") || split.HasExtension(L".rpk") || split.HasExtension(L".qbc");
+    return lisp && FoundinSpecificList(path, gLoadedAppList);
+}
+
+void RemoveInSpecificList(const CStdStr& path, CStringList& list)
+{
+    list.RemoveFirstNoCase(path);
+}
+} // namespace ModrigUtils

@@ -1,0 +1,31 @@
+// A list as it stands in the registry: a sub-key of the module key with the count of entries and one numbered
+// value per entry, from 1.
+#pragma once
+
+#include <functional>
+
+#include "modrig/base/CStringList.h"
+
+namespace ModrigUtils
+{
+// Where and under which names a list is stored.
+struct StoredListNames
+{
+    const wchar_t* subKey;      // "History"
+    const wchar_t* count;       // "NumHistory"
+    const wchar_t* entryFormat; // "%dHistory"
+};
+
+inline constexpr StoredListNames kStoredHistory = {L"History", L"NumHistory", L"%dHistory"};
+inline constexpr StoredListNames kStoredStartupSuite = {L"Startup", L"NumStartup", L"%dStartup"};
+
+// Replaces the list with what is stored. Duplicates are skipped. The list ends at the first gap in the
+// numbering; an entry that can be read only at a later attempt costs an entry at the end. `appended` is
+// called after every entry that has joined the list.
+void ReadStoredList(const StoredListNames& names, CStringList& list,
+                    const std::function<void(const CStdStr& path)>& appended);
+
+// Replaces what is stored with the list. A failure is told in a message box; the store may then hold a part
+// of the list, unless the host undoes it.
+void WriteStoredList(const StoredListNames& names, const CStringList& list);
+} // namespace ModrigUtils

@@ -1,0 +1,126 @@
+#include "modrig/types/FileFilters.h"
+
+#include <tessel/tshostservices.h>
+
+#include <algorithm>
+#include <iterator>
+#include <vector>
+
+#include "modrig/messages/MessageIds.h"
+#include "modrig/messages/Messages.h"
+#include "modrig/profile/ProfileRegistry.h"
+#include "modrig/types/ApplicationTypes.h"
+
+namespace ModrigUtils
+{
+namespace
+{
+constexpr const wchar_t* kStoredChoice = L"FileFilter";
+constexpr int kHostRelease = 21;
+
+struct FilterEntry
+{
+    CStdStr description;
+    CStdStr patterns; // separated by ";"
+};
+
+CStdStr AllApplicationsFilter()
+{
+    const TsDbHostApplicationServices* services = tsdbHostApplicationServices();
+    CStdStr text;
+    text.Format(ModrigMessages::kAllApplicationsFilter, kHostRelease, services ? services->product() : L"");
+    return text;
+}
+
+std::vector<CStdStr> FilterTexts()
+{
+    using namespace ModrigMessages;
+    std::vector<CStdStr> texts = {AllApplicationsFilter()};
+    for (const unsigned id : {kBundleFilter, kCoreModuleFilter, kLispSourceFilter, kObjectModuleFilter,
+                              kCompiledLispFilter, kPackagedLispFilter, kMacroProjectFilter})
+    {
+        CStdStr text;
+        text.Load(id);
+        texts.push_back(text);
+    }
+    return texts;
+}
+
+bool IsKnownPattern(std::wstring_view pattern)
+{
+    constexpr std::wstring_view kAnyName = L"*.";
+    if (pattern.starts_with(kAnyName))
+        pattern.remove_prefix(kAnyName.size());
+    return FindExtension(CStdStr(pattern)) != nullptr;
+}
+
+CStdStr KnownPatterns(std::wstring_view patterns)
+{
+    std::wstring known;
+    while (!patterns.empty())
+    {
+        const std::size_t end = std::min(patterns.find(L';'), patterns.size());
+        const std::wstring_view pattern = patterns.substr(0, end);
+        patterns.remove_prefix(std::min(end + 1, patterns.size()));
+        if (!IsKnownPattern(pattern))
+            continue;
+        if (!known.empty())
+            known += L';';
+        known += pattern;
+    }
+    return CStdStr(known);
+}
+
+FilterEntry ParseEntry(const CStdStr& text)
+{
+    const std::wstring& whole = text.Text();
+    const std::size_t bar = std::min(whole.find(L'|'), whole.size());
+    return {text.Left(bar), KnownPatterns(text.Mid(bar + 1).Text())};
+}
+
+std::vector<FilterEntry> FilterEntries()
+{
+    std::vector<FilterEntry> entries;
+    for (const CStdStr& text : FilterTexts())
+        if (!text.IsEmpty())
+            entries.push_back(ParseEntry(text));
+    return entries;
+}
+
+// Nothing chosen is no choice, not even of an entry that describes nothing.
+bool IsChosen(const FilterEntry& entry, const CStdStr& choice)
+{
+    return !choice.IsEmpty() && entry.description.EqualsNoCase(choice);
+}
+} // namespace
+
+CStdStr GetRegFileFilterListIndex()
+{
+    CStdStr choice;
+    // Nothing remembered and nothing readable are the same to the caller: no choice.
+    static_cast<void>(
+        ReadModrigRegString(HKEY_CURRENT_USER, GetModrigProfileRegKey(), kStoredChoice, choice));
+    return choice;
+}
+
+bool SetRegFileFilterListIndex(const CStdStr& filter)
+{
+    if (WriteModrigRegString(HKEY_CURRENT_USER, GetModrigProfileRegKey(), kStoredChoice, filter))
+        return true;
+    ModrigAfxMessageBox(ModrigMessages::kFilterNotStored, CStdStr());
+    return false;
+}
+
+void ReAdjustFilterString(CStdStr& filter)
+{
+    const CStdStr choice = GetRegFileFilterListIndex();
+    std::vector<FilterEntry> entries = FilterEntries();
+    const auto chosen = std::find_if(entries.begin(), entries.end(),
+                                     [&choice](const FilterEntry& entry) { return IsChosen(entry, choice); });
+    if (chosen != entries.end())
+        std::rotate(entries.begin(), chosen, std::next(chosen));
+    filter = CStdStr();
+    for (const FilterEntry& entry : entries)
+        filter += entry.description + CStdStr(L"|") + entry.patterns + CStdStr(L"|");
+}
+} // namespace ModrigUtils

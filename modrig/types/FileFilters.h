@@ -1,0 +1,19 @@
+// The file-type filters of the file dialogs: the remembered choice, and the classic filter string.
+#pragma once
+
+#include "modrig/base/CStdStr.h"
+
+namespace ModrigUtils
+{
+// The description of the filter last chosen, or an empty text.
+CStdStr GetRegFileFilterListIndex();
+
+// Remembers the description of the chosen filter. A failure is told in message box 24.
+bool SetRegFileFilterListIndex(const CStdStr& filter);
+
+// Replaces the string with the module's own filters, "description|*.a;*.b|" one after the other, every entry
+// followed by a "|", the last one too. The remembered choice comes first. Only extensions of the application
+// types table remain; an entry left without any keeps its place and its description, so that whoever counts
+// the entries finds the one that was meant.
+void ReAdjustFilterString(CStdStr& filter);
+} // namespace ModrigUtils

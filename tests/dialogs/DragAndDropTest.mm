@@ -1,0 +1,326 @@
+#include "tests/dialogs/support/DialogTest.h"
+
+#import "modrig/dialogs/ModrigStartupSuitController.h"
+#import "modrig/dialogs/ModrigStartupSuiteBox.h"
+#import "modrig/dialogs/TsOCModrigUtil.h"
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+namespace
+{
+class Dropping : public OpenDialogTest
+{
+protected:
+    NSDragOperation hover(NSTableView* table, NSArray* files, NSTableViewDropOperation operation)
+    {
+        return [mController tableView:table
+                         validateDrop:dragOf(files)
+                          proposedRow:0
+                proposedDropOperation:operation];
+    }
+    NSDragOperation hover(NSArray* files, NSTableViewDropOperation operation)
+    {
+        return hover(loadedTable(), files, operation);
+    }
+    BOOL drop(NSTableView* table, NSArray* files, NSInteger row)
+    {
+        return [mController tableView:table
+                           acceptDrop:dragOf(files)
+                                  row:row
+                        dropOperation:NSTableViewDropAbove];
+    }
+    NSArray* manyFiles(int count)
+    {
+        NSMutableArray* files = [NSMutableArray array];
+        for (int index = 0; index < count; ++index)
+            [files addObject:path("tool" + std::to_string(index) + ".zmb")];
+        return files;
+    }
+    ModrigStartupSuiteBox* box() { return [mController valueForKey:@"startupSuiteBox"]; }
+};
+} // namespace
+
+TEST_F(Dropping, OffersToCopyBetweenRowsWhenOneFileCanBeLoaded)
+{
+    open();
+    EXPECT_EQ(NSDragOperationCopy, hover(paths({"a.txt", "b.lsp"}), NSTableViewDropAbove));
+    EXPECT_EQ(NSDragOperationNone, hover(paths({"a.txt", "b.txt"}), NSTableViewDropAbove));
+    EXPECT_EQ(NSDragOperationNone, hover([NSArray array], NSTableViewDropAbove));
+    EXPECT_EQ(NSDragOperationNone, hover(nil, NSTableViewDropAbove));
+}
+
+TEST_F(Dropping, IsOfferedByWhicheverTableAsks)
+{
+    open();
+    NSTableView* other = [[[NSTableView alloc] init] autorelease];
+    NSTableView* const tables[] = {loadedTable(), historyTable(), other};
+    for (NSTableView* table : tables)
+        EXPECT_EQ(NSDragOperationCopy, hover(table, paths({"b.lsp"}), NSTableViewDropAbove));
+}
+
+TEST_F(Dropping, ShowsNoBoxWhileFilesWithoutAnExtensionHover)
+{
+    open();
+    std::filesystem::create_directory(mFolder / "folder");
+    NSArray* files = paths({"folder", "README", "ends."});
+    for (int move = 0; move < 3; ++move)
+    {
+        EXPECT_EQ(NSDragOperationNone, hover(files, NSTableViewDropAbove));
+        EXPECT_EQ(NSDragOperationNone, [box() draggingEntered:dragOf(files)]);
+    }
+    EXPECT_EQ(NSDragOperationCopy, hover(paths({"README", "one.zmb"}), NSTableViewDropAbove));
+    EXPECT_THAT(boxes(), IsEmpty());
+}
+
+TEST_F(Dropping, TellsOfAFileWithoutAnExtensionOnceItIsDropped)
+{
+    open();
+    drop(loadedTable(), paths({"README", "one.zmb"}), 0);
+    EXPECT_THAT(boxes(), ElementsAre(Message(2, file("README"))));
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb")));
+}
+
+TEST_F(Dropping, ScrollsToNoRow)
+{
+    for (int index = 0; index < 60; ++index)
+        gLoadedAppList.AddTail(file("tool" + std::to_string(index) + ".lsp"));
+    open();
+    drop(loadedTable(), paths({"one.zmb"}), 60);
+    EXPECT_EQ(file("one.zmb"), rowsOf(loadedApps()).back());
+    EXPECT_TRUE(NSLocationInRange(0, [loadedTable() rowsInRect:[loadedTable() visibleRect]]));
+}
+
+TEST_F(Dropping, IsRefusedOnARow)
+{
+    open();
+    EXPECT_EQ(NSDragOperationNone, hover(paths({"b.lsp"}), NSTableViewDropOn));
+}
+
+TEST_F(Dropping, IsTakenBelowTheRowsAsAtTheEnd)
+{
+    for (const char* name : {"m0.zmb", "m1.zmb"})
+        gLoadedAppList.AddTail(loadedModule(name));
+    open();
+    const auto below = [this](NSTableView* table, NSArray* files)
+    {
+        return [mController tableView:table
+                         validateDrop:dragOf(files)
+                          proposedRow:-1
+                proposedDropOperation:NSTableViewDropOn];
+    };
+    EXPECT_EQ(NSDragOperationCopy, below(loadedTable(), paths({"b.lsp"})));
+    EXPECT_EQ(NSDragOperationNone, below(loadedTable(), paths({"b.txt"})));
+    EXPECT_EQ(NSDragOperationNone, below(historyTable(), paths({"b.lsp"})));
+    drop(loadedTable(), paths({"b.lsp"}), 2);
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("m0.zmb"), file("m1.zmb"), file("b.lsp")));
+}
+
+TEST_F(Dropping, IsSignedByTheStartupSuiteBoxAsLongAsItWouldBeTaken)
+{
+    open();
+    const NSUInteger parts = [[[box() superview] subviews] count];
+    const auto signs = [&] { return [[[box() superview] subviews] count] - parts; };
+    [box() draggingEntered:dragOf(paths({"a.txt"}))];
+    EXPECT_EQ(0u, signs());
+    [box() draggingEntered:dragOf(paths({"b.lsp"}))];
+    [box() draggingEntered:dragOf(paths({"b.lsp"}))];
+    EXPECT_EQ(1u, signs());
+    [box() draggingExited:dragOf(paths({"b.lsp"}))];
+    EXPECT_EQ(0u, signs());
+    [box() draggingEntered:dragOf(paths({"b.lsp"}))];
+    [box() performDragOperation:dragOf(paths({"b.lsp"}))];
+    EXPECT_EQ(0u, signs());
+}
+
+TEST_F(Dropping, IsOfferedByTheStartupSuiteBoxForOneFileThatCanBeLoaded)
+{
+    open();
+    EXPECT_EQ(NSDragOperationCopy, [box() draggingEntered:dragOf(paths({"a.txt", "b.lsp"}))]);
+    EXPECT_EQ(NSDragOperationNone, [box() draggingEntered:dragOf(paths({"a.txt"}))]);
+}
+
+TEST_F(Dropping, InsertsFilesAtTheRowTheLastOneOnTop)
+{
+    for (const char* name : {"m0.zmb", "m1.zmb", "m2.zmb", "m3.zmb", "m4.zmb"})
+        gLoadedAppList.AddTail(loadedModule(name));
+    open();
+    EXPECT_FALSE(drop(loadedTable(), paths({"one.zmb", "two.zmb"}), 3));
+    EXPECT_THAT(rowsOf(loadedApps()),
+                ElementsAre(file("m0.zmb"), file("m1.zmb"), file("m2.zmb"), file("two.zmb"), file("one.zmb"),
+                            file("m3.zmb"), file("m4.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2")));
+    EXPECT_TRUE(gStartupList.IsEmpty());
+}
+
+TEST_F(Dropping, InsertsIntoAShorterHistoryAtItsEnd)
+{
+    for (const char* name : {"m0.zmb", "m1.zmb", "m2.zmb"})
+        gLoadedAppList.AddTail(loadedModule(name));
+    gHistoryList.AddTail(file("old.zmb"));
+    open();
+    [mController setSaveHistory:YES];
+    drop(loadedTable(), paths({"one.zmb", "two.zmb"}), 2);
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("m0.zmb"), file("m1.zmb"), file("two.zmb"),
+                                                  file("one.zmb"), file("m2.zmb")));
+    EXPECT_THAT(rowsOf(historyList()), ElementsAre(file("old.zmb"), file("one.zmb"), file("two.zmb")));
+}
+
+TEST_F(Dropping, AppendsAgainAfterwards)
+{
+    gLoadedAppList.AddTail(loadedModule("m0.zmb"));
+    open();
+    drop(loadedTable(), paths({"one.zmb"}), 0);
+    selectFiles({"two.zmb"});
+    [mController onLoad:nil];
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb"), file("m0.zmb"), file("two.zmb")));
+}
+
+TEST_F(Dropping, IgnoresFilesOnTheHistoryTable)
+{
+    open();
+    EXPECT_FALSE(drop(historyTable(), paths({"one.zmb"}), 0));
+    EXPECT_THAT(rowsOf(loadedApps()), IsEmpty());
+    EXPECT_THAT(rowsOf(historyList()), IsEmpty());
+    EXPECT_THAT(lines(), IsEmpty());
+    EXPECT_FALSE(host().linker.isLoaded(file("one.zmb")));
+}
+
+TEST_F(Dropping, IgnoresFilesOnAnyOtherTable)
+{
+    open();
+    EXPECT_FALSE(drop([[[NSTableView alloc] init] autorelease], paths({"one.zmb"}), 0));
+    EXPECT_FALSE(host().linker.isLoaded(file("one.zmb")));
+}
+
+TEST_F(Dropping, OnTheHistoryTableEndsInsertingAtARowAndOnAnyOtherDoesNot)
+{
+    open();
+    [mController setValue:[NSNumber numberWithInt:3] forKey:@"mInsertRow"];
+    drop([[[NSTableView alloc] init] autorelease], paths({"one.zmb"}), 0);
+    EXPECT_EQ(3, [[mController valueForKey:@"mInsertRow"] intValue]);
+    drop(historyTable(), paths({"one.zmb"}), 0);
+    EXPECT_EQ(-1, [[mController valueForKey:@"mInsertRow"] intValue]);
+}
+
+TEST_F(Dropping, TakesFiftyFiles)
+{
+    open();
+    drop(loadedTable(), manyFiles(50), 0);
+    EXPECT_EQ(50u, rowsOf(loadedApps()).size());
+    EXPECT_THAT(lines(), ElementsAre(Message(9, L"50")));
+    EXPECT_THAT(boxes(), IsEmpty());
+}
+
+TEST_F(Dropping, RefusesFiftyOneFilesAndLoadsNone)
+{
+    open();
+    drop(loadedTable(), manyFiles(51), 0);
+    EXPECT_TRUE([box() performDragOperation:dragOf(manyFiles(51))]);
+    EXPECT_THAT(rowsOf(loadedApps()), IsEmpty());
+    EXPECT_TRUE(gStartupList.IsEmpty());
+    EXPECT_THAT(boxes(), ElementsAre(Message(37, L"50"), Message(37, L"50")));
+    EXPECT_THAT(lines(), IsEmpty());
+}
+
+TEST_F(Dropping, AddsFilesToTheStartupSuite)
+{
+    open();
+    EXPECT_TRUE([box() performDragOperation:dragOf(paths({"one.zmb", "two.zmb"}))]);
+    EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb"), file("two.zmb")));
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb"), file("two.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2"), Message(11, L"2")));
+}
+
+TEST_F(Dropping, CountsAFileOfTheStartupSuiteWithoutAddingItTwice)
+{
+    gLoadedAppList.AddTail(loadedModule("one.zmb"));
+    gStartupList.AddTail(file("one.zmb"));
+    open();
+    [box() performDragOperation:dragOf(paths({"one.zmb"}))];
+    EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(48, L"one.zmb"), Message(10, L"one.zmb")));
+}
+
+TEST_F(Dropping, AddsWhatWasLoadedBeforeAFailure)
+{
+    open();
+    host().linker.refuseToLoad(file("bad.zmb"));
+    [box() performDragOperation:dragOf(paths({"one.zmb", "bad.zmb", "two.zmb"}))];
+    EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
+    EXPECT_FALSE(host().linker.isLoaded(file("two.zmb")));
+    EXPECT_EQ(Message(10, L"one.zmb"), wide([mController message]));
+}
+
+TEST_F(Dropping, KeepsTemporaryInternetFilesOutOfTheStartupSuite)
+{
+    open();
+    host().internet.urlsOfLocalFiles[file("net.zmb")] = L"http://example.org/net.zmb";
+    [box() performDragOperation:dragOf(paths({"net.zmb"}))];
+    EXPECT_TRUE(gStartupList.IsEmpty());
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("net.zmb")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(41, file("net.zmb"))));
+    EXPECT_THAT(lines(), ElementsAre(Message(8, L"net.zmb")));
+}
+
+TEST_F(Dropping, NamesTheFileThatJoinedTheStartupSuiteWhenTheLastOneCannot)
+{
+    open();
+    host().internet.urlsOfLocalFiles[file("net.zmb")] = L"http://example.org/net.zmb";
+    [box() performDragOperation:dragOf(paths({"one.zmb", "net.zmb"}))];
+    EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2"), Message(10, L"one.zmb")));
+}
+
+TEST_F(Dropping, LoadsALispFileAloneOnTheTableAndAllOfItOnTheStartupSuiteBox)
+{
+    open();
+    drop(loadedTable(), paths({"one.lsp"}), 0);
+    [box() performDragOperation:dragOf(paths({"two.lsp"}))];
+    ASSERT_EQ(6u, host().lisp.queued.size());
+    EXPECT_EQ(L"(load \"" + file("one.lsp") + L"\")", host().lisp.queued[0]);
+    EXPECT_EQ(L"(progn (_INTERNAL-LOAD-ALL-FILE \"" + file("two.lsp") + L"\" nil T T nil)(princ))",
+              host().lisp.queued[3]);
+}
+
+TEST_F(Dropping, StopsSilentlyWhenNoFileIsUsable)
+{
+    open();
+    EXPECT_TRUE([box() performDragOperation:dragOf(paths({"a.txt"}))]);
+    drop(loadedTable(), [NSArray arrayWithObject:@"/gone/missing.lsp"], 0);
+    EXPECT_THAT(lines(), IsEmpty());
+    EXPECT_THAT(boxes(), IsEmpty());
+}
+
+TEST_F(Dropping, LoadsAFileByThePathItWasFoundAt)
+{
+    host().files.found[L"tool.zmb"] = file("elsewhere/tool.zmb");
+    open();
+    drop(loadedTable(), [NSArray arrayWithObject:@"/gone/tool.zmb"], 0);
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("elsewhere/tool.zmb")));
+}
+
+TEST_F(Dropping, AcceptsADragWithoutFilesOnTheBoxAndDoesNothing)
+{
+    open();
+    EXPECT_TRUE([box() performDragOperation:dragOf(nil)]);
+    EXPECT_THAT(lines(), IsEmpty());
+}
+
+TEST_F(Dropping, FindsNoDialogWhenNoneIsOpen)
+{
+    ModrigStartupSuiteBox* box = [[[ModrigStartupSuiteBox alloc] initWithFrame:NSZeroRect] autorelease];
+    EXPECT_EQ(NSDragOperationNone, [box draggingEntered:dragOf(paths({"b.lsp"}))]);
+    EXPECT_FALSE([box performDragOperation:dragOf(paths({"b.lsp"}))]);
+}
+
+TEST_F(Dropping, DoesNotShowInAStartupSuiteDialogThatIsOpen)
+{
+    open();
+    ModrigStartupSuitController* suite = [[[ModrigStartupSuitController alloc] init] autorelease];
+    ASSERT_TRUE([suite window]);
+    [suite doInit];
+    [box() performDragOperation:dragOf(paths({"one.zmb"}))];
+    EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
+    EXPECT_THAT(rowsOf([suite valueForKey:@"startupApps"]), IsEmpty());
+}

@@ -1,0 +1,367 @@
+// The list of the host's file panel, by mouse and keyboard.
+#include "tests/dialogs/support/FilePanelTest.h"
+
+#include <fstream>
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+namespace
+{
+class FilePanelList : public FilePanelTest
+{
+protected:
+    void writeFiles(std::initializer_list<const char*> names)
+    {
+        for (const char* name : names)
+            mFolder.write(name, "");
+    }
+    void writeMany(int count)
+    {
+        for (int number = 100; number < 100 + count; ++number)
+            mFolder.write("tool" + std::to_string(number) + ".lsp", "");
+    }
+    void arrow(unichar key, NSUInteger modifiers = 0)
+    {
+        pressKey(mPanel, [NSString stringWithCharacters:&key length:1], modifiers);
+    }
+};
+} // namespace
+
+TEST_F(FilePanelList, HasFoldersFirstAndNoHiddenFiles)
+{
+    writeFiles({"b.lsp", "a.lsp", "zoo/inner.lsp", ".hidden.lsp"});
+    use({[this]
+         {
+             EXPECT_THAT(shown(), ElementsAre(L"zoo", L"a.lsp", L"b.lsp"));
+             [mPanel setShowsHiddenFiles:YES];
+             EXPECT_THAT(shown(), ElementsAre(L"zoo", L".hidden.lsp", L"a.lsp", L"b.lsp"));
+         }});
+}
+
+TEST_F(FilePanelList, TakesRangesWithShiftAndSingleRowsWithControl)
+{
+    writeFiles({"a.lsp", "b.lsp", "c.lsp", "d.lsp"});
+    use({[this] { clickRow(table(), 0); }, [this] { return chosen().size() == 1; },
+         [this] { clickRow(table(), 2, NSShiftKeyMask); }, [this] { return chosen().size() == 3; },
+         [this] { clickRow(table(), 1, NSControlKeyMask); }, [this] { return chosen().size() == 2; },
+         [this]
+         {
+             EXPECT_THAT(chosen(), ElementsAre(file("a.lsp"), file("c.lsp")));
+             EXPECT_EQ(L"\"a.lsp\" \"c.lsp\"", name());
+         }});
+}
+
+TEST_F(FilePanelList, TakesOneFileWhereNoMoreAreAllowed)
+{
+    writeFiles({"a.lsp", "b.lsp"});
+    [mPanel setAllowsMultipleSelection:NO];
+    use({[this] { clickRow(table(), 0); }, [this] { clickRow(table(), 1, NSShiftKeyMask); },
+         [this] { return chosen() == std::vector{file("b.lsp")}; }});
+}
+
+TEST_F(FilePanelList, TakesRangesWithShiftAndArrowsAndEverythingWithControlA)
+{
+    writeFiles({"a.lsp", "b.lsp", "c.lsp"});
+    use({[this] { arrow(NSDownArrowFunctionKey); }, [this] { arrow(NSDownArrowFunctionKey, NSShiftKeyMask); },
+         [this] {
+             return chosen() == std::vector{file("a.lsp"), file("b.lsp")};
+         },
+         [this] { pressKey(mPanel, @"a", NSControlKeyMask); }, [this] { return chosen().size() == 3; }});
+}
+
+TEST_F(FilePanelList, EndsWithTheFileThatIsDoubleClicked)
+{
+    writeFiles({"a.lsp", "b.lsp"});
+    EXPECT_EQ(NSOKButton, run({[this] { clickRow(table(), 1); }, [this] { return chosen().size() == 1; },
+                               [this] { clickRow(table(), 1, 0, 2); }}));
+    EXPECT_THAT(chosen(), ElementsAre(file("b.lsp")));
+}
+
+TEST_F(FilePanelList, GoesIntoAFolderByDoubleClickAndByReturn)
+{
+    writeFiles({"outer/inner/a.lsp"});
+    use({[this] { clickRow(table(), 0); }, [this] { clickRow(table(), 0, 0, 2); },
+         [this] { return shown() == std::vector<std::wstring>{L"inner"}; },
+         [this]
+         {
+             EXPECT_THAT(chosen(), IsEmpty());
+             arrow(NSDownArrowFunctionKey);
+         },
+         [this]
+         {
+             EXPECT_THAT(chosen(), IsEmpty()) << "a folder on the way";
+             pressKey(mPanel, @"\r");
+         },
+         [this] { return shown() == std::vector<std::wstring>{L"a.lsp"}; },
+         [this] { EXPECT_EQ((mFolder / "outer/inner").wstring(), folder()); }});
+}
+
+TEST_F(FilePanelList, GoesUpWithBackspaceAndAltUpToTheFolderThatItCameFrom)
+{
+    writeFiles({"outer/inner/a.lsp", "outer/another/b.lsp"});
+    use({[this] { pressKey(mPanel, @"\177"); }, [this] { return folder() == (mFolder / "outer").wstring(); },
+         [this]
+         {
+             EXPECT_THAT(selectedRows(), ElementsAre(1));
+             EXPECT_THAT(chosen(), IsEmpty());
+             arrow(NSUpArrowFunctionKey, NSCommandKeyMask);
+         },
+         [this] { return folder() == mFolder.path().wstring(); }},
+        "outer/inner");
+}
+
+TEST_F(FilePanelList, GoesToTheRowOfTheFirstLetters)
+{
+    writeFiles({"alpha.lsp", "beta.lsp", "bravo.lsp"});
+    use({[this] { type(@"b"); }, [this] { return name() == L"beta.lsp"; }, [this] { type(@"r"); },
+         [this] { return chosen() == std::vector{file("bravo.lsp")}; }});
+}
+
+TEST_F(FilePanelList, TellsItsDelegateOfEveryChoiceAlsoOfTheSameAgain)
+{
+    writeFiles({"a.lsp"});
+    int before = 0;
+    use({[&]
+         {
+             before = mListener->told;
+             clickRow(table(), 0);
+         },
+         [&] { return mListener->told == before + 1; }, [&] { clickRow(table(), 0); },
+         [&] { return mListener->told == before + 2; }});
+}
+
+TEST_F(FilePanelList, IsSortedByItsHeaders)
+{
+    writeFiles({"b.omp", "a.zmb", "c.lsp"});
+    use({[this]
+         {
+             NSTableColumn* kind = [table() tableColumnWithIdentifier:@"kind"];
+             [[table() delegate] tableView:table() didClickTableColumn:kind];
+             EXPECT_THAT(shown(), ElementsAre(L"c.lsp", L"b.omp", L"a.zmb"));
+             [[table() delegate] tableView:table() didClickTableColumn:kind];
+             EXPECT_THAT(shown(), ElementsAre(L"a.zmb", L"b.omp", L"c.lsp"));
+         }});
+}
+
+TEST_F(FilePanelList, KeepsFolderSelectionAndPlaceWhenItsDelegateIsAskedAgain)
+{
+    writeMany(200);
+    use({[this]
+         {
+             [table() scrollRowToVisible:150];
+             const NSInteger first = firstVisibleRow();
+             selectFilesIn(mPanel, {L"tool249.lsp"});
+             mListener->hidden = @"tool12";
+             const int told = mListener->told;
+             [mPanel validateVisibleColumns];
+             EXPECT_EQ(190u, shown().size());
+             EXPECT_EQ(first - 10, firstVisibleRow());
+             EXPECT_THAT(chosen(), ElementsAre(file("tool249.lsp")));
+             EXPECT_EQ(told, mListener->told) << "nothing has changed";
+             mListener->hidden = @"tool24";
+             [mPanel validateVisibleColumns];
+             EXPECT_THAT(chosen(), IsEmpty());
+             EXPECT_EQ(L"", name());
+             EXPECT_EQ(told + 1, mListener->told);
+         }});
+}
+
+TEST_F(FilePanelList, AsksItsDelegateAgainWhenItIsSentAwayAndBack)
+{
+    writeMany(200);
+    NSInteger first = 0;
+    use({[&]
+         {
+             [table() scrollRowToVisible:150];
+             first = firstVisibleRow();
+             selectFilesIn(mPanel, {L"tool250.lsp"});
+             mListener->hidden = @"tool299";
+             [mPanel setDirectory:@"/"];
+             [mPanel setDirectory:in("")];
+         },
+         [&] { return shown().size() == 199; },
+         [&]
+         {
+             EXPECT_EQ(first, firstVisibleRow());
+             EXPECT_THAT(chosen(), ElementsAre(file("tool250.lsp")));
+         }});
+}
+
+TEST_F(FilePanelList, ShowsWhatComesIntoTheFolderAndKeepsItsPlace)
+{
+    writeMany(200);
+    NSInteger first = 0;
+    use({[&]
+         {
+             [table() scrollRowToVisible:150];
+             first = firstVisibleRow();
+             selectFilesIn(mPanel, {L"tool250.lsp"});
+             mFolder.write("a-new-one.lsp", "");
+         },
+         [&] { return shown().size() == 201; },
+         [&]
+         {
+             EXPECT_EQ(first + 1, firstVisibleRow());
+             EXPECT_THAT(chosen(), ElementsAre(file("tool250.lsp")));
+         }});
+}
+
+TEST_F(FilePanelList, ShowsTheNearestFolderWhenItsOwnIsGone)
+{
+    writeFiles({"outer/inner/a.lsp"});
+    use({[this] { std::filesystem::remove_all(mFolder / "outer/inner"); },
+         [this] { return folder() == (mFolder / "outer").wstring(); }},
+        "outer/inner");
+}
+
+TEST_F(FilePanelList, FindsAFolderWhileThoseOnTheWayChange)
+{
+    writeFiles({"outer/inner/a.lsp"});
+    use({[this]
+         {
+             mFolder.write("outer/one-more", "");
+             [mPanel setDirectory:in("outer/inner")];
+             EXPECT_THAT(chosen(), IsEmpty());
+             EXPECT_THAT(shown(), ElementsAre(L"a.lsp"));
+         }});
+}
+
+TEST_F(FilePanelList, GoesIntoTheHostsOwnPackage)
+{
+    NSString* host = [[NSBundle mainBundle] bundlePath];
+    const std::wstring hostName = wide([host lastPathComponent]);
+    [mPanel setDirectory:[host stringByDeletingLastPathComponent]];
+    const ModalSteps running({[&] { selectFilesIn(mPanel, {hostName.c_str()}); },
+                              [&]
+                              {
+                                  EXPECT_THAT(chosen(), ElementsAre(wide(host)));
+                                  pressKey(mPanel, @"\r");
+                              },
+                              [&] { return folder() == wide(host); }, [&] { [mPanel cancel:nil]; }});
+    [mPanel runModal];
+}
+
+TEST_F(FilePanelList, TakesAnyOtherPackageForAFile)
+{
+    writeFiles({"tool.bundle/tool"});
+    EXPECT_EQ(NSOKButton, run({[this] { selectFilesIn(mPanel, {L"tool.bundle"}); },
+                               [this] { pressKey(mPanel, @"\r"); }}));
+    EXPECT_THAT(chosen(), ElementsAre((mFolder / "tool.bundle").wstring()));
+}
+
+TEST_F(FilePanelList, LivesWithOddNames)
+{
+    writeFiles({"new\nline.lsp", "q\"uote #%41?.lsp"});
+    std::ofstream((mFolder / "bad\xE9.lsp").string()).put('x');
+    use({[this]
+         {
+             EXPECT_THAT(shown(), ElementsAre(L"new\\nline.lsp", L"q\"uote #%41?.lsp"));
+             [table() selectAll:nil];
+             EXPECT_THAT(chosen(), ElementsAre((mFolder / "new\nline.lsp").wstring(),
+                                               (mFolder / "q\"uote #%41?.lsp").wstring()));
+         }});
+}
+
+TEST_F(FilePanelList, RemembersTheFoldersThatWereUsed)
+{
+    writeFiles({"one/a.lsp", "two/b.lsp"});
+    use({}, "one");
+    use({}, "two");
+    use({[this]
+         {
+             NSPopUpButton* recent = nil;
+             for (NSView* row : {[[[mPanel contentView] subviews] objectAtIndex:0]})
+                 recent = [[row subviews] lastObject];
+             EXPECT_EQ((mFolder / "two").wstring(), wide([recent itemTitleAtIndex:1]));
+             EXPECT_EQ((mFolder / "one").wstring(), wide([recent itemTitleAtIndex:2]));
+             [recent selectItemAtIndex:2];
+             [NSApp sendAction:[recent action] to:[recent target] from:recent];
+             EXPECT_EQ((mFolder / "one").wstring(), folder());
+         }});
+}
+
+TEST_F(FilePanelList, AsksItsDelegateOnceWhenThatAndTheWayAwayAndBackComeTogether)
+{
+    writeMany(20);
+    int turns = 0;
+    use({[this]
+         {
+             mListener->asked = 0;
+             [mPanel validateVisibleColumns];
+             [mPanel setDirectory:@"/"];
+             [mPanel setDirectory:in("")];
+         },
+         [&] { return ++turns > 3; }, [this] { EXPECT_EQ(20, mListener->asked); }});
+}
+
+TEST_F(FilePanelList, ReadsTheFolderAgainWithF5)
+{
+    writeFiles({"a.lsp", "b.lsp"});
+    use({[this]
+         {
+             mListener->hidden = @"a.lsp";
+             arrow(NSF5FunctionKey);
+         },
+         [this] { return shown() == std::vector<std::wstring>{L"b.lsp"}; }});
+}
+
+TEST_F(FilePanelList, GoesToTheFoldersOnItsButtons)
+{
+    writeFiles({"outer/inner/a.lsp"});
+    use({[this]
+         {
+             ASSERT_TRUE(button(L"outer") && button(L"inner") && button(L"/"));
+             [button(L"outer") performClick:nil];
+             EXPECT_EQ((mFolder / "outer").wstring(), folder());
+             EXPECT_FALSE(button(L"inner"));
+             [button(L"Up") performClick:nil];
+             EXPECT_EQ(mFolder.path().wstring(), folder());
+             [button(L"Home") performClick:nil];
+             EXPECT_EQ(wide(NSHomeDirectory()), folder());
+             [button(L"/") performClick:nil];
+             EXPECT_EQ(L"/", folder());
+         }},
+        "outer/inner");
+}
+
+TEST_F(FilePanelList, ShowsHiddenFilesWithItsSwitch)
+{
+    writeFiles({".hidden.lsp"});
+    use({[this]
+         {
+             [button(L"Hidden files") performClick:nil];
+             EXPECT_THAT(shown(), ElementsAre(L".hidden.lsp"));
+             [button(L"Hidden files") performClick:nil];
+             EXPECT_THAT(shown(), IsEmpty());
+         }});
+}
+
+TEST_F(FilePanelList, IsReachedByTabInTheOrderOfReading)
+{
+    use({[this]
+         {
+             [mPanel makeFirstResponder:table()];
+             [mPanel selectNextKeyView:nil];
+             EXPECT_TRUE([nameField(mPanel) currentEditor] != nil);
+             [mPanel selectKeyViewFollowingView:nameField(mPanel)];
+             EXPECT_EQ(button(L"Hidden files"), [mPanel firstResponder]);
+             [mPanel selectNextKeyView:nil];
+             EXPECT_EQ(button(L"Cancel"), [mPanel firstResponder]);
+             [mPanel selectNextKeyView:nil];
+             EXPECT_EQ(button(L"Up"), [mPanel firstResponder]) << "Open is disabled";
+             [mPanel selectNextKeyView:nil];
+             EXPECT_EQ(button(L"Home"), [mPanel firstResponder]);
+         }});
+}
+
+TEST_F(FilePanelList, StaysWithinTheScreen)
+{
+    NSView* tall = [[[NSView alloc] initWithFrame:NSMakeRect(0, 0, 700, 3000)] autorelease];
+    [mPanel setAccessoryView:tall];
+    use({[this]
+         {
+             const NSRect screen = [[NSScreen mainScreen] visibleFrame];
+             EXPECT_LE(NSHeight([mPanel frame]), NSHeight(screen));
+         }});
+}

@@ -1,0 +1,229 @@
+// Whether every window can be seen, reached and read, at its smallest, its usual and a large size, in this
+// language and in one whose words are half as long again. The program is run at several scales.
+#include "tests/dialogs/support/DialogTest.h"
+#include "tests/dialogs/support/LayoutCheck.h"
+
+#import <tesselui/TsOCOpenFileDialog.h>
+
+#include "host/ui/MessageBoxAlert.h"
+
+#import "modrig/dialogs/ModrigStartupSuitController.h"
+#import "modrig/dialogs/TsOCModrigUtil.h"
+
+using testing::ElementsAre;
+using testing::HasSubstr;
+using testing::IsEmpty;
+
+namespace
+{
+const NSSize kLarge = {1600, 1000};
+const NSSize kLowScreen = {800, 600};
+constexpr CGFloat kTitleBar = 24;
+
+// Not the window: the display of the tests is small at the scales of high resolutions, and would limit it.
+void resize(NSWindow* window, NSSize size)
+{
+    [[window contentView] setFrameSize:size];
+    [[window contentView] display];
+}
+
+// A piece of a window of its own, whose faults are known.
+class LayoutCheck : public testing::Test
+{
+protected:
+    void SetUp() override
+    {
+        mPool = [[NSAutoreleasePool alloc] init];
+        mView = [[[NSView alloc] initWithFrame:NSMakeRect(0, 0, 300, 200)] autorelease];
+        mOne = addButton(@"One", NSMakeRect(10, 10, 80, 28));
+        mTwo = addButton(@"Two", NSMakeRect(100, 10, 80, 28));
+    }
+    void TearDown() override { [mPool drain]; }
+
+    NSButton* addButton(NSString* title, NSRect frame)
+    {
+        NSButton* button = [[[NSButton alloc] initWithFrame:frame] autorelease];
+        [button setTitle:title];
+        [button setFont:[NSFont systemFontOfSize:13]];
+        [mView addSubview:button];
+        return button;
+    }
+
+    NSView* mView = nil;
+    NSButton* mOne = nil;
+    NSButton* mTwo = nil;
+
+private:
+    NSAutoreleasePool* mPool = nil;
+};
+
+class Layout : public OpenDialogTest
+{
+protected:
+    // Measures at the three sizes, then again with longer texts.
+    void measure(NSWindow* window)
+    {
+        measureSizesOf(window, "in this language");
+        lengthenTexts([window contentView]);
+        measureSizesOf(window, "with longer words");
+    }
+
+    void measureTabs()
+    {
+        open();
+        for (const NSInteger tab : {0, 1})
+        {
+            [mController setTabViewSelectedIndex:tab];
+            SCOPED_TRACE(tab ? "History" : "Loaded Applications");
+            measure(mPanel);
+            close();
+            open();
+        }
+    }
+
+private:
+    void measureSizesOf(NSWindow* window, const char* language)
+    {
+        const NSSize usual = [[window contentView] frame].size;
+        for (const NSSize size : {kLarge, [window contentMinSize], usual})
+        {
+            resize(window, size);
+            EXPECT_THAT(layoutFaults([window contentView]), IsEmpty())
+                << language << ", " << size.width << " by " << size.height;
+        }
+    }
+};
+} // namespace
+
+TEST_F(LayoutCheck, FindsNoFaultWhereThereIsNone)
+{
+    EXPECT_THAT(layoutFaults(mView), IsEmpty());
+}
+
+TEST_F(LayoutCheck, FindsAControlOverAnother)
+{
+    [mTwo setFrameOrigin:NSMakePoint(85, 10)];
+    EXPECT_THAT(layoutFaults(mView), ElementsAre(HasSubstr("\"One\" overlaps NSButton \"Two\"")));
+}
+
+TEST_F(LayoutCheck, IgnoresWhatIsHidden)
+{
+    [mTwo setFrameOrigin:NSMakePoint(85, 10)];
+    [mTwo setHidden:YES];
+    EXPECT_THAT(layoutFaults(mView), IsEmpty());
+}
+
+TEST_F(LayoutCheck, FindsAControlThatCannotBeReached)
+{
+    [mTwo setFrameOrigin:NSMakePoint(230, 10)];
+    EXPECT_THAT(layoutFaults(mView), ElementsAre(HasSubstr("\"Two\" stands outside of NSView")));
+}
+
+TEST_F(LayoutCheck, FindsATitleThatIsCut)
+{
+    [mTwo setTitle:@"Two, and what is too long for it"];
+    EXPECT_THAT(layoutFaults(mView), ElementsAre(HasSubstr("needs")));
+}
+
+TEST_F(LayoutCheck, FindsATextThatNeedsMoreLinesThanThereIsRoomFor)
+{
+    NSTextField* label = [[[NSTextField alloc] initWithFrame:NSMakeRect(10, 60, 100, 20)] autorelease];
+    [label setStringValue:@"A text of several words, which takes several lines in so narrow a place."];
+    [label setEditable:NO];
+    [label setSelectable:NO];
+    [mView addSubview:label];
+    EXPECT_THAT(layoutFaults(mView), ElementsAre(HasSubstr("needs a height of")));
+}
+
+TEST_F(LayoutCheck, FindsFaultsDeepInside)
+{
+    NSView* inner = [[[NSView alloc] initWithFrame:NSMakeRect(0, 60, 300, 100)] autorelease];
+    [mView addSubview:inner];
+    [inner addSubview:mOne];
+    [inner addSubview:mTwo];
+    [mTwo setFrameOrigin:NSMakePoint(85, 10)];
+    EXPECT_THAT(layoutFaults(mView), ElementsAre(HasSubstr("overlaps")));
+}
+
+TEST_F(LayoutCheck, LengthensWordsByHalf)
+{
+    EXPECT_STREQ("LoadLo", [lengthened(@"Load") UTF8String]);
+    EXPECT_STREQ("LispLi filesfil (*.lsp)", [lengthened(@"Lisp files (*.lsp)") UTF8String]);
+    lengthenTexts(mView);
+    EXPECT_STREQ("OneOn", [[mOne title] UTF8String]);
+}
+
+TEST_F(Layout, OfTheMainDialogHasRoomForEverything)
+{
+    measureTabs();
+}
+
+TEST_F(Layout, OfTheMainDialogFitsALowScreen)
+{
+    open();
+    const NSSize smallest = [mPanel contentMinSize];
+    EXPECT_LE(smallest.width, kLowScreen.width);
+    EXPECT_LE(smallest.height + kTitleBar, kLowScreen.height - 48); // the desktop's own bar
+}
+
+// The list of files gives way first, then the tables.
+TEST_F(Layout, OfTheMainDialogKeepsTheTablesAsLongAsTheListOfFilesCanGiveWay)
+{
+    open();
+    const NSSize usual = {740, 728};
+    resize(mPanel, usual);
+    const CGFloat table = NSHeight([[loadedTable() enclosingScrollView] frame]);
+    resize(mPanel, NSMakeSize(usual.width, usual.height - 150));
+    EXPECT_EQ(table, NSHeight([[loadedTable() enclosingScrollView] frame]));
+    resize(mPanel, [mPanel contentMinSize]);
+    EXPECT_LT(NSHeight([[loadedTable() enclosingScrollView] frame]), table);
+    EXPECT_GT(NSHeight([[loadedTable() enclosingScrollView] frame]), 90);
+}
+
+TEST_F(Layout, OfTheStartupSuiteHasRoomForEverything)
+{
+    open();
+    ModrigStartupSuitController* suite = [[[ModrigStartupSuitController alloc] init] autorelease];
+    ASSERT_TRUE([suite window]);
+    [suite doInit];
+    [[suite window] setContentMinSize:[[suite window] minSize]];
+    measure([suite window]);
+    [suite doClean];
+}
+
+TEST_F(Layout, OfTheAddPanelHasRoomForEverything)
+{
+    NSMutableArray* filters = [NSMutableArray array];
+    [TsOCModrigUtil populateModrigFileFilter:filters];
+    TsOCOpenFileDialog* dialog = [[[TsOCOpenFileDialog alloc] init] autorelease];
+    [dialog setTitle:@"Add to Startup Suite"];
+    [dialog setInitialPath:path("folder")];
+    [dialog setFileFilters:filters];
+    const ModalSteps steps({[&] { measure([NSApp modalWindow]); }, [] { [NSApp stopModal]; }});
+    [dialog runModal];
+}
+
+TEST_F(Layout, OfAMessageBoxHasRoomForEverything)
+{
+    open();
+    const wchar_t* text = L"/a/folder/module.bundle could not be loaded.";
+    const wchar_t* detail =
+        L"/a/folder/module.bundle: a library that it needs, libhorizon.so.4, is not on this "
+        L"computer, or none of the folders where libraries are looked for holds it.";
+    const ModalSteps steps({[=] { tsuiShowMessageBox(text, detail, 0, nullptr); },
+                            [this]
+                            {
+                                EXPECT_NE(mPanel, [NSApp modalWindow]);
+                                EXPECT_THAT(layoutFaults([[NSApp modalWindow] contentView]), IsEmpty());
+                                [NSApp stopModal];
+                            },
+                            // The box's run has to be over before its window's can end.
+                            [this]
+                            {
+                                if ([NSApp modalWindow] != mPanel)
+                                    return false;
+                                [NSApp stopModal];
+                                return true;
+                            }});
+    [NSApp runModalForWindow:mPanel];
+}

@@ -1,0 +1,354 @@
+// What a person expects of the dialog's tables without being told: real clicks and keys in its window.
+#include "tests/dialogs/support/DialogTest.h"
+#include "tests/dialogs/support/Events.h"
+
+#import "modrig/dialogs/ModrigFilePath.h"
+#import "modrig/dialogs/ModrigNameCell.h"
+#import "modrig/dialogs/ModrigTableView.h"
+#import "modrig/dialogs/TsOCModrigUtil.h"
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+namespace
+{
+constexpr int kHistoryTab = 1;
+
+class Manners : public OpenDialogTest
+{
+protected:
+    void openHistory(std::initializer_list<std::string> names)
+    {
+        for (const std::string& name : names)
+            gHistoryList.AddTail(CStdStr(file(name)));
+        open();
+        [mController setTabViewSelectedIndex:kHistoryTab];
+        show();
+    }
+    void openLoaded(std::initializer_list<std::string> names)
+    {
+        for (const std::string& name : names)
+            gLoadedAppList.AddTail(name.ends_with(".zmb") ? loadedModule(name) : file(name));
+        open();
+        show();
+    }
+    // As it shows on the screen while it runs.
+    void show()
+    {
+        [mPanel makeKeyAndOrderFront:nil];
+        events::pump();
+    }
+    std::wstring message() { return wide([mController message]); }
+    static NSPoint headerOf(NSTableView* table)
+    {
+        return events::middleOf([[table headerView] headerRectOfColumn:0]);
+    }
+};
+} // namespace
+
+TEST_F(Manners, LoadNothingForADoubleClickOnAColumnsHeader)
+{
+    openHistory({"one.lsp", "two.lsp"});
+    events::clickRow(historyTable(), 1);
+    ASSERT_THAT(selectionOf(historyList()), ElementsAre(file("two.lsp")));
+    events::click([historyTable() headerView], headerOf(historyTable()), 0, 2);
+    EXPECT_THAT(rowsOf(loadedApps()), IsEmpty());
+    EXPECT_THAT(lines(), IsEmpty());
+}
+
+TEST_F(Manners, LoadNothingForADoubleClickBelowTheLastRow)
+{
+    openHistory({"one.lsp", "two.lsp"});
+    events::clickRow(historyTable(), 1);
+    const NSRect last = [historyTable() rectOfRow:1];
+    events::click(historyTable(), NSMakePoint(NSMidX(last), NSMaxY(last) + 20), 0, 2);
+    EXPECT_THAT(rowsOf(loadedApps()), IsEmpty());
+}
+
+TEST_F(Manners, LoadARowThatIsDoubleClicked)
+{
+    openHistory({"one.lsp", "two.lsp"});
+    events::clickRow(historyTable(), 1, 0, 2);
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("two.lsp")));
+}
+
+TEST_F(Manners, TakeTheLastSuccessAwayWhenTheNextLoadFails)
+{
+    open();
+    selectFiles({"one.zmb"});
+    [mController onLoad:nil];
+    ASSERT_EQ(Message(8, L"one.zmb"), message());
+    host().linker.refuseToLoad(file("bad.zmb"));
+    selectFiles({"bad.zmb"});
+    [mController onLoad:nil];
+    EXPECT_EQ(L"", message());
+}
+
+TEST_F(Manners, TakeTheLastSuccessAwayWhenTheNextUnloadFails)
+{
+    gLoadedAppList.AddTail(loadedModule("one.zmb"));
+    open();
+    [mController setMessage:@"two.zmb was unloaded."];
+    select(loadedTable(), {0});
+    host().linker.refuseToUnload(file("one.zmb"));
+    [mController onUnload:nil];
+    EXPECT_EQ(L"", message());
+}
+
+TEST_F(Manners, LeaveTheMessageAloneWhenAnActionHasNothingToDo)
+{
+    open();
+    [mController setMessage:@"one.zmb was loaded."];
+    [mController onUnload:nil];
+    [mController onRemove:nil];
+    [mController onLoadFromHistory:nil];
+    EXPECT_EQ(L"one.zmb was loaded.", message());
+}
+
+TEST_F(Manners, TakeTheLastSuccessAwayWhenADropIsRefused)
+{
+    open();
+    [mController setMessage:@"one.zmb was loaded."];
+    NSMutableArray* many = [NSMutableArray array];
+    for (int index = 0; index < 51; ++index)
+        [many addObject:path("one.zmb")];
+    [mController loadedAppsTableViewDropFiles:many atRow:0];
+    EXPECT_EQ(L"", message());
+    [mController setMessage:@"one.zmb was loaded."];
+    [mController loadedAppsTableViewDropFiles:paths({"readme.txt"}) atRow:0];
+    EXPECT_EQ(L"", message());
+}
+
+namespace
+{
+NSString* key(unichar character)
+{
+    return [NSString stringWithCharacters:&character length:1];
+}
+
+class TableKeys : public Manners
+{
+protected:
+    void pressInTable(NSTableView* table, NSString* characters, unsigned modifiers = 0)
+    {
+        [[table window] makeFirstResponder:table];
+        events::press([table window], characters, modifiers);
+    }
+    // The menu that a click with the other button opens on the row.
+    static NSMenu* menuOn(NSTableView* table, NSInteger row)
+    {
+        const NSPoint place = events::middleOf([table rectOfRow:row]);
+        return [table menuForEvent:[NSEvent mouseEventWithType:NSRightMouseDown
+                                                      location:[table convertPoint:place toView:nil]
+                                                 modifierFlags:0
+                                                     timestamp:0
+                                                  windowNumber:[[table window] windowNumber]
+                                                       context:[[table window] graphicsContext]
+                                                   eventNumber:0
+                                                    clickCount:1
+                                                      pressure:1]];
+    }
+    static std::vector<std::wstring> titlesIn(NSMenu* menu)
+    {
+        std::vector<std::wstring> titles;
+        for (NSInteger index = 0; index < [menu numberOfItems]; ++index)
+        {
+            NSMenuItem* item = [menu itemAtIndex:index];
+            titles.push_back([item isSeparatorItem] ? L"-" : wide([item title]));
+        }
+        return titles;
+    }
+    static bool isEnabled(NSTableView* table, NSMenu* menu, NSString* title)
+    {
+        return [(id)table validateMenuItem:[menu itemWithTitle:title]];
+    }
+    static void choose(NSMenu* menu, NSString* title)
+    {
+        id item = [menu itemWithTitle:title];
+        [NSApp sendAction:[item action] to:[item target] from:item];
+    }
+    static std::wstring copied()
+    {
+        return wide([[NSPasteboard generalPasteboard] stringForType:NSStringPboardType]);
+    }
+};
+} // namespace
+
+TEST_F(TableKeys, RemoveTheSelectedRowsOfTheHistory)
+{
+    openHistory({"a.lsp", "b.lsp", "c.lsp"});
+    select(historyTable(), {1});
+    pressInTable(historyTable(), key(NSDeleteFunctionKey));
+    EXPECT_THAT(rowsOf(historyList()), ElementsAre(file("a.lsp"), file("c.lsp")));
+    EXPECT_THAT(Texts(gHistoryList), ElementsAre(file("a.lsp"), file("c.lsp")));
+    EXPECT_EQ(Message(35, L"b.lsp"), message());
+}
+
+TEST_F(TableKeys, SelectEveryRow)
+{
+    openHistory({"a.lsp", "b.lsp", "c.lsp"});
+    pressInTable(historyTable(), @"a", NSControlKeyMask);
+    EXPECT_THAT(selectionOf(historyList()), ElementsAre(file("a.lsp"), file("b.lsp"), file("c.lsp")));
+    EXPECT_TRUE([mController canRemoveHistory]);
+}
+
+TEST_F(TableKeys, SelectEveryRowThatCanBeUnloaded)
+{
+    openLoaded({"a.zmb", "tool.lsp", "b.zmb"});
+    pressInTable(loadedTable(), @"\001", NSControlKeyMask);
+    EXPECT_THAT(selectionOf(loadedApps()), ElementsAre(file("a.zmb"), file("b.zmb")));
+}
+
+TEST_F(TableKeys, GoToTheRowThatBeginsWithWhatIsTyped)
+{
+    openHistory({"gears.lsp", "moon.lsp", "monk.lsp", "primes.lsp"});
+    pressInTable(historyTable(), @"m");
+    EXPECT_THAT(selectionOf(historyList()), ElementsAre(file("moon.lsp")));
+    pressInTable(historyTable(), @"o");
+    pressInTable(historyTable(), @"n");
+    EXPECT_THAT(selectionOf(historyList()), ElementsAre(file("monk.lsp")));
+    EXPECT_TRUE([mController canRemoveHistory]);
+}
+
+TEST_F(TableKeys, CopyThePathsOfTheSelectedRows)
+{
+    openHistory({"a.lsp", "b.lsp", "c.lsp"});
+    select(historyTable(), {0, 2});
+    pressInTable(historyTable(), @"c", NSControlKeyMask);
+    EXPECT_EQ(file("a.lsp") + L"\n" + file("c.lsp"), copied());
+}
+
+TEST_F(TableKeys, OpenHelpFromEverywhereInTheDialog)
+{
+    openHistory({"a.lsp"});
+    pressInTable(historyTable(), key(NSF1FunctionKey));
+    EXPECT_THAT(host().journal.entries(),
+                testing::Contains(testing::HasSubstr(L"load_unload_applications_dialog")));
+}
+
+TEST_F(TableKeys, TakeARangeWithShiftAndSingleRowsWithControl)
+{
+    openHistory({"a.lsp", "b.lsp", "c.lsp", "d.lsp"});
+    events::clickRow(historyTable(), 0);
+    events::clickRow(historyTable(), 2, NSShiftKeyMask);
+    EXPECT_THAT(selectionOf(historyList()), ElementsAre(file("a.lsp"), file("b.lsp"), file("c.lsp")));
+    events::clickRow(historyTable(), 1, NSControlKeyMask);
+    EXPECT_THAT(selectionOf(historyList()), ElementsAre(file("a.lsp"), file("c.lsp")));
+    events::clickRow(historyTable(), 3, NSControlKeyMask);
+    EXPECT_THAT(selectionOf(historyList()), ElementsAre(file("a.lsp"), file("c.lsp"), file("d.lsp")));
+}
+
+TEST_F(TableKeys, OfTheMouseOpenAMenuWithWhatTheButtonsDo)
+{
+    openHistory({"a.lsp", "b.lsp"});
+    NSMenu* menu = menuOn(historyTable(), 1);
+    EXPECT_THAT(selectionOf(historyList()), ElementsAre(file("b.lsp"))) << "the row under the pointer";
+    EXPECT_THAT(titlesIn(menu), ElementsAre(L"Load", L"Add to Startup Suite", L"Remove", L"-", L"Copy Path",
+                                            L"Show in Folder"));
+    choose(menu, @"Load");
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("b.lsp")));
+    choose(menuOn(historyTable(), 1), @"Add to Startup Suite");
+    EXPECT_THAT(Texts(gStartupList), ElementsAre(file("b.lsp")));
+    choose(menuOn(historyTable(), 1), @"Remove");
+    EXPECT_THAT(rowsOf(historyList()), ElementsAre(file("a.lsp")));
+}
+
+TEST_F(TableKeys, OfTheMouseKeepSeveralSelectedRowsForTheMenu)
+{
+    openHistory({"a.lsp", "b.lsp", "c.lsp"});
+    select(historyTable(), {0, 1});
+    NSMenu* menu = menuOn(historyTable(), 1);
+    EXPECT_THAT(selectionOf(historyList()), ElementsAre(file("a.lsp"), file("b.lsp")));
+    choose(menu, @"Copy Path");
+    EXPECT_EQ(file("a.lsp") + L"\n" + file("b.lsp"), copied());
+}
+
+TEST_F(TableKeys, OfTheMouseLeaveARowThatCannotBeUnloadedUnselected)
+{
+    openLoaded({"a.zmb", "tool.lsp"});
+    NSMenu* menu = menuOn(loadedTable(), 1);
+    EXPECT_THAT(selectionOf(loadedApps()), IsEmpty());
+    EXPECT_FALSE(isEnabled(loadedTable(), menu, @"Unload"));
+    EXPECT_TRUE(isEnabled(loadedTable(), menu, @"Copy Path"));
+    choose(menu, @"Copy Path");
+    EXPECT_EQ(file("tool.lsp"), copied());
+    choose(menuOn(loadedTable(), 0), @"Unload");
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("tool.lsp")));
+}
+
+TEST_F(Manners, TellTheWholePathAndWhyARowIsGrey)
+{
+    openHistory({"a.lsp"});
+    const auto tipOf = [](NSTableView* table, NSInteger row) { return wide([(id)table tipForRow:row]); };
+    EXPECT_EQ(file("a.lsp"), tipOf(historyTable(), 0));
+    std::filesystem::remove(mFolder / "a.lsp");
+    EXPECT_EQ(file("x").substr(0, file("x").size() - 1) + L"a.lsp\nThis file does not exist.",
+              tipOf(historyTable(), 0));
+}
+
+TEST_F(Manners, DrawMissingFilesInGreyAndLongNamesWithAnEllipsis)
+{
+    const std::string longName = std::string(120, 'n') + ".lsp";
+    openHistory({"a.lsp", "gone.lsp", longName});
+    std::filesystem::remove(mFolder / "gone.lsp");
+    const auto cellOf = [this](NSInteger row)
+    {
+        NSTableColumn* column = [[historyTable() tableColumns] objectAtIndex:0];
+        NSCell* cell = [column dataCellForRow:row];
+        [cell setStringValue:[[historyTable() dataSource] tableView:historyTable()
+                                          objectValueForTableColumn:column
+                                                                row:row]];
+        [(id)[historyTable() delegate] tableView:historyTable()
+                                 willDisplayCell:cell
+                                  forTableColumn:column
+                                             row:row];
+        return (NSTextFieldCell*)cell;
+    };
+    EXPECT_EQ([NSColor controlTextColor], [cellOf(0) textColor]);
+    EXPECT_EQ(L"a.lsp", wide([cellOf(0) stringValue]));
+    EXPECT_EQ([NSColor disabledControlTextColor], [cellOf(1) textColor]);
+    const std::wstring shown = wide([(ModrigNameCell*)cellOf(2) textIn:170]);
+    EXPECT_EQ(L'…', shown.back());
+    EXPECT_LT(shown.size(), 40u);
+}
+
+TEST_F(Manners, FillTheWidthOfTheTableAtEverySize)
+{
+    openHistory({"a.lsp"});
+    const auto widthOfColumns = [this]
+    {
+        const NSRect last = [historyTable() rectOfColumn:1];
+        return NSMaxX(last);
+    };
+    NSRect frame = [mPanel frame];
+    for (const CGFloat more : {150, -100})
+    {
+        frame.size.width += more;
+        [mPanel setFrame:frame display:YES];
+        events::pump();
+        EXPECT_NEAR(NSWidth([[historyTable() enclosingScrollView] documentVisibleRect]), widthOfColumns(), 6);
+    }
+}
+
+TEST_F(Manners, AreRememberedForTheWindowAndItsColumns)
+{
+    openHistory({"a.lsp"});
+    NSRect frame = [mPanel frame];
+    frame.origin.x += 37;
+    frame.size.width += 60;
+    [mPanel setFrame:frame display:YES];
+    [[[historyTable() tableColumns] objectAtIndex:0] setWidth:231];
+    close();
+    open();
+    EXPECT_TRUE(NSEqualRects(frame, [mPanel frame])) << [NSStringFromRect([mPanel frame]) UTF8String];
+    EXPECT_EQ(231, [[[historyTable() tableColumns] objectAtIndex:0] width]);
+}
+
+TEST_F(Manners, ShowTheTipOfARowWhenThePointerRestsOnIt)
+{
+    openHistory({"a.lsp", "b.lsp"});
+    const std::size_t before = events::windowsOnTheScreen();
+    events::movePointerTo(historyTable(), events::middleOf([historyTable() rectOfRow:1]));
+    EXPECT_TRUE(events::comesTrue([&] { return events::windowsOnTheScreen() > before; }));
+    events::movePointerTo([mPanel contentView], NSMakePoint(1, 1));
+}

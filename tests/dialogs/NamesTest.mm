@@ -1,0 +1,98 @@
+// Files whose names are in other scripts, or hold what is rarely seen in a name.
+#include "tests/dialogs/support/DialogTest.h"
+#include "tests/dialogs/support/Events.h"
+
+#include "host/ui/platform/gnustep/FontCoverage.h"
+#include "host/ui/platform/gnustep/VisualOrder.h"
+#include "modrig/messages/MessageLine.h"
+
+#import "modrig/dialogs/ModrigFilePath.h"
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+namespace
+{
+constexpr int kHistoryTab = 1;
+
+class Names : public OpenDialogTest
+{
+protected:
+    void openHistory(std::initializer_list<std::string> names)
+    {
+        for (const std::string& name : names)
+            gHistoryList.AddTail(CStdStr(file(name)));
+        open();
+        [mController setTabViewSelectedIndex:kHistoryTab];
+        [mPanel makeKeyAndOrderFront:nil];
+        events::pump();
+    }
+    // The pixels of the row's name, but for its extension.
+    NSData* lookOf(NSInteger row)
+    {
+        const NSRect place = [historyTable() frameOfCellAtColumn:0 row:row];
+        [historyTable() lockFocus];
+        NSBitmapImageRep* image = [[[NSBitmapImageRep alloc]
+            initWithFocusedViewRect:NSMakeRect(NSMinX(place), NSMinY(place), 60, NSHeight(place))]
+            autorelease];
+        [historyTable() unlockFocus];
+        return [image TIFFRepresentation];
+    }
+    std::wstring shownName(NSInteger row)
+    {
+        return wide([[historyTable() dataSource] tableView:historyTable()
+                                 objectValueForTableColumn:[[historyTable() tableColumns] objectAtIndex:0]
+                                                       row:row]);
+    }
+};
+} // namespace
+
+// Where a font lacks a letter, all of them look like one question mark.
+TEST_F(Names, ThatDifferLookDifferentInEveryScript)
+{
+    openHistory({"first.lsp", "second.lsp", "אב.lsp", "גד.lsp", "با.lsp", "سج.lsp", "日本.lsp", "語中.lsp",
+                 "🎉🌙.lsp", "🌙🎉.lsp"});
+    for (NSInteger row = 0; row < 10; row += 2)
+        EXPECT_FALSE([lookOf(row) isEqual:lookOf(row + 1)]) << "rows " << row << " and " << row + 1;
+}
+
+TEST_F(Names, AreDrawnFromRightToLeftWhereTheyAreWrittenSo)
+{
+    using tessel::windowing::visualOrder;
+    EXPECT_EQ(u"tool.lsp", visualOrder(u"tool.lsp"));
+    EXPECT_EQ(u"םולש.lsp", visualOrder(u"שלום.lsp"));
+    EXPECT_EQ(u"a םולש b", visualOrder(u"a שלום b"));
+}
+
+TEST_F(Names, InArabicHaveTheirLettersJoined)
+{
+    // beh and alef: the beginning form and the end form, the end first on the screen.
+    EXPECT_EQ(u"\uFE8E\uFE91.lsp", tessel::windowing::visualOrder(u"\u0628\u0627.lsp"));
+}
+
+TEST_F(Names, HaveAFontForTheirLettersWhenOneIsInstalled)
+{
+    for (const char32_t letter : {U'ש', U'م', U'日', U'🎉'})
+        EXPECT_NE("", tessel::windowing::fontWith(letter, false)) << static_cast<unsigned>(letter);
+    EXPECT_EQ("", tessel::windowing::fontWith(0x10FFFD, false));
+}
+
+TEST_F(Names, MayHoldABackslash)
+{
+    openHistory({"back\\slash.lsp"});
+    EXPECT_EQ(L"back\\slash.lsp", shownName(0));
+    select(historyTable(), {0});
+    [mController onLoadFromHistory:nil];
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("back\\slash.lsp")));
+}
+
+TEST_F(Names, MayHoldALineBreakWhichIsShownInTheLine)
+{
+    openHistory({"new\nline.zmb"});
+    EXPECT_EQ(L"new\\nline.zmb", shownName(0));
+    select(historyTable(), {0});
+    [mController onLoadFromHistory:nil];
+    EXPECT_TRUE(host().linker.isLoaded(file("new\nline.zmb")));
+    ModrigUtils::SetDialogMessage(CStdStr(L"new\nline.zmb was loaded."));
+    EXPECT_EQ(L"new\\nline.zmb was loaded.", wide([mController message]));
+}
