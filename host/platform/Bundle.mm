@@ -1,12 +1,14 @@
 #include "host/platform/Bundle.h"
 
 #import <Foundation/Foundation.h>
+#include <wincompat/winstring.h>
 
 #include <algorithm>
 #include <filesystem>
 
 #include "host/platform/AutoreleasePool.h"
 #include "host/text/Unicode.h"
+#include "host/text/platform/FileNames.h"
 
 namespace tessel
 {
@@ -16,8 +18,8 @@ constexpr std::string_view kBundleSuffix = ".bundle";
 
 NSBundle* bundleAt(const std::string& folder)
 {
-    NSString* path = [NSString stringWithUTF8String:folder.c_str()];
-    return path ? [NSBundle bundleWithPath:path] : nil;
+    nameEveryFile();
+    return [NSBundle bundleWithPath:wcharToNSString(toWide(folder).c_str())];
 }
 
 char lowerAscii(char character)
@@ -44,7 +46,7 @@ std::string programOfBundle(const std::string& folder, std::wstring& whyNot)
         !std::filesystem::equivalent([[bundle bundlePath] fileSystemRepresentation], folder, failed))
     {
         // GNUstep answers with the bundle that it has opened before under the same identifier.
-        whyNot = L"the bundle \"" + toWide([[bundle bundlePath] UTF8String]) + L"\" has the same identifier";
+        whyNot = L"the bundle \"" + NSStringToWstring([bundle bundlePath]) + L"\" has the same identifier";
         return {};
     }
     NSString* program = [bundle executablePath];

@@ -18,7 +18,7 @@ void CommandLine::print(std::wstring_view text)
 {
     if (text.empty())
         return;
-    mWrite(toUtf8(text));
+    mWrite(toUtf8(withReadableBytes(text)));
     const auto lastBreak = text.find_last_of(L"\r\n");
     if (lastBreak != text.npos)
         mOpenLine.clear();

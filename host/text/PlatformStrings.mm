@@ -3,11 +3,11 @@
 
 #include <vector>
 
-#include "host/text/Unicode.h"
-
 namespace
 {
-constexpr wchar_t kReplacement = 0xFFFD;
+constexpr unichar kReplacement = 0xFFFD;
+constexpr char32_t kFirstOfTwoUnits = 0x10000;
+constexpr char32_t kLastCodePoint = 0x10FFFF;
 
 bool isHighSurrogate(unichar unit)
 {
@@ -19,9 +19,24 @@ bool isLowSurrogate(unichar unit)
     return unit >= 0xDC00 && unit < 0xE000;
 }
 
+unichar single(unichar unit)
+{
+    return isHighSurrogate(unit) || isLowSurrogate(unit) ? kReplacement : unit;
+}
+
 wchar_t joined(unichar high, unichar low)
 {
     return static_cast<wchar_t>(0x10000 + ((high - 0xD800) << 10) + (low - 0xDC00));
+}
+
+void append(std::vector<unichar>& units, char32_t code)
+{
+    if (code < kFirstOfTwoUnits)
+        return units.push_back(single(static_cast<unichar>(code)));
+    if (code > kLastCodePoint)
+        return units.push_back(kReplacement);
+    units.push_back(static_cast<unichar>(0xD800 + ((code - kFirstOfTwoUnits) >> 10)));
+    units.push_back(static_cast<unichar>(0xDC00 + ((code - kFirstOfTwoUnits) & 0x3FF)));
 }
 } // namespace
 
@@ -38,12 +53,18 @@ std::wstring NSStringToWstring(NSString* text)
         if (isHighSurrogate(unit) && isLowSurrogate(units[index + 1]))
             wide += joined(unit, units[++index]);
         else
-            wide += isHighSurrogate(unit) || isLowSurrogate(unit) ? kReplacement : static_cast<wchar_t>(unit);
+            wide += static_cast<wchar_t>(single(unit));
     }
     return wide;
 }
 
+// Not by way of UTF-8, in which the names of some files are no text.
 NSString* wcharToNSString(const wchar_t* text)
 {
-    return text ? [NSString stringWithUTF8String:tessel::toUtf8(text).c_str()] : nil;
+    if (!text)
+        return nil;
+    std::vector<unichar> units;
+    for (; *text; ++text)
+        append(units, static_cast<char32_t>(*text));
+    return [NSString stringWithCharacters:units.data() length:units.size()];
 }

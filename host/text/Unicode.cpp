@@ -10,10 +10,19 @@ namespace
 {
 constexpr char32_t kReplacement = 0xFFFD;
 constexpr char32_t kLastCodePoint = 0x10FFFF;
+// A byte that is no text stands as this and the byte: a private character at the very end of Unicode.
+constexpr char32_t kByte = 0x10FE00;
+constexpr char32_t kFirstByte = kByte | 0x80;
+constexpr char32_t kLastByte = kByte | 0xFF;
 
 bool isScalar(char32_t code)
 {
     return code <= kLastCodePoint && (code < 0xD800 || code > 0xDFFF);
+}
+
+bool isByte(char32_t code)
+{
+    return code >= kFirstByte && code <= kLastByte;
 }
 
 wchar_t foldOne(wchar_t character)
@@ -41,7 +50,7 @@ char32_t takeCodePoint(std::string_view& text)
     constexpr char32_t kSmallest[] = {0, 0, 0x80, 0x800, 0x10000};
     const auto first = static_cast<unsigned char>(text.front());
     const std::size_t length = sequenceLength(first);
-    char32_t code = length ? first & kFirstByteMask[length] : kReplacement;
+    char32_t code = length ? first & kFirstByteMask[length] : 0;
     bool sound = length != 0 && length <= text.size();
     for (std::size_t i = 1; sound && i < length; ++i)
     {
@@ -49,9 +58,9 @@ char32_t takeCodePoint(std::string_view& text)
         sound = (next & 0xC0) == 0x80;
         code = code << 6 | (next & 0x3Fu);
     }
-    sound = sound && code >= kSmallest[length] && isScalar(code);
+    sound = sound && code >= kSmallest[length] && isScalar(code) && !isByte(code);
     text.remove_prefix(sound ? length : 1);
-    return sound ? code : kReplacement;
+    return sound ? code : kByte | first;
 }
 
 void appendUtf8(std::string& utf8, char32_t code)
@@ -95,9 +104,25 @@ std::string toUtf8(std::wstring_view text)
     for (const wchar_t character : text)
     {
         const auto code = static_cast<char32_t>(character);
-        appendUtf8(utf8, isScalar(code) ? code : kReplacement);
+        if (isByte(code))
+            utf8 += static_cast<char>(code & 0xFF);
+        else
+            appendUtf8(utf8, isScalar(code) ? code : kReplacement);
     }
     return utf8;
+}
+
+std::wstring withReadableBytes(std::wstring_view text)
+{
+    constexpr wchar_t kDigits[] = L"0123456789ABCDEF";
+    std::wstring readable;
+    readable.reserve(text.size());
+    for (const wchar_t character : text)
+        if (const auto code = static_cast<char32_t>(character); isByte(code))
+            readable += {L'\\', L'x', kDigits[code >> 4 & 0xF], kDigits[code & 0xF]};
+        else
+            readable += character;
+    return readable;
 }
 
 std::wstring foldCase(std::wstring_view text)

@@ -1,5 +1,9 @@
-// Conversions between the encodings that meet in the host. None of them fails: what is not text becomes
-// U+FFFD.
+// Conversions between the encodings that meet in the host. None of them fails.
+//
+// The name of a file need not be text. In a wide text a byte NN of it that is no UTF-8 stands as the private
+// character U+10FENN, and becomes that byte again on the way back: every file is found by its wide name. The
+// private character itself, should a name contain it, stands as its four bytes. Halves of surrogate pairs
+// would do as well, were they not refused by the platform's strings.
 #pragma once
 
 #include <string>
@@ -8,7 +12,11 @@
 namespace tessel
 {
 std::wstring toWide(std::string_view utf8);
+// What is no character at all becomes U+FFFD.
 std::string toUtf8(std::wstring_view text);
+
+// The text for a person's eyes: bytes that are no text are written as escapes, \xFF.
+std::wstring withReadableBytes(std::wstring_view text);
 
 // The text with every character folded for comparison without regard to case (simple case folding of
 // Unicode, independent of the locale).

@@ -8,6 +8,7 @@
 
 #include <unistd.h>
 
+#include "host/text/Unicode.h"
 #include "host/ui/SessionEnd.h"
 #include "host/ui/Waiting.h"
 #include "host/ui/platform/Windowing.h"
@@ -20,6 +21,11 @@ bool somebodyIsThere()
 {
     return [NSApp modalWindow] != nil || isatty(STDIN_FILENO);
 }
+
+NSString* readable(const wchar_t* text)
+{
+    return text ? wcharToNSString(tessel::withReadableBytes(text).c_str()) : nil;
+}
 } // namespace
 
 int tsuiShowMessageBox(const wchar_t* text, const wchar_t* detail, unsigned style, void* parent)
@@ -30,8 +36,7 @@ int tsuiShowMessageBox(const wchar_t* text, const wchar_t* detail, unsigned styl
     if (somebodyIsThere() && tsuiHasDisplay() && tsuiPrepareWindows() && !tessel::sessionIsToEnd())
     {
         const tessel::Question question;
-        tessel::windowing::runMessage(wcharToNSString(text), wcharToNSString(detail),
-                                      style & MB_ICONEXCLAMATION);
+        tessel::windowing::runMessage(readable(text), readable(detail), style & MB_ICONEXCLAMATION);
         answer = IDOK;
         if (![NSApp modalWindow])
             tsuiFinishWindows();

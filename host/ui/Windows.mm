@@ -6,6 +6,7 @@
 #include <wincompat/winstring.h>
 
 #include "host/platform/ToolkitPlaces.h"
+#include "host/text/platform/FileNames.h"
 #include "host/ui/KeptSignals.h"
 #include "host/ui/SessionEnd.h"
 #include "host/ui/Waiting.h"
@@ -27,6 +28,7 @@ NSString* toolkitFolder()
 void prepare()
 {
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    tessel::nameEveryFile();
     const tessel::KeptSignals signals; // the display's backend would take Ctrl-C and the wish to end
     tessel::windowing::prepareToolkit(toolkitFolder());
     tessel::windowing::chooseLook();

@@ -6,6 +6,9 @@
 
 #include "../tessel/tsdefs.h"
 
+// The names of files need not be text. A byte NN of such a name is the character U+10FENN here, in all wide
+// texts and strings of the host, and the file is found by it.
+
 // The text as 4-byte wide characters; empty for nil.
 TESSEL_API std::wstring NSStringToWstring(NSString* text);
 

@@ -40,6 +40,29 @@ TEST_F(FilePanelNames, OfExistingFilesAreTheChoice)
          }});
 }
 
+TEST_F(FilePanelNames, ThatAreNoTextAreWrittenWithEscapesAndTakenSo)
+{
+    const std::wstring odd = file("odd\xFF.lsp");
+    const std::wstring inner = file("r\xE9pertoire/a.lsp");
+    use({[&]
+         {
+             selectFilesIn(mPanel, {L"odd\\xFF.lsp"});
+             EXPECT_EQ(L"odd\\xFF.lsp", name());
+             EXPECT_THAT(chosen(), ElementsAre(odd));
+             typeNameInto(mPanel, @"\"gel.omp\" \"odd\\xFF.lsp\"");
+             EXPECT_THAT(chosen(), ElementsAre(file("gel.omp"), odd));
+             typeNameInto(mPanel, @"r\\xE9pertoire");
+             pressKey(mPanel, @"\r");
+         },
+         [&] { return shown() == std::vector<std::wstring>{L"a.lsp"}; },
+         [&]
+         {
+             EXPECT_TRUE(button(L"r\\xE9pertoire"));
+             clickRow(table(), 0);
+         },
+         [&] { return chosen() == std::vector{inner}; }});
+}
+
 TEST_F(FilePanelNames, EnableTheDefaultButton)
 {
     use({[this]

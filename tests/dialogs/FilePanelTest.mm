@@ -256,9 +256,9 @@ TEST_F(FilePanelList, LivesWithOddNames)
     std::ofstream((mFolder / "bad\xE9.lsp").string()).put('x');
     use({[this]
          {
-             EXPECT_THAT(shown(), ElementsAre(L"new\\nline.lsp", L"q\"uote #%41?.lsp"));
+             EXPECT_THAT(shown(), ElementsAre(L"bad\\xE9.lsp", L"new\\nline.lsp", L"q\"uote #%41?.lsp"));
              [table() selectAll:nil];
-             EXPECT_THAT(chosen(), ElementsAre((mFolder / "new\nline.lsp").wstring(),
+             EXPECT_THAT(chosen(), ElementsAre(file("bad\xE9.lsp"), (mFolder / "new\nline.lsp").wstring(),
                                                (mFolder / "q\"uote #%41?.lsp").wstring()));
          }});
 }

@@ -54,6 +54,14 @@ TEST_F(FilePath, KeepsEveryCharacterOfItsPath)
     EXPECT_EQ(L"/none/" + name, [make(wcharToNSString((L"/none/" + name).c_str())) path].Text());
 }
 
+TEST_F(FilePath, KeepsBytesThatAreNoText)
+{
+    const std::wstring odd = file("r\xE9pertoire/odd\xFF.lsp");
+    EXPECT_EQ(odd, [make(text(odd)) path].Text());
+    EXPECT_EQ(L"odd\U0010FEFF.lsp", wide([make(text(odd)) fileName]));
+    EXPECT_EQ((mFolder.path().wstring() + L"/r\U0010FEE9pertoire"), wide([make(text(odd)) filePath]));
+}
+
 TEST_F(FilePath, ReplacesWhatIsHalfACharacter)
 {
     NSString* halves = [[[HalvesOfCharacters alloc] init] autorelease];

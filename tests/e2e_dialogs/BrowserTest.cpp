@@ -1,6 +1,7 @@
 // Loading files that are chosen in the panel.
 #include "tests/e2e_dialogs/DialogTest.h"
 
+using testing::AllOf;
 using testing::HasSubstr;
 using testing::Not;
 
@@ -142,6 +143,39 @@ TEST_F(DialogBrowser, StopsAtTheFileThatCannotBeLoaded)
     EXPECT_THAT(output, Not(HasSubstr(listedIn("b.zmb", files()))));
     EXPECT_THAT(output, Not(HasSubstr("c.lsp")));
     EXPECT_THAT(output, Not(HasSubstr("loaded.\n"))) << "nothing was completed that could be summed up";
+}
+
+// Names that another system wrote in another encoding.
+TEST_F(DialogBrowser, LoadsFilesWhoseNamesAreNoTextAndFindsThemAgain)
+{
+    mSession.folder().write("files/r\xE9pertoire/odd\xFF.lsp", "(write-line \"odd Lisp runs\")\n");
+    std::filesystem::copy(std::filesystem::path(SAMPLES_FOLDER) / "gears.omp",
+                          files() / "r\xE9pertoire/gears\xFE.omp");
+    open();
+    click(places::kAddToHistory);
+    mScreen.doubleClick(mDialog, places::file(0)); // into the folder
+    shoot("folder");
+    click(places::file(0));
+    mScreen.clickHolding("shift", mDialog, places::file(1));
+    shoot("selected");
+    click(places::kLoad);
+    EXPECT_TRUE(prints("2 applications were loaded.\n"));
+    shoot("loaded");
+    click(places::kHistoryTab);
+    click(places::tableRow(0));
+    click(places::kAddToStartupSuite);
+    EXPECT_TRUE(prints("gears\\xFE.omp was added to the Startup Suite.\n"));
+    shoot("suite");
+    EXPECT_THAT(closeAndEnd(), AllOf(HasSubstr("odd Lisp runs"), HasSubstr("  gears\\xFE.omp ")));
+    const std::string shownFolder = files().string() + "/r\\xE9pertoire/";
+    EXPECT_EQ(stored("History"), "NumHistory = 2\n1History = " + shownFolder +
+                                     "gears\\xFE.omp\n2History = " + shownFolder + "odd\\xFF.lsp\n");
+    EXPECT_EQ(stored("Startup"), "NumStartup = 1\n1Startup = " + shownFolder + "gears\\xFE.omp\n");
+
+    open(); // with the History in front
+    mScreen.doubleClick(mDialog, places::tableRow(1));
+    EXPECT_TRUE(prints(wasLoaded("odd\\xFF.lsp")));
+    EXPECT_THAT(closeAndEnd(), AllOf(HasSubstr("odd Lisp runs"), HasSubstr("  gears\\xFE.omp ")));
 }
 
 TEST_F(DialogBrowser, ShowsTheFilesOfTheChosenTypeOnly)

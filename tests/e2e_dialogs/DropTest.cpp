@@ -39,6 +39,14 @@ TEST_F(DialogDrop, LoadsTwoFilesDroppedOnTheTable)
     EXPECT_THAT(output, HasSubstr("many2.lsp runs"));
 }
 
+TEST_F(DialogDrop, LoadsAFileWhoseNameIsNoText)
+{
+    const auto file = mSession.folder().write("files/odd\xFF #%41.lsp", "(write-line \"odd Lisp runs\")\n");
+    open();
+    dragFiles({file.string()}, kTable, [this] { EXPECT_TRUE(prints(wasLoaded("odd\\xFF #%41.lsp"))); });
+    EXPECT_THAT(closeAndEnd(), HasSubstr("odd Lisp runs"));
+}
+
 TEST_F(DialogDrop, LoadsFiftyFilesDroppedOnTheTable)
 {
     const auto paths = writeManyLisp(50);

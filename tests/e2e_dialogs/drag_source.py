@@ -2,13 +2,15 @@
 import pathlib
 import sys
 
-import gi
+uris = [pathlib.Path(name).resolve().as_uri() for name in sys.argv[1:]]
+del sys.argv[1:]  # the toolkit reads them too, and takes no names that are not text
+
+import gi  # noqa: E402
 
 gi.require_version("Gdk", "3.0")
 gi.require_version("Gtk", "3.0")
 from gi.repository import Gdk, Gtk  # noqa: E402
 
-uris = [pathlib.Path(name).resolve().as_uri() for name in sys.argv[1:]]
 window = Gtk.Window(title="Files to drag")
 window.set_default_size(120, 60)
 window.move(20, 20)

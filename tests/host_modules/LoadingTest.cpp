@@ -33,6 +33,21 @@ TEST_F(Loading, LetsAClassInABundleFindTheBundlesTexts)
     EXPECT_EQ(output(), "Classes.bundle: message 1\nGrüße aus dem Bündel\n");
 }
 
+TEST_F(Loading, TakesNamesThatAreNoText)
+{
+    const auto place = mFolder / "r\xE9pertoire";
+    std::filesystem::create_directory(place);
+    std::filesystem::copy(std::filesystem::path(FIXTURE_MODULES) / "Good.zmb", place / "odd\xFF.zmb");
+    std::filesystem::copy(std::filesystem::path(FIXTURE_MODULES) / "Classes.bundle", place / "odd\xFE.bundle",
+                          std::filesystem::copy_options::recursive);
+    EXPECT_TRUE(load(place / "odd\xFF.zmb"));
+    EXPECT_TRUE(load(place / "odd\xFE.bundle"));
+    EXPECT_EQ(output(), "odd\\xFF.zmb: message 1\nodd\\xFE.bundle: message 1\nGrüße aus dem Bündel\n");
+    EXPECT_TRUE(unload(place / "odd\xFE.bundle"));
+    EXPECT_TRUE(unload(place / "odd\xFF.zmb"));
+    EXPECT_EQ(names(), L"");
+}
+
 TEST_F(Loading, TellsEachApplicationItsOwnPathAndTheOuterOneAgainAfterwards)
 {
     fixture("Good.zmb");

@@ -6,14 +6,17 @@ using tessel::equalIgnoringCase;
 using tessel::foldCase;
 using tessel::toUtf8;
 using tessel::toWide;
+using tessel::withReadableBytes;
 
 namespace
 {
-constexpr const wchar_t* kBad = L"\xFFFD";
-
-std::wstring bad(std::size_t count)
+// The characters that the bytes stand as.
+std::wstring asBytes(std::string_view bytes)
 {
-    return std::wstring(count, kBad[0]);
+    std::wstring text;
+    for (const char byte : bytes)
+        text += static_cast<wchar_t>(0x10FE00 + static_cast<unsigned char>(byte));
+    return text;
 }
 } // namespace
 
@@ -30,41 +33,66 @@ TEST(Utf8, ComesBackAsItWentForEveryCodePoint)
 {
     std::wstring text;
     for (char32_t code = 1; code <= 0x10FFFF; ++code)
-        if (code < 0xD800 || code > 0xDFFF)
+        if ((code < 0xD800 || code > 0xDFFF) && (code < 0x10FE80 || code > 0x10FEFF))
             text += static_cast<wchar_t>(code);
     EXPECT_TRUE(toWide(toUtf8(text)) == text);
 }
 
-TEST(Utf8, ReplacesBytesThatStartNothing)
+// Names of files, which may be any bytes.
+TEST(Utf8, KeepsBytesThatStartNothing)
 {
-    EXPECT_EQ(toWide("a\x80z"), L"a" + bad(1) + L"z");
-    EXPECT_EQ(toWide("\xFF\xFE"), bad(2));
-    EXPECT_EQ(toWide("\xF8\x88\x80\x80\x80"), bad(5));
+    EXPECT_EQ(toWide("a\x80z"), L"a" + asBytes("\x80") + L"z");
+    EXPECT_EQ(toWide("\xFF\xFE"), asBytes("\xFF\xFE"));
+    EXPECT_EQ(toWide("\xF8\x88\x80\x80\x80"), asBytes("\xF8\x88\x80\x80\x80"));
 }
 
-TEST(Utf8, ReplacesASequenceThatIsCutShort)
+TEST(Utf8, KeepsTheBytesOfASequenceThatIsCutShort)
 {
-    EXPECT_EQ(toWide("a\xC3"), L"a" + bad(1));
-    EXPECT_EQ(toWide("\xE2\x82"), bad(2));
-    EXPECT_EQ(toWide("\xE2z"), bad(1) + L"z");
-    EXPECT_EQ(toWide("\xF0\x9F\x98z"), bad(3) + L"z");
+    EXPECT_EQ(toWide("a\xC3"), L"a" + asBytes("\xC3"));
+    EXPECT_EQ(toWide("\xE2\x82"), asBytes("\xE2\x82"));
+    EXPECT_EQ(toWide("\xE2z"), asBytes("\xE2") + L"z");
+    EXPECT_EQ(toWide("\xF0\x9F\x98z"), asBytes("\xF0\x9F\x98") + L"z");
 }
 
-TEST(Utf8, ReplacesOverlongSequences)
+TEST(Utf8, KeepsTheBytesOfOverlongSequences)
 {
-    EXPECT_EQ(toWide("\xC0\xAF"), bad(2));
-    EXPECT_EQ(toWide("\xC1\xBF"), bad(2));
-    EXPECT_EQ(toWide("\xE0\x80\xAF"), bad(3));
-    EXPECT_EQ(toWide("\xF0\x80\x80\xAF"), bad(4));
+    for (const char* bytes : {"\xC0\xAF", "\xC1\xBF", "\xE0\x80\xAF", "\xF0\x80\x80\xAF"})
+        EXPECT_EQ(toWide(bytes), asBytes(bytes));
 }
 
-TEST(Utf8, ReplacesSurrogatesAndWhatIsBeyondTheLastCodePoint)
+TEST(Utf8, KeepsTheBytesOfSurrogatesAndOfWhatIsBeyondTheLastCodePoint)
 {
-    EXPECT_EQ(toWide("\xED\xA0\x80"), bad(3));
-    EXPECT_EQ(toWide("\xF4\x90\x80\x80"), bad(4));
+    for (const char* bytes : {"\xED\xA0\x80", "\xF4\x90\x80\x80"})
+        EXPECT_EQ(toWide(bytes), asBytes(bytes));
+}
+
+TEST(Utf8, GivesEveryByteBack)
+{
+    for (int byte = 1; byte <= 0xFF; ++byte)
+    {
+        const std::string name = std::string("a") + static_cast<char>(byte) + "z";
+        EXPECT_EQ(toUtf8(toWide(name)), name);
+    }
+}
+
+TEST(Utf8, GivesTheCharactersBackThatBytesStandAs)
+{
+    const std::string name = "\xF4\x8F\xBA\x80 \xF4\x8F\xBB\xBF"; // U+10FE80, U+10FEFF
+    EXPECT_EQ(toWide(name), asBytes("\xF4\x8F\xBA\x80") + L" " + asBytes("\xF4\x8F\xBB\xBF"));
+    EXPECT_EQ(toUtf8(toWide(name)), name);
+}
+
+TEST(Utf8, ReplacesWhatIsNoCharacter)
+{
     const wchar_t outside[] = {static_cast<wchar_t>(0xD800), static_cast<wchar_t>(0x110000),
                                static_cast<wchar_t>(0xFFFFFFFF), L'\0'};
     EXPECT_EQ(toUtf8(outside), "\xEF\xBF\xBD\xEF\xBF\xBD\xEF\xBF\xBD");
+}
+
+TEST(Utf8, WritesBytesAsEscapesWhereAPersonReads)
+{
+    EXPECT_EQ(withReadableBytes(toWide("bad\xFF\x80 gr\xC3\xBC\n")), L"bad\\xFF\\x80 gr\u00FC\n");
+    EXPECT_EQ(withReadableBytes(L"\U0010FE7F\U0010FF00"), L"\U0010FE7F\U0010FF00");
 }
 
 TEST(Utf8, KeepsNulCharacters)

@@ -9,10 +9,14 @@ namespace
 {
 constexpr wchar_t kFirstVisible = L' ';
 constexpr wchar_t kDelete = 0x7F;
+// The host's characters for bytes of names that are no text.
+constexpr wchar_t kFirstByte = 0x10FE80;
+constexpr wchar_t kLastByte = 0x10FEFF;
 
 bool IsVisible(wchar_t character)
 {
-    return character >= kFirstVisible && character != kDelete;
+    return character >= kFirstVisible && character != kDelete &&
+           (character < kFirstByte || character > kLastByte);
 }
 
 std::wstring EscapeFor(wchar_t character)
@@ -27,7 +31,7 @@ std::wstring EscapeFor(wchar_t character)
     case L'\t':
         return L"\\t";
     default:
-        return {L'\\', L'x', kDigits[character >> 4], kDigits[character & 0xF]};
+        return {L'\\', L'x', kDigits[character >> 4 & 0xF], kDigits[character & 0xF]};
     }
 }
 } // namespace

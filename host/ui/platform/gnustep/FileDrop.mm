@@ -7,7 +7,9 @@
 #include <objc/runtime.h>
 
 #include <tesselui/tsuieach.h>
+#include <wincompat/winstring.h>
 
+#include "host/text/Unicode.h"
 #include "host/ui/platform/gnustep/Behaviour.h"
 #include "host/ui/platform/gnustep/DisplayProbe.h"
 #include "host/ui/platform/gnustep/DropSelection.h"
@@ -21,6 +23,23 @@
 - (id)initWithUriList:(NSString*)uris;
 @end
 
+namespace
+{
+// The toolkit has no path for a name that is no text. Escapes are bytes, and so are the characters of
+// Latin-1.
+NSString* pathOf(NSURL* url)
+{
+    if ([url path])
+        return [url path];
+    NSString* place = [url resourceSpecifier];
+    if ([place hasPrefix:@"//"]) // a name of this computer comes first
+        place = [place substringFromIndex:[[url host] length] + 2];
+    NSString* characters = [place stringByReplacingPercentEscapesUsingEncoding:NSISOLatin1StringEncoding];
+    const char* bytes = [characters cStringUsingEncoding:NSISOLatin1StringEncoding];
+    return bytes ? wcharToNSString(tessel::toWide(bytes).c_str()) : nil;
+}
+} // namespace
+
 @implementation TsDroppedFiles
 
 - (id)initWithUriList:(NSString*)uris
@@ -32,8 +51,9 @@
              [uris componentsSeparatedByCharactersInSet:[NSCharacterSet newlineCharacterSet]]))
     {
         NSURL* url = [line length] ? [NSURL URLWithString:line] : nil;
-        if ([url isFileURL])
-            [paths addObject:[url path]];
+        NSString* path = [url isFileURL] ? pathOf(url) : nil;
+        if (path)
+            [paths addObject:path];
     }
     mPaths = [paths copy];
     return self;

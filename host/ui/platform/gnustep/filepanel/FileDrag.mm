@@ -1,5 +1,9 @@
 #import "host/ui/platform/gnustep/filepanel/FileDrag.h"
 
+#include "host/ui/platform/gnustep/filepanel/PanelState.h"
+
+using namespace tessel::filepanel;
+
 namespace
 {
 constexpr unichar kEscape = 0x1B;
@@ -10,7 +14,7 @@ constexpr CGFloat kBesideMouse = 12;
 NSString* labelOf(NSArray* paths)
 {
     if ([paths count] == 1)
-        return [[paths objectAtIndex:0] lastPathComponent];
+        return string(shownName(bytes([[paths objectAtIndex:0] lastPathComponent])));
     return [NSString stringWithFormat:@"%lu files", static_cast<unsigned long>([paths count])];
 }
 

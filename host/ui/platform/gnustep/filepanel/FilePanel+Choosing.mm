@@ -53,17 +53,25 @@ bool isHost(NSString* path)
     return entries;
 }
 
+// The path of a name as it stands in the name field, where names that are no text are written with escapes.
+- (std::string)pathOfTypedName:(const std::string&)name
+{
+    const std::string path = typedPath(name, mState->folder, bytes(NSHomeDirectory()));
+    const auto row =
+        std::ranges::find(mState->entries, name, [](const Entry& entry) { return readableName(entry.name); });
+    return fileExists(path) || row == mState->entries.end() ? path : mState->pathOf(*row);
+}
+
 // The paths that stand in the name field: one name is taken as it is where there is such a file.
 - (std::vector<std::string>)typedPaths
 {
     const std::string text = bytes([self typedText]);
-    const std::string home = bytes(NSHomeDirectory());
-    const std::string whole = typedPath(text, mState->folder, home);
+    const std::string whole = [self pathOfTypedName:text];
     if (text.empty() || fileExists(whole))
         return text.empty() ? std::vector<std::string>() : std::vector<std::string>{whole};
     std::vector<std::string> paths;
     for (const std::string& name : typedNames(text))
-        paths.push_back(typedPath(name, mState->folder, home));
+        paths.push_back([self pathOfTypedName:name]);
     return paths;
 }
 
@@ -98,7 +106,7 @@ bool isHost(NSString* path)
     std::vector<std::string> names;
     for (const Entry& entry : [self selectedEntries])
         if (mChoosesFolders || !entry.isWalkedThrough())
-            names.push_back(entry.name);
+            names.push_back(readableName(entry.name));
     mState->typed.clear();
     [mName setStringValue:string(fieldText(names))];
 }
@@ -170,9 +178,9 @@ bool isHost(NSString* path)
         entries = readFolder(folder, start.beginning.starts_with('.'));
     std::vector<std::string> names;
     for (const Entry& entry : entries)
-        if (beginsLike(entry.name, start.beginning) && isUtf8(entry.name) &&
+        if (beginsLike(readableName(entry.name), start.beginning) &&
             [self isListed:string(folder + "/" + entry.name)])
-            names.push_back(entry.name);
+            names.push_back(readableName(entry.name));
     std::ranges::sort(names);
     return names;
 }

@@ -70,14 +70,14 @@ NSString* titleOf(NSString* identifier)
            [delegate panel:self shouldShowFilename:path];
 }
 
-// What the delegate leaves of the files. A path that is no text cannot be asked about.
+// What the delegate leaves of the files.
 - (std::vector<Entry>)entriesToShow
 {
     std::vector<Entry> shown;
     for (Entry& entry : readFolder(mState->folder, [self showsHiddenFiles]))
     {
-        NSString* path = isUtf8(entry.name) ? string(mState->pathOf(entry)) : nil;
-        if (!path || ![self isListed:path])
+        NSString* path = string(mState->pathOf(entry));
+        if (![self isListed:path])
             continue;
         entry.isPackage = entry.isFolder && [self isPackage:path];
         shown.push_back(std::move(entry));

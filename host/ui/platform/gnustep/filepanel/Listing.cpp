@@ -10,6 +10,8 @@
 #include <dirent.h>
 #include <sys/stat.h>
 
+#include "host/text/Unicode.h"
+
 namespace tessel::filepanel
 {
 namespace
@@ -65,18 +67,6 @@ bool isFolder(const dirent& file, const std::string& folder)
 bool isListed(const std::string& name, bool withHiddenFiles)
 {
     return name != "." && name != ".." && (withHiddenFiles || !name.starts_with('.'));
-}
-
-// Of a character in UTF-8, by its first byte; 0: no character begins with it.
-std::size_t lengthOfCharacter(unsigned char first)
-{
-    if (first < 0x80)
-        return 1;
-    if (first >= 0xC2 && first < 0xE0)
-        return 2;
-    if (first >= 0xE0 && first < 0xF0)
-        return 3;
-    return first >= 0xF0 && first < 0xF5 ? 4 : 0;
 }
 
 std::string escaped(unsigned char byte)
@@ -151,21 +141,6 @@ std::wstring sortKey(const std::string& name)
     return key;
 }
 
-bool isUtf8(const std::string& name)
-{
-    for (std::size_t place = 0; place < name.size();)
-    {
-        const std::size_t length = lengthOfCharacter(static_cast<unsigned char>(name[place]));
-        if (length == 0 || place + length > name.size())
-            return false;
-        for (std::size_t next = 1; next < length; ++next)
-            if ((static_cast<unsigned char>(name[place + next]) & 0xC0) != 0x80)
-                return false;
-        place += length;
-    }
-    return true;
-}
-
 std::string shownName(const std::string& name)
 {
     std::string shown;
@@ -176,7 +151,12 @@ std::string shownName(const std::string& name)
             shown += escaped(static_cast<unsigned char>(character));
         else
             shown += character;
-    return shown;
+    return readableName(shown);
+}
+
+std::string readableName(const std::string& name)
+{
+    return toUtf8(withReadableBytes(toWide(name)));
 }
 
 std::string kindOf(const Entry& entry)

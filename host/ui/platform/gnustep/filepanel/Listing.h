@@ -45,8 +45,8 @@ void sortEntries(std::vector<Entry>& entries, Order order);
 // Names in a person's order: whatever their case, "file9" before "file10".
 std::wstring sortKey(const std::string& name);
 
-// Whether the name is text at all.
-bool isUtf8(const std::string& name);
+// The name as text, also where it is none: its bytes are then written as escapes (\xFF).
+std::string readableName(const std::string& name);
 
 // The name in one line: what is no visible character is written as an escape (\n, \x1B).
 std::string shownName(const std::string& name);

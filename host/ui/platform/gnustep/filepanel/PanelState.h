@@ -2,11 +2,13 @@
 #pragma once
 
 #import <Foundation/Foundation.h>
+#include <wincompat/winstring.h>
 
 #include <optional>
 #include <string>
 #include <vector>
 
+#include "host/text/Unicode.h"
 #include "host/ui/platform/gnustep/filepanel/Listing.h"
 
 namespace tessel::filepanel
@@ -26,14 +28,14 @@ struct PanelState
     std::string pathOf(const Entry& entry) const { return (folder == "/" ? "" : folder) + "/" + entry.name; }
 };
 
+// The file system's names, which need not be text, and the toolkit's.
 inline std::string bytes(NSString* text)
 {
-    const char* utf8 = [text UTF8String];
-    return utf8 ? utf8 : "";
+    return toUtf8(NSStringToWstring(text));
 }
 
 inline NSString* string(const std::string& bytes)
 {
-    return [NSString stringWithUTF8String:bytes.c_str()];
+    return wcharToNSString(toWide(bytes).c_str());
 }
 } // namespace tessel::filepanel
