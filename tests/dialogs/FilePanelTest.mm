@@ -1,13 +1,39 @@
 // The list of the host's file panel, by mouse and keyboard.
 #include "tests/dialogs/support/FilePanelTest.h"
 
+#include <ctime>
 #include <fstream>
+
+#include <sys/inotify.h>
+#include <unistd.h>
+#include <utime.h>
 
 using testing::ElementsAre;
 using testing::IsEmpty;
 
 namespace
 {
+// Takes all that the system has for this user, so that the panel gets none.
+class NoWatches
+{
+public:
+    NoWatches()
+    {
+        for (int taken = inotify_init1(IN_CLOEXEC); taken >= 0; taken = inotify_init1(IN_CLOEXEC))
+            mTaken.push_back(taken);
+    }
+    ~NoWatches()
+    {
+        for (const int taken : mTaken)
+            close(taken);
+    }
+    NoWatches(const NoWatches&) = delete;
+    NoWatches& operator=(const NoWatches&) = delete;
+
+private:
+    std::vector<int> mTaken;
+};
+
 class FilePanelList : public FilePanelTest
 {
 protected:
@@ -20,6 +46,19 @@ protected:
     {
         for (int number = 100; number < 100 + count; ++number)
             mFolder.write("tool" + std::to_string(number) + ".lsp", "");
+    }
+    // In the middle of the year 2001.
+    void giveOldDate(const std::string& name)
+    {
+        constexpr std::time_t kOld = 992'600'000;
+        const utimbuf times{kOld, kOld};
+        ASSERT_EQ(0, utime((mFolder / name).c_str(), &times));
+    }
+    // What the row says about its file's date; the text of a row that nobody has looked at is made now.
+    std::wstring dateIn(NSInteger row)
+    {
+        NSTableColumn* column = [table() tableColumnWithIdentifier:@"date"];
+        return wide([[table() dataSource] tableView:table() objectValueForTableColumn:column row:row]);
     }
     void arrow(unichar key, NSUInteger modifiers = 0)
     {
@@ -205,6 +244,74 @@ TEST_F(FilePanelList, ShowsWhatComesIntoTheFolderAndKeepsItsPlace)
              EXPECT_EQ(first + 1, firstVisibleRow());
              EXPECT_THAT(chosen(), ElementsAre(file("tool250.lsp")));
          }});
+}
+
+TEST_F(FilePanelList, ShowsNewDatesOfFilesAndKeepsItsPlace)
+{
+    writeMany(200);
+    NSInteger first = 0;
+    use({[&]
+         {
+             [table() scrollRowToVisible:150];
+             first = firstVisibleRow();
+             selectFilesIn(mPanel, {L"tool250.lsp"});
+             EXPECT_NE(L"2001", dateIn(150).substr(0, 4));
+             giveOldDate("tool250.lsp");
+         },
+         [&] { return dateIn(150).starts_with(L"2001-"); },
+         [&]
+         {
+             EXPECT_EQ(first, firstVisibleRow());
+             EXPECT_THAT(chosen(), ElementsAre(file("tool250.lsp")));
+         }});
+}
+
+TEST_F(FilePanelList, PutsAFileWhereItsNewDateBelongs)
+{
+    writeFiles({"a.lsp", "b.lsp", "c.lsp"});
+    use({[this]
+         {
+             [[table() delegate] tableView:table()
+                       didClickTableColumn:[table() tableColumnWithIdentifier:@"date"]];
+             selectFilesIn(mPanel, {L"c.lsp"});
+             giveOldDate("c.lsp");
+         },
+         [this] { return shown().front() == L"c.lsp"; },
+         [this]
+         {
+             EXPECT_THAT(chosen(), ElementsAre(file("c.lsp")));
+             EXPECT_THAT(selectedRows(), ElementsAre(0));
+         }});
+}
+
+TEST_F(FilePanelList, FollowsAFolderThatComesBack)
+{
+    writeFiles({"outer/inner/a.lsp"});
+    use({[this]
+         {
+             std::filesystem::remove_all(mFolder / "outer/inner");
+             mFolder.write("outer/inner/b.lsp", "");
+         },
+         [this] { return shown() == std::vector<std::wstring>{L"b.lsp"}; },
+         [this] { mFolder.write("outer/inner/c.lsp", ""); },
+         [this] {
+             return shown() == std::vector<std::wstring>{L"b.lsp", L"c.lsp"};
+         },
+         [this] { std::filesystem::rename(mFolder / "outer", mFolder / "elsewhere"); },
+         [this] { return folder() == mFolder.path().wstring(); }},
+        "outer/inner");
+}
+
+// As on the folders of other computers.
+TEST_F(FilePanelList, LooksForChangesWhereNobodyTellsOfThem)
+{
+    const NoWatches none;
+    writeFiles({"a.lsp"});
+    use({[this] { mFolder.write("b.lsp", ""); },
+         [this] {
+             return shown() == std::vector<std::wstring>{L"a.lsp", L"b.lsp"};
+         },
+         [this] { giveOldDate("a.lsp"); }, [this] { return dateIn(0).starts_with(L"2001-"); }});
 }
 
 TEST_F(FilePanelList, ShowsTheNearestFolderWhenItsOwnIsGone)

@@ -1,5 +1,5 @@
-// Names that are no text have no string here, and strings with the host's characters for their bytes lead to no
-// file. Whatever turns the one into the other goes through two methods of the file manager.
+// Names that are no text have no string here, and strings with the host's characters for their bytes lead to
+// no file. Whatever turns the one into the other goes through two methods of the file manager.
 #import <Foundation/Foundation.h>
 
 #include <wincompat/winstring.h>
@@ -47,8 +47,7 @@ void nameEveryFile()
     if (toolkitBytesOf)
         return;
     constexpr char kManager[] = "NSFileManager";
-    toolkitBytesOf =
-        windowing::standInFor(kManager, @selector(fileSystemRepresentationWithPath:), bytesOf);
+    toolkitBytesOf = windowing::standInFor(kManager, @selector(fileSystemRepresentationWithPath:), bytesOf);
     toolkitStringOf =
         windowing::standInFor(kManager, @selector(stringWithFileSystemRepresentation:length:), stringOf);
 }

@@ -96,6 +96,7 @@ NSString* titleOf(NSString* identifier)
 - (void)readEntries
 {
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+    [self watchFolder];
     mState->seen = stateOf(mState->folder);
     std::vector<Entry> entries = [self entriesToShow];
     [self sortEntries:entries];
@@ -198,22 +199,20 @@ NSString* titleOf(NSString* identifier)
     [NSObject cancelPreviousPerformRequestsWithTarget:self selector:@selector(finishPendingWork) object:nil];
 }
 
-- (void)lookForChanges:(NSTimer*)timer
-{
-    (void)timer;
-    if (mState->wanted == mState->folder && stateOf(mState->folder) != mState->seen)
-        [self listAgain];
-}
-
 - (void)sortRows
 {
     [self sortEntries:mState->entries];
 }
 
+- (void)sortAgain
+{
+    [self changeRowsBy:@selector(sortRows)];
+}
+
 - (void)sortBy:(NSString*)identifier
 {
     mState->order = afterClickOn(columnOf(identifier), mState->order);
-    [self changeRowsBy:@selector(sortRows)];
+    [self sortAgain];
     [self markSortedColumn];
 }
 

@@ -29,8 +29,9 @@ struct PanelState;
     NSButton* mCancel;
     NSView* mAccessory;
     CGFloat mAccessoryHeight; // what it asked for when it came
-    NSTimer* mWatch;
-    NSInteger mUpdates; // more than 0 while rows are selected by the panel itself
+    NSTimer* mLooks;          // for changes in a folder that cannot be watched
+    NSInteger mUpdates;       // more than 0 while rows are selected by the panel itself
+    BOOL mIsWatching;
     BOOL mChoosesFolders;
     BOOL mChoosesSeveral;
 }
@@ -54,10 +55,18 @@ struct PanelState;
 - (void)listFolder:(NSString*)folder;
 // The same folder again, with its place kept.
 - (void)listAgain;
-- (void)lookForChanges:(NSTimer*)timer;
+- (void)sortAgain;
 - (void)sortBy:(NSString*)column;
 - (void)markSortedColumn;
 - (BOOL)isListed:(NSString*)path;
+@end
+
+// FilePanel+Watching.mm: while the panel runs it shows what happens in its folder.
+@interface TsUIFilePanel (Watching)
+- (void)startWatching;
+- (void)stopWatching;
+// Watches the folder that shows; before it is read, so that nothing is missed.
+- (void)watchFolder;
 @end
 
 // FilePanel+Choosing.mm: which files are chosen, by rows or by typed names.

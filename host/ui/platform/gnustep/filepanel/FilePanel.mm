@@ -14,7 +14,6 @@ using namespace tessel::filepanel;
 namespace
 {
 const NSRect kFirstFrame = {{100, 100}, {750, 480}};
-constexpr NSTimeInterval kSecondsBetweenLooks = 0.5;
 
 // The toolkit's panel overrides these methods of a window for its own inside, which is not there.
 template <class Function> Function windowMethod(SEL selector)
@@ -211,12 +210,7 @@ template <class Function> Function windowMethod(SEL selector)
     [self fitOnScreen];
     [self recalculateKeyViewLoop];
     [self makeFirstResponder:mTable];
-    mWatch = [NSTimer timerWithTimeInterval:kSecondsBetweenLooks
-                                     target:self
-                                   selector:@selector(lookForChanges:)
-                                   userInfo:nil
-                                    repeats:YES];
-    [[NSRunLoop currentRunLoop] addTimer:mWatch forMode:NSModalPanelRunLoopMode];
+    [self startWatching];
     @try
     {
         // It comes to the front by this, and not before: only then is it known which window it belongs to.
@@ -224,8 +218,7 @@ template <class Function> Function windowMethod(SEL selector)
     }
     @finally
     {
-        [mWatch invalidate];
-        mWatch = nil;
+        [self stopWatching];
         [self rememberFolder];
         [self orderOut:self];
     }

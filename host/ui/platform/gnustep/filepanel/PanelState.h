@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "host/text/Unicode.h"
+#include "host/ui/platform/gnustep/filepanel/FolderWatch.h"
 #include "host/ui/platform/gnustep/filepanel/Listing.h"
 
 namespace tessel::filepanel
@@ -18,6 +19,9 @@ struct PanelState
     std::string wanted;              // the folder to show
     std::string folder;              // the one that shows
     std::optional<std::string> seen; // its state when it was read
+    FolderWatch watch;
+    FolderChanges changes;    // that have been heard of and not dealt with
+    bool isGathering = false; // they soon will be
     std::vector<Entry> entries;
     Order order;
     std::vector<std::string> chosen; // paths
