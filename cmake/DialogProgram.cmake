@@ -5,8 +5,10 @@ function(make_dialog_program target name)
   set(app "${CMAKE_CURRENT_BINARY_DIR}/${name}.app")
   set_target_properties(${target} PROPERTIES
     RUNTIME_OUTPUT_DIRECTORY "${app}" OUTPUT_NAME ${name} LINKER_LANGUAGE OBJCXX)
-  foreach(resource Modrig.xib ModrigStartupSuit.xib en.lproj/Localizable.strings)
-    set(source "${CMAKE_SOURCE_DIR}/modrig/resources/${resource}")
+  foreach(resource modrig/resources/Modrig.xib modrig/resources/ModrigStartupSuit.xib
+                   modrig/resources/en.lproj/Localizable.strings host/ui/resources/en.lproj/FilePanel.strings)
+    set(source "${CMAKE_SOURCE_DIR}/${resource}")
+    string(REGEX REPLACE "^.*/resources/" "" resource "${resource}")
     set(place "${app}/Resources/${resource}")
     add_custom_command(
       OUTPUT "${place}"

@@ -3,13 +3,19 @@
 
 #include <ctime>
 #include <fstream>
+#include <set>
 
+#include <objc/runtime.h>
 #include <sys/inotify.h>
 #include <unistd.h>
 #include <utime.h>
 
+#include <tesselui/tsuieach.h>
+#include <tesselui/tsuifilepanel.h>
+
 using testing::ElementsAre;
 using testing::IsEmpty;
+using testing::UnorderedElementsAre;
 
 namespace
 {
@@ -34,6 +40,49 @@ private:
     std::vector<int> mTaken;
 };
 
+using LocalizedString = NSString* (*)(id, SEL, NSString*, NSString*, NSString*);
+LocalizedString gLocalizedString;
+
+NSString* keyInBrackets(id bundle, SEL selector, NSString* key, NSString* value, NSString* table)
+{
+    if (![table isEqual:@"FilePanel"])
+        return gLocalizedString(bundle, selector, key, value, table);
+    return [NSString stringWithFormat:@"<%@>", key];
+}
+
+// A language whose words are the keys.
+class LanguageOfKeys
+{
+public:
+    LanguageOfKeys()
+    {
+        gLocalizedString = LocalizedString(method_setImplementation(kMethod, IMP(keyInBrackets)));
+    }
+    ~LanguageOfKeys() { method_setImplementation(kMethod, IMP(gLocalizedString)); }
+    LanguageOfKeys(const LanguageOfKeys&) = delete;
+    LanguageOfKeys& operator=(const LanguageOfKeys&) = delete;
+
+private:
+    const Method kMethod = class_getInstanceMethod([NSBundle class], @selector(localizedStringForKey:
+                                                                                               value:table:));
+};
+
+// What is written in the view and below it, but for the titles of folders.
+void collectTexts(NSView* view, std::set<std::wstring>& texts)
+{
+    if ([view isKindOfClass:NSClassFromString(@"TsPathBar")])
+        return;
+    if ([view isKindOfClass:[NSPopUpButton class]])
+        texts.insert(wide([(NSPopUpButton*)view itemTitleAtIndex:0]));
+    else if ([view isKindOfClass:[NSButton class]])
+        texts.insert(wide([(NSButton*)view title]));
+    else if ([view isKindOfClass:[NSTextField class]])
+        texts.insert(wide([(NSTextField*)view stringValue]));
+    texts.insert(wide([view toolTip]));
+    for (NSView* part : tsuiEach<NSView*>([view subviews]))
+        collectTexts(part, texts);
+}
+
 class FilePanelList : public FilePanelTest
 {
 protected:
@@ -55,9 +104,10 @@ protected:
         ASSERT_EQ(0, utime((mFolder / name).c_str(), &times));
     }
     // What the row says about its file's date; the text of a row that nobody has looked at is made now.
-    std::wstring dateIn(NSInteger row)
+    std::wstring dateIn(NSInteger row) { return textIn(@"date", row); }
+    std::wstring textIn(NSString* identifier, NSInteger row)
     {
-        NSTableColumn* column = [table() tableColumnWithIdentifier:@"date"];
+        NSTableColumn* column = [table() tableColumnWithIdentifier:identifier];
         return wide([[table() dataSource] tableView:table() objectValueForTableColumn:column row:row]);
     }
     void arrow(unichar key, NSUInteger modifiers = 0)
@@ -367,6 +417,42 @@ TEST_F(FilePanelList, LivesWithOddNames)
              [table() selectAll:nil];
              EXPECT_THAT(chosen(), ElementsAre(file("bad\xE9.lsp"), (mFolder / "new\nline.lsp").wstring(),
                                                (mFolder / "q\"uote #%41?.lsp").wstring()));
+         }});
+}
+
+TEST_F(FilePanelList, TakesEveryWordFromTheTableOfItsLanguage)
+{
+    const LanguageOfKeys language;
+    writeFiles({"a.lsp", "b", "c.bundle/c", "d/d"});
+    [mPanel release];
+    mPanel = [tsuiMakeFilePanel() retain];
+    std::set<std::wstring> texts;
+    use({[&]
+         {
+             collectTexts([mPanel contentView], texts);
+             for (NSTableColumn* column : tsuiEach<NSTableColumn*>([table() tableColumns]))
+                 texts.insert(wide([[column headerCell] stringValue]));
+             for (NSInteger row = 0; row < 4; ++row)
+                 texts.insert(textIn(@"kind", row));
+         }});
+    texts.erase(L"");
+    EXPECT_THAT(texts, UnorderedElementsAre(L"<UP>", L"<HOME>", L"<RECENT>", L"<RECENT_TIP>",
+                                            L"<NAME_COLUMN>  \u2191", L"<KIND_COLUMN>", L"<DATE_COLUMN>",
+                                            L"<FOLDER>", L"<PACKAGE>", L"<FILE>", L"<FILE_OF_KIND>",
+                                            L"<NAME_FIELD>", L"<HIDDEN_FILES>", L"<OPEN>", L"<CANCEL>"));
+}
+
+TEST_F(FilePanelList, SpeaksEnglish)
+{
+    writeFiles({"a.lsp", "b", "c.bundle/c", "d/d"});
+    use({[this]
+         {
+             for (const wchar_t* title : {L"Up", L"Home", L"Hidden files", L"Open", L"Cancel"})
+                 EXPECT_TRUE(button(title)) << title;
+             EXPECT_EQ(L"Folder", textIn(@"kind", 0));
+             EXPECT_EQ(L"LSP file", textIn(@"kind", 1));
+             EXPECT_EQ(L"File", textIn(@"kind", 2));
+             EXPECT_EQ(L"Package", textIn(@"kind", 3));
          }});
 }
 

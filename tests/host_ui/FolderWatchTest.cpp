@@ -71,7 +71,8 @@ TEST_F(WatchedFolder, NamesTheFilesThatAreChangedWhereTheyAre)
     FolderChanges changes = told();
     EXPECT_FALSE(changes.isOther);
     EXPECT_THAT(changes.written, testing::AllOf(Not(IsEmpty()), Each("a.lsp")));
-    std::filesystem::last_write_time(mPlace / "outer/inner/a.lsp", std::filesystem::file_time_type::clock::now());
+    std::filesystem::last_write_time(mPlace / "outer/inner/a.lsp",
+                                     std::filesystem::file_time_type::clock::now());
     changes = told();
     EXPECT_FALSE(changes.isOther);
     EXPECT_THAT(changes.written, testing::ElementsAre("a.lsp"));

@@ -18,14 +18,23 @@ std::vector<std::string> namesOf(const std::vector<Entry>& entries)
     return names;
 }
 
+const KindWords kWords{"Mappe", "Paket", "Datei", "Datei (%@)"};
+
+std::string kind(const Entry& entry)
+{
+    return kindOf(entry, kWords);
+}
+
 Entry file(const std::string& name, std::time_t changed = 0)
 {
-    return {name, sortKey(name), false, false, changed};
+    Entry entry{name, sortKey(name), {}, false, false, changed};
+    entry.kind = kind(entry);
+    return entry;
 }
 
 Entry folder(const std::string& name)
 {
-    return {name, sortKey(name), true, false, 0};
+    return {name, sortKey(name), kWords.folder, true, false, 0};
 }
 
 std::vector<std::string> sorted(std::vector<Entry> entries, Order order)
@@ -95,14 +104,16 @@ TEST(Listing, TurnsItsOrderRoundWithTheSecondClickOnAHeader)
 
 TEST(Listing, NamesKinds)
 {
-    EXPECT_EQ("LSP file", kindOf(file("a.lsp")));
-    EXPECT_EQ("File", kindOf(file("README")));
-    EXPECT_EQ("File", kindOf(file(".profile")));
-    EXPECT_EQ("File", kindOf(file("a.")));
-    EXPECT_EQ("Folder", kindOf(folder("sub.lsp")));
+    EXPECT_EQ("Datei (LSP)", kind(file("a.lsp")));
+    EXPECT_EQ("Datei (\\xFF)", kind(file("a.\xFF")));
+    EXPECT_EQ("file", kindOf(file("a.lsp"), {"", "", "", "file"})) << "of a language that leaves it out";
+    EXPECT_EQ("Datei", kind(file("README")));
+    EXPECT_EQ("Datei", kind(file(".profile")));
+    EXPECT_EQ("Datei", kind(file("a.")));
+    EXPECT_EQ("Mappe", kind(folder("sub.lsp")));
     Entry package = folder("a.bundle");
     package.isPackage = true;
-    EXPECT_EQ("Package", kindOf(package));
+    EXPECT_EQ("Paket", kind(package));
 }
 
 TEST(Listing, ShowsOddNamesInOneLine)

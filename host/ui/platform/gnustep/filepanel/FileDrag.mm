@@ -1,6 +1,9 @@
 #import "host/ui/platform/gnustep/filepanel/FileDrag.h"
 
+#include <string>
+
 #include "host/ui/platform/gnustep/filepanel/PanelState.h"
+#include "host/ui/platform/gnustep/filepanel/Words.h"
 
 using namespace tessel::filepanel;
 
@@ -15,7 +18,7 @@ NSString* labelOf(NSArray* paths)
 {
     if ([paths count] == 1)
         return string(shownName(bytes([[paths objectAtIndex:0] lastPathComponent])));
-    return [NSString stringWithFormat:@"%lu files", static_cast<unsigned long>([paths count])];
+    return wordWith(@"DRAGGED_FILES", string(std::to_string([paths count])));
 }
 
 NSTextField* makeText(NSString* title)

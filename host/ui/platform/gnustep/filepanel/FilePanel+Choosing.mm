@@ -10,6 +10,7 @@
 #import "host/ui/platform/gnustep/filepanel/FileTable.h"
 #include "host/ui/platform/gnustep/filepanel/PanelState.h"
 #include "host/ui/platform/gnustep/filepanel/TypedNames.h"
+#include "host/ui/platform/gnustep/filepanel/Words.h"
 
 using namespace tessel::filepanel;
 
@@ -256,7 +257,7 @@ bool isHost(NSString* path)
     {
         if (fileExists(path))
             continue;
-        NSString* text = [NSString stringWithFormat:@"There is no file \"%@\".", string(path)];
+        NSString* text = wordWith(@"NO_SUCH_FILE", string(path));
         VqHostMessageBox::simple()->show(NSStringToWstring(text).c_str(), MB_ICONEXCLAMATION, nullptr);
         return YES;
     }

@@ -4,6 +4,7 @@
 #import "host/ui/platform/gnustep/filepanel/FileTable.h"
 #include "host/ui/platform/gnustep/filepanel/Folders.h"
 #include "host/ui/platform/gnustep/filepanel/PanelState.h"
+#include "host/ui/platform/gnustep/filepanel/Words.h"
 
 using namespace tessel::filepanel;
 
@@ -111,7 +112,7 @@ void storeRecentFolders(const std::vector<std::string>& folders)
 - (void)showRecentFolders
 {
     [mRecent removeAllItems];
-    [mRecent addItemWithTitle:@"Recent"]; // the title of the button itself
+    [mRecent addItemWithTitle:word(@"RECENT")]; // the title of the button itself
     for (const std::string& folder : recentFolders())
     {
         [mRecent addItemWithTitle:string(shownName(folder))];

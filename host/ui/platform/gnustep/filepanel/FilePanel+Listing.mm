@@ -10,6 +10,7 @@
 #include "host/ui/platform/gnustep/filepanel/Folders.h"
 #include "host/ui/platform/gnustep/filepanel/PanelState.h"
 #import "host/ui/platform/gnustep/filepanel/PathBar.h"
+#include "host/ui/platform/gnustep/filepanel/Words.h"
 
 using namespace tessel::filepanel;
 
@@ -47,12 +48,18 @@ NSString* titleOf(NSString* identifier)
     switch (columnOf(identifier))
     {
     case Column::kKind:
-        return @"Kind";
+        return word(@"KIND_COLUMN");
     case Column::kDate:
-        return @"Changed";
+        return word(@"DATE_COLUMN");
     default:
-        return @"Name";
+        return word(@"NAME_COLUMN");
     }
+}
+
+KindWords kindWords()
+{
+    return {bytes(word(@"FOLDER")), bytes(word(@"PACKAGE")), bytes(word(@"FILE")),
+            bytes(word(@"FILE_OF_KIND"))};
 }
 } // namespace
 
@@ -73,6 +80,7 @@ NSString* titleOf(NSString* identifier)
 // What the delegate leaves of the files.
 - (std::vector<Entry>)entriesToShow
 {
+    const KindWords words = kindWords();
     std::vector<Entry> shown;
     for (Entry& entry : readFolder(mState->folder, [self showsHiddenFiles]))
     {
@@ -80,6 +88,7 @@ NSString* titleOf(NSString* identifier)
         if (![self isListed:path])
             continue;
         entry.isPackage = entry.isFolder && [self isPackage:path];
+        entry.kind = kindOf(entry, words);
         shown.push_back(std::move(entry));
     }
     return shown;
@@ -244,7 +253,7 @@ NSString* titleOf(NSString* identifier)
     if ([[column identifier] isEqual:@"name"])
         return string(shownName(entry.name));
     if ([[column identifier] isEqual:@"kind"])
-        return string(kindOf(entry));
+        return string(entry.kind);
     if (!entry.changed)
         entry.changed = dateOf(mState->pathOf(entry)).value_or(0);
     return *entry.changed ? dateText(*entry.changed) : @"";

@@ -8,6 +8,7 @@
 #import "host/ui/platform/gnustep/filepanel/FileTable.h"
 #include "host/ui/platform/gnustep/filepanel/Layout.h"
 #import "host/ui/platform/gnustep/filepanel/PathBar.h"
+#include "host/ui/platform/gnustep/filepanel/Words.h"
 
 using namespace tessel::filepanel;
 
@@ -105,13 +106,13 @@ NSTextFieldCell* makeTextCell()
 
 - (void)makeWayRowIn:(NSView*)row
 {
-    place(makeButton(@"Up", self, @selector(goUp:)), row, kMargin, 56, kControlHeight);
-    place(makeButton(@"Home", self, @selector(goHome:)), row, kMargin + 60, 84, kControlHeight);
+    place(makeButton(word(@"UP"), self, @selector(goUp:)), row, kMargin, 56, kControlHeight);
+    place(makeButton(word(@"HOME"), self, @selector(goHome:)), row, kMargin + 60, 84, kControlHeight);
     mRecent = [[[NSPopUpButton alloc] initWithFrame:NSMakeRect(0, 0, 100, 26) pullsDown:YES] autorelease];
     [mRecent setFont:[NSFont systemFontOfSize:kFontSize]];
     [mRecent setTarget:self];
     [mRecent setAction:@selector(goToRecent:)];
-    [mRecent setToolTip:@"The folders used last"];
+    [mRecent setToolTip:word(@"RECENT_TIP")];
     const CGFloat left = kMargin + 150;
     mWay = [[[TsPathBar alloc] initWithFrame:NSZeroRect] autorelease];
     [mWay setTarget:self action:@selector(goToStep:)];
@@ -149,7 +150,7 @@ NSTextFieldCell* makeTextCell()
 
 - (void)makeNameRowIn:(NSView*)row
 {
-    place(makeLabel(@"Name:", NSZeroRect), row, 16, 72, 18);
+    place(makeLabel(word(@"NAME_FIELD"), NSZeroRect), row, 16, 72, 18);
     mName = [[[NSTextField alloc] initWithFrame:NSZeroRect] autorelease];
     [mName setFont:[NSFont systemFontOfSize:kFontSize]];
     [mName setDelegate:(id)self];
@@ -159,7 +160,7 @@ NSTextFieldCell* makeTextCell()
     [mName setAutoresizingMask:NSViewWidthSizable];
     mHidden = [[[NSButton alloc] initWithFrame:NSZeroRect] autorelease];
     [mHidden setButtonType:NSSwitchButton];
-    [mHidden setTitle:@"Hidden files"];
+    [mHidden setTitle:word(@"HIDDEN_FILES")];
     [mHidden setFont:[NSFont systemFontOfSize:kFontSize]];
     [mHidden setTarget:self];
     [mHidden setAction:@selector(toggleHidden:)];
@@ -170,10 +171,10 @@ NSTextFieldCell* makeTextCell()
 - (void)makeButtonsIn:(NSView*)content
 {
     const CGFloat right = NSWidth([content bounds]) - kMargin - kButtonWidth;
-    mOK = makeButton(@"Open", self, @selector(ok:));
+    mOK = makeButton(word(@"OPEN"), self, @selector(ok:));
     [mOK setTag:kTsUIFilePanelDefaultButton];
     [mOK setKeyEquivalent:@"\r"];
-    mCancel = makeButton(@"Cancel", self, @selector(cancel:));
+    mCancel = makeButton(word(@"CANCEL"), self, @selector(cancel:));
     [mCancel setTag:kTsUIFilePanelCancelButton];
     NSButton* spare = makeButton(@"", nil, nullptr);
     [spare setTag:kTsUIFilePanelSpareButton];

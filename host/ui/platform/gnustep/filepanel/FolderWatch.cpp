@@ -22,9 +22,10 @@ constexpr std::uint32_t kWritten = IN_MODIFY | IN_CLOSE_WRITE | IN_ATTRIB;
 constexpr std::uint32_t kGone = IN_DELETE_SELF | IN_MOVE_SELF;
 constexpr std::size_t kMostAtOnce = 16 * 1024; // bytes
 
-// Folders of other computers, and those that the system makes up when somebody looks: nobody tells of changes.
-constexpr std::uint32_t kSilent[] = {NFS_SUPER_MAGIC, SMB_SUPER_MAGIC, CIFS_SUPER_MAGIC, SMB2_SUPER_MAGIC,
-                                     FUSE_SUPER_MAGIC, V9FS_MAGIC, CEPH_SUPER_MAGIC, AFS_SUPER_MAGIC,
+// Folders of other computers, and those that the system makes up when somebody looks: nobody tells of
+// changes.
+constexpr std::uint32_t kSilent[] = {NFS_SUPER_MAGIC,  SMB_SUPER_MAGIC,  CIFS_SUPER_MAGIC, SMB2_SUPER_MAGIC,
+                                     FUSE_SUPER_MAGIC, V9FS_MAGIC,       CEPH_SUPER_MAGIC, AFS_SUPER_MAGIC,
                                      CODA_SUPER_MAGIC, PROC_SUPER_MAGIC, SYSFS_MAGIC};
 
 bool isSilent(const std::string& folder)

@@ -22,8 +22,8 @@ public:
     FolderWatch(const FolderWatch&) = delete;
     FolderWatch& operator=(const FolderWatch&) = delete;
 
-    // Watches this folder instead of any other, and whether it stays where it is. Answers false where nothing will
-    // be heard: the system has no more watches, or the folder is on another computer.
+    // Watches this folder instead of any other, and whether it stays where it is. Answers false where nothing
+    // will be heard: the system has no more watches, or the folder is on another computer.
     bool start(const std::string& folder);
     void stop();
 

@@ -5,6 +5,7 @@
 #include <cwchar>
 #include <cwctype>
 #include <memory>
+#include <string_view>
 #include <unordered_map>
 
 #include <dirent.h>
@@ -17,6 +18,7 @@ namespace tessel::filepanel
 namespace
 {
 constexpr wchar_t kMostDigits = 0x4000;
+constexpr std::string_view kExtensionPlace = "%@";
 
 // Bytes that are no text in the encoding of the locale count as characters of their own.
 std::wstring wideText(const std::string& text)
@@ -79,7 +81,7 @@ std::string escaped(unsigned char byte)
 int compare(const Entry& left, const Entry& right, Column column)
 {
     if (column == Column::kKind)
-        return kindOf(left).compare(kindOf(right));
+        return left.kind.compare(right.kind);
     if (column == Column::kDate)
         return left.changed == right.changed ? 0 : (left.changed < right.changed ? -1 : 1);
     return left.key.compare(right.key);
@@ -106,7 +108,7 @@ std::vector<Entry> readFolder(const std::string& folder, bool withHiddenFiles)
     const std::unique_ptr<DIR, int (*)(DIR*)> open(opendir(folder.c_str()), closedir);
     while (const dirent* file = open ? readdir(open.get()) : nullptr)
         if (isListed(file->d_name, withHiddenFiles))
-            entries.push_back({file->d_name, sortKey(file->d_name), isFolder(*file, folder), false, {}});
+            entries.push_back({file->d_name, sortKey(file->d_name), {}, isFolder(*file, folder), false, {}});
     return entries;
 }
 
@@ -159,18 +161,21 @@ std::string readableName(const std::string& name)
     return toUtf8(withReadableBytes(toWide(name)));
 }
 
-std::string kindOf(const Entry& entry)
+std::string kindOf(const Entry& entry, const KindWords& words)
 {
     if (entry.isFolder)
-        return entry.isPackage ? "Package" : "Folder";
+        return entry.isPackage ? words.package : words.folder;
     const std::size_t dot = entry.name.rfind('.');
     if (dot == std::string::npos || dot == 0 || dot + 1 == entry.name.size())
-        return "File";
+        return words.file;
     std::string extension = entry.name.substr(dot + 1);
     std::ranges::transform(extension, extension.begin(),
                            [](unsigned char character)
                            { return static_cast<char>(std::toupper(character)); });
-    return extension + " file";
+    std::string kind = words.fileWithExtension;
+    const std::size_t place = kind.find(kExtensionPlace);
+    return place == std::string::npos ? kind
+                                      : kind.replace(place, kExtensionPlace.size(), readableName(extension));
 }
 
 std::optional<std::time_t> dateOf(const std::string& path)

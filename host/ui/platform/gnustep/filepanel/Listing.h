@@ -12,6 +12,7 @@ struct Entry
 {
     std::string name;
     std::wstring key; // what it is sorted by: see `sortKey`
+    std::string kind; // as it is shown: see `kindOf`
     bool isFolder = false;
     bool isPackage = false; // a folder that is shown as one file
     std::optional<std::time_t> changed;
@@ -35,8 +36,8 @@ struct Order
 // What a click on a column's header makes of the order: the column, or the other way round.
 Order afterClickOn(Column column, Order order);
 
-// The files of the folder, unsorted, without packages told from folders and without dates. Empty when it
-// cannot be read. Names that begin with a dot are hidden files.
+// The files of the folder, unsorted, without packages told from folders, without kinds and dates. Empty when
+// it cannot be read. Names that begin with a dot are hidden files.
 std::vector<Entry> readFolder(const std::string& folder, bool withHiddenFiles);
 
 // Folders first; by name among equals.
@@ -51,8 +52,17 @@ std::string readableName(const std::string& name);
 // The name in one line: what is no visible character is written as an escape (\n, \x1B).
 std::string shownName(const std::string& name);
 
+// What kinds are called. An extension takes the place of "%@" in the last.
+struct KindWords
+{
+    std::string folder;
+    std::string package;
+    std::string file;
+    std::string fileWithExtension;
+};
+
 // "Folder", "Package", "LSP file", "File".
-std::string kindOf(const Entry& entry);
+std::string kindOf(const Entry& entry, const KindWords& words);
 
 // When the file was last changed; nothing when it is gone.
 std::optional<std::time_t> dateOf(const std::string& path);
