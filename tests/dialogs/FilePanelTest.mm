@@ -105,6 +105,13 @@ protected:
     }
     // What the row says about its file's date; the text of a row that nobody has looked at is made now.
     std::wstring dateIn(NSInteger row) { return textIn(@"date", row); }
+    void openAnotherPanel()
+    {
+        [mPanel setDelegate:nil];
+        [mPanel release];
+        mPanel = [tsuiMakeFilePanel() retain];
+    }
+    CGFloat widthOf(NSString* column) { return [[table() tableColumnWithIdentifier:column] width]; }
     std::wstring textIn(NSString* identifier, NSInteger row)
     {
         NSTableColumn* column = [table() tableColumnWithIdentifier:identifier];
@@ -424,8 +431,7 @@ TEST_F(FilePanelList, TakesEveryWordFromTheTableOfItsLanguage)
 {
     const LanguageOfKeys language;
     writeFiles({"a.lsp", "b", "c.bundle/c", "d/d"});
-    [mPanel release];
-    mPanel = [tsuiMakeFilePanel() retain];
+    openAnotherPanel();
     std::set<std::wstring> texts;
     use({[&]
          {
@@ -454,6 +460,57 @@ TEST_F(FilePanelList, SpeaksEnglish)
              EXPECT_EQ(L"File", textIn(@"kind", 2));
              EXPECT_EQ(L"Package", textIn(@"kind", 3));
          }});
+}
+
+TEST_F(FilePanelList, RemembersWhetherHiddenFilesShow)
+{
+    writeFiles({".hidden.lsp"});
+    use({[this]
+         {
+             EXPECT_THAT(shown(), IsEmpty());
+             [button(L"Hidden files") performClick:nil];
+         },
+         [this] { return shown().size() == 1; }});
+    openAnotherPanel();
+    use({[this]
+         {
+             EXPECT_THAT(shown(), ElementsAre(L".hidden.lsp"));
+             [button(L"Hidden files") performClick:nil];
+         },
+         [this] { return shown().empty(); }});
+    openAnotherPanel();
+    use({[this] { EXPECT_THAT(shown(), IsEmpty()); }});
+}
+
+TEST_F(FilePanelList, RemembersItsColumnsWhichAlwaysFillIt)
+{
+    const CGFloat name = widthOf(@"name");
+    const CGFloat kind = widthOf(@"kind");
+    const CGFloat date = widthOf(@"date");
+    const auto isFull = [this]
+    {
+        return widthOf(@"name") + widthOf(@"kind") + widthOf(@"date") ==
+               NSWidth([[[table() enclosingScrollView] contentView] bounds]);
+    };
+    EXPECT_TRUE(isFull());
+    use({[&]
+         {
+             [[table() tableColumnWithIdentifier:@"name"] setWidth:name - 50];
+             EXPECT_EQ(kind + 50, widthOf(@"kind")) << "the next column takes it";
+             EXPECT_EQ(date, widthOf(@"date"));
+             [[table() tableColumnWithIdentifier:@"kind"] setWidth:kind + 30];
+             EXPECT_EQ(name - 50, widthOf(@"name"));
+             EXPECT_EQ(date + 20, widthOf(@"date"));
+             [[table() tableColumnWithIdentifier:@"name"] setWidth:2000];
+             EXPECT_EQ(60, widthOf(@"kind")) << "none gets lost";
+             EXPECT_EQ(date + 20, widthOf(@"date"));
+             EXPECT_TRUE(isFull());
+             [[table() tableColumnWithIdentifier:@"name"] setWidth:widthOf(@"name") - 70];
+         }});
+    openAnotherPanel();
+    EXPECT_EQ(130, widthOf(@"kind"));
+    EXPECT_EQ(date + 20, widthOf(@"date"));
+    EXPECT_TRUE(isFull());
 }
 
 TEST_F(FilePanelList, RemembersTheFoldersThatWereUsed)

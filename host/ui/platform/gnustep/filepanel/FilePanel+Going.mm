@@ -13,6 +13,19 @@ namespace
 NSString* const kSettings = @"FilePanel";
 constexpr unichar kEscape = 0x1B;
 
+NSString* const kHiddenSetting = @"HiddenFiles";
+NSString* const kResizedColumns[] = {@"kind", @"date"};
+
+NSString* widthSetting(NSString* column)
+{
+    return [column stringByAppendingString:@"Width"];
+}
+
+TsUIPersistentStore* openSettings()
+{
+    return [[[TsUIPersistentStore alloc] init] autorelease];
+}
+
 NSString* recentSetting(std::size_t place)
 {
     return [NSString stringWithFormat:@"RecentFolder%d", static_cast<int>(place + 1)];
@@ -20,7 +33,7 @@ NSString* recentSetting(std::size_t place)
 
 std::vector<std::string> recentFolders()
 {
-    TsUIPersistentStore* store = [[[TsUIPersistentStore alloc] init] autorelease];
+    TsUIPersistentStore* store = openSettings();
     std::vector<std::string> folders;
     for (std::size_t place = 0; place < kMostRecentFolders; ++place)
         if (NSString* folder = [store getControlString:kSettings control:recentSetting(place)])
@@ -30,7 +43,7 @@ std::vector<std::string> recentFolders()
 
 void storeRecentFolders(const std::vector<std::string>& folders)
 {
-    TsUIPersistentStore* store = [[[TsUIPersistentStore alloc] init] autorelease];
+    TsUIPersistentStore* store = openSettings();
     for (std::size_t place = 0; place < folders.size(); ++place)
         [store putControlString:kSettings control:recentSetting(place) value:string(folders[place])];
 }
@@ -81,6 +94,7 @@ void storeRecentFolders(const std::vector<std::string>& folders)
 - (IBAction)toggleHidden:(id)sender
 {
     (void)sender;
+    [openSettings() putControlState:kSettings control:kHiddenSetting state:[mHidden state] == NSOnState];
     [self listAgain];
 }
 
@@ -117,6 +131,25 @@ void storeRecentFolders(const std::vector<std::string>& folders)
     {
         [mRecent addItemWithTitle:string(shownName(folder))];
         [[mRecent lastItem] setRepresentedObject:string(folder)];
+    }
+}
+
+- (void)restoreLook
+{
+    TsUIPersistentStore* store = openSettings();
+    [mHidden setState:[store getControlState:kSettings control:kHiddenSetting] ? NSOnState : NSOffState];
+    for (NSString* column : kResizedColumns)
+        if (const int width = [store getControlInt:kSettings control:widthSetting(column)]; width > 0)
+            [self setWidth:width ofColumn:column];
+}
+
+- (void)rememberColumns
+{
+    TsUIPersistentStore* store = openSettings();
+    for (NSString* column : kResizedColumns)
+    {
+        NSTableColumn* resized = [(NSTableView*)mTable tableColumnWithIdentifier:column];
+        [store putControlInt:kSettings control:widthSetting(column) value:static_cast<int>([resized width])];
     }
 }
 

@@ -36,7 +36,9 @@ constexpr CGFloat kSwitchWidth = 150;
 constexpr CGFloat kSmallestWidth = 560;
 constexpr CGFloat kListBeyondSmallest = 190; // points, in the size that the panel opens in
 constexpr CGFloat kRowHeight = 20;
+constexpr CGFloat kKindWidth = 110;
 constexpr CGFloat kDateWidth = 150;
+constexpr CGFloat kSmallestColumn = 60;
 constexpr CGFloat kFontSize = 13;
 
 NSButton* makeButton(NSString* title, id target, SEL action)
@@ -91,9 +93,22 @@ NSTableColumn* makeColumn(NSString* identifier, CGFloat width, NSCell* cell)
     [cell setLineBreakMode:NSLineBreakByTruncatingTail];
     [column setDataCell:cell];
     [column setEditable:NO];
-    [column setMinWidth:60];
+    [column setMinWidth:kSmallestColumn];
     [column setWidth:width];
     return column;
+}
+
+// The toolkit would take from the last column first, and give to it, whatever it needs. The others can be
+// dragged wider and narrower.
+void fixWidth(NSTableColumn* column, CGFloat width)
+{
+    const CGFloat fixed = std::max(kSmallestColumn, width);
+    if (![[column identifier] isEqual:@"date"])
+        return [column setWidth:fixed];
+    [column setMinWidth:0];
+    [column setMaxWidth:fixed];
+    [column setMinWidth:fixed];
+    [column setWidth:fixed];
 }
 
 NSTextFieldCell* makeTextCell()
@@ -129,12 +144,10 @@ NSTextFieldCell* makeTextCell()
     [frame setHasHorizontalScroller:NO];
     mTable = [[[TsFileTable alloc] initWithFrame:[[frame contentView] bounds]] autorelease];
     [mTable addTableColumn:makeColumn(@"name", 400, [[[TsFileNameCell alloc] initTextCell:@""] autorelease])];
-    [mTable addTableColumn:makeColumn(@"kind", 110, makeTextCell())];
-    [mTable addTableColumn:makeColumn(@"date", 150, makeTextCell())];
-    // The toolkit would take from the last column first, and give to it, whatever it needs.
-    NSTableColumn* date = [mTable tableColumnWithIdentifier:@"date"];
-    [date setMinWidth:kDateWidth];
-    [date setMaxWidth:kDateWidth];
+    [mTable addTableColumn:makeColumn(@"kind", kKindWidth, makeTextCell())];
+    [mTable addTableColumn:makeColumn(@"date", kDateWidth, makeTextCell())];
+    for (NSTableColumn* column : tsuiEach<NSTableColumn*>([mTable tableColumns]))
+        fixWidth(column, [column width]);
     [mTable setRowHeight:kRowHeight];
     [mTable setAllowsColumnReordering:NO];
     [mTable setAllowsColumnSelection:NO];
@@ -205,12 +218,35 @@ NSTextFieldCell* makeTextCell()
 // The names get what the other columns leave. The toolkit counts the space between columns as part of them.
 - (void)fitColumns
 {
-    const CGFloat available = NSWidth([[[mTable enclosingScrollView] contentView] bounds]);
-    CGFloat others = 0;
-    for (NSTableColumn* column : tsuiEach<NSTableColumn*>([mTable tableColumns]))
-        others += [column width];
     NSTableColumn* name = [[mTable tableColumns] objectAtIndex:0];
-    [name setWidth:std::max([name minWidth], [name width] + available - others)];
+    NSTableColumn* kind = [mTable tableColumnWithIdentifier:@"kind"];
+    NSTableColumn* date = [mTable tableColumnWithIdentifier:@"date"];
+    const CGFloat available = NSWidth([[[mTable enclosingScrollView] contentView] bounds]) - [date width];
+    mIsFitting = YES;
+    fixWidth(kind, std::min([kind width], available - kSmallestColumn));
+    fixWidth(name, available - [kind width]);
+    mIsFitting = NO;
+}
+
+- (void)setWidth:(CGFloat)width ofColumn:(NSString*)identifier
+{
+    mIsFitting = YES;
+    fixWidth([mTable tableColumnWithIdentifier:identifier], width);
+    mIsFitting = NO;
+    [self fitColumns];
+}
+
+// What a column gets by hand, the next one gives.
+- (void)tableViewColumnDidResize:(NSNotification*)notification
+{
+    NSArray* columns = [mTable tableColumns];
+    NSTableColumn* column = [[notification userInfo] objectForKey:@"NSTableColumn"];
+    const NSUInteger next = [columns indexOfObject:column] + 1;
+    if (mIsFitting || !column || next >= [columns count])
+        return;
+    const CGFloat before = [[[notification userInfo] objectForKey:@"NSOldWidth"] floatValue];
+    NSTableColumn* giver = [columns objectAtIndex:next];
+    [self setWidth:[giver width] + before - [column width] ofColumn:[giver identifier]];
 }
 
 - (void)placeParts

@@ -32,6 +32,7 @@ struct PanelState;
     NSTimer* mLooks;          // for changes in a folder that cannot be watched
     NSInteger mUpdates;       // more than 0 while rows are selected by the panel itself
     BOOL mIsWatching;
+    BOOL mIsFitting; // columns are made wider and narrower by the panel itself
     BOOL mChoosesFolders;
     BOOL mChoosesSeveral;
 }
@@ -41,6 +42,7 @@ struct PanelState;
 @interface TsUIFilePanel (Parts)
 - (void)makeParts;
 - (void)placeParts;
+- (void)setWidth:(CGFloat)width ofColumn:(NSString*)identifier;
 - (void)growFor:(NSView*)accessory;
 - (void)fitOnScreen;
 @end
@@ -100,4 +102,7 @@ struct PanelState;
 - (BOOL)takeKey:(NSEvent*)event;
 - (void)showRecentFolders;
 - (void)rememberFolder;
+// Hidden files and the columns as the person left them.
+- (void)restoreLook;
+- (void)rememberColumns;
 @end

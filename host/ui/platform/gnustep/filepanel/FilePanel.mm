@@ -39,6 +39,7 @@ template <class Function> Function windowMethod(SEL selector)
     [self setReleasedWhenClosed:NO];
     [self setHidesOnDeactivate:NO];
     [self makeParts];
+    [self restoreLook];
     [self updateDefaultButton];
     return self;
 }
@@ -220,6 +221,7 @@ template <class Function> Function windowMethod(SEL selector)
     {
         [self stopWatching];
         [self rememberFolder];
+        [self rememberColumns];
         [self orderOut:self];
     }
 }
