@@ -178,6 +178,27 @@ TEST_F(DialogBrowser, LoadsFilesWhoseNamesAreNoTextAndFindsThemAgain)
     EXPECT_THAT(closeAndEnd(), AllOf(HasSubstr("odd Lisp runs"), HasSubstr("  gears\\xFE.omp ")));
 }
 
+TEST_F(DialogBrowser, OpensWithTheColumnsAndTheHiddenFilesThatItWasLeftWith)
+{
+    writeLisp(".hidden.lsp");
+    open();
+    click(places::kHiddenFiles);
+    mScreen.drag(mDialog, places::kEndOfNames, mDialog, {places::kEndOfNames.x - 100, places::kEndOfNames.y});
+    shoot("left");
+    const std::string kinds = look({places::kEndOfNames.x - 80, places::file(0).y});
+    closeAndEnd();
+    open();
+    shoot("again");
+    EXPECT_EQ(look({places::kEndOfNames.x - 80, places::file(0).y}), kinds);
+    click(places::file(0));
+    click(places::kLoad);
+    EXPECT_TRUE(prints(wasLoaded(".hidden.lsp")));
+    closeAndEnd();
+    const std::string width = runQuietly(
+        {R"(REGISTRY GET Software\Tessel\R21\Profiles\Default\DialogSettings\FilePanel kindWidth)"});
+    EXPECT_THAT(width, HasSubstr("\n2")) << "some hundred points more than before: " << width;
+}
+
 TEST_F(DialogBrowser, ShowsTheFilesOfTheChosenTypeOnly)
 {
     copySample("gears.omp");

@@ -102,6 +102,35 @@ TEST_F(DialogDrop, TakesAFileOfItsOwnListIntoTheStartupSuite)
     EXPECT_EQ(stored("Startup"), listOf({path}));
 }
 
+TEST_F(DialogDrop, OfItsOwnListIsGivenUpByEscape)
+{
+    writeLisp("a.lsp");
+    writeLisp("b.lsp");
+    open();
+    const Place table{kTable.x, kTable.y};
+    const Place edge{places::kStartupSuiteBox.x, places::kStartupSuiteBox.y + 20};
+    const std::string before = look(edge);
+    for (const Place place : {places::kStartupSuiteBox, table})
+    {
+        mScreen.dragOver(mDialog, places::file(0), mDialog, place);
+        shoot("hovering");
+        EXPECT_EQ(look(edge) != before, place.y != table.y) << "where it would land is seen";
+        mScreen.key("Escape");
+        EXPECT_TRUE(comesTrue([&] { return look(edge) == before; }));
+        mScreen.moveOn(mDialog, edge); // with the button still down
+        EXPECT_EQ(look(edge), before);
+        shoot("given-up");
+        mScreen.letGo();
+    }
+    click(places::file(1));
+    click(places::kLoad);
+    EXPECT_TRUE(prints(wasLoaded("b.lsp")));
+    mScreen.drag(mDialog, places::file(1), mDialog, places::kStartupSuiteBox);
+    EXPECT_TRUE(prints("b.lsp was added to the Startup Suite.\n"));
+    EXPECT_THAT(closeAndEnd(), Not(HasSubstr("a.lsp")));
+    EXPECT_EQ(stored("Startup"), listOf({(files() / "b.lsp").string()}));
+}
+
 TEST_F(DialogDrop, LoadsTwoFilesOfItsOwnListBetweenTheRowsOfTheTable)
 {
     writeLisp("a.lsp");

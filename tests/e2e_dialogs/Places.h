@@ -21,6 +21,8 @@ inline constexpr Place kRemoveFromHistory{475, 631};
 inline constexpr Place kStartupSuiteBox{640, 545};
 inline constexpr Place kContents{640, 620};
 inline constexpr Place kName{300, 330};
+inline constexpr Place kHiddenFiles{600, 330};
+inline constexpr Place kEndOfNames{461, 51}; // between the headers of the first two columns
 inline constexpr Place kHelp{50, 708};
 inline constexpr Place kClose{697, 708};
 
