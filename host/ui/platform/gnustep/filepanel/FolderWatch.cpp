@@ -20,7 +20,7 @@ namespace
 constexpr std::uint32_t kOther = IN_CREATE | IN_DELETE | IN_MOVED_FROM | IN_MOVED_TO;
 constexpr std::uint32_t kWritten = IN_MODIFY | IN_CLOSE_WRITE | IN_ATTRIB;
 constexpr std::uint32_t kGone = IN_DELETE_SELF | IN_MOVE_SELF;
-constexpr std::size_t kMostAtOnce = 16 * 1024; // bytes
+constexpr std::size_t kMostAtOnce = std::size_t{16} * 1024; // bytes
 
 // Folders of other computers, and those that the system makes up when somebody looks: nobody tells of
 // changes.
