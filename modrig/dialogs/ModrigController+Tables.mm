@@ -7,6 +7,7 @@
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
 #include "modrig/dialogs/Paths.h"
+#include "modrig/dialogs/model/UnloadTip.h"
 #include "modrig/dialogs/platform/Platform.h"
 #include "modrig/lists/Globals.h"
 #include "modrig/lists/ListRemoval.h"
@@ -109,6 +110,17 @@ bool hasSelection(NSArrayController* rows)
     (void)column;
     (void)place;
     return [(ModrigTableView*)table tipForRow:row];
+}
+
+// The Unload button's.
+- (NSString*)tipOfButton:(NSButton*)button
+{
+    (void)button;
+    NSMutableArray* lines = [NSMutableArray array];
+    for (const char* key :
+         ModrigUtils::UnloadTip(canUnloadApp, [(ModrigTableView*)loadedAppsTableView states]))
+        [lines addObject:[TsOCModrigUtil modrigLoadString:[NSString stringWithUTF8String:key]]];
+    return [lines componentsJoinedByString:@"\n"];
 }
 
 - (NSInteger)numberOfRowsInTableView:(NSTableView*)table

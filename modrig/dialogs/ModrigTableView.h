@@ -4,7 +4,7 @@
 
 #import <AppKit/AppKit.h>
 
-#include "modrig/dialogs/model/TableActions.h"
+#include "modrig/dialogs/model/RowLook.h"
 
 namespace ModrigUtils
 {
@@ -24,6 +24,8 @@ NSString* HelpKey();
 - (void)prepareCell:(id)cell row:(NSInteger)row;
 // What the tip of a row says: its whole path, and why it is grey.
 - (NSString*)tipForRow:(NSInteger)row;
+// How all rows are at the moment.
+- (std::vector<ModrigUtils::RowState>)states;
 
 @end
 

@@ -11,7 +11,6 @@
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
 #include "modrig/dialogs/Paths.h"
-#include "modrig/dialogs/model/RowLook.h"
 #include "modrig/dialogs/model/ShownText.h"
 #include "modrig/dialogs/model/TypedLetters.h"
 #include "modrig/dialogs/platform/Desktop.h"
@@ -282,6 +281,14 @@ NSString* ModrigUtils::HelpKey()
 - (ModrigUtils::RowState)stateOfFile:(ModrigFilePath*)file
 {
     return ModrigUtils::StateOf([(id)[self delegate] kindOfTable:self], factsOf(file));
+}
+
+- (std::vector<ModrigUtils::RowState>)states
+{
+    std::vector<ModrigUtils::RowState> states;
+    for (NSInteger row = 0; row < [self numberOfRows]; ++row)
+        states.push_back([self stateOfFile:[self fileInRow:row]]);
+    return states;
 }
 
 - (void)prepareCell:(id)cell row:(NSInteger)row

@@ -2,9 +2,12 @@
 #include "tests/dialogs/support/DialogTest.h"
 #include "tests/dialogs/support/Events.h"
 
+#include <tesselui/tsuieach.h>
+
 #import "modrig/dialogs/ModrigFilePath.h"
 #import "modrig/dialogs/ModrigNameCell.h"
 #import "modrig/dialogs/ModrigTableView.h"
+#import "modrig/dialogs/ModrigTipButton.h"
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
 using testing::ElementsAre;
@@ -12,7 +15,19 @@ using testing::IsEmpty;
 
 namespace
 {
+constexpr int kLoadedTab = 0;
 constexpr int kHistoryTab = 1;
+
+// The button with that action in the view.
+NSButton* buttonIn(NSView* view, SEL action)
+{
+    if ([view isKindOfClass:[NSButton class]] && sel_isEqual([(NSButton*)view action], action))
+        return (NSButton*)view;
+    for (NSView* inner : tsuiEach<NSView*>([view subviews]))
+        if (NSButton* found = buttonIn(inner, action))
+            return found;
+    return nil;
+}
 
 class Manners : public OpenDialogTest
 {
@@ -30,6 +45,7 @@ protected:
         for (const std::string& name : names)
             gLoadedAppList.AddTail(name.ends_with(".zmb") ? loadedModule(name) : file(name));
         open();
+        [mController setTabViewSelectedIndex:kLoadedTab];
         show();
     }
     // As it shows on the screen while it runs.
@@ -38,6 +54,7 @@ protected:
         [mPanel makeKeyAndOrderFront:nil];
         events::pump();
     }
+    NSButton* buttonOf(SEL action) { return buttonIn([mController view], action); }
     std::wstring message() { return wide([mController message]); }
     static NSPoint headerOf(NSTableView* table)
     {
@@ -349,6 +366,29 @@ TEST_F(Manners, ShowTheTipOfARowWhenThePointerRestsOnIt)
     openHistory({"a.lsp", "b.lsp"});
     const std::size_t before = events::windowsOnTheScreen();
     events::movePointerTo(historyTable(), events::middleOf([historyTable() rectOfRow:1]));
+    EXPECT_TRUE(events::comesTrue([&] { return events::windowsOnTheScreen() > before; }));
+    events::movePointerTo([mPanel contentView], NSMakePoint(1, 1));
+}
+
+TEST_F(Manners, TellWhyNothingCanBeUnloadedInTheTipOfTheButton)
+{
+    openLoaded({"tool.lsp"});
+    NSButton* unload = buttonOf(@selector(onUnload:));
+    ASSERT_FALSE([unload isEnabled]);
+    const auto tip = [&] { return wide([[unload target] tipOfButton:unload]); };
+    EXPECT_EQ(L"None of these applications can be unloaded.\nLisp applications cannot be unloaded.", tip());
+    selectFiles({"one.zmb"});
+    [mController onLoad:nil];
+    ASSERT_TRUE([unload isEnabled]);
+    EXPECT_EQ(L"Unload the selected applications", tip());
+}
+
+TEST_F(Manners, ShowTheTipOfTheDisabledUnloadButtonWhenThePointerRestsOnIt)
+{
+    openLoaded({"tool.lsp"});
+    NSButton* unload = buttonOf(@selector(onUnload:));
+    const std::size_t before = events::windowsOnTheScreen();
+    events::movePointerTo(unload, events::middleOf([unload bounds]));
     EXPECT_TRUE(events::comesTrue([&] { return events::windowsOnTheScreen() > before; }));
     events::movePointerTo([mPanel contentView], NSMakePoint(1, 1));
 }
