@@ -134,7 +134,9 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
     { [self addRowsFor:[[batchFiles objectAtIndex:index] filePathName]]; };
     ModrigUtils::LongLoad load(self, batch.files.size());
     batch.isStopped = [&load](std::size_t done) { return load.IsStopped(done); };
-    if (ModrigUtils::RunLoadBatch(batch) > 0 && mInsertRow == ModrigUtils::kAppendRow)
+    const unsigned added = ModrigUtils::RunLoadBatch(batch);
+    [historyListTableView setNeedsDisplay:YES]; // it shows which files could not be loaded
+    if (added > 0 && mInsertRow == ModrigUtils::kAppendRow)
         [self showLastRow];
 }
 

@@ -15,6 +15,7 @@
 #include "modrig/dialogs/model/TypedLetters.h"
 #include "modrig/dialogs/platform/Desktop.h"
 #include "modrig/dialogs/platform/Platform.h"
+#include "modrig/loader/FailedLoads.h"
 #include "modrig/types/ApplicationTypes.h"
 
 using ModrigUtils::TableAction;
@@ -81,6 +82,7 @@ ModrigUtils::RowFacts factsOf(ModrigFilePath* row)
     facts.exists = ModrigPlatform::FileExists([row filePathName], isFolder);
     facts.unloadable = [row unloadable];
     facts.isCompiledModule = ModrigUtils::FileTypeOfPath([row path]) == kCompiledModule;
+    facts.hasFailed = ModrigUtils::LastLoadFailed([row path]);
     return facts;
 }
 

@@ -8,6 +8,7 @@
 #include "modrig/base/SplitPath.h"
 #include "modrig/lists/Globals.h"
 #include "modrig/lists/ListMembership.h"
+#include "modrig/loader/FailedLoads.h"
 #include "modrig/loader/HostLinker.h"
 #include "modrig/messages/MessageIds.h"
 #include "modrig/messages/Messages.h"
@@ -60,7 +61,9 @@ int PerformModrig(CStdStr path, int addToHistory, signed char loadAll, signed ch
     const bool isLispApp = IsALispAppFoundinList(path);
     if (alreadyLoaded && !isLispApp)
         return kAlreadyLoaded;
-    if (LoadApplication(path, kLoad, loadAll))
+    const bool isLoaded = LoadApplication(path, kLoad, loadAll);
+    NoteLoad(path, isLoaded);
+    if (isLoaded)
     {
         RecordLoaded(path, isLispApp, addToHistory);
         return kLoaded;

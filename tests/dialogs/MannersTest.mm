@@ -1,6 +1,7 @@
 // What a person expects of the dialog's tables without being told: real clicks and keys in its window.
 #include "tests/dialogs/support/DialogTest.h"
 #include "tests/dialogs/support/Events.h"
+#include "tests/dialogs/support/Pictures.h"
 
 #include <tesselui/tsuieach.h>
 
@@ -16,7 +17,6 @@ using testing::IsEmpty;
 namespace
 {
 constexpr int kLoadedTab = 0;
-constexpr int kHistoryTab = 1;
 
 // The button with that action in the view.
 NSButton* buttonIn(NSView* view, SEL action)
@@ -32,14 +32,6 @@ NSButton* buttonIn(NSView* view, SEL action)
 class Manners : public OpenDialogTest
 {
 protected:
-    void openHistory(std::initializer_list<std::string> names)
-    {
-        for (const std::string& name : names)
-            gHistoryList.AddTail(CStdStr(file(name)));
-        open();
-        [mController setTabViewSelectedIndex:kHistoryTab];
-        show();
-    }
     void openLoaded(std::initializer_list<std::string> names)
     {
         for (const std::string& name : names)
@@ -47,12 +39,6 @@ protected:
         open();
         [mController setTabViewSelectedIndex:kLoadedTab];
         show();
-    }
-    // As it shows on the screen while it runs.
-    void show()
-    {
-        [mPanel makeKeyAndOrderFront:nil];
-        events::pump();
     }
     NSButton* buttonOf(SEL action) { return buttonIn([mController view], action); }
     std::wstring message() { return wide([mController message]); }
@@ -301,6 +287,31 @@ TEST_F(Manners, TellTheWholePathAndWhyARowIsGrey)
     std::filesystem::remove(mFolder / "a.lsp");
     EXPECT_EQ(file("x").substr(0, file("x").size() - 1) + L"a.lsp\nThis file does not exist.",
               tipOf(historyTable(), 0));
+}
+
+TEST_F(Manners, ShowWhichApplicationsCouldNotBeLoadedAtOnceAndUntilTheyAre)
+{
+    openHistory({"good.zmb", "bad.zmb"});
+    host().linker.refuseToLoad(file("bad.zmb"));
+    const auto look = [this] { return pictureOf(historyTable(), [historyTable() rectOfRow:1]); };
+    NSData* before = look();
+    select(historyTable(), {1});
+    [mPanel displayIfNeeded];
+    ASSERT_FALSE([historyTable() needsDisplay]);
+    [mController onLoadFromHistory:nil];
+    EXPECT_TRUE([historyTable() needsDisplay]);
+    [historyTable() deselectAll:nil];
+    events::pump();
+    EXPECT_FALSE([before isEqual:look()]) << "the row is not grey";
+    const auto tip = [this] { return wide([(id)historyTable() tipForRow:1]); };
+    EXPECT_EQ(file("bad.zmb") + L"\nThis application could not be loaded when it was last tried.", tip());
+    host().linker.allow(file("bad.zmb"));
+    select(historyTable(), {1});
+    [mController onLoadFromHistory:nil];
+    [historyTable() deselectAll:nil];
+    events::pump();
+    EXPECT_TRUE([before isEqual:look()]) << "the row is still grey";
+    EXPECT_EQ(file("bad.zmb"), tip());
 }
 
 TEST_F(Manners, DrawMissingFilesInGreyAndLongNamesWithAnEllipsis)

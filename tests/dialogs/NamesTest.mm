@@ -1,6 +1,6 @@
 // Files whose names are in other scripts, or hold what is rarely seen in a name.
 #include "tests/dialogs/support/DialogTest.h"
-#include "tests/dialogs/support/Events.h"
+#include "tests/dialogs/support/Pictures.h"
 
 #include "host/ui/platform/gnustep/FontCoverage.h"
 #include "host/ui/platform/gnustep/VisualOrder.h"
@@ -13,30 +13,14 @@ using testing::IsEmpty;
 
 namespace
 {
-constexpr int kHistoryTab = 1;
-
 class Names : public OpenDialogTest
 {
 protected:
-    void openHistory(std::initializer_list<std::string> names)
-    {
-        for (const std::string& name : names)
-            gHistoryList.AddTail(CStdStr(file(name)));
-        open();
-        [mController setTabViewSelectedIndex:kHistoryTab];
-        [mPanel makeKeyAndOrderFront:nil];
-        events::pump();
-    }
     // The pixels of the row's name, but for its extension.
     NSData* lookOf(NSInteger row)
     {
         const NSRect place = [historyTable() frameOfCellAtColumn:0 row:row];
-        [historyTable() lockFocus];
-        NSBitmapImageRep* image = [[[NSBitmapImageRep alloc]
-            initWithFocusedViewRect:NSMakeRect(NSMinX(place), NSMinY(place), 60, NSHeight(place))]
-            autorelease];
-        [historyTable() unlockFocus];
-        return [image TIFFRepresentation];
+        return pictureOf(historyTable(), NSMakeRect(NSMinX(place), NSMinY(place), 60, NSHeight(place)));
     }
     std::wstring shownName(NSInteger row)
     {

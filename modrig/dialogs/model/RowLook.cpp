@@ -12,15 +12,25 @@ CStdStr Beginning(const CStdStr& text, std::size_t length)
 {
     return CStdStr(text.Text().substr(0, length) + kEllipsis);
 }
+
+RowState StateOfLoaded(const RowFacts& facts)
+{
+    if (facts.unloadable)
+        return RowState::kUsable;
+    return facts.isCompiledModule ? RowState::kLocked : RowState::kNeverUnloaded;
+}
+
+RowState StateOfListed(const RowFacts& facts)
+{
+    if (!facts.exists)
+        return RowState::kMissing;
+    return facts.hasFailed ? RowState::kFailed : RowState::kUsable;
+}
 } // namespace
 
 RowState StateOf(TableKind kind, const RowFacts& facts)
 {
-    if (kind != TableKind::kLoadedApplications)
-        return facts.exists ? RowState::kUsable : RowState::kMissing;
-    if (facts.unloadable)
-        return RowState::kUsable;
-    return facts.isCompiledModule ? RowState::kLocked : RowState::kNeverUnloaded;
+    return kind == TableKind::kLoadedApplications ? StateOfLoaded(facts) : StateOfListed(facts);
 }
 
 const char* ReasonKey(RowState state)
@@ -29,6 +39,8 @@ const char* ReasonKey(RowState state)
     {
     case RowState::kMissing:
         return "IDS_MODRIG_ROW_MISSING";
+    case RowState::kFailed:
+        return "IDS_MODRIG_ROW_FAILED";
     case RowState::kLocked:
         return "IDS_MODRIG_ROW_LOCKED";
     case RowState::kNeverUnloaded:

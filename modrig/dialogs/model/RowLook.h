@@ -12,6 +12,7 @@ enum class RowState
 {
     kUsable,
     kMissing,      // there is no such file
+    kFailed,       // it was not loaded when that was last tried
     kLocked,       // a module that may not be unloaded
     kNeverUnloaded // an application of a kind that cannot be unloaded
 };
@@ -21,6 +22,7 @@ struct RowFacts
     bool exists = false;
     bool unloadable = false;
     bool isCompiledModule = false;
+    bool hasFailed = false;
 };
 
 // All but usable rows are shown in grey.

@@ -13,6 +13,17 @@ TEST(RowLook, IsGreyForAMissingFileInTheLists)
     }
 }
 
+TEST(RowLook, IsGreyForAnApplicationThatFailedToLoad)
+{
+    for (const TableKind kind : {TableKind::kHistory, TableKind::kStartupSuite})
+    {
+        EXPECT_EQ(RowState::kFailed, StateOf(kind, {.exists = true, .hasFailed = true}));
+        EXPECT_EQ(RowState::kMissing, StateOf(kind, {.exists = false, .hasFailed = true}));
+    }
+    EXPECT_EQ(RowState::kUsable,
+              StateOf(TableKind::kLoadedApplications, {.unloadable = true, .hasFailed = true}));
+}
+
 TEST(RowLook, IsGreyForALoadedApplicationThatCannotBeUnloaded)
 {
     constexpr TableKind kLoaded = TableKind::kLoadedApplications;
@@ -25,6 +36,7 @@ TEST(RowLook, HasAReasonOfItsOwnForEveryGreyRow)
 {
     EXPECT_EQ(nullptr, ReasonKey(RowState::kUsable));
     EXPECT_STREQ("IDS_MODRIG_ROW_MISSING", ReasonKey(RowState::kMissing));
+    EXPECT_STREQ("IDS_MODRIG_ROW_FAILED", ReasonKey(RowState::kFailed));
     EXPECT_STREQ("IDS_MODRIG_ROW_LOCKED", ReasonKey(RowState::kLocked));
     EXPECT_STREQ("IDS_MODRIG_ROW_NEVER_UNLOADED", ReasonKey(RowState::kNeverUnloaded));
 }

@@ -46,6 +46,10 @@ protected:
     // The same with a controller of a test's own, which is given away.
     void openWith(ModrigController* controller);
     void close();
+    // Puts it on the screen, as while it runs.
+    void show();
+    // Opens and shows it with the files in its History, which is in front.
+    void openHistory(std::initializer_list<std::string> names);
 
     ModrigController* mController = nil;
     NSOpenPanel* mPanel = nil;

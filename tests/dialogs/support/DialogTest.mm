@@ -10,6 +10,7 @@
 #include <iostream>
 
 #include "host/text/Unicode.h"
+#include "tests/dialogs/support/Events.h"
 
 #import "modrig/dialogs/ModrigFilePath.h"
 #import "modrig/dialogs/TsOCModrigUtil.h"
@@ -20,6 +21,7 @@ NSArray* const kStepModes = [[NSArray alloc]
     initWithObjects:NSModalPanelRunLoopMode, NSDefaultRunLoopMode, NSEventTrackingRunLoopMode, nil];
 
 constexpr int kMostTries = 400;
+constexpr int kHistoryTab = 1;
 
 std::vector<std::wstring> pathsOf(NSArray* rows)
 {
@@ -128,6 +130,21 @@ void OpenDialogTest::close()
     mController = nil;
     [mPanel release];
     mPanel = nil;
+}
+
+void OpenDialogTest::show()
+{
+    [mPanel makeKeyAndOrderFront:nil];
+    events::pump();
+}
+
+void OpenDialogTest::openHistory(std::initializer_list<std::string> names)
+{
+    for (const std::string& name : names)
+        gHistoryList.AddTail(CStdStr(file(name)));
+    open();
+    [mController setTabViewSelectedIndex:kHistoryTab];
+    show();
 }
 
 void OpenDialogTest::TearDown()
