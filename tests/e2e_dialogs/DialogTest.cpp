@@ -27,6 +27,9 @@ std::vector<std::string> listCommands(const std::string& list, const std::string
 DialogTest::DialogTest(DisplayKind kind) : mScreen(kind)
 {
     mSession.set("DISPLAY", mScreen.display());
+    // Programs that serve the toolkit of this session only: they find one another by that folder. Those that
+    // several sessions share end with the one that started them.
+    mSession.set("TEMP", mSession.folder().path().string());
     std::filesystem::create_directories(files());
     setSetting("InitialPath", files().string());
 }

@@ -20,9 +20,6 @@ std::string contentOf(const std::filesystem::path& path)
 class DialogToolkit : public DialogTest
 {
 protected:
-    // Programs that serve the toolkit of this session only: they find one another by that folder.
-    void haveHelpersOfItsOwn() { mSession.set("TEMP", mSession.folder().path().string()); }
-
     int helpers() const
     {
         int count = 0;
@@ -41,7 +38,6 @@ protected:
 
 TEST_F(DialogToolkit, HasHelperProgramsThatEndWithTheSession)
 {
-    haveHelpersOfItsOwn();
     open();
     EXPECT_GE(helpers(), 1);
     closeAndEnd();
@@ -50,7 +46,6 @@ TEST_F(DialogToolkit, HasHelperProgramsThatEndWithTheSession)
 
 TEST_F(DialogToolkit, HasHelperProgramsThatEndWithASessionThatIsKilled)
 {
-    haveHelpersOfItsOwn();
     open();
     EXPECT_GE(helpers(), 1);
     mHost.reset();
