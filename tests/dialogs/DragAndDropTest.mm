@@ -1,4 +1,6 @@
 #include "tests/dialogs/support/DialogTest.h"
+#include "tests/dialogs/support/Events.h"
+#include "tests/dialogs/support/Pictures.h"
 
 #import "modrig/dialogs/ModrigStartupSuitController.h"
 #import "modrig/dialogs/ModrigStartupSuiteBox.h"
@@ -323,4 +325,117 @@ TEST_F(Dropping, DoesNotShowInAStartupSuiteDialogThatIsOpen)
     [box() performDragOperation:dragOf(paths({"one.zmb"}))];
     EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
     EXPECT_THAT(rowsOf([suite valueForKey:@"startupApps"]), IsEmpty());
+}
+
+namespace
+{
+// Files that hover over the rows of the loaded applications, of which there are three.
+class HoveringOverRows : public Dropping
+{
+protected:
+    static constexpr int kRows = 3;
+
+    void SetUp() override
+    {
+        Dropping::SetUp();
+        for (const char* name : {"m0.zmb", "m1.zmb", "m2.zmb"})
+            gLoadedAppList.AddTail(loadedModule(name));
+        open();
+        [mController setTabViewSelectedIndex:0];
+        show();
+        [mPanel displayIfNeeded];
+        for (int gap = 0; gap <= kRows; ++gap)
+            mUnmarked.push_back(lookOfGap(gap));
+    }
+    NSData* lookOfGap(int gap)
+    {
+        const CGFloat place = gap * NSHeight([loadedTable() rectOfRow:0]);
+        return [[pictureOf(loadedTable(), NSMakeRect(0, place - 1, 200, 3)) retain] autorelease];
+    }
+    // `quarter`: of the row's height, from above.
+    id<NSDraggingInfo> over(NSInteger row, int quarter)
+    {
+        const NSRect rect = [loadedTable() rectOfRow:0];
+        const CGFloat place = NSHeight(rect) * (static_cast<CGFloat>(row) + (quarter - 0.5) / 4);
+        return dragOver(loadedTable(), NSMakePoint(50, place), paths({"new.zmb"}));
+    }
+    std::vector<int> markedGaps()
+    {
+        std::vector<int> marked;
+        for (int gap = 0; gap <= kRows; ++gap)
+            if (![mUnmarked[static_cast<std::size_t>(gap)] isEqual:lookOfGap(gap)])
+                marked.push_back(gap);
+        return marked;
+    }
+    void dropIt(id<NSDraggingInfo> drag)
+    {
+        [loadedTable() prepareForDragOperation:drag];
+        [loadedTable() performDragOperation:drag];
+        [loadedTable() concludeDragOperation:drag];
+    }
+    // Comes over the table there and stays; answers whether a drop is taken, which then lands in that gap.
+    bool hoverAt(id<NSDraggingInfo> drag, int gap)
+    {
+        if ([loadedTable() draggingEntered:drag] == NSDragOperationNone)
+            return false;
+        EXPECT_THAT(markedGaps(), ElementsAre(gap));
+        EXPECT_EQ(NSDragOperationCopy, [loadedTable() draggingUpdated:drag]);
+        dropIt(drag);
+        EXPECT_EQ(file("new.zmb"), rowsOf(loadedApps())[static_cast<std::size_t>(gap)]);
+        return true;
+    }
+
+private:
+    std::vector<NSData*> mUnmarked;
+};
+
+class HoveringOverOneRow : public HoveringOverRows, public testing::WithParamInterface<int>
+{
+};
+} // namespace
+
+TEST_P(HoveringOverOneRow, MarksTheGapAboveAtItsUpperEdgeWhereTheDropLands)
+{
+    EXPECT_TRUE(hoverAt(over(GetParam(), 1), GetParam()));
+}
+
+TEST_P(HoveringOverOneRow, MarksTheGapBelowAtItsLowerEdgeWhereTheDropLands)
+{
+    EXPECT_TRUE(hoverAt(over(GetParam(), 4), GetParam() + 1));
+}
+
+TEST_P(HoveringOverOneRow, MarksNothingInItsMiddleWhereNoDropIsTaken)
+{
+    for (const int quarter : {2, 3})
+    {
+        EXPECT_EQ(NSDragOperationNone, [loadedTable() draggingEntered:over(GetParam(), quarter)]);
+        EXPECT_THAT(markedGaps(), IsEmpty());
+        EXPECT_EQ(NSDragOperationNone, [loadedTable() draggingUpdated:over(GetParam(), quarter)]);
+        EXPECT_THAT(markedGaps(), IsEmpty());
+    }
+}
+
+INSTANTIATE_TEST_SUITE_P(EveryRow, HoveringOverOneRow, testing::Values(0, 1, 2));
+
+TEST_F(HoveringOverRows, MarksTheEndAnywhereBelowThemWhereTheDropLands)
+{
+    for (int quarter = 1; quarter <= 8; ++quarter)
+    {
+        id<NSDraggingInfo> drag = over(kRows, quarter);
+        EXPECT_EQ(NSDragOperationCopy, [loadedTable() draggingEntered:drag]);
+        EXPECT_THAT(markedGaps(), ElementsAre(kRows)) << "quarter " << quarter;
+    }
+    EXPECT_TRUE(hoverAt(over(kRows, 6), kRows));
+}
+
+TEST_F(HoveringOverRows, MarksAGapAgainAfterTheMiddleOfARow)
+{
+    [loadedTable() draggingEntered:over(1, 1)];
+    EXPECT_THAT(markedGaps(), ElementsAre(1));
+    [loadedTable() draggingUpdated:over(1, 2)];
+    EXPECT_THAT(markedGaps(), IsEmpty());
+    [loadedTable() draggingUpdated:over(1, 1)];
+    EXPECT_THAT(markedGaps(), ElementsAre(1));
+    [loadedTable() draggingUpdated:over(1, 4)];
+    EXPECT_THAT(markedGaps(), ElementsAre(2));
 }

@@ -17,6 +17,21 @@ protected:
         return list;
     }
 
+    // From the middle of a row to the place at its edge where it stands for a gap.
+    static constexpr int kEdge = 7;
+
+    static constexpr Place edgeOf(int row, int fromMiddle)
+    {
+        return {places::tableRow(row).x, places::tableRow(row).y + fromMiddle};
+    }
+
+    // Opens the dialog with the first three files loaded.
+    void loadThree(const std::vector<std::string>& paths)
+    {
+        storeSuite({paths[0], paths[1], paths[2]});
+        open();
+    }
+
     // What is said when more are dropped than can be taken.
     void dropFiftyOne(Place place)
     {
@@ -142,7 +157,7 @@ TEST_F(DialogDrop, LoadsTwoFilesOfItsOwnListBetweenTheRowsOfTheTable)
     click(places::file(0));
     mScreen.clickHolding("shift", mDialog, places::file(1));
     const Place row = places::tableRow(0);
-    mScreen.drag(mDialog, places::file(1), mDialog, {row.x, row.y - places::kRowHeight / 2 + 1});
+    mScreen.drag(mDialog, places::file(1), mDialog, {row.x, row.y - places::kTableRowHeight / 2 + 1});
     EXPECT_TRUE(prints("2 applications were loaded.\n"));
     shoot("loaded");
     closeAndEnd();
@@ -171,10 +186,66 @@ TEST_F(DialogDrop, IsTakenBetweenTwoRows)
     const auto paths = writeManyLisp(3);
     open();
     dragFiles({paths[0], paths[1]}, kTable, [this] { EXPECT_TRUE(prints("2 applications were loaded.\n")); });
-    const Place between{places::tableRow(1).x, places::tableRow(1).y - places::kRowHeight / 2};
+    const Place between{places::tableRow(1).x, places::tableRow(1).y - places::kTableRowHeight / 2};
     dragFiles({paths[2]}, between, [this] { EXPECT_TRUE(prints(wasLoaded("many3.lsp"))); });
     shoot("between");
     closeAndEnd();
+}
+
+// What hovers over a row, from its upper edge on, and is dropped at its lower edge lands below the row.
+TEST_F(DialogDrop, LandsBelowTheRowWhoseLowerEdgeItHoversOver)
+{
+    const auto paths = writeManyLisp(4);
+    loadThree(paths);
+    const std::string first = look(places::tableRow(0));
+    const std::string second = look(places::tableRow(1));
+    const std::string third = look(places::tableRow(2));
+    auto source = dragSource({paths[3]});
+    mScreen.dragOver(dragWindow(), kDragButton, mDialog, edgeOf(1, -kEdge));
+    shoot("upper-edge");
+    mScreen.moveOn(mDialog, edgeOf(1, kEdge));
+    shoot("lower-edge");
+    mScreen.letGo();
+    EXPECT_TRUE(prints(wasLoaded("many4.lsp")));
+    shoot("landed");
+    source.reset(); // which gives the keyboard back
+    EXPECT_EQ(look(places::tableRow(0)), first);
+    EXPECT_EQ(look(places::tableRow(1)), second);
+    EXPECT_NE(look(places::tableRow(2)), third);
+    EXPECT_EQ(look(places::tableRow(3)), third);
+    closeAndEnd();
+}
+
+TEST_F(DialogDrop, LandsAtTheEndWhenItHoversOverTheLowerEdgeOfTheLastRow)
+{
+    const auto paths = writeManyLisp(4);
+    loadThree(paths);
+    const std::string third = look(places::tableRow(2));
+    const std::string empty = look(places::tableRow(3));
+    dragFiles({paths[3]}, edgeOf(2, kEdge), [this] { EXPECT_TRUE(prints(wasLoaded("many4.lsp"))); });
+    shoot("landed");
+    EXPECT_EQ(look(places::tableRow(2)), third);
+    EXPECT_NE(look(places::tableRow(3)), empty);
+    closeAndEnd();
+}
+
+TEST_F(DialogDrop, IsNotTakenByTheMiddleOfARowWhichIsNotMarked)
+{
+    const auto paths = writeManyLisp(4);
+    loadThree(paths);
+    const Place gap = edgeOf(1, -places::kTableRowHeight / 2);
+    const std::string unmarked = look(gap);
+    const std::string row = look(places::tableRow(1));
+    auto source = dragSource({paths[3]});
+    mScreen.dragOver(dragWindow(), kDragButton, mDialog, edgeOf(1, -kEdge));
+    EXPECT_NE(look(gap), unmarked);
+    mScreen.moveOn(mDialog, {places::tableRow(1).x, places::tableRow(1).y - 1});
+    shoot("hovering");
+    EXPECT_EQ(look(gap), unmarked);
+    EXPECT_EQ(look(places::tableRow(1)), row);
+    mScreen.letGo();
+    source.reset();
+    EXPECT_THAT(closeAndEnd(), Not(HasSubstr("many4.lsp was loaded")));
 }
 
 TEST_F(DialogDrop, IsNotTakenByADialogBehindAMessageBox)

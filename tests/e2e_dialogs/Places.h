@@ -5,7 +5,8 @@
 
 namespace places
 {
-inline constexpr int kRowHeight = 20;
+inline constexpr int kTableRowHeight = 18;
+inline constexpr int kFileRowHeight = 20;
 
 // The main dialog
 inline constexpr int kDialogWidth = 750;
@@ -37,10 +38,10 @@ inline constexpr Place kFirstSuiteRow{80, 89};
 // A row of the table that shows, and of the list of files; that of the Add panel stands in the same place.
 constexpr Place tableRow(int row)
 {
-    return {80, 464 + row * kRowHeight};
+    return {80, 464 + row * kTableRowHeight};
 }
 constexpr Place file(int row)
 {
-    return {120, 73 + row * kRowHeight};
+    return {120, 73 + row * kFileRowHeight};
 }
 } // namespace places

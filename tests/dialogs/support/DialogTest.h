@@ -131,3 +131,5 @@ void pressKey(NSWindow* window, NSString* characters, NSUInteger modifiers = 0);
 
 // A drag of files, as a drop target sees it.
 id<NSDraggingInfo> dragOf(NSArray* paths);
+// The same with the pointer there, in the view's coordinates.
+id<NSDraggingInfo> dragOver(NSView* view, NSPoint place, NSArray* paths);

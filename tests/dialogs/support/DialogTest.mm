@@ -357,8 +357,10 @@ void pressKey(NSWindow* window, NSString* characters, NSUInteger modifiers)
 @interface FileDrag : NSObject
 {
     NSArray* mPaths;
+    NSPoint mPlace;
 }
 - (id)initWithPaths:(NSArray*)paths;
+- (void)setPlace:(NSPoint)place;
 @end
 
 @implementation FileDrag
@@ -374,6 +376,26 @@ void pressKey(NSWindow* window, NSString* characters, NSUInteger modifiers)
 {
     [mPaths release];
     [super dealloc];
+}
+
+- (void)setPlace:(NSPoint)place
+{
+    mPlace = place;
+}
+
+- (NSDragOperation)draggingSourceOperationMask
+{
+    return NSDragOperationCopy;
+}
+
+- (id)draggingSource
+{
+    return nil; // another program
+}
+
+- (NSPoint)draggingLocation
+{
+    return mPlace;
 }
 
 - (id)draggingPasteboard
@@ -392,6 +414,13 @@ void pressKey(NSWindow* window, NSString* characters, NSUInteger modifiers)
 }
 
 @end
+
+id<NSDraggingInfo> dragOver(NSView* view, NSPoint place, NSArray* paths)
+{
+    FileDrag* drag = [[[FileDrag alloc] initWithPaths:paths] autorelease];
+    [drag setPlace:[view convertPoint:place toView:nil]];
+    return (id<NSDraggingInfo>)drag;
+}
 
 id<NSDraggingInfo> dragOf(NSArray* paths)
 {

@@ -21,4 +21,8 @@ void keepModalWindowsInFront();
 
 // Lets scrollers that hide by themselves come and go at any scale.
 void keepScrollersSteady();
+
+// Lets tables mark the gap between rows that is nearest to what is dragged, and nothing where no drop is
+// taken.
+void showWhereDropsLandInTables();
 } // namespace tessel::windowing

@@ -73,6 +73,7 @@ void completeBehaviour()
     letNewWindowsHaveTheKeyboard();
     keepModalWindowsInFront();
     keepScrollersSteady();
+    showWhereDropsLandInTables();
 }
 
 void completeLook()
