@@ -11,6 +11,7 @@
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
 #include "modrig/dialogs/Paths.h"
+#include "modrig/dialogs/model/RowSteps.h"
 #include "modrig/dialogs/model/ShownText.h"
 #include "modrig/dialogs/model/TypedLetters.h"
 #include "modrig/dialogs/platform/Desktop.h"
@@ -217,11 +218,41 @@ NSString* ModrigUtils::HelpKey()
     return YES;
 }
 
+- (ModrigUtils::RowPlaces)places
+{
+    const auto page = static_cast<std::size_t>(NSHeight([self visibleRect]) / [self rowHeight]);
+    ModrigUtils::RowPlaces places = {static_cast<std::size_t>([self numberOfRows]), page > 1 ? page : 1, {}};
+    if ([self selectedRow] >= 0)
+        places.selected = static_cast<std::size_t>([self selectedRow]);
+    return places;
+}
+
+// The toolkit's own would come to a row that cannot be selected, and select nothing. With Shift it leaves
+// such rows out by itself, and so it may do where there are none.
+- (BOOL)moveBy:(NSEvent*)event
+{
+    const ModrigUtils::TableKey key = keyOf(event);
+    if (key.command || key.alternate || ([event modifierFlags] & NSShiftKeyMask))
+        return NO;
+    const auto canBeSelected = [=](std::size_t row)
+    {
+        return static_cast<bool>([(id)[self delegate] tableView:self
+                                                shouldSelectRow:static_cast<NSInteger>(row)]);
+    };
+    const ModrigUtils::RowPlaces places = [self places];
+    const auto row = ModrigUtils::RowForKey(key.character, places, canBeSelected);
+    if (!row || row == ModrigUtils::RowForKey(key.character, places, [](std::size_t) { return true; }))
+        return NO;
+    [self selectRowIndexes:[NSIndexSet indexSetWithIndex:*row] byExtendingSelection:NO];
+    [self scrollRowToVisible:static_cast<NSInteger>(*row)];
+    return YES;
+}
+
 - (void)keyDown:(NSEvent*)event
 {
     const ModrigUtils::TableKey key = keyOf(event);
     const auto now = std::chrono::steady_clock::now();
-    if ([self takeKey:event])
+    if ([self takeKey:event] || [self moveBy:event])
         return;
     if (isLetter(key, now))
         [self goToRowBeginningWith:typedLetters().Add(key.character, now)];

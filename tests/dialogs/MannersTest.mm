@@ -161,6 +161,15 @@ protected:
         }
         return titles;
     }
+    std::vector<std::size_t> selectedRows()
+    {
+        std::vector<std::size_t> rows;
+        NSIndexSet* selected = [historyTable() selectedRowIndexes];
+        for (NSUInteger row = [selected firstIndex]; row != NSNotFound;
+             row = [selected indexGreaterThanIndex:row])
+            rows.push_back(row);
+        return rows;
+    }
     static bool isEnabled(NSTableView* table, NSMenu* menu, NSString* title)
     {
         return [(id)table validateMenuItem:[menu itemWithTitle:title]];
@@ -239,6 +248,68 @@ TEST_F(TableKeys, TakeARangeWithShiftAndSingleRowsWithControl)
     EXPECT_THAT(selectionOf(historyList()), ElementsAre(file("a.lsp"), file("c.lsp")));
     events::clickRow(historyTable(), 3, NSControlKeyMask);
     EXPECT_THAT(selectionOf(historyList()), ElementsAre(file("a.lsp"), file("c.lsp"), file("d.lsp")));
+}
+
+TEST_F(TableKeys, TakeARangeWithShiftAndTheArrows)
+{
+    openHistory({"a.lsp", "b.lsp", "c.lsp", "d.lsp"});
+    events::clickRow(historyTable(), 1);
+    pressInTable(historyTable(), key(NSDownArrowFunctionKey), NSShiftKeyMask);
+    EXPECT_THAT(selectedRows(), ElementsAre(1, 2));
+    pressInTable(historyTable(), key(NSDownArrowFunctionKey), NSShiftKeyMask);
+    EXPECT_THAT(selectedRows(), ElementsAre(1, 2, 3));
+    pressInTable(historyTable(), key(NSUpArrowFunctionKey), NSShiftKeyMask);
+    EXPECT_THAT(selectedRows(), ElementsAre(1, 2));
+    pressInTable(historyTable(), key(NSUpArrowFunctionKey), NSShiftKeyMask);
+    pressInTable(historyTable(), key(NSUpArrowFunctionKey), NSShiftKeyMask);
+    EXPECT_THAT(selectedRows(), ElementsAre(0, 1));
+}
+
+TEST_F(TableKeys, TakeARangeToTheEndsWithShift)
+{
+    openHistory({"a.lsp", "b.lsp", "c.lsp", "d.lsp"});
+    events::clickRow(historyTable(), 1);
+    pressInTable(historyTable(), key(NSEndFunctionKey), NSShiftKeyMask);
+    EXPECT_THAT(selectedRows(), ElementsAre(1, 2, 3));
+    pressInTable(historyTable(), key(NSHomeFunctionKey), NSShiftKeyMask);
+    EXPECT_THAT(selectedRows(), ElementsAre(0, 1));
+    pressInTable(historyTable(), key(NSEndFunctionKey));
+    EXPECT_THAT(selectedRows(), ElementsAre(3));
+    pressInTable(historyTable(), key(NSHomeFunctionKey));
+    EXPECT_THAT(selectedRows(), ElementsAre(0));
+}
+
+TEST_F(TableKeys, GoAPageFurtherAndTakeItWithShift)
+{
+    for (int number = 0; number < 60; ++number)
+        gHistoryList.AddTail(CStdStr(file("tool" + std::to_string(number) + ".lsp")));
+    openHistory({});
+    events::clickRow(historyTable(), 0);
+    pressInTable(historyTable(), key(NSPageDownFunctionKey), NSShiftKeyMask);
+    const auto page = selectedRows();
+    EXPECT_GT(page.size(), 4u);
+    EXPECT_LT(page.size(), 30u);
+    EXPECT_EQ(0u, page.front());
+    pressInTable(historyTable(), key(NSPageDownFunctionKey));
+    EXPECT_THAT(selectedRows(), ElementsAre(2 * page.back()));
+    EXPECT_TRUE(NSLocationInRange(2 * page.back(), [historyTable() rowsInRect:[historyTable() visibleRect]]));
+    pressInTable(historyTable(), key(NSPageUpFunctionKey), NSShiftKeyMask);
+    EXPECT_EQ(page.back(), selectedRows().front());
+    EXPECT_EQ(page.size(), selectedRows().size());
+}
+
+TEST_F(TableKeys, PassOverRowsThatCannotBeSelected)
+{
+    openLoaded({"a.zmb", "tool.lsp", "b.zmb", "other.lsp"});
+    events::clickRow(loadedTable(), 0);
+    pressInTable(loadedTable(), key(NSDownArrowFunctionKey));
+    EXPECT_THAT(selectionOf(loadedApps()), ElementsAre(file("b.zmb")));
+    pressInTable(loadedTable(), key(NSHomeFunctionKey));
+    EXPECT_THAT(selectionOf(loadedApps()), ElementsAre(file("a.zmb")));
+    pressInTable(loadedTable(), key(NSEndFunctionKey), NSShiftKeyMask);
+    EXPECT_THAT(selectionOf(loadedApps()), ElementsAre(file("a.zmb"), file("b.zmb")));
+    pressInTable(loadedTable(), key(NSEndFunctionKey));
+    EXPECT_THAT(selectionOf(loadedApps()), ElementsAre(file("b.zmb")));
 }
 
 TEST_F(TableKeys, OfTheMouseOpenAMenuWithWhatTheButtonsDo)

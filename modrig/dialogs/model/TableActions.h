@@ -43,6 +43,10 @@ inline constexpr wchar_t kDeleteKey = 0x7F;
 inline constexpr wchar_t kBackspaceKey = 0x08;
 inline constexpr wchar_t kUpKey = 0xF700;
 inline constexpr wchar_t kDownKey = 0xF701;
+inline constexpr wchar_t kHomeKey = 0xF729;
+inline constexpr wchar_t kEndKey = 0xF72B;
+inline constexpr wchar_t kPageUpKey = 0xF72C;
+inline constexpr wchar_t kPageDownKey = 0xF72D;
 
 // The menu of the table's rows, from top to bottom.
 std::vector<TableAction> MenuOf(TableKind kind);
