@@ -25,7 +25,8 @@ constexpr char kHasFolder[] = "MODRIG_UI_TESTS_HAVE_A_FOLDER";
 [[noreturn]] void startAgainIn(const TemporaryFolder& folder, char** argv)
 {
     prctl(PR_SET_PDEATHSIG, SIGKILL);
-    for (const char* variable : {"TMP", "TEMP"})
+    setenv("TMPDIR", std::filesystem::temp_directory_path().c_str(), 1); // of the tests themselves
+    for (const char* variable : {"TMP", "TEMP"})                         // of the toolkit
         setenv(variable, folder.path().c_str(), 1);
     setenv(kHasFolder, "1", 1);
     execv("/proc/self/exe", argv);
