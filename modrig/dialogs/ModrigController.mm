@@ -103,8 +103,6 @@
 {
     [self readSettings];
     [TsOCModrigUtil setModrigController:self];
-    [ModrigTableView adopt:loadedAppsTableView];
-    [ModrigTableView adopt:historyListTableView];
     [helpButton setKeyEquivalent:ModrigUtils::HelpKey()];
     NSArray* files = [NSArray arrayWithObject:NSFilenamesPboardType];
     [loadedAppsTableView registerForDraggedTypes:files];

@@ -1,6 +1,6 @@
 #import "modrig/dialogs/ModrigNameCell.h"
 
-#include <objc/runtime.h>
+#import "modrig/dialogs/ModrigTableView.h"
 
 #include "modrig/dialogs/Paths.h"
 #include "modrig/dialogs/model/RowLook.h"
@@ -13,13 +13,6 @@ constexpr CGFloat kMargin = 8; // what a cell leaves free around its text
 
 @implementation ModrigNameCell
 
-// The window file knows the toolkit's cells only. This class adds no variables of its own.
-+ (void)adoptIn:(NSTableColumn*)column
-{
-    if (!ModrigPlatform::TablesShortenTexts())
-        object_setClass([column dataCell], [ModrigNameCell class]);
-}
-
 - (NSString*)textIn:(CGFloat)width
 {
     NSDictionary* font = [NSDictionary dictionaryWithObject:[self font] forKey:NSFontAttributeName];
@@ -31,6 +24,10 @@ constexpr CGFloat kMargin = 8; // what a cell leaves free around its text
 
 - (void)drawInteriorWithFrame:(NSRect)frame inView:(NSView*)view
 {
+    auto* table = (ModrigTableView*)view;
+    [self setTextColor:[table textColorOfRow:[table rowAtPoint:NSMakePoint(NSMidX(frame), NSMidY(frame))]]];
+    if (ModrigPlatform::TablesShortenTexts())
+        return [super drawInteriorWithFrame:frame inView:view];
     NSString* whole = [[[self stringValue] copy] autorelease];
     [self setStringValue:[self textIn:NSWidth(frame)]];
     [super drawInteriorWithFrame:frame inView:view];

@@ -83,27 +83,4 @@ std::vector<std::size_t> indexesOf(NSIndexSet* rows)
     }
 }
 
-- (void)tableView:(NSTableView*)table
-    willDisplayCell:(id)cell
-     forTableColumn:(NSTableColumn*)column
-                row:(NSInteger)row
-{
-    (void)column;
-    [(ModrigTableView*)table prepareCell:cell row:row];
-}
-
-- (NSString*)tableView:(NSTableView*)table
-        toolTipForCell:(NSCell*)cell
-                  rect:(NSRectPointer)rect
-           tableColumn:(NSTableColumn*)column
-                   row:(NSInteger)row
-         mouseLocation:(NSPoint)place
-{
-    (void)cell;
-    (void)rect;
-    (void)column;
-    (void)place;
-    return [(ModrigTableView*)table tipForRow:row];
-}
-
 @end

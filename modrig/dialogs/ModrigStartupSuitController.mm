@@ -44,7 +44,6 @@ constexpr NSInteger kRemoveSegment = 1;
 - (void)doInit
 {
     ModrigPlatform::CompleteSegments(segmentedControl);
-    [ModrigTableView adopt:startupTableView];
     TsUIPersistentStore* settings = [[[TsUIPersistentStore alloc] init] autorelease];
     ModrigUtils::RestoreFrame([self window], settings, kSuiteWindowSetting);
     ModrigUtils::RestoreColumns(startupTableView, settings, kSuiteColumnSetting);

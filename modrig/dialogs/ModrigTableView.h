@@ -14,14 +14,11 @@ NSString* HelpKey();
 
 @interface ModrigTableView : NSTableView
 
-// Makes a table of a window file one of these.
-+ (void)adopt:(NSTableView*)table;
-
 // Does what the key stands for, and answers NO when it stands for nothing here. A key that cannot act beeps.
 - (BOOL)takeKey:(NSEvent*)event;
 
-// Makes the text of a row grey that is of no use: what the owner does before a cell is drawn.
-- (void)prepareCell:(id)cell row:(NSInteger)row;
+// Grey for a row that is of no use.
+- (NSColor*)textColorOfRow:(NSInteger)row;
 // What the tip of a row says: its whole path, and why it is grey.
 - (NSString*)tipForRow:(NSInteger)row;
 // How all rows are at the moment.

@@ -1,13 +1,9 @@
 #import "modrig/dialogs/ModrigTableView.h"
 
-#include <objc/runtime.h>
-#include <tesselui/tsuieach.h>
-
 #include <algorithm>
 #include <optional>
 
 #import "modrig/dialogs/ModrigFilePath.h"
-#import "modrig/dialogs/ModrigNameCell.h"
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
 #include "modrig/dialogs/Paths.h"
@@ -103,15 +99,11 @@ NSString* ModrigUtils::HelpKey()
 
 @implementation ModrigTableView
 
-// The window file knows the toolkit's tables only. This class adds no variables of its own.
-+ (void)adopt:(NSTableView*)table
+- (void)awakeFromNib
 {
-    object_setClass(table, [ModrigTableView class]);
-    for (NSTableColumn* column : tsuiEach<NSTableColumn*>([table tableColumns]))
-        [ModrigNameCell adoptIn:column];
-    NSView* frame = [[table enclosingScrollView] contentView];
+    NSView* frame = [[self enclosingScrollView] contentView];
     [frame setPostsFrameChangedNotifications:YES];
-    [[NSNotificationCenter defaultCenter] addObserver:table
+    [[NSNotificationCenter defaultCenter] addObserver:self
                                              selector:@selector(fillFrame:)
                                                  name:NSViewFrameDidChangeNotification
                                                object:frame];
@@ -324,21 +316,17 @@ NSString* ModrigUtils::HelpKey()
     return states;
 }
 
-- (void)prepareCell:(id)cell row:(NSInteger)row
+- (NSColor*)textColorOfRow:(NSInteger)row
 {
     ModrigFilePath* file = [self fileInRow:row];
-    if (!file)
-        return;
-    const bool isGrey = [self stateOfFile:file] != ModrigUtils::RowState::kUsable;
-    [cell setTextColor:isGrey ? [NSColor disabledControlTextColor] : [NSColor controlTextColor]];
+    const bool isGrey = file && [self stateOfFile:file] != ModrigUtils::RowState::kUsable;
+    return isGrey ? [NSColor disabledControlTextColor] : [NSColor controlTextColor];
 }
 
 // One tip for each row that shows. This is called whenever others do.
 - (void)resetCursorRects
 {
     [super resetCursorRects];
-    if (ModrigPlatform::TablesShowTips())
-        return;
     [self removeAllToolTips];
     const NSRange shown = [self rowsInRect:[self visibleRect]];
     for (NSUInteger row = shown.location; row < NSMaxRange(shown); ++row)

@@ -397,15 +397,11 @@ TEST_F(Manners, DrawMissingFilesInGreyAndLongNamesWithAnEllipsis)
         [cell setStringValue:[[historyTable() dataSource] tableView:historyTable()
                                           objectValueForTableColumn:column
                                                                 row:row]];
-        [(id)[historyTable() delegate] tableView:historyTable()
-                                 willDisplayCell:cell
-                                  forTableColumn:column
-                                             row:row];
         return (NSTextFieldCell*)cell;
     };
-    EXPECT_EQ([NSColor controlTextColor], [cellOf(0) textColor]);
+    EXPECT_EQ([NSColor controlTextColor], [(ModrigTableView*)historyTable() textColorOfRow:0]);
     EXPECT_EQ(L"a.lsp", wide([cellOf(0) stringValue]));
-    EXPECT_EQ([NSColor disabledControlTextColor], [cellOf(1) textColor]);
+    EXPECT_EQ([NSColor disabledControlTextColor], [(ModrigTableView*)historyTable() textColorOfRow:1]);
     const std::wstring shown = wide([(ModrigNameCell*)cellOf(2) textIn:170]);
     EXPECT_EQ(L'…', shown.back());
     EXPECT_LT(shown.size(), 40u);

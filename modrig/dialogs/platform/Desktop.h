@@ -16,8 +16,6 @@ NSEvent* ClickOnTable(NSEvent* event);
 // Shows the file where it lies, in the program that the desktop has for folders.
 void ShowInFolder(NSString* path);
 
-// Whether the toolkit's tables shorten what does not fit into a cell, and ask their delegates for the tips of
-// cells.
+// Whether the toolkit's tables shorten what does not fit into a cell.
 bool TablesShortenTexts();
-bool TablesShowTips();
 } // namespace ModrigPlatform

@@ -26,9 +26,4 @@ bool TablesShortenTexts()
 {
     return true;
 }
-
-bool TablesShowTips()
-{
-    return true;
-}
 } // namespace ModrigPlatform

@@ -49,9 +49,4 @@ bool TablesShortenTexts()
 {
     return false;
 }
-
-bool TablesShowTips()
-{
-    return false;
-}
 } // namespace ModrigPlatform
