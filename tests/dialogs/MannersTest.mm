@@ -3,6 +3,8 @@
 #include "tests/dialogs/support/Events.h"
 #include "tests/dialogs/support/Pictures.h"
 
+#include "host/ui/platform/gnustep/TextFitting.h"
+
 #include <tesselui/tsuieach.h>
 
 #import "modrig/dialogs/ModrigFilePath.h"
@@ -469,4 +471,24 @@ TEST_F(Manners, ShowTheTipOfTheDisabledUnloadButtonWhenThePointerRestsOnIt)
     events::movePointerTo(unload, events::middleOf([unload bounds]));
     EXPECT_TRUE(events::comesTrue([&] { return events::windowsOnTheScreen() > before; }));
     events::movePointerTo([mPanel contentView], NSMakePoint(1, 1));
+}
+
+TEST_F(Manners, EndTheTitleOfANarrowColumnInAnEllipsis)
+{
+    openHistory({"a.lsp"});
+    NSTableColumn* column = [[historyTable() tableColumns] objectAtIndex:0];
+    const auto lookOf = [&](NSString* title)
+    {
+        [[column headerCell] setStringValue:title];
+        [[historyTable() headerView] setNeedsDisplay:YES];
+        [mPanel displayIfNeeded];
+        return pictureOf([historyTable() headerView], [[historyTable() headerView] headerRectOfColumn:0]);
+    };
+    NSString* title = @"Files that were loaded before, in the order of loading";
+    const CGFloat room = [column width] - 8;
+    NSString* shown = tessel::windowing::fitted(title, [[column headerCell] font], room);
+    EXPECT_EQ(L'…', wide(shown).back());
+    EXPECT_GT([shown length], 10u);
+    EXPECT_TRUE([lookOf(title) isEqual:lookOf(shown)]);
+    EXPECT_EQ(L"File", wide(tessel::windowing::fitted(@"File", [[column headerCell] font], room)));
 }

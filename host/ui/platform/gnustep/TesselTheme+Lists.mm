@@ -3,6 +3,7 @@
 
 #include "host/ui/platform/gnustep/StandIn.h"
 #include "host/ui/platform/gnustep/TesselTheme.h"
+#include "host/ui/platform/gnustep/TextFitting.h"
 #include "host/ui/platform/gnustep/ThemeFocus.h"
 #include "host/ui/platform/gnustep/ThemeShapes.h"
 
@@ -74,6 +75,22 @@ CheckSpace toolkitCheckSpace;
 using SetFrameSize = void (*)(id, SEL, NSSize);
 SetFrameSize toolkitSetFrameSize;
 
+using DrawInterior = void (*)(id, SEL, NSRect, NSView*);
+DrawInterior toolkitDrawTitle;
+
+constexpr CGFloat kTitleMargin = 8; // what a header leaves free around its title
+
+// A copy: a cell that gets another text asks to be drawn again.
+void drawTitle(id header, SEL selector, NSRect frame, NSView* view)
+{
+    NSString* whole = [header stringValue];
+    NSString* title = fitted(whole, [header font], NSWidth(frame) - kTitleMargin);
+    NSCell* shown = title == whole ? header : [[header copy] autorelease];
+    if (shown != header)
+        [shown setStringValue:title];
+    toolkitDrawTitle(shown, selector, frame, view);
+}
+
 // Asked whenever the size changes, from the first one on. The buttons would take clicks where nothing is
 // drawn; a knob and its track are what people expect.
 void checkSpace(id scroller, SEL selector)
@@ -105,5 +122,6 @@ void completeTables()
     toolkitCheckSpace = standInFor("NSScroller", @selector(checkSpaceForParts), checkSpace);
     toolkitSetFrameSize = overrideIn("NSTableHeaderView", @selector(setFrameSize:), setHeaderSize);
     overrideIn("NSTableHeaderView", @selector(resizeWithOldSuperviewSize:), growWithPlace);
+    toolkitDrawTitle = overrideIn("NSTableHeaderCell", @selector(drawInteriorWithFrame:inView:), drawTitle);
 }
 } // namespace tessel::windowing
