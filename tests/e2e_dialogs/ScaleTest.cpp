@@ -7,6 +7,8 @@ namespace
 {
 constexpr DisplayKind kLargeDisplay{.width = 2600, .height = 2500};
 constexpr int kDialogHeight = 729;
+constexpr Place kNameLabel{36, 330};
+constexpr Place kHiddenFilesBox{597, 331};
 constexpr double kRounding = 3; // of the parts to whole pixels, added up
 
 void expectScaled(const std::string& size, double scale)
@@ -48,6 +50,40 @@ TEST_P(DialogScale, OpensLargerAndAnswersClicks)
     click(scaledPlace(places::kLoadFromHistory, scale));
     EXPECT_TRUE(prints(wasLoaded("many2.lsp")));
     shoot("loaded");
+    closeAndEnd();
+}
+
+// What lies outside of the inside of a window is black, and what is cut of it is missing.
+TEST_P(DialogScale, FillsTheWindowToItsEdges)
+{
+    setToolkitSetting("GSScaleFactor", std::to_string(GetParam()));
+    open();
+    int width = 0;
+    int height = 0;
+    ASSERT_EQ(2, std::sscanf(mScreen.sizeOf(mDialog).c_str(), "%dx%d", &width, &height));
+    const std::string background = mScreen.colourOf(mDialog, {0, 0}, width, 2);
+    EXPECT_NE(background, "several");
+    EXPECT_EQ(mScreen.colourOf(mDialog, {0, height - 2}, width, 2), background);
+    EXPECT_EQ(mScreen.colourOf(mDialog, {0, 0}, 2, height), background);
+    EXPECT_EQ(mScreen.colourOf(mDialog, {width - 2, 0}, 2, height), background);
+    closeAndEnd();
+}
+
+// Letters that are drawn over themselves look bold, and the frame of the focus stays where it was.
+TEST_P(DialogScale, DrawsAgainWhatWasThere)
+{
+    setToolkitSetting("GSScaleFactor", std::to_string(GetParam()));
+    open();
+    const Place label = scaledPlace(kNameLabel, GetParam());
+    const Place box = scaledPlace(kHiddenFilesBox, GetParam());
+    const std::string labelBefore = look(label);
+    const std::string boxBefore = look(box);
+    press("Tab", 2);
+    EXPECT_TRUE(changes(box, boxBefore)) << "it has the focus";
+    shoot("focus");
+    press("Tab", 3);
+    EXPECT_TRUE(comesTrue([&] { return look(box) == boxBefore; }));
+    EXPECT_EQ(look(label), labelBefore);
     closeAndEnd();
 }
 

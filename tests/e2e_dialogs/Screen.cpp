@@ -237,3 +237,14 @@ std::string Screen::look(const std::string& window, Place place) const
         throw std::runtime_error("cannot look at the window (Debian package imagemagick)");
     return sum;
 }
+
+std::string Screen::colourOf(const std::string& window, Place corner, int width, int height) const
+{
+    const std::string piece = std::to_string(width) + "x" + std::to_string(height) + "+" +
+                              std::to_string(corner.x) + "+" + std::to_string(corner.y);
+    const std::string found = run("import -window " + window + " -crop " + piece + " miff:- | convert - " +
+                                  "-format '%k %[pixel:p{0,0}]' info:");
+    if (found.empty())
+        throw std::runtime_error("cannot look at the window (Debian package imagemagick)");
+    return found.starts_with("1 ") ? found.substr(2) : "several";
+}

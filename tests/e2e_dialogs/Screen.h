@@ -70,6 +70,8 @@ public:
     void shoot(const std::string& name) const;
     // What a piece of the window around the place looks like: equal as long as no pixel of it changes.
     std::string look(const std::string& window, Place place) const;
+    // The colour of a piece of the window, from its left and its upper edge; "several" when it has more.
+    std::string colourOf(const std::string& window, Place corner, int width, int height) const;
 
 private:
     std::string run(const std::string& command) const;

@@ -25,4 +25,10 @@ void keepScrollersSteady();
 // Lets tables mark the gap between rows that is nearest to what is dragged, and nothing where no drop is
 // taken.
 void showWhereDropsLandInTables();
+
+// Draws whole pixels again when a view asks for it, whose edges lie within pixels at some scales.
+void drawWholePixels();
+
+// Puts the inside of every window where its frame leaves room for it, at any scale.
+void placeContentsOfWindows();
 } // namespace tessel::windowing

@@ -30,6 +30,21 @@ void showScrollersNeeded(NSScrollView* scrollView, NSClipView* clip)
         [scrollView setHasHorizontalScroller:wide];
 }
 
+// The toolkit draws a knob, over the whole length, for a list that is larger by that little.
+void restScroller(NSScroller* scroller, CGFloat content, CGFloat room)
+{
+    if (content <= room + kNoticed)
+        [scroller setEnabled:NO];
+}
+
+void restScrollers(NSScrollView* scrollView, NSClipView* clip)
+{
+    const NSSize content = [[clip documentView] frame].size;
+    const NSSize room = [clip bounds].size;
+    restScroller([scrollView verticalScroller], content.height, room.height);
+    restScroller([scrollView horizontalScroller], content.width, room.width);
+}
+
 void reflectScrolling(id scrollView, SEL selector, NSClipView* clip)
 {
     const bool decides = [scrollView autohidesScrollers] && clip == [scrollView contentView];
@@ -39,6 +54,8 @@ void reflectScrolling(id scrollView, SEL selector, NSClipView* clip)
         showScrollersNeeded(scrollView, clip);
     }
     toolkitReflectScrolling(scrollView, selector, clip);
+    if (clip == [scrollView contentView])
+        restScrollers(scrollView, clip);
     if (decides)
         [scrollView setAutohidesScrollers:YES];
 }

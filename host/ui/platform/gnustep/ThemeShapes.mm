@@ -1,5 +1,8 @@
 #include "host/ui/platform/gnustep/ThemeShapes.h"
 
+#include <algorithm>
+#include <cmath>
+
 #include "host/ui/platform/gnustep/TesselTheme.h"
 
 namespace tessel::windowing
@@ -19,10 +22,25 @@ NSColor* lineColor()
     return themeColor(@"lineColor");
 }
 
-// A line drawn between pixels is two pixels wide and pale.
+// A line is so many whole pixels wide, at a scale of one and a half as well.
+CGFloat lineWidth()
+{
+    const CGFloat scale = [[[NSView focusView] window] userSpaceScaleFactor];
+    return std::max<CGFloat>(1, std::round(scale)) / scale;
+}
+
+// The rectangle whose outline is a line along the inner edge of this one: a line drawn between pixels is
+// wider and pale, and one beyond the edge is cut.
 NSRect onPixels(NSRect rect)
 {
-    return NSInsetRect(NSIntegralRect(rect), 0.5, 0.5);
+    constexpr CGFloat kRounding = 0.01;
+    NSView* view = [NSView focusView];
+    const NSRect pixels = [view convertRect:rect toView:nil];
+    const CGFloat left = std::ceil(NSMinX(pixels) - kRounding);
+    const CGFloat bottom = std::ceil(NSMinY(pixels) - kRounding);
+    const NSRect whole = NSMakeRect(left, bottom, std::floor(NSMaxX(pixels) + kRounding) - left,
+                                    std::floor(NSMaxY(pixels) + kRounding) - bottom);
+    return NSInsetRect([view convertRect:whole fromView:nil], lineWidth() / 2, lineWidth() / 2);
 }
 
 NSBezierPath* rounded(NSRect rect, CGFloat corner)
@@ -36,6 +54,7 @@ void drawRounded(NSRect rect, CGFloat corner, NSColor* fill, NSColor* line)
     [fill set];
     [path fill];
     [line set];
+    [path setLineWidth:lineWidth()];
     [path stroke];
 }
 
@@ -89,10 +108,11 @@ void drawButtonShape(NSRect shape, ButtonLook look)
 
 NSRect drawBorder(NSRect frame)
 {
-    [[NSColor controlBackgroundColor] set];
-    NSFrameRectWithWidth(frame, kBorderWidth);
+    fill(frame, [NSColor controlBackgroundColor]);
+    NSBezierPath* line = [NSBezierPath bezierPathWithRect:onPixels(frame)];
+    [line setLineWidth:lineWidth()];
     [lineColor() set];
-    NSFrameRect(frame);
+    [line stroke];
     return NSInsetRect(frame, kBorderWidth, kBorderWidth);
 }
 

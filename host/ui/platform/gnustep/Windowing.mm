@@ -74,6 +74,8 @@ void completeBehaviour()
     keepModalWindowsInFront();
     keepScrollersSteady();
     showWhereDropsLandInTables();
+    drawWholePixels();
+    placeContentsOfWindows();
 }
 
 void completeLook()
