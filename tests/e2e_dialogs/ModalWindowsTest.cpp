@@ -1,6 +1,7 @@
 // Windows that wait for an answer, over those that they came from.
 #include "tests/e2e_dialogs/DialogTest.h"
 
+#include <cstdio>
 #include <ios>
 #include <sstream>
 
@@ -55,6 +56,29 @@ protected:
         EXPECT_TRUE(mScreen.waitUntilActive(window));
     }
 
+    // The numbers that window managers have taken from Motif. Not all of them keep to it.
+    void expectWantsNoMinimizeButton(const std::string& window) const
+    {
+        constexpr unsigned kHasFunctionsAndDecorations = 3;
+        constexpr unsigned kAllOrMinimizeFunction = 1 | 8;
+        constexpr unsigned kAllOrMinimizeButton = 1 | 32;
+        unsigned flags = 0;
+        unsigned functions = 0;
+        unsigned decorations = 0;
+        const std::string hints = mScreen.property(window, "_MOTIF_WM_HINTS");
+        ASSERT_EQ(3, std::sscanf(hints.c_str(), "0x%x, 0x%x, 0x%x", &flags, &functions, &decorations))
+            << hints;
+        EXPECT_EQ(flags & kHasFunctionsAndDecorations, kHasFunctionsAndDecorations) << hints;
+        EXPECT_EQ(functions & kAllOrMinimizeFunction, 0u) << hints;
+        EXPECT_EQ(decorations & kAllOrMinimizeButton, 0u) << hints;
+    }
+
+    void expectComesBackWhenMinimized(const std::string& window, const char* title) const
+    {
+        mScreen.minimize(window);
+        EXPECT_TRUE(comesTrue([&] { return mScreen.window(title) == window; }));
+    }
+
     std::string mSuite;
 };
 } // namespace
@@ -63,6 +87,7 @@ TEST_F(ModalWindows, AMessageBoxBelongsToTheDialogAndStaysOverIt)
 {
     const std::string box = openMessageBox();
     expectBelongsTo(mDialog, box);
+    expectWantsNoMinimizeButton(box);
     expectStaysOver(mDialog, kEmptyPlaceOfDialog, box);
     dismissMessageBox();
     closeAndEnd();
@@ -105,6 +130,7 @@ TEST_F(ModalWindows, TheStartupSuiteBelongsToTheDialogAndStaysOverIt)
 {
     openSuite();
     expectBelongsTo(mDialog, mSuite);
+    expectWantsNoMinimizeButton(mSuite);
     expectStaysOver(mDialog, kEmptyPlaceOfDialog, mSuite);
     mScreen.key("Escape");
     EXPECT_TRUE(mScreen.waitUntilGone(kSuiteDialog));
@@ -118,6 +144,7 @@ TEST_F(ModalWindows, TheAddPanelBelongsToTheStartupSuiteAndStaysOverBoth)
     const std::string panel = mScreen.waitForWindow(kAddPanel);
     ASSERT_TRUE(mScreen.waitUntilActive(panel));
     expectBelongsTo(mSuite, panel);
+    expectWantsNoMinimizeButton(panel);
     expectStaysOver(mSuite, kEmptyPlaceOfSuite, panel);
     expectStaysOver(mDialog, kEmptyPlaceOfDialog, panel);
     mScreen.key("Escape");
@@ -141,8 +168,15 @@ TEST_F(ModalWindows, TheDialogIsInTheTaskBarAndTellsItsProcess)
 TEST_F(ModalWindows, TheDialogComesBackWhenItIsMinimized)
 {
     open();
-    mScreen.minimize(mDialog);
-    EXPECT_TRUE(comesTrue([&] { return mScreen.window(kDialog) == mDialog; }));
+    expectComesBackWhenMinimized(mDialog, kDialog);
     shoot("back");
+    closeAndEnd();
+}
+
+TEST_F(ModalWindows, AMessageBoxComesBackWhenItIsMinimized)
+{
+    expectComesBackWhenMinimized(openMessageBox(), kMessageBox);
+    shoot("back");
+    dismissMessageBox();
     closeAndEnd();
 }
