@@ -4,6 +4,7 @@
 
 #include <tesselui/tsuieach.h>
 
+#include "host/ui/platform/Windowing.h"
 #include "host/ui/platform/gnustep/ThemePictures.h"
 
 namespace
@@ -61,6 +62,40 @@ TEST_F(Theme, ShowsWhereTheKeyboardIsAtEveryStopOfTheTabKey)
 
 namespace
 {
+void addOtherFont(id owner, NSFont* font, std::vector<std::string>& others)
+{
+    if (font && ![[font familyName] isEqual:[[NSFont systemFontOfSize:13] familyName]])
+        others.push_back(std::string([[owner description] UTF8String]) + ": " + [[font fontName] UTF8String]);
+}
+
+// What is written in the view in another font than the dialogs'.
+void addOtherFonts(NSView* view, std::vector<std::string>& others)
+{
+    // A table writes in the fonts of its columns, and scrollers write nothing.
+    if ([view isKindOfClass:[NSControl class]] && ![view isKindOfClass:[NSScroller class]] &&
+        ![view isKindOfClass:[NSTableView class]])
+        addOtherFont(view, [(NSControl*)view font], others);
+    if ([view isKindOfClass:[NSBox class]])
+        addOtherFont(view, [(NSBox*)view titleFont], others);
+    if ([view isKindOfClass:[NSTabView class]])
+        addOtherFont(view, [(NSTabView*)view font], others);
+    if ([view isKindOfClass:[NSTableView class]])
+        for (NSTableColumn* column : tsuiEach<NSTableColumn*>([(NSTableView*)view tableColumns]))
+        {
+            addOtherFont(column, [[column headerCell] font], others);
+            addOtherFont(column, [[column dataCell] font], others);
+        }
+    for (NSView* part : tsuiEach<NSView*>([view subviews]))
+        addOtherFonts(part, others);
+}
+
+std::vector<std::string> otherFontsIn(NSWindow* window)
+{
+    std::vector<std::string> others;
+    addOtherFonts([window contentView], others);
+    return others;
+}
+
 NSString* const kThemes[] = {@"Tessel", @"TesselDark"};
 
 NSString* resourcesOf(NSString* theme)
@@ -76,6 +111,24 @@ NSArray* colourNames(NSString* theme, NSString* list)
     return [[colours allKeys] sortedArrayUsingSelector:@selector(compare:)];
 }
 } // namespace
+
+TEST_F(Theme, WritesEverythingInOneFont)
+{
+    show();
+    for (const NSInteger tab : {0, 1})
+    {
+        [mController setTabViewSelectedIndex:tab];
+        EXPECT_THAT(otherFontsIn(mPanel), testing::IsEmpty());
+    }
+    std::vector<std::string> inBox;
+    const ModalSteps steps({[&]
+                            {
+                                inBox = otherFontsIn([NSApp modalWindow]);
+                                [NSApp stopModal];
+                            }});
+    tessel::windowing::runMessage(@"It failed.", @"There is no such file.", true);
+    EXPECT_THAT(inBox, testing::IsEmpty());
+}
 
 TEST_F(Theme, HasTheSameColoursForLightAndForDarkDesktops)
 {

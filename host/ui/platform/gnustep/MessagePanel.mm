@@ -130,6 +130,7 @@ NSBezierPath* triangleIn(NSRect frame)
     NSButton* button = [[[NSButton alloc]
         initWithFrame:NSMakeRect(origin.x, origin.y, kButtonSize.width, kButtonSize.height)] autorelease];
     [button setTitle:@"OK"];
+    [button setFont:[NSFont systemFontOfSize:kFontSize]];
     [button setBezelStyle:NSRoundedBezelStyle];
     [button setKeyEquivalent:@"\r"];
     [button setTarget:self];
