@@ -13,6 +13,25 @@ using testing::IsEmpty;
 
 namespace
 {
+// The pixels of a text in a place that has room for one word beside another.
+NSData* lookOfText(NSString* text)
+{
+    NSWindow* window = [[[NSWindow alloc] initWithContentRect:NSMakeRect(0, 0, 100, 80)
+                                                    styleMask:NSBorderlessWindowMask
+                                                      backing:NSBackingStoreBuffered
+                                                        defer:NO] autorelease];
+    [window setReleasedWhenClosed:NO];
+    NSTextField* field = [[[NSTextField alloc] initWithFrame:NSMakeRect(0, 0, 100, 80)] autorelease];
+    [[field cell] setWraps:YES];
+    [field setStringValue:text];
+    [[window contentView] addSubview:field];
+    [window orderFront:nil];
+    [window display];
+    NSData* picture = pictureOf(field);
+    [window orderOut:nil];
+    return picture;
+}
+
 class Names : public OpenDialogTest
 {
 protected:
@@ -46,6 +65,25 @@ TEST_F(Names, AreDrawnFromRightToLeftWhereTheyAreWrittenSo)
     EXPECT_EQ(u"tool.lsp", visualOrder(u"tool.lsp"));
     EXPECT_EQ(u"םולש.lsp", visualOrder(u"שלום.lsp"));
     EXPECT_EQ(u"a םולש b", visualOrder(u"a שלום b"));
+}
+
+TEST_F(Names, ThatTakeSeveralLinesAreTurnedRoundLineByLine)
+{
+    using tessel::windowing::visualLines;
+    EXPECT_EQ(u"םולש \nםלוע tool", visualLines(u"שלום עולם tool", {0, 5}));
+    EXPECT_EQ(u"םולש\nםלוע", visualLines(u"שלום\nעולם", {0, 5}));
+    EXPECT_EQ(u"a.lsp", visualLines(u"a.lsp", {0}));
+}
+
+// The first words stand in the first line, as if the line were ended there.
+TEST_F(Names, ThatTakeSeveralLinesBeginInTheFirst)
+{
+    for (NSArray* words : {[NSArray arrayWithObjects:@"firstword", @"secondword", nil],
+                           [NSArray arrayWithObjects:@"שלוםשלום", @"עולםעולם", nil],
+                           [NSArray arrayWithObjects:@"مرحبامرحبا", @"العالمالعالم", nil]})
+        EXPECT_TRUE([lookOfText([words componentsJoinedByString:@" "])
+            isEqual:lookOfText([words componentsJoinedByString:@"\n"])])
+            << [[words objectAtIndex:0] UTF8String];
 }
 
 TEST_F(Names, InArabicHaveTheirLettersJoined)

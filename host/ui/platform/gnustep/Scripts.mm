@@ -5,6 +5,7 @@
 
 #import <AppKit/AppKit.h>
 
+#include <algorithm>
 #include <map>
 #include <utility>
 #include <vector>
@@ -104,14 +105,16 @@ std::u16string unitsOf(NSString* text)
     return std::u16string(units.begin(), units.end() - 1);
 }
 
+NSString* stringOf(const std::u16string& units)
+{
+    const std::vector<unichar> characters(units.begin(), units.end());
+    return [NSString stringWithCharacters:characters.data() length:characters.size()];
+}
+
 NSString* visual(NSString* text)
 {
     const std::u16string units = unitsOf(text);
-    if (!hasRightToLeft(units))
-        return text;
-    const std::u16string ordered = visualOrder(units);
-    const std::vector<unichar> characters(ordered.begin(), ordered.end());
-    return [NSString stringWithCharacters:characters.data() length:characters.size()];
+    return hasRightToLeft(units) ? stringOf(visualOrder(units)) : text;
 }
 
 NSAttributedString* visual(NSAttributedString* text)
@@ -121,6 +124,51 @@ NSAttributedString* visual(NSAttributedString* text)
         return text;
     NSDictionary* attributes = [text attributesAtIndex:0 effectiveRange:nullptr];
     return [[[NSAttributedString alloc] initWithString:ordered attributes:attributes] autorelease];
+}
+
+bool wraps(NSDictionary* attributes)
+{
+    NSParagraphStyle* style = [attributes objectForKey:NSParagraphStyleAttributeName];
+    if (!style)
+        return true;
+    const NSLineBreakMode mode = [style lineBreakMode];
+    return mode == NSLineBreakByWordWrapping || mode == NSLineBreakByCharWrapping;
+}
+
+// Where the toolkit begins the lines of a text that it draws in a place of this width.
+std::vector<std::size_t> lineStarts(NSAttributedString* text, CGFloat width)
+{
+    constexpr CGFloat kHeightAllowed = 100000;
+    NSTextStorage* storage = [[[NSTextStorage alloc] initWithAttributedString:text] autorelease];
+    NSLayoutManager* layout = [[[NSLayoutManager alloc] init] autorelease];
+    NSTextContainer* container =
+        [[[NSTextContainer alloc] initWithContainerSize:NSMakeSize(width, kHeightAllowed)] autorelease];
+    [container setLineFragmentPadding:0];
+    [layout addTextContainer:container];
+    [storage addLayoutManager:layout];
+    std::vector<std::size_t> starts;
+    NSRange line = NSMakeRange(0, 0);
+    for (NSUInteger glyph = 0; glyph < [layout numberOfGlyphs]; glyph = std::max(glyph + 1, NSMaxRange(line)))
+    {
+        [layout lineFragmentRectForGlyphAtIndex:glyph effectiveRange:&line];
+        starts.push_back([layout characterIndexForGlyphAtIndex:glyph]);
+    }
+    return starts;
+}
+
+NSAttributedString* visualWithin(NSAttributedString* text, CGFloat width)
+{
+    const std::u16string units = unitsOf([text string]);
+    if (!isPlain(text) || !hasRightToLeft(units))
+        return text;
+    NSDictionary* attributes = [text attributesAtIndex:0 effectiveRange:nullptr];
+    if (!wraps(attributes))
+        return visual(text);
+    const std::u16string joined = withJoinedLetters(units);
+    NSAttributedString* shaped = [[[NSAttributedString alloc] initWithString:stringOf(joined)
+                                                                  attributes:attributes] autorelease];
+    NSString* lines = stringOf(visualLines(joined, lineStarts(shaped, width)));
+    return [[[NSAttributedString alloc] initWithString:lines attributes:attributes] autorelease];
 }
 
 using DrawInRect = void (*)(id, SEL, NSRect, id);
@@ -144,7 +192,7 @@ void drawAtPoint(NSString* text, SEL selector, NSPoint point, id attributes)
 
 void drawTextInRect(NSAttributedString* text, SEL selector, NSRect rect)
 {
-    toolkitDrawTextInRect(visual(text), selector, rect);
+    toolkitDrawTextInRect(visualWithin(text, NSWidth(rect)), selector, rect);
 }
 
 void drawTextAtPoint(NSAttributedString* text, SEL selector, NSPoint point)
