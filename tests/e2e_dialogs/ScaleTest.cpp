@@ -9,6 +9,9 @@ constexpr DisplayKind kLargeDisplay{.width = 2600, .height = 2500};
 constexpr int kDialogHeight = 729;
 constexpr Place kNameLabel{36, 330};
 constexpr Place kHiddenFilesBox{597, 331};
+constexpr char kTip[] = "Window"; // what the toolkit calls windows without a title
+constexpr int kNarrowestTip = 145;
+constexpr int kLowestTip = 20;
 constexpr double kRounding = 3; // of the parts to whole pixels, added up
 
 void expectScaled(const std::string& size, double scale)
@@ -84,6 +87,22 @@ TEST_P(DialogScale, DrawsAgainWhatWasThere)
     press("Tab", 3);
     EXPECT_TRUE(comesTrue([&] { return look(box) == boxBefore; }));
     EXPECT_EQ(look(label), labelBefore);
+    closeAndEnd();
+}
+
+TEST_P(DialogScale, ShowsTipsAsLargeAsTheirText)
+{
+    setToolkitSetting("GSScaleFactor", std::to_string(GetParam()));
+    open();
+    mScreen.moveOn(mDialog, scaledPlace(places::kLoad, GetParam()));
+    std::string tip;
+    EXPECT_TRUE(comesTrue([&] { return !(tip = mScreen.window(kTip)).empty(); }));
+    shoot("tip");
+    int width = 0;
+    int height = 0;
+    ASSERT_EQ(2, std::sscanf(mScreen.sizeOf(tip).c_str(), "%dx%d", &width, &height));
+    EXPECT_GT(width, kNarrowestTip * GetParam());
+    EXPECT_GT(height, kLowestTip * GetParam());
     closeAndEnd();
 }
 

@@ -32,14 +32,16 @@ void setText(id view, SEL selector, NSAttributedString* text)
                                                     attributes:lookOfTips()] autorelease]);
 }
 
-// The toolkit has measured the text without room around it: the window grows to the right and down, and stays
-// on the screen.
+// The toolkit has measured the text without room around it, and in points: the window, which is measured in
+// pixels, grows to the right and down, and stays on the screen.
 void setFrame(id window, SEL selector, NSRect frame, BOOL display)
 {
     const NSSize text = [[[window contentView] valueForKey:@"text"] size];
     const NSRect screen = [[NSScreen mainScreen] frame];
     const CGFloat top = NSMaxY(frame);
-    frame.size = NSMakeSize(std::ceil(text.width) + 2 * kPadding, std::ceil(text.height) + kPadding);
+    const CGFloat scale = [window userSpaceScaleFactor];
+    frame.size = NSMakeSize((std::ceil(text.width) + 2 * kPadding) * scale,
+                            (std::ceil(text.height) + kPadding) * scale);
     frame.origin.x = std::max(NSMinX(screen), std::min(NSMinX(frame), NSMaxX(screen) - NSWidth(frame)));
     frame.origin.y = std::max(NSMinY(screen), top - NSHeight(frame));
     toolkitSetFrame(window, selector, frame, display);
