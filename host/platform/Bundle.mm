@@ -7,8 +7,8 @@
 #include <filesystem>
 
 #include "host/platform/AutoreleasePool.h"
+#include "host/platform/FileNames.h"
 #include "host/text/Unicode.h"
-#include "host/text/platform/FileNames.h"
 
 namespace tessel
 {

@@ -5,8 +5,8 @@
 #include <tesselui/tsuidisplay.h>
 #include <wincompat/winstring.h>
 
+#include "host/platform/FileNames.h"
 #include "host/platform/ToolkitPlaces.h"
-#include "host/text/platform/FileNames.h"
 #include "host/ui/KeptSignals.h"
 #include "host/ui/SessionEnd.h"
 #include "host/ui/Waiting.h"

@@ -41,6 +41,13 @@ const std::map<std::string, std::vector<std::string>> kTexts = {
     {"IDS_MODRIG_ROW_MISSING", {}},
     {"IDS_MODRIG_ROW_LOCKED", {}},
     {"IDS_MODRIG_ROW_NEVER_UNLOADED", {}},
+    {"IDS_MODRIG_ROW_FAILED", {}},
+    {"IDS_MODRIG_UNLOAD_LOCKED", {}},
+    {"IDS_MODRIG_UNLOAD_NEVER", {}},
+    {"IDS_MODRIG_UNLOAD_NONE", {}},
+    {"IDS_MODRIG_UNLOAD_NOTHING_LOADED", {}},
+    {"IDS_MODRIG_UNLOAD_NOTHING_SELECTED", {}},
+    {"IDS_MODRIG_UNLOAD_SELECTED", {}},
     {"IDS_MODRIG_LOADING", {"%u", "%u"}},
     {"IDS_MODRIG_LOADING_STOPPED", {"%u", "%u"}},
 };

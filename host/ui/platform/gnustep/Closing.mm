@@ -2,8 +2,8 @@
 // who presses it ends the program. Here every window with a title bar is closable.
 #import <AppKit/AppKit.h>
 
+#include "host/platform/gnustep/StandIn.h"
 #include "host/ui/platform/gnustep/Behaviour.h"
-#include "host/ui/platform/gnustep/StandIn.h"
 
 namespace tessel::windowing
 {

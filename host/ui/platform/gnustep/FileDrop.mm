@@ -9,11 +9,11 @@
 #include <tesselui/tsuieach.h>
 #include <wincompat/winstring.h>
 
+#include "host/platform/gnustep/StandIn.h"
 #include "host/text/Unicode.h"
 #include "host/ui/platform/gnustep/Behaviour.h"
 #include "host/ui/platform/gnustep/DisplayProbe.h"
 #include "host/ui/platform/gnustep/DropSelection.h"
-#include "host/ui/platform/gnustep/StandIn.h"
 
 // The dragging pasteboard of a drag from another program, as far as a drop target asks it.
 @interface TsDroppedFiles : NSObject

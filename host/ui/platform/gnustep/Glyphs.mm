@@ -12,7 +12,7 @@
 #include <algorithm>
 #include <string>
 
-#include "host/ui/platform/gnustep/StandIn.h"
+#include "host/platform/gnustep/StandIn.h"
 
 namespace tessel::windowing
 {

@@ -13,8 +13,8 @@
 
 #include <tesselui/tsuieach.h>
 
+#include "host/platform/gnustep/StandIn.h"
 #include "host/ui/platform/gnustep/Behaviour.h"
-#include "host/ui/platform/gnustep/StandIn.h"
 
 namespace tessel::windowing
 {

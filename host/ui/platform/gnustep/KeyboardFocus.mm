@@ -4,9 +4,9 @@
 #import <AppKit/AppKit.h>
 #import <GNUstepGUI/GSDisplayServer.h>
 
+#include "host/platform/gnustep/StandIn.h"
 #include "host/ui/platform/gnustep/Behaviour.h"
 #include "host/ui/platform/gnustep/DisplayProbe.h"
-#include "host/ui/platform/gnustep/StandIn.h"
 
 namespace tessel::windowing
 {

@@ -7,8 +7,8 @@
 
 #include <cmath>
 
+#include "host/platform/gnustep/StandIn.h"
 #include "host/ui/platform/gnustep/Behaviour.h"
-#include "host/ui/platform/gnustep/StandIn.h"
 
 namespace tessel::windowing
 {

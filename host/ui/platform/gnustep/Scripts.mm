@@ -10,9 +10,9 @@
 #include <utility>
 #include <vector>
 
+#include "host/platform/gnustep/StandIn.h"
 #include "host/ui/platform/gnustep/FontCoverage.h"
 #include "host/ui/platform/gnustep/Glyphs.h"
-#include "host/ui/platform/gnustep/StandIn.h"
 #include "host/ui/platform/gnustep/VisualOrder.h"
 
 // Of the toolkit's library; no header declares it.

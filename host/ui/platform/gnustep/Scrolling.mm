@@ -5,8 +5,8 @@
 // used up. Here what does not fill half a pixel more is no larger, and nothing is decided within a decision.
 #import <AppKit/AppKit.h>
 
+#include "host/platform/gnustep/StandIn.h"
 #include "host/ui/platform/gnustep/Behaviour.h"
-#include "host/ui/platform/gnustep/StandIn.h"
 
 namespace tessel::windowing
 {

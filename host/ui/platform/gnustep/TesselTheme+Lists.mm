@@ -1,7 +1,7 @@
 // Tables, browsers and scrollers.
 #include <algorithm>
 
-#include "host/ui/platform/gnustep/StandIn.h"
+#include "host/platform/gnustep/StandIn.h"
 #include "host/ui/platform/gnustep/TesselTheme.h"
 #include "host/ui/platform/gnustep/TextFitting.h"
 #include "host/ui/platform/gnustep/ThemeFocus.h"

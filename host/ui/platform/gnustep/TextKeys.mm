@@ -3,7 +3,7 @@
 
 #import <AppKit/AppKit.h>
 
-#include "host/ui/platform/gnustep/StandIn.h"
+#include "host/platform/gnustep/StandIn.h"
 
 namespace tessel::windowing
 {

@@ -5,7 +5,7 @@
 
 #import <AppKit/AppKit.h>
 
-#include "host/ui/platform/gnustep/StandIn.h"
+#include "host/platform/gnustep/StandIn.h"
 #include "host/ui/platform/gnustep/TesselTheme.h"
 #include "host/ui/platform/gnustep/ThemeFocus.h"
 #include "host/ui/platform/gnustep/ThemeShapes.h"

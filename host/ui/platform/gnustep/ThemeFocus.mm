@@ -1,6 +1,6 @@
 #include "host/ui/platform/gnustep/ThemeFocus.h"
 
-#include "host/ui/platform/gnustep/StandIn.h"
+#include "host/platform/gnustep/StandIn.h"
 
 namespace tessel::windowing
 {

@@ -2,7 +2,7 @@
 
 #include <tesselui/tsuieach.h>
 
-#include "host/ui/platform/gnustep/StandIn.h"
+#include "host/platform/gnustep/StandIn.h"
 
 namespace tessel::windowing
 {

@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <cmath>
 
-#include "host/ui/platform/gnustep/StandIn.h"
+#include "host/platform/gnustep/StandIn.h"
 #include "host/ui/platform/gnustep/TesselTheme.h"
 
 namespace tessel::windowing

@@ -2,8 +2,8 @@
 // is the run loop's own.
 #import <Foundation/Foundation.h>
 
+#include "host/platform/gnustep/StandIn.h"
 #include "host/ui/platform/Windowing.h"
-#include "host/ui/platform/gnustep/StandIn.h"
 
 namespace tessel::windowing
 {

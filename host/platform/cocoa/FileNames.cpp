@@ -1,4 +1,4 @@
-#include "host/text/platform/FileNames.h"
+#include "host/platform/FileNames.h"
 
 namespace tessel
 {

@@ -6,9 +6,9 @@
 
 #include <string>
 
+#include "host/platform/FileNames.h"
+#include "host/platform/gnustep/StandIn.h"
 #include "host/text/Unicode.h"
-#include "host/text/platform/FileNames.h"
-#include "host/ui/platform/gnustep/StandIn.h"
 
 namespace tessel
 {
