@@ -1,6 +1,7 @@
 #include "host/files/RemoteFiles.h"
 
 #include <tessel/tsdefs.h>
+#include <unicode/utf8.h>
 
 #include <algorithm>
 #include <cstdint>
@@ -37,7 +38,7 @@ std::uint64_t hashOf(const std::string& text)
 // The first byte at or behind the position that begins a character.
 std::size_t firstCharacter(const std::string& utf8, std::size_t position)
 {
-    while (position < utf8.size() && (static_cast<unsigned char>(utf8[position]) & 0xC0) == 0x80)
+    while (position < utf8.size() && U8_IS_TRAIL(static_cast<std::uint8_t>(utf8[position])))
         ++position;
     return position;
 }

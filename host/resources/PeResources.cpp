@@ -3,6 +3,7 @@
 #include <utility>
 
 #include "host/resources/ByteReader.h"
+#include "host/text/Unicode.h"
 
 namespace tessel
 {
@@ -211,33 +212,12 @@ std::map<unsigned, std::size_t> blocksIn(std::span<const std::uint8_t> bytes, st
     return blocks;
 }
 
-bool isFirstHalf(std::uint32_t unit)
-{
-    return unit >= 0xd800 && unit < 0xdc00;
-}
-
-bool isSecondHalf(std::uint32_t unit)
-{
-    return unit >= 0xdc00 && unit < 0xe000;
-}
-
 std::wstring decode(const ByteReader& units)
 {
-    constexpr wchar_t kNoCharacter = 0xfffd;
-    std::wstring text;
+    std::u16string text;
     for (std::size_t at = 0; at < units.size(); at += kUnitSize)
-    {
-        const std::uint32_t unit = units.u16(at);
-        const std::uint32_t next = at + kUnitSize < units.size() ? units.u16(at + kUnitSize) : 0;
-        if (isFirstHalf(unit) && isSecondHalf(next))
-        {
-            text += static_cast<wchar_t>(0x10000 + ((unit - 0xd800) << 10) + (next - 0xdc00));
-            at += kUnitSize;
-        }
-        else
-            text += isFirstHalf(unit) || isSecondHalf(unit) ? kNoCharacter : static_cast<wchar_t>(unit);
-    }
-    return text;
+        text += static_cast<char16_t>(units.u16(at));
+    return toWide(text);
 }
 } // namespace
 

@@ -1,24 +1,21 @@
 #include "host/text/Unicode.h"
 
 #include <unicode/uchar.h>
+#include <unicode/utf16.h>
+#include <unicode/utf8.h>
 
 #include <algorithm>
+#include <iterator>
 
 namespace tessel
 {
 namespace
 {
 constexpr char32_t kReplacement = 0xFFFD;
-constexpr char32_t kLastCodePoint = 0x10FFFF;
 // A byte that is no text stands as this and the byte: a private character at the very end of Unicode.
 constexpr char32_t kByte = 0x10FE00;
 constexpr char32_t kFirstByte = kByte | 0x80;
 constexpr char32_t kLastByte = kByte | 0xFF;
-
-bool isScalar(char32_t code)
-{
-    return code <= kLastCodePoint && (code < 0xD800 || code > 0xDFFF);
-}
 
 bool isByte(char32_t code)
 {
@@ -30,61 +27,58 @@ wchar_t foldOne(wchar_t character)
     return static_cast<wchar_t>(u_foldCase(static_cast<UChar32>(character), U_FOLD_CASE_DEFAULT));
 }
 
-// The length of a sequence by its first byte; 0 for a byte that starts none.
-std::size_t sequenceLength(unsigned char first)
+// The character at the position, which moves past what was read; past one byte only when it is not UTF-8.
+wchar_t takeCharacter(std::string_view utf8, std::size_t& position)
 {
-    if (first < 0x80)
-        return 1;
-    if (first >= 0xC2 && first < 0xE0)
-        return 2;
-    if ((first & 0xF0) == 0xE0)
-        return 3;
-    return first >= 0xF0 && first < 0xF5 ? 4 : 0;
+    const auto first = static_cast<unsigned char>(utf8[position]);
+    std::size_t next = position;
+    UChar32 code = 0;
+#pragma GCC diagnostic push
+#pragma GCC diagnostic ignored "-Wconversion" // the macro keeps a difference of bytes in a byte
+    U8_NEXT(utf8, next, utf8.size(), code);
+#pragma GCC diagnostic pop
+    const bool isText = code >= 0 && !isByte(static_cast<char32_t>(code));
+    position = isText ? next : position + 1;
+    return static_cast<wchar_t>(isText ? static_cast<char32_t>(code) : kByte | first);
 }
 
-// The code point at the head of the text, which is shortened by what was read; one byte of it when it is not
-// UTF-8.
-char32_t takeCodePoint(std::string_view& text)
+void append(std::string& utf8, char32_t code)
 {
-    constexpr unsigned kFirstByteMask[] = {0, 0x7F, 0x1F, 0x0F, 0x07};
-    constexpr char32_t kSmallest[] = {0, 0, 0x80, 0x800, 0x10000};
-    const auto first = static_cast<unsigned char>(text.front());
-    const std::size_t length = sequenceLength(first);
-    char32_t code = length ? first & kFirstByteMask[length] : 0;
-    bool sound = length != 0 && length <= text.size();
-    for (std::size_t i = 1; sound && i < length; ++i)
+    if (isByte(code))
     {
-        const auto next = static_cast<unsigned char>(text[i]);
-        sound = (next & 0xC0) == 0x80;
-        code = code << 6 | (next & 0x3Fu);
+        utf8 += static_cast<char>(code & 0xFF);
+        return;
     }
-    sound = sound && code >= kSmallest[length] && isScalar(code) && !isByte(code);
-    text.remove_prefix(sound ? length : 1);
-    return sound ? code : kByte | first;
-}
-
-void appendUtf8(std::string& utf8, char32_t code)
-{
-    const auto put = [&utf8](char32_t byte)
-    {
-        utf8 += static_cast<char>(byte);
-    };
-    if (code < 0x80)
-        return put(code);
-    if (code < 0x800)
-        put(0xC0 | code >> 6);
-    else if (code < 0x10000)
-    {
-        put(0xE0 | code >> 12);
-        put(0x80 | (code >> 6 & 0x3F));
-    }
+    char bytes[U8_MAX_LENGTH];
+    std::size_t length = 0;
+    UBool isNoCharacter = false;
+    U8_APPEND(bytes, length, std::size(bytes), static_cast<UChar32>(code), isNoCharacter);
+    if (isNoCharacter)
+        append(utf8, kReplacement);
     else
-    {
-        put(0xF0 | code >> 18);
-        put(0x80 | (code >> 12 & 0x3F));
-        put(0x80 | (code >> 6 & 0x3F));
-    }
-    put(0x80 | (code & 0x3F));
+        utf8.append(bytes, length);
+}
+
+void append(std::u16string& utf16, char32_t code)
+{
+    char16_t units[U16_MAX_LENGTH];
+    std::size_t length = 0;
+    UBool isNoCharacter = false;
+    U16_APPEND(units, length, std::size(units), static_cast<UChar32>(code), isNoCharacter);
+    if (isNoCharacter || U_IS_SURROGATE(code))
+        append(utf16, kReplacement);
+    else
+        utf16.append(units, length);
+}
+
+// The text's characters, one by one, in another encoding.
+template <class Encoded> Encoded encoded(std::wstring_view text)
+{
+    Encoded result;
+    result.reserve(text.size());
+    for (const wchar_t character : text)
+        append(result, static_cast<char32_t>(character));
+    return result;
 }
 } // namespace
 
@@ -92,24 +86,32 @@ std::wstring toWide(std::string_view utf8)
 {
     std::wstring text;
     text.reserve(utf8.size());
-    while (!utf8.empty())
-        text += static_cast<wchar_t>(takeCodePoint(utf8));
+    for (std::size_t position = 0; position < utf8.size();)
+        text += takeCharacter(utf8, position);
+    return text;
+}
+
+std::wstring toWide(std::u16string_view utf16)
+{
+    std::wstring text;
+    text.reserve(utf16.size());
+    for (std::size_t position = 0; position < utf16.size();)
+    {
+        UChar32 code = 0;
+        U16_NEXT_OR_FFFD(utf16, position, utf16.size(), code);
+        text += static_cast<wchar_t>(code);
+    }
     return text;
 }
 
 std::string toUtf8(std::wstring_view text)
 {
-    std::string utf8;
-    utf8.reserve(text.size());
-    for (const wchar_t character : text)
-    {
-        const auto code = static_cast<char32_t>(character);
-        if (isByte(code))
-            utf8 += static_cast<char>(code & 0xFF);
-        else
-            appendUtf8(utf8, isScalar(code) ? code : kReplacement);
-    }
-    return utf8;
+    return encoded<std::string>(text);
+}
+
+std::u16string toUtf16(std::wstring_view text)
+{
+    return encoded<std::u16string>(text);
 }
 
 std::wstring withReadableBytes(std::wstring_view text)

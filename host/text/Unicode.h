@@ -12,8 +12,10 @@
 namespace tessel
 {
 std::wstring toWide(std::string_view utf8);
+std::wstring toWide(std::u16string_view utf16);
 // What is no character at all becomes U+FFFD.
 std::string toUtf8(std::wstring_view text);
+std::u16string toUtf16(std::wstring_view text);
 
 // The text for a person's eyes: bytes that are no text are written as escapes, \xFF.
 std::wstring withReadableBytes(std::wstring_view text);

@@ -101,6 +101,21 @@ TEST(Utf8, KeepsNulCharacters)
     EXPECT_EQ(toUtf8(std::wstring_view(L"a\0b", 3)), std::string("a\0b", 3));
 }
 
+TEST(Utf16, JoinsTheHalvesOfCharactersOutsideTheBasicPlane)
+{
+    EXPECT_EQ(toWide(u"a\xD800\xDC00z\xDBFF\xDFFF"), L"a\U00010000z\U0010FFFF");
+    EXPECT_EQ(toWide(u"\xD7FF\xE000\xFFFF"), L"\xD7FF\xE000\xFFFF");
+    EXPECT_EQ(toWide(std::u16string_view(u"a\0b", 3)), std::wstring(L"a\0b", 3));
+}
+
+TEST(Utf16, ReplacesHalvesThatStandAlone)
+{
+    EXPECT_EQ(toWide(u"a\xD83D"), L"a" + bad(1));
+    EXPECT_EQ(toWide(u"\xD83Dz"), bad(1) + L"z");
+    EXPECT_EQ(toWide(u"\xDE00\xD83D\xDE00"), bad(1) + L"\U0001F600");
+    EXPECT_EQ(toWide(u"\xD83D\xD83D\xDE00"), bad(1) + L"\U0001F600");
+}
+
 TEST(CaseFolding, IsRightForLettersOfEveryScript)
 {
     EXPECT_EQ(foldCase(L"GRÖSSE"), L"grösse");
