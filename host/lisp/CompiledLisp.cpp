@@ -1,9 +1,9 @@
 #include "host/lisp/CompiledLisp.h"
 
-#include <array>
 #include <cstdint>
 
 #include <ecl/ecl.h>
+#include <zlib.h>
 
 namespace tessel
 {
@@ -23,27 +23,10 @@ constexpr std::size_t kLengthAt = 2 * kNumberSize;
 constexpr std::size_t kChecksumAt = 3 * kNumberSize;
 constexpr std::size_t kNumbersSize = 4 * kNumberSize;
 
-constexpr std::array<std::uint32_t, 256> makeChecksumTable()
-{
-    constexpr std::uint32_t kReversedPolynomial = 0xEDB88320; // CRC-32 as in ISO 3309
-    std::array<std::uint32_t, 256> table{};
-    for (std::uint32_t byte = 0; byte < table.size(); ++byte)
-    {
-        std::uint32_t value = byte;
-        for (int bit = 0; bit < 8; ++bit)
-            value = (value >> 1) ^ ((value & 1) != 0 ? kReversedPolynomial : 0);
-        table.at(byte) = value;
-    }
-    return table;
-}
-
 std::uint32_t addToChecksum(std::uint32_t checksum, std::string_view bytes)
 {
-    static constexpr auto kTable = makeChecksumTable();
-    checksum = ~checksum;
-    for (const char byte : bytes)
-        checksum = (checksum >> 8) ^ kTable.at((checksum ^ static_cast<unsigned char>(byte)) & 0xFF);
-    return ~checksum;
+    return static_cast<std::uint32_t>(
+        crc32_z(checksum, reinterpret_cast<const Bytef*>(bytes.data()), bytes.size()));
 }
 
 void appendNumber(std::string& bytes, std::uint32_t number)

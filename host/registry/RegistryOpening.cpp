@@ -1,6 +1,8 @@
 // Opening the registry's file: whose it is, and whether it may be written.
 #include <sys/stat.h>
 
+#include <charconv>
+#include <iterator>
 #include <string_view>
 
 #include "host/registry/Statements.h"
@@ -45,15 +47,17 @@ bool hasJournal(const std::filesystem::path& file)
 // that may not be written cannot take.
 std::string fixedFile(const std::filesystem::path& file)
 {
-    constexpr char kDigits[] = "0123456789ABCDEF";
     std::string uri = "file:";
     for (const char character : std::filesystem::absolute(file).string())
     {
-        const auto byte = static_cast<unsigned char>(character);
         if (std::string_view("%?#").find(character) == std::string_view::npos)
+        {
             uri += character;
-        else
-            uri += {'%', kDigits[byte >> 4], kDigits[byte & 0xF]};
+            continue;
+        }
+        char digits[2]; // each of these characters takes both
+        std::to_chars(std::begin(digits), std::end(digits), static_cast<int>(character), 16);
+        uri += '%' + std::string(digits, std::size(digits));
     }
     return uri + "?immutable=1";
 }

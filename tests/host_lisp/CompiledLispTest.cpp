@@ -1,9 +1,40 @@
 #include <gmock/gmock.h>
 
+#include <cstdint>
+
 #include "host/lisp/CompiledLisp.h"
 
 using tessel::packCompiledLisp;
 using tessel::unpackCompiledLisp;
+
+namespace
+{
+constexpr std::size_t kChecksumAt = 20;
+constexpr std::size_t kByteCodeAt = 24;
+
+// CRC-32, bit by bit, of everything between the mark at the front and the byte code's end, itself left out.
+std::uint32_t checksumOf(const std::string& compiled)
+{
+    std::uint32_t rest = 0xFFFFFFFF;
+    for (const char byte : compiled.substr(8, kChecksumAt - 8) + compiled.substr(kByteCodeAt))
+    {
+        rest ^= static_cast<unsigned char>(byte);
+        for (int bit = 0; bit < 8; ++bit)
+            rest = (rest >> 1) ^ ((rest & 1) != 0 ? 0xEDB88320 : 0);
+    }
+    return ~rest;
+}
+} // namespace
+
+// Files that somebody has compiled must stay good.
+TEST(CompiledLisp, HasTheChecksumThatItAlwaysHad)
+{
+    const std::string compiled = packCompiledLisp("(1 . code)\xFF\x80");
+    std::uint32_t stored = 0;
+    for (std::size_t byte = 0; byte < 4; ++byte)
+        stored |= std::uint32_t{static_cast<unsigned char>(compiled.at(kChecksumAt + byte))} << (8 * byte);
+    EXPECT_EQ(stored, checksumOf(compiled));
+}
 
 TEST(CompiledLisp, ComesOutAsItWentIn)
 {

@@ -21,13 +21,16 @@ namespace
 {
 constexpr fs::perms kNobodyWrites = fs::perms::owner_read | fs::perms::group_read | fs::perms::others_read;
 
+// What a URI would take for something else belongs to the name.
+const std::string kFile = "registry 100%41?#.db";
+
 constexpr fs::perms kEverybodyEnters =
     kNobodyWrites | fs::perms::owner_exec | fs::perms::group_exec | fs::perms::others_exec;
 
 class RegistryFile : public testing::Test
 {
 protected:
-    fs::path file() const { return folder / "registry.db"; }
+    fs::path file() const { return folder / kFile; }
 
     // A registry with a list of many pages, closed.
     void makeFile(int entries = 500)
@@ -116,7 +119,7 @@ TEST_F(RegistryFile, ThatAUserMayNotWriteIsReadInAFolderThatHeMayNotWriteEither)
 
 TEST_F(RegistryFile, ThatIsAFolderIsNotUsed)
 {
-    folder.write("registry.db/in the way", "");
+    folder.write(kFile + "/in the way", "");
     Registry registry(file());
     EXPECT_THAT(tessel::toUtf8(registry.problem()),
                 AllOf(HasSubstr(file().string()), HasSubstr("unable to open database file")));
@@ -139,7 +142,7 @@ TEST_F(RegistryFile, ThatIsNoDatabaseIsLeftAsItIs)
         std::string bytes(size, '\0');
         for (char& byte : bytes)
             byte = static_cast<char>(random());
-        folder.write("registry.db", bytes);
+        folder.write(kFile, bytes);
         expectRefusedAndLeftAlone("file is not a database");
     }
 }
@@ -161,7 +164,7 @@ TEST_F(RegistryFile, OfANewerTesselIsLeftAsItIs)
 
 TEST_F(RegistryFile, ThatIsEmptyBecomesARegistry)
 {
-    folder.write("registry.db", "");
+    folder.write(kFile, "");
     Registry registry(file());
     EXPECT_EQ(registry.problem(), L"");
     EXPECT_TRUE(registry.write(L"A", L"name", L"1"));
@@ -173,7 +176,7 @@ TEST_F(RegistryFile, ThatWasCutShortIsLeftAsItIs)
     const std::string whole = contentOf(file());
     for (const std::size_t length : {50ul, 99ul, 100ul, 4096ul, 3 * 4096ul, whole.size() - 4096})
     {
-        folder.write("registry.db", whole.substr(0, length));
+        folder.write(kFile, whole.substr(0, length));
         expectRefusedAndLeftAlone("malformed");
     }
 }
@@ -186,7 +189,7 @@ TEST_F(RegistryFile, WithADamagedPageIsNeverWrittenOverWhatCannotBeRead)
     {
         std::string damaged = whole;
         damaged.replace(page * 4096, 4096, std::string(4096, '\xA5'));
-        folder.write("registry.db", damaged);
+        folder.write(kFile, damaged);
         output.clear();
         bool stored = false;
         bool readable = false;
@@ -216,7 +219,7 @@ TEST_F(RegistryFile, WithChangedBytesIsSurvived)
         std::string changed = whole;
         for (int i = 0; i < 20; ++i)
             changed[random() % changed.size()] = static_cast<char>(random());
-        folder.write("registry.db", changed);
+        folder.write(kFile, changed);
         fs::remove(file().string() + "-wal");
         fs::remove(file().string() + "-shm");
         Registry registry(file());
