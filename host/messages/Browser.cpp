@@ -1,8 +1,7 @@
 #include "host/messages/Help.h"
 
+#include <algorithm>
 #include <array>
-#include <cstdlib>
-#include <sstream>
 #include <string>
 
 #include <spawn.h>
@@ -17,29 +16,12 @@ namespace tessel
 {
 namespace
 {
-std::string findProgram(const std::string& name)
-{
-    const char* searchPath = std::getenv("PATH");
-    std::istringstream folders(searchPath ? searchPath : "");
-    for (std::string folder; std::getline(folders, folder, ':');)
-        if (auto program = std::filesystem::path(folder) / name; access(program.c_str(), X_OK) == 0)
-            return program.string();
-    return {};
-}
-
-std::string findOpener()
-{
-    for (const auto& name : pageOpeners())
-        if (auto program = findProgram(name); !program.empty())
-            return program;
-    return {};
-}
-
-// Through a shell that leaves the browser behind: nobody waits for it, and it is nobody's child.
+// Through a shell that leaves the browser behind: nobody waits for it, and it is nobody's child. False when
+// there is no such program.
 bool startAndForget(std::string program, std::string argument)
 {
     std::string shell = "sh", option = "-c";
-    std::string script = R"("$0" "$1" </dev/null >/dev/null 2>&1 &)";
+    std::string script = R"(command -v "$0" >/dev/null || exit; "$0" "$1" </dev/null >/dev/null 2>&1 &)";
     std::array arguments = {shell.data(),   option.data(),   script.data(),
                             program.data(), argument.data(), static_cast<char*>(nullptr)};
     pid_t process = 0;
@@ -52,7 +34,7 @@ bool startAndForget(std::string program, std::string argument)
 
 bool openInBrowser(const std::filesystem::path& page)
 {
-    const std::string opener = hasDisplay() ? findOpener() : std::string();
-    return !opener.empty() && startAndForget(opener, page.string());
+    return hasDisplay() && std::ranges::any_of(pageOpeners(), [&page](const std::string& opener)
+                                               { return startAndForget(opener, page.string()); });
 }
 } // namespace tessel

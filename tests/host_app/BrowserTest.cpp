@@ -1,0 +1,102 @@
+// Showing a page in the person's browser, a program that the session starts and forgets.
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+#include <fstream>
+#include <iterator>
+#include <optional>
+
+#include <sys/stat.h>
+
+#include "host/messages/Help.h"
+#include "host/messages/platform/Desktop.h"
+#include "tests/support/TemporaryFolder.h"
+
+namespace fs = std::filesystem;
+
+using tessel::openInBrowser;
+using tessel::pageOpeners;
+
+namespace
+{
+// A variable of the environment, as long as this lasts.
+class Variable
+{
+public:
+    Variable(const char* name, const std::string& value) : mName(name)
+    {
+        if (const char* before = std::getenv(name))
+            mBefore = before;
+        setenv(name, value.c_str(), 1);
+    }
+    ~Variable()
+    {
+        if (mBefore)
+            setenv(mName, mBefore->c_str(), 1);
+        else
+            unsetenv(mName);
+    }
+    Variable(const Variable&) = delete;
+    Variable& operator=(const Variable&) = delete;
+
+private:
+    const char* mName;
+    std::optional<std::string> mBefore;
+};
+
+class Browser : public testing::Test
+{
+protected:
+    Browser() { mkfifo(mNote.c_str(), 0600); }
+
+    // A program that tells which page it was given, and then does not end before somebody has read it.
+    void install(const std::string& name, bool runs = true)
+    {
+        const fs::path program = mFolder.write(
+            "programs/" + name, "#!/bin/sh\nprintf '%s in " + name + "' \"$1\" >'" + mNote.string() + "'\n");
+        fs::permissions(program, runs ? fs::perms::owner_all : fs::perms::owner_read);
+    }
+
+    std::string opened() const
+    {
+        std::ifstream note(mNote);
+        return {std::istreambuf_iterator<char>(note), {}};
+    }
+
+private:
+    TemporaryFolder mFolder;
+    fs::path mNote = mFolder / "note";
+    Variable mPath{"PATH", (mFolder / "programs").string()};
+    Variable mDisplay{"DISPLAY", ":0"};
+};
+} // namespace
+
+TEST_F(Browser, IsGivenThePageWithWhateverNameItHas)
+{
+    install(pageOpeners().front());
+    ASSERT_TRUE(openInBrowser("/help/a \"b\" $c 'd'.html"));
+    EXPECT_EQ(opened(), "/help/a \"b\" $c 'd'.html in " + pageOpeners().front());
+}
+
+TEST_F(Browser, IsTheFirstOneThatIsThere)
+{
+    for (const std::string& name : pageOpeners())
+        install(name);
+    ASSERT_TRUE(openInBrowser("/page.html"));
+    EXPECT_EQ(opened(), "/page.html in " + pageOpeners().front());
+}
+
+TEST_F(Browser, IsTheNextOneWhereAnotherIsMissingOrIsNoProgram)
+{
+    install(pageOpeners().front(), pageOpeners().size() == 1);
+    install(pageOpeners().back());
+    ASSERT_TRUE(openInBrowser("/page.html"));
+    EXPECT_EQ(opened(), "/page.html in " + pageOpeners().back());
+}
+
+TEST_F(Browser, ThatIsNotThereOpensNothing)
+{
+    EXPECT_FALSE(openInBrowser("/page.html"));
+    install(pageOpeners().front(), false);
+    EXPECT_FALSE(openInBrowser("/page.html"));
+}
