@@ -30,7 +30,8 @@ NSString* readable(const wchar_t* text)
 
 int tsuiShowMessageBox(const wchar_t* text, const wchar_t* detail, unsigned style, void* parent)
 {
-    (void)parent; // the box is modal for the whole program, over whatever window is modal already
+    // The box is modal for the whole program, over whatever window is modal already: the parent does not
+    // matter.
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
     int answer = kNotShown;
     if (somebodyIsThere() && tsuiHasDisplay() && tsuiPrepareWindows() && !tessel::sessionIsToEnd())

@@ -66,7 +66,6 @@ NSEvent* releaseOfTheMouse()
 
 - (void)onRequest:(NSNotification*)notification
 {
-    (void)notification;
     NSTimer* timer = [NSTimer timerWithTimeInterval:kBetweenWindows
                                              target:self
                                            selector:@selector(closeFrontWindow:)
@@ -78,7 +77,6 @@ NSEvent* releaseOfTheMouse()
 
 - (void)closeFrontWindow:(NSTimer*)timer
 {
-    (void)timer;
     if (![NSApp modalWindow])
         return;
     [NSApp stopModalWithCode:NSCancelButton];

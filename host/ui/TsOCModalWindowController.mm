@@ -65,7 +65,6 @@
 
 - (IBAction)closeModalWindow:(id)sender
 {
-    (void)sender;
     [NSApp stopModal];
 }
 

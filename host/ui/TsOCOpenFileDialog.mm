@@ -90,7 +90,6 @@ NSTextField* makeLabel(NSString* text)
 
 - (BOOL)panel:(id)sender shouldShowFilename:(NSString*)path
 {
-    (void)sender;
     if ([mFilters count] == 0)
         return YES;
     for (NSString* extension : tsuiEach<NSString*>([[mFilters objectAtIndex:mChosen] fileExtensions]))

@@ -58,7 +58,6 @@ NSDragOperation operationFor(id<NSDraggingInfo> info)
               row:(NSInteger)row
     dropOperation:(NSTableViewDropOperation)operation
 {
-    (void)operation;
     if (table == loadedAppsTableView)
         [self loadedAppsTableViewDropFiles:draggedPaths(info) atRow:row];
     else if (table == historyListTableView)
@@ -73,8 +72,6 @@ NSDragOperation operationFor(id<NSDraggingInfo> info)
 
 - (void)historyTableViewDropFiles:(NSArray*)paths atRow:(NSInteger)row
 {
-    (void)paths;
-    (void)row;
     mInsertRow = ModrigUtils::kAppendRow;
 }
 

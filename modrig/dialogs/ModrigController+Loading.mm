@@ -62,7 +62,6 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
 
 - (IBAction)onLoad:(id)sender
 {
-    (void)sender;
     if ([mSelectedFiles count] == 0)
     {
         if (tsuiTellOfMissingFile(mOpenPanel))
@@ -79,7 +78,6 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
 
 - (IBAction)onStartupSuits:(id)sender
 {
-    (void)sender;
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
     ModrigStartupSuitController* suite = [[ModrigStartupSuitController alloc] init];
     [suite showModalWindowCenterOfParent:[[self view] window]];
@@ -89,7 +87,6 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
 
 - (IBAction)onHelp:(id)sender
 {
-    (void)sender;
     ModrigUtils::OnCommandHelp(ModrigUtils::kMainDialogHelp);
 }
 

@@ -92,7 +92,6 @@ bool hasSelection(NSArrayController* rows)
 // The Unload button's.
 - (NSString*)tipOfButton:(NSButton*)button
 {
-    (void)button;
     NSMutableArray* lines = [NSMutableArray array];
     for (const char* key :
          ModrigUtils::UnloadTip(canUnloadApp, [(ModrigTableView*)loadedAppsTableView states]))
@@ -159,7 +158,6 @@ bool hasSelection(NSArrayController* rows)
 
 - (void)tabView:(NSTabView*)tabView didSelectTabViewItem:(NSTabViewItem*)item
 {
-    (void)item;
     [loadedAppsTableView sizeLastColumnToFit];
     [historyListTableView sizeLastColumnToFit];
     ModrigPlatform::UpdateKeyViews([tabView window]);
@@ -167,7 +165,6 @@ bool hasSelection(NSArrayController* rows)
 
 - (IBAction)onLoadFromHistory:(id)sender
 {
-    (void)sender;
     if (hasSelection(historyList))
         [self loadApps:[historyList selectedObjects] successedApps:nil addToStartupSuit:NO];
 }
@@ -180,7 +177,6 @@ bool hasSelection(NSArrayController* rows)
 
 - (IBAction)onAddToStartupSuiteFromHistory:(id)sender
 {
-    (void)sender;
     NSMutableArray* paths = [NSMutableArray array];
     for (ModrigFilePath* row : tsuiEach<ModrigFilePath*>([historyList selectedObjects]))
         [paths addObject:[row filePathName]];
@@ -190,7 +186,6 @@ bool hasSelection(NSArrayController* rows)
 
 - (IBAction)onRemove:(id)sender
 {
-    (void)sender;
     NSArray* rows = [[[historyList selectedObjects] copy] autorelease];
     if ([rows count] == 0)
         return;
@@ -201,7 +196,6 @@ bool hasSelection(NSArrayController* rows)
 
 - (IBAction)onUnload:(id)sender
 {
-    (void)sender;
     NSArray* rows = [[[loadedApps selectedObjects] copy] autorelease];
     if ([rows count] == 0)
         return;

@@ -21,20 +21,16 @@ std::vector<std::size_t> indexesOf(NSIndexSet* rows)
 
 - (ModrigUtils::TableKind)kindOfTable:(NSTableView*)table
 {
-    (void)table;
     return ModrigUtils::TableKind::kStartupSuite;
 }
 
 - (NSArrayController*)rowsOf:(NSTableView*)table
 {
-    (void)table;
     return startupApps;
 }
 
 - (BOOL)tableView:(NSTableView*)table shouldSelectRow:(NSInteger)row
 {
-    (void)table;
-    (void)row;
     return YES;
 }
 
@@ -67,7 +63,6 @@ std::vector<std::size_t> indexesOf(NSIndexSet* rows)
 
 - (void)perform:(ModrigUtils::TableAction)action inTable:(NSTableView*)table
 {
-    (void)table;
     switch (action)
     {
     case ModrigUtils::TableAction::kAdd:

@@ -116,13 +116,11 @@ constexpr NSInteger kRemoveSegment = 1;
 
 - (NSInteger)numberOfRowsInTableView:(NSTableView*)table
 {
-    (void)table;
     return static_cast<NSInteger>([[startupApps arrangedObjects] count]);
 }
 
 - (id)tableView:(NSTableView*)table objectValueForTableColumn:(NSTableColumn*)column row:(NSInteger)row
 {
-    (void)table;
     return ModrigUtils::ValueInRow(startupApps, column, row);
 }
 
@@ -162,7 +160,6 @@ constexpr NSInteger kRemoveSegment = 1;
 
 - (IBAction)help:(id)sender
 {
-    (void)sender;
     ModrigUtils::OnCommandHelp(ModrigUtils::kStartupSuiteHelp);
 }
 

@@ -22,7 +22,6 @@ NSColor* acceptingColor()
 
 - (void)drawRect:(NSRect)dirty
 {
-    (void)dirty;
     NSBezierPath* ring =
         [NSBezierPath bezierPathWithRoundedRect:NSInsetRect([self bounds], kRingWidth, kRingWidth)
                                         xRadius:kRingCorner
@@ -37,7 +36,6 @@ NSColor* acceptingColor()
 // Clicks and drags go to what lies below.
 - (NSView*)hitTest:(NSPoint)point
 {
-    (void)point;
     return nil;
 }
 
@@ -79,7 +77,6 @@ NSColor* acceptingColor()
 
 - (void)draggingExited:(id<NSDraggingInfo>)sender
 {
-    (void)sender;
     [self hideDropSign];
 }
 

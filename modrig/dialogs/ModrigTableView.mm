@@ -130,7 +130,6 @@ NSString* ModrigUtils::HelpKey()
 // At every size the columns take all the width that there is.
 - (void)fillFrame:(NSNotification*)notification
 {
-    (void)notification;
     [self sizeLastColumnToFit];
 }
 
@@ -341,9 +340,6 @@ NSString* ModrigUtils::HelpKey()
 
 - (NSString*)view:(NSView*)view stringForToolTip:(NSToolTipTag)tag point:(NSPoint)place userData:(void*)data
 {
-    (void)view;
-    (void)tag;
-    (void)data;
     return [self tipForRow:[self rowAtPoint:place]];
 }
 

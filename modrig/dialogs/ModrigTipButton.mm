@@ -12,10 +12,6 @@
 
 - (NSString*)view:(NSView*)view stringForToolTip:(NSToolTipTag)tag point:(NSPoint)place userData:(void*)data
 {
-    (void)view;
-    (void)tag;
-    (void)place;
-    (void)data;
     return [[self target] tipOfButton:self];
 }
 

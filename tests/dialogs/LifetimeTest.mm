@@ -46,7 +46,6 @@ int gTextsGone = 0;
 
 - (id)copyWithZone:(NSZone*)zone
 {
-    (void)zone;
     return [self retain];
 }
 

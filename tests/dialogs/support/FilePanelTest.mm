@@ -7,14 +7,12 @@
 
 - (BOOL)panel:(id)panel shouldShowFilename:(NSString*)path
 {
-    (void)panel;
     ++asked;
     return !hidden || [[path lastPathComponent] rangeOfString:hidden].location == NSNotFound;
 }
 
 - (void)panelSelectionDidChange:(id)panel
 {
-    (void)panel;
     ++told;
 }
 

@@ -82,13 +82,11 @@ NSString* pathOf(NSURL* url)
 
 - (NSData*)dataForType:(NSString*)type
 {
-    (void)type;
     return nil;
 }
 
 - (NSString*)stringForType:(NSString*)type
 {
-    (void)type;
     return nil;
 }
 

@@ -65,7 +65,6 @@ NSBezierPath* triangleIn(NSRect frame)
 
 - (void)drawRect:(NSRect)dirty
 {
-    (void)dirty;
     const NSRect frame = NSInsetRect([self bounds], 4, 4);
     NSBezierPath* shape = mWarning ? triangleIn(frame) : [NSBezierPath bezierPathWithOvalInRect:frame];
     NSColor* fill = themeColor(mWarning ? @"warningColor" : @"accentColor");
@@ -166,7 +165,6 @@ NSBezierPath* triangleIn(NSRect frame)
 
 - (void)answer:(id)sender
 {
-    (void)sender;
     [NSApp stopModal];
 }
 

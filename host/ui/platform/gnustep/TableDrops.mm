@@ -50,7 +50,6 @@ NSDragOperation draggingUpdated(id table, SEL selector, id drag)
 
 NSDragOperation draggingEntered(id table, SEL selector, id drag)
 {
-    (void)selector;
     return [table draggingUpdated:drag];
 }
 } // namespace

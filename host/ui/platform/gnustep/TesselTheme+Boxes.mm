@@ -14,7 +14,6 @@ using namespace tessel::windowing;
               withItems:(NSArray*)items
            selectedItem:(NSTabViewItem*)selected
 {
-    (void)rect;
     const NSRect bounds = [view bounds];
     const bool flipped = [view isFlipped];
     drawPane(tabPaneOf(bounds, flipped));

@@ -16,9 +16,6 @@ using namespace tessel::windowing;
                      inView:(NSView*)view
                       state:(GSThemeControlState)state
 {
-    (void)cell;
-    (void)view;
-    (void)state;
     drawHeader(frame);
 }
 
@@ -31,14 +28,11 @@ using namespace tessel::windowing;
 
 - (void)drawTableCornerView:(NSView*)view withClip:(NSRect)clip
 {
-    (void)clip;
     drawHeaderBackground([view bounds]);
 }
 
 - (void)drawBrowserHeaderCell:(NSTableHeaderCell*)cell withFrame:(NSRect)frame inView:(NSView*)view
 {
-    (void)cell;
-    (void)view;
     drawHeader(frame);
 }
 
@@ -55,8 +49,6 @@ using namespace tessel::windowing;
                  hitPart:(NSScrollerPart)part
             isHorizontal:(BOOL)horizontal
 {
-    (void)rect;
-    (void)part;
     NSScroller* scroller = (NSScroller*)view;
     drawScrollTrack([view bounds], horizontal);
     if ([scroller isEnabled])

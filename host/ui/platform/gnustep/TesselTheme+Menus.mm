@@ -11,9 +11,6 @@ using namespace tessel::windowing;
                         dirtyRect:(NSRect)dirty
                        horizontal:(BOOL)horizontal
 {
-    (void)menu;
-    (void)dirty;
-    (void)horizontal;
     drawMenuBackground(bounds);
 }
 
@@ -22,9 +19,6 @@ using namespace tessel::windowing;
                              state:(GSThemeControlState)state
                       isHorizontal:(BOOL)horizontal
 {
-    (void)cell;
-    (void)state;
-    (void)horizontal;
     return NO;
 }
 
@@ -34,9 +28,6 @@ using namespace tessel::windowing;
                                          state:(GSThemeControlState)state
                                   isHorizontal:(BOOL)horizontal
 {
-    (void)cell;
-    (void)view;
-    (void)horizontal;
     if (state == GSThemeSelectedState || state == GSThemeHighlightedState)
         drawMenuSelection(frame);
 }

@@ -33,7 +33,6 @@ NSColor* tessel::windowing::themeColor(NSString* name)
              style:(int)style
              state:(GSThemeControlState)state
 {
-    (void)view;
     ButtonLook look;
     look.pressed = isPressed(state);
     look.disabled = state == GSThemeDisabledState;
@@ -45,13 +44,10 @@ NSColor* tessel::windowing::themeColor(NSString* name)
 // The toolkit would put the picture of a Return key into the default button, whose colour tells already.
 - (void)setKeyEquivalent:(NSString*)key forButtonCell:(NSButtonCell*)cell
 {
-    (void)key;
-    (void)cell;
 }
 
 - (void)drawFocusFrame:(NSRect)frame view:(NSView*)view
 {
-    (void)view;
     drawFocusRing(NSInsetRect(frame, -1, -1));
 }
 
@@ -65,25 +61,21 @@ NSColor* tessel::windowing::themeColor(NSString* name)
 
 - (NSRect)drawDarkBezel:(NSRect)border withClip:(NSRect)clip
 {
-    (void)clip;
     return drawBorder(border);
 }
 
 - (NSRect)drawGrayBezel:(NSRect)border withClip:(NSRect)clip
 {
-    (void)clip;
     return drawBorder(border);
 }
 
 - (NSRect)drawWhiteBezel:(NSRect)border withClip:(NSRect)clip
 {
-    (void)clip;
     return drawBorder(border);
 }
 
 - (NSRect)drawGroove:(NSRect)border withClip:(NSRect)clip
 {
-    (void)clip;
     return drawBorder(border);
 }
 

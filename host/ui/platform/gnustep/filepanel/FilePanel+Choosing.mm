@@ -121,7 +121,6 @@ bool isHost(NSString* path)
 
 - (void)tableViewSelectionDidChange:(NSNotification*)notification
 {
-    (void)notification;
     if (mUpdates == 0)
         [self rowsWereChosen];
 }

@@ -61,7 +61,6 @@ void storeRecentFolders(const std::vector<std::string>& folders)
 // The folder that was left is shown among the others, so that the keyboard is where it came from.
 - (IBAction)goUp:(id)sender
 {
-    (void)sender;
     [self bringUpToDate];
     const std::string left = mState->folder;
     [self goTo:string(folderAbove(left))];
@@ -75,7 +74,6 @@ void storeRecentFolders(const std::vector<std::string>& folders)
 
 - (IBAction)goHome:(id)sender
 {
-    (void)sender;
     [self goTo:NSHomeDirectory()];
 }
 
@@ -86,14 +84,12 @@ void storeRecentFolders(const std::vector<std::string>& folders)
 
 - (IBAction)goToRecent:(id)sender
 {
-    (void)sender;
     if (NSString* folder = [[mRecent selectedItem] representedObject])
         [self goTo:folder];
 }
 
 - (IBAction)toggleHidden:(id)sender
 {
-    (void)sender;
     [openSettings() putControlState:kSettings control:kHiddenSetting state:[mHidden state] == NSOnState];
     [self listAgain];
 }

@@ -240,13 +240,11 @@ KindWords kindWords()
 
 - (NSInteger)numberOfRowsInTableView:(NSTableView*)table
 {
-    (void)table;
     return static_cast<NSInteger>(mState->entries.size());
 }
 
 - (id)tableView:(NSTableView*)table objectValueForTableColumn:(NSTableColumn*)column row:(NSInteger)row
 {
-    (void)table;
     if (row < 0 || static_cast<std::size_t>(row) >= mState->entries.size())
         return nil;
     Entry& entry = mState->entries[static_cast<std::size_t>(row)];
@@ -264,7 +262,6 @@ KindWords kindWords()
      forTableColumn:(NSTableColumn*)column
                 row:(NSInteger)row
 {
-    (void)table;
     const bool isThere = row >= 0 && static_cast<std::size_t>(row) < mState->entries.size();
     if (isThere && [[column identifier] isEqual:@"name"])
         [(TsFileNameCell*)cell setFileIcon:iconOf(mState->entries[static_cast<std::size_t>(row)])];
@@ -272,7 +269,6 @@ KindWords kindWords()
 
 - (void)tableView:(NSTableView*)table didClickTableColumn:(NSTableColumn*)column
 {
-    (void)table;
     [self sortBy:[column identifier]];
 }
 

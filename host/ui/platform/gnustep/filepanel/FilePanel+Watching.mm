@@ -49,7 +49,6 @@ void* eventOf(int descriptor)
 
 - (void)lookForChanges:(NSTimer*)timer
 {
-    (void)timer;
     if (mState->wanted != mState->folder)
         return;
     if (stateOf(mState->folder) != mState->seen)

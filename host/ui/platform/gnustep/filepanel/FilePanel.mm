@@ -228,7 +228,6 @@ template <class Function> Function windowMethod(SEL selector)
 
 - (void)ok:(id)sender
 {
-    (void)sender;
     [self bringUpToDate];
     if ([self goIntoFolder] || [self tellOfMissingFile] || mState->chosen.empty())
         return;
@@ -238,7 +237,6 @@ template <class Function> Function windowMethod(SEL selector)
 // A window over the panel runs a modal session of its own, which is not this panel's to end.
 - (void)cancel:(id)sender
 {
-    (void)sender;
     if ([NSApp modalWindow] == self)
         [NSApp stopModalWithCode:NSCancelButton];
 }
