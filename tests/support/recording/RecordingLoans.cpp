@@ -1,14 +1,13 @@
 #include "tests/support/recording/RecordingLoans.h"
 
 #include <map>
-#include <new>
 
 namespace
 {
 using Loans = std::map<const void*, const char*>;
 
-// Made with the first loan and never destroyed: memory is freed before the program's first object is made
-// and after its last one is gone.
+// Made with the first loan and never destroyed: things are given back after the program's last object is
+// gone.
 constinit Loans* loans = nullptr;
 } // namespace
 
@@ -38,22 +37,4 @@ void recording_loans::forgetAll()
 {
     if (loans)
         loans->clear();
-}
-
-// The string of a variable is given back with a plain `delete[]`, so that is where its way back is seen. Both
-// do what they do anyway, and belong together: who frees has to know how it was allocated.
-void* operator new[](std::size_t size)
-{
-    return ::operator new(size);
-}
-
-void operator delete[](void* memory) noexcept
-{
-    recording_loans::takeBack(memory);
-    ::operator delete(memory);
-}
-
-void operator delete[](void* memory, std::size_t) noexcept
-{
-    ::operator delete[](memory);
 }

@@ -4,7 +4,6 @@
 
 #include "host/text/Unicode.h"
 #include "tests/support/RecordingHost.h"
-#include "tests/support/recording/RecordingLoans.h"
 
 void RecordingVariables::set(const std::wstring& name, const RecordingValue& value)
 {
@@ -34,8 +33,6 @@ int tsedGetVar(const wchar_t* name, TsResultBuffer* result)
     TsResultBuffer* made = resultBuffer({*value});
     *result = *made;
     made->type = TS_NIL;
-    if (result->type == TS_STRING)
-        recording_loans::lend(result->value.string, "string of a variable");
     tsutRelRb(made);
     return TS_NORMAL;
 }
