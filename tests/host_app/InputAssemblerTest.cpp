@@ -85,6 +85,10 @@ TEST(InputAssembler, DoesNotCountParenthesesThatAreNoLists)
     EXPECT_FALSE(isUnfinishedLisp(L"(list |a(b|)"));
     EXPECT_FALSE(isUnfinishedLisp(L"(list a\\( )"));
     EXPECT_FALSE(isUnfinishedLisp(L"(list #| ( #| ( |# ( |# 1) ; ((("));
+    EXPECT_FALSE(isUnfinishedLisp(L"(list a#|(|)")); // a symbol: # begins a comment only where a token begins
+    EXPECT_FALSE(isUnfinishedLisp(L"(list 'a|(|b\"(\")"));
+    EXPECT_FALSE(isUnfinishedLisp(L"(list #)")); // an error, which is the interpreter's to tell
+    EXPECT_FALSE(isUnfinishedLisp(L"(list) #; ((("));
 }
 
 TEST(InputAssembler, SeesWhatIsStillOpen)

@@ -45,6 +45,8 @@ TEST(LispSource, IgnoresParenthesesThatAreText)
                              L"#\\( #\\( #\\( #\\(", L"\\(\\(\\(\\(\\("})
         EXPECT_EQ(findTooDeepForm(text, 3), std::nullopt) << text;
     EXPECT_EQ(findTooDeepForm(L"\"\\\"\" ((((1))))", 3), 5U);
+    EXPECT_EQ(findTooDeepForm(L"a|(((((|b #3|((((|# a#|((((|", 3), std::nullopt);
+    EXPECT_EQ(findTooDeepForm(L"#|(|# ((((1))))", 3), 6U);
 }
 
 TEST(LispSource, SurvivesTextThatEndsAnywhere)
