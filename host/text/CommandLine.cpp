@@ -32,6 +32,13 @@ void CommandLine::say(std::wstring_view sentence)
     print(sentence);
     print(L"\n");
 }
+
+bool CommandLine::tell(const Outcome& outcome)
+{
+    if (!outcome.sentence().empty())
+        say(outcome.sentence());
+    return static_cast<bool>(outcome);
+}
 } // namespace tessel
 
 int tsutPrintfArguments(const wchar_t* format, const TsFormatArgument* arguments, std::size_t count)

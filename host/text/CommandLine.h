@@ -5,6 +5,8 @@
 #include <string>
 #include <string_view>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 class CommandLine
@@ -21,6 +23,9 @@ public:
     // Prints one sentence on a line of its own: after a line break if something stands on the line already,
     // and with a line break behind it.
     void say(std::wstring_view sentence);
+
+    // Says what went wrong, if anything did. Answers whether all went well.
+    bool tell(const Outcome& outcome);
 
     // Whether the next character starts a line.
     bool atLineStart() const { return mOpenLine.empty(); }

@@ -53,3 +53,20 @@ TEST(CommandLine, FormattedPrintingWithoutAHostOnlyCounts)
 {
     EXPECT_EQ(tsutPrintf(L"%d files", 3), 7);
 }
+
+TEST(CommandLine, TellsWhatWentWrongAndWhetherAnythingDid)
+{
+    CapturedOutput output;
+    EXPECT_TRUE(output.commandLine().tell(tessel::Result<int>(1)));
+    EXPECT_EQ(output.text(), "");
+    output.commandLine().print(L"Command: ");
+    EXPECT_FALSE(output.commandLine().tell(tessel::Result<>(tessel::Failure{L"It is locked."})));
+    EXPECT_EQ(output.text(), "Command: \nIt is locked.\n");
+}
+
+TEST(CommandLine, HasNothingToTellOfFailuresThatWereToldOneByOne)
+{
+    CapturedOutput output;
+    EXPECT_FALSE(output.commandLine().tell(tessel::Result<>(tessel::Failure{})));
+    EXPECT_EQ(output.text(), "");
+}
