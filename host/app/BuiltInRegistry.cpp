@@ -27,10 +27,12 @@ bool failAt(const std::wstring& path, const std::wstring& reason)
     return fail(L"The registry key \"" + path + L"\" " + reason + L".");
 }
 
-std::wstring writeFailure(LONG status)
+// The store's own words are told at the end of the command, which undoes all of it.
+std::wstring writeFailure(const Result<>& written)
 {
-    const std::wstring& problem = services().registry->problem();
-    return L"cannot be written: " + (problem.empty() ? L"error " + std::to_wstring(status) : problem);
+    const Result<>& canStore = services().registry->canStore();
+    return L"cannot be written: " +
+           (canStore ? L"error " + std::to_wstring(written.code()) : canStore.sentence());
 }
 
 bool list(const std::wstring& path)
@@ -59,11 +61,11 @@ bool get(const std::wstring& path, const std::wstring& name)
 bool set(const std::wstring& path, const Arguments& arguments)
 {
     Registry& registry = *services().registry;
-    Registry::Key key = Registry::kNoKey;
-    LONG status = registry.create(path, Registry::kRoot, key);
-    if (status == ERROR_SUCCESS && arguments.size() > 2)
-        status = registry.writeValue(key, at(arguments, 2), at(arguments, 3));
-    return status == ERROR_SUCCESS || failAt(path, writeFailure(status));
+    const auto key = registry.create(path, Registry::kRoot);
+    Result<> done = key ? Result<>() : key.failure();
+    if (key && arguments.size() > 2)
+        done = registry.writeValue(*key, at(arguments, 2), at(arguments, 3));
+    return done || failAt(path, writeFailure(done));
 }
 
 // A key alone goes with everything below it; with a name, only the value.
@@ -73,11 +75,11 @@ bool remove(const std::wstring& path, const Arguments& arguments)
     const auto key = registry.find(path);
     if (key == Registry::kNoKey)
         return failAt(path, L"does not exist");
-    const LONG status =
+    const Result<> done =
         arguments.size() > 2 ? registry.removeValue(key, at(arguments, 2)) : registry.removeKey(key);
-    if (status == ERROR_FILE_NOT_FOUND)
+    if (done.code() == ERROR_FILE_NOT_FOUND)
         return failAt(path, L"has no value \"" + at(arguments, 2) + L"\"");
-    return status == ERROR_SUCCESS || failAt(path, writeFailure(status));
+    return done || failAt(path, writeFailure(done));
 }
 
 bool registryCommand(const Arguments& arguments)

@@ -116,8 +116,7 @@ void Host::makeStore()
 {
     services().application = &mParts->application.emplace(wideText(mOptions.profileFolder));
     services().registry = &mParts->registry.emplace(mOptions.profileFolder / kRegistryFile);
-    if (const std::wstring& problem = mParts->registry->problem(); !problem.empty())
-        mCommandLine.say(problem);
+    mCommandLine.tell(mParts->registry->canStore());
     ensureCurrentProfile(*mParts->registry, mParts->application->productRegistryRoot());
     services().variables = &mParts->variables.emplace();
     services().removingTsLisp = mParts->variables->number(kRemovingTsLisp) != 0;
@@ -175,9 +174,9 @@ bool Host::run(const std::wstring& input)
 bool Host::finishLine()
 {
     // What the line wrote is stored before the queue runs: queued Lisp may take its time, or never end.
-    const bool stored = mParts->registry->endOfCommand();
+    const bool stored = mCommandLine.tell(mParts->registry->endOfCommand());
     mParts->lisp->runQueue();
-    return mParts->registry->endOfCommand() && stored;
+    return mCommandLine.tell(mParts->registry->endOfCommand()) && stored;
 }
 
 bool Host::runScript(const std::filesystem::path& script)
@@ -203,7 +202,7 @@ void Host::end()
     if (!mCommandLine.atLineStart())
         mCommandLine.print(L"\n");
     mParts->linker.unloadAll();
-    mParts->registry->endOfCommand();
+    mCommandLine.tell(mParts->registry->endOfCommand());
     mInterruptible = nullptr;
     mParts.reset();
     services() = {};

@@ -48,18 +48,19 @@ std::optional<unsigned> parseReasons(const std::wstring& text)
 }
 
 // A record without a module or readable load reasons is none: somebody else's key, or half of one.
-bool readRecord(Registry& registry, const std::wstring& name, ApplicationRecord& record)
+std::optional<ApplicationRecord> readRecord(Registry& registry, const std::wstring& name)
 {
     const std::wstring key = keyOf(name);
     const auto module = registry.read(key, kModule);
     const auto reasons = parseReasons(registry.read(key, kLoadReasons).value_or(L""));
     if (!module || !reasons)
-        return false;
+        return std::nullopt;
+    ApplicationRecord record;
     record.name = name;
     record.module = *module;
     record.description = registry.read(key, kDescription).value_or(L"");
     record.loadReasons = *reasons;
-    return true;
+    return record;
 }
 
 void readCommands(Registry& registry, ApplicationRecord& record)
@@ -71,27 +72,30 @@ void readCommands(Registry& registry, ApplicationRecord& record)
         record.commands.emplace_back(value.name, value.data);
 }
 
-bool writeRecord(Registry& registry, const ApplicationRecord& record)
+Result<> writeRecord(Registry& registry, const ApplicationRecord& record)
 {
     const std::wstring key = keyOf(record.name);
-    return registry.write(key, kModule, record.module) &&
-           registry.write(key, kDescription, record.description) &&
-           registry.write(key, kLoadReasons, std::to_wstring(record.loadReasons));
+    Result<> written = registry.write(key, kModule, record.module);
+    if (written)
+        written = registry.write(key, kDescription, record.description);
+    if (written)
+        written = registry.write(key, kLoadReasons, std::to_wstring(record.loadReasons));
+    return written;
 }
 
 // The commands replace those of an earlier version of the application.
-bool writeCommandsOfCaller(Registry& registry, const std::wstring& name)
+Result<> writeCommandsOfCaller(Registry& registry, const std::wstring& name)
 {
     const std::wstring key = keyOf(name) + kCommands;
     if (const Registry::Key old = registry.find(key); old != Registry::kNoKey)
-        if (registry.removeKey(old) != ERROR_SUCCESS)
-            return false;
+        if (auto removed = registry.removeKey(old); !removed)
+            return removed;
     if (!services().commands)
-        return true;
+        return {};
     for (const auto& [global, local] : services().commands->commandsOf(tsedGetAppName()))
-        if (!registry.write(key, global, local))
-            return false;
-    return true;
+        if (auto written = registry.write(key, global, local); !written)
+            return written;
+    return {};
 }
 } // namespace
 
@@ -104,11 +108,11 @@ std::vector<ApplicationRecord> allApplicationRecords()
         return records;
     for (const std::wstring& name : registry->subKeys(key))
     {
-        ApplicationRecord record;
-        if (!readRecord(*registry, name, record))
+        auto record = readRecord(*registry, name);
+        if (!record)
             continue;
-        readCommands(*registry, record);
-        records.push_back(std::move(record));
+        readCommands(*registry, *record);
+        records.push_back(*std::move(record));
     }
     return records;
 }
@@ -168,10 +172,10 @@ int TesselAppInfo::readFromRegistry()
     tessel::Registry* registry = tessel::services().registry;
     if (!registry || !tessel::isRecordName(mRecord->name))
         return TSRX_APPINFO_ERROR;
-    tessel::ApplicationRecord found;
-    if (!tessel::readRecord(*registry, mRecord->name, found))
+    const auto found = tessel::readRecord(*registry, mRecord->name);
+    if (!found)
         return TSRX_APPINFO_NOT_FOUND;
-    static_cast<tessel::ApplicationRecord&>(*mRecord) = found;
+    static_cast<tessel::ApplicationRecord&>(*mRecord) = *found;
     return TSRX_APPINFO_OK;
 }
 

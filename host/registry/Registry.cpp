@@ -3,10 +3,9 @@
 #include <sqlite3.h>
 
 #include <algorithm>
+#include <utility>
 
-#include "host/Services.h"
 #include "host/registry/Statements.h"
-#include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -25,6 +24,16 @@ std::wstring_view takePart(std::wstring_view& path)
     path.remove_prefix(std::min(end + 1, path.size()));
     return part;
 }
+
+Failure noSuchValue()
+{
+    return {L"There is no such value.", ERROR_FILE_NOT_FOUND};
+}
+
+Failure noMoreValues()
+{
+    return {L"There are no more values.", ERROR_NO_MORE_ITEMS};
+}
 } // namespace
 
 Registry::Registry(std::filesystem::path file) : mFile(std::move(file)), mNextHandle(kFirstHandle)
@@ -34,7 +43,7 @@ Registry::Registry(std::filesystem::path file) : mFile(std::move(file)), mNextHa
 
 Registry::~Registry()
 {
-    endOfCommand();
+    static_cast<void>(endOfCommand()); // who wants to know whether it was stored has asked before
     mStatements.reset();
     sqlite3_close(mDatabase);
 }
@@ -64,41 +73,38 @@ Registry::Key Registry::find(std::wstring_view path, Key from)
     return key;
 }
 
-LONG Registry::createChild(Key parent, std::wstring_view name, Key& key)
+Result<Registry::Key> Registry::createChild(Key parent, std::wstring_view name)
 {
-    if (const LONG status = beginWriting(); status != ERROR_SUCCESS)
-        return status;
+    if (const auto writing = beginWriting(); !writing)
+        return writing.failure();
     // Another process may have made it before the transaction began.
-    key = findChild(parent, name);
-    if (key != kNoKey)
-        return ERROR_SUCCESS;
+    if (const Key found = findChild(parent, name); found != kNoKey)
+        return found;
     const int status = mStatements->insertKey.bind(parent).bind(name).bind(foldCase(name)).run();
-    key = sqlite3_last_insert_rowid(mDatabase);
-    return finishWrite(status);
+    const Key made = sqlite3_last_insert_rowid(mDatabase);
+    const auto written = finishWrite(status);
+    return written ? Result<Key>(made) : written.failure();
 }
 
-LONG Registry::create(std::wstring_view path, Key from, Key& key)
+Result<Registry::Key> Registry::create(std::wstring_view path, Key from)
 {
-    if (!mDatabase || mReadOnly)
-    {
-        // Opening an existing key is no write, but who opens it this way is about to write.
-        return ERROR_ACCESS_DENIED;
-    }
-    key = from;
+    // Opening an existing key is no write, but who opens it this way is about to write.
+    if (!mCanStore)
+        return mCanStore.failure();
+    Key key = from;
     while (!path.empty())
     {
         const std::wstring_view part = takePart(path);
         if (part.empty())
             continue;
-        const Key parent = key;
-        key = findChild(parent, part);
-        if (key != kNoKey)
-            continue;
-        if (const LONG status = createChild(parent, part, key); status != ERROR_SUCCESS)
-            return status;
+        const Key found = findChild(key, part);
+        const auto child = found != kNoKey ? Result<Key>(found) : createChild(key, part);
+        if (!child)
+            return child;
+        key = *child;
     }
     mOpenedForWriting.insert(key);
-    return ERROR_SUCCESS;
+    return key;
 }
 
 std::vector<std::wstring> Registry::subKeys(Key key)
@@ -114,63 +120,63 @@ std::vector<std::wstring> Registry::subKeys(Key key)
     return names;
 }
 
-LONG Registry::removeKey(Key key)
+Result<> Registry::removeKey(Key key)
 {
     if (key == kNoKey || key == kRoot)
-        return ERROR_INVALID_PARAMETER;
-    if (const LONG status = beginWriting(); status != ERROR_SUCCESS)
-        return status;
+        return Failure{L"Only a key below the root can be removed.", ERROR_INVALID_PARAMETER};
+    if (auto writing = beginWriting(); !writing)
+        return writing;
     mCursor = {};
     return finishWrite(mStatements->deleteKey.bind(key).run());
 }
 
-LONG Registry::readValue(Key key, std::wstring_view name, std::wstring& data)
+Result<std::wstring> Registry::readValue(Key key, std::wstring_view name)
 {
     if (!mDatabase)
-        return ERROR_FILE_NOT_FOUND;
+        return noSuchValue();
     lookInto(key);
     Statement& read = mStatements->readValue;
     const int status = read.bind(key).bind(foldCase(name)).step();
     if (!isRow(status))
-        return status == SQLITE_DONE ? ERROR_FILE_NOT_FOUND : ERROR_READ_FAULT;
-    data = read.text(0);
+        return status == SQLITE_DONE ? noSuchValue() : Failure{mCommand.sentence(), ERROR_READ_FAULT};
+    std::wstring data = read.text(0);
     read.reset();
-    return ERROR_SUCCESS;
+    return data;
 }
 
-LONG Registry::writeValue(Key key, std::wstring_view name, std::wstring_view data)
+Result<> Registry::writeValue(Key key, std::wstring_view name, std::wstring_view data)
 {
-    if (const LONG status = beginWriting(); status != ERROR_SUCCESS)
-        return status;
+    if (auto writing = beginWriting(); !writing)
+        return writing;
     return finishWrite(mStatements->writeValue.bind(key).bind(name).bind(foldCase(name)).bind(data).run());
 }
 
-LONG Registry::removeValue(Key key, std::wstring_view name)
+Result<> Registry::removeValue(Key key, std::wstring_view name)
 {
-    if (const LONG status = beginWriting(); status != ERROR_SUCCESS)
-        return status;
+    if (auto writing = beginWriting(); !writing)
+        return writing;
     mCursor = {};
-    const LONG status = finishWrite(mStatements->deleteValue.bind(key).bind(foldCase(name)).run());
-    if (status == ERROR_SUCCESS && sqlite3_changes(mDatabase) == 0)
-        return ERROR_FILE_NOT_FOUND;
-    return status;
+    auto removed = finishWrite(mStatements->deleteValue.bind(key).bind(foldCase(name)).run());
+    if (removed && sqlite3_changes(mDatabase) == 0)
+        return noSuchValue();
+    return removed;
 }
 
-LONG Registry::valueName(Key key, DWORD index, std::wstring& name)
+Result<std::wstring> Registry::valueName(Key key, DWORD index)
 {
     if (!mDatabase)
-        return ERROR_NO_MORE_ITEMS;
+        return noMoreValues();
     lookInto(key);
     const bool next = mCursor.key == key && index == mCursor.index + 1;
     Statement& find = next || index == 0 ? mStatements->nextValue : mStatements->valueAt;
     find.bind(key).bind(next ? mCursor.sequence : std::int64_t{index});
     // A store that cannot be read has no more items either: whoever walks it must come to an end.
     if (!isRow(find.step()))
-        return ERROR_NO_MORE_ITEMS;
+        return noMoreValues();
     mCursor = {key, index, find.number(0)};
-    name = find.text(1);
+    std::wstring name = find.text(1);
     find.reset();
-    return ERROR_SUCCESS;
+    return name;
 }
 
 std::vector<Registry::Value> Registry::values(Key key)
@@ -189,32 +195,30 @@ std::vector<Registry::Value> Registry::values(Key key)
 std::optional<std::wstring> Registry::read(std::wstring_view path, std::wstring_view name)
 {
     const Key key = find(path);
-    std::wstring data;
-    if (key == kNoKey || readValue(key, name, data) != ERROR_SUCCESS)
+    if (key == kNoKey)
         return std::nullopt;
-    return data;
+    auto data = readValue(key, name);
+    return data ? std::optional(*std::move(data)) : std::nullopt;
 }
 
-bool Registry::write(std::wstring_view path, std::wstring_view name, std::wstring_view data)
+Result<> Registry::write(std::wstring_view path, std::wstring_view name, std::wstring_view data)
 {
-    Key key = kNoKey;
-    return create(path, kRoot, key) == ERROR_SUCCESS && writeValue(key, name, data) == ERROR_SUCCESS;
+    const auto key = create(path, kRoot);
+    return key ? writeValue(*key, name, data) : key.failure();
 }
 
-LONG Registry::beginWriting()
+Result<> Registry::beginWriting()
 {
-    if (!mDatabase || mReadOnly)
-        return ERROR_ACCESS_DENIED;
-    if (mFailure != ERROR_SUCCESS)
-        return mFailure;
-    if (mWriting)
-        return ERROR_SUCCESS;
+    if (!mCanStore)
+        return mCanStore;
+    if (!mCommand || mWriting)
+        return mCommand;
     // What was read by now is of a moment that may be over; the writes are to stand on what is stored now.
     commit();
     mWrites = 0;
     const int status = mStatements->begin.run();
     mWriting = status == SQLITE_DONE;
-    return mWriting ? ERROR_SUCCESS : fail(status, L"written");
+    return mWriting ? Result<>() : fail(status, L"written");
 }
 
 // Where this fails, the reading that follows says so.
@@ -233,16 +237,16 @@ void Registry::lookInto(Key key)
     beginReading();
 }
 
-LONG Registry::finishWrite(int status)
+Result<> Registry::finishWrite(int status)
 {
     if (status != SQLITE_DONE)
         return fail(status, L"written");
     ++mWrites;
     if (mWrites > kWritesFlushedAtOnce && mWrites % kWritesFlushedAtOnce != 0)
-        return ERROR_SUCCESS;
+        return {};
     status = sqlite3_db_cacheflush(mDatabase);
     // Pages in use are flushed another time.
-    return status == SQLITE_OK || status == SQLITE_BUSY ? ERROR_SUCCESS : fail(status, L"written");
+    return status == SQLITE_OK || status == SQLITE_BUSY ? Result<>() : fail(status, L"written");
 }
 
 // What could not be read must not be mistaken for what is not there and then be overwritten: no write of the
@@ -250,28 +254,29 @@ LONG Registry::finishWrite(int status)
 bool Registry::isRow(int status)
 {
     if (status != SQLITE_ROW && status != SQLITE_DONE)
-        fail(status, L"read");
+        static_cast<void>(fail(status, L"read")); // the command's end tells it
     return status == SQLITE_ROW;
 }
 
 // Undoes the command at once: until it ends it reads what was stored before, and not what half a command
 // left.
-LONG Registry::fail(int status, const wchar_t* done)
+Failure Registry::fail(int status, const wchar_t* done)
 {
-    if (mFailure != ERROR_SUCCESS)
+    if (!mCommand)
     {
         rollBack();
-        return mFailure;
+        return mCommand.failure();
     }
-    mFailure = statusOf(status);
     // Flushing leaves no words behind.
     const bool hasWords = sqlite3_errcode(mDatabase) != SQLITE_OK;
     const char* words = hasWords ? sqlite3_errmsg(mDatabase) : sqlite3_errstr(status);
-    mFailureWords = std::wstring(L" could not be ") + done + L": " + toWide(words);
+    mCommand = Failure{L"The registry " + toWide(mFile.string()) + L" could not be " + done + L": " +
+                           toWide(words) + L". What was stored before is unchanged.",
+                       statusOf(status)};
     rollBack();
     mCursor = {};
     closeHandlesOfLostKeys();
-    return mFailure;
+    return mCommand.failure();
 }
 
 void Registry::rollBack()
@@ -300,7 +305,7 @@ void Registry::commit()
     if (sqlite3_get_autocommit(mDatabase))
         return;
     if (const int status = mStatements->commit.run(); status != SQLITE_DONE)
-        fail(status, L"written");
+        static_cast<void>(fail(status, L"written")); // the command's end tells it
     mWriting = false;
 }
 
@@ -310,20 +315,13 @@ void Registry::storeSoFar()
         commit();
 }
 
-bool Registry::endOfCommand()
+Result<> Registry::endOfCommand()
 {
     if (!mDatabase)
-        return true;
+        return {};
     commit();
     mOpenedForWriting.clear();
-    if (mFailure == ERROR_SUCCESS)
-        return true;
-    if (services().commandLine)
-        services().commandLine->say(L"The registry " + toWide(mFile.string()) + mFailureWords +
-                                    L". What was stored before is unchanged.");
-    mFailure = ERROR_SUCCESS;
-    mFailureWords.clear();
-    return false;
+    return std::exchange(mCommand, {});
 }
 
 HKEY Registry::openHandle(Key key)
@@ -350,6 +348,6 @@ void ensureCurrentProfile(Registry& registry, std::wstring_view productRoot)
 {
     const std::wstring profiles = std::wstring(productRoot) + L"\\Profiles";
     if (!registry.read(profiles, L""))
-        registry.write(profiles, L"", L"Default");
+        static_cast<void>(registry.write(profiles, L"", L"Default")); // what is wrong is told by `canStore`
 }
 } // namespace tessel

@@ -9,7 +9,7 @@
 // the store could not be written or read, all that the command wrote is undone and the rest of its writes
 // fail too.
 //
-// Status codes are those of the Windows-style registry calls (wincompat/wintypes.h).
+// The codes of failures are those of the Windows-style registry calls (wincompat/wintypes.h).
 #pragma once
 
 #include <wincompat/winreg.h>
@@ -23,6 +23,8 @@
 #include <unordered_map>
 #include <unordered_set>
 #include <vector>
+
+#include "host/text/Result.h"
 
 struct sqlite3;
 
@@ -48,32 +50,32 @@ public:
     Registry(const Registry&) = delete;
     Registry& operator=(const Registry&) = delete;
 
-    // Empty, or one sentence about why nothing can be stored.
-    const std::wstring& problem() const { return mProblem; }
+    // Whether anything can be stored; one sentence about why not.
+    const Result<>& canStore() const { return mCanStore; }
 
     // Paths are relative to `from`; the parts are separated by one backslash, empty parts are passed over.
     Key find(std::wstring_view path, Key from = kRoot);
     // Opens the key for writing, and makes it if need be. A key that is there already locks nobody out: it is
     // the way in which everybody makes sure of a key before reading below it.
-    LONG create(std::wstring_view path, Key from, Key& key);
+    Result<Key> create(std::wstring_view path, Key from);
     std::vector<std::wstring> subKeys(Key key);
     // Removes the key, its values and everything below it.
-    LONG removeKey(Key key);
+    Result<> removeKey(Key key);
 
-    LONG readValue(Key key, std::wstring_view name, std::wstring& data);
-    LONG writeValue(Key key, std::wstring_view name, std::wstring_view data);
-    LONG removeValue(Key key, std::wstring_view name);
+    Result<std::wstring> readValue(Key key, std::wstring_view name);
+    Result<> writeValue(Key key, std::wstring_view name, std::wstring_view data);
+    Result<> removeValue(Key key, std::wstring_view name);
     // The name of the value at an index from 0; cheap for indexes asked for in ascending order.
-    LONG valueName(Key key, DWORD index, std::wstring& name);
+    Result<std::wstring> valueName(Key key, DWORD index);
     std::vector<Value> values(Key key);
 
     // The same by path, for the host's own settings.
     std::optional<std::wstring> read(std::wstring_view path, std::wstring_view name);
-    bool write(std::wstring_view path, std::wstring_view name, std::wstring_view data);
+    Result<> write(std::wstring_view path, std::wstring_view name, std::wstring_view data);
 
     // Stores what the command wrote. When that or something before it failed, everything that the command
-    // wrote is undone, one sentence says so, and the answer is false.
-    bool endOfCommand();
+    // wrote is undone, and the sentence says so.
+    Result<> endOfCommand();
 
     // Stores what the command wrote so far, and reads as it stands from now on. A failure stays the
     // command's, and is told at its end.
@@ -94,30 +96,28 @@ private:
     };
 
     void open();
-    LONG openFile();
-    LONG checkOrigin(int& version);
-    LONG prepare();
+    Result<> openFile();
+    Result<int> checkOrigin();
+    Result<> prepare();
     Key findChild(Key parent, std::wstring_view name);
-    LONG createChild(Key parent, std::wstring_view name, Key& key);
-    LONG beginWriting();
+    Result<Key> createChild(Key parent, std::wstring_view name);
+    Result<> beginWriting();
     void beginReading();
     void lookInto(Key key);
     void commit();
     void rollBack();
-    LONG finishWrite(int status);
+    Result<> finishWrite(int status);
     bool isRow(int status);
-    LONG fail(int status, const wchar_t* done);
+    Failure fail(int status, const wchar_t* done);
     void closeHandlesOfLostKeys();
-    std::wstring storeWords() const;
 
     std::filesystem::path mFile;
-    std::wstring mProblem;
+    Result<> mCanStore;
     sqlite3* mDatabase = nullptr;
     bool mReadOnly = false;
     std::unique_ptr<Statements> mStatements;
     Cursor mCursor;
-    LONG mFailure = ERROR_SUCCESS; // of the running command, its first one
-    std::wstring mFailureWords;
+    Result<> mCommand;                         // the running one, or what failed in it first
     bool mWriting = false;                     // the running transaction is one that writes
     unsigned mWrites = 0;                      // in it
     std::unordered_set<Key> mOpenedForWriting; // by the running command

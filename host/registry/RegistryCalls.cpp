@@ -7,6 +7,7 @@
 
 #include "host/Services.h"
 #include "host/registry/Registry.h"
+#include "host/text/CommandLine.h"
 
 using tessel::Registry;
 
@@ -31,6 +32,12 @@ Target targetOf(HKEY handle)
 const wchar_t* orEmpty(const wchar_t* text)
 {
     return text ? text : L"";
+}
+
+void tellOf(const tessel::Result<>& stored)
+{
+    if (auto* commandLine = tessel::services().commandLine)
+        commandLine->tell(stored);
 }
 
 LONG copyData(const std::wstring& data, void* buffer, DWORD* size)
@@ -70,13 +77,12 @@ LONG RegCreateKeyEx(HKEY root, const wchar_t* subKey, DWORD, const wchar_t*, DWO
         return ERROR_INVALID_HANDLE;
     const bool existed =
         disposition && target.registry->find(orEmpty(subKey), target.key) != Registry::kNoKey;
-    Registry::Key key = Registry::kNoKey;
-    if (const LONG status = target.registry->create(orEmpty(subKey), target.key, key);
-        status != ERROR_SUCCESS)
-        return status;
+    const auto key = target.registry->create(orEmpty(subKey), target.key);
+    if (!key)
+        return key.code();
     if (disposition)
         *disposition = existed ? REG_OPENED_EXISTING_KEY : REG_CREATED_NEW_KEY;
-    *result = target.registry->openHandle(key);
+    *result = target.registry->openHandle(*key);
     return ERROR_SUCCESS;
 }
 
@@ -88,20 +94,20 @@ LONG RegEnumValueW(HKEY key, DWORD index, wchar_t* name, DWORD* nameLength, DWOR
     const Target target = targetOf(key);
     if (!target)
         return ERROR_INVALID_HANDLE;
-    std::wstring found;
-    if (const LONG status = target.registry->valueName(target.key, index, found); status != ERROR_SUCCESS)
-        return status;
-    if (found.size() + 1 > *nameLength)
+    const auto found = target.registry->valueName(target.key, index);
+    if (!found)
+        return found.code();
+    if (found->size() + 1 > *nameLength)
         return ERROR_MORE_DATA;
-    std::wmemcpy(name, found.c_str(), found.size() + 1);
-    *nameLength = static_cast<DWORD>(found.size());
-    return type || dataSize ? tsRegGetValue(key, found.c_str(), 0, type, data, dataSize) : ERROR_SUCCESS;
+    std::wmemcpy(name, found->c_str(), found->size() + 1);
+    *nameLength = static_cast<DWORD>(found->size());
+    return type || dataSize ? tsRegGetValue(key, found->c_str(), 0, type, data, dataSize) : ERROR_SUCCESS;
 }
 
 LONG RegDeleteValueW(HKEY key, const wchar_t* name)
 {
     const Target target = targetOf(key);
-    return target ? target.registry->removeValue(target.key, orEmpty(name)) : ERROR_INVALID_HANDLE;
+    return target ? target.registry->removeValue(target.key, orEmpty(name)).code() : ERROR_INVALID_HANDLE;
 }
 
 LONG RegCloseKey(HKEY key)
@@ -117,19 +123,18 @@ LONG tsRegGetValue(HKEY key, const wchar_t* name, DWORD, DWORD* type, void* data
     const Target target = targetOf(key);
     if (!target)
         return ERROR_INVALID_HANDLE;
-    std::wstring found;
-    if (const LONG status = target.registry->readValue(target.key, orEmpty(name), found);
-        status != ERROR_SUCCESS)
-        return status;
+    const auto found = target.registry->readValue(target.key, orEmpty(name));
+    if (!found)
+        return found.code();
     if (type)
         *type = REG_SZ;
-    return size ? copyData(found, data, size) : ERROR_SUCCESS;
+    return size ? copyData(*found, data, size) : ERROR_SUCCESS;
 }
 
 LONG tsudRegSetString(HKEY key, const wchar_t* name, const wchar_t* data)
 {
     const Target target = targetOf(key);
-    return target ? target.registry->writeValue(target.key, orEmpty(name), orEmpty(data))
+    return target ? target.registry->writeValue(target.key, orEmpty(name), orEmpty(data)).code()
                   : ERROR_INVALID_HANDLE;
 }
 
@@ -139,7 +144,7 @@ void tsrxBeforeWaiting(bool actionIsOver)
     if (!registry)
         return;
     if (actionIsOver)
-        static_cast<void>(registry->endOfCommand()); // it says by itself what could not be stored
+        tellOf(registry->endOfCommand());
     else
         registry->storeSoFar();
 }

@@ -62,45 +62,55 @@ std::string fixedFile(const std::filesystem::path& file)
     return uri + "?immutable=1";
 }
 
-int firstNumber(sqlite3* database, const char* sql, int& number)
+// Why the store does not do what it was asked, in its own words: the end of a sentence.
+Failure storeFailure(sqlite3* database, int status)
+{
+    return {toWide(sqlite3_errmsg(database)), status};
+}
+
+// The first number that a statement answers; the codes are the store's.
+Result<int> firstNumber(sqlite3* database, const char* sql)
 {
     Statement statement;
     int status = statement.prepare(database, sql);
     if (status == SQLITE_OK)
         status = statement.step();
     if (status != SQLITE_ROW)
-        return status;
-    number = static_cast<int>(statement.number(0));
-    return SQLITE_OK;
+        return storeFailure(database, status);
+    return static_cast<int>(statement.number(0));
 }
 } // namespace
 
 void Registry::open()
 {
     mReadOnly = isMarkedReadOnly(mFile);
-    if (openFile() != ERROR_SUCCESS || prepare() != ERROR_SUCCESS)
+    Result<> ready = openFile();
+    if (ready)
+        ready = prepare();
+    if (!ready)
     {
-        mProblem = L"The registry " + toWide(mFile.string()) + L" cannot be used: " + storeWords() +
-                   L". It was left as it is, and nothing will be stored.";
+        mCanStore = Failure{L"The registry " + toWide(mFile.string()) + L" cannot be used: " +
+                                ready.sentence() + L". It was left as it is, and nothing will be stored.",
+                            ERROR_ACCESS_DENIED};
         mStatements.reset();
         sqlite3_close(mDatabase);
         mDatabase = nullptr;
-        return;
     }
-    if (mReadOnly)
-        mProblem = L"The registry " + toWide(mFile.string()) +
-                   L" may only be read: what is stored there is used, and nothing new will be stored.";
+    else if (mReadOnly)
+        mCanStore =
+            Failure{L"The registry " + toWide(mFile.string()) +
+                        L" may only be read: what is stored there is used, and nothing new will be stored.",
+                    ERROR_ACCESS_DENIED};
 }
 
-LONG Registry::openFile()
+Result<> Registry::openFile()
 {
     const int flags = mReadOnly ? SQLITE_OPEN_READONLY : SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE;
     int status = sqlite3_open_v2(mFile.c_str(), &mDatabase, flags | SQLITE_OPEN_NOMUTEX, nullptr);
     if (status != SQLITE_OK)
-        return statusOf(status);
+        return storeFailure(mDatabase, status);
     mReadOnly = sqlite3_db_readonly(mDatabase, "main") == 1;
-    int version = 0;
-    const int asked = firstNumber(mDatabase, kAskVersion, version);
+    const int asked = firstNumber(mDatabase, kAskVersion).code();
     const bool journalRefused = mReadOnly && (asked == SQLITE_CANTOPEN || asked == SQLITE_READONLY);
     if (journalRefused && !hasJournal(mFile))
     {
@@ -108,50 +118,55 @@ LONG Registry::openFile()
         constexpr int kReadUri = SQLITE_OPEN_READONLY | SQLITE_OPEN_URI | SQLITE_OPEN_NOMUTEX;
         status = sqlite3_open_v2(fixedFile(mFile).c_str(), &mDatabase, kReadUri, nullptr);
     }
-    return statusOf(status == SQLITE_OK ? sqlite3_busy_timeout(mDatabase, kBusyMilliseconds) : status);
+    if (status == SQLITE_OK)
+        status = sqlite3_busy_timeout(mDatabase, kBusyMilliseconds);
+    return status == SQLITE_OK ? Result<>() : storeFailure(mDatabase, status);
 }
 
-LONG Registry::checkOrigin(int& version)
+// Whether the file is a registry that this host understands. Answers its version, 0 for a new one.
+Result<int> Registry::checkOrigin()
 {
-    int tables = 0;
-    int status = firstNumber(mDatabase, kAskVersion, version);
-    if (status == SQLITE_OK && version < kSchemaVersion)
-        status = firstNumber(mDatabase, "SELECT count(*) FROM sqlite_master", tables);
-    if (version > kSchemaVersion)
-        mFailureWords = L"it was written by a newer Tessel";
+    const auto version = firstNumber(mDatabase, kAskVersion);
+    if (!version || *version == kSchemaVersion)
+        return version;
+    if (*version > kSchemaVersion)
+        return Failure{L"it was written by a newer Tessel"};
+    const auto tables = firstNumber(mDatabase, "SELECT count(*) FROM sqlite_master");
+    if (!tables)
+        return tables;
+    if (*tables == 0)
+        return version;
     // Another process may have made the registry between the two looks; then it says its version by now.
-    else if (tables > 0 && firstNumber(mDatabase, kAskVersion, version) == SQLITE_OK &&
-             version < kSchemaVersion)
-        mFailureWords = L"it belongs to another program";
-    return mFailureWords.empty() ? statusOf(status) : ERROR_ACCESS_DENIED;
+    const auto versionNow = firstNumber(mDatabase, kAskVersion);
+    if (versionNow && *versionNow < kSchemaVersion)
+        return Failure{L"it belongs to another program"};
+    return versionNow;
 }
 
 // What is somebody else's is recognised before anything is written: the journal's kind is part of the file.
-LONG Registry::prepare()
+Result<> Registry::prepare()
 {
-    int version = 0;
-    if (const LONG status = checkOrigin(version); status != ERROR_SUCCESS)
-        return status;
+    const auto version = checkOrigin();
+    if (!version)
+        return version.failure();
     const auto run = [this](const char* sql)
     {
         return sqlite3_exec(mDatabase, sql, nullptr, nullptr, nullptr);
     };
     int status = run("PRAGMA synchronous=FULL; PRAGMA foreign_keys=ON;");
-    if (status == SQLITE_OK && version < kSchemaVersion && !mReadOnly)
+    if (status == SQLITE_OK && *version < kSchemaVersion && !mReadOnly)
         status = run(kSchema);
     mStatements = std::make_unique<Statements>();
     if (status == SQLITE_OK)
         status = mStatements->prepare(mDatabase);
-    if (status != SQLITE_OK)
-        return statusOf(status);
-    if (!mReadOnly)
+    if (status == SQLITE_OK && !mReadOnly)
+    {
         status = run("PRAGMA journal_mode=WAL;");
-    // Another process is about to change the journal's kind; until then the old one keeps the promises too.
-    return status == SQLITE_BUSY ? ERROR_SUCCESS : statusOf(status);
-}
-
-std::wstring Registry::storeWords() const
-{
-    return mFailureWords.empty() ? toWide(sqlite3_errmsg(mDatabase)) : mFailureWords;
+        // Another process is about to change the journal's kind; until then the old one keeps the promises
+        // too.
+        if (status == SQLITE_BUSY)
+            return {};
+    }
+    return status == SQLITE_OK ? Result<>() : storeFailure(mDatabase, status);
 }
 } // namespace tessel

@@ -45,14 +45,12 @@ protected:
     {
         EXPECT_EQ(registry.read(L"A", L"name"), std::nullopt);
         EXPECT_FALSE(registry.write(L"A", L"name", L"1"));
-        Registry::Key key = Registry::kNoKey;
-        EXPECT_EQ(registry.create(L"A", Registry::kRoot, key), ERROR_ACCESS_DENIED);
-        EXPECT_EQ(registry.writeValue(Registry::kRoot, L"name", L"1"), ERROR_ACCESS_DENIED);
-        EXPECT_EQ(registry.removeValue(Registry::kRoot, L"name"), ERROR_ACCESS_DENIED);
+        EXPECT_EQ(registry.create(L"A", Registry::kRoot).code(), ERROR_ACCESS_DENIED);
+        EXPECT_EQ(registry.writeValue(Registry::kRoot, L"name", L"1").code(), ERROR_ACCESS_DENIED);
+        EXPECT_EQ(registry.removeValue(Registry::kRoot, L"name").code(), ERROR_ACCESS_DENIED);
         EXPECT_TRUE(registry.subKeys(Registry::kRoot).empty());
         EXPECT_TRUE(registry.values(Registry::kRoot).empty());
-        std::wstring name;
-        EXPECT_EQ(registry.valueName(Registry::kRoot, 0, name), ERROR_NO_MORE_ITEMS);
+        EXPECT_EQ(registry.valueName(Registry::kRoot, 0).code(), ERROR_NO_MORE_ITEMS);
         EXPECT_TRUE(registry.endOfCommand());
         EXPECT_EQ(output.text(), "");
     }
@@ -62,12 +60,14 @@ protected:
         const std::string before = contentOf(file());
         {
             Registry registry(file());
-            EXPECT_THAT(tessel::toUtf8(registry.problem()),
+            EXPECT_THAT(tessel::toUtf8(registry.canStore().sentence()),
                         AllOf(HasSubstr(file().string()), HasSubstr(reason)));
             expectUseless(registry);
         }
         EXPECT_TRUE(contentOf(file()) == before) << "not left as it was";
     }
+
+    bool tell(const tessel::Result<>& stored) { return output.commandLine().tell(stored); }
 
     TemporaryFolder folder;
     CapturedOutput output;
@@ -80,13 +80,12 @@ TEST_F(RegistryFile, ThatNobodyMayWriteIsRead)
     fs::permissions(file(), kNobodyWrites);
     const std::string before = contentOf(file());
     Registry registry(file());
-    EXPECT_THAT(tessel::toUtf8(registry.problem()),
+    EXPECT_THAT(tessel::toUtf8(registry.canStore().sentence()),
                 AllOf(HasSubstr(file().string()), HasSubstr("only be read")));
     EXPECT_EQ(generationOf(registry), 1);
     EXPECT_FALSE(registry.write(L"A", L"name", L"1"));
-    Registry::Key key = Registry::kNoKey;
-    EXPECT_EQ(registry.create(L"Software", Registry::kRoot, key), ERROR_ACCESS_DENIED);
-    EXPECT_EQ(registry.removeKey(registry.find(L"Software")), ERROR_ACCESS_DENIED);
+    EXPECT_EQ(registry.create(L"Software", Registry::kRoot).code(), ERROR_ACCESS_DENIED);
+    EXPECT_EQ(registry.removeKey(registry.find(L"Software")).code(), ERROR_ACCESS_DENIED);
     EXPECT_TRUE(registry.endOfCommand());
     EXPECT_EQ(output.text(), "");
     EXPECT_TRUE(contentOf(file()) == before);
@@ -111,7 +110,7 @@ TEST_F(RegistryFile, ThatAUserMayNotWriteIsReadInAFolderThatHeMayNotWriteEither)
             Registry registry(file());
             return "read " + std::to_string(generationOf(registry)) +
                    (registry.write(L"A", L"name", L"1") ? ", written" : ", not written") + ": " +
-                   tessel::toUtf8(registry.problem());
+                   tessel::toUtf8(registry.canStore().sentence());
         });
     fs::permissions(folder.path(), fs::perms::owner_all);
     EXPECT_THAT(answer, AllOf(HasSubstr("read 1, not written: "), HasSubstr("only be read")));
@@ -121,7 +120,7 @@ TEST_F(RegistryFile, ThatIsAFolderIsNotUsed)
 {
     folder.write(kFile + "/in the way", "");
     Registry registry(file());
-    EXPECT_THAT(tessel::toUtf8(registry.problem()),
+    EXPECT_THAT(tessel::toUtf8(registry.canStore().sentence()),
                 AllOf(HasSubstr(file().string()), HasSubstr("unable to open database file")));
     expectUseless(registry);
 }
@@ -129,7 +128,7 @@ TEST_F(RegistryFile, ThatIsAFolderIsNotUsed)
 TEST_F(RegistryFile, InAFolderThatIsMissingIsNotMade)
 {
     Registry registry(folder / "missing" / "registry.db");
-    EXPECT_THAT(tessel::toUtf8(registry.problem()), HasSubstr("unable to open database file"));
+    EXPECT_THAT(tessel::toUtf8(registry.canStore().sentence()), HasSubstr("unable to open database file"));
     expectUseless(registry);
     EXPECT_FALSE(fs::exists(folder / "missing"));
 }
@@ -166,7 +165,7 @@ TEST_F(RegistryFile, ThatIsEmptyBecomesARegistry)
 {
     folder.write(kFile, "");
     Registry registry(file());
-    EXPECT_EQ(registry.problem(), L"");
+    EXPECT_EQ(registry.canStore().sentence(), L"");
     EXPECT_TRUE(registry.write(L"A", L"name", L"1"));
 }
 
@@ -196,8 +195,8 @@ TEST_F(RegistryFile, WithADamagedPageIsNeverWrittenOverWhatCannotBeRead)
         {
             Registry registry(file());
             readable = generationOf(registry) == 1;
-            stored = rewriteList(registry, 2, 500) && registry.endOfCommand();
-            registry.endOfCommand();
+            stored = rewriteList(registry, 2, 500) && tell(registry.endOfCommand());
+            tell(registry.endOfCommand());
         }
         if (!readable)
         {
@@ -224,9 +223,9 @@ TEST_F(RegistryFile, WithChangedBytesIsSurvived)
         fs::remove(file().string() + "-shm");
         Registry registry(file());
         registry.values(registry.find(L"Software\\Tessel"));
-        if (rewriteList(registry, 2, 100) && registry.endOfCommand())
+        if (rewriteList(registry, 2, 100) && tell(registry.endOfCommand()))
             unharmed += generationOf(registry) == 2;
-        registry.endOfCommand();
+        tell(registry.endOfCommand());
     }
     EXPECT_GT(unharmed, 0u) << "most of the bytes are the entries' text";
 }

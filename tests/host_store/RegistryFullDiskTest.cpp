@@ -53,7 +53,7 @@ protected:
                     return std::string("cannot start");
                 std::string answer = rewriteList(registry, 2, entries) ? "written" : "write failed";
                 answer += ", reads " + std::to_string(generationOf(registry));
-                answer += registry.endOfCommand() ? ", stored" : ", undone";
+                answer += output.commandLine().tell(registry.endOfCommand()) ? ", stored" : ", undone";
                 answer += ", reads " + std::to_string(generationOf(registry));
                 return answer + ", said: " + output.text().substr(0, output.text().find('\n'));
             });
@@ -150,11 +150,11 @@ TEST_F(FullDisk, IsToldWhenANewRegistryCannotBeMade)
                 limitFiles(bytes);
                 Registry registry(file());
                 return (registry.write(L"A", L"name", L"1") ? "written: " : "not written: ") +
-                       tessel::toUtf8(registry.problem());
+                       tessel::toUtf8(registry.canStore().sentence());
             });
         EXPECT_THAT(answer, AllOf(StartsWith("not written: The registry"), HasSubstr(file().string())))
             << bytes;
         Registry registry(file());
-        EXPECT_EQ(registry.problem(), L"") << "nothing of it is in the way later";
+        EXPECT_EQ(registry.canStore().sentence(), L"") << "nothing of it is in the way later";
     }
 }

@@ -60,7 +60,7 @@ TEST(KilledProcess, LeavesAListThatIsWhole)
         child.kill();
         ASSERT_EQ(runSql(file, "PRAGMA integrity_check"), "ok") << "kill " << kill;
         Registry registry(file);
-        ASSERT_EQ(registry.problem(), L"");
+        ASSERT_EQ(registry.canStore().sentence(), L"");
         stored = generationOf(registry);
         ASSERT_GE(stored, acknowledged) << "kill " << kill;
     }

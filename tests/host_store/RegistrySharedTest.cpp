@@ -63,9 +63,9 @@ TEST(SharedRegistry, IsMadeOnceByProcessesThatStartTogether)
         const auto work = [&file](int output)
         {
             Registry registry(file);
-            const bool done = registry.problem().empty() &&
-                              registry.write(L"A", std::to_wstring(output), L"1") && registry.endOfCommand();
-            const std::string line = done ? "done\n" : tessel::toUtf8(registry.problem()) + "!\n";
+            const bool done = registry.canStore() && registry.write(L"A", std::to_wstring(output), L"1") &&
+                              registry.endOfCommand();
+            const std::string line = done ? "done\n" : tessel::toUtf8(registry.canStore().sentence()) + "!\n";
             if (write(output, line.data(), line.size()) < 0)
                 _exit(1);
         };
@@ -270,7 +270,7 @@ TEST(SharedRegistry, RefusesAWriteWhileAnotherCommandTakesTooLong)
     Registry other(host.file());
     ASSERT_TRUE(other.write(L"A", L"name", L"other"));
     EXPECT_FALSE(host.registry().write(L"A", L"name", L"mine"));
-    EXPECT_FALSE(host.registry().endOfCommand());
+    EXPECT_FALSE(host.output().commandLine().tell(host.registry().endOfCommand()));
     EXPECT_EQ(host.output().text(),
               "The registry " + host.file().string() +
                   " could not be written: database is locked. What was stored before is "

@@ -30,7 +30,7 @@ protected:
 
 TEST_F(RegistryStore, KeepsWhatACommandWrote)
 {
-    EXPECT_EQ(registry().problem(), L"");
+    EXPECT_EQ(registry().canStore().sentence(), L"");
     EXPECT_TRUE(registry().write(L"Software\\Tessel", L"name", L"größe \U0001F600"));
     EXPECT_TRUE(registry().endOfCommand());
     host.open();
@@ -88,8 +88,8 @@ TEST_F(RegistryStore, PutsAValueThatWasRemovedAtTheEnd)
     for (const wchar_t* name : {L"a", L"b", L"c"})
         EXPECT_TRUE(registry().write(L"K", name, L""));
     const auto key = registry().find(L"K");
-    EXPECT_EQ(registry().removeValue(key, L"A"), ERROR_SUCCESS);
-    EXPECT_EQ(registry().removeValue(key, L"A"), ERROR_FILE_NOT_FOUND);
+    EXPECT_EQ(registry().removeValue(key, L"A").code(), ERROR_SUCCESS);
+    EXPECT_EQ(registry().removeValue(key, L"A").code(), ERROR_FILE_NOT_FOUND);
     EXPECT_TRUE(registry().write(L"K", L"A", L""));
     EXPECT_THAT(valueNames(L"K"), ElementsAre(L"b", L"c", L"A"));
 }
@@ -116,7 +116,7 @@ TEST_F(RegistryStore, RemovesAKeyWithAllThatIsBelowIt)
 {
     EXPECT_TRUE(registry().write(L"A\\B\\C", L"name", L"1"));
     EXPECT_TRUE(registry().write(L"A\\D", L"name", L"1"));
-    EXPECT_EQ(registry().removeKey(registry().find(L"A\\B")), ERROR_SUCCESS);
+    EXPECT_EQ(registry().removeKey(registry().find(L"A\\B")).code(), ERROR_SUCCESS);
     EXPECT_EQ(registry().find(L"A\\B"), Registry::kNoKey);
     EXPECT_EQ(registry().find(L"A\\B\\C"), Registry::kNoKey);
     EXPECT_TRUE(registry().write(L"A\\B\\C", L"other", L"1"));
@@ -127,21 +127,21 @@ TEST_F(RegistryStore, RemovesAKeyWithAllThatIsBelowIt)
 TEST_F(RegistryStore, KeepsItsRoot)
 {
     EXPECT_TRUE(registry().write(L"A", L"name", L"1"));
-    EXPECT_EQ(registry().removeKey(Registry::kRoot), ERROR_INVALID_PARAMETER);
-    EXPECT_EQ(registry().removeKey(Registry::kNoKey), ERROR_INVALID_PARAMETER);
+    EXPECT_EQ(registry().removeKey(Registry::kRoot).code(), ERROR_INVALID_PARAMETER);
+    EXPECT_EQ(registry().removeKey(Registry::kNoKey).code(), ERROR_INVALID_PARAMETER);
     EXPECT_EQ(registry().read(L"A", L"name"), L"1");
     EXPECT_EQ(registry().find(L"HKEY_CURRENT_USER"), Registry::kNoKey);
 }
 
 TEST_F(RegistryStore, NeverGivesTheNumberOfARemovedKeyToAnother)
 {
-    Registry::Key removed = Registry::kNoKey;
-    EXPECT_EQ(registry().create(L"A", Registry::kRoot, removed), ERROR_SUCCESS);
-    EXPECT_EQ(registry().removeKey(removed), ERROR_SUCCESS);
+    const auto removed = registry().create(L"A", Registry::kRoot);
+    ASSERT_EQ(removed.code(), ERROR_SUCCESS);
+    EXPECT_EQ(registry().removeKey(*removed).code(), ERROR_SUCCESS);
     EXPECT_TRUE(registry().endOfCommand());
-    Registry::Key other = Registry::kNoKey;
-    EXPECT_EQ(registry().create(L"B", Registry::kRoot, other), ERROR_SUCCESS);
-    EXPECT_NE(other, removed);
+    const auto other = registry().create(L"B", Registry::kRoot);
+    ASSERT_EQ(other.code(), ERROR_SUCCESS);
+    EXPECT_NE(*other, *removed);
 }
 
 TEST_F(RegistryStore, UndoesTheWholeCommandAfterAWriteThatFailed)
@@ -151,11 +151,11 @@ TEST_F(RegistryStore, UndoesTheWholeCommandAfterAWriteThatFailed)
     EXPECT_TRUE(registry().write(L"A", L"name", L"after"));
     EXPECT_TRUE(registry().write(L"New", L"name", L"after"));
     const HKEY handle = registry().openHandle(registry().find(L"New"));
-    EXPECT_EQ(registry().writeValue(999'999, L"name", L"no such key"), ERROR_WRITE_FAULT);
+    EXPECT_EQ(registry().writeValue(999'999, L"name", L"no such key").code(), ERROR_WRITE_FAULT);
     EXPECT_EQ(registry().read(L"A", L"name"), L"before") << "what is stored is read from then on";
     EXPECT_FALSE(registry().write(L"A", L"name", L"later")) << "the rest of the command fails too";
     EXPECT_EQ(registry().keyOf(handle), std::nullopt) << "a key that was undone has no handle";
-    EXPECT_FALSE(registry().endOfCommand());
+    EXPECT_FALSE(host.output().commandLine().tell(registry().endOfCommand()));
     EXPECT_EQ(host.output().text(), "The registry " + host.file().string() +
                                         " could not be written: FOREIGN KEY constraint failed. What was "
                                         "stored before is unchanged.\n");
@@ -170,21 +170,22 @@ TEST_F(RegistryStore, WalksALongListInBothDirectionsAndByLeaps)
 {
     ASSERT_TRUE(rewriteList(registry(), 1, 1000));
     const auto key = registry().find(L"Software\\Tessel\\R21\\Profiles\\Default\\Dialogs\\Modrig\\History");
-    std::wstring name;
     for (DWORD index = 0; index < 1000; ++index)
     {
-        ASSERT_EQ(registry().valueName(key, index, name), ERROR_SUCCESS);
-        ASSERT_EQ(name, std::to_wstring(index + 1) + L"History");
+        const auto name = registry().valueName(key, index);
+        ASSERT_EQ(name.code(), ERROR_SUCCESS);
+        ASSERT_EQ(*name, std::to_wstring(index + 1) + L"History");
     }
     for (const DWORD index : {999u, 998u, 0u, 1u, 500u, 500u, 501u})
     {
-        ASSERT_EQ(registry().valueName(key, index, name), ERROR_SUCCESS);
-        EXPECT_EQ(name, std::to_wstring(index + 1) + L"History");
+        const auto name = registry().valueName(key, index);
+        ASSERT_EQ(name.code(), ERROR_SUCCESS);
+        EXPECT_EQ(*name, std::to_wstring(index + 1) + L"History");
     }
-    EXPECT_EQ(registry().valueName(key, 1000, name), ERROR_SUCCESS);
-    EXPECT_EQ(registry().valueName(key, 1001, name), ERROR_NO_MORE_ITEMS);
-    EXPECT_EQ(registry().valueName(key, 0xFFFFFFFF, name), ERROR_NO_MORE_ITEMS);
-    EXPECT_EQ(registry().valueName(Registry::kNoKey, 0, name), ERROR_NO_MORE_ITEMS);
+    EXPECT_EQ(registry().valueName(key, 1000).code(), ERROR_SUCCESS);
+    EXPECT_EQ(registry().valueName(key, 1001).code(), ERROR_NO_MORE_ITEMS);
+    EXPECT_EQ(registry().valueName(key, 0xFFFFFFFF).code(), ERROR_NO_MORE_ITEMS);
+    EXPECT_EQ(registry().valueName(Registry::kNoKey, 0).code(), ERROR_NO_MORE_ITEMS);
 }
 
 TEST_F(RegistryStore, WalksTwoKeysAtTheSameTime)
@@ -195,12 +196,12 @@ TEST_F(RegistryStore, WalksTwoKeysAtTheSameTime)
         EXPECT_TRUE(registry().write(L"B", std::wstring(L"b") + name, L""));
     }
     std::vector<std::wstring> names;
-    std::wstring name;
     for (DWORD index = 0; index < 3; ++index)
         for (const wchar_t* path : {L"A", L"B"})
         {
-            ASSERT_EQ(registry().valueName(registry().find(path), index, name), ERROR_SUCCESS);
-            names.push_back(name);
+            const auto name = registry().valueName(registry().find(path), index);
+            ASSERT_EQ(name.code(), ERROR_SUCCESS);
+            names.push_back(*name);
         }
     EXPECT_THAT(names, ElementsAre(L"a1", L"b1", L"a2", L"b2", L"a3", L"b3"));
 }

@@ -35,7 +35,7 @@ bool removeOld(Registry& registry)
     if (key == Registry::kNoKey)
         return true;
     for (const auto& value : registry.values(key))
-        if (registry.removeValue(key, value.name) != ERROR_SUCCESS)
+        if (!registry.removeValue(key, value.name))
             return false;
     return true;
 }
@@ -76,7 +76,9 @@ bool writeList(Registry& registry, int generation, int count, std::size_t entryL
     for (int number = 1; number <= count; ++number)
         if (!registry.write(kListKey, entryName(number), entryData(generation, number, entryLength)))
             return false;
-    return registry.write(kListKey, kCount, std::to_wstring(generation) + L" " + std::to_wstring(count));
+    const auto counted =
+        registry.write(kListKey, kCount, std::to_wstring(generation) + L" " + std::to_wstring(count));
+    return static_cast<bool>(counted);
 }
 
 int generationOf(Registry& registry)
