@@ -22,9 +22,12 @@ int main(int argc, char** argv)
     tessel::Registry registry(std::filesystem::path(argv[1]) / "registry.db");
     tessel::services().registry = &registry;
     tessel::ensureCurrentProfile(registry, L"Software\\Tessel\\R21");
-    registry.endOfCommand();
+    if (!registry.endOfCommand())
+        return 1;
     const tessel::LispInterpreter lisp({});
-    std::wstring whyNot;
-    const auto bundle = tessel::ModuleLibrary::open(tessel::moduleFileAt(argv[2]), true, whyNot);
-    return bundle && bundle->entryPoint() ? 0 : 1;
+    const auto file = tessel::moduleFileAt(argv[2]);
+    if (!file)
+        return 1;
+    const auto bundle = tessel::ModuleLibrary::open(*file, true);
+    return bundle && (*bundle)->entryPoint() ? 0 : 1;
 }

@@ -57,27 +57,29 @@ void say(const std::wstring& path, const wchar_t* whatFailed, const std::wstring
     services().commandLine->say(L"The application \"" + path + L"\" " + whatFailed + whyNot + L".");
 }
 
-std::wstring whyNotLoadable(const ModuleFile& file, const RegularFile& program)
+Result<> checkLoadable(const RegularFile& program)
 {
-    if (!file.whyNoProgram.empty())
-        return file.whyNoProgram;
-    if (!program.isOpen())
-        return program.whyNot();
-    const auto read = [&](std::uint64_t offset, void* buffer, std::size_t size)
-    {
-        return program.read(offset, buffer, size);
-    };
-    return std::wstring(whyNotMappable(program.size(), read));
+    if (!program.opened())
+        return program.opened();
+    return checkMappable(program.size(), [&](std::uint64_t offset, void* buffer, std::size_t size)
+                         { return program.read(offset, buffer, size); });
 }
 
-std::unique_ptr<Module> open(const ModuleFile& file, bool resolveNow, std::wstring& whyNot)
+Result<std::unique_ptr<Module>> open(const ModuleFile& file, bool resolveNow)
 {
+    auto library = ModuleLibrary::open(file, resolveNow);
+    if (!library)
+        return library.failure();
     auto module = std::make_unique<Module>();
-    module->library = ModuleLibrary::open(file, resolveNow, whyNot);
-    if (!module->library)
-        return nullptr;
+    module->library = *std::move(library);
     module->entryPoint = module->library->entryPoint();
     return module;
+}
+
+// The program at a path, or a file that is not open.
+RegularFile programOf(const Result<ModuleFile>& file)
+{
+    return RegularFile(file ? file->program : std::string());
 }
 } // namespace
 
@@ -92,112 +94,115 @@ bool DynamicLinker::registerApplication(void* application)
 bool DynamicLinker::loadModule(const wchar_t* path, bool sayWhyNot, bool resolveNow)
 {
     const std::wstring fullPath = fullPathOf(path);
-    std::wstring whyNot;
-    if (load(fullPath, resolveNow, whyNot))
+    const auto loaded = load(fullPath, resolveNow);
+    if (loaded)
         return true;
     if (auto* box = services().messageBox)
-        box->explain(fullPath, whyNot + L".");
+        box->explain(fullPath, loaded.sentence() + L".");
     if (sayWhyNot)
-        say(fullPath, L"is not loaded: ", whyNot);
+        say(fullPath, L"is not loaded: ", loaded.sentence());
     return false;
 }
 
-bool DynamicLinker::load(const std::wstring& path, bool resolveNow, std::wstring& whyNot)
+Result<> DynamicLinker::load(const std::wstring& path, bool resolveNow)
 {
     if (mEnding)
-    {
-        whyNot = L"the host is ending";
-        return false;
-    }
+        return Failure{L"the host is ending"};
     if (const Module* known = mModules.withPath(path))
-        return answerForKnown(*known, whyNot);
-    const ModuleFile file = moduleFileAt(toUtf8(path));
-    const RegularFile program(file.program);
+        return answerForKnown(*known);
+    const auto file = moduleFileAt(toUtf8(path));
+    const RegularFile program = programOf(file);
     const std::wstring realPath = realPathOf(path);
     if (const Module* loaded = known(realPath, program))
-        return answerForKnown(*loaded, whyNot);
-    whyNot = whyNotLoadable(file, program);
-    if (!whyNot.empty())
-        return false;
-    auto opened = open(file, resolveNow, whyNot);
+        return answerForKnown(*loaded);
+    if (!file)
+        return file.failure();
+    if (auto loadable = checkLoadable(program); !loadable)
+        return loadable;
+    auto opened = open(*file, resolveNow);
     if (!opened)
-        return false;
-    opened->path = path;
-    opened->realPath = realPath;
-    opened->name = nameIn(path);
-    opened->identity = program.identity();
-    return start(mModules.add(std::move(opened)), whyNot);
+        return opened.failure();
+    std::unique_ptr<Module> module = *std::move(opened);
+    module->path = path;
+    module->realPath = realPath;
+    module->name = nameIn(path);
+    module->identity = program.identity();
+    return start(mModules.add(std::move(module)));
 }
 
-bool DynamicLinker::answerForKnown(const Module& module, std::wstring& whyNot) const
+Result<> DynamicLinker::answerForKnown(const Module& module) const
 {
-    if (!module.inService)
-        whyNot = L"its load message is still running, and it has not registered itself";
-    return module.inService;
+    if (module.inService)
+        return {};
+    return Failure{L"its load message is still running, and it has not registered itself"};
 }
 
-bool DynamicLinker::start(Module& module, std::wstring& whyNot)
+Result<> DynamicLinker::start(Module& module)
 {
-    if (!module.entryPoint)
-        whyNot = L"it has no entry point \"tsrxEntryPoint\"";
-    else if (send(module, TSRX_MSG_LOAD, whyNot))
-    {
+    auto started = module.entryPoint ? send(module, TSRX_MSG_LOAD)
+                                     : Failure{L"it has no entry point \"tsrxEntryPoint\""};
+    if (started)
         mModules.putInService(module);
-        return true;
-    }
-    // Why it was not loaded is what a person needs to know; whether it is still mapped matters to nobody.
-    static_cast<void>(takeOut(module));
-    return false;
+    else
+        // Why it was not loaded is what a person needs to know; whether it is still mapped matters to nobody.
+        static_cast<void>(takeOut(module));
+    return started;
 }
 
-bool DynamicLinker::send(Module& module, unsigned message, std::wstring& whyNot) const
+Result<> DynamicLinker::send(Module& module, unsigned message) const
 {
     const CallingApplication::Scope calling(*services().callingApplication, module.path);
+    constexpr wchar_t kThrew[] = L"its entry point threw an exception: ";
     int answer = TSRX_RET_OK;
     try
     {
-        const auto thrown = catchObjectiveC([&] { answer = module.entryPoint(message, &module); });
-        if (thrown)
-            whyNot = L"its entry point threw an exception: " + *thrown;
-        else if (answer != TSRX_RET_OK)
-            whyNot = L"its entry point answered " + std::to_wstring(answer);
+        const auto returned = catchObjectiveC([&] { answer = module.entryPoint(message, &module); });
+        if (!returned)
+            return Failure{kThrew + returned.sentence()};
     }
     catch (const std::exception& error)
     {
-        whyNot = L"its entry point threw an exception: " + toWide(error.what());
+        return Failure{kThrew + toWide(error.what())};
     }
     catch (...)
     {
-        whyNot = L"its entry point threw something that is not an error of the standard library";
+        return Failure{L"its entry point threw something that is not an error of the standard library"};
     }
-    return whyNot.empty();
+    if (answer != TSRX_RET_OK)
+        return Failure{L"its entry point answered " + std::to_wstring(answer)};
+    return {};
 }
 
 bool DynamicLinker::unloadModule(const wchar_t* path, bool sayWhyNot)
 {
     const std::wstring fullPath = fullPathOf(path);
     Module* module = find(path);
-    std::wstring whyNot;
-    if (!isFreeToGo(module, whyNot) || !send(*module, TSRX_MSG_UNLOAD, whyNot))
-    {
-        if (sayWhyNot)
-            say(fullPath, L"is not unloaded: ", whyNot);
+    const auto unloaded = unload(module);
+    if (!unloaded && sayWhyNot)
+        say(fullPath, L"is not unloaded: ", unloaded.sentence());
+    if (!unloaded)
         return false;
-    }
     if (!takeOut(*module) && sayWhyNot)
         say(fullPath, L"is out of service; ", L"its code stays in memory until the session ends");
     return true;
 }
 
-bool DynamicLinker::isFreeToGo(const Module* module, std::wstring& whyNot) const
+// Message 2, to one that may go.
+Result<> DynamicLinker::unload(Module* module)
+{
+    auto free = checkFreeToGo(module);
+    return free ? send(*module, TSRX_MSG_UNLOAD) : free;
+}
+
+Result<> DynamicLinker::checkFreeToGo(const Module* module) const
 {
     if (!module || !module->inService)
-        whyNot = L"it is not loaded";
-    else if (module->locked)
-        whyNot = L"it is locked";
-    else if (services().callingApplication->isAtWork(module->path))
-        whyNot = L"it is at work";
-    return whyNot.empty();
+        return Failure{L"it is not loaded"};
+    if (module->locked)
+        return Failure{L"it is locked"};
+    if (services().callingApplication->isAtWork(module->path))
+        return Failure{L"it is at work"};
+    return {};
 }
 
 // False when the system keeps the library mapped.
@@ -214,15 +219,14 @@ Module* DynamicLinker::find(const wchar_t* path) const
     const std::wstring fullPath = fullPathOf(path);
     if (Module* module = mModules.withPath(fullPath))
         return module;
-    const RegularFile program(moduleFileAt(toUtf8(fullPath)).program);
-    return known(realPathOf(fullPath), program);
+    return known(realPathOf(fullPath), programOf(moduleFileAt(toUtf8(fullPath))));
 }
 
 Module* DynamicLinker::known(const std::wstring& realPath, const RegularFile& program) const
 {
     if (Module* module = mModules.withPath(realPath))
         return module;
-    return program.isOpen() ? mModules.withIdentity(program.identity()) : nullptr;
+    return program.opened() ? mModules.withIdentity(program.identity()) : nullptr;
 }
 
 bool DynamicLinker::isModuleLocked(const wchar_t* path) const
@@ -265,9 +269,8 @@ void DynamicLinker::unloadAll()
     while (!mModules.inService().empty())
     {
         Module& last = *mModules.inService().back();
-        std::wstring whyNot;
-        if (!send(last, TSRX_MSG_UNLOAD, whyNot))
-            say(last.path, L"did not end as it should: ", whyNot);
+        if (const auto ended = send(last, TSRX_MSG_UNLOAD); !ended)
+            say(last.path, L"did not end as it should: ", ended.sentence());
         services().commands->removeCommandsOf(last.path);
         mModules.remove(last);
     }

@@ -51,12 +51,15 @@ public:
     void unloadAll();
 
 private:
-    bool load(const std::wstring& path, bool resolveNow, std::wstring& whyNot);
-    bool answerForKnown(const Module& module, std::wstring& whyNot) const;
-    bool start(Module& module, std::wstring& whyNot);
-    bool isFreeToGo(const Module* module, std::wstring& whyNot) const;
+    // What these say of a failure is the end of a sentence.
+    Result<> load(const std::wstring& path, bool resolveNow);
+    Result<> answerForKnown(const Module& module) const;
+    Result<> start(Module& module);
+    Result<> unload(Module* module);
+    Result<> checkFreeToGo(const Module* module) const;
+    Result<> send(Module& module, unsigned message) const;
+
     bool takeOut(Module& module);
-    bool send(Module& module, unsigned message, std::wstring& whyNot) const;
     Module* find(const wchar_t* path) const;
     Module* known(const std::wstring& realPath, const RegularFile& program) const;
 

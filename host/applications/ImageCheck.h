@@ -8,13 +8,14 @@
 #include <cstddef>
 #include <cstdint>
 #include <functional>
-#include <string_view>
+
+#include "host/text/Result.h"
 
 namespace tessel
 {
 // Fills the buffer with bytes of the file from an offset; false when the file does not hold that many there.
 using ReadAt = std::function<bool(std::uint64_t offset, void* buffer, std::size_t size)>;
 
-// Why the file must not be mapped, as the end of a sentence; empty when nothing speaks against it.
-std::wstring_view whyNotMappable(std::uint64_t fileSize, const ReadAt& readAt);
+// Whether the file may be mapped; why not is the end of a sentence.
+Result<> checkMappable(std::uint64_t fileSize, const ReadAt& readAt);
 } // namespace tessel

@@ -41,12 +41,15 @@ bool isMapped(const std::string& program)
 }
 } // namespace
 
-ModuleFile moduleFileAt(std::string path)
+Result<ModuleFile> moduleFileAt(std::string path)
 {
     ModuleFile file;
     file.isBundle = isBundlePath(path);
+    const auto program = file.isBundle ? programOfBundle(path) : Result<std::string>(path);
+    if (!program)
+        return program.failure();
+    file.program = *program;
     file.path = std::move(path);
-    file.program = file.isBundle ? programOfBundle(file.path, file.whyNoProgram) : file.path;
     return file;
 }
 
@@ -55,35 +58,24 @@ ModuleLibrary::ModuleLibrary(ModuleFile file, void* handle, bool byPlatform)
 {
 }
 
-std::unique_ptr<ModuleLibrary> ModuleLibrary::open(const ModuleFile& file, bool resolveNow,
-                                                   std::wstring& whyNot)
+Result<std::unique_ptr<ModuleLibrary>> ModuleLibrary::open(const ModuleFile& file, bool resolveNow)
 {
     if (file.isBundle && needsBundleLoading(file.program))
-        return openBundle(file, resolveNow, whyNot);
+        return openBundle(file, resolveNow);
     if (void* handle = map(file.program, resolveNow))
         return std::unique_ptr<ModuleLibrary>(new ModuleLibrary(file, handle, false));
-    whyNot = linkersWords(file.program);
-    return nullptr;
+    return Failure{linkersWords(file.program)};
 }
 
-std::unique_ptr<ModuleLibrary> ModuleLibrary::openBundle(const ModuleFile& file, bool resolveNow,
-                                                         std::wstring& whyNot)
+Result<std::unique_ptr<ModuleLibrary>> ModuleLibrary::openBundle(const ModuleFile& file, bool resolveNow)
 {
     void* handle = loadBundle(file.path) ? mappedLibrary(file.program) : nullptr;
     if (!handle)
-    {
         // The platform keeps the reason to itself; the system's linker has the same one.
-        if (!map(file.program, true))
-            whyNot = linkersWords(file.program);
-        else
-            whyNot = L"the platform does not accept it as a bundle";
-        return nullptr;
-    }
+        return Failure{map(file.program, true) ? L"the platform does not accept it as a bundle"
+                                               : linkersWords(file.program)};
     if (const std::string missing = resolveNow ? firstUnresolvedFunction(handle) : ""; !missing.empty())
-    {
-        whyNot = L"undefined symbol: " + toWide(missing);
-        return nullptr;
-    }
+        return Failure{L"undefined symbol: " + toWide(missing)};
     return std::unique_ptr<ModuleLibrary>(new ModuleLibrary(file, handle, true));
 }
 

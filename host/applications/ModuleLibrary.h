@@ -6,6 +6,8 @@
 
 #include <tessel/tsrx.h>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 // What stands at the path of an application.
@@ -14,18 +16,17 @@ struct ModuleFile
     std::string path;    // full, without a separator at its end
     std::string program; // the file that is mapped: the path itself, or the program inside the bundle
     bool isBundle = false;
-    std::wstring whyNoProgram; // the end of a sentence, where a bundle stands at the path that cannot be used
 };
 
-// What stands at a full path.
-ModuleFile moduleFileAt(std::string path);
+// What stands at a full path; why a bundle there cannot be used is the end of a sentence.
+Result<ModuleFile> moduleFileAt(std::string path);
 
 class ModuleLibrary
 {
 public:
-    // Maps the file, which has been checked. Null when the system refuses: `whyNot` is then the end of a
-    // sentence, in the system's own words.
-    static std::unique_ptr<ModuleLibrary> open(const ModuleFile& file, bool resolveNow, std::wstring& whyNot);
+    // Maps the file, which has been checked. Why the system refuses is the end of a sentence, in its own
+    // words.
+    static Result<std::unique_ptr<ModuleLibrary>> open(const ModuleFile& file, bool resolveNow);
 
     // Leaves the library mapped.
     ~ModuleLibrary() = default;
@@ -40,8 +41,7 @@ public:
 
 private:
     ModuleLibrary(ModuleFile file, void* handle, bool byPlatform);
-    static std::unique_ptr<ModuleLibrary> openBundle(const ModuleFile& file, bool resolveNow,
-                                                     std::wstring& whyNot);
+    static Result<std::unique_ptr<ModuleLibrary>> openBundle(const ModuleFile& file, bool resolveNow);
 
     ModuleFile mFile;
     void* mHandle;

@@ -4,14 +4,15 @@
 #include <string>
 #include <string_view>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 // Whether the path names a bundle: it ends in ".bundle", in any case of letters.
 bool isBundlePath(std::string_view path);
 
-// The file with the bundle's code. Empty when the folder is no bundle of this platform: `whyNot` is then the
-// end of a sentence, or empty if nothing stands at the path.
-std::string programOfBundle(const std::string& folder, std::wstring& whyNot);
+// The file with the bundle's code; why there is none is the end of a sentence.
+Result<std::string> programOfBundle(const std::string& folder);
 
 // Maps the bundle's code and makes its classes known. A bundle that is loaded already stays so. False when
 // the platform refuses.

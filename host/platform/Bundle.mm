@@ -4,6 +4,7 @@
 #include <wincompat/winstring.h>
 
 #include <algorithm>
+#include <cerrno>
 #include <filesystem>
 
 #include "host/platform/AutoreleasePool.h"
@@ -35,24 +36,22 @@ bool isBundlePath(std::string_view path)
     return std::ranges::equal(path.substr(path.size() - kBundleSuffix.size()), kBundleSuffix, {}, lowerAscii);
 }
 
-std::string programOfBundle(const std::string& folder, std::wstring& whyNot)
+Result<std::string> programOfBundle(const std::string& folder)
 {
     const AutoreleasePool pool;
     std::error_code failed;
     if (!std::filesystem::exists(folder, failed))
-        return {};
+        return Failure{toWide(std::generic_category().message(failed ? failed.value() : ENOENT))};
     NSBundle* bundle = bundleAt(folder);
     if (bundle &&
         !std::filesystem::equivalent([[bundle bundlePath] fileSystemRepresentation], folder, failed))
-    {
         // GNUstep answers with the bundle that it has opened before under the same identifier.
-        whyNot = L"the bundle \"" + NSStringToWstring([bundle bundlePath]) + L"\" has the same identifier";
-        return {};
-    }
+        return Failure{L"the bundle \"" + NSStringToWstring([bundle bundlePath]) +
+                       L"\" has the same identifier"};
     NSString* program = [bundle executablePath];
     if (!program)
-        whyNot = L"the bundle holds no program for this system";
-    return program ? [program fileSystemRepresentation] : "";
+        return Failure{L"the bundle holds no program for this system"};
+    return std::string([program fileSystemRepresentation]);
 }
 
 bool loadBundle(const std::string& folder)

@@ -2,13 +2,13 @@
 #pragma once
 
 #include <functional>
-#include <optional>
-#include <string>
+
+#include "host/text/Result.h"
 
 namespace tessel
 {
-// What the exception says of itself, or nothing when the call returned. C++ exceptions pass through.
+// Whether the call returned; otherwise what the exception says of itself. C++ exceptions pass through.
 // There is no autorelease pool of the call's own, which would cost as much as a tenth of loading an
 // application: what it leaves goes with the command that it belongs to.
-std::optional<std::wstring> catchObjectiveC(const std::function<void()>& call);
+Result<> catchObjectiveC(const std::function<void()>& call);
 } // namespace tessel

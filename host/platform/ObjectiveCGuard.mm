@@ -9,17 +9,17 @@ extern "C" id tesselCatch(void (*call)(const void* context), const void* context
 
 namespace tessel
 {
-std::optional<std::wstring> catchObjectiveC(const std::function<void()>& call)
+Result<> catchObjectiveC(const std::function<void()>& call)
 {
     const id thrown = tesselCatch(
         [](const void* context) { (*static_cast<const std::function<void()>*>(context))(); }, &call);
     if (!thrown)
-        return std::nullopt;
+        return {};
     const AutoreleasePool pool;
     NSString* text = [thrown isKindOfClass:[NSException class]]
                          ? [NSString stringWithFormat:@"%@: %@", [(NSException*)thrown name],
                                                       [(NSException*)thrown reason]]
                          : [thrown description];
-    return toWide([text UTF8String]);
+    return Failure{toWide([text UTF8String])};
 }
 } // namespace tessel

@@ -18,15 +18,15 @@ RegularFile::RegularFile(const std::string& path)
     struct stat status = {};
     if (mDescriptor < 0 || fstat(mDescriptor, &status) != 0)
     {
-        mMissing = errno == ENOENT || errno == ENOTDIR;
-        refuse(toWide(std::strerror(errno)));
+        const bool isMissing = errno == ENOENT || errno == ENOTDIR;
+        refuse({toWide(std::strerror(errno)), isMissing ? kMissing : Failure::kUnspecified});
     }
     else if (S_ISDIR(status.st_mode))
-        refuse(L"it is a folder, not a file");
+        refuse({L"it is a folder, not a file"});
     else if (!S_ISREG(status.st_mode))
-        refuse(L"it is not a regular file");
+        refuse({L"it is not a regular file"});
     else if (status.st_size == 0)
-        refuse(L"the file is empty");
+        refuse({L"the file is empty"});
     mIdentity = {status.st_dev, status.st_ino};
     mSize = static_cast<std::uint64_t>(status.st_size);
 }
@@ -37,9 +37,9 @@ RegularFile::~RegularFile()
         close(mDescriptor);
 }
 
-void RegularFile::refuse(std::wstring whyNot)
+void RegularFile::refuse(Failure failure)
 {
-    mWhyNot = std::move(whyNot);
+    mOpened = std::move(failure);
     if (mDescriptor >= 0)
         close(mDescriptor);
     mDescriptor = -1;

@@ -10,6 +10,8 @@
 
 #include <sys/types.h>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 // Which file it is, however its path is spelled and through whatever links it was reached.
@@ -30,11 +32,11 @@ public:
     RegularFile(const RegularFile&) = delete;
     RegularFile& operator=(const RegularFile&) = delete;
 
-    bool isOpen() const { return mDescriptor >= 0; }
-    // Whether nothing stands at the path at all.
-    bool isMissing() const { return mMissing; }
-    // Why it is not open, as the end of a sentence; empty when it is.
-    const std::wstring& whyNot() const { return mWhyNot; }
+    // The code of a failure when nothing stands at the path at all.
+    static constexpr int kMissing = 2;
+
+    // Whether the file is open; why not is the end of a sentence.
+    const Result<>& opened() const { return mOpened; }
 
     const FileIdentity& identity() const { return mIdentity; }
     std::uint64_t size() const { return mSize; }
@@ -46,12 +48,11 @@ private:
     // Everything that tells whether a library can be mapped usually stands here, so that one read serves.
     static constexpr std::size_t kHeadSize = 1024;
 
-    void refuse(std::wstring whyNot);
+    void refuse(Failure failure);
     void readHead() const;
 
     int mDescriptor = -1;
-    bool mMissing = false;
-    std::wstring mWhyNot;
+    Result<> mOpened;
     FileIdentity mIdentity;
     std::uint64_t mSize = 0;
     mutable std::array<unsigned char, kHeadSize> mHead;

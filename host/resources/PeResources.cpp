@@ -1,5 +1,6 @@
 #include "host/resources/PeResources.h"
 
+#include <optional>
 #include <utility>
 
 #include "host/resources/ByteReader.h"
@@ -221,7 +222,7 @@ std::wstring decode(const ByteReader& units)
 }
 } // namespace
 
-std::optional<PeResources> PeResources::read(std::vector<std::uint8_t> bytes, std::wstring& whyNot)
+Result<PeResources> PeResources::read(std::vector<std::uint8_t> bytes)
 try
 {
     const ByteReader file(bytes, kCutShort);
@@ -236,8 +237,7 @@ try
 }
 catch (const DamagedFile& damage)
 {
-    whyNot = damage.why;
-    return std::nullopt;
+    return Failure{damage.why};
 }
 
 std::wstring PeResources::string(unsigned id) const

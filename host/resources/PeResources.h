@@ -8,17 +8,18 @@
 #include <cstddef>
 #include <cstdint>
 #include <map>
-#include <optional>
 #include <string>
 #include <vector>
+
+#include "host/text/Result.h"
 
 namespace tessel
 {
 class PeResources
 {
 public:
-    // None when the bytes are no sound file with resources: `whyNot` is then the end of a sentence.
-    static std::optional<PeResources> read(std::vector<std::uint8_t> bytes, std::wstring& whyNot);
+    // Why the bytes are no sound file with resources is the end of a sentence.
+    static Result<PeResources> read(std::vector<std::uint8_t> bytes);
 
     // The text of that id; empty when there is none. Where the file has it in several languages, the first in
     // the file. Halves of a character outside the basic plane become one character, a lone half U+FFFD.

@@ -6,11 +6,15 @@
 
 #include "host/Services.h"
 #include "host/resources/ResourceModules.h"
+#include "host/text/CommandLine.h"
 
 HMODULE LoadLibrary(const wchar_t* name)
 {
     auto* modules = tessel::services().resources;
-    return modules ? modules->open(name) : nullptr;
+    if (!modules)
+        return nullptr;
+    const auto module = modules->open(name);
+    return tessel::services().commandLine->tell(module) ? *module : nullptr;
 }
 
 int FreeLibrary(HMODULE module)

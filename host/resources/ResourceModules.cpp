@@ -7,7 +7,6 @@
 #include "host/Services.h"
 #include "host/commands/CallingApplication.h"
 #include "host/platform/Bundle.h"
-#include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -48,9 +47,9 @@ std::wstring joined(const std::vector<std::wstring>& places)
     return result;
 }
 
-void say(const std::wstring& name, const std::wstring& whyNot)
+Failure notOpened(const std::wstring& name, const std::wstring& reason)
 {
-    services().commandLine->say(L"The resource module \"" + name + L"\" cannot be opened: " + whyNot + L".");
+    return {L"The resource module \"" + name + L"\" cannot be opened: " + reason + L"."};
 }
 } // namespace
 
@@ -75,53 +74,45 @@ std::vector<std::wstring> ResourceModules::placesOf(const std::wstring& name) co
     return places;
 }
 
-HMODULE ResourceModules::open(const wchar_t* name)
+Result<HMODULE> ResourceModules::open(const wchar_t* name)
 {
     const std::wstring plainName = withOneKindOfSeparator(name);
     if (plainName.empty())
-    {
-        say(plainName, L"it has no name");
-        return nullptr;
-    }
+        return notOpened(plainName, L"it has no name");
     const auto places = placesOf(plainName);
     for (const std::wstring& place : places)
     {
         const RegularFile file(toUtf8(place));
-        if (file.isMissing())
+        if (file.opened().code() == RegularFile::kMissing)
             continue;
-        std::wstring whyNot;
-        const HMODULE module = openFile(file, whyNot);
-        if (!module)
-            say(place, whyNot);
-        return module;
+        const auto module = openFile(file);
+        return module ? module : notOpened(place, module.sentence());
     }
-    say(plainName, L"there is no " + joined(places));
-    return nullptr;
+    return notOpened(plainName, L"there is no " + joined(places));
 }
 
-HMODULE ResourceModules::openFile(const RegularFile& file, std::wstring& whyNot)
+// What this says of a failure is the end of a sentence.
+Result<HMODULE> ResourceModules::openFile(const RegularFile& file)
 {
     const auto known = std::ranges::find_if(mEntries, [&](const auto& entry)
                                             { return entry.second.identity == file.identity(); });
-    if (file.isOpen() && known != mEntries.end())
+    if (file.opened() && known != mEntries.end())
     {
         ++known->second.references;
         return known->first;
     }
-    whyNot = file.size() > kLargestFile ? L"the file is too large for a resource module" : file.whyNot();
-    if (!whyNot.empty())
-        return nullptr;
+    if (file.size() > kLargestFile)
+        return Failure{L"the file is too large for a resource module"};
+    if (!file.opened())
+        return file.opened().failure();
     std::vector<std::uint8_t> bytes(file.size());
     if (!file.read(0, bytes.data(), bytes.size()))
-    {
-        whyNot = L"the file cannot be read";
-        return nullptr;
-    }
-    auto resources = PeResources::read(std::move(bytes), whyNot);
+        return Failure{L"the file cannot be read"};
+    auto resources = PeResources::read(std::move(bytes));
     if (!resources)
-        return nullptr;
+        return resources.failure();
     const auto handle = reinterpret_cast<HMODULE>(++mLastHandle);
-    mEntries.emplace(handle, Entry{file.identity(), std::move(*resources), 1});
+    mEntries.emplace(handle, Entry{file.identity(), *std::move(resources), 1});
     return handle;
 }
 

@@ -22,8 +22,8 @@ public:
 
     // Opens a module by its full path, or by a name looked for first in the resources of the application that
     // is being called (a bundle's; a plain library has its own folder) and then in the host's. A file that is
-    // open already is opened once more under the same handle. Null after one sentence on the command line.
-    HMODULE open(const wchar_t* name);
+    // open already is opened once more under the same handle.
+    Result<HMODULE> open(const wchar_t* name);
 
     // Undoes one `open`. False for a handle that is not open.
     bool close(HMODULE module);
@@ -43,7 +43,7 @@ private:
     };
 
     std::vector<std::wstring> placesOf(const std::wstring& name) const;
-    HMODULE openFile(const RegularFile& file, std::wstring& whyNot);
+    Result<HMODULE> openFile(const RegularFile& file);
 
     std::wstring mHostFolder;
     std::map<HMODULE, Entry> mEntries;

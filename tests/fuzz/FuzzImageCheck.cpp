@@ -28,7 +28,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
         std::memcpy(buffer, data + offset, wanted);
         return true;
     };
-    if (!tessel::whyNotMappable(kFileSize, readAt).empty())
+    if (!tessel::checkMappable(kFileSize, readAt))
         return 0;
     Elf64_Ehdr header;
     if (!readAt(0, &header, sizeof header))

@@ -6,9 +6,8 @@
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size)
 {
-    std::wstring whyNot;
-    const auto resources = tessel::PeResources::read({data, data + size}, whyNot);
-    if (resources.has_value() != whyNot.empty())
+    const auto resources = tessel::PeResources::read({data, data + size});
+    if (static_cast<bool>(resources) != resources.sentence().empty())
         std::abort();
     for (unsigned id = 0; resources && id < 0x10010; id += 5) // reaches each place in the blocks of sixteen
         if (resources->string(id).size() > size)

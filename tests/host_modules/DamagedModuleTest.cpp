@@ -27,16 +27,17 @@ std::string goodModule()
     return contentOf(std::filesystem::path(FIXTURE_MODULES) / "Good.zmb");
 }
 
-std::wstring_view check(std::string_view content)
+std::wstring check(std::string_view content)
 {
-    return tessel::whyNotMappable(content.size(),
-                                  [&](std::uint64_t offset, void* buffer, std::size_t size)
-                                  {
-                                      if (size > content.size() || offset > content.size() - size)
-                                          return false;
-                                      std::memcpy(buffer, content.data() + offset, size);
-                                      return true;
-                                  });
+    return tessel::checkMappable(content.size(),
+                                 [&](std::uint64_t offset, void* buffer, std::size_t size)
+                                 {
+                                     if (size > content.size() || offset > content.size() - size)
+                                         return false;
+                                     std::memcpy(buffer, content.data() + offset, size);
+                                     return true;
+                                 })
+        .sentence();
 }
 
 template <class Field>
@@ -80,7 +81,7 @@ TEST(ImageCheck, FindsNothingWrongWithTheSystemsOwnLibraries)
         {
             return file.read(offset, buffer, size);
         };
-        const auto whyNot = tessel::whyNotMappable(file.size(), read);
+        const std::wstring whyNot = tessel::checkMappable(file.size(), read).sentence();
         if (whyNot == kRunsToo || whyNot == kScript)
             continue;
         EXPECT_EQ(whyNot, L"") << entry.path();

@@ -27,17 +27,16 @@ Bytes texts()
     return contentOf(TEXTS_DLL);
 }
 
-std::optional<PeResources> read(Bytes bytes)
+tessel::Result<PeResources> read(Bytes bytes)
 {
-    std::wstring whyNot;
-    return PeResources::read(std::move(bytes), whyNot);
+    return PeResources::read(std::move(bytes));
 }
 
 std::wstring whyNot(Bytes bytes)
 {
-    std::wstring whyNot;
-    EXPECT_FALSE(PeResources::read(std::move(bytes), whyNot).has_value());
-    return whyNot;
+    const auto resources = read(std::move(bytes));
+    EXPECT_FALSE(resources);
+    return resources.sentence();
 }
 
 // Every text of the file by an independent reader: a block holds sixteen UTF-16 texts behind their lengths.
@@ -94,7 +93,7 @@ std::size_t charactersIn(const PeResources& resources)
 TEST(PeResources, GivesEveryTextAsItWasWritten)
 {
     const auto resources = read(texts());
-    ASSERT_TRUE(resources.has_value());
+    ASSERT_TRUE(resources);
     EXPECT_EQ(resources->string(1), L"Load/Unload Applications");
     EXPECT_EQ(resources->string(2), L"%s \"quoted\" 100%% \\ tab\there");
     EXPECT_EQ(resources->string(15), L"Größe, çà, Ελλάδα");
@@ -107,7 +106,7 @@ TEST(PeResources, GivesEveryTextAsItWasWritten)
 TEST(PeResources, GivesNothingForIdsThatAreNotThere)
 {
     const auto resources = read(texts());
-    ASSERT_TRUE(resources.has_value());
+    ASSERT_TRUE(resources);
     for (const unsigned id : {0U, 3U, 17U, 50U, 52U, 9999U, 65534U, 65536U, 65537U, 0xffffffffU})
         EXPECT_EQ(resources->string(id), L"") << id;
 }
@@ -115,7 +114,7 @@ TEST(PeResources, GivesNothingForIdsThatAreNotThere)
 TEST(PeResources, AgreesWithAnotherReaderAboutEveryText)
 {
     const auto resources = read(texts());
-    ASSERT_TRUE(resources.has_value());
+    ASSERT_TRUE(resources);
     const auto others = textsByTheOtherReader(texts());
     EXPECT_GE(others.size(), 7U);
     for (unsigned id = 0; id < kIdsBehindTheLast; ++id)
@@ -136,7 +135,7 @@ TEST(PeResources, SaysInWordsWhatIsWrong)
 TEST(PeResources, TakesAFileWithResourcesButWithoutTexts)
 {
     const auto resources = read(contentOf(NO_TEXTS_DLL));
-    ASSERT_TRUE(resources.has_value());
+    ASSERT_TRUE(resources);
     EXPECT_EQ(charactersIn(*resources), 0U);
 }
 
@@ -159,13 +158,12 @@ TEST(PeResources, RefusesOrAnswersWhateverIsChangedInAFile)
         Bytes damaged = whole;
         for (std::size_t changes = 1 + random() % 8; changes > 0; --changes)
             damaged[random() % damaged.size()] = static_cast<std::uint8_t>(random());
-        std::wstring why;
-        const auto resources = PeResources::read(std::move(damaged), why);
+        const auto resources = read(std::move(damaged));
         if (resources)
             EXPECT_LE(charactersIn(*resources), whole.size() * 16);
         else
         {
-            EXPECT_NE(why, L"");
+            EXPECT_NE(resources.sentence(), L"");
             ++refused;
         }
     }
@@ -181,9 +179,8 @@ TEST(PeResources, RefusesOrAnswersForEveryValueOfEveryHeaderByte)
         {
             Bytes damaged = whole;
             damaged[offset] = static_cast<std::uint8_t>(value);
-            std::wstring why;
-            const auto resources = PeResources::read(std::move(damaged), why);
-            ASSERT_NE(resources.has_value(), !why.empty()) << offset;
+            const auto resources = read(std::move(damaged));
+            ASSERT_EQ(static_cast<bool>(resources), resources.sentence().empty()) << offset;
             ASSERT_LE(resources ? resources->string(1).size() : 0, whole.size()) << offset;
         }
 }

@@ -13,8 +13,7 @@ constexpr unsigned kLargestId = 65535;
 std::map<unsigned, std::wstring> readResourceTexts(const std::filesystem::path& module)
 {
     const std::string content = readFile(module);
-    std::wstring whyNot;
-    const auto resources = tessel::PeResources::read({content.begin(), content.end()}, whyNot);
+    const auto resources = tessel::PeResources::read({content.begin(), content.end()});
     if (!resources)
         throw std::runtime_error("not a resource module: " + module.string());
     std::map<unsigned, std::wstring> texts;

@@ -22,13 +22,17 @@ using Segment = ElfW(Phdr);
 constexpr std::size_t kMostSegments = 128; // linkers write about a dozen
 constexpr std::uint64_t kPage = 4096;      // the smallest page that segments are laid out for
 
-constexpr std::wstring_view kSound;
 constexpr std::wstring_view kNoLibrary = L"it is not a shared library";
 constexpr std::wstring_view kProgram = L"it is a program, not a shared library";
 constexpr std::wstring_view kObjectFile = L"it is an object file, not a shared library";
 constexpr std::wstring_view kOtherMachine = L"it is built for another kind of processor";
 constexpr std::wstring_view kCutShort = L"the file is cut short";
 constexpr std::wstring_view kDamaged = L"its program headers are damaged";
+
+Failure refused(std::wstring_view reason)
+{
+    return {std::wstring(reason)};
+}
 
 bool fits(std::uint64_t offset, std::uint64_t size, std::uint64_t whole)
 {
@@ -45,46 +49,47 @@ std::uint64_t pageEnd(std::uint64_t address)
     return pageStart(address + kPage - 1);
 }
 
-std::wstring_view kindFault(const Header& header)
+Result<> checkKind(const Header& header)
 {
     if (std::memcmp(header.e_ident, ELFMAG, SELFMAG) != 0)
-        return kNoLibrary;
+        return refused(kNoLibrary);
     const bool sameMachine = header.e_ident[EI_CLASS] == __ehdr_start.e_ident[EI_CLASS] &&
                              header.e_ident[EI_DATA] == __ehdr_start.e_ident[EI_DATA] &&
                              header.e_machine == __ehdr_start.e_machine;
     if (!sameMachine)
-        return kOtherMachine;
+        return refused(kOtherMachine);
     if (header.e_type == ET_EXEC)
-        return kProgram;
+        return refused(kProgram);
     if (header.e_type == ET_REL)
-        return kObjectFile;
-    return header.e_type == ET_DYN ? kSound : kNoLibrary;
+        return refused(kObjectFile);
+    return header.e_type == ET_DYN ? Result<>() : refused(kNoLibrary);
 }
 
-std::wstring_view tablesFault(const Header& header, std::uint64_t fileSize)
+Result<> checkTables(const Header& header, std::uint64_t fileSize)
 {
     if (header.e_phentsize != sizeof(Segment) || header.e_phnum == 0 || header.e_phnum > kMostSegments)
-        return kDamaged;
+        return refused(kDamaged);
     if (!fits(header.e_phoff, std::uint64_t{header.e_phnum} * sizeof(Segment), fileSize))
-        return kCutShort;
+        return refused(kCutShort);
     // Sections are not mapped, but their table is the last thing in the file: where it is missing, the file
     // has lost its end.
     if (!fits(header.e_shoff, std::uint64_t{header.e_shnum} * header.e_shentsize, fileSize))
-        return kCutShort;
-    return kSound;
+        return refused(kCutShort);
+    return {};
 }
 
-std::wstring_view loadedSegmentFault(const Segment& segment, std::uint64_t fileSize)
+Result<> checkLoadedSegment(const Segment& segment, std::uint64_t fileSize)
 {
     if (!fits(segment.p_offset, segment.p_filesz, fileSize))
-        return kCutShort;
+        return refused(kCutShort);
     const bool alignmentIsPower = (segment.p_align & (segment.p_align - 1)) == 0;
     const bool samePlaceInPage = (segment.p_vaddr - segment.p_offset) % kPage == 0;
     const bool endsInAddressSpace = segment.p_vaddr + segment.p_memsz + kPage > segment.p_vaddr;
     // Only what can be written has a part that the file does not hold.
     const bool sizesAgree = (segment.p_flags & PF_W) != 0 ? segment.p_filesz <= segment.p_memsz
                                                           : segment.p_filesz == segment.p_memsz;
-    return alignmentIsPower && samePlaceInPage && endsInAddressSpace && sizesAgree ? kSound : kDamaged;
+    return alignmentIsPower && samePlaceInPage && endsInAddressSpace && sizesAgree ? Result<>()
+                                                                                   : refused(kDamaged);
 }
 
 // The system maps each segment over what stands at its addresses, so they have to follow one another, on
@@ -95,7 +100,7 @@ bool follows(const Segment& segment, const Segment& previous)
            segment.p_offset >= previous.p_offset + previous.p_filesz;
 }
 
-std::wstring_view loadedSegmentsFault(std::span<const Segment> segments, std::uint64_t fileSize)
+Result<> checkLoadedSegments(std::span<const Segment> segments, std::uint64_t fileSize)
 {
     const Segment* previous = nullptr;
     bool hasCode = false;
@@ -103,14 +108,14 @@ std::wstring_view loadedSegmentsFault(std::span<const Segment> segments, std::ui
     {
         if (segment.p_type != PT_LOAD)
             continue;
-        if (const auto fault = loadedSegmentFault(segment, fileSize); !fault.empty())
-            return fault;
+        if (auto checked = checkLoadedSegment(segment, fileSize); !checked)
+            return checked;
         if (previous && !follows(segment, *previous))
-            return kDamaged;
+            return refused(kDamaged);
         previous = &segment;
         hasCode |= (segment.p_flags & PF_X) != 0;
     }
-    return hasCode ? kSound : kDamaged;
+    return hasCode ? Result<>() : refused(kDamaged);
 }
 
 bool holds(const Segment& loaded, const Segment& part)
@@ -147,43 +152,43 @@ bool isSoundPart(const Segment& part, std::span<const Segment> segments)
     return loaded != segments.end() && liesIn(part, *loaded);
 }
 
-std::wstring_view segmentsFault(std::span<const Segment> segments, std::uint64_t fileSize)
+Result<> checkSegments(std::span<const Segment> segments, std::uint64_t fileSize)
 {
     const auto count = [&](std::uint32_t type)
     {
         return std::ranges::count(segments, type, &Segment::p_type);
     };
     if (count(PT_INTERP) > 0)
-        return kProgram;
-    if (const auto fault = loadedSegmentsFault(segments, fileSize); !fault.empty())
-        return fault;
+        return refused(kProgram);
+    if (auto checked = checkLoadedSegments(segments, fileSize); !checked)
+        return checked;
     const bool partsAreSound =
         std::ranges::all_of(segments, [&](const Segment& part) { return isSoundPart(part, segments); });
-    return partsAreSound && count(PT_DYNAMIC) == 1 ? kSound : kDamaged;
+    return partsAreSound && count(PT_DYNAMIC) == 1 ? Result<>() : refused(kDamaged);
 }
 
 // A file too short for a header may still show what it was meant to be.
-std::wstring_view shortFileFault(std::uint64_t fileSize, const ReadAt& readAt)
+Result<> checkShortFile(std::uint64_t fileSize, const ReadAt& readAt)
 {
     std::array<unsigned char, SELFMAG> start = {};
     const bool wasElf = readAt(0, start.data(), std::min<std::uint64_t>(fileSize, start.size())) &&
                         std::memcmp(start.data(), ELFMAG, start.size()) == 0;
-    return wasElf ? kCutShort : kNoLibrary;
+    return refused(wasElf ? kCutShort : kNoLibrary);
 }
 } // namespace
 
-std::wstring_view whyNotMappable(std::uint64_t fileSize, const ReadAt& readAt)
+Result<> checkMappable(std::uint64_t fileSize, const ReadAt& readAt)
 {
     Header header = {};
     if (!readAt(0, &header, sizeof header))
-        return shortFileFault(fileSize, readAt);
-    if (const auto fault = kindFault(header); !fault.empty())
-        return fault;
-    if (const auto fault = tablesFault(header, fileSize); !fault.empty())
-        return fault;
+        return checkShortFile(fileSize, readAt);
+    if (auto checked = checkKind(header); !checked)
+        return checked;
+    if (auto checked = checkTables(header, fileSize); !checked)
+        return checked;
     std::array<Segment, kMostSegments> table;
     if (!readAt(header.e_phoff, table.data(), header.e_phnum * sizeof(Segment)))
-        return kCutShort;
-    return segmentsFault(std::span(table).first(header.e_phnum), fileSize);
+        return refused(kCutShort);
+    return checkSegments(std::span(table).first(header.e_phnum), fileSize);
 }
 } // namespace tessel

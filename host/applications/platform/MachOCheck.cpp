@@ -13,63 +13,68 @@ namespace
 {
 constexpr std::uint32_t kMostArchitectures = 32;
 
-constexpr std::wstring_view kSound;
 constexpr std::wstring_view kNoLibrary = L"it is not a shared library";
 constexpr std::wstring_view kProgram = L"it is a program, not a shared library";
 constexpr std::wstring_view kOtherMachine = L"it is built for another kind of processor";
 constexpr std::wstring_view kCutShort = L"the file is cut short";
+
+Failure refused(std::wstring_view reason)
+{
+    return {std::wstring(reason)};
+}
 
 cpu_type_t ownProcessor()
 {
     return _dyld_get_image_header(0)->cputype;
 }
 
-std::wstring_view thinFault(std::uint64_t start, std::uint64_t size, const ReadAt& readAt)
+Result<> checkThin(std::uint64_t start, std::uint64_t size, const ReadAt& readAt)
 {
     mach_header_64 header = {};
     if (size < sizeof header || !readAt(start, &header, sizeof header))
-        return kCutShort;
+        return refused(kCutShort);
     if (header.magic != MH_MAGIC_64)
-        return kNoLibrary;
+        return refused(kNoLibrary);
     if (header.cputype != ownProcessor())
-        return kOtherMachine;
+        return refused(kOtherMachine);
     if (header.filetype == MH_EXECUTE)
-        return kProgram;
+        return refused(kProgram);
     if (header.filetype != MH_BUNDLE && header.filetype != MH_DYLIB)
-        return kNoLibrary;
-    return header.sizeofcmds <= size - sizeof header ? kSound : kCutShort;
+        return refused(kNoLibrary);
+    return header.sizeofcmds <= size - sizeof header ? Result<>() : refused(kCutShort);
 }
 
 // A universal file: one image per processor, big-endian headers in front.
-std::wstring_view universalFault(std::uint64_t fileSize, const ReadAt& readAt)
+Result<> checkUniversal(std::uint64_t fileSize, const ReadAt& readAt)
 {
     fat_header header = {};
     if (!readAt(0, &header, sizeof header))
-        return kCutShort;
+        return refused(kCutShort);
     const std::uint32_t count = OSSwapBigToHostInt32(header.nfat_arch);
     if (count > kMostArchitectures)
-        return kNoLibrary;
+        return refused(kNoLibrary);
     for (std::uint32_t i = 0; i < count; ++i)
     {
         fat_arch image = {};
         if (!readAt(sizeof header + i * sizeof image, &image, sizeof image))
-            return kCutShort;
+            return refused(kCutShort);
         if (static_cast<cpu_type_t>(OSSwapBigToHostInt32(static_cast<std::uint32_t>(image.cputype))) !=
             ownProcessor())
             continue;
         const std::uint64_t start = OSSwapBigToHostInt32(image.offset);
         const std::uint64_t size = OSSwapBigToHostInt32(image.size);
-        return size <= fileSize && start <= fileSize - size ? thinFault(start, size, readAt) : kCutShort;
+        return size <= fileSize && start <= fileSize - size ? checkThin(start, size, readAt)
+                                                            : refused(kCutShort);
     }
-    return kOtherMachine;
+    return refused(kOtherMachine);
 }
 } // namespace
 
-std::wstring_view whyNotMappable(std::uint64_t fileSize, const ReadAt& readAt)
+Result<> checkMappable(std::uint64_t fileSize, const ReadAt& readAt)
 {
     std::uint32_t magic = 0;
     if (!readAt(0, &magic, sizeof magic))
-        return kNoLibrary;
-    return magic == FAT_CIGAM ? universalFault(fileSize, readAt) : thinFault(0, fileSize, readAt);
+        return refused(kNoLibrary);
+    return magic == FAT_CIGAM ? checkUniversal(fileSize, readAt) : checkThin(0, fileSize, readAt);
 }
 } // namespace tessel
