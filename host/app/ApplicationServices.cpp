@@ -6,7 +6,6 @@
 #include <string_view>
 
 #include "host/Services.h"
-#include "host/files/RemoteFiles.h"
 #include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
 
@@ -33,27 +32,27 @@ bool ApplicationServices::isUrl(const wchar_t* text) const
                        });
 }
 
+Result<RemoteFiles::Copy> ApplicationServices::fetch(const std::wstring& url, std::size_t capacity,
+                                                     bool ignoreCache) const
+{
+    if (!isUrl(url.c_str()))
+        return Failure{L"\"" + url + L"\" is no http or https address.", TS_FETCH_FAILED};
+    if (capacity == 0)
+        return Failure{url + L" could not be fetched: there is no room for the path of its local copy.",
+                       TS_FETCH_FAILED};
+    return services().remote->fetch(url, capacity - 1, ignoreCache);
+}
+
 int ApplicationServices::fetchRemoteFile(const wchar_t* url, wchar_t* localPath, std::size_t capacity,
                                          bool ignoreCache)
 {
     if (!services().remote)
         return TS_FETCH_FAILED;
-    if (!isUrl(url))
-    {
-        services().commandLine->say(L"\"" + std::wstring(url ? url : L"") +
-                                    L"\" is no http or https address.");
-        return TS_FETCH_FAILED;
-    }
-    if (!localPath || capacity == 0)
-    {
-        services().commandLine->say(
-            std::wstring(url) + L" could not be fetched: there is no room for the path of its local copy.");
-        return TS_FETCH_FAILED;
-    }
-    const RemoteFiles::Copy copy = services().remote->fetch(url, capacity - 1, ignoreCache);
-    if (copy.status != TS_FETCH_FAILED)
-        std::wmemcpy(localPath, copy.path.c_str(), copy.path.size() + 1);
-    return copy.status;
+    const auto copy = fetch(url ? url : L"", localPath ? capacity : 0, ignoreCache);
+    if (!services().commandLine->tell(copy))
+        return copy.code();
+    std::wmemcpy(localPath, copy->path.c_str(), copy->path.size() + 1);
+    return copy->status;
 }
 } // namespace tessel
 

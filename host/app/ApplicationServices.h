@@ -6,6 +6,8 @@
 
 #include <tessel/tshostservices.h>
 
+#include "host/files/RemoteFiles.h"
+
 namespace tessel
 {
 class ApplicationServices : public TsDbHostApplicationServices
@@ -21,6 +23,8 @@ public:
                         bool ignoreCache) override;
 
 private:
+    Result<RemoteFiles::Copy> fetch(const std::wstring& url, std::size_t capacity, bool ignoreCache) const;
+
     std::wstring mProfileFolder;
 };
 } // namespace tessel

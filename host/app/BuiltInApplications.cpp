@@ -56,8 +56,8 @@ std::wstring quoted(const std::wstring& text)
 
 bool loadLisp(const std::wstring& path)
 {
-    const auto outcome = services().lisp->evaluate(L"(load " + quoted(path) + L")");
-    return outcome.ok ? succeed(path + L" is loaded.") : fail(outcome.text);
+    const auto value = services().lisp->evaluate(L"(load " + quoted(path) + L")");
+    return value ? succeed(path + L" is loaded.") : fail(value.sentence());
 }
 
 bool load(const CommandStack::Arguments& arguments)

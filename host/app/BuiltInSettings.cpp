@@ -41,8 +41,8 @@ bool setVariable(const CommandStack::Arguments& arguments)
         return showVariable(arguments.front());
     if (arguments.size() > 2)
         return failWithUsage(L"SETVAR");
-    const std::wstring whyNot = services().variables->set(arguments[0], arguments[1]);
-    return whyNot.empty() || fail(whyNot);
+    const auto done = services().variables->set(arguments[0], arguments[1]);
+    return done || fail(done.sentence());
 }
 
 bool profile(const CommandStack::Arguments& arguments)

@@ -165,10 +165,10 @@ bool Host::run(const std::wstring& input)
     const AutoreleasePool pool;
     if (!isLisp(input))
         return mParts->commands.run(input);
-    const auto outcome = mParts->lisp->evaluate(input);
-    if (!outcome.text.empty())
-        mCommandLine.say(outcome.text);
-    return finishLine() && outcome.ok;
+    const auto value = mParts->lisp->evaluate(input);
+    if (mCommandLine.tell(value) && !value->empty())
+        mCommandLine.say(*value);
+    return finishLine() && value;
 }
 
 bool Host::finishLine()

@@ -8,6 +8,8 @@
 #include <memory>
 #include <system_error>
 
+#include "host/text/Unicode.h"
+
 namespace tessel
 {
 namespace
@@ -60,51 +62,56 @@ void configure(CURL* transfer, const std::string& url, const RemoteFiles::Limits
     curl_easy_setopt(transfer, CURLOPT_WRITEDATA, &sink);
 }
 
-std::string whyNot(CURL* transfer, CURLcode status, const Sink& sink, const char* words)
+Failure notMade(const std::filesystem::path& file, const std::string& reason)
 {
-    if (sink.isFull() || status == CURLE_FILESIZE_EXCEEDED)
-        return "it is larger than " + std::to_string(sink.limit) + " bytes";
-    if (!sink.file)
-        return "the local copy could not be written";
-    if (status != CURLE_OK)
-        return *words ? words : curl_easy_strerror(status);
-    long answer = 0;
-    curl_easy_getinfo(transfer, CURLINFO_RESPONSE_CODE, &answer);
-    return answer == kWholeFile ? "" : "the server answered " + std::to_string(answer);
+    return {toWide("the local copy " + file.string() + " cannot be made: " + reason)};
 }
 
-std::string transferInto(const std::string& url, const std::filesystem::path& part,
-                         const RemoteFiles::Limits& limits)
+Result<> outcomeOf(CURL* transfer, CURLcode status, const Sink& sink, const char* words)
+{
+    if (sink.isFull() || status == CURLE_FILESIZE_EXCEEDED)
+        return Failure{L"it is larger than " + std::to_wstring(sink.limit) + L" bytes"};
+    if (!sink.file)
+        return Failure{L"the local copy could not be written"};
+    if (status != CURLE_OK)
+        return Failure{toWide(*words ? words : curl_easy_strerror(status))};
+    long answer = 0;
+    curl_easy_getinfo(transfer, CURLINFO_RESPONSE_CODE, &answer);
+    if (answer != kWholeFile)
+        return Failure{L"the server answered " + std::to_wstring(answer)};
+    return {};
+}
+
+Result<> transferInto(const std::string& url, const std::filesystem::path& part,
+                      const RemoteFiles::Limits& limits)
 {
     Sink sink{std::ofstream(part, std::ios::binary), 0, limits.bytes};
     if (!sink.file)
-        return "the local copy " + part.string() +
-               " cannot be made: " + std::generic_category().message(errno);
+        return notMade(part, std::generic_category().message(errno));
     const Transfer transfer(curl_easy_init());
     if (!transfer)
-        return "the network library cannot be started";
+        return Failure{L"the network library cannot be started"};
     char words[CURL_ERROR_SIZE] = "";
     configure(transfer.get(), url, limits, sink, words);
     const CURLcode status = curl_easy_perform(transfer.get());
     sink.file.close();
-    return whyNot(transfer.get(), status, sink, words);
+    return outcomeOf(transfer.get(), status, sink, words);
 }
 } // namespace
 
-std::string download(const std::string& url, const std::filesystem::path& file,
-                     const RemoteFiles::Limits& limits)
+Result<> download(const std::string& url, const std::filesystem::path& file,
+                  const RemoteFiles::Limits& limits)
 {
     // Named after the process: another one may be fetching the same file.
     const std::filesystem::path part = file.parent_path() / (".part-" + std::to_string(getpid()));
-    std::string problem = transferInto(url, part, limits);
+    Result<> done = transferInto(url, part, limits);
     std::error_code failed;
-    if (problem.empty())
-    {
+    if (done)
         std::filesystem::rename(part, file, failed);
-        problem = failed ? "the local copy " + file.string() + " cannot be made: " + failed.message() : "";
-    }
-    if (!problem.empty())
+    if (failed)
+        done = notMade(file, failed.message());
+    if (!done)
         std::filesystem::remove(part, failed); // may never have come into being
-    return problem;
+    return done;
 }
 } // namespace tessel

@@ -13,7 +13,6 @@
 
 #include "host/Services.h"
 #include "host/files/Download.h"
-#include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
 
 // The cache holds one folder per URL, named by its hash: the copy under the file's own name, so that its
@@ -82,6 +81,11 @@ std::filesystem::path resolved(const std::filesystem::path& path)
     std::error_code unreachable;
     return std::filesystem::weakly_canonical(path, unreachable);
 }
+
+Failure notFetched(const std::wstring& url, const std::wstring& reason)
+{
+    return {url + L" could not be fetched: " + reason + L".", TS_FETCH_FAILED};
+}
 } // namespace
 
 RemoteFiles::RemoteFiles(std::filesystem::path cacheFolder, Limits limits)
@@ -94,41 +98,39 @@ std::filesystem::path RemoteFiles::copyOf(const std::string& url) const
     return mCacheFolder / std::to_string(hashOf(url)) / fileNameOf(url);
 }
 
-RemoteFiles::Copy RemoteFiles::fetch(const std::wstring& url, std::size_t longestPath, bool ignoreCache)
+Result<RemoteFiles::Copy> RemoteFiles::fetch(const std::wstring& url, std::size_t longestPath,
+                                             bool ignoreCache)
 {
     const std::string address = toUtf8(url);
     const std::filesystem::path copy = copyOf(address);
     const std::wstring path = toWide(copy.string());
     if (path.size() > longestPath)
-        return fail(url, "the path of its local copy has more than " + std::to_string(longestPath) +
-                             " characters");
+        return notFetched(url, L"the path of its local copy has more than " + std::to_wstring(longestPath) +
+                                   L" characters");
     if (!ignoreCache && isFile(copy) && readFile(copy.parent_path() / kOriginFile) == address)
-        return {TS_FROM_CACHE, path};
-    const std::string problem = fetchInto(copy, address);
-    return problem.empty() ? Copy{TS_FETCHED, path} : fail(url, problem);
+        return Copy{TS_FROM_CACHE, path};
+    if (const auto fetched = fetchInto(copy, address); !fetched)
+        return notFetched(url, fetched.sentence());
+    return Copy{TS_FETCHED, path};
 }
 
-std::string RemoteFiles::fetchInto(const std::filesystem::path& copy, const std::string& url) const
+// What this says of a failure is the end of a sentence.
+Result<> RemoteFiles::fetchInto(const std::filesystem::path& copy, const std::string& url) const
 {
     const std::filesystem::path folder = copy.parent_path();
     std::error_code failed;
     const bool isNew = std::filesystem::create_directories(folder, failed);
     if (failed)
-        return "the cache folder " + folder.string() + " cannot be made: " + failed.message();
-    std::string problem = download(url, copy, mLimits);
+        return Failure{
+            toWide("the cache folder " + folder.string() + " cannot be made: " + failed.message())};
+    Result<> fetched = download(url, copy, mLimits);
     // What an earlier fetch wrote stays: a copy without its origin would be lost.
     const bool isKnown = readFile(folder / kOriginFile) == url;
-    if (problem.empty() && !isKnown && !writeFile(folder / kOriginFile, url))
-        problem = "the cache folder " + folder.string() + " cannot be written";
-    if (!problem.empty() && isNew)
+    if (fetched && !isKnown && !writeFile(folder / kOriginFile, url))
+        fetched = Failure{toWide("the cache folder " + folder.string() + " cannot be written")};
+    if (!fetched && isNew)
         std::filesystem::remove_all(folder, failed);
-    return problem;
-}
-
-RemoteFiles::Copy RemoteFiles::fail(const std::wstring& url, const std::string& reason) const
-{
-    services().commandLine->say(url + L" could not be fetched: " + toWide(reason) + L".");
-    return {TS_FETCH_FAILED, {}};
+    return fetched;
 }
 
 bool RemoteFiles::IsRemoteFile(const wchar_t* localPath, wchar_t* url, std::size_t capacity) const

@@ -8,6 +8,8 @@
 #include <filesystem>
 #include <string>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 class RemoteFiles : public CProxyInet
@@ -22,7 +24,7 @@ public:
 
     struct Copy
     {
-        int status;        // TS_FETCHED, TS_FROM_CACHE or TS_FETCH_FAILED
+        int status;        // TS_FETCHED or TS_FROM_CACHE
         std::wstring path; // of the local copy
     };
 
@@ -30,16 +32,14 @@ public:
     RemoteFiles(std::filesystem::path cacheFolder, Limits limits);
 
     // Makes a local copy, or, unless `ignoreCache`, takes an earlier one. A failure, which a path longer than
-    // `longestPath` characters is too, leaves nothing new behind and is told in one sentence on the command
-    // line.
-    Copy fetch(const std::wstring& url, std::size_t longestPath, bool ignoreCache);
+    // `longestPath` characters is too, leaves nothing new behind and has the code TS_FETCH_FAILED.
+    Result<Copy> fetch(const std::wstring& url, std::size_t longestPath, bool ignoreCache);
 
     bool IsRemoteFile(const wchar_t* localPath, wchar_t* url, std::size_t capacity) const override;
 
 private:
     std::filesystem::path copyOf(const std::string& url) const;
-    std::string fetchInto(const std::filesystem::path& copy, const std::string& url) const;
-    Copy fail(const std::wstring& url, const std::string& reason) const;
+    Result<> fetchInto(const std::filesystem::path& copy, const std::string& url) const;
 
     std::filesystem::path mCacheFolder;
     Limits mLimits;

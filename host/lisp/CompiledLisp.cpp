@@ -47,11 +47,6 @@ std::uint32_t checksumOf(std::string_view numbers, std::string_view byteCode)
 {
     return addToChecksum(addToChecksum(0, numbers.substr(0, kChecksumAt)), byteCode);
 }
-
-UnpackedLisp refused(std::wstring fault)
-{
-    return {false, {}, std::move(fault)};
-}
 } // namespace
 
 std::string packCompiledLisp(std::string_view byteCode)
@@ -64,22 +59,22 @@ std::string packCompiledLisp(std::string_view byteCode)
     return std::string(kMagic) + numbers + std::string(byteCode);
 }
 
-UnpackedLisp unpackCompiledLisp(std::string_view bytes)
+Result<std::string_view> unpackCompiledLisp(std::string_view bytes)
 {
     if (!bytes.starts_with(kMagic))
-        return refused(L"is not compiled Lisp");
+        return Failure{L"is not compiled Lisp"};
     bytes.remove_prefix(kMagic.size());
     if (bytes.size() < kNumbersSize)
-        return refused(L"is cut short");
+        return Failure{L"is cut short"};
     const auto numbers = bytes.substr(0, kNumbersSize);
     const auto byteCode = bytes.substr(kNumbersSize);
     if (numberAt(numbers, 0) != kFormatVersion || numberAt(numbers, kLispVersionAt) != kLispVersion)
-        return refused(L"was compiled for another version of Lisp; compile it again");
+        return Failure{L"was compiled for another version of Lisp; compile it again"};
     if (byteCode.size() < numberAt(numbers, kLengthAt))
-        return refused(L"is cut short");
+        return Failure{L"is cut short"};
     if (byteCode.size() > numberAt(numbers, kLengthAt) ||
         checksumOf(numbers, byteCode) != numberAt(numbers, kChecksumAt))
-        return refused(L"is damaged");
-    return {true, byteCode, {}};
+        return Failure{L"is damaged"};
+    return byteCode;
 }
 } // namespace tessel

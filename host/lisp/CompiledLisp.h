@@ -7,16 +7,14 @@
 #include <string>
 #include <string_view>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 // The bytes of a file that holds the byte code.
 std::string packCompiledLisp(std::string_view byteCode);
 
-struct UnpackedLisp
-{
-    bool ok = false;
-    std::string_view byteCode; // within the bytes that were given
-    std::wstring fault;        // why not: the end of a sentence that begins with the file's name
-};
-UnpackedLisp unpackCompiledLisp(std::string_view bytes);
+// The byte code within the bytes that were given; why not is the end of a sentence that begins with the
+// file's name.
+Result<std::string_view> unpackCompiledLisp(std::string_view bytes);
 } // namespace tessel

@@ -30,10 +30,9 @@ constexpr char kAfterword[] = "Tessel loads the compiled file as it loads the so
                               "read or written; 2: wrong\n"
                               "arguments.";
 
-int fail(const std::string& sentence)
+std::wstring quoted(const fs::path& path)
 {
-    std::cerr << "tesselc: " << sentence << '\n';
-    return kNotCompiled;
+    return toWide("\"" + path.string() + "\"");
 }
 
 LispSurroundings terminal()
@@ -51,7 +50,7 @@ LispSurroundings terminal()
 }
 
 // Whole or not at all: a build that is stopped midway must not leave a file that looks finished.
-int writeWhole(const fs::path& output, const std::string& bytes)
+Result<> writeWhole(const fs::path& output, const std::string& bytes)
 {
     const fs::path part = output.string() + ".part";
     errno = 0;
@@ -62,30 +61,28 @@ int writeWhole(const fs::path& output, const std::string& bytes)
     if (!error)
         fs::rename(part, output, error);
     if (!error)
-        return 0;
+        return {};
     std::error_code ignored; // what went wrong first is what is told
     fs::remove(part, ignored);
-    return fail("cannot write \"" + output.string() + "\": " + error.message() + ".");
+    return Failure{L"cannot write " + quoted(output) + L": " + toWide(error.message()) + L"."};
 }
 
-int compileFile(const fs::path& input, const fs::path& output)
+Result<> compileFile(const fs::path& input, const fs::path& output)
 {
     std::error_code error;
     if (fs::equivalent(input, output, error))
-        return fail("\"" + input.string() + "\" would be overwritten by its own byte code.");
-    const LispFile file = readLispFile(toWide(input.string()), true);
-    if (file.kind == LispFile::Kind::kCompiled)
-        return fail("\"" + input.string() + "\" is compiled already.");
-    if (file.kind != LispFile::Kind::kSource)
-        return fail(toUtf8(file.text));
+        return Failure{quoted(input) + L" would be overwritten by its own byte code."};
+    const auto file = readLispFile(toWide(input.string()), true);
+    if (!file)
+        return file.failure();
+    if (file->kind == LispFile::Kind::kCompiled)
+        return Failure{quoted(input) + L" is compiled already."};
     LispMachine lisp(terminal());
-    const LispAnswer answer = lisp.compile(file.name, file.text);
-    if (!answer.ok)
-        return fail(toUtf8(answer.text));
-    return writeWhole(output, packCompiledLisp(toUtf8(answer.text)));
+    const auto byteCode = lisp.compile(file->name, file->text);
+    return byteCode ? writeWhole(output, packCompiledLisp(toUtf8(*byteCode))) : byteCode.failure();
 }
 
-int compileGuarded(const fs::path& input, const fs::path& output)
+Result<> compileGuarded(const fs::path& input, const fs::path& output)
 {
     try
     {
@@ -93,7 +90,7 @@ int compileGuarded(const fs::path& input, const fs::path& output)
     }
     catch (const std::exception& exception)
     {
-        return fail(exception.what());
+        return Failure{toWide(exception.what())};
     }
 }
 } // namespace
@@ -114,7 +111,10 @@ int runCompilerProgram(int count, const char* const* arguments)
     {
         return app.exit(outcome) == 0 ? 0 : kWrongArguments;
     }
-    return compileGuarded(input,
-                          output.empty() ? fs::path(input).replace_extension(".qbc") : fs::path(output));
+    const auto compiled =
+        compileGuarded(input, output.empty() ? fs::path(input).replace_extension(".qbc") : fs::path(output));
+    if (!compiled)
+        std::cerr << "tesselc: " << toUtf8(compiled.sentence()) << '\n';
+    return compiled ? 0 : kNotCompiled;
 }
 } // namespace tessel

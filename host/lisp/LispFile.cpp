@@ -8,6 +8,7 @@
 #include <optional>
 #include <string_view>
 #include <system_error>
+#include <utility>
 
 #include "host/lisp/CompiledLisp.h"
 #include "host/lisp/LispSource.h"
@@ -25,19 +26,19 @@ constexpr std::wstring_view kExtensions[] = {L"", L".lsp", kCompiledExtension};
 constexpr std::uintmax_t kLargestFile = std::uintmax_t{32} << 20;
 constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
 
-LispFile refused(const std::wstring& name, const std::wstring& reason, LispFile::Kind kind)
+Failure refused(const std::wstring& name, const std::wstring& reason, int code = Failure::kUnspecified)
 {
-    return {kind, name, L"Cannot load \"" + name + L"\": " + reason};
-}
-
-LispFile refused(const std::wstring& name, const std::wstring& reason)
-{
-    return refused(name, reason, LispFile::Kind::kRefused);
+    return {L"Cannot load \"" + name + L"\": " + reason, code};
 }
 
 std::wstring systemText(std::error_code error)
 {
     return toWide(error.message()) + L".";
+}
+
+Failure missing(const std::wstring& name, std::error_code error)
+{
+    return refused(name, systemText(error), LispFile::kMissing);
 }
 
 struct FoundFile
@@ -55,14 +56,12 @@ std::wstring withSlashes(std::wstring path)
 }
 
 // The path as it stands comes first: a file name may contain a backslash.
-std::optional<FoundFile> find(const std::wstring& given, std::error_code& error)
+Result<FoundFile> find(const std::wstring& given)
 {
     if (given.find(L'\0') != std::wstring::npos)
-    {
-        error = std::make_error_code(std::errc::invalid_argument);
-        return std::nullopt;
-    }
+        return missing(given, std::make_error_code(std::errc::invalid_argument));
     std::error_code first;
+    std::error_code error;
     for (const auto& spelling : {given, withSlashes(given)})
         for (const auto extension : kExtensions)
         {
@@ -74,32 +73,33 @@ std::optional<FoundFile> find(const std::wstring& given, std::error_code& error)
             if (!first)
                 first = error;
         }
-    error = first;
-    return std::nullopt;
+    // The first error says more than those of the other names.
+    if (fs::is_directory(fs::path(toUtf8(given)), error))
+        return refused(given, L"it is a folder.");
+    return missing(given, first);
 }
 
-LispFile decodeSource(const std::wstring& name, std::string_view bytes)
+Result<LispFile> decodeSource(const std::wstring& name, std::string_view bytes)
 {
     if (bytes.starts_with(kByteOrderMark))
         bytes.remove_prefix(kByteOrderMark.size());
-    LispFile file{LispFile::Kind::kSource, name, toWide(bytes)};
-    if (const auto form = findTooDeepForm(file.text))
+    std::wstring text = toWide(bytes);
+    if (const auto form = findTooDeepForm(text))
     {
-        const auto line = 1 + countLineBreaks(std::wstring_view(file.text).substr(0, *form));
-        file.kind = LispFile::Kind::kRefused;
-        file.text = name + L":" + std::to_wstring(line) +
-                    L": The form that begins here is nested more than " + std::to_wstring(kDeepestNesting) +
-                    L" levels deep.";
+        const auto line = 1 + countLineBreaks(std::wstring_view(text).substr(0, *form));
+        return Failure{name + L":" + std::to_wstring(line) +
+                       L": The form that begins here is nested more than " +
+                       std::to_wstring(kDeepestNesting) + L" levels deep."};
     }
-    return file;
+    return LispFile{LispFile::Kind::kSource, name, std::move(text)};
 }
 
-LispFile decodeCompiled(const std::wstring& name, std::string_view bytes)
+Result<LispFile> decodeCompiled(const std::wstring& name, std::string_view bytes)
 {
     const auto unpacked = unpackCompiledLisp(bytes);
-    if (!unpacked.ok)
-        return refused(name, L"it " + unpacked.fault + L".");
-    return {LispFile::Kind::kCompiled, name, toWide(unpacked.byteCode)};
+    if (!unpacked)
+        return refused(name, L"it " + unpacked.sentence() + L".");
+    return LispFile{LispFile::Kind::kCompiled, name, toWide(*unpacked)};
 }
 
 bool isCompiled(const std::wstring& name)
@@ -109,7 +109,7 @@ bool isCompiled(const std::wstring& name)
                              kCompiledExtension);
 }
 
-LispFile read(const FoundFile& found)
+Result<LispFile> read(const FoundFile& found)
 {
     std::error_code error;
     // A pipe or a device might never end.
@@ -126,17 +126,11 @@ LispFile read(const FoundFile& found)
 }
 } // namespace
 
-LispFile readLispFile(const std::wstring& path, bool compiledFiles)
+Result<LispFile> readLispFile(const std::wstring& path, bool compiledFiles)
 {
-    std::error_code error;
-    const auto found = find(path, error);
+    const auto found = find(path);
     if (!found)
-    {
-        std::error_code ignored; // the first error says more
-        if (fs::is_directory(fs::path(toUtf8(path)), ignored))
-            return refused(path, L"it is a folder.");
-        return refused(path, systemText(error), LispFile::Kind::kMissing);
-    }
+        return found.failure();
     if (!compiledFiles && isCompiled(found->name))
         return refused(found->name, L"this host does not load compiled Lisp.");
     return read(*found);

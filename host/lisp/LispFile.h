@@ -3,6 +3,8 @@
 
 #include <string>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 struct LispFile
@@ -10,18 +12,17 @@ struct LispFile
     enum class Kind
     {
         kSource,
-        kCompiled,
-        kMissing, // there is no such file
-        kRefused
+        kCompiled
     };
-    Kind kind = Kind::kRefused;
+    static constexpr int kMissing = 2; // the code of a failure when there is no such file
+
+    Kind kind = Kind::kSource;
     std::wstring name; // what messages call it: the path as given, with the extension that was added
-    std::wstring
-        text; // what Lisp is to read; for the last two kinds a sentence that says why there is nothing
+    std::wstring text; // what Lisp is to read
 };
 
 // The path may have separators of either kind, and may lack its extension. Text is taken as UTF-8; what is
 // not is replaced. What Lisp would not survive is refused: text that is nested too deep, compiled Lisp that
 // is not whole. Without `compiledFiles`, so is compiled Lisp altogether.
-LispFile readLispFile(const std::wstring& path, bool compiledFiles);
+Result<LispFile> readLispFile(const std::wstring& path, bool compiledFiles);
 } // namespace tessel

@@ -41,10 +41,9 @@ LispInterpreter::LispInterpreter(const Options& options)
 
 LispInterpreter::~LispInterpreter() = default;
 
-LispInterpreter::Outcome LispInterpreter::evaluate(std::wstring_view expressions)
+Result<std::wstring> LispInterpreter::evaluate(std::wstring_view expressions)
 {
-    auto [ok, text] = mMachine->evaluate(expressions);
-    return {ok, std::move(text)};
+    return mMachine->evaluate(expressions);
 }
 
 void LispInterpreter::queue(std::wstring expression)
@@ -62,10 +61,7 @@ bool LispInterpreter::runQueue()
     {
         const std::wstring expression = std::move(mQueue.front());
         mQueue.pop_front();
-        const Outcome outcome = evaluate(expression);
-        if (!outcome.ok)
-            services().commandLine->say(outcome.text);
-        allRan = allRan && outcome.ok;
+        allRan = services().commandLine->tell(evaluate(expression)) && allRan;
     }
     mRunningQueue = false;
     return allRan;
@@ -78,11 +74,9 @@ bool LispInterpreter::idle() const
 
 int LispInterpreter::invoke(const TsResultBuffer* call, TsResultBuffer** result)
 {
-    const auto answer = mMachine->call(call, result);
-    if (answer.ok)
-        return TS_NORMAL;
-    services().commandLine->say(answer.text);
-    return TS_ERROR;
+    const auto values = mMachine->call(call);
+    *result = values ? *values : nullptr;
+    return services().commandLine->tell(values) ? TS_NORMAL : TS_ERROR;
 }
 
 void LispInterpreter::interrupt() noexcept

@@ -9,6 +9,8 @@
 #include <string>
 #include <string_view>
 
+#include "host/text/Result.h"
+
 struct TsResultBuffer;
 
 namespace tessel
@@ -31,14 +33,9 @@ public:
     LispInterpreter(const LispInterpreter&) = delete;
     LispInterpreter& operator=(const LispInterpreter&) = delete;
 
-    struct Outcome
-    {
-        bool ok = false;
-        std::wstring text; // the printed value, empty when there is none to show; or one line of error text
-    };
-
-    // What a typed line does: every form is evaluated, the value is that of the last.
-    Outcome evaluate(std::wstring_view expressions);
+    // What a typed line does: every form is evaluated, the printed value is that of the last, empty when
+    // there is none to show. What is said of a failure is one line of error text.
+    Result<std::wstring> evaluate(std::wstring_view expressions);
 
     // Expressions for later, when the host is idle. Their values are not printed.
     void queue(std::wstring expression);

@@ -131,14 +131,8 @@ struct LispMachine::Parts
     Parts(const Parts&) = delete;
     Parts& operator=(const Parts&) = delete;
 
-    // (:DONE . value) or (:FAILED . text), as the prelude answers.
-    struct Raw
-    {
-        bool ok = false;
-        cl_object value = ECL_NIL;
-    };
-
-    Raw run(const LispCall& call)
+    // The prelude answers (:DONE . value) or (:FAILED . text).
+    Result<cl_object> run(const LispCall& call)
     {
         const std::size_t memoryBefore = cl_core.max_heap_size;
         interrupter.begin();
@@ -148,36 +142,36 @@ struct LispMachine::Parts
         restoreLispStackLimits();
         flushLispOutput();
         if (!ECL_CONSP(pair))
-            return {false, recover(cl_core.max_heap_size > memoryBefore, interrupted)};
+            return Failure{recover(cl_core.max_heap_size > memoryBefore, interrupted)};
         if (cl_car(pair) == ecl_make_keyword("DONE"))
-            return {true, cl_cdr(pair)};
+            return cl_cdr(pair);
         releaseForgottenLock();
         takeBackReserve(surroundings.heapBytes);
-        return {false, cl_cdr(pair)};
+        return Failure{fromLisp(cl_cdr(pair))};
     }
 
     // After a jump out of everything; answers what is to be told.
-    cl_object recover(bool memoryWasExhausted, bool interrupted)
+    std::wstring recover(bool memoryWasExhausted, bool interrupted)
     {
         releaseForgottenLock();
         if (canMakeSymbols())
         {
             takeBackReserve(surroundings.heapBytes);
             if (memoryWasExhausted)
-                return toLisp(L"the memory for Lisp is exhausted.");
+                return L"the memory for Lisp is exhausted.";
             // A second interrupt can meet the jump that the first one began; what it carried is lost then.
-            return toLisp(interrupted ? L"Lisp was interrupted." : L"Lisp has given up what it was doing.");
+            return interrupted ? L"Lisp was interrupted." : L"Lisp has given up what it was doing.";
         }
         // The user's symbols fill the memory.
         if (!beginSession(surroundings))
-            return toLisp(L"the memory for Lisp is exhausted; only a new start of the host frees it.");
-        return toLisp(L"the memory for Lisp is exhausted; everything that was defined is forgotten.");
+            return L"the memory for Lisp is exhausted; only a new start of the host frees it.";
+        return L"the memory for Lisp is exhausted; everything that was defined is forgotten.";
     }
 
-    LispAnswer runForText(const LispCall& call)
+    Result<std::wstring> runForText(const LispCall& call)
     {
-        const Raw raw = run(call);
-        return {raw.ok, fromLisp(raw.value)};
+        const auto value = run(call);
+        return value ? Result<std::wstring>(fromLisp(*value)) : value.failure();
     }
 
     LispSurroundings surroundings;
@@ -191,30 +185,26 @@ LispMachine::LispMachine(LispSurroundings surroundings)
 
 LispMachine::~LispMachine() = default;
 
-LispAnswer LispMachine::evaluate(std::wstring_view forms)
+Result<std::wstring> LispMachine::evaluate(std::wstring_view forms)
 {
     if (findTooDeepForm(forms))
-        return {false,
-                L"The expression is nested more than " + std::to_wstring(kDeepestNesting) + L" levels deep."};
+        return Failure{L"The expression is nested more than " + std::to_wstring(kDeepestNesting) +
+                       L" levels deep."};
     return mParts->runForText({.function = lispFunctions().evaluate, .text = forms});
 }
 
-LispAnswer LispMachine::compile(const std::wstring& name, std::wstring_view text)
+Result<std::wstring> LispMachine::compile(const std::wstring& name, std::wstring_view text)
 {
     return mParts->runForText({.function = lispFunctions().compileText, .text = text, .name = name});
 }
 
-LispAnswer LispMachine::call(const TsResultBuffer* call, TsResultBuffer** values)
+Result<TsResultBuffer*> LispMachine::call(const TsResultBuffer* call)
 {
-    *values = nullptr;
     if (!call || call->type != TS_STRING || !call->value.string)
-        return {false, L"A Lisp function is called by its name, as the first value of the list."};
-    const auto raw =
+        return Failure{L"A Lisp function is called by its name, as the first value of the list."};
+    const auto value =
         mParts->run({.function = lispFunctions().invoke, .text = call->value.string, .values = call});
-    if (!raw.ok)
-        return {false, fromLisp(raw.value)};
-    *values = resultFromLisp(raw.value);
-    return {true, {}};
+    return value ? Result<TsResultBuffer*>(resultFromLisp(*value)) : value.failure();
 }
 
 void LispMachine::interrupt() noexcept

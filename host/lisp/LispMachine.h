@@ -12,6 +12,8 @@
 #include <string>
 #include <string_view>
 
+#include "host/text/Result.h"
+
 struct TsResultBuffer;
 
 namespace tessel
@@ -28,12 +30,6 @@ struct LispSurroundings
     std::function<void(const std::wstring& path)> fileLoaded; // without an error; the path as it was given
 };
 
-struct LispAnswer
-{
-    bool ok = false;
-    std::wstring text; // the printed value, or one line of error text
-};
-
 class LispMachine
 {
 public:
@@ -45,15 +41,17 @@ public:
     LispMachine(const LispMachine&) = delete;
     LispMachine& operator=(const LispMachine&) = delete;
 
-    // Every form, one after the other; the value of the last, or an empty text where there is none to print.
-    LispAnswer evaluate(std::wstring_view forms);
+    // What each of these says of a failure is one line of error text.
 
-    // Calls the function named by the first value with the rest. The answer's text is for an error only; the
-    // values are the caller's to free, null for nil.
-    LispAnswer call(const TsResultBuffer* call, TsResultBuffer** values);
+    // Every form, one after the other; the printed value of the last, empty where there is none to print.
+    Result<std::wstring> evaluate(std::wstring_view forms);
+
+    // Calls the function named by the first value with the rest. The values are the caller's to free, null
+    // for nil.
+    Result<TsResultBuffer*> call(const TsResultBuffer* call);
 
     // Byte code of a source text, to be packed; `name` is what errors call the text.
-    LispAnswer compile(const std::wstring& name, std::wstring_view text);
+    Result<std::wstring> compile(const std::wstring& name, std::wstring_view text);
 
     // From any thread or signal handler.
     void interrupt() noexcept;

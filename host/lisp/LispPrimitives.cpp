@@ -24,8 +24,8 @@ struct Connection
     LispInterrupter* interrupter = nullptr;
     std::thread::id thread;
     LispOutput output;
-    LispFile file;
-    std::wstring fault; // why the host's own code failed
+    Result<LispFile> file = LispFile();
+    Result<> hostCode; // how the host's own code came off
 };
 
 Connection& connection()
@@ -37,18 +37,18 @@ Connection& connection()
 template <typename Work>
 void runCatching(Work work) noexcept
 {
-    connection().fault.clear();
+    connection().hostCode = {};
     try
     {
         work();
     }
     catch (const std::exception& exception)
     {
-        connection().fault = toWide(exception.what());
+        connection().hostCode = Failure{toWide(exception.what())};
     }
     catch (...)
     {
-        connection().fault = L"The host failed for a reason of its own.";
+        connection().hostCode = Failure{L"The host failed for a reason of its own."};
     }
 }
 
@@ -61,8 +61,8 @@ void callHost(Work work)
     ecl_disable_interrupts_env(environment);
     runCatching(work);
     ecl_enable_interrupts_env(environment);
-    if (!connection().fault.empty())
-        FEerror("~A", 1, toLisp(connection().fault));
+    if (!connection().hostCode)
+        FEerror("~A", 1, toLisp(connection().hostCode.sentence()));
 }
 
 cl_object answer(cl_object value)
@@ -112,22 +112,15 @@ cl_object column()
     return answer(ecl_make_fixnum(static_cast<cl_fixnum>(count)));
 }
 
-cl_object kindOf(LispFile::Kind kind)
+cl_object kindOf(const Result<LispFile>& file)
 {
-    switch (kind)
-    {
-    case LispFile::Kind::kSource:
-        return ecl_make_keyword("SOURCE");
-    case LispFile::Kind::kCompiled:
-        return ecl_make_keyword("COMPILED");
-    case LispFile::Kind::kMissing:
-        return ecl_make_keyword("MISSING");
-    default:
-        return ecl_make_keyword("REFUSED");
-    }
+    if (!file)
+        return ecl_make_keyword(file.code() == LispFile::kMissing ? "MISSING" : "REFUSED");
+    return ecl_make_keyword(file->kind == LispFile::Kind::kCompiled ? "COMPILED" : "SOURCE");
 }
 
-// A list: the kind, the name for messages, the text.
+// A list: the kind, the name for messages, the text; of a file that is not there or not good a sentence
+// instead of the text, and no name.
 cl_object readFile(cl_object path)
 {
     callHost(
@@ -136,10 +129,11 @@ cl_object readFile(cl_object path)
             const auto* surroundings = connection().surroundings;
             connection().file = readLispFile(fromLisp(path), surroundings && surroundings->removingTsLisp);
         });
-    cl_object text = toLisp(connection().file.text);
-    cl_object name = toLisp(connection().file.name);
-    cl_object kind = kindOf(connection().file.kind);
-    callHost([] { connection().file = {}; });
+    const Result<LispFile>& file = connection().file;
+    cl_object text = toLisp(file ? file->text : file.sentence());
+    cl_object name = file ? toLisp(file->name) : ECL_NIL;
+    cl_object kind = kindOf(file);
+    callHost([] { connection().file = LispFile(); });
     return answer(cl_list(3, kind, name, text));
 }
 

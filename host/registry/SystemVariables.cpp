@@ -92,21 +92,21 @@ const SystemVariables::Variable* SystemVariables::find(std::wstring_view name) c
     return found == mVariables.end() ? nullptr : &*found;
 }
 
-std::wstring SystemVariables::set(std::wstring_view name, std::wstring_view text)
+Result<> SystemVariables::set(std::wstring_view name, std::wstring_view text)
 {
     const auto* found = find(name);
     if (!found)
-        return L"There is no variable called \"" + std::wstring(name) + L"\".";
+        return Failure{L"There is no variable called \"" + std::wstring(name) + L"\"."};
     if (found->storage == Storage::kReadOnly)
-        return found->name + L" can only be read.";
+        return Failure{found->name + L" can only be read."};
     const auto value = parseFor(*found, text);
     if (!value)
-        return rangeSentence(*found);
+        return Failure{rangeSentence(*found)};
     Variable& variable = mVariables[static_cast<std::size_t>(found - mVariables.data())];
     variable.value = *value;
     const bool store = variable.storage == Storage::kStored && services().registry;
     if (store && !services().registry->write(storageKey(), variable.name, toText(variable.value)))
-        return variable.name + L" is set for this session only: the registry cannot be written.";
+        return Failure{variable.name + L" is set for this session only: the registry cannot be written."};
     return {};
 }
 

@@ -7,6 +7,8 @@
 #include <variant>
 #include <vector>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 class SystemVariables
@@ -40,8 +42,8 @@ public:
     // Null for an unknown name. Case does not matter.
     const Variable* find(std::wstring_view name) const;
 
-    // Sets a variable from what a person typed. Empty, or one sentence about why not.
-    std::wstring set(std::wstring_view name, std::wstring_view text);
+    // Sets a variable from what a person typed.
+    Result<> set(std::wstring_view name, std::wstring_view text);
 
     std::int16_t number(std::wstring_view name) const;
     std::wstring text(std::wstring_view name) const;

@@ -42,8 +42,8 @@ TEST(CompiledLisp, ComesOutAsItWentIn)
     {
         const std::string bytes = packCompiledLisp(byteCode);
         const auto unpacked = unpackCompiledLisp(bytes);
-        EXPECT_TRUE(unpacked.ok);
-        EXPECT_EQ(unpacked.byteCode, byteCode);
+        ASSERT_TRUE(unpacked);
+        EXPECT_EQ(*unpacked, byteCode);
     }
 }
 
@@ -56,8 +56,8 @@ TEST(CompiledLisp, IsRefusedWithAnyByteChangedInAnyBit)
             std::string damaged = whole;
             damaged[at] = static_cast<char>(damaged[at] ^ (1 << bit));
             const auto unpacked = unpackCompiledLisp(damaged);
-            EXPECT_FALSE(unpacked.ok) << at << " " << bit;
-            EXPECT_FALSE(unpacked.fault.empty());
+            EXPECT_FALSE(unpacked) << at << " " << bit;
+            EXPECT_FALSE(unpacked.sentence().empty());
         }
 }
 
@@ -65,17 +65,19 @@ TEST(CompiledLisp, IsRefusedAtAnyOtherLength)
 {
     const std::string whole = packCompiledLisp("(1 . code)\n(2 . code)\n");
     for (std::size_t length = 0; length < whole.size(); ++length)
-        EXPECT_FALSE(unpackCompiledLisp(std::string_view(whole).substr(0, length)).ok) << length;
-    EXPECT_FALSE(unpackCompiledLisp(whole + "x").ok);
+        EXPECT_FALSE(unpackCompiledLisp(std::string_view(whole).substr(0, length))) << length;
+    EXPECT_FALSE(unpackCompiledLisp(whole + "x"));
 }
 
 TEST(CompiledLisp, TellsWhatIsWrong)
 {
     const std::string whole = packCompiledLisp("(1 . code)");
-    EXPECT_EQ(unpackCompiledLisp("(defun a () 1)").fault, L"is not compiled Lisp");
-    EXPECT_EQ(unpackCompiledLisp(std::string_view(whole).substr(0, whole.size() - 1)).fault, L"is cut short");
-    EXPECT_EQ(unpackCompiledLisp(whole + "x").fault, L"is damaged");
+    EXPECT_EQ(unpackCompiledLisp("(defun a () 1)").sentence(), L"is not compiled Lisp");
+    EXPECT_EQ(unpackCompiledLisp(std::string_view(whole).substr(0, whole.size() - 1)).sentence(),
+              L"is cut short");
+    EXPECT_EQ(unpackCompiledLisp(whole + "x").sentence(), L"is damaged");
     std::string other = whole;
     other[8] = 99;
-    EXPECT_EQ(unpackCompiledLisp(other).fault, L"was compiled for another version of Lisp; compile it again");
+    EXPECT_EQ(unpackCompiledLisp(other).sentence(),
+              L"was compiled for another version of Lisp; compile it again");
 }

@@ -139,12 +139,11 @@ TEST(LispInterruptFromAnywhere, MayComeAtAnyMoment)
         });
     for (int round = 0; round < 2000; ++round)
     {
-        const auto outcome =
-            session.lisp().evaluate(L"(length (loop for i below 100 collect (make-list 10)))");
-        if (outcome.ok)
-            EXPECT_EQ(outcome.text, L"100");
+        const auto value = session.lisp().evaluate(L"(length (loop for i below 100 collect (make-list 10)))");
+        if (value)
+            EXPECT_EQ(*value, L"100");
         else
-            EXPECT_EQ(outcome.text, L"Lisp was interrupted.");
+            EXPECT_EQ(value.sentence(), L"Lisp was interrupted.");
     }
     over = true;
     other.join();

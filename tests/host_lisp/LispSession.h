@@ -45,18 +45,18 @@ public:
     // The printed value; a failure fails the test.
     std::string value(const std::string& expression)
     {
-        const auto outcome = mLisp.evaluate(tessel::toWide(expression));
-        EXPECT_TRUE(outcome.ok) << expression << ": " << tessel::toUtf8(outcome.text);
-        return tessel::toUtf8(outcome.text);
+        const auto value = mLisp.evaluate(tessel::toWide(expression));
+        EXPECT_TRUE(value) << expression << ": " << tessel::toUtf8(value.sentence());
+        return tessel::toUtf8(value ? *value : value.sentence());
     }
 
     // The line of error text; success fails the test, and so does more than one line.
     std::string error(const std::string& expression)
     {
-        const auto outcome = mLisp.evaluate(tessel::toWide(expression));
-        EXPECT_FALSE(outcome.ok) << expression << ": " << tessel::toUtf8(outcome.text);
-        EXPECT_EQ(outcome.text.find(L'\n'), std::wstring::npos) << tessel::toUtf8(outcome.text);
-        return tessel::toUtf8(outcome.text);
+        const auto value = mLisp.evaluate(tessel::toWide(expression));
+        EXPECT_FALSE(value) << expression << ": " << (value ? tessel::toUtf8(*value) : "");
+        EXPECT_EQ(value.sentence().find(L'\n'), std::wstring::npos) << tessel::toUtf8(value.sentence());
+        return tessel::toUtf8(value.sentence());
     }
 
     std::vector<std::string> documentNames() const

@@ -54,7 +54,7 @@ TEST(Https, ServerThatSpeaksInTheClearIsRefused)
     RemoteHost host;
     const std::wstring url = L"https" + server.url(L"/tool.lsp").substr(4);
     auto impatient = host.impatient();
-    EXPECT_EQ(impatient.fetch(url, RemoteHost::kLongestPath, false).status, TS_FETCH_FAILED);
+    EXPECT_EQ(host.told(impatient.fetch(url, RemoteHost::kLongestPath, false)).status, TS_FETCH_FAILED);
     EXPECT_THAT(host.output().text(), StartsWith(tessel::toUtf8(url) + " could not be fetched: "));
     EXPECT_THAT(host.stored(), IsEmpty());
 }

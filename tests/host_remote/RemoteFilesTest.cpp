@@ -58,7 +58,7 @@ protected:
     {
         const auto before = host.stored();
         host.output().clear();
-        const Copy copy = files.fetch(url, RemoteHost::kLongestPath, ignoreCache);
+        const Copy copy = host.told(files.fetch(url, RemoteHost::kLongestPath, ignoreCache));
         EXPECT_EQ(copy.status, TS_FETCH_FAILED);
         EXPECT_EQ(copy.path, L"");
         EXPECT_THAT(host.output().text(), AllOf(StartsWith(tessel::toUtf8(url) + " could not be fetched: "),
@@ -98,7 +98,8 @@ TEST_F(Remote, TheCacheIsThereForTheNextSession)
     offer("/tool.lsp", httpAnswer("200 OK", "1"));
     EXPECT_EQ(host.fetch(server.url(L"/tool.lsp")).status, TS_FETCHED);
     tessel::RemoteFiles next = host.impatient();
-    EXPECT_EQ(next.fetch(server.url(L"/tool.lsp"), RemoteHost::kLongestPath, false).status, TS_FROM_CACHE);
+    EXPECT_EQ(host.told(next.fetch(server.url(L"/tool.lsp"), RemoteHost::kLongestPath, false)).status,
+              TS_FROM_CACHE);
 }
 
 TEST_F(Remote, TheCacheIsPassedOverOnRequest)
@@ -352,8 +353,9 @@ TEST_F(Remote, APathThatIsTooLongForItsUserIsAFailure)
     offer("/tool.lsp", httpAnswer("200 OK", "1"));
     const std::size_t length = host.fetch(server.url(L"/tool.lsp")).path.size();
     const auto before = host.stored();
-    EXPECT_EQ(host.remote().fetch(server.url(L"/tool.lsp"), length, true).status, TS_FETCHED);
-    EXPECT_EQ(host.remote().fetch(server.url(L"/tool.lsp"), length - 1, true).status, TS_FETCH_FAILED);
+    EXPECT_EQ(host.told(host.remote().fetch(server.url(L"/tool.lsp"), length, true)).status, TS_FETCHED);
+    EXPECT_EQ(host.told(host.remote().fetch(server.url(L"/tool.lsp"), length - 1, true)).status,
+              TS_FETCH_FAILED);
     EXPECT_THAT(host.output().text(),
                 HasSubstr("the path of its local copy has more than " + std::to_string(length - 1)));
     EXPECT_EQ(host.stored(), before);

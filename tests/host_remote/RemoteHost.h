@@ -34,7 +34,12 @@ public:
 
     tessel::RemoteFiles::Copy fetch(const std::wstring& url, bool ignoreCache = false)
     {
-        return mRemote.fetch(url, kLongestPath, ignoreCache);
+        return told(mRemote.fetch(url, kLongestPath, ignoreCache));
+    }
+    // The copy, or a status alone and what went wrong in the output, as applications find it.
+    tessel::RemoteFiles::Copy told(const tessel::Result<tessel::RemoteFiles::Copy>& fetched)
+    {
+        return mOutput.commandLine().tell(fetched) ? *fetched : tessel::RemoteFiles::Copy{fetched.code(), {}};
     }
 
     // Everything in the cache with its content.

@@ -34,7 +34,7 @@ protected:
 
     void setSearchPath(const std::string& path)
     {
-        EXPECT_EQ(variables.set(tessel::kSearchPath, tessel::toWide(path)), L"");
+        EXPECT_EQ(variables.set(tessel::kSearchPath, tessel::toWide(path)).sentence(), L"");
     }
     std::string find(const char* name)
     {

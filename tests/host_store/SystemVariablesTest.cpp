@@ -54,29 +54,30 @@ TEST_F(Variables, AreFoundWithoutRegardToCase)
 
 TEST_F(Variables, TakeOnlyWhatIsInTheirRange)
 {
-    EXPECT_EQ(variables->set(L"lispenabled", L"0"), L"");
+    EXPECT_EQ(variables->set(L"lispenabled", L"0").sentence(), L"");
     EXPECT_EQ(variables->number(L"LISPENABLED"), 0);
     for (const wchar_t* wrong :
          {L"2", L"-1", L"", L"on", L"1x", L" 1", L"1.0", L"32768", L"99999999999999999999"})
-        EXPECT_EQ(variables->set(L"LISPENABLED", wrong), L"LISPENABLED takes a whole number from 0 to 1.")
+        EXPECT_EQ(variables->set(L"LISPENABLED", wrong).sentence(),
+                  L"LISPENABLED takes a whole number from 0 to 1.")
             << wrong;
     EXPECT_EQ(variables->number(L"LISPENABLED"), 0);
-    EXPECT_EQ(variables->set(L"LISPENABLED", L"1"), L"");
+    EXPECT_EQ(variables->set(L"LISPENABLED", L"1").sentence(), L"");
     EXPECT_EQ(variables->text(L"LISPENABLED"), L"1");
 }
 
 TEST_F(Variables, TellUnknownNamesAndThoseThatCanOnlyBeRead)
 {
-    EXPECT_EQ(variables->set(L"NoSuch", L"1"), L"There is no variable called \"NoSuch\".");
-    EXPECT_EQ(variables->set(L"tesselversion", L"R22"), L"TESSELVERSION can only be read.");
+    EXPECT_EQ(variables->set(L"NoSuch", L"1").sentence(), L"There is no variable called \"NoSuch\".");
+    EXPECT_EQ(variables->set(L"tesselversion", L"R22").sentence(), L"TESSELVERSION can only be read.");
     EXPECT_EQ(variables->text(L"TESSELVERSION"), L"R21");
 }
 
 TEST_F(Variables, KeepStoredOnesFromStartToStart)
 {
-    EXPECT_EQ(variables->set(L"SEARCHPATH", L"/büro;/a b"), L"");
-    EXPECT_EQ(variables->set(L"REMOVINGTSLISP", L"0"), L"");
-    EXPECT_EQ(variables->set(L"LISPENABLED", L"0"), L"");
+    EXPECT_EQ(variables->set(L"SEARCHPATH", L"/büro;/a b").sentence(), L"");
+    EXPECT_EQ(variables->set(L"REMOVINGTSLISP", L"0").sentence(), L"");
+    EXPECT_EQ(variables->set(L"LISPENABLED", L"0").sentence(), L"");
     EXPECT_TRUE(host.registry().endOfCommand());
     host.open();
     start();
@@ -106,10 +107,10 @@ TEST_F(Variables, SayWhenTheyCannotBeStored)
     std::filesystem::permissions(host.file(), std::filesystem::perms::owner_read);
     host.open();
     start();
-    EXPECT_EQ(variables->set(L"SEARCHPATH", L"/x"),
+    EXPECT_EQ(variables->set(L"SEARCHPATH", L"/x").sentence(),
               L"SEARCHPATH is set for this session only: the registry cannot be written.");
     EXPECT_EQ(variables->text(L"SEARCHPATH"), L"/x");
-    EXPECT_EQ(variables->set(L"LISPENABLED", L"0"), L"") << "that one is not stored anyway";
+    EXPECT_EQ(variables->set(L"LISPENABLED", L"0").sentence(), L"") << "that one is not stored anyway";
 }
 
 TEST_F(Variables, StartWithoutARegistry)
@@ -117,7 +118,7 @@ TEST_F(Variables, StartWithoutARegistry)
     host.close();
     start();
     EXPECT_EQ(variables->number(L"LISPENABLED"), 1);
-    EXPECT_EQ(variables->set(L"SEARCHPATH", L"/x"), L"");
+    EXPECT_EQ(variables->set(L"SEARCHPATH", L"/x").sentence(), L"");
 }
 
 TEST_F(Variables, AreGivenToApplicationsWithTheirTypes)
