@@ -24,7 +24,8 @@ int main(int argc, char** argv)
     tessel::ensureCurrentProfile(registry, L"Software\\Tessel\\R21");
     if (!registry.endOfCommand())
         return 1;
-    const tessel::LispInterpreter lisp({});
+    if (!tessel::LispInterpreter::start({}))
+        return 1;
     const auto file = tessel::moduleFileAt(argv[2]);
     if (!file)
         return 1;

@@ -5,6 +5,8 @@
 #include <filesystem>
 #include <functional>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 class CommandStack;
@@ -13,7 +15,7 @@ class CommandStack;
 struct SessionActions
 {
     std::function<void()> quit;
-    std::function<bool(const std::filesystem::path&)> runScript; // false: a line of it failed
+    std::function<Result<>(const std::filesystem::path&)> runScript;
 };
 
 void addSessionCommands(CommandStack& commands, SessionActions actions); // HELP QUIT EXIT VERSION CD SCRIPT

@@ -54,33 +54,37 @@ std::wstring quoted(const std::wstring& text)
     return result + L"\"";
 }
 
-bool loadLisp(const std::wstring& path)
+Result<> loadLisp(const std::wstring& path)
 {
     const auto value = services().lisp->evaluate(L"(load " + quoted(path) + L")");
-    return value ? succeed(path + L" is loaded.") : fail(value.sentence());
+    return value ? succeed(path + L" is loaded.") : value.failure();
 }
 
-bool load(const CommandStack::Arguments& arguments)
+Result<> load(const CommandStack::Arguments& arguments)
 {
     if (arguments.size() != 1)
-        return failWithUsage(L"LOAD");
+        return wrongUsage(L"LOAD");
     const std::wstring path = fullPath(arguments.front());
     if (isLispFile(path))
         return loadLisp(path);
-    return services().linker->loadModule(path.c_str(), true, true) && succeed(path + L" is loaded.");
+    if (!services().linker->loadModule(path.c_str(), true, true))
+        return Failure{}; // the linker has said why
+    return succeed(path + L" is loaded.");
 }
 
-bool unload(const CommandStack::Arguments& arguments)
+Result<> unload(const CommandStack::Arguments& arguments)
 {
     if (arguments.size() != 1)
-        return failWithUsage(L"UNLOAD");
+        return wrongUsage(L"UNLOAD");
     const std::wstring path = fullPath(arguments.front());
     if (isLispFile(path))
-        return fail(path + L" cannot be unloaded: Lisp stays until the session ends.");
+        return Failure{path + L" cannot be unloaded: Lisp stays until the session ends."};
     // The name alone is enough for what is loaded.
     const std::wstring loaded = services().linker->pathOfModule(arguments.front());
     const std::wstring module = loaded.empty() ? path : loaded;
-    return services().linker->unloadModule(module.c_str(), true) && succeed(module + L" is unloaded.");
+    if (!services().linker->unloadModule(module.c_str(), true))
+        return Failure{}; // the linker has said why
+    return succeed(module + L" is unloaded.");
 }
 
 void sayApplication(const std::wstring& path, const std::wstring& state)
@@ -90,7 +94,7 @@ void sayApplication(const std::wstring& path, const std::wstring& state)
             padded(toText(file.parent_path()), kFolderColumn) + L" " + state);
 }
 
-bool listApplications(const CommandStack::Arguments&)
+Result<> listApplications(const CommandStack::Arguments&)
 {
     const auto modules = services().linker->loadedModules();
     for (const auto& module : modules)
@@ -101,7 +105,7 @@ bool listApplications(const CommandStack::Arguments&)
         sayApplication(document->loadedApplicationName(index), L"Lisp");
     if (modules.empty() && lispFiles == 0)
         sayLine(L"No application is loaded.");
-    return true;
+    return {};
 }
 } // namespace
 

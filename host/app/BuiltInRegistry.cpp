@@ -22,67 +22,67 @@ std::wstring at(const Arguments& arguments, std::size_t index)
     return index < arguments.size() ? arguments[index] : L"";
 }
 
-bool failAt(const std::wstring& path, const std::wstring& reason)
+Failure failureAt(const std::wstring& path, const std::wstring& reason)
 {
-    return fail(L"The registry key \"" + path + L"\" " + reason + L".");
+    return {L"The registry key \"" + path + L"\" " + reason + L"."};
 }
 
 // The store's own words are told at the end of the command, which undoes all of it.
-std::wstring writeFailure(const Result<>& written)
+std::wstring writeReason(const Result<>& written)
 {
     const Result<>& canStore = services().registry->canStore();
     return L"cannot be written: " +
            (canStore ? L"error " + std::to_wstring(written.code()) : canStore.sentence());
 }
 
-bool list(const std::wstring& path)
+Result<> list(const std::wstring& path)
 {
     Registry& registry = *services().registry;
     const auto key = registry.find(path);
     if (key == Registry::kNoKey)
-        return failAt(path, L"does not exist");
+        return failureAt(path, L"does not exist");
     for (const auto& name : registry.subKeys(key))
         sayLine(L"[" + name + L"]");
     for (const auto& value : registry.values(key))
         sayLine((value.name.empty() ? L"(unnamed)" : value.name) + L" = " + value.data);
-    return true;
+    return {};
 }
 
-bool get(const std::wstring& path, const std::wstring& name)
+Result<> get(const std::wstring& path, const std::wstring& name)
 {
     const auto data = services().registry->read(path, name);
     if (!data)
-        return failAt(path, L"has no value \"" + name + L"\"");
+        return failureAt(path, L"has no value \"" + name + L"\"");
     sayLine(*data);
-    return true;
+    return {};
 }
 
 // A key alone is made; with a name, the value is stored.
-bool set(const std::wstring& path, const Arguments& arguments)
+Result<> set(const std::wstring& path, const Arguments& arguments)
 {
     Registry& registry = *services().registry;
     const auto key = registry.create(path, Registry::kRoot);
     Result<> done = key ? Result<>() : key.failure();
     if (key && arguments.size() > 2)
         done = registry.writeValue(*key, at(arguments, 2), at(arguments, 3));
-    return done || failAt(path, writeFailure(done));
+    return done ? done : failureAt(path, writeReason(done));
 }
 
 // A key alone goes with everything below it; with a name, only the value.
-bool remove(const std::wstring& path, const Arguments& arguments)
+Result<> remove(const std::wstring& path, const Arguments& arguments)
 {
     Registry& registry = *services().registry;
     const auto key = registry.find(path);
     if (key == Registry::kNoKey)
-        return failAt(path, L"does not exist");
+        return failureAt(path, L"does not exist");
     const Result<> done =
         arguments.size() > 2 ? registry.removeValue(key, at(arguments, 2)) : registry.removeKey(key);
     if (done.code() == ERROR_FILE_NOT_FOUND)
-        return failAt(path, L"has no value \"" + at(arguments, 2) + L"\"");
-    return done || failAt(path, writeFailure(done));
+        return failureAt(path, L"has no value \"" + at(arguments, 2) + L"\"");
+    return done ? done : failureAt(path, writeReason(done));
 }
 
-bool registryCommand(const Arguments& arguments)
+Result<> registryCommand(const Arguments& arguments)
 {
     const std::wstring action = at(arguments, 0);
     const std::wstring path = at(arguments, 1);
@@ -94,7 +94,7 @@ bool registryCommand(const Arguments& arguments)
         return set(path, arguments);
     if (equalIgnoringCase(action, L"DELETE") && (arguments.size() == 2 || arguments.size() == 3))
         return remove(path, arguments);
-    return failWithUsage(kCommand);
+    return wrongUsage(kCommand);
 }
 } // namespace
 

@@ -21,7 +21,7 @@ void sayCommand(const CommandStack::Description& command)
     sayLine(L"  " + (command.summary.empty() ? usage : padded(usage, kUsageColumn) + command.summary));
 }
 
-bool listCommands()
+Result<> listCommands()
 {
     std::wstring group;
     for (const auto& command : services().commands->descriptions())
@@ -31,11 +31,11 @@ bool listCommands()
         group = command.group;
         sayCommand(command);
     }
-    return true;
+    return {};
 }
 
 // A name is that of a command, or else a topic of the help book.
-bool help(const CommandStack::Arguments& arguments)
+Result<> help(const CommandStack::Arguments& arguments)
 {
     if (arguments.empty())
         return listCommands();
@@ -43,22 +43,26 @@ bool help(const CommandStack::Arguments& arguments)
     const auto found = std::ranges::find_if(known, [&](const auto& command)
                                             { return equalIgnoringCase(command.name, arguments.front()); });
     if (found == known.end())
-        return services().help->show(arguments.front());
+    {
+        const auto shown = services().help->show(arguments.front());
+        return shown ? succeed(*shown) : shown.failure();
+    }
     sayCommand(*found);
-    return true;
+    return {};
 }
 
-bool changeFolder(const CommandStack::Arguments& arguments)
+Result<> changeFolder(const CommandStack::Arguments& arguments)
 {
     std::error_code error;
     if (!arguments.empty())
         std::filesystem::current_path(toPath(arguments.front()), error);
     if (error)
-        return fail(L"The folder " + arguments.front() + L" cannot be entered: " + toWide(error.message()) +
-                    L".");
+        return Failure{L"The folder " + arguments.front() + L" cannot be entered: " +
+                       toWide(error.message()) + L"."};
     const auto folder = std::filesystem::current_path(error);
-    sayLine(error ? L"The current folder is gone." : toText(folder));
-    return !error;
+    if (error)
+        return Failure{L"The current folder is gone."};
+    return succeed(toText(folder));
 }
 } // namespace
 
@@ -67,16 +71,15 @@ void addSessionCommands(CommandStack& commands, SessionActions actions)
     const auto quit = [leave = std::move(actions.quit)](const auto&)
     {
         leave();
-        return true;
+        return Result<>();
     };
     const auto script = [run = std::move(actions.runScript)](const CommandStack::Arguments& arguments)
     {
-        return arguments.size() == 1 ? run(toPath(arguments.front())) : failWithUsage(L"SCRIPT");
+        return arguments.size() == 1 ? run(toPath(arguments.front())) : wrongUsage(L"SCRIPT");
     };
     const auto version = [](const auto&)
     {
-        sayLine(toWide(kVersionLine));
-        return true;
+        return succeed(toWide(kVersionLine));
     };
     commands.addBuiltIn(
         {kGroup, L"HELP", L"[name]", L"Lists the commands, or tells about one or a help topic"}, help);

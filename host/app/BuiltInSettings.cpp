@@ -17,42 +17,41 @@ std::wstring assignment(const SystemVariables::Variable& variable)
     return variable.name + L" = " + toText(variable.value);
 }
 
-bool listVariables()
+Result<> listVariables()
 {
     for (const auto& variable : services().variables->all())
         sayLine(L"  " + padded(assignment(variable), kVariableColumn) + L" " + variable.purpose);
-    return true;
+    return {};
 }
 
-bool showVariable(const std::wstring& name)
+Result<> showVariable(const std::wstring& name)
 {
     const auto* variable = services().variables->find(name);
     if (!variable)
-        return fail(L"There is no variable called \"" + name + L"\".");
+        return Failure{L"There is no variable called \"" + name + L"\"."};
     sayLine(assignment(*variable));
-    return true;
+    return {};
 }
 
-bool setVariable(const CommandStack::Arguments& arguments)
+Result<> setVariable(const CommandStack::Arguments& arguments)
 {
     if (arguments.empty())
         return listVariables();
     if (arguments.size() == 1)
         return showVariable(arguments.front());
     if (arguments.size() > 2)
-        return failWithUsage(L"SETVAR");
-    const auto done = services().variables->set(arguments[0], arguments[1]);
-    return done || fail(done.sentence());
+        return wrongUsage(L"SETVAR");
+    return services().variables->set(arguments[0], arguments[1]);
 }
 
-bool profile(const CommandStack::Arguments& arguments)
+Result<> profile(const CommandStack::Arguments& arguments)
 {
     if (arguments.size() > 1)
-        return failWithUsage(L"PROFILE");
+        return wrongUsage(L"PROFILE");
     if (arguments.size() == 1)
         return setCurrentProfile(arguments.front());
     sayLine(currentProfile());
-    return true;
+    return {};
 }
 } // namespace
 

@@ -13,23 +13,17 @@ void sayLine(const std::wstring& sentence)
     services().commandLine->say(sentence);
 }
 
-bool succeed(const std::wstring& sentence)
+Result<> succeed(const std::wstring& sentence)
 {
     sayLine(sentence);
-    return true;
+    return {};
 }
 
-bool fail(const std::wstring& sentence)
-{
-    sayLine(sentence);
-    return false;
-}
-
-bool failWithUsage(const std::wstring& command)
+Failure wrongUsage(const std::wstring& command)
 {
     const auto known = services().commands->descriptions();
     const auto found = std::ranges::find_if(known, [&](const auto& entry) { return entry.name == command; });
-    return fail(L"Usage: " + command + L" " + (found == known.end() ? L"" : found->usage));
+    return {L"Usage: " + command + L" " + (found == known.end() ? L"" : found->usage)};
 }
 
 std::filesystem::path toPath(const std::wstring& text)

@@ -5,17 +5,17 @@
 #include <string>
 
 #include "host/commands/CommandStack.h"
+#include "host/text/Result.h"
 
 namespace tessel
 {
 void sayLine(const std::wstring& sentence);
 
-// Says the sentence and answers whether the command succeeded: its end.
-bool succeed(const std::wstring& sentence);
-bool fail(const std::wstring& sentence);
+// Says the sentence with which a command ends well.
+Result<> succeed(const std::wstring& sentence);
 
-// Says how the command is to be typed, and answers false.
-bool failWithUsage(const std::wstring& command);
+// How the command is to be typed.
+Failure wrongUsage(const std::wstring& command);
 
 std::filesystem::path toPath(const std::wstring& text);
 std::wstring toText(const std::filesystem::path& path);

@@ -58,7 +58,7 @@ struct Host::Parts
     Document document;
     MessageBox messageBox;
     std::optional<Help> help;
-    std::optional<LispInterpreter> lisp;
+    std::unique_ptr<LispInterpreter> lisp;
 };
 
 Host::Host(HostOptions options) : mOptions(std::move(options)), mCommandLine(mOptions.output)
@@ -73,42 +73,46 @@ Host::~Host()
 bool Host::start()
 {
     const AutoreleasePool pool;
-    if (anotherRuns() || !prepareProfileFolder())
+    if (!mCommandLine.tell(makeParts()))
         return false;
-    // The applications that are loaded next may bring Objective-C along.
-    static_cast<void>(keepToolkitFilesIn(mOptions.profileFolder / kToolkitFolder));
-    services().commandLine = &mCommandLine;
-    services().endRequest = &mEndRequest;
-    mParts = std::make_unique<Parts>();
-    makeStore();
-    makeApplicationParts();
-    makeUserParts();
-    addCommands();
     if (!mOptions.safe)
         mParts->demandLoading->loadAtStart();
     finishLine();
     return true;
 }
 
-bool Host::anotherRuns()
+Result<> Host::makeParts()
 {
     if (services().commandLine)
-        mCommandLine.say(L"Another session runs in this process already.");
-    return services().commandLine;
+        return Failure{L"Another session runs in this process already."};
+    if (auto prepared = prepareProfileFolder(); !prepared)
+        return prepared;
+    // The applications that are loaded next may bring Objective-C along.
+    static_cast<void>(keepToolkitFilesIn(mOptions.profileFolder / kToolkitFolder));
+    services().commandLine = &mCommandLine;
+    services().endRequest = &mEndRequest;
+    mParts = std::make_unique<Parts>();
+    makeStore();
+    if (auto made = makeApplicationParts(); !made)
+        return made;
+    makeUserParts();
+    addCommands();
+    return {};
 }
 
-bool Host::prepareProfileFolder()
+Result<> Host::prepareProfileFolder()
 {
-    std::error_code error;
     if (mOptions.profileFolder.empty())
-        mCommandLine.say(
-            L"Tessel does not know where to keep its profile: HOME is not set, and no folder was given.");
-    else if (std::filesystem::create_directories(mOptions.profileFolder, error); error)
-        mCommandLine.say(L"The profile folder " + wideText(mOptions.profileFolder) + L" cannot be made: " +
-                         toWide(error.message()) + L".");
-    else
+        return Failure{
+            L"Tessel does not know where to keep its profile: HOME is not set, and no folder was given."};
+    std::error_code error;
+    std::filesystem::create_directories(mOptions.profileFolder, error);
+    if (!error)
         mOptions.profileFolder = std::filesystem::canonical(mOptions.profileFolder, error);
-    return !mOptions.profileFolder.empty() && !error;
+    if (!error)
+        return {};
+    return Failure{L"The profile folder " + wideText(mOptions.profileFolder) + L" cannot be made: " +
+                   toWide(error.message()) + L"."};
 }
 
 // What is stored, and what is read from it before any application can ask.
@@ -122,7 +126,7 @@ void Host::makeStore()
     services().removingTsLisp = mParts->variables->number(kRemovingTsLisp) != 0;
 }
 
-void Host::makeApplicationParts()
+Result<> Host::makeApplicationParts()
 {
     services().callingApplication = &mParts->callingApplication;
     services().commands = &mParts->commands;
@@ -132,9 +136,14 @@ void Host::makeApplicationParts()
     services().files = &mParts->files.emplace(mParts->layout.resources);
     services().remote =
         &mParts->remote.emplace(mOptions.profileFolder / kRemoteFilesFolder, RemoteFiles::Limits());
-    services().lisp = &mParts->lisp.emplace(LispInterpreter::Options{services().removingTsLisp});
-    mInterruptible = services().lisp;
     mParts->demandLoading.emplace(mParts->layout.plugIns);
+    auto lisp = LispInterpreter::start({services().removingTsLisp});
+    if (!lisp)
+        return lisp.failure();
+    mParts->lisp = *std::move(lisp);
+    services().lisp = mParts->lisp.get();
+    mInterruptible = services().lisp;
+    return {};
 }
 
 void Host::makeUserParts()
@@ -179,18 +188,15 @@ bool Host::finishLine()
     return mCommandLine.tell(mParts->registry->endOfCommand()) && stored;
 }
 
-bool Host::runScript(const std::filesystem::path& script)
+Result<> Host::runScript(const std::filesystem::path& script)
 {
     if (mScriptDepth == kDeepestScript)
-    {
-        mCommandLine.say(L"The script " + wideText(script) +
-                         L" is not run: it seems to be a script that runs itself.");
-        return false;
-    }
+        return Failure{L"The script " + wideText(script) +
+                       L" is not run: it seems to be a script that runs itself."};
     ++mScriptDepth;
-    const bool allWell = Console(mCommandLine, *this).runScript(script);
+    auto done = Console(mCommandLine, *this).runScript(script);
     --mScriptDepth;
-    return allWell;
+    return done;
 }
 
 void Host::end()

@@ -46,8 +46,9 @@ public:
     // the registry is stored, and the queued Lisp is evaluated; a store that fails makes the line fail.
     bool run(const std::wstring& input) override;
 
-    // Runs a file of lines as if typed. Scripts may run scripts, as deep as a sensible one reaches.
-    bool runScript(const std::filesystem::path& script);
+    // Runs a file of lines as if typed. Scripts may run scripts, as deep as a sensible one reaches. Fails
+    // without a sentence when a line of it did: each has been told.
+    Result<> runScript(const std::filesystem::path& script);
 
     // Unloads every application, stores the registry, and takes the parts down.
     void end();
@@ -67,10 +68,10 @@ public:
 private:
     struct Parts;
 
-    bool anotherRuns();
-    bool prepareProfileFolder();
+    Result<> makeParts();
+    Result<> prepareProfileFolder();
     void makeStore();
-    void makeApplicationParts();
+    Result<> makeApplicationParts();
     void makeUserParts();
     void addCommands();
     bool finishLine();

@@ -60,7 +60,7 @@ void greet(CommandLine& commandLine)
 int runBatch(Host& host, const Options& options)
 {
     Console console(host.commandLine(), host);
-    bool allWell = options.script.empty() || host.runScript(options.script);
+    bool allWell = options.script.empty() || host.commandLine().tell(host.runScript(options.script));
     for (const auto& command : options.commands)
         allWell = (host.isEnding() || console.runLine(command)) && allWell;
     return allWell ? kAllWell : kSomethingFailed;

@@ -7,6 +7,8 @@
 
 #include <tessel/tsedcommands.h>
 
+#include "host/text/Result.h"
+
 class TsEdCommand
 {
 public:
@@ -17,7 +19,7 @@ public:
     TsEdCommandHandler handler = nullptr;
 
     // The host's own commands have these instead of a handler.
-    std::function<bool(const std::vector<std::wstring>& arguments)> builtIn;
+    std::function<tessel::Result<>(const std::vector<std::wstring>& arguments)> builtIn;
     std::wstring usage;
     std::wstring summary;
 };

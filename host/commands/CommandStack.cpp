@@ -52,36 +52,32 @@ bool isOwn(const TsEdCommand& command)
     return static_cast<bool>(command.builtIn);
 }
 
-void sayFailed(const std::wstring& name, const std::wstring& reason)
+Failure failed(const std::wstring& name, const std::wstring& reason)
 {
-    services().commandLine->say(L"The command \"" + name + L"\" failed: " + reason);
+    return {L"The command \"" + name + L"\" failed: " + reason};
 }
 
 // What runs here may come from anybody's application: whatever it throws ends with the command.
-bool call(const TsEdCommand& command, const CommandStack::Arguments& arguments)
+Result<> call(const TsEdCommand& command, const CommandStack::Arguments& arguments)
 {
     try
     {
         if (isOwn(command))
             return command.builtIn(arguments);
         if (!arguments.empty())
-        {
-            sayFailed(command.localName, L"it takes no arguments.");
-            return false;
-        }
+            return failed(command.localName, L"it takes no arguments.");
         const CallingApplication::Scope calling(*services().callingApplication, command.owner);
         command.handler();
-        return true;
+        return {};
     }
     catch (const std::exception& error)
     {
-        sayFailed(command.localName, toWide(error.what()));
+        return failed(command.localName, toWide(error.what()));
     }
     catch (...)
     {
-        sayFailed(command.localName, L"it threw something that is not an error of the standard library.");
+        return failed(command.localName, L"it threw something that is not an error of the standard library.");
     }
-    return false;
 }
 } // namespace
 
@@ -156,19 +152,17 @@ bool CommandStack::run(std::wstring_view line)
     const Arguments parts = splitLine(line);
     if (parts.empty())
         return true;
-    const bool done = runParts(parts);
+    const bool done = services().commandLine->tell(runParts(parts));
     const bool finished = !mAfterLine || mAfterLine();
     return done && finished;
 }
 
-bool CommandStack::runParts(const Arguments& parts) const
+Result<> CommandStack::runParts(const Arguments& parts) const
 {
     // Kept alive here: the handler may unload the application and so remove its own command.
     if (const Command command = findOrLoad(parts.front()))
         return call(*command, Arguments(parts.begin() + 1, parts.end()));
-    services().commandLine->say(L"Unknown command \"" + parts.front() +
-                                L"\". Type HELP for the list of commands.");
-    return false;
+    return Failure{L"Unknown command \"" + parts.front() + L"\". Type HELP for the list of commands."};
 }
 
 CommandStack::Command CommandStack::find(std::wstring_view typedName) const

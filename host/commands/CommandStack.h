@@ -10,14 +10,16 @@
 
 #include <tessel/tsedcommands.h>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 class CommandStack : public TsEdCommandStack
 {
 public:
     using Arguments = std::vector<std::wstring>;
-    using BuiltIn = std::function<bool(const Arguments&)>; // false: it failed, and has said why
-    using Names = std::pair<std::wstring, std::wstring>;   // a global and a local name
+    using BuiltIn = std::function<Result<>(const Arguments&)>;
+    using Names = std::pair<std::wstring, std::wstring>; // a global and a local name
 
     struct Description
     {
@@ -52,7 +54,7 @@ public:
 
     // Runs one line: a command's name and its arguments (see `splitLine`). A blank line does nothing. Where
     // several commands share a name, the one registered first runs, so that nobody can take the host's own
-    // away. False when the command is unknown or failed; a sentence has then been said. Nothing that a
+    // away. False when the command is unknown or failed, which has been told by then. Nothing that a
     // handler throws comes out of here.
     bool run(std::wstring_view line);
 
@@ -73,7 +75,7 @@ private:
 
     Command find(std::wstring_view typedName) const;
     Command findOrLoad(const std::wstring& typedName) const;
-    bool runParts(const Arguments& parts) const;
+    Result<> runParts(const Arguments& parts) const;
     std::size_t removeIf(const std::function<bool(const TsEdCommand&)>& goes);
 
     std::vector<Command> mCommands;

@@ -55,14 +55,13 @@ bool Console::runLine(std::string_view line)
     return runLines(lines);
 }
 
-bool Console::runScript(const std::filesystem::path& script)
+Result<> Console::runScript(const std::filesystem::path& script)
 {
     std::ifstream lines(script);
     if (lines && !std::filesystem::is_directory(script))
-        return runLines(lines);
+        return runLines(lines) ? Result<>() : Failure{};
     const char* reason = lines ? std::strerror(EISDIR) : std::strerror(errno);
-    mCommandLine.say(L"The script " + toWide(script.string()) + L" cannot be read: " + toWide(reason) + L".");
-    return false;
+    return Failure{L"The script " + toWide(script.string()) + L" cannot be read: " + toWide(reason) + L"."};
 }
 
 const wchar_t* Console::prompt(const InputAssembler& input) const

@@ -34,8 +34,9 @@ public:
     bool runLines(std::istream& lines);
     bool runLine(std::string_view line);
 
-    // The same with a file of commands; a file that cannot be read is told in a sentence.
-    bool runScript(const std::filesystem::path& script);
+    // The same with a file of commands. Fails when it cannot be read, and without a sentence when one of its
+    // lines did: each has been told.
+    Result<> runScript(const std::filesystem::path& script);
 
 private:
     const wchar_t* prompt(const InputAssembler& input) const;

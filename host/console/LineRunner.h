@@ -14,7 +14,7 @@ public:
     virtual ~LineRunner() = default;
 
     // Runs one command, or Lisp when the text begins with a parenthesis (it may then hold line breaks).
-    // False when it was unknown or failed; a sentence has then been said.
+    // False when it was unknown or failed, which has been told by then.
     virtual bool run(const std::wstring& input) = 0;
 
     // Whether the session is to end.

@@ -77,8 +77,10 @@ Result<> compileFile(const fs::path& input, const fs::path& output)
         return file.failure();
     if (file->kind == LispFile::Kind::kCompiled)
         return Failure{quoted(input) + L" is compiled already."};
-    LispMachine lisp(terminal());
-    const auto byteCode = lisp.compile(file->name, file->text);
+    const auto lisp = LispMachine::start(terminal());
+    if (!lisp)
+        return lisp.failure();
+    const auto byteCode = (*lisp)->compile(file->name, file->text);
     return byteCode ? writeWhole(output, packCompiledLisp(toUtf8(*byteCode))) : byteCode.failure();
 }
 

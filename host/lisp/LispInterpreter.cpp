@@ -34,9 +34,16 @@ bool isToEnd()
 }
 } // namespace
 
-LispInterpreter::LispInterpreter(const Options& options)
-    : mMachine(std::make_unique<LispMachine>(surroundings(options)))
+LispInterpreter::LispInterpreter(std::unique_ptr<LispMachine> machine) : mMachine(std::move(machine))
 {
+}
+
+Result<std::unique_ptr<LispInterpreter>> LispInterpreter::start(const Options& options)
+{
+    auto machine = LispMachine::start(surroundings(options));
+    if (!machine)
+        return machine.failure();
+    return std::unique_ptr<LispInterpreter>(new LispInterpreter(*std::move(machine)));
 }
 
 LispInterpreter::~LispInterpreter() = default;

@@ -27,8 +27,8 @@ public:
     };
 
     // Starts Lisp, on the thread on which everything but `interrupt` is to be called. A later interpreter in
-    // the same process finds none of an earlier one's definitions. One at a time. Throws std::runtime_error.
-    explicit LispInterpreter(const Options& options);
+    // the same process finds none of an earlier one's definitions. One at a time.
+    static Result<std::unique_ptr<LispInterpreter>> start(const Options& options);
     ~LispInterpreter();
     LispInterpreter(const LispInterpreter&) = delete;
     LispInterpreter& operator=(const LispInterpreter&) = delete;
@@ -59,6 +59,8 @@ public:
     bool running() const noexcept;
 
 private:
+    explicit LispInterpreter(std::unique_ptr<LispMachine> machine);
+
     std::unique_ptr<LispMachine> mMachine;
     std::deque<std::wstring> mQueue;
     bool mRunningQueue = false;

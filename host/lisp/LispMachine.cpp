@@ -1,6 +1,5 @@
 #include "host/lisp/LispMachine.h"
 
-#include <stdexcept>
 #include <utility>
 
 #include <ecl/ecl.h>
@@ -124,8 +123,6 @@ struct LispMachine::Parts
     explicit Parts(LispSurroundings given) : surroundings(std::move(given)), interrupter(lispInterrupter())
     {
         connectLispPrimitives(&surroundings, &interrupter);
-        if (!beginSession(surroundings))
-            throw std::runtime_error("Lisp cannot begin a new session.");
     }
     ~Parts() { connectLispPrimitives(nullptr, nullptr); }
     Parts(const Parts&) = delete;
@@ -178,9 +175,18 @@ struct LispMachine::Parts
     LispInterrupter& interrupter;
 };
 
-LispMachine::LispMachine(LispSurroundings surroundings)
-    : mParts(std::make_unique<Parts>(std::move(surroundings)))
+LispMachine::LispMachine(std::unique_ptr<Parts> parts) : mParts(std::move(parts))
 {
+}
+
+Result<std::unique_ptr<LispMachine>> LispMachine::start(LispSurroundings surroundings)
+{
+    if (const Outcome& started = startLisp(); !started)
+        return started.failure();
+    auto parts = std::make_unique<Parts>(std::move(surroundings));
+    if (!beginSession(parts->surroundings))
+        return Failure{L"Lisp cannot begin a new session."};
+    return std::unique_ptr<LispMachine>(new LispMachine(std::move(parts)));
 }
 
 LispMachine::~LispMachine() = default;

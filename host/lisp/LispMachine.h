@@ -34,9 +34,8 @@ class LispMachine
 {
 public:
     // Starts Lisp, or takes over the one that is there with a new, empty user package. One at a time; the
-    // first decides the thread on which all evaluations run. Throws std::runtime_error when Lisp does not
-    // start.
-    explicit LispMachine(LispSurroundings surroundings);
+    // first decides the thread on which all evaluations run.
+    static Result<std::unique_ptr<LispMachine>> start(LispSurroundings surroundings);
     ~LispMachine();
     LispMachine(const LispMachine&) = delete;
     LispMachine& operator=(const LispMachine&) = delete;
@@ -59,6 +58,8 @@ public:
 
 private:
     struct Parts;
+    explicit LispMachine(std::unique_ptr<Parts> parts);
+
     std::unique_ptr<Parts> mParts;
 };
 } // namespace tessel

@@ -1,7 +1,6 @@
 #include "host/lisp/LispStart.h"
 
 #include <algorithm>
-#include <stdexcept>
 #include <string_view>
 
 #include <sys/resource.h>
@@ -84,7 +83,7 @@ cl_object startPrelude(std::wstring_view prelude)
     return fault;
 }
 
-LispFunctions startLisp()
+Result<LispFunctions> boot()
 {
     setSignalOptions();
     const cl_fixnum usualFrameStackSize = ecl_get_option(ECL_OPT_FRAME_STACK_SIZE);
@@ -104,16 +103,22 @@ LispFunctions startLisp()
     raiseStackLimit();
     cl_object fault = startPrelude(toWide(lispPrelude()));
     if (fault != ECL_NIL)
-        throw std::runtime_error("Lisp did not start: " + toUtf8(fromLisp(fault)));
-    return {functionNamed("BEGIN-SESSION"), functionNamed("EVALUATE"),    functionNamed("INVOKE"),
-            functionNamed("COMPILE-TEXT"),  functionNamed("INTERRUPTED"), functionNamed("MAKE-USER-SYMBOL")};
+        return Failure{L"Lisp did not start: " + fromLisp(fault)};
+    return LispFunctions{functionNamed("BEGIN-SESSION"), functionNamed("EVALUATE"),
+                         functionNamed("INVOKE"),        functionNamed("COMPILE-TEXT"),
+                         functionNamed("INTERRUPTED"),   functionNamed("MAKE-USER-SYMBOL")};
 }
 } // namespace
 
+const Result<LispFunctions>& startLisp()
+{
+    static const Result<LispFunctions> started = boot();
+    return started;
+}
+
 const LispFunctions& lispFunctions()
 {
-    static const LispFunctions functions = startLisp();
-    return functions;
+    return *startLisp();
 }
 
 LispInterrupter& lispInterrupter()

@@ -5,6 +5,8 @@
 
 #include <ecl/ecl.h>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 class LispInterrupter;
@@ -23,7 +25,10 @@ struct LispFunctions
     cl_object makeSymbol;
 };
 
-// Starts Lisp if it does not run yet, on this thread. Throws std::runtime_error.
+// Starts Lisp if that has not been tried yet, on this thread.
+const Result<LispFunctions>& startLisp();
+
+// Of the Lisp that was started.
 const LispFunctions& lispFunctions();
 
 // One for the process: a thread that joins Lisp takes memory that Lisp does not give back.

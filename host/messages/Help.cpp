@@ -31,24 +31,25 @@ Help::Help(std::filesystem::path book, Browser browser) : mBook(std::move(book))
 {
 }
 
-bool Help::show(const std::wstring& topic, const std::filesystem::path& otherBook)
+Result<std::wstring> Help::show(const std::wstring& topic, const std::filesystem::path& otherBook)
 {
-    CommandLine& commandLine = *services().commandLine;
     const std::wstring name = topic.empty() ? kFirstPage : topic;
     const auto page = (otherBook.empty() ? mBook : otherBook) / (toUtf8(name) + ".html");
     if (!isTopicName(name) || !isFile(page))
-    {
-        commandLine.say(L"There is no help on \"" + name + L"\".");
-        return false;
-    }
+        return Failure{L"There is no help on \"" + name + L"\"."};
     const bool shown = mBrowser(page);
-    commandLine.say((shown ? L"The help opens in the browser: " : L"Help: ") + toWide(page.string()));
-    return true;
+    return (shown ? L"The help opens in the browser: " : L"Help: ") + toWide(page.string());
 }
 } // namespace tessel
 
 bool tsedHelp(const wchar_t* file, const wchar_t* topic, int)
 {
     auto* help = tessel::services().help;
-    return help && help->show(topic ? topic : L"", file ? tessel::toUtf8(file) : "");
+    if (!help)
+        return false;
+    tessel::CommandLine& commandLine = *tessel::services().commandLine;
+    const auto shown = help->show(topic ? topic : L"", file ? tessel::toUtf8(file) : "");
+    if (shown)
+        commandLine.say(*shown);
+    return commandLine.tell(shown);
 }

@@ -5,6 +5,8 @@
 #include <functional>
 #include <string>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 class Help
@@ -17,9 +19,9 @@ public:
     Help(std::filesystem::path book, Browser browser);
 
     // Shows a topic of the host's book, or of another one when its folder is given; an empty topic is the
-    // first page of the book. Without a browser the page's path is printed. Answers whether the topic exists;
-    // if not, a sentence says so.
-    bool show(const std::wstring& topic, const std::filesystem::path& otherBook = {});
+    // first page of the book. Answers what to tell the person: where the page opens, or without a browser its
+    // path. Fails when there is no such topic.
+    Result<std::wstring> show(const std::wstring& topic, const std::filesystem::path& otherBook = {});
 
 private:
     std::filesystem::path mBook;

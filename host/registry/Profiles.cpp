@@ -4,7 +4,6 @@
 
 #include "host/Services.h"
 #include "host/registry/Registry.h"
-#include "host/text/CommandLine.h"
 
 namespace tessel
 {
@@ -21,25 +20,20 @@ std::wstring profilesKey()
 bool isProfileName(const std::wstring& name)
 {
     return !name.empty() && name.size() <= kLongestName && name.find(L'\\') == name.npos;
-}
-bool refuse(const std::wstring& sentence)
-{
-    services().commandLine->say(sentence);
-    return false;
-}
-} // namespace
+}} // namespace
 
 std::wstring currentProfile()
 {
     return services().registry->read(profilesKey(), kCurrentProfileValue).value_or(L"");
 }
 
-bool setCurrentProfile(const std::wstring& name)
+Result<> setCurrentProfile(const std::wstring& name)
 {
     if (!isProfileName(name))
-        return refuse(L"\"" + name + L"\" cannot be the name of a profile.");
+        return Failure{L"\"" + name + L"\" cannot be the name of a profile."};
     if (!services().registry->write(profilesKey(), kCurrentProfileValue, name))
-        return refuse(L"The profile cannot be changed to \"" + name + L"\": the registry cannot be written.");
-    return true;
+        return Failure{L"The profile cannot be changed to \"" + name +
+                       L"\": the registry cannot be written."};
+    return {};
 }
 } // namespace tessel

@@ -4,12 +4,14 @@
 
 #include <string>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 // The current profile's name; empty when the registry cannot be read.
 std::wstring currentProfile();
 
-// Makes a profile the current one; one that is new begins empty. False when the name cannot be that of a key
-// or the registry cannot be written; a sentence has then been said.
-bool setCurrentProfile(const std::wstring& name);
+// Makes a profile the current one; one that is new begins empty. Fails when the name cannot be that of a key
+// or the registry cannot be written.
+Result<> setCurrentProfile(const std::wstring& name);
 } // namespace tessel

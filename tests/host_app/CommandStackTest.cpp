@@ -187,11 +187,12 @@ TEST_F(Commands, OfTheHostTakeArgumentsAndStay)
                      [&](const auto& arguments)
                      {
                          seen = arguments;
-                         return arguments.size() != 1;
+                         return arguments.size() != 1 ? tessel::Result<>() : tessel::Failure{L"Too few."};
                      });
     EXPECT_TRUE(stack.run(LR"(echo "a b" c)"));
     EXPECT_THAT(seen, ElementsAre(L"a b", L"c"));
     EXPECT_FALSE(stack.run(L"ECHO x"));
+    EXPECT_EQ(output.text(), "Too few.\n");
     EXPECT_EQ(stack.removeGroup(L"Session"), TSED_COMMAND_UNKNOWN);
     EXPECT_EQ(stack.removeCommand(L"Session", L"ECHO"), TSED_COMMAND_UNKNOWN);
     stack.removeCommandsOf(L"");
@@ -221,7 +222,7 @@ TEST_F(Commands, AreDescribedGroupByGroup)
 {
     const auto nothing = [](const auto&)
     {
-        return true;
+        return tessel::Result<>();
     };
     stack.addBuiltIn({L"Session", L"HELP", L"[name]", L"Helps"}, nothing);
     add(kFirst, L"DRAW", L"A", L"EINS");

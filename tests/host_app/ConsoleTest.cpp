@@ -109,10 +109,10 @@ TEST_F(Console, RunsAScriptFromAFile)
 TEST_F(Console, SaysWhyAScriptCannotBeRead)
 {
     const TemporaryFolder folder;
-    EXPECT_FALSE(console.runScript(folder / "missing.script"));
+    EXPECT_FALSE(output.commandLine().tell(console.runScript(folder / "missing.script")));
     EXPECT_THAT(output.text(), StartsWith("The script " + (folder / "missing.script").string() +
                                           " cannot be read: No such file or directory."));
     output.clear();
-    EXPECT_FALSE(console.runScript(folder.path()));
+    EXPECT_FALSE(output.commandLine().tell(console.runScript(folder.path())));
     EXPECT_THAT(output.text(), HasSubstr("cannot be read: Is a directory."));
 }

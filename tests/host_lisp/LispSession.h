@@ -2,6 +2,7 @@
 #pragma once
 
 #include <functional>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -21,19 +22,20 @@ class LispSession
 {
 public:
     explicit LispSession(bool removingTsLisp = true)
-        : mLisp({.removingTsLisp = removingTsLisp, .heapBytes = kTestHeapBytes})
+        : mLisp(*tessel::LispInterpreter::start(
+              {.removingTsLisp = removingTsLisp, .heapBytes = kTestHeapBytes}))
     {
         auto& services = tessel::services();
         services.commandLine = &mCommandLine;
         services.document = &mDocument;
-        services.lisp = &mLisp;
+        services.lisp = mLisp.get();
         services.removingTsLisp = removingTsLisp;
     }
     ~LispSession() { tessel::services() = {}; }
     LispSession(const LispSession&) = delete;
     LispSession& operator=(const LispSession&) = delete;
 
-    tessel::LispInterpreter& lisp() { return mLisp; }
+    tessel::LispInterpreter& lisp() { return *mLisp; }
     tessel::Document& document() { return mDocument; }
     tessel::CommandLine& commandLine() { return mCommandLine; }
     const std::string& output() const { return mOutput; }
@@ -45,7 +47,7 @@ public:
     // The printed value; a failure fails the test.
     std::string value(const std::string& expression)
     {
-        const auto value = mLisp.evaluate(tessel::toWide(expression));
+        const auto value = mLisp->evaluate(tessel::toWide(expression));
         EXPECT_TRUE(value) << expression << ": " << tessel::toUtf8(value.sentence());
         return tessel::toUtf8(value ? *value : value.sentence());
     }
@@ -53,7 +55,7 @@ public:
     // The line of error text; success fails the test, and so does more than one line.
     std::string error(const std::string& expression)
     {
-        const auto value = mLisp.evaluate(tessel::toWide(expression));
+        const auto value = mLisp->evaluate(tessel::toWide(expression));
         EXPECT_FALSE(value) << expression << ": " << (value ? tessel::toUtf8(*value) : "");
         EXPECT_EQ(value.sentence().find(L'\n'), std::wstring::npos) << tessel::toUtf8(value.sentence());
         return tessel::toUtf8(value.sentence());
@@ -82,5 +84,5 @@ private:
                                          receive(piece);
                                      }};
     tessel::Document mDocument;
-    tessel::LispInterpreter mLisp;
+    std::unique_ptr<tessel::LispInterpreter> mLisp;
 };
