@@ -72,7 +72,7 @@ public:
     bool RemoveFirstNoCase(const CStdStr& text);
 
     // Whether an entry stands for the same application as the path (see `SplitPath` and `MatchesEntry`).
-    bool HoldsApplication(const CStdStr& path) const;
+    [[nodiscard]] bool HoldsApplication(const CStdStr& path) const;
 
 private:
     // By the hash of what an entry is matched by.
@@ -87,4 +87,4 @@ private:
 
 // The rule by which an entry stands for the same application as a path: an entry that is known by its file
 // name alone matches on that; any other matches on file name and folder. Case never matters.
-bool MatchesEntry(const SplitPath& entry, const SplitPath& target);
+[[nodiscard]] bool MatchesEntry(const SplitPath& entry, const SplitPath& target);

@@ -107,8 +107,9 @@
     TsOCFileFilter* filter = [self selectedFilter];
     if (!filter)
         return;
-    if (sender)
-        ModrigUtils::SetRegFileFilterListIndex(ModrigUtils::PathFromString([filter description]));
+    if (sender) // a failure has been told in a box, and the filter counts all the same
+        static_cast<void>(
+            ModrigUtils::SetRegFileFilterListIndex(ModrigUtils::PathFromString([filter description])));
     NSArray* chosen = [[mSelectedFiles copy] autorelease];
     const bool chosenInHistory = [self historyIsChosen];
     [self filterPanelAgain];

@@ -8,14 +8,14 @@ namespace ModrigUtils
 // Whether the list has an entry for the application at the path: the same folder and file name in any case,
 // or, for object-database modules (.omp), the same file name wherever it lies. A path that is too long to be
 // taken apart stands for itself only.
-bool FoundinSpecificList(const CStdStr& path, const CStringList& list);
+[[nodiscard]] bool FoundinSpecificList(const CStdStr& path, const CStringList& list);
 
-bool FoundinStartupList(const CStdStr& path);
-bool FoundinHistoryList(const CStdStr& path);
-bool FoundinLoadedList(const CStdStr& path);
+[[nodiscard]] bool FoundinStartupList(const CStdStr& path);
+[[nodiscard]] bool FoundinHistoryList(const CStdStr& path);
+[[nodiscard]] bool FoundinLoadedList(const CStdStr& path);
 
 // Whether the path names a Lisp file (.lsp, .rpk, .qbc) that is in the list of loaded applications.
-bool IsALispAppFoundinList(const CStdStr& path);
+[[nodiscard]] bool IsALispAppFoundinList(const CStdStr& path);
 
 // Erases the first entry that equals the whole path without regard to case, if there is one. The rule for
 // object-database modules does not apply here.

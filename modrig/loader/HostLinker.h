@@ -12,8 +12,8 @@ inline constexpr bool kResolveNow = true;
 
 // The linker service, looked up again for every call of it: what loading runs may replace it. Null in a host
 // without one.
-TsRxDynamicLinker* HostLinker();
+[[nodiscard]] TsRxDynamicLinker* HostLinker();
 
 // Whether the host keeps the module at the path from being unloaded.
-bool IsModuleLocked(const CStdStr& path);
+[[nodiscard]] bool IsModuleLocked(const CStdStr& path);
 } // namespace ModrigUtils

@@ -15,11 +15,11 @@ void PopulateLoadedApps();
 
 // Whether the host has the compiled module loaded (asked by file name). True for files of every other kind. A
 // path without a dot: message 2 and false.
-bool ApplicationIsLoaded(CStdStr path);
+[[nodiscard]] bool ApplicationIsLoaded(CStdStr path);
 
 // Whether the compiled module may be unloaded. False for files of every other kind. A path without a dot:
 // message 2 and true.
-bool IsAppUnloadAble(CStdStr path);
+[[nodiscard]] bool IsAppUnloadAble(CStdStr path);
 
 // An application that the user wants unloaded, and whether it could be unloaded when it was listed.
 struct UnloadCandidate

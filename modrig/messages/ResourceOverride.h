@@ -18,7 +18,7 @@ public:
 
     // Loads the module's resource module, once: false when it is loaded already, or cannot be. With a
     // language other than 0 the folder "en-us" is tried first, whatever the language.
-    static bool SetDefaultResource(long language, CStdStr moduleName);
+    [[nodiscard]] static bool SetDefaultResource(long language, CStdStr moduleName);
 
     // Gives the resource module back. Nothing happens when none is loaded.
     static void ReleaseDefaultResource();

@@ -35,11 +35,11 @@ extern CExtInfo sExtInfo[kApplicationTypes];
 namespace ModrigUtils
 {
 // The first enabled row with that extension (no dot, any case), or null.
-const CExtInfo* FindExtension(const CStdStr& ext);
+[[nodiscard]] const CExtInfo* FindExtension(const CStdStr& ext);
 
 // The kind that goes with an extension given without its dot, in any case; kNoApplication when there is none.
-int FileType(CStdStr ext);
+[[nodiscard]] int FileType(CStdStr ext);
 
 // The kind of the file at the path, by the text after the path's last dot.
-int FileTypeOfPath(const CStdStr& path);
+[[nodiscard]] int FileTypeOfPath(const CStdStr& path);
 } // namespace ModrigUtils

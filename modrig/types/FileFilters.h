@@ -6,10 +6,10 @@
 namespace ModrigUtils
 {
 // The description of the filter last chosen, or an empty text.
-CStdStr GetRegFileFilterListIndex();
+[[nodiscard]] CStdStr GetRegFileFilterListIndex();
 
 // Remembers the description of the chosen filter. A failure is told in message box 24.
-bool SetRegFileFilterListIndex(const CStdStr& filter);
+[[nodiscard]] bool SetRegFileFilterListIndex(const CStdStr& filter);
 
 // Replaces the string with the module's own filters, "description|*.a;*.b|" one after the other, every entry
 // followed by a "|", the last one too. The remembered choice comes first. Only extensions of the application

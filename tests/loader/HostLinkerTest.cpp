@@ -14,7 +14,7 @@ class HostLinker : public ModuleTest
 TEST_F(HostLinker, IsLookedUpAnewForEveryCall)
 {
     EXPECT_EQ(&host().linker, ModrigUtils::HostLinker());
-    ModrigUtils::HostLinker();
+    EXPECT_EQ(&host().linker, ModrigUtils::HostLinker());
     EXPECT_THAT(host().services.asked, ElementsAre(L"DynamicLinker", L"DynamicLinker"));
 }
 

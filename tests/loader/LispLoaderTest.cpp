@@ -114,7 +114,7 @@ TEST_F(LispLoader, KeepsBlanksPerCentSignsAndLettersOfAnyScript)
     EXPECT_EQ(L"/a b/100%s%n%%.lsp", SafePath(L"/a b/100%s%n%%.lsp"));
     EXPECT_EQ(L"C:/ä/чертёж.lsp", SafePath(L"C:\\ä\\чертёж.lsp"));
     host().lisp.queued.clear();
-    LoadLispFile(L"/a/100%s%n%%.lsp", 1, 1);
+    EXPECT_TRUE(LoadLispFile(L"/a/100%s%n%%.lsp", 1, 1));
     EXPECT_EQ(L"(progn (_INTERNAL-LOAD-ALL-FILE \"/a/100%s%n%%.lsp\" nil T T nil)(princ))", First());
 }
 
@@ -137,18 +137,18 @@ TEST_F(LispLoader, QueuesAPathOf4000CharactersWhole)
     const std::wstring path = LongPath(4000, L"tool.lsp");
     EXPECT_EQ(path, SafePath(path));
     host().lisp.queued.clear();
-    LoadLispFile(CStdStr(path), 1, 1);
+    EXPECT_TRUE(LoadLispFile(CStdStr(path), 1, 1));
     EXPECT_EQ(L"(progn (_INTERNAL-LOAD-ALL-FILE \"" + path + L"\" nil T T nil)(princ))", First());
 }
 
 TEST_F(LispLoader, TakesThePromptFromTheTexts)
 {
     host().resources.setText(kResourceModuleName, 15, L"100%s>");
-    LoadLispFile(L"/a/tool.lsp", 1, 0);
+    EXPECT_TRUE(LoadLispFile(L"/a/tool.lsp", 1, 0));
     ASSERT_FALSE(queued().empty());
     EXPECT_EQ(L"(prompt \"100%s> \")", queued().back());
     host().resources.removeText(kResourceModuleName, 15);
-    LoadLispFile(L"/a/tool.lsp", 1, 0);
+    EXPECT_TRUE(LoadLispFile(L"/a/tool.lsp", 1, 0));
     EXPECT_EQ(L"(prompt \" \")", queued().back());
 }
 

@@ -85,8 +85,7 @@ TEST_F(ModuleKey, IsMadeWithItsParentAndStaysTheSame)
 
 TEST_F(ModuleKey, IsMadeAnewOnEveryCall)
 {
-    GetModrigProfileRegKey();
-    GetModrigProfileRegKey();
+    EXPECT_EQ(GetModrigProfileRegKey(), GetModrigProfileRegKey());
     std::vector<std::wstring> made;
     for (const RecordingRegistry::Call& call : registry().callsOf(Operation::kCreate))
         made.push_back(call.key);
@@ -304,7 +303,7 @@ TEST_F(ProfileRegistry, OpensAKeyForReadingWithNothingReserved)
     CStdStr data;
     Read(L"name", data);
     CStringList names;
-    EnumModrigRegString(HKEY_CURRENT_USER, kKey, names);
+    static_cast<void>(EnumModrigRegString(HKEY_CURRENT_USER, kKey, names)); // there is nothing
     const std::vector<RecordingRegistry::Call> opened = registry().callsOf(Operation::kOpen);
     ASSERT_EQ(2u, opened.size());
     for (const RecordingRegistry::Call& call : opened)
@@ -348,7 +347,7 @@ TEST_F(ProfileRegistry, AsksForEachNameWithRoomFor1024CharactersAndForNothingEls
     registry().setValue(kKey, L"first and longer", L"data");
     registry().setValue(kKey, L"second", L"data");
     CStringList names;
-    EnumModrigRegString(HKEY_CURRENT_USER, kKey, names);
+    EXPECT_TRUE(EnumModrigRegString(HKEY_CURRENT_USER, kKey, names));
     const std::vector<RecordingRegistry::Call> asked = registry().callsOf(Operation::kEnumerate);
     ASSERT_EQ(3u, asked.size());
     for (const RecordingRegistry::Call& call : asked)
