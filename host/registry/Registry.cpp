@@ -98,7 +98,7 @@ Result<Registry::Key> Registry::create(std::wstring_view path, Key from)
         if (part.empty())
             continue;
         const Key found = findChild(key, part);
-        const auto child = found != kNoKey ? Result<Key>(found) : createChild(key, part);
+        auto child = found != kNoKey ? Result<Key>(found) : createChild(key, part);
         if (!child)
             return child;
         key = *child;

@@ -126,18 +126,18 @@ Result<> Registry::openFile()
 // Whether the file is a registry that this host understands. Answers its version, 0 for a new one.
 Result<int> Registry::checkOrigin()
 {
-    const auto version = firstNumber(mDatabase, kAskVersion);
+    auto version = firstNumber(mDatabase, kAskVersion);
     if (!version || *version == kSchemaVersion)
         return version;
     if (*version > kSchemaVersion)
         return Failure{L"it was written by a newer Tessel"};
-    const auto tables = firstNumber(mDatabase, "SELECT count(*) FROM sqlite_master");
+    auto tables = firstNumber(mDatabase, "SELECT count(*) FROM sqlite_master");
     if (!tables)
         return tables;
     if (*tables == 0)
         return version;
     // Another process may have made the registry between the two looks; then it says its version by now.
-    const auto versionNow = firstNumber(mDatabase, kAskVersion);
+    auto versionNow = firstNumber(mDatabase, kAskVersion);
     if (versionNow && *versionNow < kSchemaVersion)
         return Failure{L"it belongs to another program"};
     return versionNow;
