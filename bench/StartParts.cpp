@@ -24,10 +24,9 @@ int main(int argc, char** argv)
     tessel::ensureCurrentProfile(registry, L"Software\\Tessel\\R21");
     if (!registry.endOfCommand())
         return 1;
-    if (!tessel::LispInterpreter::start({}))
-        return 1;
+    const auto lisp = tessel::LispInterpreter::start({});
     const auto file = tessel::moduleFileAt(argv[2]);
-    if (!file)
+    if (!lisp || !file)
         return 1;
     const auto bundle = tessel::ModuleLibrary::open(*file, true);
     return bundle && (*bundle)->entryPoint() ? 0 : 1;

@@ -49,7 +49,7 @@ int ApplicationServices::fetchRemoteFile(const wchar_t* url, wchar_t* localPath,
     if (!services().remote)
         return TS_FETCH_FAILED;
     const auto copy = fetch(url ? url : L"", localPath ? capacity : 0, ignoreCache);
-    if (!services().commandLine->tell(copy))
+    if (!services().commandLine->tell(copy) || !localPath) // without room for the path it has failed
         return copy.code();
     std::wmemcpy(localPath, copy->path.c_str(), copy->path.size() + 1);
     return copy->status;
