@@ -5,11 +5,17 @@
 
 #include <cstdlib>
 
+#include <sys/wait.h>
+
 #include "tests/support/RecordingHost.h"
 
 namespace
 {
-constexpr int kLeaked = 23; // the leak checker's own status
+// With a status of the leak checker's own, which is another one within the address sanitizer.
+bool hasFailed(int status)
+{
+    return WIFEXITED(status) && WEXITSTATUS(status) != EXIT_SUCCESS;
+}
 
 // Not inlined, and with a stack of its own: what lies about there would still count as known.
 [[gnu::noinline]] void askForTheVariable(bool givesItBack)
@@ -33,5 +39,5 @@ void endAfterAsking(bool givesItBack)
 TEST(LeakCheck, FailsAProgramThatLosesTheStringOfAVariable)
 {
     EXPECT_EXIT(endAfterAsking(true), testing::ExitedWithCode(EXIT_SUCCESS), "");
-    EXPECT_EXIT(endAfterAsking(false), testing::ExitedWithCode(kLeaked), "tsedGetVar");
+    EXPECT_EXIT(endAfterAsking(false), hasFailed, "tsedGetVar");
 }
