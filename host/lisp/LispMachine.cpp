@@ -1,5 +1,6 @@
 #include "host/lisp/LispMachine.h"
 
+#include <system_error>
 #include <utility>
 
 #include <ecl/ecl.h>
@@ -10,6 +11,7 @@
 #include "host/lisp/LispSource.h"
 #include "host/lisp/LispStart.h"
 #include "host/lisp/LispValues.h"
+#include "host/text/Unicode.h"
 
 namespace tessel
 {
@@ -180,6 +182,7 @@ LispMachine::LispMachine(std::unique_ptr<Parts> parts) : mParts(std::move(parts)
 }
 
 Result<std::unique_ptr<LispMachine>> LispMachine::start(LispSurroundings surroundings)
+try
 {
     if (const Outcome& started = startLisp(); !started)
         return started.failure();
@@ -187,6 +190,10 @@ Result<std::unique_ptr<LispMachine>> LispMachine::start(LispSurroundings surroun
     if (!beginSession(parts->surroundings))
         return Failure{L"Lisp cannot begin a new session."};
     return std::unique_ptr<LispMachine>(new LispMachine(std::move(parts)));
+}
+catch (const std::system_error& error) // no pipe or thread for interrupting Lisp
+{
+    return Failure{L"Lisp did not start: " + toWide(error.what()) + L"."};
 }
 
 LispMachine::~LispMachine() = default;
