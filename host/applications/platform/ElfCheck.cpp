@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <array>
+#include <cstdint>
 #include <cstring>
 #include <span>
 
@@ -92,12 +93,27 @@ Result<> checkLoadedSegment(const Segment& segment, std::uint64_t fileSize)
                                                                                    : refused(kDamaged);
 }
 
+// How far a segment's addresses lie past its place in the file.
+std::uint64_t shiftOf(const Segment& segment)
+{
+    return segment.p_vaddr - segment.p_offset;
+}
+
+// Linkers leave no more room before a segment than its alignment asks for, and what the one before it has
+// that the file does not hold: one farther away has been moved, and what is written there ends the host.
+bool isNear(const Segment& segment, const Segment& previous)
+{
+    const std::uint64_t room =
+        std::max<std::uint64_t>(segment.p_align, kPage) + pageEnd(previous.p_memsz - previous.p_filesz);
+    return static_cast<std::int64_t>(shiftOf(segment) - shiftOf(previous)) <= static_cast<std::int64_t>(room);
+}
+
 // The system maps each segment over what stands at its addresses, so they have to follow one another, on
 // pages of their own.
 bool follows(const Segment& segment, const Segment& previous)
 {
     return pageStart(segment.p_vaddr) >= pageEnd(previous.p_vaddr + previous.p_memsz) &&
-           segment.p_offset >= previous.p_offset + previous.p_filesz;
+           segment.p_offset >= previous.p_offset + previous.p_filesz && isNear(segment, previous);
 }
 
 Result<> checkLoadedSegments(std::span<const Segment> segments, std::uint64_t fileSize)
