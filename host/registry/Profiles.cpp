@@ -20,7 +20,8 @@ std::wstring profilesKey()
 bool isProfileName(const std::wstring& name)
 {
     return !name.empty() && name.size() <= kLongestName && name.find(L'\\') == name.npos;
-}} // namespace
+}
+} // namespace
 
 std::wstring currentProfile()
 {

@@ -72,7 +72,8 @@ void append(std::u16string& utf16, char32_t code)
 }
 
 // The text's characters, one by one, in another encoding.
-template <class Encoded> Encoded encoded(std::wstring_view text)
+template <class Encoded>
+Encoded encoded(std::wstring_view text)
 {
     Encoded result;
     result.reserve(text.size());

@@ -7,20 +7,10 @@
 #include <gmock/gmock.h>
 
 #include "modrig/base/SplitPath.h"
+#include "tests/support/ModuleTest.h"
 
 using testing::ElementsAre;
 using testing::IsEmpty;
-
-namespace
-{
-std::vector<std::wstring> Texts(const CStringList& list)
-{
-    std::vector<std::wstring> texts;
-    for (const CStdStr& text : list)
-        texts.push_back(text.Text());
-    return texts;
-}
-} // namespace
 
 TEST(StringList, BeginsEmpty)
 {

@@ -5,6 +5,9 @@
 
 #include "tests/contract/HostUnderTest.h"
 
+// Room for a path, as the calls want it.
+inline constexpr std::size_t kPathSize = 1024;
+
 class ContractTest : public testing::Test
 {
 protected:

@@ -8,8 +8,6 @@
 
 namespace
 {
-constexpr std::size_t kPathSize = 1024;
-
 class FilesContract : public ContractTest
 {
 protected:

@@ -6,7 +6,6 @@
 
 namespace
 {
-constexpr std::size_t kPathSize = 1024;
 constexpr const wchar_t* kUntouched = L"untouched";
 
 class InternetContract : public ContractTest

@@ -8,8 +8,6 @@ using testing::IsEmpty;
 
 namespace
 {
-constexpr std::size_t kPathSize = 1024;
-
 std::size_t countOf(const std::wstring& text, const std::wstring& part)
 {
     std::size_t count = 0;

@@ -4,7 +4,7 @@
 
 namespace
 {
-constexpr int kTextSize = 64;
+constexpr int kBufferSize = 64;
 
 class ResourcesContract : public ContractTest
 {
@@ -13,8 +13,8 @@ protected:
 
     static std::wstring text(HMODULE module, unsigned id)
     {
-        wchar_t buffer[kTextSize] = L"before";
-        const int length = loadStringFromWin32ResourceDLL(module, id, buffer, kTextSize);
+        wchar_t buffer[kBufferSize] = L"before";
+        const int length = loadStringFromWin32ResourceDLL(module, id, buffer, kBufferSize);
         EXPECT_EQ(static_cast<std::size_t>(length), std::wcslen(buffer));
         return buffer;
     }

@@ -13,8 +13,6 @@ using testing::IsEmpty;
 
 namespace
 {
-constexpr std::size_t kPathSize = 1024;
-
 class ServicesContract : public ContractTest
 {
 protected:

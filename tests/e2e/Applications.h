@@ -17,6 +17,9 @@ inline constexpr char kRecordKey[] = R"(Software\Tessel\R21\Applications\TesselM
 
 using Paths = std::vector<std::string>;
 
+// What the sample of primes says when it is loaded.
+inline constexpr char kPrimes[] = "Primes: type PRIMES to see them on a spiral.\n";
+
 std::string sample(const std::string& name);
 std::string fixtureModule(const std::string& name);
 std::string lispFixture(const std::string& name);

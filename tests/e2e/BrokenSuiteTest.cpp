@@ -10,6 +10,7 @@
 
 #include "tests/e2e/Applications.h"
 #include "tests/e2e/HostTerminal.h"
+#include "tests/support/Content.h"
 
 namespace fs = std::filesystem;
 
@@ -21,12 +22,6 @@ namespace
 constexpr char kGoOn[] = "VERSION";
 constexpr char kStillThere[] = "Command: VERSION\nTessel R21, reference host for Modrig\n";
 constexpr char kGoodLisp[] = "good.lsp: loaded\n";
-
-std::string contentOf(const fs::path& file)
-{
-    std::ifstream stream(file, std::ios::binary);
-    return {std::istreambuf_iterator<char>(stream), {}};
-}
 
 // What is said about a broken file between a good file of its kind and another one.
 class BrokenSuite : public testing::Test

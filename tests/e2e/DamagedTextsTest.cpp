@@ -6,6 +6,7 @@
 #include <random>
 
 #include "tests/e2e/Applications.h"
+#include "tests/support/Content.h"
 
 namespace fs = std::filesystem;
 
@@ -14,12 +15,6 @@ using testing::HasSubstr;
 
 namespace
 {
-std::string contentOf(const fs::path& file)
-{
-    std::ifstream stream(file, std::ios::binary);
-    return {std::istreambuf_iterator<char>(stream), {}};
-}
-
 class DamagedTexts : public testing::Test
 {
 protected:

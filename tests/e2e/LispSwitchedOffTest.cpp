@@ -5,7 +5,6 @@
 
 namespace
 {
-constexpr char kPrimes[] = "Primes: type PRIMES to see them on a spiral.\n";
 constexpr char kGood[] = "good.lsp: loaded\n";
 
 // The variable counts for the session only, so that Modrig must be loaded after it is set.

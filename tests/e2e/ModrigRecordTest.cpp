@@ -6,7 +6,6 @@
 
 namespace
 {
-constexpr char kPrimes[] = "Primes: type PRIMES to see them on a spiral.\n";
 constexpr char kNoDisplay[] = "Tessel cannot open a window: there is no display.\n";
 
 const std::string kListRecord = std::string("REGISTRY LIST ") + kRecordKey;

@@ -57,7 +57,7 @@ protected:
     HostSession session;
 };
 
-std::string nameOf(const testing::TestParamInfo<OddName>& info)
+std::string labelOf(const testing::TestParamInfo<OddName>& info)
 {
     return info.param.test;
 }
@@ -105,7 +105,7 @@ INSTANTIATE_TEST_SUITE_P(WithOddNames, OddPaths,
                                          OddName{"Dollars", "$HOME `id` ; & | *"},
                                          OddName{"Brackets", "(setq [x] #{y} #. )"},
                                          OddName{"Dots", "a.b..c.zmb"}, OddName{"Tildes", "~ ~% ~A @x"}),
-                         nameOf);
+                         labelOf);
 
 TEST_F(OddPaths, OfFourThousandCharactersAreLoadedByHand)
 {

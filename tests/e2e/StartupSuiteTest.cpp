@@ -5,7 +5,6 @@
 
 namespace
 {
-constexpr char kPrimes[] = "Primes: type PRIMES to see them on a spiral.\n";
 constexpr char kGears[] = "Gears: type GEARS for the table of a speed reducer.\n";
 constexpr char kMoon[] = "Moon: type MOONPHASE for tonight's moon, LOCKMOON to keep this module loaded, "
                          "UNLOCKMOON to let it go.\n";

@@ -1,37 +1,12 @@
 // Applications that are loaded when the host starts, and by hand.
 #include <gmock/gmock.h>
 
+#include "tests/e2e/Applications.h"
 #include "tests/e2e/HostProcess.h"
 
 using testing::AllOf;
 using testing::HasSubstr;
 using testing::Not;
-
-namespace
-{
-constexpr char kSuiteKey[] = R"(Software\Tessel\R21\Profiles\Default\Dialogs\Modrig\Startup)";
-
-std::string sample(const std::string& name)
-{
-    return std::string(SAMPLES_FOLDER) + "/" + name;
-}
-
-// Puts the paths into the stored Startup Suite.
-void storeSuite(const HostSession& session, const std::vector<std::string>& paths)
-{
-    std::vector<std::string> arguments = {"--safe"};
-    const auto set = [&](const std::string& name, const std::string& data)
-    {
-        arguments.insert(arguments.end(),
-                         {"-c", std::string("REGISTRY SET ") + kSuiteKey + " " + name + " \"" + data + "\""});
-    };
-    set("NumStartup", std::to_string(paths.size()));
-    for (std::size_t index = 0; index < paths.size(); ++index)
-        set(std::to_string(index + 1) + "Startup", paths[index]);
-    const auto result = session.start(arguments);
-    ASSERT_EQ(result.exitStatus, 0) << result.output;
-}
-} // namespace
 
 TEST(Startup, LoadsModrigWhichRegistersItsCommand)
 {

@@ -1,5 +1,6 @@
 // What the toolkit brings along: programs of its own, settings, complaints.
 #include "tests/e2e_dialogs/DialogTest.h"
+#include "tests/support/Content.h"
 
 #include <fstream>
 #include <iterator>
@@ -10,12 +11,6 @@ using testing::Not;
 namespace
 {
 constexpr std::chrono::seconds kSoon{4};
-
-std::string contentOf(const std::filesystem::path& path)
-{
-    std::ifstream file(path, std::ios::binary);
-    return {std::istreambuf_iterator<char>(file), {}};
-}
 
 class DialogToolkit : public DialogTest
 {

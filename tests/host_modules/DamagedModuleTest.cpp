@@ -1,6 +1,7 @@
 // What the check of a shared library promises, tried on a real one: no cut file and no changed header byte
 // may end the process.
 #include "tests/host_modules/HostWithModules.h"
+#include "tests/support/Content.h"
 
 #include <cstring>
 #include <fstream>
@@ -16,12 +17,6 @@
 
 namespace
 {
-std::string contentOf(const std::filesystem::path& path)
-{
-    std::ifstream file(path, std::ios::binary);
-    return {std::istreambuf_iterator<char>(file), {}};
-}
-
 std::string goodModule()
 {
     return contentOf(std::filesystem::path(FIXTURE_MODULES) / "Good.zmb");

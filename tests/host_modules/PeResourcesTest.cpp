@@ -2,12 +2,12 @@
 
 #include <cstdio>
 #include <filesystem>
-#include <fstream>
-#include <iterator>
 #include <random>
 
 #include <LIEF/PE.hpp>
 #include <gtest/gtest.h>
+
+#include "tests/support/Content.h"
 
 using tessel::PeResources;
 using Bytes = std::vector<std::uint8_t>;
@@ -16,15 +16,15 @@ namespace
 {
 constexpr unsigned kIdsBehindTheLast = 0x10010;
 
-Bytes contentOf(const std::filesystem::path& path)
+Bytes bytesOf(const std::filesystem::path& path)
 {
-    std::ifstream file(path, std::ios::binary);
-    return {std::istreambuf_iterator<char>(file), {}};
+    const std::string content = contentOf(path);
+    return {content.begin(), content.end()};
 }
 
 Bytes texts()
 {
-    return contentOf(TEXTS_DLL);
+    return bytesOf(TEXTS_DLL);
 }
 
 tessel::Result<PeResources> read(Bytes bytes)
@@ -128,13 +128,13 @@ TEST(PeResources, SaysInWordsWhatIsWrong)
 {
     EXPECT_EQ(whyNot({}), L"the file is cut short");
     EXPECT_EQ(whyNot({'M', 'Z'}), L"the file is cut short");
-    EXPECT_EQ(whyNot(contentOf("/proc/self/exe")), L"it is not a Windows library");
-    EXPECT_EQ(whyNot(contentOf(EMPTY_DLL)), L"it holds no resources");
+    EXPECT_EQ(whyNot(bytesOf("/proc/self/exe")), L"it is not a Windows library");
+    EXPECT_EQ(whyNot(bytesOf(EMPTY_DLL)), L"it holds no resources");
 }
 
 TEST(PeResources, TakesAFileWithResourcesButWithoutTexts)
 {
-    const auto resources = read(contentOf(NO_TEXTS_DLL));
+    const auto resources = read(bytesOf(NO_TEXTS_DLL));
     ASSERT_TRUE(resources);
     EXPECT_EQ(charactersIn(*resources), 0U);
 }

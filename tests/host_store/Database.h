@@ -8,6 +8,8 @@
 
 #include <sqlite3.h>
 
+#include "tests/support/Content.h"
+
 // The first column of the first row, or the words of what went wrong.
 inline std::string runSql(const std::filesystem::path& file, const char* sql)
 {
@@ -25,10 +27,4 @@ inline std::string runSql(const std::filesystem::path& file, const char* sql)
         answer = sqlite3_errmsg(database);
     sqlite3_close(database);
     return answer;
-}
-
-inline std::string contentOf(const std::filesystem::path& file)
-{
-    std::ifstream stream(file, std::ios::binary);
-    return {std::istreambuf_iterator<char>(stream), {}};
 }

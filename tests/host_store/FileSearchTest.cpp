@@ -16,7 +16,7 @@ namespace fs = std::filesystem;
 
 namespace
 {
-constexpr std::size_t kRoom = 1024;
+constexpr std::size_t kPathRoom = 1024;
 
 class FileSearch : public testing::Test
 {
@@ -135,7 +135,7 @@ TEST_F(FileSearch, GivesApplicationsThePathWholeOrNotAtAll)
 {
     const std::wstring path = tessel::toWide(folder.write("größe 100%/tool.lsp", "").string());
     setSearchPath(in("größe 100%"));
-    wchar_t found[kRoom] = L"untouched";
+    wchar_t found[kPathRoom] = L"untouched";
     EXPECT_EQ(tsedFindFile(L"tool.lsp", found, path.size()), TS_ERROR);
     EXPECT_STREQ(found, L"untouched");
     EXPECT_EQ(tsedFindFile(L"tool.lsp", found, path.size() + 1), TS_NORMAL);
@@ -144,12 +144,12 @@ TEST_F(FileSearch, GivesApplicationsThePathWholeOrNotAtAll)
 
 TEST_F(FileSearch, AnswersApplicationsWithAnError)
 {
-    wchar_t found[kRoom] = L"untouched";
-    EXPECT_EQ(tsedFindFile(L"other.lsp", found, kRoom), TS_ERROR);
-    EXPECT_EQ(tsedFindFile(L"", found, kRoom), TS_ERROR);
-    EXPECT_EQ(tsedFindFile(nullptr, found, kRoom), TS_ERROR);
-    EXPECT_EQ(tsedFindFile(L"other.lsp", nullptr, kRoom), TS_ERROR);
+    wchar_t found[kPathRoom] = L"untouched";
+    EXPECT_EQ(tsedFindFile(L"other.lsp", found, kPathRoom), TS_ERROR);
+    EXPECT_EQ(tsedFindFile(L"", found, kPathRoom), TS_ERROR);
+    EXPECT_EQ(tsedFindFile(nullptr, found, kPathRoom), TS_ERROR);
+    EXPECT_EQ(tsedFindFile(L"other.lsp", nullptr, kPathRoom), TS_ERROR);
     tessel::services().files = nullptr;
-    EXPECT_EQ(tsedFindFile(L"other.lsp", found, kRoom), TS_ERROR);
+    EXPECT_EQ(tsedFindFile(L"other.lsp", found, kPathRoom), TS_ERROR);
     EXPECT_STREQ(found, L"untouched");
 }

@@ -10,7 +10,7 @@ namespace
 class FailedLoads : public ModuleTest
 {
 protected:
-    static void Load(const wchar_t* path) { PerformModrig(CStdStr(path), 0, 0, 0); }
+    static void Load(const wchar_t* path) { static_cast<void>(PerformModrig(CStdStr(path), 0, 0, 0)); }
     static bool Failed(const wchar_t* path) { return LastLoadFailed(CStdStr(path)); }
 };
 } // namespace

@@ -10,6 +10,12 @@
 #include <string_view>
 #include <vector>
 
+// A text that a caller may leave out.
+inline std::wstring orEmpty(const wchar_t* text)
+{
+    return text ? text : L"";
+}
+
 class Journal
 {
 public:

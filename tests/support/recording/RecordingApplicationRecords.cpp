@@ -8,14 +8,6 @@ struct TesselAppInfo::Record : RecordingApplicationRecord
 {
 };
 
-namespace
-{
-std::wstring orEmpty(const wchar_t* text)
-{
-    return text ? text : L"";
-}
-} // namespace
-
 void RecordingApplicationRecords::set(const RecordingApplicationRecord& record)
 {
     mRecords[tessel::foldCase(record.name)] = record;

@@ -6,14 +6,6 @@
 #include "host/text/Unicode.h"
 #include "tests/support/RecordingHost.h"
 
-namespace
-{
-std::wstring orEmpty(const wchar_t* text)
-{
-    return text ? text : L"";
-}
-} // namespace
-
 const wchar_t* RecordingApplicationServices::productRegistryRoot() const
 {
     return registryRoot.c_str();

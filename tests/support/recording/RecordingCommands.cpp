@@ -8,11 +8,6 @@
 
 namespace
 {
-std::wstring orEmpty(const wchar_t* text)
-{
-    return text ? text : L"";
-}
-
 bool isName(const std::wstring& text)
 {
     return !text.empty() &&
