@@ -1,11 +1,9 @@
 #import "modrig/dialogs/ModrigController.h"
 
-#include <tesselui/tsuieach.h>
-
-#import "modrig/dialogs/ModrigFilePath.h"
-#import "modrig/dialogs/TsOCModrigUtil.h"
+#import "modrig/dialogs/ModrigTableView.h"
 
 #include "modrig/dialogs/Paths.h"
+#include "modrig/dialogs/model/Drop.h"
 #include "modrig/loader/FileIntake.h"
 #include "modrig/loader/LoadBatch.h"
 
@@ -16,22 +14,10 @@ NSArray* draggedPaths(id<NSDraggingInfo> info)
     return [[info draggingPasteboard] propertyListForType:NSFilenamesPboardType];
 }
 
-// A file without an extension gets message 2 when it is asked whether it can be loaded. During a drag that
-// would be a box at every move of the mouse, which the program that the files come from holds, out of reach
-// until the drop: what has no extension is passed over here, and heard of when it is dropped with others.
-bool hasExtension(NSString* path)
+ModrigUtils::DraggedFiles filesIn(NSArray* paths)
 {
-    const NSRange dot = [path rangeOfString:@"." options:NSBackwardsSearch];
-    return dot.location != NSNotFound && NSMaxRange(dot) < [path length];
-}
-
-// One file that can be loaded among those dragged is enough.
-NSDragOperation operationFor(id<NSDraggingInfo> info)
-{
-    for (NSString* path : tsuiEach<NSString*>(draggedPaths(info)))
-        if (hasExtension(path) && [TsOCModrigUtil isValidFileForModrig:path])
-            return NSDragOperationCopy;
-    return NSDragOperationNone;
+    return {[paths count],
+            [=](std::size_t index) { return ModrigUtils::PathFromString([paths objectAtIndex:index]); }};
 }
 } // namespace
 
@@ -42,14 +28,19 @@ NSDragOperation operationFor(id<NSDraggingInfo> info)
                  proposedRow:(NSInteger)row
        proposedDropOperation:(NSTableViewDropOperation)operation
 {
-    // Below the rows a toolkit may propose the table as a whole, which is no row.
-    const bool belowTheRows = row < 0 && table == loadedAppsTableView;
-    if (operation == NSTableViewDropOn && !belowTheRows)
+    const ModrigUtils::ProposedDrop drop = {[(id)self kindOfTable:table], row,
+                                            operation == NSTableViewDropOn};
+    switch (ModrigUtils::AnswerDrop(drop, filesIn(draggedPaths(info))))
+    {
+    case ModrigUtils::DropAnswer::kRefused:
         return NSDragOperationNone;
-    const NSDragOperation accepted = operationFor(info);
-    if (belowTheRows && accepted != NSDragOperationNone)
+    case ModrigUtils::DropAnswer::kTakenAtEnd:
         [table setDropRow:[table numberOfRows] dropOperation:NSTableViewDropAbove];
-    return accepted;
+        return NSDragOperationCopy;
+    case ModrigUtils::DropAnswer::kTaken:
+        return NSDragOperationCopy;
+    }
+    return NSDragOperationNone;
 }
 
 // NO in any case: the rows appear as the files are loaded, and the table has nothing to show of its own.
@@ -77,7 +68,8 @@ NSDragOperation operationFor(id<NSDraggingInfo> info)
 
 - (NSDragOperation)draggingEnteredStartupSuite:(id<NSDraggingInfo>)info
 {
-    return operationFor(info);
+    return ModrigUtils::HasApplication(filesIn(draggedPaths(info))) ? NSDragOperationCopy
+                                                                    : NSDragOperationNone;
 }
 
 - (BOOL)performDragOperationToStartupSuite:(id<NSDraggingInfo>)info
@@ -90,8 +82,6 @@ NSDragOperation operationFor(id<NSDraggingInfo> info)
 - (void)dropFiles:(NSArray*)paths atRow:(NSInteger)row addToStartupList:(BOOL)addToStartupList
 {
     [self clearMessage];
-    if (ModrigUtils::RefuseTooManyFiles([paths count]))
-        return;
     NSArray* files =
         ModrigUtils::RowsFromPaths(ModrigUtils::AcceptedFiles(ModrigUtils::PathsFromStrings(paths)));
     if ([files count] == 0)

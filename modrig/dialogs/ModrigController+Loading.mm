@@ -12,14 +12,12 @@
 #include "modrig/dialogs/Paths.h"
 #include "modrig/dialogs/Settings.h"
 #include "modrig/dialogs/model/ChosenFiles.h"
+#include "modrig/dialogs/model/ShownTab.h"
 #include "modrig/loader/LoadBatch.h"
 #include "modrig/messages/Messages.h"
 
 namespace
 {
-constexpr NSInteger kLoadedApplicationsTab = 0;
-constexpr NSInteger kHistoryTab = 1;
-
 // Answers NO when the table has a row for that file already.
 BOOL insertRow(ModrigFilePath* row, NSArrayController* table, int insertRow)
 {
@@ -104,12 +102,29 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
     [pool drain];
 }
 
-- (void)showLastRow
+- (void)showLastRowAfter:(unsigned)added
 {
-    if (tabViewSelectedIndex == kLoadedApplicationsTab)
+    const auto kind = ModrigUtils::TableToScroll(added, mInsertRow, tabViewSelectedIndex);
+    if (kind == ModrigUtils::TableKind::kLoadedApplications)
         scrollToLastRow(loadedAppsTableView, loadedApps);
-    else if (tabViewSelectedIndex == kHistoryTab)
+    else if (kind == ModrigUtils::TableKind::kHistory)
         scrollToLastRow(historyListTableView, historyList);
+}
+
+- (std::vector<ModrigUtils::BatchFile>)batchFilesOf:(NSArray*)rows
+{
+    std::vector<ModrigUtils::BatchFile> files;
+    for (ModrigFilePath* row : tsuiEach<ModrigFilePath*>(rows))
+        files.push_back({[row path], static_cast<bool>([self isTesselFolder:[row filePathName]])});
+    return files;
+}
+
+- (BOOL)openTesselFolder
+{
+    if (!ModrigUtils::IsHostFolderOnly([self batchFilesOf:mSelectedFiles]))
+        return NO;
+    [mOpenPanel setDirectory:[[mSelectedFiles objectAtIndex:0] filePathName]];
+    return YES;
 }
 
 - (void)loadApps:(NSArray*)files
@@ -122,8 +137,7 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
     // A copy: what is loaded may change the selection that the files come from.
     NSArray* batchFiles = [[files copy] autorelease];
     ModrigUtils::LoadBatch batch;
-    for (ModrigFilePath* file : tsuiEach<ModrigFilePath*>(batchFiles))
-        batch.files.push_back({[file path], static_cast<bool>([self isTesselFolder:[file filePathName]])});
+    batch.files = [self batchFilesOf:batchFiles];
     batch.saveHistory = mbSaveHistory;
     batch.loadAll = addToStartupSuit;
     batch.succeeded = [=](std::size_t index) { [successedApps addObject:[batchFiles objectAtIndex:index]]; };
@@ -133,8 +147,7 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
     batch.isStopped = [&load](std::size_t done) { return load.IsStopped(done); };
     const unsigned added = ModrigUtils::RunLoadBatch(batch);
     [historyListTableView setNeedsDisplay:YES]; // it shows which files could not be loaded
-    if (added > 0 && mInsertRow == ModrigUtils::kAppendRow)
-        [self showLastRow];
+    [self showLastRowAfter:added];
 }
 
 @end

@@ -145,17 +145,6 @@
     [self onLoad:sender];
 }
 
-- (BOOL)openTesselFolder
-{
-    if ([mSelectedFiles count] != 1)
-        return NO;
-    NSString* path = [[mSelectedFiles objectAtIndex:0] filePathName];
-    if (![self isTesselFolder:path])
-        return NO;
-    [mOpenPanel setDirectory:path];
-    return YES;
-}
-
 - (BOOL)isTesselFolder:(NSString*)path
 {
     return path && [path caseInsensitiveCompare:[[NSBundle mainBundle] bundlePath]] == NSOrderedSame;

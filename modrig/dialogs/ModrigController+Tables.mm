@@ -7,28 +7,31 @@
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
 #include "modrig/dialogs/Paths.h"
+#include "modrig/dialogs/model/ChosenFiles.h"
+#include "modrig/dialogs/model/RowSelection.h"
 #include "modrig/dialogs/model/UnloadTip.h"
 #include "modrig/dialogs/platform/Platform.h"
-#include "modrig/lists/Globals.h"
+#include "modrig/lists/ListMembership.h"
 #include "modrig/lists/ListRemoval.h"
 #include "modrig/loader/LoadBatch.h"
 #include "modrig/loader/LoadedApplications.h"
 
 namespace
 {
-void addLoadedOf(const CStringList& list, NSMutableArray* paths)
-{
-    for (const CStdStr& path : list)
-        if (ModrigUtils::ApplicationIsLoaded(path))
-            [paths addObject:ModrigUtils::StringFromPath(path)];
-}
-
 std::vector<ModrigUtils::UnloadCandidate> unloadCandidates(NSArray* rows)
 {
     std::vector<ModrigUtils::UnloadCandidate> candidates;
     for (ModrigFilePath* row : tsuiEach<ModrigFilePath*>(rows))
         candidates.push_back({[row path], static_cast<bool>([row unloadable])});
     return candidates;
+}
+
+std::vector<ModrigUtils::RowIdentity> identitiesOf(NSArray* rows)
+{
+    std::vector<ModrigUtils::RowIdentity> identities;
+    for (ModrigFilePath* row : tsuiEach<ModrigFilePath*>(rows))
+        identities.push_back(row);
+    return identities;
 }
 
 // A header sends the action of its table too, and so does the empty part of some.
@@ -48,15 +51,14 @@ bool hasSelection(NSArrayController* rows)
 
 - (void)populateLoadedApplications
 {
-    NSMutableArray* paths = [NSMutableArray array];
-    addLoadedOf(gLoadedAppList, paths);
-    addLoadedOf(gStartupList, paths);
-    [TsOCModrigUtil fill:loadedApps withPathNames:paths];
+    const std::vector<CStdStr> paths = ModrigUtils::ApplicationsShownAsLoaded();
+    [TsOCModrigUtil fill:loadedApps withPathNames:ModrigUtils::StringsFromPaths(paths)];
 }
 
 - (void)populateHistoryList
 {
-    [TsOCModrigUtil fill:historyList withPathNames:ModrigUtils::StringsFromList(gHistoryList)];
+    [TsOCModrigUtil fill:historyList
+           withPathNames:ModrigUtils::StringsFromPaths(ModrigUtils::HistoryFiles())];
 }
 
 - (NSArrayController*)rowsOf:(NSTableView*)table
@@ -128,31 +130,29 @@ bool hasSelection(NSArrayController* rows)
 
 - (BOOL)historyIsChosen
 {
-    return [[historyList selectedObjects] indexOfObjectIdenticalTo:[mSelectedFiles lastObject]] != NSNotFound;
+    return ModrigUtils::AreChosenInHistory(identitiesOf(mSelectedFiles),
+                                           identitiesOf([historyList selectedObjects]));
 }
 
 - (BOOL)tableView:(NSTableView*)table shouldSelectRow:(NSInteger)row
 {
-    if (table != loadedAppsTableView)
-        return YES;
-    NSArray* rows = [loadedApps arrangedObjects];
-    if (row < 0 || static_cast<NSUInteger>(row) >= [rows count])
-        return NO;
-    return [[rows objectAtIndex:static_cast<NSUInteger>(row)] unloadable];
+    NSArray* rows = [[self rowsOf:table] arrangedObjects];
+    return ModrigUtils::MayBeSelected([self kindOfTable:table], row, [rows count],
+                                      [=](std::size_t index) -> bool
+                                      { return [[rows objectAtIndex:index] unloadable]; });
 }
 
 // The table is asked which rows may be selected when they are clicked, and not when new rows come selected.
 - (void)keepToUnloadableRows
 {
-    NSMutableIndexSet* unloadable = [NSMutableIndexSet indexSet];
-    NSIndexSet* selected = [loadedApps selectionIndexes];
-    for (NSUInteger row = [selected firstIndex]; row != NSNotFound;
-         row = [selected indexGreaterThanIndex:row])
-        if ([self tableView:loadedAppsTableView shouldSelectRow:static_cast<NSInteger>(row)])
-            [unloadable addIndex:row];
-    [loadedApps setSelectionIndexes:unloadable];
+    NSTableView* table = loadedAppsTableView;
+    const auto mayBeSelected = [=](std::size_t row) -> bool
+    { return [self tableView:table shouldSelectRow:static_cast<NSInteger>(row)]; };
+    NSIndexSet* staying = ModrigUtils::SetFromIndexes(
+        ModrigUtils::SelectableOf(ModrigUtils::IndexesFromSet([loadedApps selectionIndexes]), mayBeSelected));
+    [loadedApps setSelectionIndexes:staying];
     // The binding is silent while it is at work itself.
-    [loadedAppsTableView selectRowIndexes:unloadable byExtendingSelection:NO];
+    [loadedAppsTableView selectRowIndexes:staying byExtendingSelection:NO];
     self.canUnloadApp = hasSelection(loadedApps);
 }
 

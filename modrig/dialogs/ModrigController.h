@@ -86,6 +86,9 @@
 @interface ModrigController (Loading)
 
 - (IBAction)onLoad:(id)sender;
+// Moves the panel into the host's own folder when that is all that is selected, and answers whether it did.
+- (BOOL)openTesselFolder;
+
 - (IBAction)onStartupSuits:(id)sender;
 - (IBAction)onHelp:(id)sender;
 
@@ -112,8 +115,6 @@
 // The action of the panel's default button.
 - (void)openPanelOK:(id)sender;
 
-// Moves the panel into the host's own folder when that is all that is selected, and answers whether it did.
-- (BOOL)openTesselFolder;
 - (BOOL)isTesselFolder:(NSString*)path;
 
 @end

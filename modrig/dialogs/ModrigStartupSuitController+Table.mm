@@ -4,18 +4,8 @@
 #import "modrig/dialogs/ModrigFilePath.h"
 #import "modrig/dialogs/ModrigTableView.h"
 
+#include "modrig/dialogs/Paths.h"
 #include "modrig/lists/StartupOrder.h"
-
-namespace
-{
-std::vector<std::size_t> indexesOf(NSIndexSet* rows)
-{
-    std::vector<std::size_t> indexes;
-    for (NSUInteger row = [rows firstIndex]; row != NSNotFound; row = [rows indexGreaterThanIndex:row])
-        indexes.push_back(row);
-    return indexes;
-}
-} // namespace
 
 @implementation ModrigStartupSuitController (Table)
 
@@ -50,7 +40,7 @@ std::vector<std::size_t> indexesOf(NSIndexSet* rows)
 - (void)moveSelectionUp:(BOOL)up
 {
     NSMutableIndexSet* places = [NSMutableIndexSet indexSet];
-    const auto moves = ModrigUtils::MovesOf(indexesOf([startupApps selectionIndexes]),
+    const auto moves = ModrigUtils::MovesOf(ModrigUtils::IndexesFromSet([startupApps selectionIndexes]),
                                             [[startupApps arrangedObjects] count], up);
     for (const ModrigUtils::RowMove& move : moves)
         [places addIndex:[self moveRow:move] ? move.to : move.from];

@@ -2,7 +2,6 @@
 
 #import <tesselui/TsOCOpenFileDialog.h>
 #import <tesselui/TsUIPersistentStore.h>
-#include <tesselui/tsuieach.h>
 
 #import "modrig/dialogs/ModrigController.h"
 #import "modrig/dialogs/ModrigFilePath.h"
@@ -13,7 +12,7 @@
 #include "modrig/dialogs/Paths.h"
 #include "modrig/dialogs/Settings.h"
 #include "modrig/dialogs/platform/Platform.h"
-#include "modrig/lists/Globals.h"
+#include "modrig/lists/ListMembership.h"
 #include "modrig/lists/ListRemoval.h"
 #include "modrig/loader/FileIntake.h"
 #include "modrig/messages/MessageIds.h"
@@ -48,7 +47,8 @@ constexpr NSInteger kRemoveSegment = 1;
     ModrigUtils::RestoreFrame([self window], settings, kSuiteWindowSetting);
     ModrigUtils::RestoreColumns(startupTableView, settings, kSuiteColumnSetting);
     ModrigPlatform::ShowRows(startupTableView, startupApps);
-    [TsOCModrigUtil fill:startupApps withPathNames:ModrigUtils::StringsFromList(gStartupList)];
+    [TsOCModrigUtil fill:startupApps
+           withPathNames:ModrigUtils::StringsFromPaths(ModrigUtils::StartupSuiteFiles())];
     [self enableRemove:NO];
 }
 
@@ -124,29 +124,19 @@ constexpr NSInteger kRemoveSegment = 1;
     return ModrigUtils::ValueInRow(startupApps, column, row);
 }
 
-- (BOOL)addToSuite:(ModrigFilePath*)file
-{
-    if ([[startupApps arrangedObjects] containsObject:file] ||
-        ModrigUtils::RefuseTemporaryInternetFile([file path]))
-        return NO;
-    [startupApps addObject:file];
-    gStartupList.AddTail([file path]);
-    return YES;
-}
-
 - (void)addFiles:(NSArray*)paths
 {
     [[TsOCModrigUtil getModrigController] clearMessage];
-    if (ModrigUtils::RefuseTooManyFiles([paths count]))
-        return;
     NSArray* files =
         ModrigUtils::RowsFromPaths(ModrigUtils::FilesNewToStartupSuite(ModrigUtils::PathsFromStrings(paths)));
     NSMutableArray* loaded = [NSMutableArray array];
     [[TsOCModrigUtil getModrigController] loadApps:files successedApps:loaded addToStartupSuit:YES];
-    NSUInteger added = 0;
-    for (ModrigFilePath* file : tsuiEach<ModrigFilePath*>(loaded))
-        added += [self addToSuite:file];
-    if (added > 0)
+    NSArrayController* rows = startupApps;
+    ModrigUtils::StartupSuiteTable table;
+    table.hasRow = [=](std::size_t index)
+    { return static_cast<bool>([[rows arrangedObjects] containsObject:[loaded objectAtIndex:index]]); };
+    table.addRow = [=](std::size_t index) { [rows addObject:[loaded objectAtIndex:index]]; };
+    if (ModrigUtils::AddToShownStartupSuite(ModrigUtils::PathsFromRows(loaded), table) > 0)
         [startupTableView scrollRowToVisible:[self numberOfRowsInTableView:startupTableView] - 1];
 }
 

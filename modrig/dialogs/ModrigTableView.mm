@@ -7,6 +7,7 @@
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
 #include "modrig/dialogs/Paths.h"
+#include "modrig/dialogs/model/RowSelection.h"
 #include "modrig/dialogs/model/RowSteps.h"
 #include "modrig/dialogs/model/ShownText.h"
 #include "modrig/dialogs/model/TypedLetters.h"
@@ -19,42 +20,12 @@ using ModrigUtils::TableAction;
 
 namespace
 {
-NSString* titleOf(TableAction action)
-{
-    switch (action)
-    {
-    case TableAction::kLoad:
-        return @"IDS_MODRIG_MENU_LOAD";
-    case TableAction::kUnload:
-        return @"IDS_MODRIG_MENU_UNLOAD";
-    case TableAction::kAdd:
-        return @"IDS_MODRIG_MENU_ADD";
-    case TableAction::kAddToStartupSuite:
-        return @"IDS_MODRIG_MENU_ADD_TO_STARTUP_SUITE";
-    case TableAction::kRemove:
-        return @"IDS_MODRIG_MENU_REMOVE";
-    case TableAction::kMoveUp:
-        return @"IDS_MODRIG_MENU_MOVE_UP";
-    case TableAction::kMoveDown:
-        return @"IDS_MODRIG_MENU_MOVE_DOWN";
-    case TableAction::kShowInFolder:
-        return @"IDS_MODRIG_MENU_SHOW_IN_FOLDER";
-    default:
-        return @"IDS_MODRIG_MENU_COPY_PATH";
-    }
-}
-
 ModrigUtils::TableKey keyOf(NSEvent* event)
 {
-    constexpr wchar_t kLastControlCharacter = 0x1A;
     NSString* characters = [event charactersIgnoringModifiers];
-    ModrigUtils::TableKey key = {[characters length] == 1 ? wchar_t([characters characterAtIndex:0]) : L'\0',
-                                 ModrigPlatform::IsCommand(event),
-                                 ModrigPlatform::IsAlternate(event)};
-    // Some displays send Control-A as the first of the control characters.
-    if (key.command && key.character > 0 && key.character <= kLastControlCharacter)
-        key.character = static_cast<wchar_t>(key.character + L'a' - 1);
-    return key;
+    return ModrigUtils::KnownKey({[characters length] == 1 ? wchar_t([characters characterAtIndex:0]) : L'\0',
+                                  ModrigPlatform::IsCommand(event),
+                                  ModrigPlatform::IsAlternate(event)});
 }
 
 // One person types, in one table at a time.
@@ -62,14 +33,6 @@ ModrigUtils::TypedLetters& typedLetters()
 {
     static ModrigUtils::TypedLetters letters;
     return letters;
-}
-
-bool isLetter(ModrigUtils::TableKey key, ModrigUtils::TypedLetters::Time now)
-{
-    constexpr wchar_t kFirstFunctionKey = 0xF700;
-    if (key.command || key.alternate || key.character >= kFirstFunctionKey || key.character == 0x7F)
-        return false;
-    return key.character > L' ' || (key.character == L' ' && typedLetters().IsTyping(now));
 }
 
 ModrigUtils::RowFacts factsOf(ModrigFilePath* row)
@@ -81,6 +44,12 @@ ModrigUtils::RowFacts factsOf(ModrigFilePath* row)
     facts.isCompiledModule = ModrigUtils::FileTypeOfPath([row path]) == kCompiledModule;
     facts.hasFailed = ModrigUtils::LastLoadFailed([row path]);
     return facts;
+}
+
+ModrigUtils::RowTest mayBeSelectedIn(NSTableView* table)
+{
+    return [=](std::size_t row) -> bool
+    { return [(id)[table delegate] tableView:table shouldSelectRow:static_cast<NSInteger>(row)]; };
 }
 
 void copyToPasteboard(NSString* text)
@@ -160,11 +129,9 @@ NSString* ModrigUtils::HelpKey()
 // The toolkit selects none at all when one of them must not be selected.
 - (void)selectEveryRow
 {
-    NSMutableIndexSet* rows = [NSMutableIndexSet indexSet];
-    for (NSInteger row = 0; row < [self numberOfRows]; ++row)
-        if ([(id)[self delegate] tableView:self shouldSelectRow:row])
-            [rows addIndex:static_cast<NSUInteger>(row)];
-    [self selectRowIndexes:rows byExtendingSelection:NO];
+    const std::vector<std::size_t> rows =
+        ModrigUtils::AllSelectable(static_cast<std::size_t>([self numberOfRows]), mayBeSelectedIn(self));
+    [self selectRowIndexes:ModrigUtils::SetFromIndexes(rows) byExtendingSelection:NO];
 }
 
 - (void)perform:(TableAction)action on:(NSIndexSet*)rows
@@ -225,14 +192,8 @@ NSString* ModrigUtils::HelpKey()
     const ModrigUtils::TableKey key = keyOf(event);
     if (key.command || key.alternate || ([event modifierFlags] & NSShiftKeyMask))
         return NO;
-    const auto canBeSelected = [=](std::size_t row)
-    {
-        return static_cast<bool>([(id)[self delegate] tableView:self
-                                                shouldSelectRow:static_cast<NSInteger>(row)]);
-    };
-    const ModrigUtils::RowPlaces places = [self places];
-    const auto row = ModrigUtils::RowForKey(key.character, places, canBeSelected);
-    if (!row || row == ModrigUtils::RowForKey(key.character, places, [](std::size_t) { return true; }))
+    const auto row = ModrigUtils::RowPassedOverFor(key.character, [self places], mayBeSelectedIn(self));
+    if (!row)
         return NO;
     [self selectRowIndexes:[NSIndexSet indexSetWithIndex:*row] byExtendingSelection:NO];
     [self scrollRowToVisible:static_cast<NSInteger>(*row)];
@@ -245,7 +206,7 @@ NSString* ModrigUtils::HelpKey()
     const auto now = std::chrono::steady_clock::now();
     if ([self takeKey:event] || [self moveBy:event])
         return;
-    if (isLetter(key, now))
+    if (typedLetters().Take(key, now))
         [self goToRowBeginningWith:typedLetters().Add(key.character, now)];
     else
         [super keyDown:event];
@@ -271,7 +232,8 @@ NSString* ModrigUtils::HelpKey()
 {
     if (action == TableAction::kNone)
         return (NSMenuItem*)[NSMenuItem separatorItem];
-    NSMenuItem* item = [[[NSMenuItem alloc] initWithTitle:[TsOCModrigUtil modrigLoadString:titleOf(action)]
+    NSString* title = [NSString stringWithUTF8String:ModrigUtils::TitleKey(action)];
+    NSMenuItem* item = [[[NSMenuItem alloc] initWithTitle:[TsOCModrigUtil modrigLoadString:title]
                                                    action:@selector(performMenuItem:)
                                             keyEquivalent:@""] autorelease];
     [item setTarget:self];
@@ -284,12 +246,21 @@ NSString* ModrigUtils::HelpKey()
 // rows.
 - (NSIndexSet*)rowsPointedAt:(NSInteger)row
 {
-    if (row < 0)
-        return [NSIndexSet indexSet];
-    NSIndexSet* clicked = [NSIndexSet indexSetWithIndex:static_cast<NSUInteger>(row)];
-    if (![self isRowSelected:row] && [(id)[self delegate] tableView:self shouldSelectRow:row])
+    NSIndexSet* clicked =
+        row < 0 ? [NSIndexSet indexSet] : [NSIndexSet indexSetWithIndex:static_cast<NSUInteger>(row)];
+    switch (ModrigUtils::RowsOfMenu(row, [self isRowSelected:row],
+                                    [(id)[self delegate] tableView:self shouldSelectRow:row]))
+    {
+    case ModrigUtils::MenuRows::kSelection:
+        return [self selectedRowIndexes];
+    case ModrigUtils::MenuRows::kNewSelection:
         [self selectRowIndexes:clicked byExtendingSelection:NO];
-    return [self isRowSelected:row] ? [self selectedRowIndexes] : clicked;
+        return [self selectedRowIndexes];
+    case ModrigUtils::MenuRows::kNone:
+    case ModrigUtils::MenuRows::kUnselectedRow:
+        break;
+    }
+    return clicked;
 }
 
 - (NSMenu*)menuForEvent:(NSEvent*)event

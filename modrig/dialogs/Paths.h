@@ -7,7 +7,6 @@
 #include <vector>
 
 #include "modrig/base/CStdStr.h"
-#include "modrig/base/CStringList.h"
 
 namespace ModrigUtils
 {
@@ -22,10 +21,21 @@ NSArray* RowsFromPaths(const std::vector<CStdStr>& paths);
 // Removes the row of an index from the table. Neither array may go before the function does.
 std::function<void(std::size_t index)> RemovingRows(NSArray* rows, NSArrayController* table);
 
+// Places in a table, ascending.
+std::vector<std::size_t> IndexesFromSet(NSIndexSet* set);
+NSIndexSet* SetFromIndexes(const std::vector<std::size_t>& indexes);
+
 // What a column shows of a row; nil for a row that is not there.
 id ValueInRow(NSArrayController* rows, NSTableColumn* column, NSInteger row);
 
 CStdStr PathFromString(NSString* text);
 NSString* StringFromPath(const CStdStr& path);
-NSArray* StringsFromList(const CStringList& list);
+// Of a list, or of any other row of paths.
+template <typename Paths> NSArray* StringsFromPaths(const Paths& paths)
+{
+    NSMutableArray* strings = [NSMutableArray array];
+    for (const CStdStr& path : paths)
+        [strings addObject:StringFromPath(path)];
+    return strings;
+}
 } // namespace ModrigUtils

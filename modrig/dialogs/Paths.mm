@@ -42,6 +42,22 @@ std::function<void(std::size_t)> RemovingRows(NSArray* rows, NSArrayController* 
     return [=](std::size_t index) { [table removeObject:[rows objectAtIndex:index]]; };
 }
 
+std::vector<std::size_t> IndexesFromSet(NSIndexSet* set)
+{
+    std::vector<std::size_t> indexes;
+    for (NSUInteger index = [set firstIndex]; index != NSNotFound; index = [set indexGreaterThanIndex:index])
+        indexes.push_back(index);
+    return indexes;
+}
+
+NSIndexSet* SetFromIndexes(const std::vector<std::size_t>& indexes)
+{
+    NSMutableIndexSet* set = [NSMutableIndexSet indexSet];
+    for (const std::size_t index : indexes)
+        [set addIndex:index];
+    return set;
+}
+
 id ValueInRow(NSArrayController* rows, NSTableColumn* column, NSInteger row)
 {
     NSArray* all = [rows arrangedObjects];
@@ -59,13 +75,5 @@ CStdStr PathFromString(NSString* text)
 NSString* StringFromPath(const CStdStr& path)
 {
     return wcharToNSString(path.c_str());
-}
-
-NSArray* StringsFromList(const CStringList& list)
-{
-    NSMutableArray* strings = [NSMutableArray arrayWithCapacity:list.GetCount()];
-    for (const CStdStr& path : list)
-        [strings addObject:StringFromPath(path)];
-    return strings;
 }
 } // namespace ModrigUtils

@@ -5,6 +5,16 @@
 
 namespace ModrigUtils
 {
+const CStringList& StartupSuiteFiles()
+{
+    return gStartupList;
+}
+
+const CStringList& HistoryFiles()
+{
+    return gHistoryList;
+}
+
 bool FoundinSpecificList(const CStdStr& path, const CStringList& list)
 {
     return list.HoldsApplication(path);

@@ -1,10 +1,14 @@
-// Whether an application is in one of the module's lists, and taking it out.
+// What is in the module's lists: asked whole or by path, and taken out.
 #pragma once
 
 #include "modrig/base/CStringList.h"
 
 namespace ModrigUtils
 {
+// The lists as they are shown, in their order.
+const CStringList& StartupSuiteFiles();
+const CStringList& HistoryFiles();
+
 // Whether the list has an entry for the application at the path: the same folder and file name in any case,
 // or, for object-database modules (.omp), the same file name wherever it lies. A path that is too long to be
 // taken apart stands for itself only.

@@ -23,6 +23,8 @@ bool RefuseTooManyFiles(std::size_t count)
 std::vector<CStdStr> AcceptedFiles(const std::vector<CStdStr>& paths)
 {
     std::vector<CStdStr> accepted;
+    if (RefuseTooManyFiles(paths.size()))
+        return accepted;
     for (CStdStr path : paths)
         if (IsValidFileForModrig(path) && ValidateFileExists(path) != INVALID_FILE_ATTRIBUTES)
             accepted.push_back(path);
@@ -59,5 +61,19 @@ void AddToStartupSuite(const std::vector<CStdStr>& paths)
     }
     ModrigCmdlineSummary(ModrigMessages::kOneAddedToStartupSuite, ModrigMessages::kManyAddedToStartupSuite,
                          count, lastPath);
+}
+
+std::size_t AddToShownStartupSuite(const std::vector<CStdStr>& paths, const StartupSuiteTable& table)
+{
+    std::size_t count = 0;
+    for (std::size_t index = 0; index < paths.size(); ++index)
+    {
+        if (table.hasRow(index) || RefuseTemporaryInternetFile(paths[index]))
+            continue;
+        table.addRow(index);
+        gStartupList.AddTail(paths[index]);
+        ++count;
+    }
+    return count;
 }
 } // namespace ModrigUtils

@@ -2,6 +2,7 @@
 // join the Startup Suite.
 #pragma once
 
+#include <functional>
 #include <vector>
 
 #include "modrig/base/CStdStr.h"
@@ -14,7 +15,8 @@ inline constexpr std::size_t kMaxFilesAtOnce = 50;
 // Whether there are too many files; message 37 then says so.
 bool RefuseTooManyFiles(std::size_t count);
 
-// The applications among the files that exist, each by the path it was found at, in order.
+// The applications among the files that exist, each by the path it was found at, in order. None of too many
+// files; message 37 then says so.
 std::vector<CStdStr> AcceptedFiles(const std::vector<CStdStr>& paths);
 
 // The same without those that the Startup Suite has already.
@@ -27,4 +29,17 @@ bool RefuseTemporaryInternetFile(const CStdStr& path);
 // Appends the files to the Startup Suite and says how many of them are in it now; those that were in it
 // before count too.
 void AddToStartupSuite(const std::vector<CStdStr>& paths);
+
+// A table that shows the Startup Suite, as far as files that join the Suite concern it. Files are told by
+// their index.
+struct StartupSuiteTable
+{
+    std::function<bool(std::size_t index)> hasRow;
+    // Called right before the file joins the list, so that table and list are in step after each.
+    std::function<void(std::size_t index)> addRow;
+};
+
+// Appends the files that the table has no row for to the Startup Suite, silently: the user sees them come. A
+// temporary copy of a file from the internet is refused with message 41. Answers how many files have joined.
+std::size_t AddToShownStartupSuite(const std::vector<CStdStr>& paths, const StartupSuiteTable& table);
 } // namespace ModrigUtils

@@ -84,6 +84,13 @@ void AddDocumentApplications()
     for (int index = 0; index < count; ++index)
         AddUnlessFound(CStdStr(document->loadedApplicationName(index)));
 }
+
+void AppendLoadedOf(const CStringList& list, std::vector<CStdStr>& loaded)
+{
+    for (const CStdStr& path : list)
+        if (ApplicationIsLoaded(path))
+            loaded.push_back(path);
+}
 } // namespace
 
 void PopulateLoadedApps()
@@ -93,6 +100,14 @@ void PopulateLoadedApps()
     // either.
     if (AddModules())
         AddDocumentApplications();
+}
+
+std::vector<CStdStr> ApplicationsShownAsLoaded()
+{
+    std::vector<CStdStr> loaded;
+    AppendLoadedOf(gLoadedAppList, loaded);
+    AppendLoadedOf(gStartupList, loaded);
+    return loaded;
 }
 
 bool ApplicationIsLoaded(CStdStr path)

@@ -154,3 +154,12 @@ TEST_F(ListMembership, RemovesByTheWholePathAlsoWhatIsTooLongToBeTakenApart)
     RemoveInSpecificList(CStdStr(other), list);
     EXPECT_THAT(Texts(list), ElementsAre(one));
 }
+
+TEST_F(ListMembership, ShowsTheListsThatTheDialogsAskFor)
+{
+    Fill(gLoadedAppList, {L"/a/loaded.lsp"});
+    Fill(gStartupList, {L"/a/suite.lsp"});
+    Fill(gHistoryList, {L"/a/history.lsp"});
+    EXPECT_THAT(Texts(StartupSuiteFiles()), ElementsAre(L"/a/suite.lsp"));
+    EXPECT_THAT(Texts(HistoryFiles()), ElementsAre(L"/a/history.lsp"));
+}

@@ -1,6 +1,7 @@
 #include "modrig/loader/LoadedApplications.h"
 
 #include "modrig/lists/Globals.h"
+#include "modrig/messages/MessageIds.h"
 #include "tests/support/ModuleTest.h"
 #include "tests/support/recording/RecordingLoans.h"
 
@@ -213,7 +214,7 @@ TEST_F(Rebuilding, AsksTheHostForItsModulesBeforeItsDocument)
 TEST_F(AskingWhatIsLoaded, RefusesAPathWithoutADotWithAnAnswerOfNo)
 {
     EXPECT_FALSE(ApplicationIsLoaded(L"/a/tool"));
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/tool")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a/tool")));
     EXPECT_EQ(0u, host().journal.count(L"tsedQmbLoaded"));
 }
 
@@ -252,7 +253,7 @@ TEST_F(AskingWhatIsLoaded, LooksAtNamesOnly)
 TEST_F(AskingWhatMayBeUnloaded, AnswersYesForAPathWithoutADotAndSaysSo)
 {
     EXPECT_TRUE(IsAppUnloadAble(L"/a/tool"));
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/tool")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a/tool")));
 }
 
 TEST_F(AskingWhatMayBeUnloaded, AsksTheLinkerForTheLockOfACompiledModule)
@@ -279,8 +280,8 @@ TEST_F(Unloading, OneModuleTakesItOutOfTheListAndNamesIt)
     Load({L"/a/one.zmb", L"/a/two.zmb"});
     EXPECT_THAT(Unload({{L"/A/Two.zmb", false}, {L"/a/two.zmb", true}}), ElementsAre(1u));
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(L"/a/one.zmb"));
-    EXPECT_THAT(lines(), ElementsAre(Message(12, L"two.zmb")));
-    EXPECT_THAT(recordingDialog().messages, ElementsAre(Message(12, L"two.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneUnloaded, L"two.zmb")));
+    EXPECT_THAT(recordingDialog().messages, ElementsAre(Message(ModrigMessages::kOneUnloaded, L"two.zmb")));
 }
 
 TEST_F(Unloading, SeveralModulesCountsThem)
@@ -289,7 +290,7 @@ TEST_F(Unloading, SeveralModulesCountsThem)
     EXPECT_THAT(Unload({{L"/a/three.bundle", true}, {L"/a/one.zmb", true}}), ElementsAre(0u, 1u));
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(L"/a/two.zmb"));
     EXPECT_THAT(mEntriesLeft, ElementsAre(3u, 2u));
-    EXPECT_THAT(lines(), ElementsAre(Message(13, L"2")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyUnloaded, L"2")));
 }
 
 TEST_F(Unloading, GoesInTheOrderOfTheSelectionAndAsksForEachLockAgain)
@@ -318,7 +319,7 @@ TEST_F(Unloading, ALockedModuleStaysAndIsTheOnlyThingSaid)
     Load({L"/a/one.zmb"});
     host().linker.setLocked(L"/a/one.zmb");
     EXPECT_THAT(Unload({{L"/a/one.zmb", true}}), IsEmpty());
-    EXPECT_THAT(lines(), ElementsAre(Message(3, L"one.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kModuleLocked, L"one.zmb")));
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(L"/a/one.zmb"));
 }
 
@@ -327,7 +328,8 @@ TEST_F(Unloading, NamesTheLastOneTriedAlsoWhenAnotherWasUnloaded)
     Load({L"/a/a.zmb", L"/a/b.zmb"});
     host().linker.setLocked(L"/a/b.zmb");
     EXPECT_THAT(Unload({{L"/a/a.zmb", true}, {L"/a/b.zmb", true}}), ElementsAre(0u));
-    EXPECT_THAT(lines(), ElementsAre(Message(3, L"b.zmb"), Message(12, L"b.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kModuleLocked, L"b.zmb"),
+                                     Message(ModrigMessages::kOneUnloaded, L"b.zmb")));
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(L"/a/b.zmb"));
 }
 
@@ -335,7 +337,7 @@ TEST_F(Unloading, DoesNotCountARowThatIsNotUnloadableAsTried)
 {
     Load({L"/a/a.zmb", L"/a/b.zmb"});
     Unload({{L"/a/a.zmb", true}, {L"/a/b.zmb", false}});
-    EXPECT_THAT(lines(), ElementsAre(Message(12, L"a.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneUnloaded, L"a.zmb")));
 }
 
 TEST_F(Unloading, GoesOnBehindAModuleThatDoesNotUnload)
@@ -344,7 +346,7 @@ TEST_F(Unloading, GoesOnBehindAModuleThatDoesNotUnload)
     host().linker.refuseToUnload(L"/a/a.zmb", L"it will not go");
     EXPECT_THAT(Unload({{L"/a/a.zmb", true}, {L"/a/b.zmb", true}, {L"/a/c.zmb", true}}), ElementsAre(1u, 2u));
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(L"/a/a.zmb"));
-    EXPECT_EQ(Message(13, L"2"), lines().back());
+    EXPECT_EQ(Message(ModrigMessages::kManyUnloaded, L"2"), lines().back());
 }
 
 TEST_F(Unloading, TakesAnObjectDatabaseModuleOutByItsWholePath)
@@ -358,7 +360,7 @@ TEST_F(Unloading, TakesAnObjectDatabaseModuleOutByItsWholePath)
 TEST_F(Unloading, APathWithoutADotThatCountsAsUnloadableIsRefusedByTheLoader)
 {
     EXPECT_THAT(Unload({{L"/a/tool", true}}), IsEmpty());
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/tool")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a/tool")));
     EXPECT_THAT(lines(), IsEmpty());
 }
 
@@ -366,5 +368,17 @@ TEST_F(Unloading, ModulesWithPerCentSignsInTheirNamesPrintsThemAsTheyAre)
 {
     Load({L"/a/100%s%n.zmb"});
     Unload({{L"/a/100%s%n.zmb", true}});
-    EXPECT_THAT(lines(), ElementsAre(Message(12, L"100%s%n.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneUnloaded, L"100%s%n.zmb")));
+}
+
+TEST_F(AskingWhatIsLoaded, ShowsWhatTheHostHasOfTheLoadedAndThenOfTheStartupSuite)
+{
+    host().loadedModules.add(L"/a/one.zmb");
+    host().loadedModules.add(L"/a/two.zmb");
+    Fill(gLoadedAppList, {L"/a/gone.zmb", L"/a/two.zmb", L"/a/tool.lsp"});
+    Fill(gStartupList, {L"/a/one.zmb", L"/a/missing.zmb", L"/a/two.zmb"});
+    std::vector<std::wstring> shown;
+    for (const CStdStr& path : ApplicationsShownAsLoaded())
+        shown.push_back(path.Text());
+    EXPECT_THAT(shown, ElementsAre(L"/a/two.zmb", L"/a/tool.lsp", L"/a/one.zmb", L"/a/two.zmb"));
 }

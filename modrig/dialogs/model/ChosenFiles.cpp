@@ -1,10 +1,22 @@
 #include "modrig/dialogs/model/ChosenFiles.h"
 
+#include <algorithm>
+
 namespace ModrigUtils
 {
 bool PanelSelectionCounts(PanelChange change, bool panelIsEmpty, bool chosenInHistory)
 {
     return change == PanelChange::kChoice || !panelIsEmpty || !chosenInHistory;
+}
+
+bool AreChosenInHistory(const std::vector<RowIdentity>& chosen, const std::vector<RowIdentity>& selected)
+{
+    return !chosen.empty() && std::find(selected.begin(), selected.end(), chosen.back()) != selected.end();
+}
+
+bool IsHostFolderOnly(const std::vector<BatchFile>& chosen)
+{
+    return chosen.size() == 1 && chosen.front().isHostFolder;
 }
 
 LoadSource SourceWithoutChoice(bool panelHasSelection, bool historyHasSelection)

@@ -2,6 +2,10 @@
 // chosen last counts.
 #pragma once
 
+#include <vector>
+
+#include "modrig/loader/LoadBatch.h"
+
 namespace ModrigUtils
 {
 // Why the panel's selection has changed: somebody chose, or another file type took files out of sight.
@@ -14,6 +18,15 @@ enum class PanelChange
 // Whether the panel's selection is from now on what Load will load. A file type is not a choice of files:
 // when it leaves the panel without any, what is chosen in the History stays chosen.
 bool PanelSelectionCounts(PanelChange change, bool panelIsEmpty, bool chosenInHistory);
+
+// A row, told from others that stand for the same file.
+using RowIdentity = const void*;
+
+// Whether what Load will load was chosen in the History: its last file is a row that is selected there.
+bool AreChosenInHistory(const std::vector<RowIdentity>& chosen, const std::vector<RowIdentity>& selected);
+
+// Whether Load goes into a folder instead: the host's own application folder is all that is chosen.
+bool IsHostFolderOnly(const std::vector<BatchFile>& chosen);
 
 enum class LoadSource
 {

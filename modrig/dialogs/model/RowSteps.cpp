@@ -56,4 +56,11 @@ std::optional<std::size_t> RowForKey(wchar_t key, const RowPlaces& places,
     const auto beyond = Search(goal, direction, rows, canBeSelected);
     return beyond ? beyond : Search(goal, -direction, rows, canBeSelected);
 }
+
+std::optional<std::size_t> RowPassedOverFor(wchar_t key, const RowPlaces& places,
+                                            const std::function<bool(std::size_t)>& canBeSelected)
+{
+    const auto row = RowForKey(key, places, canBeSelected);
+    return row == RowForKey(key, places, [](std::size_t) { return true; }) ? std::nullopt : row;
+}
 } // namespace ModrigUtils

@@ -30,6 +30,39 @@ TableAction MoveFor(wchar_t character)
 }
 } // namespace
 
+TableKey KnownKey(TableKey key)
+{
+    constexpr wchar_t kLastControlCharacter = 0x1A;
+    if (key.command && key.character > 0 && key.character <= kLastControlCharacter)
+        key.character = static_cast<wchar_t>(key.character + L'a' - 1);
+    return key;
+}
+
+const char* TitleKey(TableAction action)
+{
+    switch (action)
+    {
+    case TableAction::kLoad:
+        return "IDS_MODRIG_MENU_LOAD";
+    case TableAction::kUnload:
+        return "IDS_MODRIG_MENU_UNLOAD";
+    case TableAction::kAdd:
+        return "IDS_MODRIG_MENU_ADD";
+    case TableAction::kAddToStartupSuite:
+        return "IDS_MODRIG_MENU_ADD_TO_STARTUP_SUITE";
+    case TableAction::kRemove:
+        return "IDS_MODRIG_MENU_REMOVE";
+    case TableAction::kMoveUp:
+        return "IDS_MODRIG_MENU_MOVE_UP";
+    case TableAction::kMoveDown:
+        return "IDS_MODRIG_MENU_MOVE_DOWN";
+    case TableAction::kShowInFolder:
+        return "IDS_MODRIG_MENU_SHOW_IN_FOLDER";
+    default:
+        return "IDS_MODRIG_MENU_COPY_PATH";
+    }
+}
+
 std::vector<TableAction> MenuOf(TableKind kind)
 {
     std::vector<TableAction> menu;

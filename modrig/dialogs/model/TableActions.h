@@ -36,6 +36,9 @@ struct TableKey
     bool alternate = false;
 };
 
+// The key as the tables know it: some displays send Control-A as the first of the control characters.
+TableKey KnownKey(TableKey key);
+
 // Keys that are no characters, as the tables are told of them.
 inline constexpr wchar_t kInsertKey = 0xF727;
 inline constexpr wchar_t kForwardDeleteKey = 0xF728;
@@ -47,6 +50,9 @@ inline constexpr wchar_t kHomeKey = 0xF729;
 inline constexpr wchar_t kEndKey = 0xF72B;
 inline constexpr wchar_t kPageUpKey = 0xF72C;
 inline constexpr wchar_t kPageDownKey = 0xF72D;
+
+// The key of the text of its menu item.
+const char* TitleKey(TableAction action);
 
 // The menu of the table's rows, from top to bottom.
 std::vector<TableAction> MenuOf(TableKind kind);

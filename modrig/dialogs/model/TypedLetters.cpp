@@ -31,6 +31,14 @@ bool TypedLetters::IsTyping(Time now) const
     return !mLetters.IsEmpty() && now - mLast < kWordEnds;
 }
 
+bool TypedLetters::Take(TableKey key, Time now) const
+{
+    constexpr wchar_t kFirstFunctionKey = 0xF700;
+    if (key.command || key.alternate || key.character >= kFirstFunctionKey || key.character == kDeleteKey)
+        return false;
+    return key.character > L' ' || (key.character == L' ' && IsTyping(now));
+}
+
 std::optional<std::size_t> RowBeginningWith(const CStdStr& letters, std::size_t rows,
                                             std::optional<std::size_t> current,
                                             const std::function<CStdStr(std::size_t)>& nameOf)

@@ -6,6 +6,7 @@
 #include <optional>
 
 #include "modrig/base/CStdStr.h"
+#include "modrig/dialogs/model/TableActions.h"
 
 namespace ModrigUtils
 {
@@ -19,6 +20,9 @@ public:
 
     // Whether a word has begun that a space may go on with.
     bool IsTyping(Time now) const;
+
+    // Whether the key is a letter of a word, and no key that does something.
+    bool Take(TableKey key, Time now) const;
 
 private:
     CStdStr mLetters;

@@ -34,3 +34,23 @@ TEST(ChosenFiles, AreWhatIsStillSelectedWhenNoneAreLeft)
     EXPECT_EQ(LoadSource::kHistory, SourceWithoutChoice(false, true));
     EXPECT_EQ(LoadSource::kNothing, SourceWithoutChoice(false, false));
 }
+
+TEST(ChosenFiles, AreTheHistorysWhenTheLastOfThemIsSelectedThere)
+{
+    const int rows[3] = {};
+    EXPECT_TRUE(AreChosenInHistory({&rows[0], &rows[1]}, {&rows[1], &rows[2]}));
+    EXPECT_FALSE(AreChosenInHistory({&rows[1], &rows[0]}, {&rows[1], &rows[2]}));
+    EXPECT_FALSE(AreChosenInHistory({&rows[0]}, {}));
+    EXPECT_FALSE(AreChosenInHistory({}, {&rows[0]}));
+}
+
+TEST(ChosenFiles, AreAFolderToGoIntoWhenTheHostsIsAllOfThem)
+{
+    const BatchFile folder = {CStdStr(L"/host"), true};
+    const BatchFile file = {CStdStr(L"/a/tool.lsp"), false};
+    EXPECT_TRUE(IsHostFolderOnly({folder}));
+    EXPECT_FALSE(IsHostFolderOnly({file}));
+    EXPECT_FALSE(IsHostFolderOnly({folder, file}));
+    EXPECT_FALSE(IsHostFolderOnly({file, folder}));
+    EXPECT_FALSE(IsHostFolderOnly({}));
+}

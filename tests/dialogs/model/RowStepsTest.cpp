@@ -62,3 +62,16 @@ TEST(RowSteps, LeadNowhereWithoutARowOrForOtherKeys)
         RowForKey(kDownKey, {.rows = 3, .page = 1, .selected = {}}, [](std::size_t) { return false; }),
         Eq(std::nullopt));
 }
+
+TEST(RowSteps, NeedHelpOnlyWhereTheToolkitWouldComeToAnotherRow)
+{
+    const auto passedOver = [](std::size_t selected, wchar_t key)
+    {
+        return RowPassedOverFor(key, {.rows = 10, .page = 3, .selected = selected},
+                                [](std::size_t row) { return row == 3 || row == 4 || row == 7; });
+    };
+    EXPECT_THAT(passedOver(4, kDownKey), Optional(7u));
+    EXPECT_THAT(passedOver(7, kDownKey), Optional(7u));
+    EXPECT_THAT(passedOver(3, kDownKey), Eq(std::nullopt));
+    EXPECT_THAT(passedOver(3, L'x'), Eq(std::nullopt));
+}

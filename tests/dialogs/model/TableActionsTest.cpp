@@ -118,3 +118,26 @@ TEST(Moves, AreNoneAtTheEnds)
     EXPECT_THAT(Moves({1, 3}, 4, false), IsEmpty());
     EXPECT_THAT(Moves({}, 4, true), IsEmpty());
 }
+
+TEST(TableKeys, AreLettersWhereADisplaySendsControlCharacters)
+{
+    EXPECT_EQ(L'a', KnownKey({0x01, true}).character);
+    EXPECT_EQ(L'z', KnownKey({0x1A, true}).character);
+    EXPECT_EQ(0x1B, KnownKey({0x1B, true}).character);
+    EXPECT_EQ(0x01, KnownKey({0x01}).character);
+    EXPECT_EQ(L'\0', KnownKey({L'\0', true}).character);
+    EXPECT_TRUE(KnownKey({0x01, true, true}).alternate);
+}
+
+TEST(TableMenus, NameEachActionByATextOfItsOwn)
+{
+    EXPECT_STREQ("IDS_MODRIG_MENU_LOAD", TitleKey(TableAction::kLoad));
+    EXPECT_STREQ("IDS_MODRIG_MENU_UNLOAD", TitleKey(TableAction::kUnload));
+    EXPECT_STREQ("IDS_MODRIG_MENU_ADD", TitleKey(TableAction::kAdd));
+    EXPECT_STREQ("IDS_MODRIG_MENU_ADD_TO_STARTUP_SUITE", TitleKey(TableAction::kAddToStartupSuite));
+    EXPECT_STREQ("IDS_MODRIG_MENU_REMOVE", TitleKey(TableAction::kRemove));
+    EXPECT_STREQ("IDS_MODRIG_MENU_MOVE_UP", TitleKey(TableAction::kMoveUp));
+    EXPECT_STREQ("IDS_MODRIG_MENU_MOVE_DOWN", TitleKey(TableAction::kMoveDown));
+    EXPECT_STREQ("IDS_MODRIG_MENU_COPY_PATH", TitleKey(TableAction::kCopyPath));
+    EXPECT_STREQ("IDS_MODRIG_MENU_SHOW_IN_FOLDER", TitleKey(TableAction::kShowInFolder));
+}

@@ -63,3 +63,24 @@ TEST(RowBeginningWith, IsNoneInAnEmptyTable)
 {
     EXPECT_EQ(std::nullopt, RowBeginningWith(CStdStr(L"m"), 0, std::nullopt, nullptr));
 }
+
+TEST(TypedLetters, AreNoKeysThatDoSomething)
+{
+    const TypedLetters letters;
+    EXPECT_TRUE(letters.Take({L'g'}, At(0)));
+    EXPECT_TRUE(letters.Take({L'!'}, At(0)));
+    EXPECT_TRUE(letters.Take({0xE9}, At(0)));
+    for (const wchar_t character : {kUpKey, kInsertKey, kDeleteKey, L'\r', L'\t'})
+        EXPECT_FALSE(letters.Take({character}, At(0)));
+    EXPECT_FALSE(letters.Take({.character = L'g', .command = true}, At(0)));
+    EXPECT_FALSE(letters.Take({.character = L'g', .alternate = true}, At(0)));
+}
+
+TEST(TypedLetters, TakeASpaceOnlyWithinAWord)
+{
+    TypedLetters letters;
+    EXPECT_FALSE(letters.Take({L' '}, At(0)));
+    letters.Add(L'g', At(0));
+    EXPECT_TRUE(letters.Take({L' '}, At(999)));
+    EXPECT_FALSE(letters.Take({L' '}, At(1'000)));
+}

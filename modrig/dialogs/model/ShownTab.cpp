@@ -1,0 +1,15 @@
+#include "modrig/dialogs/model/ShownTab.h"
+
+#include "modrig/loader/LoadBatch.h"
+
+namespace ModrigUtils
+{
+std::optional<TableKind> TableToScroll(unsigned added, int insertRow, long tab)
+{
+    if (added == 0 || insertRow != kAppendRow)
+        return std::nullopt;
+    if (tab == kLoadedApplicationsTab)
+        return TableKind::kLoadedApplications;
+    return tab == kHistoryTab ? std::optional(TableKind::kHistory) : std::nullopt;
+}
+} // namespace ModrigUtils
