@@ -6,6 +6,8 @@
 #import "modrig/dialogs/ModrigFilePath.h"
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
+#include "modrig/messages/MessageIds.h"
+
 using testing::ElementsAre;
 using testing::IsEmpty;
 
@@ -141,7 +143,7 @@ TEST_F(Bridge, PassesTheQuestionsAboutAFileOn)
     EXPECT_TRUE([TsOCModrigUtil isValidFileForModrig:@"/a/tool.lsp"]);
     EXPECT_FALSE([TsOCModrigUtil isValidFileForModrig:@"/a/text.txt"]);
     EXPECT_FALSE([TsOCModrigUtil isValidFileForModrig:@"/a/tool"]);
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/tool")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a/tool")));
     EXPECT_EQ(file("tool.lsp"), wide([TsOCModrigUtil validateFileExists:path("tool.lsp")]));
     EXPECT_EQ(nil, [TsOCModrigUtil validateFileExists:@"/gone/missing.lsp"]);
     host().internet.urlsOfLocalFiles[L"/tmp/net.lsp"] = L"http://example.org/net.lsp";

@@ -6,6 +6,8 @@
 #import "modrig/dialogs/ModrigStartupSuiteBox.h"
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
+#include "modrig/messages/MessageIds.h"
+
 using testing::ElementsAre;
 using testing::IsEmpty;
 
@@ -79,7 +81,7 @@ TEST_F(Dropping, TellsOfAFileWithoutAnExtensionOnceItIsDropped)
 {
     open();
     drop(loadedTable(), paths({"README", "one.zmb"}), 0);
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, file("README"))));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, file("README"))));
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb")));
 }
 
@@ -151,7 +153,7 @@ TEST_F(Dropping, InsertsFilesAtTheRowTheLastOneOnTop)
     EXPECT_THAT(rowsOf(loadedApps()),
                 ElementsAre(file("m0.zmb"), file("m1.zmb"), file("m2.zmb"), file("two.zmb"), file("one.zmb"),
                             file("m3.zmb"), file("m4.zmb")));
-    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"2")));
     EXPECT_TRUE(gStartupList.IsEmpty());
 }
 
@@ -210,7 +212,7 @@ TEST_F(Dropping, TakesFiftyFiles)
     open();
     drop(loadedTable(), manyFiles(50), 0);
     EXPECT_EQ(50u, rowsOf(loadedApps()).size());
-    EXPECT_THAT(lines(), ElementsAre(Message(9, L"50")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"50")));
     EXPECT_THAT(boxes(), IsEmpty());
 }
 
@@ -221,7 +223,8 @@ TEST_F(Dropping, RefusesFiftyOneFilesAndLoadsNone)
     EXPECT_TRUE([box() performDragOperation:dragOf(manyFiles(51))]);
     EXPECT_THAT(rowsOf(loadedApps()), IsEmpty());
     EXPECT_TRUE(gStartupList.IsEmpty());
-    EXPECT_THAT(boxes(), ElementsAre(Message(37, L"50"), Message(37, L"50")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kTooManyFiles, L"50"),
+                                     Message(ModrigMessages::kTooManyFiles, L"50")));
     EXPECT_THAT(lines(), IsEmpty());
 }
 
@@ -231,7 +234,8 @@ TEST_F(Dropping, AddsFilesToTheStartupSuite)
     EXPECT_TRUE([box() performDragOperation:dragOf(paths({"one.zmb", "two.zmb"}))]);
     EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb"), file("two.zmb")));
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb"), file("two.zmb")));
-    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2"), Message(11, L"2")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"2"),
+                                     Message(ModrigMessages::kManyAddedToStartupSuite, L"2")));
 }
 
 TEST_F(Dropping, CountsAFileOfTheStartupSuiteWithoutAddingItTwice)
@@ -241,7 +245,8 @@ TEST_F(Dropping, CountsAFileOfTheStartupSuiteWithoutAddingItTwice)
     open();
     [box() performDragOperation:dragOf(paths({"one.zmb"}))];
     EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
-    EXPECT_THAT(lines(), ElementsAre(Message(48, L"one.zmb"), Message(10, L"one.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kAlreadyLoaded, L"one.zmb"),
+                                     Message(ModrigMessages::kOneAddedToStartupSuite, L"one.zmb")));
 }
 
 TEST_F(Dropping, AddsWhatWasLoadedBeforeAFailure)
@@ -251,7 +256,7 @@ TEST_F(Dropping, AddsWhatWasLoadedBeforeAFailure)
     [box() performDragOperation:dragOf(paths({"one.zmb", "bad.zmb", "two.zmb"}))];
     EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
     EXPECT_FALSE(host().linker.isLoaded(file("two.zmb")));
-    EXPECT_EQ(Message(10, L"one.zmb"), wide([mController message]));
+    EXPECT_EQ(Message(ModrigMessages::kOneAddedToStartupSuite, L"one.zmb"), wide([mController message]));
 }
 
 TEST_F(Dropping, KeepsTemporaryInternetFilesOutOfTheStartupSuite)
@@ -261,8 +266,8 @@ TEST_F(Dropping, KeepsTemporaryInternetFilesOutOfTheStartupSuite)
     [box() performDragOperation:dragOf(paths({"net.zmb"}))];
     EXPECT_TRUE(gStartupList.IsEmpty());
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("net.zmb")));
-    EXPECT_THAT(boxes(), ElementsAre(Message(41, file("net.zmb"))));
-    EXPECT_THAT(lines(), ElementsAre(Message(8, L"net.zmb")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kTemporaryInternetFile, file("net.zmb"))));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"net.zmb")));
 }
 
 TEST_F(Dropping, NamesTheFileThatJoinedTheStartupSuiteWhenTheLastOneCannot)
@@ -271,7 +276,8 @@ TEST_F(Dropping, NamesTheFileThatJoinedTheStartupSuiteWhenTheLastOneCannot)
     host().internet.urlsOfLocalFiles[file("net.zmb")] = L"http://example.org/net.zmb";
     [box() performDragOperation:dragOf(paths({"one.zmb", "net.zmb"}))];
     EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
-    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2"), Message(10, L"one.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"2"),
+                                     Message(ModrigMessages::kOneAddedToStartupSuite, L"one.zmb")));
 }
 
 TEST_F(Dropping, LoadsALispFileAloneOnTheTableAndAllOfItOnTheStartupSuiteBox)

@@ -1,6 +1,7 @@
 // The choice of the file types, and what is remembered of it.
 #include "tests/dialogs/support/DialogTest.h"
 
+#include "modrig/messages/MessageIds.h"
 #include "modrig/types/FileFilters.h"
 
 #import "modrig/dialogs/TsOCModrigUtil.h"
@@ -62,6 +63,6 @@ TEST_F(FileTypes, ThatCannotBeStoredAreToldAndUsed)
     host().registry.failWhen([](const RecordingRegistry::Call& call)
                              { return call.valueName == L"FileFilter" ? ERROR_WRITE_FAULT : ERROR_SUCCESS; });
     choose(3);
-    EXPECT_EQ(std::vector<std::wstring>{Message(24, L"%s")}, boxes());
+    EXPECT_EQ(std::vector<std::wstring>{Message(ModrigMessages::kFilterNotStored, L"%s")}, boxes());
     EXPECT_EQ(3u, [types() selectionIndex]);
 }

@@ -8,6 +8,7 @@
 #import <objc/runtime.h>
 
 #include "modrig/dialogs/Paths.h"
+#include "modrig/messages/MessageIds.h"
 #include "modrig/messages/ResourceOverride.h"
 #include "modrig/module/DialogBridge.h"
 #include "modrig/module/EntryPoint.h"
@@ -433,5 +434,6 @@ TEST_F(Lifetime, OfADialogThatTheToolkitEndsIsToldInATextOfTheModule)
 {
     const WatchedCommand watched(true);
     ModrigUtils::RunModrigDialog();
-    EXPECT_EQ(Message(60, L"NSGenericException: no %s more") + L"\n", host().output.printed);
+    EXPECT_EQ(Message(ModrigMessages::kDialogFailed, L"NSGenericException: no %s more") + L"\n",
+              host().output.printed);
 }

@@ -9,6 +9,8 @@
 #import "modrig/dialogs/ModrigArrayController.h"
 #import "modrig/dialogs/ModrigFilePath.h"
 
+#include "modrig/messages/MessageIds.h"
+
 using testing::ElementsAre;
 using testing::IsEmpty;
 
@@ -89,7 +91,7 @@ TEST_F(LongLoading, GoesOnWhenAnotherKeyIsPressed)
                  });
     load({"one.zmb", "two.zmb"});
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb"), file("two.zmb")));
-    EXPECT_EQ(Message(9, L"2"), message());
+    EXPECT_EQ(Message(ModrigMessages::kManyLoaded, L"2"), message());
 }
 
 TEST_F(LongLoading, SaysAfterASecondHowFarItIs)
@@ -106,7 +108,7 @@ TEST_F(LongLoading, SaysAfterASecondHowFarItIs)
     whileLoading("three.zmb", [&] { said.push_back(message()); });
     load({"one.zmb", "two.zmb", "three.zmb"});
     EXPECT_THAT(said, ElementsAre(L"", L"2 of 3 files are loaded. Escape stops."));
-    EXPECT_EQ(Message(9, L"3"), message());
+    EXPECT_EQ(Message(ModrigMessages::kManyLoaded, L"3"), message());
 }
 
 TEST_F(LongLoading, ShowsAnHourglassFromItsFirstFileToItsLast)

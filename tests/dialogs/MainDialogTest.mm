@@ -2,6 +2,7 @@
 
 #include <objc/runtime.h>
 
+#include "modrig/messages/MessageIds.h"
 #include "modrig/messages/Messages.h"
 #include "modrig/module/DialogBridge.h"
 
@@ -111,7 +112,7 @@ TEST_F(MainDialog, TakesMessagesIntoItsMessageLineOnlyWhileItIsOpen)
     EXPECT_EQ(L"", message());
     ModrigUtils::ModrigCmdlineMessage(CStdStr(L"now"));
     EXPECT_EQ(L"now", message());
-    ModrigUtils::ModrigCmdlineMessage(9, 0u);
+    ModrigUtils::ModrigCmdlineMessage(ModrigMessages::kManyLoaded, 0u);
     EXPECT_EQ(L"now", message());
     EXPECT_THAT(lines(), IsEmpty());
 }
@@ -122,8 +123,8 @@ TEST_F(MainDialog, LoadsTheSelectedFilesAndShowsThem)
     selectFiles({"one.zmb", "two.zmb"});
     [mController onLoad:nil];
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb"), file("two.zmb")));
-    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2")));
-    EXPECT_EQ(Message(9, L"2"), message());
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"2")));
+    EXPECT_EQ(Message(ModrigMessages::kManyLoaded, L"2"), message());
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(file("one.zmb"), file("two.zmb")));
 }
 
@@ -156,7 +157,7 @@ TEST_F(MainDialog, StopsAtTheSecondOfThreeFilesWithoutASummary)
     [mController onLoad:nil];
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb")));
     EXPECT_FALSE(host().linker.isLoaded(file("three.zmb")));
-    EXPECT_THAT(boxes(), ElementsAre(Message(38, file("two.zmb"))));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kLoadFailed, file("two.zmb"))));
     EXPECT_EQ(L"", message());
 }
 
@@ -169,7 +170,8 @@ TEST_F(MainDialog, ShowsApplicationsThatCannotBeLoadedAndSaysSoWhenOneIsChosen)
         EXPECT_TRUE([mController panel:mPanel shouldShowFilename:path(name)]) << name;
         selectFiles({name});
         [mController onLoad:nil];
-        EXPECT_THAT(boxes(), ElementsAre(Message(2, chosen), Message(38, chosen)));
+        EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, chosen),
+                                         Message(ModrigMessages::kLoadFailed, chosen)));
         close();
         host().output.boxes.clear();
     }
@@ -181,7 +183,7 @@ TEST_F(MainDialog, SaysThatAFileIsLoadedAlreadyAndAddsNoRow)
     open();
     selectFiles({"one.zmb"});
     [mController onLoad:nil];
-    EXPECT_THAT(lines(), ElementsAre(Message(48, L"one.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kAlreadyLoaded, L"one.zmb")));
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb")));
 }
 
@@ -191,7 +193,7 @@ TEST_F(MainDialog, GivesALispFileThatIsLoadedAgainNoSecondRow)
     open();
     selectFiles({"tool.lsp"});
     [mController onLoad:nil];
-    EXPECT_THAT(lines(), ElementsAre(Message(8, L"tool.lsp")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"tool.lsp")));
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("tool.lsp")));
 }
 
@@ -240,7 +242,7 @@ TEST_F(MainDialog, PassesOverTheHostsFolderAmongOtherFiles)
     EXPECT_FALSE([mController openTesselFolder]);
     [mController onLoad:nil];
     EXPECT_EQ(mFolder.path().wstring(), wide([mPanel directory]));
-    EXPECT_THAT(lines(), ElementsAre(Message(8, L"one.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"one.zmb")));
 }
 
 TEST_F(MainDialog, LoadsEveryFileThoughLoadingChangesWhatIsChosen)
@@ -250,7 +252,7 @@ TEST_F(MainDialog, LoadsEveryFileThoughLoadingChangesWhatIsChosen)
     selectFiles({"one.zmb", "two.zmb", "three.zmb"});
     [mController onLoad:nil];
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb"), file("two.zmb"), file("three.zmb")));
-    EXPECT_THAT(lines(), ElementsAre(Message(9, L"3")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"3")));
 }
 
 TEST_F(MainDialog, LoadsLispFilesAlone)
@@ -280,7 +282,7 @@ TEST_F(MainDialog, DoesNotRememberTheFolderWhenItLoadsFromTheHistory)
     open();
     select(historyTable(), {0});
     [mController onLoadFromHistory:nil];
-    EXPECT_THAT(lines(), ElementsAre(Message(8, L"one.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"one.zmb")));
     EXPECT_FALSE(setting(L"InitialPath"));
 }
 
@@ -346,7 +348,7 @@ TEST_F(MainDialog, AddsHistoryRowsToTheStartupSuiteAsIfTheyWereDropped)
     [mController onAddToStartupSuiteFromHistory:nil];
     EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb"), file("three.zmb")));
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb"), file("three.zmb")));
-    EXPECT_EQ(Message(11, L"2"), message());
+    EXPECT_EQ(Message(ModrigMessages::kManyAddedToStartupSuite, L"2"), message());
 }
 
 TEST_F(MainDialog, NamesTheOnlyRowRemovedFromTheHistory)
@@ -357,7 +359,7 @@ TEST_F(MainDialog, NamesTheOnlyRowRemovedFromTheHistory)
     [mController onRemove:nil];
     EXPECT_THAT(rowsOf(historyList()), ElementsAre(file("two.zmb")));
     EXPECT_THAT(Texts(gHistoryList), ElementsAre(file("two.zmb")));
-    EXPECT_THAT(lines(), ElementsAre(Message(35, L"one.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneRemovedFromHistory, L"one.zmb")));
     EXPECT_FALSE([mController canRemoveHistory]);
 }
 
@@ -368,7 +370,7 @@ TEST_F(MainDialog, CountsThreeRowsRemovedFromTheHistory)
     select(historyTable(), {0, 1, 3});
     [mController onRemove:nil];
     EXPECT_THAT(rowsOf(historyList()), ElementsAre(file("three.zmb")));
-    EXPECT_THAT(lines(), ElementsAre(Message(36, L"3")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyRemovedFromHistory, L"3")));
 }
 
 TEST_F(MainDialog, RemovesNothingWithoutASelection)
@@ -392,7 +394,7 @@ TEST_F(MainDialog, UnloadsTheSelectedRowAndNamesIt)
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb")));
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(file("one.zmb")));
     EXPECT_FALSE(host().linker.isLoaded(file("two.zmb")));
-    EXPECT_THAT(lines(), ElementsAre(Message(12, L"two.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneUnloaded, L"two.zmb")));
     EXPECT_FALSE([mController canUnloadApp]);
 }
 
@@ -404,7 +406,7 @@ TEST_F(MainDialog, CountsTwoUnloadedRows)
     select(loadedTable(), {0, 1});
     [mController onUnload:nil];
     EXPECT_THAT(rowsOf(loadedApps()), IsEmpty());
-    EXPECT_THAT(lines(), ElementsAre(Message(13, L"2")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyUnloaded, L"2")));
 }
 
 TEST_F(MainDialog, TakesOutEachRowBeforeItUnloadsTheNext)
@@ -439,7 +441,7 @@ TEST_F(MainDialog, PassesOverARowThatCouldNotBeUnloadedWhenItWasMade)
     [mController onUnload:nil];
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("locked.zmb")));
     EXPECT_TRUE(host().linker.isLoaded(file("locked.zmb")));
-    EXPECT_THAT(lines(), ElementsAre(Message(12, L"one.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneUnloaded, L"one.zmb")));
 }
 
 TEST_F(MainDialog, NamesTheLastRowTriedWhenOneOfTwoWasUnloaded)
@@ -451,7 +453,8 @@ TEST_F(MainDialog, NamesTheLastRowTriedWhenOneOfTwoWasUnloaded)
     select(loadedTable(), {0, 1});
     [mController onUnload:nil];
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("two.zmb")));
-    EXPECT_THAT(lines(), ElementsAre(Message(3, L"two.zmb"), Message(12, L"two.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kModuleLocked, L"two.zmb"),
+                                     Message(ModrigMessages::kOneUnloaded, L"two.zmb")));
 }
 
 TEST_F(MainDialog, KeepsRowsThatCannotBeUnloadedFromBeingSelected)

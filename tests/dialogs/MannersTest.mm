@@ -13,6 +13,8 @@
 #import "modrig/dialogs/ModrigTipButton.h"
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
+#include "modrig/messages/MessageIds.h"
+
 using testing::ElementsAre;
 using testing::IsEmpty;
 
@@ -82,7 +84,7 @@ TEST_F(Manners, TakeTheLastSuccessAwayWhenTheNextLoadFails)
     open();
     selectFiles({"one.zmb"});
     [mController onLoad:nil];
-    ASSERT_EQ(Message(8, L"one.zmb"), message());
+    ASSERT_EQ(Message(ModrigMessages::kOneLoaded, L"one.zmb"), message());
     host().linker.refuseToLoad(file("bad.zmb"));
     selectFiles({"bad.zmb"});
     [mController onLoad:nil];
@@ -195,7 +197,7 @@ TEST_F(TableKeys, RemoveTheSelectedRowsOfTheHistory)
     pressInTable(historyTable(), key(NSDeleteFunctionKey));
     EXPECT_THAT(rowsOf(historyList()), ElementsAre(file("a.lsp"), file("c.lsp")));
     EXPECT_THAT(Texts(gHistoryList), ElementsAre(file("a.lsp"), file("c.lsp")));
-    EXPECT_EQ(Message(35, L"b.lsp"), message());
+    EXPECT_EQ(Message(ModrigMessages::kOneRemovedFromHistory, L"b.lsp"), message());
 }
 
 TEST_F(TableKeys, SelectEveryRow)

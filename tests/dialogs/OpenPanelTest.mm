@@ -3,6 +3,7 @@
 #include <objc/runtime.h>
 
 #include "host/text/Unicode.h"
+#include "modrig/messages/MessageIds.h"
 #include "modrig/module/DialogBridge.h"
 
 #import "modrig/dialogs/ModrigFilePath.h"
@@ -283,7 +284,7 @@ TEST_F(OpenPanel, LoadsWithReturnAndClosesWithEscape)
     ModrigUtils::RunModrigDialog();
     EXPECT_FALSE([mPanel isVisible]);
     [mPanel release];
-    EXPECT_THAT(lines(), ElementsAre(Message(8, L"one.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"one.zmb")));
 }
 
 TEST_F(OpenPanel, ForgetsTheSelectedFileWhenTheListingIsFilteredAnew)

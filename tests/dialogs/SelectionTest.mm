@@ -3,6 +3,7 @@
 
 #include <algorithm>
 
+#include "modrig/messages/MessageIds.h"
 #include "modrig/module/DialogBridge.h"
 
 #import "modrig/dialogs/ModrigFilePath.h"
@@ -166,7 +167,8 @@ TEST_F(Selection, OfTheNewHistoryRowIsWhatLoadLoadsNext)
     EXPECT_TRUE([mController canRemoveHistory]);
     EXPECT_THAT(selectedFiles(), ElementsAre(file("b.lsp")));
     [mController onLoad:nil];
-    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2"), Message(8, L"b.lsp")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"2"),
+                                     Message(ModrigMessages::kOneLoaded, L"b.lsp")));
 }
 
 TEST_F(Selection, OfTheNewHistoryRowIsTheSameAfterAClickOnIt)
@@ -184,7 +186,8 @@ TEST_F(Selection, OfTheNewHistoryRowIsTheSameAfterAClickOnIt)
                             {
                                 EXPECT_THAT(selectedFiles(), ElementsAre(file("b.lsp")));
                                 [mController onLoad:nil];
-                                EXPECT_EQ(Message(8, L"b.lsp"), wide([mController message]));
+                                EXPECT_EQ(Message(ModrigMessages::kOneLoaded, L"b.lsp"),
+                                          wide([mController message]));
                                 [mPanel cancel:nil];
                             }});
     ModrigUtils::RunModrigDialog();
@@ -239,7 +242,7 @@ TEST_F(Selection, OfTheHistoryOutlivesAnotherFileType)
     chooseLisp();
     EXPECT_THAT(selectedFiles(), ElementsAre(file("old.zmb")));
     [mController onLoad:nil];
-    EXPECT_THAT(lines(), ElementsAre(Message(8, L"old.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"old.zmb")));
 }
 
 TEST_F(Selection, OfTheHistoryIsLoadedWhenThePanelLeavesNothingChosen)
@@ -249,7 +252,7 @@ TEST_F(Selection, OfTheHistoryIsLoadedWhenThePanelLeavesNothingChosen)
     select(historyTable(), {0});
     [mController panelSelectionDidChange:panelWith({})];
     [mController onLoad:nil];
-    EXPECT_THAT(lines(), ElementsAre(Message(8, L"old.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"old.zmb")));
 }
 
 TEST_F(Selection, OfNothingIsAnsweredInTheMessageLine)

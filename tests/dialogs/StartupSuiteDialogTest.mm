@@ -1,5 +1,6 @@
 #include "tests/dialogs/support/DialogTest.h"
 
+#include "modrig/messages/MessageIds.h"
 #include "modrig/module/DialogBridge.h"
 
 #import <tesselui/TsOCFileFilter.h>
@@ -146,7 +147,7 @@ TEST_F(StartupSuiteDialog, LoadsNewFilesThroughTheMainDialogAndAddsThem)
     EXPECT_THAT(rowsOf(rows()), ElementsAre(file("one.zmb"), file("two.lsp")));
     EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb"), file("two.lsp")));
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb"), file("two.lsp")));
-    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"2")));
 }
 
 TEST_F(StartupSuiteDialog, AddsAFileThatIsLoadedAlready)
@@ -157,7 +158,7 @@ TEST_F(StartupSuiteDialog, AddsAFileThatIsLoadedAlready)
     [mSuite addFiles:paths({"one.zmb"})];
     EXPECT_THAT(rowsOf(rows()), ElementsAre(file("one.zmb")));
     EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
-    EXPECT_THAT(lines(), ElementsAre(Message(48, L"one.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kAlreadyLoaded, L"one.zmb")));
 }
 
 TEST_F(StartupSuiteDialog, PassesOverAFileOfTheSuiteSilently)
@@ -199,7 +200,7 @@ TEST_F(StartupSuiteDialog, KeepsTemporaryInternetFilesOut)
     openSuite();
     host().internet.urlsOfLocalFiles[file("net.zmb")] = L"http://example.org/net.zmb";
     [mSuite addFiles:paths({"net.zmb", "one.zmb"})];
-    EXPECT_THAT(boxes(), ElementsAre(Message(41, file("net.zmb"))));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kTemporaryInternetFile, file("net.zmb"))));
     EXPECT_THAT(rowsOf(rows()), ElementsAre(file("one.zmb")));
     EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
 }
@@ -248,7 +249,7 @@ TEST_F(StartupSuiteDialog, RefusesFiftyOneFiles)
     for (int index = 0; index < 51; ++index)
         [files addObject:path("tool" + std::to_string(index) + ".zmb")];
     [mSuite addFiles:files];
-    EXPECT_THAT(boxes(), ElementsAre(Message(37, L"50")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kTooManyFiles, L"50")));
     EXPECT_THAT(rowsOf(rows()), IsEmpty());
     [files removeLastObject];
     [mSuite addFiles:files];

@@ -1,6 +1,7 @@
 #include "modrig/lists/ListRemoval.h"
 
 #include "modrig/lists/Globals.h"
+#include "modrig/messages/MessageIds.h"
 #include "tests/support/ModuleTest.h"
 
 using namespace ModrigUtils;
@@ -37,7 +38,7 @@ TEST_F(RemovingEntries, NamesTheOnlyEntryRemovedFromTheHistory)
 {
     RemoveFromHistory({CStdStr(L"/a/two.lsp")}, rowsGoingFrom(gHistoryList));
     EXPECT_THAT(Texts(gHistoryList), ElementsAre(L"/a/one.lsp", L"/a/three.lsp", L"/a/four.lsp"));
-    EXPECT_THAT(lines(), ElementsAre(Message(35, L"two.lsp")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneRemovedFromHistory, L"two.lsp")));
 }
 
 TEST_F(RemovingEntries, CountsSeveralEntriesRemovedFromTheHistory)
@@ -45,7 +46,7 @@ TEST_F(RemovingEntries, CountsSeveralEntriesRemovedFromTheHistory)
     RemoveFromHistory({CStdStr(L"/a/one.lsp"), CStdStr(L"/a/two.lsp"), CStdStr(L"/a/four.lsp")},
                       rowsGoingFrom(gHistoryList));
     EXPECT_THAT(Texts(gHistoryList), ElementsAre(L"/a/three.lsp"));
-    EXPECT_THAT(lines(), ElementsAre(Message(36, L"3")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyRemovedFromHistory, L"3")));
     EXPECT_THAT(mRows, ElementsAre(Pair(0, 4), Pair(1, 3), Pair(2, 2)));
 }
 

@@ -6,6 +6,7 @@
 #include "modrig/lists/Globals.h"
 #include "modrig/lists/History.h"
 #include "modrig/loader/StartupSuite.h"
+#include "modrig/messages/MessageIds.h"
 #include "tests/support/ModuleTest.h"
 
 using testing::ElementsAre;
@@ -100,7 +101,8 @@ protected:
     }
     static void ExpectTheFailureIsReportedOnce()
     {
-        EXPECT_THAT(boxes(), ElementsAre(L"[19] %s")) << "the text as it stands, without an argument";
+        EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kListNotStored, L"%s")))
+            << "the text as it stands, without an argument";
     }
 };
 } // namespace

@@ -1,6 +1,7 @@
 #include "modrig/loader/ApplicationLoader.h"
 
 #include "modrig/lists/Globals.h"
+#include "modrig/messages/MessageIds.h"
 #include "tests/support/ModuleTest.h"
 
 using namespace ModrigUtils;
@@ -128,7 +129,7 @@ TEST_F(PerformingALoad, ReportsAModuleThatDoesNotLoadAndListsItNowhere)
 {
     host().linker.refuseToLoad(L"/a/tool.zmb", L"it is truncated");
     EXPECT_EQ(0, Perform(L"/a/tool.zmb", 1));
-    EXPECT_THAT(boxes(), ElementsAre(Message(38, L"/a/tool.zmb")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kLoadFailed, L"/a/tool.zmb")));
     EXPECT_TRUE(gLoadedAppList.IsEmpty());
     EXPECT_TRUE(gHistoryList.IsEmpty());
 }
@@ -147,28 +148,31 @@ TEST_F(PerformingALoad, ReportsAFailureForAnyFlagButZero)
     {
         host().output.boxes.clear();
         EXPECT_EQ(0, Perform(L"/a/tool.zmb", 1, static_cast<signed char>(flag)));
-        EXPECT_THAT(boxes(), ElementsAre(Message(38, L"/a/tool.zmb"))) << flag;
+        EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kLoadFailed, L"/a/tool.zmb"))) << flag;
     }
 }
 
 TEST_F(PerformingALoad, ReportsAPathWithoutADotTwice)
 {
     EXPECT_EQ(0, Perform(L"/a/tool"));
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/tool"), Message(38, L"/a/tool")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a/tool"),
+                                     Message(ModrigMessages::kLoadFailed, L"/a/tool")));
 }
 
 TEST_F(PerformingALoad, ReportsAPathWithoutADotOnceWhenFailuresAreNotReported)
 {
     EXPECT_EQ(0, Perform(L"/a/tool", 0, 0));
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/tool")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a/tool")));
 }
 
 TEST_F(PerformingALoad, AlwaysRefusesPackagedLispAndMacroProjectsAloudWhileLispIsOn)
 {
     EXPECT_EQ(0, Perform(L"/a/tool.rpk", 1));
     EXPECT_EQ(0, Perform(L"/a/tool.mcp", 1));
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/tool.rpk"), Message(38, L"/a/tool.rpk"),
-                                     Message(2, L"/a/tool.mcp"), Message(38, L"/a/tool.mcp")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a/tool.rpk"),
+                                     Message(ModrigMessages::kLoadFailed, L"/a/tool.rpk"),
+                                     Message(ModrigMessages::kCannotLoadFile, L"/a/tool.mcp"),
+                                     Message(ModrigMessages::kLoadFailed, L"/a/tool.mcp")));
     EXPECT_TRUE(gLoadedAppList.IsEmpty());
 }
 
@@ -176,7 +180,8 @@ TEST_F(PerformingALoad, RefusesAListedPackagedLispAloudInsteadOfAnsweringTwo)
 {
     Fill(gLoadedAppList, {L"/a/tool.rpk"});
     EXPECT_EQ(0, Perform(L"/a/tool.rpk"));
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/tool.rpk"), Message(38, L"/a/tool.rpk")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a/tool.rpk"),
+                                     Message(ModrigMessages::kLoadFailed, L"/a/tool.rpk")));
 }
 
 TEST_F(PerformingALoad, RefusesLispAndMacroFilesSilentlyWhileLispIsOff)
@@ -204,7 +209,8 @@ TEST_F(PerformingALoad, RefusesUnknownFilesAloudWhileLispIsOff)
 {
     SetLispEnabled(RecordingValue::Short(0));
     EXPECT_EQ(0, Perform(L"/a/tool.txt"));
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/tool.txt"), Message(38, L"/a/tool.txt")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a/tool.txt"),
+                                     Message(ModrigMessages::kLoadFailed, L"/a/tool.txt")));
 }
 
 TEST_F(PerformingALoad, LoadsLispUnlessTheVariableIsAShortZero)
@@ -257,7 +263,7 @@ TEST_F(PerformingALoad, ReportsAPathOf4000CharactersThatDoesNotLoadByItsHead)
     const std::wstring path = LongPath(4000, L"tool.txt");
     EXPECT_EQ(0, Perform(path));
     ASSERT_EQ(2u, boxes().size());
-    EXPECT_TRUE(boxes()[1].starts_with(Message(38, path.substr(0, 1000))));
+    EXPECT_TRUE(boxes()[1].starts_with(Message(ModrigMessages::kLoadFailed, path.substr(0, 1000))));
 }
 
 TEST_F(PerformingALoad, DoesNotTakeALispPathThatIsTooLongToBeTakenApartForLisp)
@@ -286,14 +292,16 @@ TEST_F(LoadingAnApplication, RefusesAPathWithoutADotInBothDirections)
 {
     EXPECT_FALSE(LoadApplication(L"/a/tool", 1, 0));
     EXPECT_FALSE(LoadApplication(L"/a/tool", 0, 0));
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/tool"), Message(2, L"/a/tool")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a/tool"),
+                                     Message(ModrigMessages::kCannotLoadFile, L"/a/tool")));
 }
 
 TEST_F(LoadingAnApplication, RefusesAFileWhoseFolderAloneHasADot)
 {
     EXPECT_FALSE(LoadApplication(L"/a.lsp/tool", 1, 0));
     EXPECT_FALSE(LoadApplication(L"/a/tool.lsp.", 1, 0));
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a.lsp/tool"), Message(2, L"/a/tool.lsp.")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a.lsp/tool"),
+                                     Message(ModrigMessages::kCannotLoadFile, L"/a/tool.lsp.")));
 }
 
 TEST_F(LoadingAnApplication, HasNoRoadForMacroProjectsAndPackagedLispInEitherDirection)
@@ -303,7 +311,7 @@ TEST_F(LoadingAnApplication, HasNoRoadForMacroProjectsAndPackagedLispInEitherDir
         {
             host().output.boxes.clear();
             EXPECT_FALSE(LoadApplication(path, load, 1));
-            EXPECT_THAT(boxes(), ElementsAre(Message(2, path)));
+            EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, path)));
         }
     EXPECT_THAT(host().lisp.queued, IsEmpty());
     EXPECT_THAT(host().linker.calls, IsEmpty());
@@ -336,8 +344,9 @@ TEST_F(LoadingACompiledModule, LeavesALockedModuleAndNamesIt)
     host().linker.setLocked(L"/a/100%s.zmb");
     EXPECT_FALSE(LoadQMBFile(L"/a/100%s.zmb", 0));
     EXPECT_EQ(0u, host().journal.count(L"unloadModule"));
-    EXPECT_THAT(lines(), ElementsAre(Message(3, L"100%s.zmb")));
-    EXPECT_THAT(recordingDialog().messages, ElementsAre(Message(3, L"100%s.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kModuleLocked, L"100%s.zmb")));
+    EXPECT_THAT(recordingDialog().messages,
+                ElementsAre(Message(ModrigMessages::kModuleLocked, L"100%s.zmb")));
     EXPECT_THAT(boxes(), IsEmpty());
 }
 

@@ -1,6 +1,7 @@
 #include "modrig/loader/ApplicationLoader.h"
 
 #include "modrig/lists/Globals.h"
+#include "modrig/messages/MessageIds.h"
 #include "tests/support/ModuleTest.h"
 
 using namespace ModrigUtils;
@@ -143,7 +144,7 @@ TEST_F(LispLoader, QueuesAPathOf4000CharactersWhole)
 
 TEST_F(LispLoader, TakesThePromptFromTheTexts)
 {
-    host().resources.setText(kResourceModuleName, 15, L"100%s>");
+    host().resources.setText(kResourceModuleName, ModrigMessages::kLispPrompt, L"100%s>");
     EXPECT_TRUE(LoadLispFile(L"/a/tool.lsp", 1, 0));
     ASSERT_FALSE(queued().empty());
     EXPECT_EQ(L"(prompt \"100%s> \")", queued().back());

@@ -1,6 +1,7 @@
 #include "modrig/loader/LoadBatch.h"
 
 #include "modrig/lists/Globals.h"
+#include "modrig/messages/MessageIds.h"
 #include "tests/support/ModuleTest.h"
 
 using namespace ModrigUtils;
@@ -37,13 +38,13 @@ protected:
 TEST_F(LoadingABatch, NamesTheOnlyFileLoaded)
 {
     EXPECT_EQ(1u, Load({L"/a/tool.zmb"}));
-    EXPECT_THAT(lines(), ElementsAre(Message(8, L"tool.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"tool.zmb")));
 }
 
 TEST_F(LoadingABatch, CountsSeveralFiles)
 {
     EXPECT_EQ(2u, Load({L"/a/one.zmb", L"/a/two.zmb"}));
-    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"2")));
     EXPECT_THAT(mAdded, ElementsAre(0, 1));
 }
 
@@ -51,7 +52,7 @@ TEST_F(LoadingABatch, SaysThatTheOnlyFileWasLoadedAlready)
 {
     Fill(gLoadedAppList, {L"/a/tool.zmb"});
     EXPECT_EQ(0u, Load({L"/a/tool.zmb"}));
-    EXPECT_THAT(lines(), ElementsAre(Message(48, L"tool.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kAlreadyLoaded, L"tool.zmb")));
     EXPECT_THAT(mSucceeded, ElementsAre(0));
     EXPECT_THAT(mAdded, IsEmpty());
 }
@@ -60,7 +61,7 @@ TEST_F(LoadingABatch, CountsFilesLoadedAlreadyAmongTheProcessedOnes)
 {
     Fill(gLoadedAppList, {L"/a/one.zmb"});
     EXPECT_EQ(1u, Load({L"/a/one.zmb", L"/a/two.zmb"}));
-    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"2")));
     EXPECT_THAT(mSucceeded, ElementsAre(0, 1));
     EXPECT_THAT(mAdded, ElementsAre(1));
 }
@@ -71,7 +72,7 @@ TEST_F(LoadingABatch, StopsAtTheFirstFailureWithoutASummary)
     EXPECT_EQ(0u, Load({L"/a/one.zmb", L"/a/two.zmb", L"/a/three.zmb"}));
     EXPECT_THAT(mAdded, ElementsAre(0));
     EXPECT_FALSE(host().linker.isLoaded(L"/a/three.zmb"));
-    EXPECT_THAT(boxes(), ElementsAre(Message(38, L"/a/two.zmb")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kLoadFailed, L"/a/two.zmb")));
     EXPECT_THAT(recordingDialog().messages, IsEmpty());
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(L"/a/one.zmb"));
 }
@@ -80,7 +81,7 @@ TEST_F(LoadingABatch, PassesOverTheHostsFolderWithoutCountingIt)
 {
     mBatch.files.push_back({CStdStr(L"/host/Tessel.app"), true});
     EXPECT_EQ(1u, Load({L"/a/tool.zmb"}));
-    EXPECT_THAT(lines(), ElementsAre(Message(8, L"tool.zmb")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"tool.zmb")));
     EXPECT_THAT(boxes(), IsEmpty());
     EXPECT_THAT(mAdded, ElementsAre(1));
 }
@@ -141,7 +142,7 @@ TEST_F(LoadingABatch, IsNotStoppedAfterItsLastFile)
         return done == 2;
     };
     EXPECT_EQ(2u, Load({L"/a/one.zmb", L"/a/two.zmb"}));
-    EXPECT_THAT(lines(), ElementsAre(Message(9, L"2")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"2")));
 }
 
 TEST(RowForInsertion, IsTheEndWhenNothingWasDropped)

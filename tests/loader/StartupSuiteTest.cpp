@@ -1,6 +1,7 @@
 #include "modrig/loader/StartupSuite.h"
 
 #include "modrig/lists/Globals.h"
+#include "modrig/messages/MessageIds.h"
 #include "tests/support/ModuleTest.h"
 
 using ModrigUtils::InitializeStartupFiles;
@@ -98,11 +99,16 @@ TEST_F(StartupSuite, HandsEveryOtherKindToTheLoaderWhichRefusesItAndSaysSo)
 {
     Store({L"/a/one.mcp", L"/a/two.rpk", L"/a/three.xyz", L"/a.b/four", L"/a/five."});
     InitializeStartupFiles();
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/one.mcp"), Message(38, L"/a/one.mcp"),     //
-                                     Message(2, L"/a/two.rpk"), Message(38, L"/a/two.rpk"),     //
-                                     Message(2, L"/a/three.xyz"), Message(38, L"/a/three.xyz"), //
-                                     Message(2, L"/a.b/four"), Message(38, L"/a.b/four"),       //
-                                     Message(2, L"/a/five."), Message(38, L"/a/five.")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a/one.mcp"),
+                                     Message(ModrigMessages::kLoadFailed, L"/a/one.mcp"), //
+                                     Message(ModrigMessages::kCannotLoadFile, L"/a/two.rpk"),
+                                     Message(ModrigMessages::kLoadFailed, L"/a/two.rpk"), //
+                                     Message(ModrigMessages::kCannotLoadFile, L"/a/three.xyz"),
+                                     Message(ModrigMessages::kLoadFailed, L"/a/three.xyz"), //
+                                     Message(ModrigMessages::kCannotLoadFile, L"/a.b/four"),
+                                     Message(ModrigMessages::kLoadFailed, L"/a.b/four"), //
+                                     Message(ModrigMessages::kCannotLoadFile, L"/a/five."),
+                                     Message(ModrigMessages::kLoadFailed, L"/a/five.")));
     EXPECT_EQ(5u, gStartupList.GetCount());
     EXPECT_TRUE(gLoadedAppList.IsEmpty());
 }
@@ -114,7 +120,7 @@ TEST_F(StartupSuite, KeepsAnApplicationThatDoesNotLoadAndGoesOnBehindIt)
     InitializeStartupFiles();
     EXPECT_THAT(Texts(gStartupList), ElementsAre(L"/a/good.zmb", L"/a/broken.zmb", L"/a/better.zmb"));
     EXPECT_THAT(Texts(gLoadedAppList), ElementsAre(L"/a/good.zmb", L"/a/better.zmb"));
-    EXPECT_THAT(boxes(), ElementsAre(Message(38, L"/a/broken.zmb")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kLoadFailed, L"/a/broken.zmb")));
 }
 
 TEST_F(StartupSuite, AddsNothingToTheHistory)

@@ -1,5 +1,6 @@
 #include "modrig/messages/Messages.h"
 
+#include "modrig/messages/MessageIds.h"
 #include "tests/support/ModuleTest.h"
 
 using namespace ModrigUtils;
@@ -22,26 +23,26 @@ class HelpTopics : public ModuleTest, public testing::WithParamInterface<std::pa
 
 TEST_F(Messages, NameAFileWithoutItsFolderOnTheCommandLine)
 {
-    ModrigCmdlineMessage(12, CStdStr(L"/a/b/tool.lsp"));
-    EXPECT_EQ(Message(12, L"tool.lsp") + L"\n", printed());
+    ModrigCmdlineMessage(ModrigMessages::kOneUnloaded, CStdStr(L"/a/b/tool.lsp"));
+    EXPECT_EQ(Message(ModrigMessages::kOneUnloaded, L"tool.lsp") + L"\n", printed());
 }
 
 TEST_F(Messages, NameAFileOfAWindowsPathWithoutItsFolder)
 {
-    ModrigCmdlineMessage(12, CStdStr(L"C:\\a b\\tööl 1.lsp"));
-    EXPECT_EQ(Message(12, L"tööl 1.lsp") + L"\n", printed());
+    ModrigCmdlineMessage(ModrigMessages::kOneUnloaded, CStdStr(L"C:\\a b\\tööl 1.lsp"));
+    EXPECT_EQ(Message(ModrigMessages::kOneUnloaded, L"tööl 1.lsp") + L"\n", printed());
 }
 
 TEST_F(Messages, NameAFileWithItsWholePathInABox)
 {
-    ModrigAfxMessageBox(2, CStdStr(L"/a/b/tool.lsp"));
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/b/tool.lsp")));
+    ModrigAfxMessageBox(ModrigMessages::kCannotLoadFile, CStdStr(L"/a/b/tool.lsp"));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a/b/tool.lsp")));
 }
 
 TEST_F(Messages, ShowTheLineInTheDialogWithoutItsLineFeed)
 {
-    ModrigCmdlineMessage(12, CStdStr(L"/a/tool.lsp"));
-    EXPECT_THAT(recordingDialog().messages, ElementsAre(Message(12, L"tool.lsp")));
+    ModrigCmdlineMessage(ModrigMessages::kOneUnloaded, CStdStr(L"/a/tool.lsp"));
+    EXPECT_THAT(recordingDialog().messages, ElementsAre(Message(ModrigMessages::kOneUnloaded, L"tool.lsp")));
 }
 
 TEST_F(Messages, AreInTheDialogBeforeTheyAreOnTheCommandLine)
@@ -51,11 +52,11 @@ TEST_F(Messages, AreInTheDialogBeforeTheyAreOnTheCommandLine)
     {
         printedMeanwhile.push_back(printed());
     };
-    ModrigCmdlineMessage(12, CStdStr(L"/a/tool.lsp"));
+    ModrigCmdlineMessage(ModrigMessages::kOneUnloaded, CStdStr(L"/a/tool.lsp"));
     host().output.printed.clear();
-    ModrigCmdlineMessage(13, 2u);
+    ModrigCmdlineMessage(ModrigMessages::kManyUnloaded, 2u);
     EXPECT_THAT(printedMeanwhile, ElementsAre(L"", L""));
-    EXPECT_THAT(lines(), ElementsAre(Message(13, L"2")));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyUnloaded, L"2")));
 }
 
 TEST_F(Messages, PrintNothingWhenATextIsOnlyForTheDialog)
@@ -67,68 +68,71 @@ TEST_F(Messages, PrintNothingWhenATextIsOnlyForTheDialog)
 
 TEST_F(Messages, StandAsTheyAreForAnEmptyPath)
 {
-    ModrigCmdlineMessage(3, CStdStr());
-    EXPECT_EQ(L"[3] %s\n", printed());
-    ModrigAfxMessageBox(19, CStdStr());
-    EXPECT_THAT(boxes(), ElementsAre(L"[19] %s"));
+    ModrigCmdlineMessage(ModrigMessages::kModuleLocked, CStdStr());
+    EXPECT_EQ(Message(ModrigMessages::kModuleLocked, L"%s") + L"\n", printed());
+    ModrigAfxMessageBox(ModrigMessages::kListNotStored, CStdStr());
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kListNotStored, L"%s")));
 }
 
 TEST_F(Messages, NameNothingForAPathThatIsTooLongToBeTakenApart)
 {
-    ModrigCmdlineMessage(3, CStdStr(L"/a/" + std::wstring(300, L'n') + L".lsp"));
-    EXPECT_EQ(L"[3] \n", printed());
+    ModrigCmdlineMessage(ModrigMessages::kModuleLocked, CStdStr(L"/a/" + std::wstring(300, L'n') + L".lsp"));
+    EXPECT_EQ(Message(ModrigMessages::kModuleLocked, L"") + L"\n", printed());
 }
 
 TEST_F(Messages, AreAnEmptyLineAndAnEmptyBoxWhenTheirTextIsMissing)
 {
     host().resources.removeText(kResourceModuleName, 12);
-    ModrigCmdlineMessage(12, CStdStr(L"/a/tool.lsp"));
-    ModrigCmdlineMessage(12, CStdStr());
-    ModrigCmdlineMessage(12, 5u);
+    ModrigCmdlineMessage(ModrigMessages::kOneUnloaded, CStdStr(L"/a/tool.lsp"));
+    ModrigCmdlineMessage(ModrigMessages::kOneUnloaded, CStdStr());
+    ModrigCmdlineMessage(ModrigMessages::kOneUnloaded, 5u);
     EXPECT_EQ(L"\n\n\n", printed());
     EXPECT_THAT(recordingDialog().messages, ElementsAre(L"", L"", L""));
-    ModrigAfxMessageBox(12, CStdStr(L"/a/tool.lsp"));
-    ModrigAfxMessageBox(12, CStdStr());
+    ModrigAfxMessageBox(ModrigMessages::kOneUnloaded, CStdStr(L"/a/tool.lsp"));
+    ModrigAfxMessageBox(ModrigMessages::kOneUnloaded, CStdStr());
     EXPECT_THAT(boxes(), ElementsAre(L"", L""));
 }
 
 TEST_F(Messages, PrintACountInDecimal)
 {
-    ModrigCmdlineMessage(13, 1u);
-    ModrigCmdlineMessage(13, 20u);
-    ModrigCmdlineMessage(13, 2147483647u);
-    EXPECT_THAT(lines(), ElementsAre(Message(13, L"1"), Message(13, L"20"), Message(13, L"2147483647")));
+    ModrigCmdlineMessage(ModrigMessages::kManyUnloaded, 1u);
+    ModrigCmdlineMessage(ModrigMessages::kManyUnloaded, 20u);
+    ModrigCmdlineMessage(ModrigMessages::kManyUnloaded, 2147483647u);
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyUnloaded, L"1"),
+                                     Message(ModrigMessages::kManyUnloaded, L"20"),
+                                     Message(ModrigMessages::kManyUnloaded, L"2147483647")));
 }
 
 TEST_F(Messages, DoNothingAtAllForACountOfZero)
 {
     recordingDialog().messages = {L"what stood there"};
-    ModrigCmdlineMessage(13, 0u);
+    ModrigCmdlineMessage(ModrigMessages::kManyUnloaded, 0u);
     EXPECT_THAT(host().journal.entries(), IsEmpty());
     EXPECT_THAT(recordingDialog().messages, ElementsAre(L"what stood there"));
 }
 
 TEST_F(Messages, PrintTheTextItselfAsTheFormatSoThatNamesWithPerCentSignsStandAsTheyAre)
 {
-    ModrigCmdlineMessage(8, CStdStr(L"/a/100%.lsp"));
-    ModrigCmdlineMessage(8, CStdStr(L"/a/%s%n.lsp"));
-    ModrigCmdlineMessage(8, CStdStr(L"/a/%1000000000d%.lsp"));
-    EXPECT_THAT(lines(), ElementsAre(Message(8, L"100%.lsp"), Message(8, L"%s%n.lsp"),
-                                     Message(8, L"%1000000000d%.lsp")));
+    ModrigCmdlineMessage(ModrigMessages::kOneLoaded, CStdStr(L"/a/100%.lsp"));
+    ModrigCmdlineMessage(ModrigMessages::kOneLoaded, CStdStr(L"/a/%s%n.lsp"));
+    ModrigCmdlineMessage(ModrigMessages::kOneLoaded, CStdStr(L"/a/%1000000000d%.lsp"));
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"100%.lsp"),
+                                     Message(ModrigMessages::kOneLoaded, L"%s%n.lsp"),
+                                     Message(ModrigMessages::kOneLoaded, L"%1000000000d%.lsp")));
 }
 
 TEST_F(Messages, PrintADoubledPerCentSignOnceBecauseTheTextIsTheFormat)
 {
-    ModrigCmdlineMessage(8, CStdStr(L"/a/50%%.lsp"));
-    EXPECT_EQ(Message(8, L"50%.lsp") + L"\n", printed());
-    EXPECT_THAT(recordingDialog().messages, ElementsAre(Message(8, L"50%%.lsp")));
+    ModrigCmdlineMessage(ModrigMessages::kOneLoaded, CStdStr(L"/a/50%%.lsp"));
+    EXPECT_EQ(Message(ModrigMessages::kOneLoaded, L"50%.lsp") + L"\n", printed());
+    EXPECT_THAT(recordingDialog().messages, ElementsAre(Message(ModrigMessages::kOneLoaded, L"50%%.lsp")));
 }
 
 TEST_F(Messages, KeepPerCentSignsInABox)
 {
-    ModrigAfxMessageBox(38, CStdStr(L"/50%%/%s%n.lsp"));
+    ModrigAfxMessageBox(ModrigMessages::kLoadFailed, CStdStr(L"/50%%/%s%n.lsp"));
     ModrigAfxMessageBox(CStdStr(L"%d %%"));
-    EXPECT_THAT(boxes(), ElementsAre(Message(38, L"/50%%/%s%n.lsp"), L"%d %%"));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kLoadFailed, L"/50%%/%s%n.lsp"), L"%d %%"));
 }
 
 TEST_F(Messages, ShowABoxWithAnExclamationIconOverTheActiveWindow)
@@ -143,17 +147,18 @@ TEST_F(Messages, ShowABoxWithAnExclamationIconOverTheActiveWindow)
 TEST_F(Messages, CutAPathInABoxAtTheRoomOfFormatting)
 {
     const std::wstring path = LongPath(4000, L"tool.lsp");
-    ModrigAfxMessageBox(38, CStdStr(path));
-    const std::wstring expected = Message(38, path).substr(0, std::wstring(L"[38] %s").size() + 1023);
+    ModrigAfxMessageBox(ModrigMessages::kLoadFailed, CStdStr(path));
+    const std::wstring expected = Message(ModrigMessages::kLoadFailed, path)
+                                      .substr(0, Message(ModrigMessages::kLoadFailed, L"%s").size() + 1023);
     EXPECT_THAT(boxes(), ElementsAre(expected));
 }
 
 TEST_F(Messages, AreShownWholeHoweverLongTheyAre)
 {
     const std::wstring words(10000, L'w');
-    host().resources.setText(kResourceModuleName, 12, words + L"%s");
-    ModrigCmdlineMessage(12, CStdStr(L"/a/tool.lsp"));
-    ModrigAfxMessageBox(12, CStdStr(L"/a/tool.lsp"));
+    host().resources.setText(kResourceModuleName, ModrigMessages::kOneUnloaded, words + L"%s");
+    ModrigCmdlineMessage(ModrigMessages::kOneUnloaded, CStdStr(L"/a/tool.lsp"));
+    ModrigAfxMessageBox(ModrigMessages::kOneUnloaded, CStdStr(L"/a/tool.lsp"));
     EXPECT_THAT(lines(), ElementsAre(words + L"tool.lsp"));
     EXPECT_THAT(recordingDialog().messages, ElementsAre(words + L"tool.lsp"));
     EXPECT_THAT(boxes(), ElementsAre(words + L"/a/tool.lsp"));
@@ -161,10 +166,11 @@ TEST_F(Messages, AreShownWholeHoweverLongTheyAre)
 
 TEST_F(Messages, NameTheFileWhenTheCountIsExactlyOneAndCountOtherwise)
 {
-    ModrigCmdlineSummary(12, 13, 1, L"/a/tool.zmb");
-    ModrigCmdlineSummary(12, 13, 2, L"/a/tool.zmb");
-    ModrigCmdlineSummary(12, 13, 0, L"/a/tool.zmb");
-    EXPECT_THAT(lines(), ElementsAre(Message(12, L"tool.zmb"), Message(13, L"2")));
+    ModrigCmdlineSummary(ModrigMessages::kOneUnloaded, ModrigMessages::kManyUnloaded, 1, L"/a/tool.zmb");
+    ModrigCmdlineSummary(ModrigMessages::kOneUnloaded, ModrigMessages::kManyUnloaded, 2, L"/a/tool.zmb");
+    ModrigCmdlineSummary(ModrigMessages::kOneUnloaded, ModrigMessages::kManyUnloaded, 0, L"/a/tool.zmb");
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneUnloaded, L"tool.zmb"),
+                                     Message(ModrigMessages::kManyUnloaded, L"2")));
 }
 
 TEST_P(HelpTopics, OpenThePageOfTheDialogInTheHostsOwnBook)
@@ -180,3 +186,45 @@ INSTANTIATE_TEST_SUITE_P(EveryTopic, HelpTopics,
                                          std::pair{2, L"StandardFileSelectionDialogs"s},
                                          std::pair{3, L"load_unload_applications_dialog"s},
                                          std::pair{-1, L"load_unload_applications_dialog"s}));
+
+// The tests name messages; translations of the resource module know their numbers.
+TEST_F(Messages, KeepTheirNumbers)
+{
+    using namespace ModrigMessages;
+    const std::pair<unsigned, unsigned> numbers[] = {
+        {1, kOpenPanelTitle},
+        {2, kCannotLoadFile},
+        {3, kModuleLocked},
+        {8, kOneLoaded},
+        {9, kManyLoaded},
+        {10, kOneAddedToStartupSuite},
+        {11, kManyAddedToStartupSuite},
+        {12, kOneUnloaded},
+        {13, kManyUnloaded},
+        {14, kStartupSuitePanelTitle},
+        {15, kLispPrompt},
+        {16, kCommandGroup},
+        {17, kCommandGlobalName},
+        {18, kCommandLocalName},
+        {19, kListNotStored},
+        {24, kFilterNotStored},
+        {25, kAllApplicationsFilter},
+        {26, kBundleFilter},
+        {27, kLispSourceFilter},
+        {28, kObjectModuleFilter},
+        {29, kCompiledLispFilter},
+        {35, kOneRemovedFromHistory},
+        {36, kManyRemovedFromHistory},
+        {37, kTooManyFiles},
+        {38, kLoadFailed},
+        {39, kUrlNotFetched},
+        {41, kTemporaryInternetFile},
+        {46, kPackagedLispFilter},
+        {47, kMacroProjectFilter},
+        {48, kAlreadyLoaded},
+        {51, kCoreModuleFilter},
+        {60, kDialogFailed},
+    };
+    for (const auto& [number, message] : numbers)
+        EXPECT_EQ(number, message);
+}

@@ -3,6 +3,7 @@
 #include <tessel/tsappinfo.h>
 
 #include "modrig/lists/Globals.h"
+#include "modrig/messages/MessageIds.h"
 #include "modrig/messages/ResourceOverride.h"
 #include "tests/support/ModuleTest.h"
 
@@ -271,7 +272,9 @@ TEST_F(EntryPoint, AddsTheCommandWithItsNineArguments)
 
 TEST_F(EntryPoint, TakesTheCommandsNamesFromItsOwnModuleWhateverIsCurrent)
 {
-    host().resources.addModule(L"own.dll", {{16, L"OWN_GROUP"}, {17, L"OWN_GLOBAL"}, {18, L"OWN"}});
+    host().resources.addModule(L"own.dll", {{ModrigMessages::kCommandGroup, L"OWN_GROUP"},
+                                            {ModrigMessages::kCommandGlobalName, L"OWN_GLOBAL"},
+                                            {ModrigMessages::kCommandLocalName, L"OWN"}});
     hModrigRes = host().resources.load(L"own.dll");
     CTemporaryResourceOverride::m_hInstanceDefault = host().resources.load(kResourceModuleName);
     initApp();
@@ -283,14 +286,16 @@ TEST_F(EntryPoint, TakesTheCommandsNamesFromItsOwnModuleWhateverIsCurrent)
 
 TEST_F(EntryPoint, AddsNoCommandSilentlyWhenOneOfItsNamesIsMissing)
 {
-    for (const unsigned missing : {16u, 17u, 18u})
+    for (const unsigned missing : {ModrigMessages::kCommandGroup, ModrigMessages::kCommandGlobalName,
+                                   ModrigMessages::kCommandLocalName})
     {
         SetUp();
         StoreStartupSuite({L"/apps/tool.zmb"});
         host().resources.removeText(kResourceModuleName, missing);
         EXPECT_EQ(0, Send(kLoadMessage));
         EXPECT_THAT(host().commands.added, IsEmpty());
-        EXPECT_EQ(missing - 15, host().journal.count(L"loadStringFromWin32ResourceDLL"))
+        EXPECT_EQ(missing - ModrigMessages::kCommandGroup + 1,
+                  host().journal.count(L"loadStringFromWin32ResourceDLL"))
             << "the first missing text ends the chain";
         EXPECT_THAT(host().services.asked, ElementsAre(L"DynamicLinker", L"DynamicLinker"));
         EXPECT_THAT(lines(), IsEmpty());

@@ -3,24 +3,41 @@
 #include <algorithm>
 
 #include "modrig/lists/Globals.h"
+#include "modrig/messages/MessageIds.h"
 #include "modrig/messages/ResourceOverride.h"
 
 namespace
 {
-constexpr unsigned kMessagesWithArgument[] = {2,  3,  8,  9,  10, 11, 12, 13, 19,
-                                              24, 35, 36, 37, 38, 39, 41, 48, 60};
+constexpr unsigned kMessagesWithArgument[] = {ModrigMessages::kCannotLoadFile,
+                                              ModrigMessages::kModuleLocked,
+                                              ModrigMessages::kOneLoaded,
+                                              ModrigMessages::kManyLoaded,
+                                              ModrigMessages::kOneAddedToStartupSuite,
+                                              ModrigMessages::kManyAddedToStartupSuite,
+                                              ModrigMessages::kOneUnloaded,
+                                              ModrigMessages::kManyUnloaded,
+                                              ModrigMessages::kListNotStored,
+                                              ModrigMessages::kFilterNotStored,
+                                              ModrigMessages::kOneRemovedFromHistory,
+                                              ModrigMessages::kManyRemovedFromHistory,
+                                              ModrigMessages::kTooManyFiles,
+                                              ModrigMessages::kLoadFailed,
+                                              ModrigMessages::kUrlNotFetched,
+                                              ModrigMessages::kTemporaryInternetFile,
+                                              ModrigMessages::kAlreadyLoaded,
+                                              ModrigMessages::kDialogFailed};
 
 RecordingResources::Texts TestTexts()
 {
     RecordingResources::Texts texts = {
-        {1, L"Load"},
-        {14, L"Add"},
-        {15, L"Command:"},
-        {16, L"GROUP"},
-        {17, L"GLOBALNAME"},
-        {18, L"LOCALNAME"},
-        {25, L"R%d %s|*.bundle;*.exe;*.LSP"},
-        {26, L"Bundles|*.bundle"},
+        {ModrigMessages::kOpenPanelTitle, L"Load"},
+        {ModrigMessages::kStartupSuitePanelTitle, L"Add"},
+        {ModrigMessages::kLispPrompt, L"Command:"},
+        {ModrigMessages::kCommandGroup, L"GROUP"},
+        {ModrigMessages::kCommandGlobalName, L"GLOBALNAME"},
+        {ModrigMessages::kCommandLocalName, L"LOCALNAME"},
+        {ModrigMessages::kAllApplicationsFilter, L"R%d %s|*.bundle;*.exe;*.LSP"},
+        {ModrigMessages::kBundleFilter, L"Bundles|*.bundle"},
     };
     for (const unsigned id : kMessagesWithArgument)
         texts[id] = L"[" + std::to_wstring(id) + L"] %s";

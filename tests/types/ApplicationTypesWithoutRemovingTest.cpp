@@ -1,6 +1,7 @@
 // In a host that does not load compiled and packaged Lisp.
 #include "modrig/loader/ApplicationLoader.h"
 #include "modrig/loader/LoadedApplications.h"
+#include "modrig/messages/MessageIds.h"
 #include "modrig/types/ApplicationTypes.h"
 #include "modrig/types/FileFilters.h"
 #include "modrig/types/FileValidation.h"
@@ -55,8 +56,10 @@ TEST_F(HostWithoutCompiledLisp, LoadsNoneOfTheirFiles)
 {
     EXPECT_EQ(kNotLoaded, PerformModrig(L"/a/tool.qbc", 1, 1, 1));
     EXPECT_EQ(kNotLoaded, PerformModrig(L"/a/tool.rpk", 1, 1, 1));
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/tool.qbc"), Message(38, L"/a/tool.qbc"),
-                                     Message(2, L"/a/tool.rpk"), Message(38, L"/a/tool.rpk")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a/tool.qbc"),
+                                     Message(ModrigMessages::kLoadFailed, L"/a/tool.qbc"),
+                                     Message(ModrigMessages::kCannotLoadFile, L"/a/tool.rpk"),
+                                     Message(ModrigMessages::kLoadFailed, L"/a/tool.rpk")));
     EXPECT_THAT(host().lisp.queued, IsEmpty());
 }
 
@@ -74,8 +77,10 @@ TEST_F(HostWithoutCompiledLisp, CountsTheirFilesAmongThoseThatCannotBeFoundNotLo
 
 TEST_F(HostWithoutCompiledLisp, TakesTheirPatternsOutOfTheFilters)
 {
-    host().resources.setText(kResourceModuleName, 29, L"Compiled Lisp|*.qbc");
-    host().resources.setText(kResourceModuleName, 46, L"Packaged Lisp|*.rpk;*.lsp");
+    host().resources.setText(kResourceModuleName, ModrigMessages::kCompiledLispFilter,
+                             L"Compiled Lisp|*.qbc");
+    host().resources.setText(kResourceModuleName, ModrigMessages::kPackagedLispFilter,
+                             L"Packaged Lisp|*.rpk;*.lsp");
     CStdStr filter;
     ReAdjustFilterString(filter);
     EXPECT_EQ(L"R21 Tessel|*.bundle;*.LSP|Bundles|*.bundle|Compiled Lisp||Packaged Lisp|*.lsp|",

@@ -1,5 +1,6 @@
 #include "modrig/types/FileFilters.h"
 
+#include "modrig/messages/MessageIds.h"
 #include "tests/support/ModuleTest.h"
 
 using namespace ModrigUtils;
@@ -58,14 +59,15 @@ TEST_F(FileFilters, ReportAChoiceThatCannotBeStored)
 {
     host().registry.failAfter(RecordingRegistry::Operation::kWrite, 0);
     EXPECT_FALSE(SetRegFileFilterListIndex(L"Bundles"));
-    EXPECT_THAT(boxes(), ElementsAre(L"[24] %s")) << "the text as it stands, without an argument";
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kFilterNotStored, L"%s")))
+        << "the text as it stands, without an argument";
 }
 
 TEST_F(FileFilters, ReportAChoiceWhoseKeyCannotBeOpened)
 {
     host().registry.failAfter(RecordingRegistry::Operation::kCreate, 0);
     EXPECT_FALSE(SetRegFileFilterListIndex(L"Bundles"));
-    EXPECT_THAT(boxes(), ElementsAre(L"[24] %s"));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kFilterNotStored, L"%s")));
 }
 
 TEST_F(FileFilters, PutTheReleaseAndTheHostsNameIntoTheFirstDescription)
@@ -76,37 +78,37 @@ TEST_F(FileFilters, PutTheReleaseAndTheHostsNameIntoTheFirstDescription)
 
 TEST_F(FileFilters, KeepOnlyPatternsOfApplications)
 {
-    SetText(26, L"Some|*.exe;*.zmb;*.*;*.OMP;*.dll");
+    SetText(ModrigMessages::kBundleFilter, L"Some|*.exe;*.zmb;*.*;*.OMP;*.dll");
     EXPECT_EQ(std::wstring(kFirst) + L"Some|*.zmb;*.OMP|", Readjusted());
 }
 
 TEST_F(FileFilters, KeepThePlaceAndTheDescriptionOfAnEntryWithoutAnyPatternLeft)
 {
-    SetText(26, L"Programs|*.exe;*.dll");
-    SetText(51, L"No patterns|");
-    SetText(27, L"No bar");
-    SetText(28, L"Objects|*.omp");
+    SetText(ModrigMessages::kBundleFilter, L"Programs|*.exe;*.dll");
+    SetText(ModrigMessages::kCoreModuleFilter, L"No patterns|");
+    SetText(ModrigMessages::kLispSourceFilter, L"No bar");
+    SetText(ModrigMessages::kObjectModuleFilter, L"Objects|*.omp");
     EXPECT_EQ(std::wstring(kFirst) + L"Programs||No patterns||No bar||Objects|*.omp|", Readjusted());
 }
 
 TEST_F(FileFilters, PutAChosenEntryFirstAlsoWithoutAnyPatternLeft)
 {
-    SetText(26, L"Programs|*.exe");
+    SetText(ModrigMessages::kBundleFilter, L"Programs|*.exe");
     Choose(L"Programs");
     EXPECT_EQ(std::wstring(L"Programs||") + kFirst, Readjusted());
 }
 
 TEST_F(FileFilters, DropEmptyEntriesOnly)
 {
-    SetText(26, L"");
-    SetText(51, L"|");
-    SetText(27, L"|*.lsp");
+    SetText(ModrigMessages::kBundleFilter, L"");
+    SetText(ModrigMessages::kCoreModuleFilter, L"|");
+    SetText(ModrigMessages::kLispSourceFilter, L"|*.lsp");
     EXPECT_EQ(std::wstring(kFirst) + L"|||*.lsp|", Readjusted());
 }
 
 TEST_F(FileFilters, AreInTheOrderOfTheTableWhenNothingWasChosenAlsoWithAnEntryThatDescribesNothing)
 {
-    SetText(26, L"|*.bundle");
+    SetText(ModrigMessages::kBundleFilter, L"|*.bundle");
     for (const bool chosen : {false, true})
     {
         if (chosen)
@@ -117,7 +119,7 @@ TEST_F(FileFilters, AreInTheOrderOfTheTableWhenNothingWasChosenAlsoWithAnEntryTh
 
 TEST_F(FileFilters, EndTheDescriptionAtTheFirstBar)
 {
-    SetText(26, L"Bundles|*.bundle;*.zmb|*.lsp");
+    SetText(ModrigMessages::kBundleFilter, L"Bundles|*.bundle;*.zmb|*.lsp");
     EXPECT_EQ(std::wstring(kFirst) + kBundles, Readjusted()) << "no kind is called \"zmb|*.lsp\"";
     Choose(L"Bundles");
     EXPECT_EQ(std::wstring(kBundles) + kFirst, Readjusted());
@@ -133,8 +135,8 @@ TEST_F(FileFilters, FollowTheOrderOfTheTableAndNotOfTheNumbers)
 
 TEST_F(FileFilters, PutTheRememberedChoiceFirstAndKeepTheOrderOfTheOthers)
 {
-    SetText(51, L"Core|*.zmb");
-    SetText(27, L"Lisp|*.lsp");
+    SetText(ModrigMessages::kCoreModuleFilter, L"Core|*.zmb");
+    SetText(ModrigMessages::kLispSourceFilter, L"Lisp|*.lsp");
     Choose(L"CORE");
     EXPECT_EQ(std::wstring(L"Core|*.zmb|") + kFirst + kBundles + L"Lisp|*.lsp|", Readjusted());
 }
@@ -151,7 +153,7 @@ TEST_F(FileFilters, CompareTheChoiceWithTheWholeDescription)
 
 TEST_F(FileFilters, LookUpNoPatternTwice)
 {
-    SetText(26, L"Some|;;*.lsp;;zmb;");
+    SetText(ModrigMessages::kBundleFilter, L"Some|;;*.lsp;;zmb;");
     EXPECT_EQ(std::wstring(kFirst) + L"Some|*.lsp;zmb|", Readjusted());
 }
 

@@ -1,5 +1,6 @@
 #include "modrig/types/FileValidation.h"
 
+#include "modrig/messages/MessageIds.h"
 #include "tests/support/ModuleTest.h"
 
 using namespace ModrigUtils;
@@ -49,14 +50,15 @@ TEST_F(FileValidation, AcceptsEveryKindOfApplicationInAnyCase)
 TEST_F(FileValidation, RefusesAPathWithoutADotAndSaysSo)
 {
     EXPECT_FALSE(IsValidFileForModrig(L"/a/tool"));
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/tool")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a/tool")));
 }
 
 TEST_F(FileValidation, RefusesAPathThatEndsWithItsDotAndSaysSo)
 {
     EXPECT_FALSE(IsValidFileForModrig(L"/a/tool."));
     EXPECT_FALSE(IsValidFileForModrig(L"/a/tool.lsp."));
-    EXPECT_THAT(boxes(), ElementsAre(Message(2, L"/a/tool."), Message(2, L"/a/tool.lsp.")));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/a/tool."),
+                                     Message(ModrigMessages::kCannotLoadFile, L"/a/tool.lsp.")));
 }
 
 TEST_F(FileValidation, RefusesAnUnknownExtensionSilently)
@@ -268,7 +270,8 @@ TEST_F(UrlValidation, ReportsAUrlThatCannotBeFetched)
         host().output.boxes.clear();
         Serve(L"http://example.test/tool.lsp", status);
         EXPECT_EQ(L"http://example.test/tool.lsp", Validated(L"http://example.test/tool.lsp"));
-        EXPECT_THAT(boxes(), ElementsAre(L"[39] %s")) << "the text as it stands, without an argument";
+        EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kUrlNotFetched, L"%s")))
+            << "the text as it stands, without an argument";
     }
 }
 
@@ -327,5 +330,5 @@ TEST_F(UrlValidation, FitsTheLongestPathOfALocalCopy)
     EXPECT_EQ(LongPath(1023, L"tool.lsp"), Validated(url));
     host().applicationServices.remotes[url] = {TS_FROM_CACHE, LongPath(1024, L"tool.lsp")};
     EXPECT_EQ(url, Validated(url));
-    EXPECT_THAT(boxes(), ElementsAre(L"[39] %s"));
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kUrlNotFetched, L"%s")));
 }
