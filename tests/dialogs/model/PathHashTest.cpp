@@ -18,3 +18,16 @@ TEST(PathHash, TellsPathsApartByLettersThatNothingElseIsEqualTo)
     EXPECT_NE(HashOfPath(u""), HashOfPath(u"9"));
     EXPECT_NE(HashOfPath(u"/"), HashOfPath(u"/."));
 }
+
+TEST(PathHash, PassesOverLettersThatOthersAreEqualTo)
+{
+    EXPECT_EQ(HashOfPath(u"/bk"), HashOfPath(u"/b\u212A"));      // the sign for kelvin
+    EXPECT_EQ(HashOfPath(u"/s"), HashOfPath(u"/\u017F"));        // the long s
+    EXPECT_EQ(HashOfPath(u"/bfi/x"), HashOfPath(u"/b\uFB01/x")); // the ligature fi
+}
+
+TEST(PathHash, PassesOverALetterThatAnAccentMayFollow)
+{
+    EXPECT_EQ(HashOfPath(u"/caf\u00E9.x"), HashOfPath(u"/cafe\u0301.x"));
+    EXPECT_EQ(HashOfPath(u"/\u00E9"), HashOfPath(u"/e\u0301"));
+}
