@@ -8,15 +8,12 @@
 #import "modrig/dialogs/ModrigController.h"
 #import "modrig/dialogs/ModrigFilePath.h"
 
+#include "modrig/types/FileFilters.h"
 #include "modrig/types/FileValidation.h"
 
 namespace
 {
 ModrigController* gModrigController = nil;
-
-// Each has a description under the key, and extensions under the key followed by "_EXT".
-NSString* const kFilterKeys[] = {@"IDS_MODRIG_TESSEL_APPS", @"IDS_MODRIG_QMB_APPS", @"IDS_MODRIG_ZMB_APPS",
-                                 @"IDS_MODRIG_LSP_APPS",    @"IDS_MODRIG_OMP_APPS", @"IDS_MODRIG_QBC_APPS"};
 
 CStdStr wide(NSString* text)
 {
@@ -76,8 +73,9 @@ CStdStr wide(NSString* text)
 
 + (void)populateModrigFileFilter:(NSMutableArray*)filters
 {
-    for (NSString* key : kFilterKeys)
+    for (const char* name : ModrigUtils::FileFilterKeys())
     {
+        NSString* key = [NSString stringWithUTF8String:name];
         NSString* description = [self modrigLoadString:key];
         NSString* extensions = [self modrigLoadString:[key stringByAppendingString:@"_EXT"]];
         [filters addObject:[[[TsOCFileFilter alloc] initWithDescription:description

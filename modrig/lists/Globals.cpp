@@ -4,10 +4,7 @@
 
 // One file, so that the order of construction is the order of these lines: the table first, then the lists as
 // loaded, startup, history; they are destroyed in reverse.
-CExtInfo sExtInfo[kApplicationTypes] = {
-    {L"bundle", kCompiledModule}, {L"zmb", kCompiledModule}, {L"lsp", kLispFile}, {L"mcp", kMacroProject},
-    {L"omp", kCompiledModule},    {L"rpk", kPackagedLisp},   {L"qbc", kLispFile},
-};
+std::array<CExtInfo, kApplicationTypes> sExtInfo = ModrigUtils::UsableKinds();
 
 CStringList gLoadedAppList;
 CStringList gStartupList;

@@ -2,6 +2,7 @@
 
 #include "modrig/base/SplitPath.h"
 #include "modrig/lists/Globals.h"
+#include "modrig/types/ApplicationTypes.h"
 
 namespace ModrigUtils
 {
@@ -37,10 +38,8 @@ bool FoundinLoadedList(const CStdStr& path)
 
 bool IsALispAppFoundinList(const CStdStr& path)
 {
-    const SplitPath split(path);
-    const bool lisp =
-        split.HasExtension(L".lsp") || split.HasExtension(L".rpk") || split.HasExtension(L".qbc");
-    return lisp && FoundinSpecificList(path, gLoadedAppList);
+    const ApplicationKind* kind = KindOfFile(SplitPath(path));
+    return kind && kind->isLisp && FoundinSpecificList(path, gLoadedAppList);
 }
 
 void RemoveInSpecificList(const CStdStr& path, CStringList& list)

@@ -2,9 +2,6 @@
 
 #include <tessel/tsed.h>
 
-#include <algorithm>
-#include <iterator>
-
 #include "modrig/base/SplitPath.h"
 #include "modrig/lists/Globals.h"
 #include "modrig/lists/ListMembership.h"
@@ -32,10 +29,8 @@ bool LispIsDisabled()
 // Macro projects are no Lisp, and stand here all the same: who switches Lisp off wants no scripts loaded.
 bool IsRefusedWhileLispIsOff(const CStdStr& path)
 {
-    static constexpr const wchar_t* kRefused[] = {L".lsp", L".qbc", L".rpk", L".mcp"};
-    const SplitPath split(path);
-    return std::any_of(std::begin(kRefused), std::end(kRefused),
-                       [&split](const wchar_t* extension) { return split.HasExtension(extension); });
+    const ApplicationKind* kind = KindOfFile(SplitPath(path));
+    return kind && (kind->isLisp || kind->type == kMacroProject);
 }
 
 void RecordLoaded(const CStdStr& path, bool listedAlready, int addToHistory)

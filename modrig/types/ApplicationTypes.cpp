@@ -2,9 +2,13 @@
 
 #include <tessel/tsed.h>
 
+#include <algorithm>
 #include <cwchar>
+#include <string>
+#include <utility>
 
 #include "modrig/base/CaseFolding.h"
+#include "modrig/base/SplitPath.h"
 
 CExtInfo::CExtInfo(const wchar_t* ext, int type)
     : mbEnabled(testValidExt(ext, type)), mExtension{}, mType(type)
@@ -22,6 +26,37 @@ bool CExtInfo::testValidExt(const wchar_t* ext, int type)
 
 namespace ModrigUtils
 {
+namespace
+{
+template <std::size_t... kRows>
+std::array<CExtInfo, kApplicationTypes> UsableRows(std::index_sequence<kRows...>)
+{
+    return {CExtInfo(kApplicationKinds[kRows].extension, kApplicationKinds[kRows].type)...};
+}
+} // namespace
+
+std::array<CExtInfo, kApplicationTypes> UsableKinds()
+{
+    return UsableRows(std::make_index_sequence<kApplicationTypes>());
+}
+
+const ApplicationKind* KindOfFile(const SplitPath& file)
+{
+    for (const ApplicationKind& kind : kApplicationKinds)
+        if (file.HasExtension(std::wstring(L".") + kind.extension))
+            return &kind;
+    return nullptr;
+}
+
+std::vector<ApplicationKind> KindsByFilter()
+{
+    std::vector<ApplicationKind> kinds(std::begin(kApplicationKinds), std::end(kApplicationKinds));
+    std::sort(kinds.begin(), kinds.end(),
+              [](const ApplicationKind& left, const ApplicationKind& right)
+              { return left.filterPlace < right.filterPlace; });
+    return kinds;
+}
+
 const CExtInfo* FindExtension(const CStdStr& ext)
 {
     for (const CExtInfo& row : sExtInfo)

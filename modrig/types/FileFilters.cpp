@@ -16,6 +16,7 @@ namespace ModrigUtils
 namespace
 {
 constexpr const wchar_t* kStoredChoice = L"FileFilter";
+constexpr const char* kAllApplicationsKey = "IDS_MODRIG_TESSEL_APPS";
 constexpr int kHostRelease = 21;
 
 struct FilterEntry
@@ -34,13 +35,11 @@ CStdStr AllApplicationsFilter()
 
 std::vector<CStdStr> FilterTexts()
 {
-    using namespace ModrigMessages;
     std::vector<CStdStr> texts = {AllApplicationsFilter()};
-    for (const unsigned id : {kBundleFilter, kCoreModuleFilter, kLispSourceFilter, kObjectModuleFilter,
-                              kCompiledLispFilter, kPackagedLispFilter, kMacroProjectFilter})
+    for (const ApplicationKind& kind : KindsByFilter())
     {
         CStdStr text;
-        text.Load(id);
+        text.Load(kind.filterText);
         texts.push_back(text);
     }
     return texts;
@@ -93,6 +92,15 @@ bool IsChosen(const FilterEntry& entry, const CStdStr& choice)
     return !choice.IsEmpty() && entry.description.EqualsNoCase(choice);
 }
 } // namespace
+
+std::vector<const char*> FileFilterKeys()
+{
+    std::vector<const char*> keys = {kAllApplicationsKey};
+    for (const ApplicationKind& kind : KindsByFilter())
+        if (kind.filterKey)
+            keys.push_back(kind.filterKey);
+    return keys;
+}
 
 CStdStr GetRegFileFilterListIndex()
 {

@@ -1,10 +1,17 @@
-// The file-type filters of the file dialogs: the remembered choice, and the classic filter string.
+// The file-type filters of the file dialogs: what they offer, the remembered choice, and the classic filter
+// string.
 #pragma once
+
+#include <vector>
 
 #include "modrig/base/CStdStr.h"
 
 namespace ModrigUtils
 {
+// The keys of the filters that the file panels offer, in their order: all applications, then kind by kind.
+// Each has a description under the key, and extensions under the key followed by "_EXT".
+std::vector<const char*> FileFilterKeys();
+
 // The description of the filter last chosen, or an empty text.
 [[nodiscard]] CStdStr GetRegFileFilterListIndex();
 

@@ -3,10 +3,10 @@
 #include <cstddef>
 #include <type_traits>
 
+#include "modrig/base/SplitPath.h"
 #include "tests/support/ModuleTest.h"
 
-using ModrigUtils::FileType;
-using ModrigUtils::FileTypeOfPath;
+using namespace ModrigUtils;
 
 namespace
 {
@@ -33,6 +33,31 @@ TEST_F(ApplicationTypes, StandInTheTableInTheirSearchOrder)
         EXPECT_EQ(expected[i].second, sExtInfo[i].mType);
         EXPECT_TRUE(sExtInfo[i].mbEnabled);
     }
+}
+
+TEST_F(ApplicationTypes, AreKindsOfTheirOwnWhateverTheHostCanUse)
+{
+    const std::pair<const wchar_t*, bool> expected[] = {
+        {L"/a/tool.bundle", false}, {L"/a/tool.ZMB", false}, {L"/a/tool.lsp", true}, {L"/a/tool.mcp", false},
+        {L"/a/tool.omp", false},    {L"/a/tool.Rpk", true},  {L"/a/tool.qbc", true}};
+    for (const auto& [path, isLisp] : expected)
+    {
+        const ApplicationKind* kind = KindOfFile(SplitPath(CStdStr(path)));
+        ASSERT_NE(nullptr, kind) << path;
+        EXPECT_EQ(isLisp, kind->isLisp) << path;
+    }
+    for (const wchar_t* path : {L"/a/tool.txt", L"/a/lsp", L"/a.lsp/tool", L"/a/tool.", L""})
+        EXPECT_EQ(nullptr, KindOfFile(SplitPath(CStdStr(path)))) << path;
+    EXPECT_EQ(nullptr, KindOfFile(SplitPath(CStdStr(LongPath(4000, L"tool.lsp")))))
+        << "a path that is too long is of no kind";
+}
+
+TEST_F(ApplicationTypes, HaveFiltersInPlacesOfTheirOwn)
+{
+    int place = 0;
+    for (const ApplicationKind& kind : KindsByFilter())
+        EXPECT_EQ(++place, kind.filterPlace) << kind.filterText;
+    EXPECT_EQ(std::size(sExtInfo), static_cast<std::size_t>(place));
 }
 
 TEST_F(ApplicationTypes, ArePlainRecordsOfFlagExtensionAndCode)

@@ -32,6 +32,14 @@ protected:
 };
 } // namespace
 
+TEST_F(FileFilters, ArePanelsFiltersForAllKindsAndForFiveOfThem)
+{
+    const std::vector<const char*> names = FileFilterKeys();
+    EXPECT_THAT(std::vector<std::string>(names.begin(), names.end()),
+                ElementsAre("IDS_MODRIG_TESSEL_APPS", "IDS_MODRIG_QMB_APPS", "IDS_MODRIG_ZMB_APPS",
+                            "IDS_MODRIG_LSP_APPS", "IDS_MODRIG_OMP_APPS", "IDS_MODRIG_QBC_APPS"));
+}
+
 TEST_F(FileFilters, RememberExactlyTheTextThatWasChosen)
 {
     for (const wchar_t* choice : {L"Lisp source (*.lsp)", L" 100%s \\ \"ä\" ", L"x"})
