@@ -31,10 +31,10 @@ public:
     bool EqualsNoCase(const CStdStr& other) const;
 
     // The first `count` characters; all of them when there are fewer.
-    CStdStr Left(std::size_t count) const;
+    [[nodiscard]] CStdStr Left(std::size_t count) const;
     // From position `first` (0 is the head) to the end, or at most `count` characters; empty beyond the end.
-    CStdStr Mid(std::size_t first) const;
-    CStdStr Mid(std::size_t first, std::size_t count) const;
+    [[nodiscard]] CStdStr Mid(std::size_t first) const;
+    [[nodiscard]] CStdStr Mid(std::size_t first, std::size_t count) const;
 
     // Remove white space, or the given character, from the ends.
     CStdStr& TrimLeft();

@@ -21,7 +21,7 @@ public:
 
     // Whether somebody has stopped the load, asked between two files with how many are done. The message line
     // says then how far it has come.
-    bool IsStopped(std::size_t done);
+    [[nodiscard]] bool IsStopped(std::size_t done);
 
 private:
     void Say(NSString* key, std::size_t done) const;

@@ -6,8 +6,8 @@
 namespace ModrigUtils
 {
 // The lists as they are shown, in their order.
-const CStringList& StartupSuiteFiles();
-const CStringList& HistoryFiles();
+[[nodiscard]] const CStringList& StartupSuiteFiles();
+[[nodiscard]] const CStringList& HistoryFiles();
 
 // Whether the list has an entry for the application at the path: the same folder and file name in any case,
 // or, for object-database modules (.omp), the same file name wherever it lies. A path that is too long to be

@@ -9,5 +9,5 @@ namespace ModrigUtils
 // What became of loading the file at the path, whose letters' case does not matter.
 void NoteLoad(const CStdStr& path, bool succeeded);
 
-bool LastLoadFailed(const CStdStr& path);
+[[nodiscard]] bool LastLoadFailed(const CStdStr& path);
 } // namespace ModrigUtils

@@ -13,18 +13,18 @@ namespace ModrigUtils
 inline constexpr std::size_t kMaxFilesAtOnce = 50;
 
 // Whether there are too many files; message 37 then says so.
-bool RefuseTooManyFiles(std::size_t count);
+[[nodiscard]] bool RefuseTooManyFiles(std::size_t count);
 
 // The applications among the files that exist, each by the path it was found at, in order. None of too many
 // files; message 37 then says so.
-std::vector<CStdStr> AcceptedFiles(const std::vector<CStdStr>& paths);
+[[nodiscard]] std::vector<CStdStr> AcceptedFiles(const std::vector<CStdStr>& paths);
 
 // The same without those that the Startup Suite has already.
-std::vector<CStdStr> FilesNewToStartupSuite(const std::vector<CStdStr>& paths);
+[[nodiscard]] std::vector<CStdStr> FilesNewToStartupSuite(const std::vector<CStdStr>& paths);
 
 // Whether the file is a local copy of one from the internet, gone at the next start; message 41 then says
 // that it cannot join the Startup Suite.
-bool RefuseTemporaryInternetFile(const CStdStr& path);
+[[nodiscard]] bool RefuseTemporaryInternetFile(const CStdStr& path);
 
 // Appends the files to the Startup Suite and says how many of them are in it now; those that were in it
 // before count too.
@@ -41,5 +41,6 @@ struct StartupSuiteTable
 
 // Appends the files that the table has no row for to the Startup Suite, silently: the user sees them come. A
 // temporary copy of a file from the internet is refused with message 41. Answers how many files have joined.
-std::size_t AddToShownStartupSuite(const std::vector<CStdStr>& paths, const StartupSuiteTable& table);
+[[nodiscard]] std::size_t AddToShownStartupSuite(const std::vector<CStdStr>& paths,
+                                                 const StartupSuiteTable& table);
 } // namespace ModrigUtils

@@ -15,7 +15,7 @@ void PopulateLoadedApps();
 
 // The applications that the dialog lists as loaded: those of `gLoadedAppList`, then those of the Startup
 // Suite, but for what the host has no longer. An application may come twice.
-std::vector<CStdStr> ApplicationsShownAsLoaded();
+[[nodiscard]] std::vector<CStdStr> ApplicationsShownAsLoaded();
 
 // Whether the host has the compiled module loaded (asked by file name). True for files of every other kind. A
 // path without a dot: message 2 and false.

@@ -51,7 +51,7 @@ struct CExtInfo
 
     // Whether the running host can use files of the kind. Packaged and compiled Lisp need a host that answers
     // the query `RemovingTsLISP`; everything else is always usable.
-    static bool testValidExt(const wchar_t* ext, int type);
+    [[nodiscard]] static bool testValidExt(const wchar_t* ext, int type);
 
     static constexpr std::size_t kExtensionSize = 7;
 
@@ -67,13 +67,13 @@ extern std::array<CExtInfo, kApplicationTypes> sExtInfo;
 namespace ModrigUtils
 {
 // The rows of `sExtInfo`. The host is asked here what it can use.
-std::array<CExtInfo, kApplicationTypes> UsableKinds();
+[[nodiscard]] std::array<CExtInfo, kApplicationTypes> UsableKinds();
 
 // The kind of the file, whether or not the host can use it; null for any other file.
-const ApplicationKind* KindOfFile(const SplitPath& file);
+[[nodiscard]] const ApplicationKind* KindOfFile(const SplitPath& file);
 
 // The kinds in the order of their filters.
-std::vector<ApplicationKind> KindsByFilter();
+[[nodiscard]] std::vector<ApplicationKind> KindsByFilter();
 
 // The first enabled row with that extension (no dot, any case), or null.
 [[nodiscard]] const CExtInfo* FindExtension(const CStdStr& ext);

@@ -10,7 +10,7 @@ namespace ModrigUtils
 {
 // The keys of the filters that the file panels offer, in their order: all applications, then kind by kind.
 // Each has a description under the key, and extensions under the key followed by "_EXT".
-std::vector<const char*> FileFilterKeys();
+[[nodiscard]] std::vector<const char*> FileFilterKeys();
 
 // The description of the filter last chosen, or an empty text.
 [[nodiscard]] CStdStr GetRegFileFilterListIndex();
@@ -20,7 +20,7 @@ std::vector<const char*> FileFilterKeys();
 
 // Replaces the string with the module's own filters, "description|*.a;*.b|" one after the other, every entry
 // followed by a "|", the last one too. The remembered choice comes first. Only extensions of the application
-// types table remain; an entry left without any keeps its place and its description, so that whoever counts
-// the entries finds the one that was meant.
+// types table remain. An entry left without any keeps its place and its description, so that the place of
+// every other entry is the same in any host.
 void ReAdjustFilterString(CStdStr& filter);
 } // namespace ModrigUtils

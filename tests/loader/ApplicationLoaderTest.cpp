@@ -230,8 +230,8 @@ TEST_F(PerformingALoad, LoadsLispUnlessTheVariableIsAShortZero)
 
 TEST_F(PerformingALoad, HandsTheLoadAllFlagToTheLispRoad)
 {
-    EXPECT_EQ(1, PerformModrig(L"/a/tool.lsp", 0, 0, 1));
-    EXPECT_EQ(1, PerformModrig(L"/a/tool.lsp", 0, 1, 1));
+    EXPECT_EQ(kLoaded, PerformModrig(L"/a/tool.lsp", 0, 0, 1));
+    EXPECT_EQ(kLoaded, PerformModrig(L"/a/tool.lsp", 0, 1, 1));
     ASSERT_EQ(6u, host().lisp.queued.size());
     EXPECT_EQ(L"(load \"/a/tool.lsp\")", host().lisp.queued[0]);
     EXPECT_EQ(L"(progn (_INTERNAL-LOAD-ALL-FILE \"/a/tool.lsp\" nil T T nil)(princ))", host().lisp.queued[3]);

@@ -352,7 +352,7 @@ TEST_F(ProfileRegistry, AsksForEachNameWithRoomFor1024CharactersAndForNothingEls
     ASSERT_EQ(3u, asked.size());
     for (const RecordingRegistry::Call& call : asked)
     {
-        EXPECT_EQ(1024u, call.size) << "the room is told anew each time";
+        EXPECT_EQ(1024u, call.size) << "the room is told again each time";
         EXPECT_FALSE(call.asksForData);
     }
 }
