@@ -56,7 +56,7 @@ public:
     };
 
     CStringList() = default;
-    // The index points into the list, so that a copy would need its own; nobody has needed one.
+    // The index points into the list: a copy would need an index of its own, and nothing needs a copy.
     CStringList(const CStringList&) = delete;
     CStringList& operator=(const CStringList&) = delete;
 

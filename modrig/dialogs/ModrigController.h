@@ -64,7 +64,7 @@
 
 - (void)tableViewSelectionDidChange:(NSNotification*)notification;
 - (BOOL)tableView:(NSTableView*)table shouldSelectRow:(NSInteger)row;
-// Takes rows that cannot be unloaded out of the selection, whoever put them there.
+// Takes rows that cannot be unloaded out of the selection: new rows come selected, whatever they are.
 - (void)keepToUnloadableRows;
 
 // Makes the rows that are selected in the History what Load will load.

@@ -55,7 +55,7 @@ constexpr NSInteger kRemoveSegment = 1;
 - (void)enableRemove:(BOOL)enabled
 {
     [segmentedControl setEnabled:enabled forSegment:kRemoveSegment];
-    [segmentedControl setNeedsDisplay:YES]; // not every toolkit draws the segment anew by itself
+    [segmentedControl setNeedsDisplay:YES]; // not every toolkit draws the segment again by itself
 }
 
 - (void)doClean

@@ -20,8 +20,8 @@ inline constexpr StoredListNames kStoredHistory = {L"History", L"NumHistory", L"
 inline constexpr StoredListNames kStoredStartupSuite = {L"Startup", L"NumStartup", L"%dStartup"};
 
 // Replaces the list with what is stored. Duplicates are skipped. The list ends at the first gap in the
-// numbering; an entry that can be read only at a later attempt costs an entry at the end. `appended` is
-// called after every entry that has joined the list.
+// numbering. The count is of attempts: each that fails, where a later one succeeds, costs an entry at the
+// end. `appended` is called after every entry that has joined the list.
 void ReadStoredList(const StoredListNames& names, CStringList& list,
                     const std::function<void(const CStdStr& path)>& appended);
 

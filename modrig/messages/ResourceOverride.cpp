@@ -5,7 +5,7 @@ HINSTANCE CTemporaryResourceOverride::m_hInstanceDefault = nullptr;
 namespace
 {
 // Stands in the field of an object that was made with a null handle and so has nothing to restore: an address
-// of our own, which no module has. Null would not do, it is what is current before anybody has chosen.
+// of our own, which no module has. Null would not do: it is what is current before anybody has chosen.
 HINSTANCE NothingToRestore()
 {
     return reinterpret_cast<HINSTANCE>(&CTemporaryResourceOverride::m_hInstanceDefault);

@@ -5,13 +5,13 @@
 
 // Called by the host. Message 1 loads: TSRX_RET_ERROR, with nothing done, when the resource module is missing
 // or the module is loaded already. Message 2 releases the resource module; the lists live on and the command
-// stays, both are the host's to end. Every other message is ignored.
+// stays, for the host ends both. Every other message is ignored.
 extern "C" TESSEL_EXPORT int tsrxEntryPoint(unsigned message, void* application);
 
 // Start-up: Startup Suite, History, command, demand-load record.
 void initApp();
 
-// Has nothing to give back; kept as the counterpart that the host's makers ask of every application.
+// The counterpart of `initApp`, which every application of the host has. There is nothing to give back.
 void unloadApp();
 
 namespace ModrigUtils

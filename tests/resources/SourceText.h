@@ -9,5 +9,5 @@ std::filesystem::path sourceRoot();
 
 std::string readFile(const std::filesystem::path& file);
 
-// The code of the module, all its files one behind the other.
+// The code of the module, all its files one after the other.
 std::string moduleSources();

@@ -214,7 +214,7 @@ void OpenDialogTest::selectFiles(std::initializer_list<std::string> names)
     const std::size_t step = next++;
     if (++tries > kMostTries)
         [self giveUp];
-    // Scheduled first: a step may open another modal run, which goes on with the steps behind it.
+    // Scheduled first: a step may open another modal run, which goes on with the steps after it.
     [self schedule];
     if (!(*steps)[step].run())
         next = step;

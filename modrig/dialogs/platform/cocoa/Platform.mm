@@ -25,7 +25,7 @@
 
 namespace ModrigPlatform
 {
-// The panel sizes the frame around the view, which has to hand its size on.
+// The panel puts a frame around the view and sizes that: the frame has to size the view.
 void FitAccessoryView(NSView* view)
 {
     [view setAutoresizingMask:[view autoresizingMask] | NSViewWidthSizable];
@@ -35,7 +35,7 @@ void FitAccessoryView(NSView* view)
     [frame resizeSubviewsWithOldSize:[view frame].size];
 }
 
-// The platform follows what shows.
+// The platform does so by itself when another tab shows.
 void UpdateKeyViews(NSWindow*)
 {
 }
@@ -56,7 +56,7 @@ bool IsFilePackage(NSString* path)
     return [[NSWorkspace sharedWorkspace] isFilePackageAtPath:path];
 }
 
-// The bindings do.
+// The bindings of the window file do it, in both directions.
 void ShowRows(NSTableView*, NSArrayController*)
 {
 }

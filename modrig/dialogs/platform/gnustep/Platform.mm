@@ -36,7 +36,7 @@ void FitAccessoryView(NSView* view)
     [view setAutoresizingMask:[view autoresizingMask] | NSViewWidthSizable];
 }
 
-// The toolkit works it out once, and not anew when another tab shows.
+// The toolkit works it out once, and not again when another tab shows.
 void UpdateKeyViews(NSWindow* window)
 {
     [window recalculateKeyViewLoop];
@@ -56,8 +56,8 @@ bool IsFilePackage(NSString* path)
     return [[NSWorkspace sharedWorkspace] isFilePackageAtPath:path];
 }
 
-// Bindings lead from the controller to the table only.
-// A bound column watches every row, and fetches what all of them show anew for each cell that it draws.
+// A bound column watches every row, and fetches what all of them show again for each cell that it draws. Here
+// the table asks its data source for what it draws, and for nothing else.
 void ShowRows(NSTableView* table, NSArrayController* rows)
 {
     for (NSTableColumn* column : tsuiEach<NSTableColumn*>([table tableColumns]))
@@ -66,12 +66,13 @@ void ShowRows(NSTableView* table, NSArrayController* rows)
     [table reloadData];
 }
 
+// A selection made in the table does not reach the controller: bindings lead the other way only.
 void AdoptTableSelection(NSTableView* table, NSArrayController* rows)
 {
     [rows setSelectionIndexes:[table selectedRowIndexes]];
 }
 
-// Labels are lost on the way from the window file.
+// The toolkit does not read the labels from the window file.
 void CompleteSegments(NSSegmentedControl* segments)
 {
     [segments setLabel:@"+" forSegment:0];
