@@ -25,7 +25,7 @@ constexpr auto kCertain = []
     {
         certain[static_cast<std::size_t>(character)] = character;
         if (character >= 'a' && character <= 'z')
-            certain[static_cast<std::size_t>(character - 'a' + 'A')] = character;
+            certain[static_cast<std::size_t>('A') + static_cast<std::size_t>(character - 'a')] = character;
     }
     return certain;
 }();
