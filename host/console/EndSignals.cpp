@@ -33,10 +33,13 @@ EndSignals::EndSignals(LineRunner& runner)
     }
 }
 
+// What ends on a signal goes on to its end: the next one would otherwise cut it short.
 EndSignals::~EndSignals()
 {
+    struct sigaction ignored = {};
+    ignored.sa_handler = SIG_IGN;
     for (std::size_t index = 0; index < kSignals.size(); ++index)
-        sigaction(kSignals[index], &mPrevious[index], nullptr);
+        sigaction(kSignals[index], theSignal == 0 ? &mPrevious[index] : &ignored, nullptr);
 }
 
 int EndSignals::received()

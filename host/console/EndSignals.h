@@ -8,7 +8,8 @@
 
 namespace tessel
 {
-// From its making to its end these signals end the runner's session in good order. One at a time.
+// From its making to its end these signals end the runner's session in good order; after one has, they are
+// ignored for the rest of the process. One at a time.
 class EndSignals
 {
 public:
