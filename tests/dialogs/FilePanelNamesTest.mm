@@ -98,7 +98,7 @@ TEST_F(FilePanelNames, OfAFolderGoThereWithReturn)
 TEST_F(FilePanelNames, OfNoFileAreToldAndTheRunGoesOn)
 {
     use({[this] { typeNameInto(mPanel, @"nothing.omp"); }, [this] { pressKey(mPanel, @"\r"); },
-         [this] { return boxes().size() == 1; },
+         [] { return boxes().size() == 1; },
          [this]
          {
              EXPECT_THAT(boxes(),

@@ -57,7 +57,8 @@ protected:
     {
         [mPanel orderFront:nil];
         auto* display = static_cast<Display*>([GSCurrentServer() serverDevice]);
-        const auto window = reinterpret_cast<Window>([GSCurrentServer() windowDevice:[mPanel windowNumber]]);
+        const auto window = reinterpret_cast<Window>(
+            [GSCurrentServer() windowDevice:static_cast<int>([mPanel windowNumber])]);
         XMapRaised(display, window);
         XWarpPointer(display, None, window, 0, 0, 0, 0, 60, 60);
     }

@@ -122,7 +122,7 @@ std::vector<std::string> HostSession::environment() const
     }
     for (const auto& [name, value] : mEnvironment)
         if (!value.empty()) // an empty value takes the variable away
-            result.push_back(name + "=" + value);
+            result.push_back(std::string(name).append("=").append(value));
     return result;
 }
 

@@ -78,7 +78,7 @@ void populate()
 
 int load(const std::wstring& path, bool addToHistory, bool addToStartup)
 {
-    return ModrigUtils::PerformModrig(path, addToHistory, addToStartup, ModrigUtils::kReportFailure);
+    return ModrigUtils::PerformModrig(path, addToHistory, addToStartup ? 1 : 0, ModrigUtils::kReportFailure);
 }
 
 namespace

@@ -25,7 +25,7 @@ std::optional<std::map<std::string, std::string>> readStringsFile(const std::fil
     std::optional<std::map<std::string, std::string>> texts;
     NSString* content = [NSString stringWithContentsOfFile:[NSString stringWithUTF8String:file.c_str()]
                                                   encoding:NSUTF8StringEncoding
-                                                     error:NULL];
+                                                     error:nullptr];
     if (NSDictionary* table = parse(content))
     {
         texts.emplace();

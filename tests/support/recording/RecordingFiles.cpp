@@ -55,7 +55,8 @@ std::wstring RecordingFiles::search(const std::wstring& name) const
     std::vector<std::wstring> folders = searchFolders;
     folders.insert(folders.begin(), currentFolderNow());
     for (const std::wstring& folder : folders)
-        if (const std::wstring path = folder + L"/" + name; attributes(path) != INVALID_FILE_ATTRIBUTES)
+        if (const std::wstring path = std::wstring(folder).append(L"/").append(name);
+            attributes(path) != INVALID_FILE_ATTRIBUTES)
             return path;
     return {};
 }

@@ -120,7 +120,8 @@ bool gSourceIsDismissed = false;
 
 unsigned long deviceOf(NSWindow* window)
 {
-    return reinterpret_cast<unsigned long>([GSServerForWindow(window) windowDevice:[window windowNumber]]);
+    return reinterpret_cast<unsigned long>(
+        [GSServerForWindow(window) windowDevice:static_cast<int>([window windowNumber])]);
 }
 
 // A window behind the one that waits for an answer takes nothing.

@@ -56,6 +56,7 @@ std::vector<std::string> commandLine(NSString* path, NSArray* arguments)
 void startHelper(const std::vector<std::string>& command)
 {
     std::vector<const char*> pointers;
+    pointers.reserve(command.size() + 1);
     for (const std::string& word : command)
         pointers.push_back(word.c_str());
     pointers.push_back(nullptr);

@@ -40,7 +40,7 @@ NSWindow* ownerOf(NSWindow* window)
 unsigned long deviceOf(NSWindow* window)
 {
     return window ? reinterpret_cast<unsigned long>(
-                        [GSServerForWindow(window) windowDevice:[window windowNumber]])
+                        [GSServerForWindow(window) windowDevice:static_cast<int>([window windowNumber])])
                   : 0;
 }
 

@@ -31,7 +31,12 @@ using Bidi = std::unique_ptr<UBiDi, CloseBidi>;
 // What ends a line is written again by whoever puts the lines together.
 int32_t endOfLine(std::u16string_view text, int32_t start, int32_t end)
 {
-    while (end > start && (text[end - 1] == u'\n' || text[end - 1] == u'\r'))
+    const auto isEnd = [&](int32_t index)
+    {
+        const char16_t unit = text[static_cast<std::size_t>(index)];
+        return unit == u'\n' || unit == u'\r';
+    };
+    while (end > start && isEnd(end - 1))
         --end;
     return end;
 }

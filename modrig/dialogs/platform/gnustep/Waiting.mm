@@ -16,7 +16,7 @@ Display* display()
 
 Window deviceOf(NSWindow* window)
 {
-    return reinterpret_cast<Window>([GSCurrentServer() windowDevice:[window windowNumber]]);
+    return reinterpret_cast<Window>([GSCurrentServer() windowDevice:static_cast<int>([window windowNumber])]);
 }
 
 // Kept to the end: one for the session.
