@@ -53,7 +53,8 @@ public:
     void set(const std::string& variable, const std::string& value);
 
     const TemporaryFolder& folder() const { return mFolder; } // for the files of the test
-    std::filesystem::path profile() const { return mFolder / "profile"; }
+    std::filesystem::path profile() const { return mFolder / mProfile; }
+    void nameProfile(const std::string& name) { mProfile = name; }
 
     // The program and its arguments, and the environment, as `execve` wants them.
     std::vector<std::string> commandLine(const std::vector<std::string>& arguments) const;
@@ -61,6 +62,7 @@ public:
 
 private:
     TemporaryFolder mFolder;
+    std::string mProfile = "profile";
     std::vector<std::string> mLauncher;
     std::vector<std::string> mAlways;
     std::vector<EnvironmentChange> mEnvironment;

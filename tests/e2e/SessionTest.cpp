@@ -149,6 +149,48 @@ TEST(Session, EndsWithStatusTwoForArgumentsItDoesNotKnow)
     EXPECT_EQ(session.start({"--version"}).output, "Tessel R21, reference host for Modrig\n");
 }
 
+TEST(Session, TakesArgumentsThatAreNoText)
+{
+    const HostSession session;
+    const auto file = session.folder().write("caf\xE9.lsp", "(write-line \"it runs\")\n");
+    const auto result = session.run({"LOAD \"" + file.string() + "\""});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, HasSubstr("caf\\xE9.lsp\"\n"));
+    EXPECT_THAT(result.output, HasSubstr("\nit runs\n"));
+}
+
+TEST(Session, TakesAnEnvironmentThatIsNoText)
+{
+    HostSession session;
+    session.set("ODD\xE9", "value");
+    session.set("ODD", "\xE9");
+    const auto result = session.run({"VERSION"});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, EndsWith("Command: VERSION\nTessel R21, reference host for Modrig\n"));
+}
+
+TEST(Session, KeepsItsProfileInAFolderWhoseNameIsNoText)
+{
+    HostSession session;
+    session.nameProfile("profil\xE9");
+    EXPECT_EQ(session.run({"REGISTRY SET Software\\Trial name data"}).exitStatus, 0);
+    const auto result = session.run({"REGISTRY GET Software\\Trial name"});
+    EXPECT_EQ(result.exitStatus, 0);
+    EXPECT_THAT(result.output, EndsWith("\ndata\n"));
+    EXPECT_TRUE(std::filesystem::is_regular_file(session.profile() / "registry.db"));
+}
+
+TEST(Session, RunsFromAFolderWhoseNameIsNoText)
+{
+    HostSession session;
+    const auto link = session.folder() / "h\xE9te";
+    std::filesystem::create_directory_symlink(std::filesystem::path(TESSEL_PROGRAM).parent_path(), link);
+    session.startBy("exec '" + (link / "Tessel").string() + "' \"$@\"");
+    const auto result = session.run({"VERSION"});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, EndsWith("Command: VERSION\nTessel R21, reference host for Modrig\n"));
+}
+
 TEST(Session, OutlivesTheReaderOfItsOutput)
 {
     HostSession session;

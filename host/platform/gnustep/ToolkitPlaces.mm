@@ -3,7 +3,12 @@
 // toolkit, and a program that was killed with their lock would keep all others waiting for it.
 #import <Foundation/Foundation.h>
 
+#include <wincompat/winstring.h>
+
 #include "host/platform/ToolkitPlaces.h"
+#include "host/platform/gnustep/ToolkitProcess.h"
+#include "host/text/Unicode.h"
+#include "host/text/platform/FileNames.h"
 
 namespace tessel
 {
@@ -24,11 +29,13 @@ NSString* withKey(NSString* keys, NSString* key)
 
 std::string keepToolkitFilesIn(const std::string& folder)
 {
+    tellToolkitOfProcess(currentEnvironment());
+    nameEveryFile();
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
     NSMutableDictionary* places = [[GNUstepConfig(nil) mutableCopy] autorelease];
     if (![places objectForKey:kPersonalPlace])
     {
-        NSString* root = [NSString stringWithUTF8String:folder.c_str()];
+        NSString* root = wcharToNSString(toWide(folder).c_str());
         [places setObject:[places objectForKey:kSettingsPlace] forKey:kPersonalPlace];
         [places setObject:withKey([places objectForKey:kFurtherKeys], kPersonalPlace) forKey:kFurtherKeys];
         [places setObject:[root stringByAppendingPathComponent:@"Defaults"] forKey:kSettingsPlace];
