@@ -3,6 +3,7 @@
 #include <tessel/tsformat.h>
 #include <tessel/tshostservices.h>
 #include <tesselui/tsuidisplay.h>
+#include <tesselui/tsuierrors.h>
 #include <wincompat/winstring.h>
 
 #include "host/platform/FileNames.h"
@@ -43,6 +44,16 @@ void prepare()
     tessel::storeBeforeEachWait();
     [pool drain];
 }
+
+// Closing a window is only asked of the display; what comes back is taken here, since nobody waits for it.
+void takeEvents(void*)
+{
+    while (NSEvent* event = [NSApp nextEventMatchingMask:NSAnyEventMask
+                                               untilDate:[NSDate distantPast]
+                                                  inMode:NSDefaultRunLoopMode
+                                                 dequeue:YES])
+        [NSApp sendEvent:event];
+}
 } // namespace
 
 bool tsuiHasDisplay()
@@ -69,13 +80,9 @@ void tsuiFinishWindows()
     if (!gPrepared)
         return;
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
-    // Closing a window is only asked of the display; what comes back is taken here, since nobody waits for
-    // it.
-    while (NSEvent* event = [NSApp nextEventMatchingMask:NSAnyEventMask
-                                               untilDate:[NSDate distantPast]
-                                                  inMode:NSDefaultRunLoopMode
-                                                 dequeue:YES])
-        [NSApp sendEvent:event];
+    // The windows are closed and their work is done: what fails now is for the log, not for the command.
+    if (NSString* error = tsuiErrorOf(takeEvents, nullptr))
+        NSLog(@"%@", error);
     tessel::windowing::flushScreen();
     [pool drain];
 }

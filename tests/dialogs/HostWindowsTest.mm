@@ -16,11 +16,33 @@ using testing::ElementsAre;
 
 namespace
 {
+int failures = 0;
+}
+
+// A window in whose events the toolkit fails.
+@interface FailingWindow : NSWindow
+@end
+
+@implementation FailingWindow
+- (void)sendEvent:(NSEvent*)event
+{
+    (void)event;
+    ++failures;
+    [NSException raise:NSInternalInconsistencyException format:@"the display went away"];
+}
+@end
+
+namespace
+{
 class FileFilter : public DialogTest
 {
 };
 
 class Segments : public DialogTest
+{
+};
+
+class FinishedWindows : public DialogTest
 {
 };
 
@@ -196,6 +218,29 @@ TEST_F(Waiting, OutsideOfModalWindowsTellsTheHostNothing)
     host().services.waits.clear();
     tsuiFinishWindows();
     EXPECT_THAT(host().services.waits, testing::IsEmpty());
+}
+
+TEST_F(FinishedWindows, DoNotEndTheCommandWhoseEventsTheToolkitFailsOver)
+{
+    NSWindow* window = [[[FailingWindow alloc] initWithContentRect:NSMakeRect(0, 0, 100, 40)
+                                                         styleMask:NSBorderlessWindowMask
+                                                           backing:NSBackingStoreBuffered
+                                                             defer:NO] autorelease];
+    [window setReleasedWhenClosed:NO];
+    [NSApp postEvent:[NSEvent otherEventWithType:NSApplicationDefined
+                                        location:NSZeroPoint
+                                   modifierFlags:0
+                                       timestamp:0
+                                    windowNumber:[window windowNumber]
+                                         context:nil
+                                         subtype:0
+                                           data1:0
+                                           data2:0]
+             atStart:YES];
+    failures = 0;
+    const auto finish = [](void*) { tsuiFinishWindows(); };
+    EXPECT_EQ(nil, tsuiErrorOf(finish, nullptr));
+    EXPECT_EQ(1, failures);
 }
 
 TEST_F(Segments, LookDisabledWhenTheyAre)

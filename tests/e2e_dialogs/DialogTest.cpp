@@ -27,8 +27,7 @@ std::vector<std::string> listCommands(const std::string& list, const std::string
 DialogTest::DialogTest(DisplayKind kind) : mScreen(kind)
 {
     mSession.set("DISPLAY", mScreen.display());
-    // Programs that serve the toolkit of this session only: they find one another by that folder. Those that
-    // several sessions share end with the one that started them.
+    // Where a host that is killed leaves something is gone with the test.
     mSession.set("TEMP", mSession.folder().path().string());
     std::filesystem::create_directories(files());
     setSetting("InitialPath", files().string());
@@ -70,7 +69,7 @@ void DialogTest::setSetting(const std::string& name, const std::string& value) c
 
 void DialogTest::setToolkitSetting(const std::string& name, const std::string& value) const
 {
-    mSession.folder().write("profile/toolkit/Defaults/NSGlobalDomain.plist",
+    mSession.folder().write(mSession.profile() / "toolkit/Defaults/NSGlobalDomain.plist",
                             "{ " + name + " = \"" + value + "\"; }\n");
 }
 

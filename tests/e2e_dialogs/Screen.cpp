@@ -3,6 +3,7 @@
 #include <cstdio>
 #include <filesystem>
 #include <ios>
+#include <iterator>
 #include <sstream>
 #include <stdexcept>
 
@@ -70,10 +71,29 @@ std::string Screen::run(const std::string& command) const
     return text;
 }
 
+std::vector<std::string> Screen::windows(const std::string& title) const
+{
+    std::istringstream lines(run("xdotool search --onlyvisible --name '^" + title + "$'"));
+    return {std::istream_iterator<std::string>(lines), {}};
+}
+
 std::string Screen::window(const std::string& title) const
 {
-    const std::string found = run("xdotool search --onlyvisible --name '^" + title + "$'");
-    return found.substr(0, found.find('\n'));
+    const auto found = windows(title);
+    return found.empty() ? std::string() : found.front();
+}
+
+std::string Screen::waitForAnotherWindow(const std::string& title, const std::string& known) const
+{
+    std::vector<std::string> found;
+    comesTrue(
+        [&]
+        {
+            found = windows(title);
+            std::erase(found, known);
+            return !found.empty();
+        });
+    return found.empty() ? std::string() : found.front();
 }
 
 std::string Screen::waitForWindow(const std::string& title) const

@@ -27,6 +27,8 @@ public:
     // The visible window with this title; empty when there is none.
     std::string window(const std::string& title) const;
     std::string waitForWindow(const std::string& title) const;
+    // The visible window with this title that is not the known one.
+    std::string waitForAnotherWindow(const std::string& title, const std::string& known) const;
     // Until the window manager has given the keyboard to the window.
     bool waitUntilActive(const std::string& window) const;
     bool waitUntilGone(const std::string& title) const;
@@ -74,6 +76,7 @@ public:
     std::string colourOf(const std::string& window, Place corner, int width, int height) const;
 
 private:
+    std::vector<std::string> windows(const std::string& title) const;
     std::string run(const std::string& command) const;
 
     TemporaryFolder mFolder;

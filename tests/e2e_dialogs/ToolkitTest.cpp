@@ -18,7 +18,7 @@ protected:
     int helpers() const
     {
         int count = 0;
-        const std::string own = "TEMP=" + mSession.folder().path().string();
+        const std::string own = "TEMP=" + (mSession.folder() / "tessel-").string();
         for (const auto& process : std::filesystem::directory_iterator("/proc"))
         {
             const std::string name = contentOf(process.path() / "comm");
@@ -55,6 +55,20 @@ TEST_F(DialogToolkit, ComplainsIntoALogOfTheProfile)
     const std::string output = closeAndEnd();
     EXPECT_THAT(output, Not(HasSubstr("reflectScrolledClipView")));
     EXPECT_THAT(contentOf(mSession.profile() / "toolkit" / "log.txt"), HasSubstr("reflectScrolledClipView"));
+}
+
+TEST_F(DialogToolkit, ReadsItsSettingsInAProfileFolderWhoseNameIsNoText)
+{
+    mSession.nameProfile("profil\xE9");
+    setSetting("InitialPath", files().string());
+    setToolkitSetting("GSScaleFactor", "1.2");
+    writeLisp("a.lsp");
+    open();
+    EXPECT_THAT(mScreen.sizeOf(mDialog), testing::StartsWith("900x"));
+    press("Down");
+    press("Return");
+    EXPECT_TRUE(prints(wasLoaded("a.lsp")));
+    EXPECT_THAT(closeAndEnd(), Not(HasSubstr("error of the toolkit")));
 }
 
 // A lock in the person's home, left by a program that was killed, would hold up every start.

@@ -4,8 +4,8 @@
 
 namespace tessel::windowing
 {
-// Lets the programs that the toolkit starts for itself end when this one does.
-void endHelperProgramsWithTheSession();
+// Lets the programs that the toolkit starts for itself serve this one alone, and end when it does.
+void keepHelperProgramsToTheSession();
 
 // Takes files that are dragged here from other programs.
 void acceptFileDrops();

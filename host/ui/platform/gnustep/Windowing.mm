@@ -47,7 +47,7 @@ void prepareToolkit(NSString* folder)
 {
     keepSettingsIn(folder);
     keepComplaintsIn(folder);
-    endHelperProgramsWithTheSession();
+    keepHelperProgramsToTheSession();
 }
 
 void chooseLook()
