@@ -1,4 +1,5 @@
-// Two hosts of one person, on one display: what serves the windows of the one is not the other's to take away.
+// Two hosts of one person, on one display: what serves the windows of the one is not the other's to take
+// away.
 #include <filesystem>
 
 #include "tests/e2e_dialogs/DialogTest.h"
@@ -46,8 +47,8 @@ protected:
 
     void expectAGoodEnd()
     {
-        EXPECT_THAT(closeAndEnd(),
-                    AllOf(Not(HasSubstr("error of the toolkit")), Not(HasSubstr("threw")), HasSubstr("QUIT")));
+        EXPECT_THAT(closeAndEnd(), AllOf(Not(HasSubstr("error of the toolkit")), Not(HasSubstr("threw")),
+                                         HasSubstr("QUIT")));
     }
 
     std::vector<std::string> whatSessionsLeft() const

@@ -1,11 +1,25 @@
 // Tab views, and boxes around controls: both are panes of one kind.
 #include <tesselui/tsuieach.h>
 
+#include "host/ui/platform/gnustep/Mnemonics.h"
 #include "host/ui/platform/gnustep/TesselTheme.h"
 #include "host/ui/platform/gnustep/ThemeFocus.h"
 #include "host/ui/platform/gnustep/ThemeShapes.h"
 
 using namespace tessel::windowing;
+
+namespace
+{
+void drawLabel(NSTabViewItem* item, NSFont* font, NSRect tab)
+{
+    NSDictionary* look =
+        [NSDictionary dictionaryWithObjectsAndKeys:font, NSFontAttributeName, [NSColor controlTextColor],
+                                                   NSForegroundColorAttributeName, nil];
+    NSAttributedString* label = labelOfTab(item, look);
+    const NSSize size = [label size];
+    [label drawAtPoint:NSMakePoint(NSMinX(tab) + kTabPadding, NSMidY(tab) - size.height / 2)];
+}
+} // namespace
 
 @implementation TesselTheme (Boxes)
 
@@ -25,7 +39,7 @@ using namespace tessel::windowing;
         [item _setTabState:item == selected ? NSSelectedTab : NSBackgroundTab];
         if (item == selected)
             drawTab(tab, flipped);
-        [item drawLabel:NO inRect:NSInsetRect(tab, kTabPadding, 0)];
+        drawLabel(item, [(NSTabView*)view font], tab);
         if (item == selected && hasKeyboard(view))
             drawFocusRing(NSInsetRect(tab, 4, 4));
         tab.origin.x += tab.size.width;

@@ -1,5 +1,6 @@
 // The toolkit starts the title of a pop-up button at its very edge, and has an arrow of another kind for a
 // list of actions than for a choice. Drawn here instead.
+#include "host/ui/platform/gnustep/Mnemonics.h"
 #include "host/platform/gnustep/StandIn.h"
 #include "host/ui/platform/gnustep/ThemeButtons.h"
 
@@ -24,12 +25,17 @@ NSDictionary* lookOfTitle(NSCell* cell)
                                                       NSParagraphStyleAttributeName, nil];
 }
 
-void drawTitle(NSString* title, NSDictionary* look, NSRect frame)
+void drawTitle(NSAttributedString* title, NSRect frame)
 {
-    const CGFloat height = [title sizeWithAttributes:look].height;
+    const CGFloat height = [title size].height;
     frame.origin.y = NSMidY(frame) - height / 2;
     frame.size.height = height;
-    [title drawInRect:frame withAttributes:look];
+    [title drawInRect:frame];
+}
+
+NSAttributedString* titleOf(NSCell* cell, NSString* text)
+{
+    return [[[NSAttributedString alloc] initWithString:text attributes:lookOfTitle(cell)] autorelease];
 }
 
 void drawArrow(NSRect frame, NSView* view)
@@ -48,7 +54,8 @@ void drawInterior(id cell, SEL, NSRect frame, NSView* view)
 {
     NSRect inside = NSInsetRect(frame, kPadding, 0);
     inside.size.width -= kArrowWidth;
-    drawTitle([cell title], lookOfTitle(cell), inside);
+    if (NSString* text = [cell title])
+        drawTitle(withMnemonic(titleOf(cell, text), view), inside);
     drawArrow(frame, view);
 }
 } // namespace

@@ -6,7 +6,9 @@
 
 #include "host/ui/platform/gnustep/Behaviour.h"
 #include "host/ui/platform/gnustep/DisplayProbe.h"
+#include "host/ui/platform/gnustep/Mnemonics.h"
 #include "host/ui/platform/gnustep/Settings.h"
+#include "host/ui/platform/gnustep/TabKeys.h"
 #include "host/ui/platform/gnustep/Theme.h"
 
 namespace tessel::windowing
@@ -76,6 +78,8 @@ void completeBehaviour()
     showWhereDropsLandInTables();
     drawWholePixels();
     placeContentsOfWindows();
+    letTabsHaveTheKeyboard();
+    giveControlsMnemonics();
 }
 
 void completeLook()

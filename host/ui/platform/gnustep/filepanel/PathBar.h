@@ -1,4 +1,5 @@
-// A row of buttons for the folders on the way, from the root to the one that shows.
+// A row of buttons for the folders on the way, from the root to the one that shows. The Tab key comes to one
+// of them, from which the arrows lead to the others.
 #pragma once
 
 #import <AppKit/AppKit.h>

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include <tesselui/tsuieach.h>
+
 #include "host/ui/platform/gnustep/filepanel/Folders.h"
 #include "host/ui/platform/gnustep/filepanel/PanelState.h"
 
@@ -26,7 +28,7 @@ NSButton* makeStep(const Step& step, bool isShown)
     [[button cell] setLineBreakMode:NSLineBreakByTruncatingMiddle];
     [[button cell] setRepresentedObject:string(step.path)];
     [button setToolTip:string(shownName(step.path))];
-    [button setRefusesFirstResponder:YES]; // Up and Home are what the Tab key comes to
+    [button setRefusesFirstResponder:YES]; // unless it is the one of them that the Tab key comes to
     const CGFloat width =
         [title sizeWithAttributes:[NSDictionary dictionaryWithObject:font forKey:NSFontAttributeName]].width;
     [button setFrameSize:NSMakeSize(std::clamp(width + kPadding, kSmallest, kWidest), 26)];
@@ -71,12 +73,26 @@ NSButton* makeStep(const Step& step, bool isShown)
     [self placeFrom:stepsThatDoNotFit(widths, NSWidth([self bounds]))];
 }
 
+// The bar is one stop of the Tab key: this button of it.
+- (void)stopAt:(NSButton*)stop
+{
+    for (NSButton* button : tsuiEach<NSButton*>([self subviews]))
+        [button setRefusesFirstResponder:button != stop];
+}
+
+- (BOOL)hasKeyboard
+{
+    NSResponder* responder = [[self window] firstResponder];
+    return [responder isKindOfClass:[NSView class]] && [(NSView*)responder isDescendantOf:self];
+}
+
 - (void)showFolder:(NSString*)folder
 {
     if ([folder isEqual:mFolder])
         return;
     [mFolder release];
     mFolder = [folder copy];
+    const bool hadKeyboard = [self hasKeyboard];
     while ([[self subviews] count])
         [[[self subviews] lastObject] removeFromSuperview];
     const std::vector<Step> steps = wayTo(bytes(folder));
@@ -88,6 +104,29 @@ NSButton* makeStep(const Step& step, bool isShown)
         [self addSubview:button];
     }
     [self placeButtons];
+    [self stopAt:[[self subviews] lastObject]];
+    [[self window] recalculateKeyViewLoop];
+    if (hadKeyboard)
+        [[self window] makeFirstResponder:[[self subviews] lastObject]];
+}
+
+// The arrows lead from one button to the next.
+- (void)keyDown:(NSEvent*)event
+{
+    NSString* characters = [event charactersIgnoringModifiers];
+    const unichar key = [characters length] ? [characters characterAtIndex:0] : 0;
+    if ((key != NSLeftArrowFunctionKey && key != NSRightArrowFunctionKey) || ![self hasKeyboard])
+        return [super keyDown:event];
+    NSArray* buttons = [self subviews];
+    const auto here = static_cast<NSInteger>([buttons indexOfObject:[[self window] firstResponder]]);
+    const NSInteger next = here + (key == NSRightArrowFunctionKey ? 1 : -1);
+    if (next < 0 || next >= static_cast<NSInteger>([buttons count]))
+        return;
+    NSButton* button = [buttons objectAtIndex:static_cast<NSUInteger>(next)];
+    if ([button isHidden])
+        return;
+    [self stopAt:button];
+    [[self window] makeFirstResponder:button];
 }
 
 - (void)setFrameSize:(NSSize)size
