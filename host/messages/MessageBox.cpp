@@ -1,5 +1,7 @@
 #include "host/messages/MessageBox.h"
 
+#include <algorithm>
+#include <cwctype>
 #include <utility>
 
 #include "host/Services.h"
@@ -7,6 +9,23 @@
 
 namespace tessel
 {
+namespace
+{
+// On the command line it is the end of a sentence; in the box it stands alone. What begins with a word begins
+// with a capital there; names stay as they are.
+std::wstring asSentence(std::wstring text)
+{
+    const std::wstring word = text.substr(0, text.find(L' '));
+    const auto isLetter = [](wchar_t character)
+    {
+        return std::iswalpha(static_cast<std::wint_t>(character)) != 0;
+    };
+    if (!word.empty() && std::ranges::all_of(word, isLetter))
+        text.front() = static_cast<wchar_t>(std::towupper(static_cast<std::wint_t>(text.front())));
+    return text;
+}
+} // namespace
+
 void MessageBox::setPresenter(Presenter presenter)
 {
     mPresenter = std::move(presenter);
@@ -23,7 +42,7 @@ std::wstring MessageBox::takeDetailFor(const std::wstring& text)
 {
     const std::wstring path = std::exchange(mExplainedPath, {});
     const std::wstring why = std::exchange(mWhy, {});
-    return !path.empty() && text.find(path) != std::wstring::npos ? why : std::wstring();
+    return !path.empty() && text.find(path) != std::wstring::npos ? asSentence(why) : std::wstring();
 }
 
 int MessageBox::show(const wchar_t* text, unsigned style, void* parent)

@@ -9,7 +9,7 @@ namespace
 {
 const NSRect kFilterBar = {{0, 0}, {420, 44}};
 const NSRect kFilterLabel = {{16, 14}, {72, 18}}; // in line with the panel's name field
-const NSRect kFilterChoice = {{92, 10}, {320, 26}};
+const NSRect kFilterChoice = {{104, 10}, {308, 26}};
 constexpr CGFloat kFontSize = 13;
 
 NSTextField* makeLabel(NSString* text)

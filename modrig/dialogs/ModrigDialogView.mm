@@ -1,5 +1,6 @@
 #import "modrig/dialogs/ModrigDialogView.h"
 
+#include <algorithm>
 #include <cmath>
 
 #import "modrig/dialogs/ModrigController.h"
@@ -10,6 +11,7 @@ namespace
 constexpr NSInteger kTabs = 2;
 constexpr CGFloat kSmallestHeight = 280; // a table of four rows, and the whole text of the Startup Suite box
 constexpr CGFloat kGap = 6;
+constexpr CGFloat kChoicePlace = 104; // in line with the panel's name field
 
 // The tab that the key stands for, or -1.
 NSInteger tabOf(NSEvent* event)
@@ -37,7 +39,7 @@ NSInteger tabOf(NSEvent* event)
     NSRect choice = [fileTypesChoice frame];
     const CGFloat right = NSMaxX(choice);
     label.size.width = width;
-    choice.origin.x = NSMaxX(label) + kGap;
+    choice.origin.x = std::max(kChoicePlace, NSMaxX(label) + kGap);
     choice.size.width = right - NSMinX(choice);
     [fileTypesLabel setFrame:label];
     [fileTypesChoice setFrame:choice];

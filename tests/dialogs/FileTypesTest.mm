@@ -22,7 +22,35 @@ protected:
         return host().registry.value(host().moduleKey(), L"FileFilter");
     }
 };
+// The uppermost row of the view's window in which something dark is drawn, within a part of the view.
+NSInteger topOfInk(NSView* view, NSRect part)
+{
+    [view lockFocus];
+    NSBitmapImageRep* picture = [[[NSBitmapImageRep alloc] initWithFocusedViewRect:part] autorelease];
+    [view unlockFocus];
+    const CGFloat top = NSMaxY([view convertRect:part toView:nil]);
+    for (NSInteger row = 0; row < [picture pixelsHigh]; ++row)
+        for (NSInteger column = 0; column < [picture pixelsWide]; ++column)
+            if ([[picture colorAtX:column y:row] brightnessComponent] < 0.4)
+                return static_cast<NSInteger>(top) - row;
+    return 0;
+}
 } // namespace
+
+TEST_F(FileTypes, StandInLineWithTheNameFieldAndWithTheirLabel)
+{
+    open();
+    show();
+    NSView* label = [[mController view] valueForKey:@"fileTypesLabel"];
+    NSView* choice = [[mController view] valueForKey:@"fileTypesChoice"];
+    NSTextField* name = nameField(mPanel);
+    EXPECT_EQ(NSMinX([name convertRect:[name bounds] toView:nil]), NSMinX([choice convertRect:[choice bounds]
+                                                                                       toView:nil]));
+    [mPanel display];
+    // The letters F and A, without the edge of the pop-up button.
+    EXPECT_EQ(topOfInk(label, NSMakeRect(1, 0, 9, NSHeight([label bounds]))),
+              topOfInk(choice, NSInsetRect(NSMakeRect(8, 0, 10, NSHeight([choice bounds])), 0, 4)));
+}
 
 TEST_F(FileTypes, AreNotStoredByOpening)
 {

@@ -23,7 +23,8 @@ std::wstring nameOf(NSView* view)
     if ([view isKindOfClass:[NSButton class]])
         return wide([(NSButton*)view title]);
     if ([view isKindOfClass:[NSTableView class]])
-        return L"table of " + wide([[[[(NSTableView*)view tableColumns] objectAtIndex:1] headerCell] stringValue]);
+        return L"table of " +
+               wide([[[[(NSTableView*)view tableColumns] objectAtIndex:1] headerCell] stringValue]);
     if ([view isKindOfClass:[NSTextField class]])
         return L"field";
     return wide(NSStringFromClass([view class]));
@@ -42,7 +43,10 @@ class TabOrder : public OpenDialogTest
 {
 protected:
     // "Up", before which nothing is read.
-    NSView* firstStop() { return [[[[[mPanel contentView] subviews] objectAtIndex:0] subviews] objectAtIndex:0]; }
+    NSView* firstStop()
+    {
+        return [[[[[mPanel contentView] subviews] objectAtIndex:0] subviews] objectAtIndex:0];
+    }
     std::wstring lastFolder() { return wide([[mPanel directory] lastPathComponent]); }
 };
 } // namespace

@@ -9,10 +9,12 @@ namespace
 // opens. On the way are the name field and the switch for hidden files. What is disabled is left out.
 constexpr int kTabsToLoad = 4;
 constexpr int kTabsToAddToHistory = 5;
-constexpr int kTabsToTable = 6;
-constexpr int kTabsToContents = 7; // with nothing selected in the table
-constexpr int kTabsToHelp = 8;
-constexpr int kTabsToClose = 9;
+constexpr int kTabsToTabs = 6;
+constexpr int kTabsToTable = 7;
+constexpr int kTabsToContents = 8; // with nothing selected in the table
+constexpr int kTabsToHelp = 9;
+constexpr int kTabsToClose = 10;
+constexpr int kTabsToWay = 13;
 
 // From the table to what is under it when a row is selected.
 constexpr int kTabsToFirstButton = 1; // Unload, or Load from the History
@@ -77,6 +79,113 @@ TEST_F(DialogKeyboard, GoesToTheTabs)
     shoot("loaded-applications");
     closeAndEnd();
     EXPECT_EQ(storedSetting("LastTab"), "0\n");
+}
+
+// A stop of the Tab key, and a place at the edge of the control, where it shows that it has the keyboard.
+struct Stop
+{
+    const char* name;
+    Place edge;
+};
+
+TEST_F(DialogKeyboard, ComesToEveryControlInTheOrderOfReading)
+{
+    const Stop kStops[] = {{"name", {545, 320}},
+                           {"hidden-files", {715, 330}},
+                           {"file-types", {100, 375}},
+                           {"load", {715, 376}},
+                           {"add-to-history", {620, 405}},
+                           {"tabs", {60, 410}},
+                           {"table", {30, 550}},
+                           {"contents", {575, 620}},
+                           {"help", {35, 708}},
+                           {"close", {655, 708}},
+                           {"up", {35, 21}},
+                           {"home", {160, 21}}};
+    open();
+    std::string lastBefore;
+    const Stop* last = nullptr;
+    for (const Stop& stop : kStops)
+    {
+        const std::string before = look(stop.edge);
+        press("Tab");
+        EXPECT_TRUE(changes(stop.edge, before)) << stop.name;
+        shoot(std::string("at-") + stop.name);
+        EXPECT_TRUE(!last || comesTrue([&] { return look(last->edge) == lastBefore; })) << stop.name;
+        last = &stop;
+        lastBefore = before;
+    }
+    closeAndEnd();
+}
+
+TEST_F(DialogKeyboard, GoesToFoldersOnTheWayWithTheArrows)
+{
+    writeLisp("inner/a.lsp");
+    writeLisp("b.lsp");
+    setSetting("InitialPath", (files() / "inner").string());
+    open();
+    press("Tab", kTabsToWay);
+    shoot("at-way");
+    press("Left");
+    shoot("at-folder-above");
+    press("space");
+    press("Right"); // there is none further in any more
+    press("alt+n");
+    mScreen.text("b.lsp");
+    shoot("went-up");
+    press("Return");
+    EXPECT_TRUE(prints(wasLoaded("b.lsp")));
+    closeAndEnd();
+}
+
+TEST_F(DialogKeyboard, GoesFromTabToTabWithTheArrows)
+{
+    open();
+    press("Tab", kTabsToTabs);
+    press("Right", 2); // there is no third
+    shoot("history");
+    closeAndEnd();
+    EXPECT_EQ(storedSetting("LastTab"), "1\n");
+    open();
+    press("Tab", kTabsToTabs);
+    press("Left", 2);
+    shoot("loaded-applications");
+    closeAndEnd();
+    EXPECT_EQ(storedSetting("LastTab"), "0\n");
+}
+
+TEST_F(DialogKeyboard, PressesControlsByTheirLetters)
+{
+    writeLisp("a.lsp");
+    mSession.folder().write("files/broken.zmb", "no module");
+    open();
+    press("alt+a"); // Add to History
+    press("alt+n"); // Name
+    mScreen.text((files() / "a.lsp").string());
+    press("alt+l"); // Load
+    EXPECT_TRUE(prints(wasLoaded("a.lsp")));
+    press("alt+s"); // History
+    shoot("history");
+    press("alt+t"); // Contents
+    const std::string suite = mScreen.waitForWindow(kSuiteDialog);
+    ASSERT_TRUE(mScreen.waitUntilActive(suite));
+    shoot("suite");
+    press("alt+c"); // Close
+    waitForTheMainDialog();
+    press("alt+n");
+    press("ctrl+a");
+    mScreen.text((files() / "broken.zmb").string());
+    press("alt+l");
+    ASSERT_TRUE(mScreen.waitUntilActive(mScreen.waitForWindow(kMessageBox)));
+    shoot("box");
+    press("alt+o"); // OK
+    EXPECT_TRUE(mScreen.waitUntilGone(kMessageBox));
+    ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
+    press("alt+c");
+    EXPECT_TRUE(mScreen.waitUntilGone(kDialog));
+    end();
+    EXPECT_EQ(storedSetting("LastTab"), "1\n");
+    EXPECT_EQ(storedSetting("SaveHistory"), "1\n");
 }
 
 TEST_F(DialogKeyboard, ReachesTheCheckBoxWithTab)

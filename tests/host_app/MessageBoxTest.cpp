@@ -63,7 +63,27 @@ TEST(MessageBox, SaysInItsDetailWhatIsKnownOfTheFileThatItNames)
     box.show(L"/a/tool.zmb was not loaded.", 48, nullptr);
     box.explain(L"/a/tool.zmb", L"it has no entry point.");
     box.show(L"/a/other.zmb was not loaded.", 48, nullptr);
-    EXPECT_EQ(details, (std::vector<std::wstring>{L"it has no entry point.", L"", L""}));
+    EXPECT_EQ(details, (std::vector<std::wstring>{L"It has no entry point.", L"", L""}));
+}
+
+TEST(MessageBox, BeginsItsDetailWithACapitalUnlessThatIsAName)
+{
+    CapturedOutput output;
+    tessel::MessageBox box;
+    std::vector<std::wstring> details;
+    box.setPresenter(
+        [&](const tessel::MessageBox::Box& shown)
+        {
+            details.push_back(shown.detail);
+            return IDOK;
+        });
+    for (const wchar_t* why : {L"cut", L"it is", L"libc.so: gone", L"/a/b: gone", L"xy7 is", L"It is", L""})
+    {
+        box.explain(L"/a/tool.zmb", why);
+        box.show(L"/a/tool.zmb was not loaded.", 48, nullptr);
+    }
+    EXPECT_EQ(details, (std::vector<std::wstring>{L"Cut", L"It is", L"libc.so: gone", L"/a/b: gone",
+                                                  L"xy7 is", L"It is", L""}));
 }
 
 TEST(MessageBox, LeavesTheDetailToTheCommandLineWithoutADisplay)

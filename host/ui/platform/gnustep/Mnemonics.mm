@@ -164,7 +164,8 @@ void use(NSView* control)
 
 bool isEnabled(NSView* control)
 {
-    return [control window] && (![control isKindOfClass:[NSControl class]] || [(NSControl*)control isEnabled]);
+    return
+        [control window] && (![control isKindOfClass:[NSControl class]] || [(NSControl*)control isEnabled]);
 }
 
 void use(const Holder& holder)
@@ -234,8 +235,8 @@ NSAttributedString* withMnemonic(NSAttributedString* text, NSView* control)
 
 NSAttributedString* labelOfTab(NSTabViewItem* item, NSDictionary* look)
 {
-    NSAttributedString* label =
-        [[[NSAttributedString alloc] initWithString:[item label] attributes:look] autorelease];
+    NSAttributedString* label = [[[NSAttributedString alloc] initWithString:[item label]
+                                                                 attributes:look] autorelease];
     return underlined(label, placeOf(item, [[item tabView] window]));
 }
 

@@ -46,8 +46,11 @@ NSColor* tessel::windowing::themeColor(NSString* name)
 {
 }
 
+// A button with an edge has its ring there.
 - (void)drawFocusFrame:(NSRect)frame view:(NSView*)view
 {
+    if ([view isKindOfClass:[NSButton class]] && [(NSButton*)view isBordered])
+        return;
     drawFocusRing(NSInsetRect(frame, -1, -1));
 }
 

@@ -39,7 +39,17 @@ BOOL tabsResign(id tabs, SEL selector)
     return toolkitTabsResign(tabs, selector);
 }
 
-// A field stays as it was drawn when its editor goes.
+using SetUpEditor = NSText* (*)(id, SEL, NSText*);
+SetUpEditor toolkitSetUpEditor;
+
+// A field stays as it was drawn when its editor comes.
+NSText* setUpEditor(id cell, SEL selector, NSText* editor)
+{
+    [[cell controlView] setNeedsDisplay:YES];
+    return toolkitSetUpEditor(cell, selector, editor);
+}
+
+// And when it goes.
 void fieldEnds(id field, SEL selector, NSNotification* end)
 {
     toolkitFieldEnds(field, selector, end);
@@ -80,6 +90,7 @@ void showWhereTheKeyboardIs()
     toolkitTabsBecome = overrideIn("NSTabView", @selector(becomeFirstResponder), tabsBecome);
     toolkitTabsResign = overrideIn("NSTabView", @selector(resignFirstResponder), tabsResign);
     toolkitFieldEnds = standInFor("NSTextField", @selector(textDidEndEditing:), fieldEnds);
+    toolkitSetUpEditor = standInFor("NSTextFieldCell", @selector(setUpFieldEditorAttributes:), setUpEditor);
     standInFor("NSClipView", @selector(acceptsFirstResponder), clipStops);
 }
 } // namespace tessel::windowing

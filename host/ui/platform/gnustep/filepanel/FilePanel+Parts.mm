@@ -31,7 +31,7 @@ namespace
 constexpr CGFloat kMargin = 8;
 constexpr CGFloat kControlHeight = 26;
 constexpr CGFloat kButtonWidth = 90;
-constexpr CGFloat kFieldPlace = 92; // from the left edge
+constexpr CGFloat kFieldPlace = 104; // from the left edge
 constexpr CGFloat kSwitchWidth = 150;
 constexpr CGFloat kSmallestWidth = 560;
 constexpr CGFloat kListBeyondSmallest = 190; // points, in the size that the panel opens in
