@@ -39,14 +39,16 @@ std::vector<std::wstring> stopsFrom(NSView* first)
     return stops;
 }
 
+// "Up", before which nothing is read.
+NSView* firstStopOf(NSWindow* panel)
+{
+    return [[[[[panel contentView] subviews] objectAtIndex:0] subviews] objectAtIndex:0];
+}
+
 class TabOrder : public OpenDialogTest
 {
 protected:
-    // "Up", before which nothing is read.
-    NSView* firstStop()
-    {
-        return [[[[[mPanel contentView] subviews] objectAtIndex:0] subviews] objectAtIndex:0];
-    }
+    NSView* firstStop() { return firstStopOf(mPanel); }
     std::wstring lastFolder() { return wide([[mPanel directory] lastPathComponent]); }
 };
 } // namespace
@@ -73,4 +75,50 @@ TEST_F(TabOrder, OfTheHistoryIsThatOfReading)
                             L"Hidden files", L"menu All Tessel applications", L"Load", L"Add to History",
                             L"NSTabView", L"table of Folder", L"Load", L"Add to Startup Suite", L"Remove",
                             L"Contents…", L"Help", L"Close"));
+}
+
+TEST_F(TabOrder, OfTheStartupSuiteIsThatOfReading)
+{
+    open();
+    ModrigStartupSuitController* suite = [[[ModrigStartupSuitController alloc] init] autorelease];
+    NSWindow* window = [suite window];
+    [suite doInit];
+    NSView* table = [suite valueForKey:@"startupTableView"];
+    EXPECT_EQ([window initialFirstResponder], table);
+    EXPECT_THAT(stopsFrom(table), ElementsAre(L"table of Folder", L"NSSegmentedControl", L"Help", L"Close"));
+    [suite doClean];
+}
+
+TEST_F(TabOrder, OfTheAddPanelIsThatOfReading)
+{
+    NSMutableArray* filters = [NSMutableArray array];
+    [TsOCModrigUtil populateModrigFileFilter:filters];
+    TsOCOpenFileDialog* dialog = [[[TsOCOpenFileDialog alloc] init] autorelease];
+    NSString* folder = [path("one.lsp") stringByDeletingLastPathComponent];
+    [dialog setInitialPath:folder];
+    [dialog setFileFilters:filters];
+    std::vector<std::wstring> stops;
+    const ModalSteps steps({[&]
+                            {
+                                auto* panel = (NSOpenPanel*)[NSApp modalWindow];
+                                selectFilesIn(panel, {L"one.lsp"});
+                                stops = stopsFrom(firstStopOf(panel));
+                                [NSApp stopModal];
+                            }});
+    [dialog runModal];
+    EXPECT_THAT(stops, ElementsAre(L"Up", L"Home", wide([folder lastPathComponent]), L"menu Recent",
+                                   L"table of Kind", L"field", L"Hidden files",
+                                   L"menu All Tessel applications", L"Cancel", L"Open"));
+}
+
+TEST_F(TabOrder, OfAMessageBoxIsThatOfReading)
+{
+    std::vector<std::wstring> stops;
+    const ModalSteps steps({[&]
+                            {
+                                stops = stopsFrom((NSView*)[[NSApp modalWindow] initialFirstResponder]);
+                                [NSApp stopModal];
+                            }});
+    tessel::windowing::runMessage(@"It failed.", @"There is no such file.", true);
+    EXPECT_THAT(stops, ElementsAre(L"OK", L"field"));
 }

@@ -159,6 +159,7 @@ NSBezierPath* triangleIn(NSRect frame)
     [[self contentView] addSubview:words];
     NSButton* button = [self answerAt:NSMakePoint(NSWidth(content) - kMargin - kButtonSize.width, kMargin)];
     [[self contentView] addSubview:button];
+    [self recalculateKeyViewLoop]; // the detail can be selected
     [self setInitialFirstResponder:button];
     return self;
 }

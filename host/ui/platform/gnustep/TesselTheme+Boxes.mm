@@ -10,6 +10,15 @@ using namespace tessel::windowing;
 
 namespace
 {
+// By drawing a label the toolkit learns where clicks on it go, so it draws; nobody sees it.
+void drawUnseen(NSTabViewItem* item, NSRect tab)
+{
+    [NSGraphicsContext saveGraphicsState];
+    NSRectClip(NSZeroRect);
+    [item drawLabel:NO inRect:tab];
+    [NSGraphicsContext restoreGraphicsState];
+}
+
 void drawLabel(NSTabViewItem* item, NSFont* font, NSRect tab)
 {
     NSDictionary* look =
@@ -39,6 +48,7 @@ void drawLabel(NSTabViewItem* item, NSFont* font, NSRect tab)
         [item _setTabState:item == selected ? NSSelectedTab : NSBackgroundTab];
         if (item == selected)
             drawTab(tab, flipped);
+        drawUnseen(item, NSInsetRect(tab, kTabPadding, 0));
         drawLabel(item, [(NSTabView*)view font], tab);
         if (item == selected && hasKeyboard(view))
             drawFocusRing(NSInsetRect(tab, 4, 4));

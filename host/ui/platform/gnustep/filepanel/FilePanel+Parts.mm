@@ -198,7 +198,7 @@ NSTextFieldCell* makeTextCell()
     [mCancel setFrameOrigin:NSMakePoint(right - kButtonWidth - kMargin, 7)];
     for (NSButton* button : {mCancel, mOK})
         [button setAutoresizingMask:NSViewMinXMargin | NSViewMaxYMargin];
-    for (NSButton* button : {spare, mOK, mCancel})
+    for (NSButton* button : {spare, mCancel, mOK}) // from left to right, for the order of the Tab key
         [content addSubview:button];
     [self setDefaultButtonCell:[mOK cell]];
 }
