@@ -90,7 +90,7 @@ struct Stop
 
 TEST_F(DialogKeyboard, ComesToEveryControlInTheOrderOfReading)
 {
-    const Stop kStops[] = {{"name", {545, 320}},
+    const Stop kStops[] = {{"name", {545, 346}},
                            {"hidden-files", {715, 330}},
                            {"file-types", {100, 375}},
                            {"load", {715, 376}},

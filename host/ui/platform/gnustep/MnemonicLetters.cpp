@@ -31,7 +31,8 @@ std::vector<std::size_t> placesIn(const std::wstring& text)
     for (std::size_t place = 0; place < text.size(); ++place)
         if (isLetter(text[place]))
             places.push_back(place);
-    std::ranges::stable_partition(places, [&](std::size_t place) { return beginsWord(text, place); });
+    std::stable_partition(places.begin(), places.end(),
+                          [&](std::size_t place) { return beginsWord(text, place); });
     return places;
 }
 
