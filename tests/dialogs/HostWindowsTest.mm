@@ -26,7 +26,6 @@ int failures = 0;
 @implementation FailingWindow
 - (void)sendEvent:(NSEvent*)event
 {
-    (void)event;
     ++failures;
     [NSException raise:NSInternalInconsistencyException format:@"the display went away"];
 }

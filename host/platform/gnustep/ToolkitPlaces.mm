@@ -5,10 +5,10 @@
 
 #include <wincompat/winstring.h>
 
+#include "host/platform/FileNames.h"
 #include "host/platform/ToolkitPlaces.h"
 #include "host/platform/gnustep/ToolkitProcess.h"
 #include "host/text/Unicode.h"
-#include "host/text/platform/FileNames.h"
 
 namespace tessel
 {

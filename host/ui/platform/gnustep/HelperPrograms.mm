@@ -18,10 +18,10 @@
 
 #include <tesselui/tsuieach.h>
 
+#include "host/platform/gnustep/StandIn.h"
 #include "host/platform/gnustep/ToolkitProcess.h"
 #include "host/ui/platform/gnustep/Behaviour.h"
 #include "host/ui/platform/gnustep/SessionFolder.h"
-#include "host/platform/gnustep/StandIn.h"
 
 namespace tessel::windowing
 {

@@ -10,8 +10,8 @@
 #include <tesselui/tsuieach.h>
 #include <wincompat/winstring.h>
 
-#include "host/ui/platform/gnustep/MnemonicLetters.h"
 #include "host/platform/gnustep/StandIn.h"
+#include "host/ui/platform/gnustep/MnemonicLetters.h"
 #include "host/ui/platform/gnustep/TabKeys.h"
 #import "host/ui/platform/gnustep/filepanel/PathBar.h"
 

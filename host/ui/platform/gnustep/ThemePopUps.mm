@@ -1,7 +1,7 @@
 // The toolkit starts the title of a pop-up button at its very edge, and has an arrow of another kind for a
 // list of actions than for a choice. Drawn here instead.
-#include "host/ui/platform/gnustep/Mnemonics.h"
 #include "host/platform/gnustep/StandIn.h"
+#include "host/ui/platform/gnustep/Mnemonics.h"
 #include "host/ui/platform/gnustep/ThemeButtons.h"
 
 #import <AppKit/AppKit.h>
