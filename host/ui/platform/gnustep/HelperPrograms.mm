@@ -78,6 +78,7 @@ NSDictionary* personalEnvironment(NSDictionary* environment)
 std::vector<const char*> pointersTo(const std::vector<std::string>& texts)
 {
     std::vector<const char*> pointers;
+    pointers.reserve(texts.size() + 1);
     for (const std::string& text : texts)
         pointers.push_back(text.c_str());
     pointers.push_back(nullptr);
