@@ -3,11 +3,14 @@
 #include <cstdio>
 #include <filesystem>
 
-#include "host/Services.h"
+#include "host/applications/Document.h"
 #include "host/applications/ModuleLibrary.h"
+#include "host/commands/EndRequest.h"
 #include "host/lisp/LispInterpreter.h"
+#include "host/registry/Profiles.h"
 #include "host/registry/Registry.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Version.h"
 
 int main(int argc, char** argv)
 {
@@ -18,13 +21,13 @@ int main(int argc, char** argv)
     }
     std::filesystem::create_directories(argv[1]);
     tessel::CommandLine commandLine([](std::string_view) {});
-    tessel::services().commandLine = &commandLine;
     tessel::Registry registry(std::filesystem::path(argv[1]) / "registry.db");
-    tessel::services().registry = &registry;
-    tessel::ensureCurrentProfile(registry, L"Software\\Tessel\\R21");
+    const tessel::Profiles profiles(registry, tessel::kProductRegistryRoot);
     if (!registry.endOfCommand())
         return 1;
-    const auto lisp = tessel::LispInterpreter::start({});
+    tessel::Document document;
+    const tessel::EndRequest endRequest;
+    const auto lisp = tessel::LispInterpreter::start({}, commandLine, document, endRequest);
     const auto file = tessel::moduleFileAt(argv[2]);
     if (!lisp || !file)
         return 1;

@@ -1,5 +1,5 @@
-// The host's own commands, by subject. Each function adds its commands to the stack; they work on the parts
-// of the running host.
+// The host's own commands, by subject. Each function adds its commands to the parts' command stack; they work
+// on those parts.
 #pragma once
 
 #include <filesystem>
@@ -9,7 +9,7 @@
 
 namespace tessel
 {
-class CommandStack;
+struct Parts;
 
 // What only the session can do.
 struct SessionActions
@@ -18,8 +18,8 @@ struct SessionActions
     std::function<Result<>(const std::filesystem::path&)> runScript;
 };
 
-void addSessionCommands(CommandStack& commands, SessionActions actions); // HELP QUIT EXIT VERSION CD SCRIPT
-void addApplicationCommands(CommandStack& commands);                     // LOAD UNLOAD APPS
-void addSettingCommands(CommandStack& commands);                         // SETVAR PROFILE
-void addRegistryCommands(CommandStack& commands);                        // REGISTRY
+void addSessionCommands(Parts& parts, SessionActions actions); // HELP QUIT EXIT VERSION CD SCRIPT
+void addApplicationCommands(Parts& parts);                     // LOAD UNLOAD APPS
+void addSettingCommands(Parts& parts);                         // SETVAR PROFILE
+void addRegistryCommands(Parts& parts);                        // REGISTRY
 } // namespace tessel

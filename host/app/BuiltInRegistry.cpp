@@ -2,10 +2,9 @@
 // keep there.
 #include <string>
 
-#include "host/Services.h"
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
-#include "host/registry/Registry.h"
+#include "host/app/Parts.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -14,7 +13,7 @@ namespace
 {
 constexpr wchar_t kCommand[] = L"REGISTRY";
 
-// The arguments behind the name of what is to be done. A name that is left out is the unnamed value's.
+// The arguments after the name of what is to be done. A name that is left out is the unnamed value's.
 using Arguments = CommandStack::Arguments;
 
 std::wstring at(const Arguments& arguments, std::size_t index)
@@ -28,50 +27,50 @@ Failure failureAt(const std::wstring& path, const std::wstring& reason)
 }
 
 // The store's own words are told at the end of the command, which undoes all of it.
-std::wstring writeReason(const Result<>& written)
+std::wstring writeReason(const Registry& registry, const Result<>& written)
 {
-    const Result<>& canStore = services().registry->canStore();
+    const Result<>& canStore = registry.canStore();
     return L"cannot be written: " +
            (canStore ? L"error " + std::to_wstring(written.code()) : canStore.sentence());
 }
 
-Result<> list(const std::wstring& path)
+Result<> list(Parts& parts, const std::wstring& path)
 {
-    Registry& registry = *services().registry;
+    Registry& registry = *parts.registry;
     const auto key = registry.find(path);
     if (key == Registry::kNoKey)
         return failureAt(path, L"does not exist");
     for (const auto& name : registry.subKeys(key))
-        sayLine(L"[" + name + L"]");
+        sayLine(parts, L"[" + name + L"]");
     for (const auto& value : registry.values(key))
-        sayLine((value.name.empty() ? L"(unnamed)" : value.name) + L" = " + value.data);
+        sayLine(parts, (value.name.empty() ? L"(unnamed)" : value.name) + L" = " + value.data);
     return {};
 }
 
-Result<> get(const std::wstring& path, const std::wstring& name)
+Result<> get(Parts& parts, const std::wstring& path, const std::wstring& name)
 {
-    const auto data = services().registry->read(path, name);
+    const auto data = parts.registry->read(path, name);
     if (!data)
         return failureAt(path, L"has no value \"" + name + L"\"");
-    sayLine(*data);
+    sayLine(parts, *data);
     return {};
 }
 
 // A key alone is made; with a name, the value is stored.
-Result<> set(const std::wstring& path, const Arguments& arguments)
+Result<> set(Parts& parts, const std::wstring& path, const Arguments& arguments)
 {
-    Registry& registry = *services().registry;
+    Registry& registry = *parts.registry;
     const auto key = registry.create(path, Registry::kRoot);
     Result<> done = key ? Result<>() : key.failure();
     if (key && arguments.size() > 2)
         done = registry.writeValue(*key, at(arguments, 2), at(arguments, 3));
-    return done ? done : failureAt(path, writeReason(done));
+    return done ? done : failureAt(path, writeReason(registry, done));
 }
 
 // A key alone goes with everything below it; with a name, only the value.
-Result<> remove(const std::wstring& path, const Arguments& arguments)
+Result<> remove(Parts& parts, const std::wstring& path, const Arguments& arguments)
 {
-    Registry& registry = *services().registry;
+    Registry& registry = *parts.registry;
     const auto key = registry.find(path);
     if (key == Registry::kNoKey)
         return failureAt(path, L"does not exist");
@@ -79,29 +78,30 @@ Result<> remove(const std::wstring& path, const Arguments& arguments)
         arguments.size() > 2 ? registry.removeValue(key, at(arguments, 2)) : registry.removeKey(key);
     if (done.code() == ERROR_FILE_NOT_FOUND)
         return failureAt(path, L"has no value \"" + at(arguments, 2) + L"\"");
-    return done ? done : failureAt(path, writeReason(done));
+    return done ? done : failureAt(path, writeReason(registry, done));
 }
 
-Result<> registryCommand(const Arguments& arguments)
+Result<> registryCommand(Parts& parts, const Arguments& arguments)
 {
     const std::wstring action = at(arguments, 0);
     const std::wstring path = at(arguments, 1);
     if (equalIgnoringCase(action, L"LIST") && arguments.size() <= 2)
-        return list(path);
+        return list(parts, path);
     if (equalIgnoringCase(action, L"GET") && (arguments.size() == 2 || arguments.size() == 3))
-        return get(path, at(arguments, 2));
+        return get(parts, path, at(arguments, 2));
     if (equalIgnoringCase(action, L"SET") && (arguments.size() == 2 || arguments.size() == 4))
-        return set(path, arguments);
+        return set(parts, path, arguments);
     if (equalIgnoringCase(action, L"DELETE") && (arguments.size() == 2 || arguments.size() == 3))
-        return remove(path, arguments);
-    return wrongUsage(kCommand);
+        return remove(parts, path, arguments);
+    return wrongUsage(parts, kCommand);
 }
 } // namespace
 
-void addRegistryCommands(CommandStack& commands)
+void addRegistryCommands(Parts& parts)
 {
-    commands.addBuiltIn({L"Settings", kCommand, L"LIST|GET|SET|DELETE key [name] [data]",
-                         L"Works on the registry, below HKEY_CURRENT_USER"},
-                        registryCommand);
+    addBuiltIn(parts,
+               {L"Settings", kCommand, L"LIST|GET|SET|DELETE key [name] [data]",
+                L"Works on the registry, below HKEY_CURRENT_USER"},
+               registryCommand);
 }
 } // namespace tessel

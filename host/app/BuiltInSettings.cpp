@@ -1,9 +1,7 @@
 // SETVAR, PROFILE: how the host is set.
-#include "host/Services.h"
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
-#include "host/registry/Profiles.h"
-#include "host/registry/SystemVariables.h"
+#include "host/app/Parts.h"
 
 namespace tessel
 {
@@ -17,48 +15,47 @@ std::wstring assignment(const SystemVariables::Variable& variable)
     return variable.name + L" = " + toText(variable.value);
 }
 
-Result<> listVariables()
+Result<> listVariables(Parts& parts)
 {
-    for (const auto& variable : services().variables->all())
-        sayLine(L"  " + padded(assignment(variable), kVariableColumn) + L" " + variable.purpose);
+    for (const auto& variable : parts.variables->all())
+        sayLine(parts, L"  " + padded(assignment(variable), kVariableColumn) + L" " + variable.purpose);
     return {};
 }
 
-Result<> showVariable(const std::wstring& name)
+Result<> showVariable(Parts& parts, const std::wstring& name)
 {
-    const auto* variable = services().variables->find(name);
+    const auto* variable = parts.variables->find(name);
     if (!variable)
         return Failure{L"There is no variable called \"" + name + L"\"."};
-    sayLine(assignment(*variable));
+    sayLine(parts, assignment(*variable));
     return {};
 }
 
-Result<> setVariable(const CommandStack::Arguments& arguments)
+Result<> setVariable(Parts& parts, const CommandStack::Arguments& arguments)
 {
     if (arguments.empty())
-        return listVariables();
+        return listVariables(parts);
     if (arguments.size() == 1)
-        return showVariable(arguments.front());
+        return showVariable(parts, arguments.front());
     if (arguments.size() > 2)
-        return wrongUsage(L"SETVAR");
-    return services().variables->set(arguments[0], arguments[1]);
+        return wrongUsage(parts, L"SETVAR");
+    return parts.variables->set(arguments[0], arguments[1]);
 }
 
-Result<> profile(const CommandStack::Arguments& arguments)
+Result<> profile(Parts& parts, const CommandStack::Arguments& arguments)
 {
     if (arguments.size() > 1)
-        return wrongUsage(L"PROFILE");
+        return wrongUsage(parts, L"PROFILE");
     if (arguments.size() == 1)
-        return setCurrentProfile(arguments.front());
-    sayLine(currentProfile());
+        return parts.profiles.setCurrent(arguments.front());
+    sayLine(parts, parts.profiles.current());
     return {};
 }
 } // namespace
 
-void addSettingCommands(CommandStack& commands)
+void addSettingCommands(Parts& parts)
 {
-    commands.addBuiltIn({kGroup, L"SETVAR", L"[name [value]]", L"Shows or sets system variables"},
-                        setVariable);
-    commands.addBuiltIn({kGroup, L"PROFILE", L"[name]", L"Shows or changes the current profile"}, profile);
+    addBuiltIn(parts, {kGroup, L"SETVAR", L"[name [value]]", L"Shows or sets system variables"}, setVariable);
+    addBuiltIn(parts, {kGroup, L"PROFILE", L"[name]", L"Shows or changes the current profile"}, profile);
 }
 } // namespace tessel

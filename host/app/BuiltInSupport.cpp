@@ -1,27 +1,31 @@
 #include "host/app/BuiltInSupport.h"
 
 #include <algorithm>
+#include <functional>
 
-#include "host/Services.h"
-#include "host/text/CommandLine.h"
-#include "host/text/Unicode.h"
+#include "host/app/Parts.h"
 
 namespace tessel
 {
-void sayLine(const std::wstring& sentence)
+void addBuiltIn(Parts& parts, const CommandStack::Description& description, BuiltInCommand* command)
 {
-    services().commandLine->say(sentence);
+    parts.commands->addBuiltIn(description, std::bind_front(command, std::ref(parts)));
 }
 
-Result<> succeed(const std::wstring& sentence)
+void sayLine(Parts& parts, const std::wstring& sentence)
 {
-    sayLine(sentence);
+    parts.commandLine->say(sentence);
+}
+
+Result<> succeed(Parts& parts, const std::wstring& sentence)
+{
+    sayLine(parts, sentence);
     return {};
 }
 
-Failure wrongUsage(const std::wstring& command)
+Failure wrongUsage(const Parts& parts, const std::wstring& command)
 {
-    const auto known = services().commands->descriptions();
+    const auto known = parts.commands->descriptions();
     const auto found = std::ranges::find_if(known, [&](const auto& entry) { return entry.name == command; });
     return {L"Usage: " + command + L" " + (found == known.end() ? L"" : found->usage)};
 }

@@ -9,13 +9,20 @@
 
 namespace tessel
 {
-void sayLine(const std::wstring& sentence);
+struct Parts;
+
+using BuiltInCommand = Result<>(Parts& parts, const CommandStack::Arguments& arguments);
+
+// Adds a command that works on the parts.
+void addBuiltIn(Parts& parts, const CommandStack::Description& description, BuiltInCommand* command);
+
+void sayLine(Parts& parts, const std::wstring& sentence);
 
 // Says the sentence with which a command ends well.
-Result<> succeed(const std::wstring& sentence);
+Result<> succeed(Parts& parts, const std::wstring& sentence);
 
 // How the command is to be typed.
-Failure wrongUsage(const std::wstring& command);
+Failure wrongUsage(const Parts& parts, const std::wstring& command);
 
 std::filesystem::path toPath(const std::wstring& text);
 std::wstring toText(const std::filesystem::path& path);

@@ -2,8 +2,13 @@
 // the same host in its own process:
 //
 //     std::string output;
-//     Host host({.profileFolder = folder / "profile", .output = [&](std::string_view text) { output += text;
-//     }}); ASSERT_TRUE(host.start()); EXPECT_TRUE(host.run(L"VERSION")); host.end();
+//     HostOptions options;
+//     options.profileFolder = folder / "profile";
+//     options.output = [&](std::string_view text) { output += text; };
+//     Host host(options);
+//     ASSERT_TRUE(host.start());
+//     EXPECT_TRUE(host.run(L"VERSION"));
+//     host.end();
 //
 // One host at a time in a process, and everything on the thread that makes it. The SDK's functions answer for
 // the host that is running.
@@ -18,17 +23,20 @@
 #include "host/app/Export.h"
 #include "host/commands/EndRequest.h"
 #include "host/console/LineRunner.h"
+#include "host/files/RemoteFiles.h"
 #include "host/text/CommandLine.h"
 
 namespace tessel
 {
 class LispInterpreter;
+struct Parts;
 
 struct HostOptions
 {
     std::filesystem::path profileFolder; // made when it is missing
     bool safe = false;                   // load no application by itself
     CommandLine::Sink output;            // receives everything that the host says
+    RemoteFiles::Limits downloads = {};  // of the files that are fetched for applications
 };
 
 class TESSEL_PROGRAM_API Host : public LineRunner
@@ -66,13 +74,8 @@ public:
     std::vector<std::wstring> commandNames() const;
 
 private:
-    struct Parts;
-
     Result<> makeParts();
     Result<> prepareProfileFolder();
-    void makeStore();
-    Result<> makeApplicationParts();
-    void makeUserParts();
     void addCommands();
     bool finishLine();
 

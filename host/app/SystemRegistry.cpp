@@ -1,11 +1,11 @@
-// The host's registry of named services.
+// The SDK's registry of named services.
 #include <string_view>
 
 #include <tessel/tsrx.h>
 
-#include "host/Services.h"
 #include "host/applications/DynamicLinker.h"
 #include "host/commands/CommandStack.h"
+#include "host/text/Running.h"
 
 namespace tessel
 {
@@ -18,9 +18,9 @@ public:
     {
         const std::wstring_view wanted = name ? name : L"";
         if (wanted == TSRX_DYNAMIC_LINKER)
-            return services().linker;
+            return running<DynamicLinker>();
         if (wanted == TSED_REGISTERED_COMMANDS)
-            return services().commands;
+            return running<CommandStack>();
         return nullptr;
     }
 };

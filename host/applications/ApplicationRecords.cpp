@@ -1,15 +1,13 @@
 #include "host/applications/ApplicationRecords.h"
 
 #include <tessel/tsappinfo.h>
-#include <tessel/tsed.h>
-#include <tessel/tshostservices.h>
 
 #include <charconv>
-#include <optional>
 
-#include "host/Services.h"
+#include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
 #include "host/registry/Registry.h"
+#include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -19,18 +17,6 @@ namespace
 constexpr const wchar_t* kModule = L"Module";
 constexpr const wchar_t* kDescription = L"Description";
 constexpr const wchar_t* kLoadReasons = L"LoadReasons";
-constexpr const wchar_t* kCommands = L"\\Commands";
-
-std::wstring recordsKey()
-{
-    const TsDbHostApplicationServices* application = tsdbHostApplicationServices();
-    return (application ? application->productRegistryRoot() : L"") + std::wstring(L"\\Applications");
-}
-
-std::wstring keyOf(const std::wstring& name)
-{
-    return recordsKey() + L"\\" + name;
-}
 
 // A name with a separator would file the record below another one, where nobody looks for it.
 bool isRecordName(const std::wstring& name)
@@ -46,75 +32,87 @@ std::optional<unsigned> parseReasons(const std::wstring& text)
     return error == std::errc() && end == digits.data() + digits.size() ? std::optional(reasons)
                                                                         : std::nullopt;
 }
+} // namespace
+
+ApplicationRecords::ApplicationRecords(Registry& registry, const CommandStack& commands,
+                                       const CallingApplication& calls, const std::wstring& productRoot)
+    : mRegistry(registry), mCommands(commands), mCalls(calls), mKey(productRoot + L"\\Applications")
+{
+}
+
+std::wstring ApplicationRecords::keyOf(const std::wstring& name) const
+{
+    return mKey + L"\\" + name;
+}
+
+std::wstring ApplicationRecords::commandsKeyOf(const std::wstring& name) const
+{
+    return keyOf(name) + L"\\Commands";
+}
+
+std::vector<ApplicationRecord> ApplicationRecords::all() const
+{
+    std::vector<ApplicationRecord> records;
+    const Registry::Key key = mRegistry.find(mKey);
+    if (key == Registry::kNoKey)
+        return records;
+    for (const std::wstring& name : mRegistry.subKeys(key))
+    {
+        auto record = read(name);
+        if (!record)
+            continue;
+        readCommands(*record);
+        records.push_back(*std::move(record));
+    }
+    return records;
+}
 
 // A record without a module or readable load reasons is none: somebody else's key, or half of one.
-std::optional<ApplicationRecord> readRecord(Registry& registry, const std::wstring& name)
+std::optional<ApplicationRecord> ApplicationRecords::read(const std::wstring& name) const
 {
     const std::wstring key = keyOf(name);
-    const auto module = registry.read(key, kModule);
-    const auto reasons = parseReasons(registry.read(key, kLoadReasons).value_or(L""));
+    const auto module = mRegistry.read(key, kModule);
+    const auto reasons = parseReasons(mRegistry.read(key, kLoadReasons).value_or(L""));
     if (!module || !reasons)
         return std::nullopt;
     ApplicationRecord record;
     record.name = name;
     record.module = *module;
-    record.description = registry.read(key, kDescription).value_or(L"");
+    record.description = mRegistry.read(key, kDescription).value_or(L"");
     record.loadReasons = *reasons;
     return record;
 }
 
-void readCommands(Registry& registry, ApplicationRecord& record)
+void ApplicationRecords::readCommands(ApplicationRecord& record) const
 {
-    const Registry::Key key = registry.find(keyOf(record.name) + kCommands);
+    const Registry::Key key = mRegistry.find(commandsKeyOf(record.name));
     if (key == Registry::kNoKey)
         return;
-    for (const Registry::Value& value : registry.values(key))
+    for (const Registry::Value& value : mRegistry.values(key))
         record.commands.emplace_back(value.name, value.data);
 }
 
-Result<> writeRecord(Registry& registry, const ApplicationRecord& record)
+Result<> ApplicationRecords::write(const ApplicationRecord& record)
 {
     const std::wstring key = keyOf(record.name);
-    Result<> written = registry.write(key, kModule, record.module);
+    Result<> written = mRegistry.write(key, kModule, record.module);
     if (written)
-        written = registry.write(key, kDescription, record.description);
+        written = mRegistry.write(key, kDescription, record.description);
     if (written)
-        written = registry.write(key, kLoadReasons, std::to_wstring(record.loadReasons));
+        written = mRegistry.write(key, kLoadReasons, std::to_wstring(record.loadReasons));
     return written;
 }
 
-// The commands replace those of an earlier version of the application.
-Result<> writeCommandsOfCaller(Registry& registry, const std::wstring& name)
+Result<> ApplicationRecords::writeCommandsOfCaller(const std::wstring& name)
 {
-    const std::wstring key = keyOf(name) + kCommands;
-    if (const Registry::Key old = registry.find(key); old != Registry::kNoKey)
-        if (auto removed = registry.removeKey(old); !removed)
+    const std::wstring key = commandsKeyOf(name);
+    if (const Registry::Key old = mRegistry.find(key); old != Registry::kNoKey)
+        if (auto removed = mRegistry.removeKey(old); !removed)
             return removed;
-    if (!services().commands)
-        return {};
-    for (const auto& [global, local] : services().commands->commandsOf(tsedGetAppName()))
-        if (auto written = registry.write(key, global, local); !written)
+    for (const auto& [global, local] : mCommands.commandsOf(mCalls.path()))
+        if (auto written = mRegistry.write(key, global, local); !written)
             return written;
     return {};
-}
-} // namespace
-
-std::vector<ApplicationRecord> allApplicationRecords()
-{
-    std::vector<ApplicationRecord> records;
-    Registry* registry = services().registry;
-    const Registry::Key key = registry ? registry->find(recordsKey()) : Registry::kNoKey;
-    if (key == Registry::kNoKey)
-        return records;
-    for (const std::wstring& name : registry->subKeys(key))
-    {
-        auto record = readRecord(*registry, name);
-        if (!record)
-            continue;
-        readCommands(*registry, *record);
-        records.push_back(*std::move(record));
-    }
-    return records;
 }
 } // namespace tessel
 
@@ -169,10 +167,10 @@ unsigned TesselAppInfo::loadReason() const
 
 int TesselAppInfo::readFromRegistry()
 {
-    tessel::Registry* registry = tessel::services().registry;
-    if (!registry || !tessel::isRecordName(mRecord->name))
+    const auto* records = tessel::running<tessel::ApplicationRecords>();
+    if (!records || !tessel::isRecordName(mRecord->name))
         return TSRX_APPINFO_ERROR;
-    const auto found = tessel::readRecord(*registry, mRecord->name);
+    const auto found = records->read(mRecord->name);
     if (!found)
         return TSRX_APPINFO_NOT_FOUND;
     static_cast<tessel::ApplicationRecord&>(*mRecord) = *found;
@@ -182,10 +180,10 @@ int TesselAppInfo::readFromRegistry()
 int TesselAppInfo::writeToRegistry(bool, bool withCommands)
 {
     // This host has one user's registry only: a record for all users is stored there too.
-    tessel::Registry* registry = tessel::services().registry;
-    if (!registry || !tessel::isRecordName(mRecord->name) || !tessel::writeRecord(*registry, *mRecord))
+    auto* records = tessel::running<tessel::ApplicationRecords>();
+    if (!records || !tessel::isRecordName(mRecord->name) || !records->write(*mRecord))
         return TSRX_APPINFO_ERROR;
-    if (withCommands && !tessel::writeCommandsOfCaller(*registry, mRecord->name))
+    if (withCommands && !records->writeCommandsOfCaller(mRecord->name))
         return TSRX_APPINFO_ERROR;
     return TSRX_APPINFO_OK;
 }

@@ -1,12 +1,19 @@
 // The host's records of applications: what is called what, where it is and when it is loaded.
 #pragma once
 
+#include <optional>
 #include <string>
 #include <utility>
 #include <vector>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
+class CallingApplication;
+class CommandStack;
+class Registry;
+
 struct ApplicationRecord
 {
     std::wstring name;
@@ -16,6 +23,32 @@ struct ApplicationRecord
     std::vector<std::pair<std::wstring, std::wstring>> commands; // global and local names
 };
 
-// Every record, in the order in which they were made.
-std::vector<ApplicationRecord> allApplicationRecords();
+class ApplicationRecords
+{
+public:
+    ApplicationRecords(Registry& registry, const CommandStack& commands, const CallingApplication& calls,
+                       const std::wstring& productRoot);
+
+    // Every record, in the order in which they were made.
+    std::vector<ApplicationRecord> all() const;
+
+    // The record of that name, without its commands.
+    std::optional<ApplicationRecord> read(const std::wstring& name) const;
+
+    // Stores the record in place of an earlier one of its name, all but its commands.
+    Result<> write(const ApplicationRecord& record);
+
+    // Stores the commands of the application that is being called, in place of those of an earlier version.
+    Result<> writeCommandsOfCaller(const std::wstring& name);
+
+private:
+    std::wstring keyOf(const std::wstring& name) const;
+    std::wstring commandsKeyOf(const std::wstring& name) const;
+    void readCommands(ApplicationRecord& record) const;
+
+    Registry& mRegistry;
+    const CommandStack& mCommands;
+    const CallingApplication& mCalls;
+    std::wstring mKey;
+};
 } // namespace tessel

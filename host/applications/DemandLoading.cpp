@@ -7,7 +7,6 @@
 
 #include <tessel/tsappinfo.h>
 
-#include "host/Services.h"
 #include "host/applications/ApplicationRecords.h"
 #include "host/applications/DynamicLinker.h"
 #include "host/text/Unicode.h"
@@ -20,11 +19,6 @@ constexpr bool kSayWhyNot = true;
 constexpr bool kResolveNow = true;
 constexpr wchar_t kGlobalNameMark = L'_';
 constexpr std::array<std::wstring_view, 3> kApplicationExtensions = {L".bundle", L".zmb", L".omp"};
-
-bool load(const std::wstring& path)
-{
-    return services().linker->loadModule(path.c_str(), kSayWhyNot, kResolveNow);
-}
 
 bool isApplication(const std::filesystem::path& path)
 {
@@ -51,23 +45,24 @@ bool lists(const ApplicationRecord& record, std::wstring_view typedName)
                                           equalIgnoringCase(command.second, typedName);
                                });
 }
-
-bool isDue(const ApplicationRecord& record, std::wstring_view command)
-{
-    return (record.loadReasons & TSRX_LOAD_ON_COMMAND) != 0 && lists(record, command) &&
-           !services().linker->isModuleLoaded(record.module.c_str());
-}
 } // namespace
 
-DemandLoading::DemandLoading(std::filesystem::path plugInsFolder) : mPlugInsFolder(std::move(plugInsFolder))
+DemandLoading::DemandLoading(std::filesystem::path plugInsFolder, const ApplicationRecords& records,
+                             DynamicLinker& linker)
+    : mPlugInsFolder(std::move(plugInsFolder)), mRecords(records), mLinker(linker)
 {
+}
+
+bool DemandLoading::load(const std::wstring& path) const
+{
+    return mLinker.loadModule(path.c_str(), kSayWhyNot, kResolveNow);
 }
 
 void DemandLoading::loadAtStart() const
 {
     // Asked before anything is loaded: what is loaded may write a record of its own.
     const auto plugIns = unrecordedPlugIns();
-    for (const auto& record : allApplicationRecords())
+    for (const auto& record : mRecords.all())
         if ((record.loadReasons & TSRX_LOAD_AT_HOST_START) != 0)
             load(record.module);
     for (const auto& plugIn : plugIns)
@@ -77,7 +72,7 @@ void DemandLoading::loadAtStart() const
 std::vector<std::filesystem::path> DemandLoading::unrecordedPlugIns() const
 {
     std::set<std::filesystem::path> recorded;
-    for (const auto& record : allApplicationRecords())
+    for (const auto& record : mRecords.all())
         recorded.insert(resolved(toUtf8(record.module)));
     std::vector<std::filesystem::path> result;
     std::error_code failed; // without a PlugIns folder there are no plug-ins
@@ -89,9 +84,15 @@ std::vector<std::filesystem::path> DemandLoading::unrecordedPlugIns() const
     return result;
 }
 
+bool DemandLoading::isDue(const ApplicationRecord& record, std::wstring_view command) const
+{
+    return (record.loadReasons & TSRX_LOAD_ON_COMMAND) != 0 && lists(record, command) &&
+           !mLinker.isModuleLoaded(record.module.c_str());
+}
+
 bool DemandLoading::loadForCommand(std::wstring_view name) const
 {
-    const auto records = allApplicationRecords();
+    const auto records = mRecords.all();
     return std::ranges::any_of(records, [&](const ApplicationRecord& record)
                                { return isDue(record, name) && load(record.module); });
 }

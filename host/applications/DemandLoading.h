@@ -10,10 +10,15 @@
 
 namespace tessel
 {
+class ApplicationRecords;
+class DynamicLinker;
+struct ApplicationRecord;
+
 class DemandLoading
 {
 public:
-    explicit DemandLoading(std::filesystem::path plugInsFolder);
+    DemandLoading(std::filesystem::path plugInsFolder, const ApplicationRecords& records,
+                  DynamicLinker& linker);
 
     // Loads what is due at the start: by the records, in their order, then from the PlugIns folder, by name.
     // What cannot be loaded is explained on the command line, and the start goes on.
@@ -28,6 +33,11 @@ public:
 private:
     std::vector<std::filesystem::path> unrecordedPlugIns() const;
 
+    bool load(const std::wstring& path) const;
+    bool isDue(const ApplicationRecord& record, std::wstring_view command) const;
+
     std::filesystem::path mPlugInsFolder;
+    const ApplicationRecords& mRecords;
+    DynamicLinker& mLinker;
 };
 } // namespace tessel

@@ -1,6 +1,6 @@
 #include "host/applications/Document.h"
 
-#include "host/Services.h"
+#include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -25,5 +25,5 @@ const wchar_t* Document::loadedApplicationName(int index) const
 
 TsApDocument* curDoc()
 {
-    return tessel::services().document;
+    return tessel::running<tessel::Document>();
 }

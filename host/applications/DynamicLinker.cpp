@@ -6,7 +6,6 @@
 #include <ranges>
 #include <utility>
 
-#include "host/Services.h"
 #include "host/applications/ImageCheck.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
@@ -52,11 +51,6 @@ std::wstring nameIn(const std::wstring& path)
     return path.substr(path.rfind(kSeparator) + 1);
 }
 
-void say(const std::wstring& path, const wchar_t* whatFailed, const std::wstring& whyNot)
-{
-    services().commandLine->say(L"The application \"" + path + L"\" " + whatFailed + whyNot + L".");
-}
-
 Result<> checkLoadable(const RegularFile& program)
 {
     if (!program.opened())
@@ -83,6 +77,12 @@ RegularFile programOf(const Result<ModuleFile>& file)
 }
 } // namespace
 
+DynamicLinker::DynamicLinker(CommandLine& commandLine, CallingApplication& calls, CommandStack& commands,
+                             MessageBox& messageBox)
+    : mCommandLine(commandLine), mCalls(calls), mCommands(commands), mMessageBox(messageBox)
+{
+}
+
 bool DynamicLinker::registerApplication(void* application)
 {
     Module* module = mModules.withHandle(application);
@@ -97,8 +97,7 @@ bool DynamicLinker::loadModule(const wchar_t* path, bool sayWhyNot, bool resolve
     const auto loaded = load(fullPath, resolveNow);
     if (loaded)
         return true;
-    if (auto* box = services().messageBox)
-        box->explain(fullPath, loaded.sentence() + L".");
+    mMessageBox.explain(fullPath, loaded.sentence() + L".");
     if (sayWhyNot)
         say(fullPath, L"is not loaded: ", loaded.sentence());
     return false;
@@ -151,7 +150,7 @@ Result<> DynamicLinker::start(Module& module)
 
 Result<> DynamicLinker::send(Module& module, unsigned message) const
 {
-    const CallingApplication::Scope calling(*services().callingApplication, module.path);
+    const CallingApplication::Scope calling(mCalls, module.path);
     constexpr wchar_t kThrew[] = L"its entry point threw an exception: ";
     int answer = TSRX_RET_OK;
     try
@@ -187,6 +186,11 @@ bool DynamicLinker::unloadModule(const wchar_t* path, bool sayWhyNot)
     return true;
 }
 
+void DynamicLinker::say(const std::wstring& path, const wchar_t* whatFailed, const std::wstring& whyNot) const
+{
+    mCommandLine.say(L"The application \"" + path + L"\" " + whatFailed + whyNot + L".");
+}
+
 // Message 2, to one that may go.
 Result<> DynamicLinker::unload(Module* module)
 {
@@ -200,7 +204,7 @@ Result<> DynamicLinker::checkFreeToGo(const Module* module) const
         return Failure{L"it is not loaded"};
     if (module->locked)
         return Failure{L"it is locked"};
-    if (services().callingApplication->isAtWork(module->path))
+    if (mCalls.isAtWork(module->path))
         return Failure{L"it is at work"};
     return {};
 }
@@ -208,7 +212,7 @@ Result<> DynamicLinker::checkFreeToGo(const Module* module) const
 // False when the system keeps the library mapped.
 bool DynamicLinker::takeOut(Module& module)
 {
-    services().commands->removeCommandsOf(module.path);
+    mCommands.removeCommandsOf(module.path);
     const bool closed = module.library->close();
     mModules.remove(module);
     return closed;
@@ -271,7 +275,7 @@ void DynamicLinker::unloadAll()
         Module& last = *mModules.inService().back();
         if (const auto ended = send(last, TSRX_MSG_UNLOAD); !ended)
             say(last.path, L"did not end as it should: ", ended.sentence());
-        services().commands->removeCommandsOf(last.path);
+        mCommands.removeCommandsOf(last.path);
         mModules.remove(last);
     }
 }

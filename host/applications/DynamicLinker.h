@@ -20,6 +20,11 @@
 
 namespace tessel
 {
+class CallingApplication;
+class CommandLine;
+class CommandStack;
+class MessageBox;
+
 class DynamicLinker : public TsRxDynamicLinker
 {
 public:
@@ -29,6 +34,11 @@ public:
         std::wstring name; // the file name with its extension
         bool locked = false;
     };
+
+    // Says on the command line why something failed, tells `calls` whose entry point runs, takes the commands
+    // of what goes out of `commands`, and gives the message box its detail.
+    DynamicLinker(CommandLine& commandLine, CallingApplication& calls, CommandStack& commands,
+                  MessageBox& messageBox);
 
     bool registerApplication(void* application) override;
     bool loadModule(const wchar_t* path, bool sayWhyNot, bool resolveNow) override;
@@ -59,10 +69,15 @@ private:
     Result<> checkFreeToGo(const Module* module) const;
     Result<> send(Module& module, unsigned message) const;
 
+    void say(const std::wstring& path, const wchar_t* whatFailed, const std::wstring& whyNot) const;
     bool takeOut(Module& module);
     Module* find(const wchar_t* path) const;
     Module* known(const std::wstring& realPath, const RegularFile& program) const;
 
+    CommandLine& mCommandLine;
+    CallingApplication& mCalls;
+    CommandStack& mCommands;
+    MessageBox& mMessageBox;
     LoadedModules mModules;
     bool mEnding = false;
 };

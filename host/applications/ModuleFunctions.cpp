@@ -4,8 +4,8 @@
 
 #include <tessel/tsed.h>
 
-#include "host/Services.h"
 #include "host/applications/DynamicLinker.h"
+#include "host/text/Running.h"
 
 namespace
 {
@@ -17,7 +17,7 @@ TsResultBuffer* tsedQmbLoaded()
 {
     TsResultBuffer* list = nullptr;
     TsResultBuffer** end = &list;
-    const auto* linker = tessel::services().linker;
+    const auto* linker = tessel::running<tessel::DynamicLinker>();
     if (!linker)
         return nullptr;
     for (const auto& module : linker->loadedModules())
@@ -30,7 +30,7 @@ TsResultBuffer* tsedQmbLoaded()
 
 int tsedGetModuleFileName(const wchar_t* moduleName, wchar_t* path, std::size_t capacity)
 {
-    const auto* linker = tessel::services().linker;
+    const auto* linker = tessel::running<tessel::DynamicLinker>();
     if (!linker || !moduleName || !path)
         return kNotFound;
     const std::wstring found = linker->pathOfModule(moduleName);

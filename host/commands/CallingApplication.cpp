@@ -4,7 +4,7 @@
 
 #include <tessel/tsed.h>
 
-#include "host/Services.h"
+#include "host/text/Running.h"
 
 namespace tessel
 {
@@ -22,6 +22,6 @@ bool CallingApplication::isAtWork(std::wstring_view path) const
 
 const wchar_t* tsedGetAppName()
 {
-    const auto* calls = tessel::services().callingApplication;
+    const auto* calls = tessel::running<tessel::CallingApplication>();
     return calls ? calls->path().c_str() : L"";
 }

@@ -4,7 +4,6 @@
 #include <cwctype>
 #include <exception>
 
-#include "host/Services.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/Command.h"
 #include "host/text/CommandLine.h"
@@ -58,7 +57,7 @@ Failure failed(const std::wstring& name, const std::wstring& reason)
 }
 
 // What runs here may come from anybody's application: whatever it throws ends with the command.
-Result<> call(const TsEdCommand& command, const CommandStack::Arguments& arguments)
+Result<> call(const TsEdCommand& command, const CommandStack::Arguments& arguments, CallingApplication& calls)
 {
     try
     {
@@ -66,7 +65,7 @@ Result<> call(const TsEdCommand& command, const CommandStack::Arguments& argumen
             return command.builtIn(arguments);
         if (!arguments.empty())
             return failed(command.localName, L"it takes no arguments.");
-        const CallingApplication::Scope calling(*services().callingApplication, command.owner);
+        const CallingApplication::Scope calling(calls, command.owner);
         command.handler();
         return {};
     }
@@ -81,7 +80,11 @@ Result<> call(const TsEdCommand& command, const CommandStack::Arguments& argumen
 }
 } // namespace
 
-CommandStack::CommandStack() = default;
+CommandStack::CommandStack(CommandLine& commandLine, CallingApplication& calls)
+    : mCommandLine(commandLine), mCalls(calls)
+{
+}
+
 CommandStack::~CommandStack() = default;
 
 void CommandStack::setLoader(Loader loader)
@@ -119,7 +122,7 @@ int CommandStack::addCommand(const wchar_t* group, const wchar_t* globalName, co
     added->group = group;
     added->globalName = globalName;
     added->localName = localName;
-    added->owner = services().callingApplication->path();
+    added->owner = mCalls.path();
     added->handler = handler;
     if (command)
         *command = added.get();
@@ -152,7 +155,7 @@ bool CommandStack::run(std::wstring_view line)
     const Arguments parts = splitLine(line);
     if (parts.empty())
         return true;
-    const bool done = services().commandLine->tell(runParts(parts));
+    const bool done = mCommandLine.tell(runParts(parts));
     const bool finished = !mAfterLine || mAfterLine();
     return done && finished;
 }
@@ -161,7 +164,7 @@ Result<> CommandStack::runParts(const Arguments& parts) const
 {
     // Kept alive here: the handler may unload the application and so remove its own command.
     if (const Command command = findOrLoad(parts.front()))
-        return call(*command, Arguments(parts.begin() + 1, parts.end()));
+        return call(*command, Arguments(parts.begin() + 1, parts.end()), mCalls);
     return Failure{L"Unknown command \"" + parts.front() + L"\". Type HELP for the list of commands."};
 }
 

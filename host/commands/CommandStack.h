@@ -14,6 +14,9 @@
 
 namespace tessel
 {
+class CallingApplication;
+class CommandLine;
+
 class CommandStack : public TsEdCommandStack
 {
 public:
@@ -36,7 +39,8 @@ public:
     // Called at the end of every line that ran, whatever came of it; false makes the line one that failed.
     using AfterLine = std::function<bool()>;
 
-    CommandStack();
+    // Says on the command line what became of a line, and tells `calls` whose command runs.
+    CommandStack(CommandLine& commandLine, CallingApplication& calls);
     ~CommandStack() override;
 
     void setLoader(Loader loader);
@@ -78,6 +82,8 @@ private:
     Result<> runParts(const Arguments& parts) const;
     std::size_t removeIf(const std::function<bool(const TsEdCommand&)>& goes);
 
+    CommandLine& mCommandLine;
+    CallingApplication& mCalls;
     std::vector<Command> mCommands;
     Loader mLoader;
     AfterLine mAfterLine;

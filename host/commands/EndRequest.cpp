@@ -7,7 +7,7 @@
 
 #include <tessel/tssession.h>
 
-#include "host/Services.h"
+#include "host/text/Running.h"
 
 namespace tessel
 {
@@ -40,6 +40,6 @@ void EndRequest::make() noexcept
 
 int tsrxEndRequest()
 {
-    const auto* request = tessel::services().endRequest;
+    const auto* request = tessel::running<tessel::EndRequest>();
     return request ? request->descriptor() : -1;
 }

@@ -7,8 +7,8 @@
 #include <string_view>
 #include <system_error>
 
-#include "host/Services.h"
 #include "host/registry/SystemVariables.h"
+#include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -32,7 +32,8 @@ std::optional<std::filesystem::path> absolutePath(const std::filesystem::path& p
 }
 } // namespace
 
-FileSearch::FileSearch(std::filesystem::path hostFolder) : mHostFolder(std::move(hostFolder))
+FileSearch::FileSearch(std::filesystem::path hostFolder, const SystemVariables& variables)
+    : mHostFolder(std::move(hostFolder)), mVariables(variables)
 {
 }
 
@@ -40,7 +41,7 @@ std::vector<std::filesystem::path> FileSearch::folders() const
 {
     std::error_code gone; // a current folder that was removed is passed over
     std::vector<std::filesystem::path> folders = {std::filesystem::current_path(gone), mHostFolder};
-    const std::string listed = services().variables ? toUtf8(services().variables->text(kSearchPath)) : "";
+    const std::string listed = toUtf8(mVariables.text(kSearchPath));
     std::string_view rest = listed;
     while (!rest.empty())
     {
@@ -67,7 +68,7 @@ std::optional<std::filesystem::path> FileSearch::find(const std::filesystem::pat
 
 int tsedFindFile(const wchar_t* name, wchar_t* found, std::size_t capacity)
 {
-    const tessel::FileSearch* files = tessel::services().files;
+    const tessel::FileSearch* files = tessel::running<tessel::FileSearch>();
     if (!files || !name || !found)
         return TS_ERROR;
     const auto path = files->find(tessel::toUtf8(name));

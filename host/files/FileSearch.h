@@ -7,11 +7,13 @@
 
 namespace tessel
 {
+class SystemVariables;
+
 class FileSearch
 {
 public:
-    // `hostFolder` is searched behind the current folder and before those of the variable SEARCHPATH.
-    explicit FileSearch(std::filesystem::path hostFolder);
+    // `hostFolder` is searched after the current folder and before those of the variable SEARCHPATH.
+    FileSearch(std::filesystem::path hostFolder, const SystemVariables& variables);
 
     // The full path of the first match. A full path is only checked for existence.
     std::optional<std::filesystem::path> find(const std::filesystem::path& name) const;
@@ -20,5 +22,6 @@ private:
     std::vector<std::filesystem::path> folders() const;
 
     std::filesystem::path mHostFolder;
+    const SystemVariables& mVariables;
 };
 } // namespace tessel

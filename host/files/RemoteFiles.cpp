@@ -11,8 +11,8 @@
 #include <optional>
 #include <system_error>
 
-#include "host/Services.h"
 #include "host/files/Download.h"
+#include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
 // The cache holds one folder per URL, named by its hash: the copy under the file's own name, so that its
@@ -34,7 +34,7 @@ std::uint64_t hashOf(const std::string& text)
     return hash;
 }
 
-// The first byte at or behind the position that begins a character.
+// The first byte at or after the position that begins a character.
 std::size_t firstCharacter(const std::string& utf8, std::size_t position)
 {
     while (position < utf8.size() && U8_IS_TRAIL(static_cast<std::uint8_t>(utf8[position])))
@@ -155,5 +155,5 @@ bool RemoteFiles::IsRemoteFile(const wchar_t* localPath, wchar_t* url, std::size
 
 CProxyInet* CProxyInet::GetProxyInet()
 {
-    return tessel::services().remote;
+    return tessel::running<tessel::RemoteFiles>();
 }

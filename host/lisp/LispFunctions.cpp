@@ -1,15 +1,17 @@
 // The functions of the SDK that concern Lisp.
 #include <tessel/tsed.h>
 
-#include "host/Services.h"
 #include "host/lisp/LispInterpreter.h"
+#include "host/text/Running.h"
 
-using tessel::services;
+using tessel::LispInterpreter;
+using tessel::running;
 
 int tsedInvoke(const TsResultBuffer* call, TsResultBuffer** result)
 {
     TsResultBuffer* values = nullptr;
-    const int status = services().lisp ? services().lisp->invoke(call, &values) : TS_ERROR;
+    auto* lisp = running<LispInterpreter>();
+    const int status = lisp ? lisp->invoke(call, &values) : TS_ERROR;
     if (result)
         *result = values;
     else
@@ -19,11 +21,13 @@ int tsedInvoke(const TsResultBuffer* call, TsResultBuffer** result)
 
 void qxr_queueexpr(const wchar_t* expression)
 {
-    if (services().lisp && expression)
-        services().lisp->queue(expression);
+    auto* lisp = running<LispInterpreter>();
+    if (lisp && expression)
+        lisp->queue(expression);
 }
 
 bool RemovingTsLISP()
 {
-    return services().removingTsLisp;
+    const auto* lisp = running<LispInterpreter>();
+    return !lisp || lisp->removingTsLisp();
 }

@@ -4,7 +4,6 @@
 
 #include <tessel/tsdefs.h>
 
-#include "host/Services.h"
 #include "host/applications/Document.h"
 #include "host/commands/EndRequest.h"
 #include "host/lisp/LispMachine.h"
@@ -14,36 +13,37 @@ namespace tessel
 {
 namespace
 {
-LispSurroundings surroundings(const LispInterpreter::Options& options)
+LispSurroundings surroundings(const LispInterpreter::Options& options, CommandLine& commandLine,
+                              Document& document)
 {
     return {.removingTsLisp = options.removingTsLisp,
             .heapBytes = options.heapBytes != 0 ? options.heapBytes : kLispHeapBytes,
-            .write = [](std::wstring_view text) { services().commandLine->print(text); },
-            .column = [] { return services().commandLine->openLine().size(); },
+            .write = [&commandLine](std::wstring_view text) { commandLine.print(text); },
+            .column = [&commandLine] { return commandLine.openLine().size(); },
             .fileLoaded =
-                [](const std::wstring& path)
+                [&document](const std::wstring& path)
             {
-                if (services().document)
-                    services().document->add(path);
+                document.add(path);
             }};
-}
-
-bool isToEnd()
-{
-    return services().endRequest && services().endRequest->isMade();
 }
 } // namespace
 
-LispInterpreter::LispInterpreter(std::unique_ptr<LispMachine> machine) : mMachine(std::move(machine))
+LispInterpreter::LispInterpreter(std::unique_ptr<LispMachine> machine, bool removingTsLisp,
+                                 CommandLine& commandLine, const EndRequest& endRequest)
+    : mMachine(std::move(machine)), mRemovingTsLisp(removingTsLisp), mCommandLine(commandLine),
+      mEndRequest(endRequest)
 {
 }
 
-Result<std::unique_ptr<LispInterpreter>> LispInterpreter::start(const Options& options)
+Result<std::unique_ptr<LispInterpreter>> LispInterpreter::start(const Options& options,
+                                                                CommandLine& commandLine, Document& document,
+                                                                const EndRequest& endRequest)
 {
-    auto machine = LispMachine::start(surroundings(options));
+    auto machine = LispMachine::start(surroundings(options, commandLine, document));
     if (!machine)
         return machine.failure();
-    return std::unique_ptr<LispInterpreter>(new LispInterpreter(*std::move(machine)));
+    return std::unique_ptr<LispInterpreter>(
+        new LispInterpreter(*std::move(machine), options.removingTsLisp, commandLine, endRequest));
 }
 
 LispInterpreter::~LispInterpreter() = default;
@@ -64,11 +64,11 @@ bool LispInterpreter::runQueue()
         return true;
     mRunningQueue = true;
     bool allRan = true;
-    while (!mQueue.empty() && !isToEnd())
+    while (!mQueue.empty() && !mEndRequest.isMade())
     {
         const std::wstring expression = std::move(mQueue.front());
         mQueue.pop_front();
-        allRan = services().commandLine->tell(evaluate(expression)) && allRan;
+        allRan = mCommandLine.tell(evaluate(expression)) && allRan;
     }
     mRunningQueue = false;
     return allRan;
@@ -83,7 +83,7 @@ int LispInterpreter::invoke(const TsResultBuffer* call, TsResultBuffer** result)
 {
     const auto values = mMachine->call(call);
     *result = values ? *values : nullptr;
-    return services().commandLine->tell(values) ? TS_NORMAL : TS_ERROR;
+    return mCommandLine.tell(values) ? TS_NORMAL : TS_ERROR;
 }
 
 void LispInterpreter::interrupt() noexcept

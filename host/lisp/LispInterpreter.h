@@ -1,6 +1,4 @@
 // The host's Lisp, as its users and applications know it: typed expressions, the queue, called functions.
-//
-// Uses the command line and the document of `services()` when it runs.
 #pragma once
 
 #include <cstddef>
@@ -10,11 +8,15 @@
 #include <string_view>
 
 #include "host/text/Result.h"
+#include "host/text/Running.h"
 
 struct TsResultBuffer;
 
 namespace tessel
 {
+class CommandLine;
+class Document;
+class EndRequest;
 class LispMachine;
 
 class LispInterpreter
@@ -22,13 +24,17 @@ class LispInterpreter
 public:
     struct Options
     {
-        bool removingTsLisp = true; // as `services().removingTsLisp`
+        bool removingTsLisp = true; // compiled and packaged Lisp can be loaded
         std::size_t heapBytes = 0;  // memory for Lisp's objects; 0: as much as is usual
     };
 
     // Starts Lisp, on the thread on which everything but `interrupt` is to be called. A later interpreter in
-    // the same process finds none of an earlier one's definitions. One at a time.
-    static Result<std::unique_ptr<LispInterpreter>> start(const Options& options);
+    // the same process finds none of an earlier one's definitions. One at a time, and so the running one.
+    //
+    // What Lisp prints and what is said of errors goes to the command line, what it has loaded into the
+    // document. When the end is requested the queue stops.
+    static Result<std::unique_ptr<LispInterpreter>> start(const Options& options, CommandLine& commandLine,
+                                                          Document& document, const EndRequest& endRequest);
     ~LispInterpreter();
     LispInterpreter(const LispInterpreter&) = delete;
     LispInterpreter& operator=(const LispInterpreter&) = delete;
@@ -36,6 +42,8 @@ public:
     // What a typed line does: every form is evaluated, the printed value is that of the last, empty when
     // there is none to show. What is said of a failure is one line of error text.
     Result<std::wstring> evaluate(std::wstring_view expressions);
+
+    bool removingTsLisp() const { return mRemovingTsLisp; }
 
     // Expressions for later, when the host is idle. Their values are not printed.
     void queue(std::wstring expression);
@@ -59,10 +67,15 @@ public:
     bool running() const noexcept;
 
 private:
-    explicit LispInterpreter(std::unique_ptr<LispMachine> machine);
+    LispInterpreter(std::unique_ptr<LispMachine> machine, bool removingTsLisp, CommandLine& commandLine,
+                    const EndRequest& endRequest);
 
     std::unique_ptr<LispMachine> mMachine;
+    bool mRemovingTsLisp;
+    CommandLine& mCommandLine;
+    const EndRequest& mEndRequest;
     std::deque<std::wstring> mQueue;
     bool mRunningQueue = false;
+    Published<LispInterpreter> mPublished{*this};
 };
 } // namespace tessel

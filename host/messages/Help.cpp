@@ -4,8 +4,8 @@
 
 #include <tessel/tsed.h>
 
-#include "host/Services.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -44,10 +44,10 @@ Result<std::wstring> Help::show(const std::wstring& topic, const std::filesystem
 
 bool tsedHelp(const wchar_t* file, const wchar_t* topic, int)
 {
-    auto* help = tessel::services().help;
+    auto* help = tessel::running<tessel::Help>();
     if (!help)
         return false;
-    tessel::CommandLine& commandLine = *tessel::services().commandLine;
+    tessel::CommandLine& commandLine = *tessel::running<tessel::CommandLine>();
     const auto shown = help->show(topic ? topic : L"", file ? tessel::toUtf8(file) : "");
     if (shown)
         commandLine.say(*shown);

@@ -4,8 +4,8 @@
 #include <cwctype>
 #include <utility>
 
-#include "host/Services.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Running.h"
 
 namespace tessel
 {
@@ -25,6 +25,10 @@ std::wstring asSentence(std::wstring text)
     return text;
 }
 } // namespace
+
+MessageBox::MessageBox(CommandLine& commandLine) : mCommandLine(commandLine)
+{
+}
 
 void MessageBox::setPresenter(Presenter presenter)
 {
@@ -51,15 +55,16 @@ int MessageBox::show(const wchar_t* text, unsigned style, void* parent)
     const std::wstring detail = takeDetailFor(message);
     if (const int answer = mPresenter ? mPresenter({message, detail, style, parent}) : 0)
         return answer;
-    if (auto* commandLine = services().commandLine)
-        commandLine->say(L"Message: " + message);
+    mCommandLine.say(L"Message: " + message);
     return IDOK; // every style begins with the button OK
 }
 } // namespace tessel
 
 VqHostMessageBox* VqHostMessageBox::simple()
 {
-    static tessel::MessageBox withoutHost; // never null, not even while the host starts or ends
-    auto* running = tessel::services().messageBox;
+    // Never null, not even while the host starts or ends.
+    static tessel::CommandLine nowhere([](std::string_view) {});
+    static tessel::MessageBox withoutHost(nowhere);
+    auto* running = tessel::running<tessel::MessageBox>();
     return running ? running : &withoutHost;
 }

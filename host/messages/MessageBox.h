@@ -8,6 +8,8 @@
 
 namespace tessel
 {
+class CommandLine;
+
 class MessageBox : public VqHostMessageBox
 {
 public:
@@ -21,6 +23,8 @@ public:
 
     // Shows a box and answers the button's code, or 0 when it cannot. Must not throw.
     using Presenter = std::function<int(const Box& box)>;
+
+    explicit MessageBox(CommandLine& commandLine);
 
     // From now on boxes are shown by the presenter, and as text where it cannot; an empty one brings the
     // text back.
@@ -36,6 +40,7 @@ public:
 private:
     std::wstring takeDetailFor(const std::wstring& text);
 
+    CommandLine& mCommandLine;
     Presenter mPresenter;
     std::wstring mExplainedPath;
     std::wstring mWhy;

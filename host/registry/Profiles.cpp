@@ -1,8 +1,5 @@
 #include "host/registry/Profiles.h"
 
-#include <tessel/tshostservices.h>
-
-#include "host/Services.h"
 #include "host/registry/Registry.h"
 
 namespace tessel
@@ -10,12 +7,8 @@ namespace tessel
 namespace
 {
 constexpr wchar_t kCurrentProfileValue[] = L""; // the unnamed value of the key that holds the profiles
+constexpr wchar_t kFirstProfile[] = L"Default";
 constexpr std::size_t kLongestName = 255;
-
-std::wstring profilesKey()
-{
-    return std::wstring(tsdbHostApplicationServices()->productRegistryRoot()) + L"\\Profiles";
-}
 
 bool isProfileName(const std::wstring& name)
 {
@@ -23,16 +16,24 @@ bool isProfileName(const std::wstring& name)
 }
 } // namespace
 
-std::wstring currentProfile()
+Profiles::Profiles(Registry& registry, const std::wstring& productRoot)
+    : mRegistry(registry), mKey(productRoot + L"\\Profiles")
 {
-    return services().registry->read(profilesKey(), kCurrentProfileValue).value_or(L"");
+    if (!mRegistry.read(mKey, kCurrentProfileValue))
+        // What is wrong is told by `canStore`.
+        static_cast<void>(mRegistry.write(mKey, kCurrentProfileValue, kFirstProfile));
 }
 
-Result<> setCurrentProfile(const std::wstring& name)
+std::wstring Profiles::current() const
+{
+    return mRegistry.read(mKey, kCurrentProfileValue).value_or(L"");
+}
+
+Result<> Profiles::setCurrent(const std::wstring& name)
 {
     if (!isProfileName(name))
         return Failure{L"\"" + name + L"\" cannot be the name of a profile."};
-    if (!services().registry->write(profilesKey(), kCurrentProfileValue, name))
+    if (!mRegistry.write(mKey, kCurrentProfileValue, name))
         return Failure{L"The profile cannot be changed to \"" + name +
                        L"\": the registry cannot be written."};
     return {};

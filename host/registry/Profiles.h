@@ -8,10 +8,23 @@
 
 namespace tessel
 {
-// The current profile's name; empty when the registry cannot be read.
-std::wstring currentProfile();
+class Registry;
 
-// Makes a profile the current one; one that is new begins empty. Fails when the name cannot be that of a key
-// or the registry cannot be written.
-Result<> setCurrentProfile(const std::wstring& name);
+class Profiles
+{
+public:
+    // Gives a new registry its first profile, "Default", unless a current profile is set already.
+    Profiles(Registry& registry, const std::wstring& productRoot);
+
+    // The current profile's name; empty when the registry cannot be read.
+    std::wstring current() const;
+
+    // Makes a profile the current one; one that is new begins empty. Fails when the name cannot be that of a
+    // key or the registry cannot be written.
+    Result<> setCurrent(const std::wstring& name);
+
+private:
+    Registry& mRegistry;
+    std::wstring mKey;
+};
 } // namespace tessel

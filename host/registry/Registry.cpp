@@ -36,7 +36,8 @@ Failure noMoreValues()
 }
 } // namespace
 
-Registry::Registry(std::filesystem::path file) : mFile(std::move(file)), mNextHandle(kFirstHandle)
+Registry::Registry(std::filesystem::path file, std::chrono::milliseconds busyTimeout)
+    : mFile(std::move(file)), mBusyTimeout(busyTimeout), mNextHandle(kFirstHandle)
 {
     open();
 }
@@ -342,12 +343,5 @@ std::optional<Registry::Key> Registry::keyOf(HKEY handle) const
 bool Registry::closeHandle(HKEY handle)
 {
     return handle == HKEY_CURRENT_USER || mHandles.erase(handle) > 0;
-}
-
-void ensureCurrentProfile(Registry& registry, std::wstring_view productRoot)
-{
-    const std::wstring profiles = std::wstring(productRoot) + L"\\Profiles";
-    if (!registry.read(profiles, L""))
-        static_cast<void>(registry.write(profiles, L"", L"Default")); // what is wrong is told by `canStore`
 }
 } // namespace tessel

@@ -14,6 +14,7 @@
 
 #include <wincompat/winreg.h>
 
+#include <chrono>
 #include <cstdint>
 #include <filesystem>
 #include <memory>
@@ -36,6 +37,7 @@ public:
     using Key = std::int64_t;
     static constexpr Key kNoKey = 0;
     static constexpr Key kRoot = 1; // HKEY_CURRENT_USER
+    static constexpr std::chrono::milliseconds kBusyTimeout{5000};
 
     struct Value
     {
@@ -45,7 +47,8 @@ public:
 
     // Opens the file or makes it. A file that cannot be used is left as it is: reads then find nothing and
     // writes fail. A file marked read-only is only read.
-    explicit Registry(std::filesystem::path file);
+    // A write waits that long for another process that is writing, and then fails.
+    explicit Registry(std::filesystem::path file, std::chrono::milliseconds busyTimeout = kBusyTimeout);
     ~Registry();
     Registry(const Registry&) = delete;
     Registry& operator=(const Registry&) = delete;
@@ -112,6 +115,7 @@ private:
     void closeHandlesOfLostKeys();
 
     std::filesystem::path mFile;
+    std::chrono::milliseconds mBusyTimeout;
     Result<> mCanStore;
     sqlite3* mDatabase = nullptr;
     bool mReadOnly = false;
@@ -124,7 +128,4 @@ private:
     std::unordered_map<HKEY, Key> mHandles;
     std::uintptr_t mNextHandle;
 };
-
-// Gives a new registry its first profile, "Default", unless a current profile is set already.
-void ensureCurrentProfile(Registry& registry, std::wstring_view productRoot);
 } // namespace tessel

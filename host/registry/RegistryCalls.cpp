@@ -5,9 +5,9 @@
 #include <cstring>
 #include <cwchar>
 
-#include "host/Services.h"
 #include "host/registry/Registry.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Running.h"
 
 using tessel::Registry;
 
@@ -24,7 +24,7 @@ struct Target
 
 Target targetOf(HKEY handle)
 {
-    Registry* registry = tessel::services().registry;
+    Registry* registry = tessel::running<Registry>();
     const auto key = registry ? registry->keyOf(handle) : std::nullopt;
     return key ? Target{registry, *key} : Target{};
 }
@@ -36,7 +36,7 @@ const wchar_t* orEmpty(const wchar_t* text)
 
 void tellOf(const tessel::Result<>& stored)
 {
-    if (auto* commandLine = tessel::services().commandLine)
+    if (auto* commandLine = tessel::running<tessel::CommandLine>())
         commandLine->tell(stored);
 }
 
@@ -140,7 +140,7 @@ LONG tsudRegSetString(HKEY key, const wchar_t* name, const wchar_t* data)
 
 void tsrxBeforeWaiting(bool actionIsOver)
 {
-    Registry* registry = tessel::services().registry;
+    Registry* registry = tessel::running<Registry>();
     if (!registry)
         return;
     if (actionIsOver)

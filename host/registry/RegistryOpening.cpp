@@ -12,7 +12,6 @@ namespace tessel
 {
 namespace
 {
-constexpr int kBusyMilliseconds = 5000;
 constexpr int kSchemaVersion = 1;
 constexpr const char* kAskVersion = "PRAGMA user_version";
 
@@ -119,7 +118,7 @@ Result<> Registry::openFile()
         status = sqlite3_open_v2(fixedFile(mFile).c_str(), &mDatabase, kReadUri, nullptr);
     }
     if (status == SQLITE_OK)
-        status = sqlite3_busy_timeout(mDatabase, kBusyMilliseconds);
+        status = sqlite3_busy_timeout(mDatabase, static_cast<int>(mBusyTimeout.count()));
     return status == SQLITE_OK ? Result<>() : storeFailure(mDatabase, status);
 }
 

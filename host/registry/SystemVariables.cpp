@@ -1,27 +1,20 @@
 #include "host/registry/SystemVariables.h"
 
 #include <tessel/tsed.h>
-#include <tessel/tshostservices.h>
 
 #include <algorithm>
 #include <charconv>
 #include <cwchar>
 #include <optional>
 
-#include "host/Services.h"
 #include "host/registry/Registry.h"
+#include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
 {
 namespace
 {
-std::wstring storageKey()
-{
-    const TsDbHostApplicationServices* application = tsdbHostApplicationServices();
-    return (application ? application->productRegistryRoot() : L"") + std::wstring(L"\\Variables");
-}
-
 std::vector<SystemVariables::Variable> hostVariables()
 {
     using Storage = SystemVariables::Storage;
@@ -65,20 +58,21 @@ std::wstring rangeSentence(const SystemVariables::Variable& variable)
 }
 } // namespace
 
-SystemVariables::SystemVariables() : mVariables(hostVariables())
+SystemVariables::SystemVariables(Registry* registry, const std::wstring& productRoot)
+    : mRegistry(registry), mStorageKey(productRoot + L"\\Variables"), mVariables(hostVariables())
 {
     readStored();
 }
 
 void SystemVariables::readStored()
 {
-    if (!services().registry)
+    if (!mRegistry)
         return;
     for (Variable& variable : mVariables)
     {
         if (variable.storage != Storage::kStored)
             continue;
-        const auto stored = services().registry->read(storageKey(), variable.name);
+        const auto stored = mRegistry->read(mStorageKey, variable.name);
         if (const auto value = stored ? parseFor(variable, *stored) : std::nullopt)
             variable.value = *value;
     }
@@ -104,8 +98,8 @@ Result<> SystemVariables::set(std::wstring_view name, std::wstring_view text)
         return Failure{rangeSentence(*found)};
     Variable& variable = mVariables[static_cast<std::size_t>(found - mVariables.data())];
     variable.value = *value;
-    const bool store = variable.storage == Storage::kStored && services().registry;
-    if (store && !services().registry->write(storageKey(), variable.name, toText(variable.value)))
+    const bool store = variable.storage == Storage::kStored && mRegistry;
+    if (store && !mRegistry->write(mStorageKey, variable.name, toText(variable.value)))
         return Failure{variable.name + L" is set for this session only: the registry cannot be written."};
     return {};
 }
@@ -133,7 +127,7 @@ std::wstring toText(const SystemVariables::Value& value)
 
 int tsedGetVar(const wchar_t* name, TsResultBuffer* result)
 {
-    const tessel::SystemVariables* variables = tessel::services().variables;
+    const tessel::SystemVariables* variables = tessel::running<tessel::SystemVariables>();
     const auto* variable = variables && name ? variables->find(name) : nullptr;
     if (!variable || !result)
         return TS_ERROR;

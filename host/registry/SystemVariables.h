@@ -11,6 +11,8 @@
 
 namespace tessel
 {
+class Registry;
+
 class SystemVariables
 {
 public:
@@ -18,7 +20,7 @@ public:
 
     enum class Storage
     {
-        kSession, // starts anew with the host
+        kSession, // starts again with the host
         kStored,  // kept in the registry
         kReadOnly
     };
@@ -33,9 +35,9 @@ public:
         std::wstring purpose; // one line
     };
 
-    // The host's own variables, stored ones as the registry has them. A stored value that does not fit is
-    // passed over.
-    SystemVariables();
+    // The host's own variables, stored ones as the registry has them below the product's root. A stored value
+    // that does not fit is passed over. Without a registry nothing is stored.
+    SystemVariables(Registry* registry, const std::wstring& productRoot);
 
     const std::vector<Variable>& all() const { return mVariables; }
 
@@ -51,6 +53,8 @@ public:
 private:
     void readStored();
 
+    Registry* mRegistry;
+    std::wstring mStorageKey;
     std::vector<Variable> mVariables;
 };
 

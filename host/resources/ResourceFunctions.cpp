@@ -4,40 +4,40 @@
 
 #include <wincompat/winres.h>
 
-#include "host/Services.h"
 #include "host/resources/ResourceModules.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Running.h"
 
 HMODULE LoadLibrary(const wchar_t* name)
 {
-    auto* modules = tessel::services().resources;
+    auto* modules = tessel::running<tessel::ResourceModules>();
     if (!modules)
         return nullptr;
     const auto module = modules->open(name);
-    return tessel::services().commandLine->tell(module) ? *module : nullptr;
+    return tessel::running<tessel::CommandLine>()->tell(module) ? *module : nullptr;
 }
 
 int FreeLibrary(HMODULE module)
 {
-    auto* modules = tessel::services().resources;
+    auto* modules = tessel::running<tessel::ResourceModules>();
     return modules && modules->close(module) ? 1 : 0;
 }
 
 HMODULE AfxGetResourceHandle()
 {
-    const auto* modules = tessel::services().resources;
+    const auto* modules = tessel::running<tessel::ResourceModules>();
     return modules ? modules->current() : nullptr;
 }
 
 void AfxSetResourceHandle(HMODULE module)
 {
-    if (auto* modules = tessel::services().resources)
+    if (auto* modules = tessel::running<tessel::ResourceModules>())
         modules->setCurrent(module);
 }
 
 int loadStringFromWin32ResourceDLL(HMODULE module, unsigned id, wchar_t* buffer, int capacity)
 {
-    const auto* modules = tessel::services().resources;
+    const auto* modules = tessel::running<tessel::ResourceModules>();
     if (!buffer || capacity <= 0)
         return 0;
     const std::wstring text = modules ? modules->string(module, id) : std::wstring();

@@ -4,7 +4,6 @@
 #include <filesystem>
 #include <utility>
 
-#include "host/Services.h"
 #include "host/commands/CallingApplication.h"
 #include "host/platform/Bundle.h"
 #include "host/text/Unicode.h"
@@ -53,8 +52,8 @@ Failure notOpened(const std::wstring& name, const std::wstring& reason)
 }
 } // namespace
 
-ResourceModules::ResourceModules(std::wstring hostFolder)
-    : mHostFolder(std::move(hostFolder)), mLastHandle(kHandlesBegin)
+ResourceModules::ResourceModules(std::wstring hostFolder, const CallingApplication& calls)
+    : mHostFolder(std::move(hostFolder)), mCalls(calls), mLastHandle(kHandlesBegin)
 {
 }
 
@@ -63,7 +62,7 @@ std::vector<std::wstring> ResourceModules::placesOf(const std::wstring& name) co
     if (name.starts_with(kSeparator))
         return {name};
     std::vector<std::wstring> places;
-    for (std::wstring place : {resourcesOf(services().callingApplication->path()), mHostFolder})
+    for (std::wstring place : {resourcesOf(mCalls.path()), mHostFolder})
     {
         if (place.empty())
             continue;

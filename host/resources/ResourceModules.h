@@ -14,11 +14,13 @@
 
 namespace tessel
 {
+class CallingApplication;
+
 class ResourceModules
 {
 public:
     // `hostFolder`: where the host's own resources are.
-    explicit ResourceModules(std::wstring hostFolder);
+    ResourceModules(std::wstring hostFolder, const CallingApplication& calls);
 
     // Opens a module by its full path, or by a name looked for first in the resources of the application that
     // is being called (a bundle's; a plain library has its own folder) and then in the host's. A file that is
@@ -46,6 +48,7 @@ private:
     Result<HMODULE> openFile(const RegularFile& file);
 
     std::wstring mHostFolder;
+    const CallingApplication& mCalls;
     std::map<HMODULE, Entry> mEntries;
     std::uintptr_t mLastHandle;
     HMODULE mCurrent = nullptr;

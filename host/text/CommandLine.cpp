@@ -5,7 +5,7 @@
 
 #include <tessel/tsformat.h>
 
-#include "host/Services.h"
+#include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -46,7 +46,7 @@ int tsutPrintfArguments(const wchar_t* format, const TsFormatArgument* arguments
     const std::size_t length = tsutFormatArguments(nullptr, 0, format, arguments, count);
     std::vector<wchar_t> text(length + 1);
     tsutFormatArguments(text.data(), text.size(), format, arguments, count);
-    if (auto* commandLine = tessel::services().commandLine)
+    if (auto* commandLine = tessel::running<tessel::CommandLine>())
         commandLine->print({text.data(), length});
     return static_cast<int>(length);
 }

@@ -7,7 +7,7 @@
 #include "tests/host_app/HostParts.h"
 
 using tessel::CallingApplication;
-using tessel::services;
+using tessel::running;
 using tessel::splitLine;
 using testing::ElementsAre;
 using testing::HasSubstr;
@@ -25,7 +25,7 @@ std::wstring caller;
 void count()
 {
     ++calls;
-    caller = services().callingApplication->path();
+    caller = running<CallingApplication>()->path();
 }
 
 class Commands : public testing::Test
@@ -35,8 +35,6 @@ protected:
     {
         calls = 0;
         caller.clear();
-        services().callingApplication = &calling;
-        services().commands = &stack;
     }
 
     int add(const std::wstring& owner, const wchar_t* group, const wchar_t* global, const wchar_t* local,
@@ -49,7 +47,9 @@ protected:
 
     CapturedOutput output;
     CallingApplication calling;
-    tessel::CommandStack stack;
+    tessel::CommandStack stack{output.commandLine(), calling};
+    tessel::Published<CallingApplication> publishedCalling{calling};
+    tessel::Published<tessel::CommandStack> publishedStack{stack};
 };
 } // namespace
 
@@ -141,7 +141,7 @@ TEST_F(Commands, MayRemoveThemselvesWhileTheyRun)
     add(kFirst, L"DRAW", L"GO", L"GO",
         []
         {
-            services().commands->removeCommandsOf(kFirst);
+            running<tessel::CommandStack>()->removeCommandsOf(kFirst);
             ++calls;
         });
     EXPECT_TRUE(stack.run(L"GO"));

@@ -16,18 +16,17 @@ protected:
         folder.write("book/suite.html", "<p>Suite</p>");
         folder.write("book/index.html", "<p>Book</p>");
         folder.write("secret.html", "<p>not of the book</p>");
-        tessel::services().help = &help;
     }
 
     CapturedOutput output;
     TemporaryFolder folder;
     bool hasBrowser = false;
     std::filesystem::path shown;
-    tessel::Help help{folder / "book", [this](const auto& page)
-                      {
-                          shown = page;
-                          return hasBrowser;
-                      }};
+    tessel::Owned<tessel::Help> help{folder / "book", [this](const auto& page)
+                                     {
+                                         shown = page;
+                                         return hasBrowser;
+                                     }};
 };
 } // namespace
 

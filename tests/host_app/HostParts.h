@@ -3,25 +3,24 @@
 
 #include <string>
 
-#include "host/Services.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Running.h"
 
 class CapturedOutput
 {
 public:
-    CapturedOutput() { tessel::services().commandLine = &mCommandLine; }
-    ~CapturedOutput() { tessel::services() = {}; }
+    CapturedOutput() = default;
     CapturedOutput(const CapturedOutput&) = delete;
     CapturedOutput& operator=(const CapturedOutput&) = delete;
 
-    tessel::CommandLine& commandLine() { return mCommandLine; }
+    tessel::CommandLine& commandLine() { return *mCommandLine; }
     const std::string& text() const { return mText; }
     void clear() { mText.clear(); }
 
 private:
     std::string mText;
-    tessel::CommandLine mCommandLine{[this](std::string_view piece)
-                                     {
-                                         mText += piece;
-                                     }};
+    tessel::Owned<tessel::CommandLine> mCommandLine{[this](std::string_view piece)
+                                                    {
+                                                        mText += piece;
+                                                    }};
 };

@@ -8,8 +8,7 @@
 TEST(MessageBox, IsTextWithTheFirstButtonChosenWithoutADisplay)
 {
     CapturedOutput output;
-    tessel::MessageBox box;
-    tessel::services().messageBox = &box;
+    const tessel::Owned<tessel::MessageBox> box(output.commandLine());
     output.commandLine().print(L"Loading");
     EXPECT_EQ(VqHostMessageBox::simple()->show(L"100%s/größe.lsp is missing.", MB_ICONEXCLAMATION, nullptr),
               IDOK);
@@ -19,7 +18,7 @@ TEST(MessageBox, IsTextWithTheFirstButtonChosenWithoutADisplay)
 TEST(MessageBox, IsShownByThePresenterWhenThereIsOne)
 {
     CapturedOutput output;
-    tessel::MessageBox box;
+    tessel::MessageBox box(output.commandLine());
     std::wstring seen;
     unsigned seenStyle = 0;
     box.setPresenter(
@@ -41,7 +40,7 @@ TEST(MessageBox, IsShownByThePresenterWhenThereIsOne)
 TEST(MessageBox, IsTextWhereThePresenterCannotShowIt)
 {
     CapturedOutput output;
-    tessel::MessageBox box;
+    tessel::MessageBox box(output.commandLine());
     box.setPresenter([](const tessel::MessageBox::Box&) { return 0; });
     EXPECT_EQ(box.show(L"text", MB_OK, nullptr), IDOK);
     EXPECT_EQ(output.text(), "Message: text\n");
@@ -50,7 +49,7 @@ TEST(MessageBox, IsTextWhereThePresenterCannotShowIt)
 TEST(MessageBox, SaysInItsDetailWhatIsKnownOfTheFileThatItNames)
 {
     CapturedOutput output;
-    tessel::MessageBox box;
+    tessel::MessageBox box(output.commandLine());
     std::vector<std::wstring> details;
     box.setPresenter(
         [&](const tessel::MessageBox::Box& shown)
@@ -89,7 +88,7 @@ TEST(MessageBox, BeginsItsDetailWithACapitalUnlessThatIsAName)
 TEST(MessageBox, LeavesTheDetailToTheCommandLineWithoutADisplay)
 {
     CapturedOutput output;
-    tessel::MessageBox box;
+    tessel::MessageBox box(output.commandLine());
     box.explain(L"/a/tool.zmb", L"it has no entry point.");
     box.show(L"/a/tool.zmb was not loaded.", 48, nullptr);
     EXPECT_EQ(output.text(), "Message: /a/tool.zmb was not loaded.\n");

@@ -9,10 +9,11 @@
 #include <gtest/gtest.h>
 #include <tessel/tsed.h>
 
-#include "host/Services.h"
 #include "host/applications/Document.h"
+#include "host/commands/EndRequest.h"
 #include "host/lisp/LispInterpreter.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
 // Small enough to be filled quickly.
@@ -22,22 +23,17 @@ class LispSession
 {
 public:
     explicit LispSession(bool removingTsLisp = true)
-        : mLisp(*tessel::LispInterpreter::start(
-              {.removingTsLisp = removingTsLisp, .heapBytes = kTestHeapBytes}))
+        : mLisp(
+              *tessel::LispInterpreter::start({.removingTsLisp = removingTsLisp, .heapBytes = kTestHeapBytes},
+                                              *mCommandLine, *mDocument, mEndRequest))
     {
-        auto& services = tessel::services();
-        services.commandLine = &mCommandLine;
-        services.document = &mDocument;
-        services.lisp = mLisp.get();
-        services.removingTsLisp = removingTsLisp;
     }
-    ~LispSession() { tessel::services() = {}; }
     LispSession(const LispSession&) = delete;
     LispSession& operator=(const LispSession&) = delete;
 
     tessel::LispInterpreter& lisp() { return *mLisp; }
-    tessel::Document& document() { return mDocument; }
-    tessel::CommandLine& commandLine() { return mCommandLine; }
+    tessel::Document& document() { return *mDocument; }
+    tessel::CommandLine& commandLine() { return *mCommandLine; }
     const std::string& output() const { return mOutput; }
     void clearOutput() { mOutput.clear(); }
 
@@ -64,8 +60,8 @@ public:
     std::vector<std::string> documentNames() const
     {
         std::vector<std::string> names;
-        for (int index = 0; index < mDocument.loadedApplicationCount(); ++index)
-            names.push_back(tessel::toUtf8(mDocument.loadedApplicationName(index)));
+        for (int index = 0; index < mDocument->loadedApplicationCount(); ++index)
+            names.push_back(tessel::toUtf8(mDocument->loadedApplicationName(index)));
         return names;
     }
 
@@ -79,10 +75,11 @@ private:
 
     std::string mOutput;
     std::function<void(std::string_view)> mListener;
-    tessel::CommandLine mCommandLine{[this](std::string_view piece)
-                                     {
-                                         receive(piece);
-                                     }};
-    tessel::Document mDocument;
+    tessel::Owned<tessel::CommandLine> mCommandLine{[this](std::string_view piece)
+                                                    {
+                                                        receive(piece);
+                                                    }};
+    tessel::Owned<tessel::Document> mDocument;
+    tessel::EndRequest mEndRequest;
     std::unique_ptr<tessel::LispInterpreter> mLisp;
 };

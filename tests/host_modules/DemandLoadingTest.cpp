@@ -2,7 +2,7 @@
 
 #include <tessel/tsappinfo.h>
 
-#include "host/app/ApplicationServices.h"
+#include "host/applications/ApplicationRecords.h"
 #include "host/registry/Registry.h"
 #include "tests/host_modules/HostWithModules.h"
 
@@ -11,12 +11,6 @@ using tessel::toWide;
 class Demand : public HostWithModules
 {
 protected:
-    Demand()
-    {
-        tessel::services().registry = &mRegistry;
-        tessel::services().application = &mApplication;
-    }
-
     // The record that an application writes about itself, while it is called.
     void record(const std::wstring& name, const std::filesystem::path& module, unsigned reasons)
     {
@@ -30,8 +24,9 @@ protected:
     }
 
     tessel::Registry mRegistry{mFolder / "registry.db"};
-    tessel::ApplicationServices mApplication{L"/profile"};
-    tessel::DemandLoading mDemand{mFolder / "PlugIns"};
+    tessel::Owned<tessel::ApplicationRecords> mRecords{mRegistry, mCommands, mCalls,
+                                                       L"Software\\Tessel\\R21"};
+    tessel::DemandLoading mDemand{mFolder / "PlugIns", *mRecords, mLinker};
 };
 
 TEST_F(Demand, LoadsAtTheStartWhatItsRecordsAskFor)

@@ -2,20 +2,9 @@
 
 #include <dlfcn.h>
 
-HostWithModules::HostWithModules()
-{
-    auto& services = tessel::services();
-    services.commandLine = &mCommandLine;
-    services.callingApplication = &mCalls;
-    services.commands = &mCommands;
-    services.linker = &mLinker;
-    services.resources = &mResources;
-}
-
 HostWithModules::~HostWithModules()
 {
     mLinker.unloadAll();
-    tessel::services() = {};
 }
 
 std::filesystem::path HostWithModules::fixture(const std::string& name) const

@@ -6,19 +6,20 @@
 
 #include <gtest/gtest.h>
 
-#include "host/Services.h"
 #include "host/applications/DynamicLinker.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
+#include "host/messages/MessageBox.h"
 #include "host/resources/ResourceModules.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Running.h"
 #include "host/text/Unicode.h"
 #include "tests/support/TemporaryFolder.h"
 
 class HostWithModules : public testing::Test
 {
 public:
-    HostWithModules();
+    HostWithModules() = default;
     ~HostWithModules() override;
     HostWithModules(const HostWithModules&) = delete;
     HostWithModules& operator=(const HostWithModules&) = delete;
@@ -30,7 +31,7 @@ protected:
 
     bool load(const std::filesystem::path& path);
     bool unload(const std::filesystem::path& path);
-    std::wstring names() const; // of the loaded modules, each with a blank behind it
+    std::wstring names() const; // of the loaded modules, each with a blank after it
 
     // What was printed since the last call.
     std::string output();
@@ -51,7 +52,16 @@ protected:
                                          mOutput += piece;
                                      }};
     tessel::CallingApplication mCalls;
-    tessel::CommandStack mCommands;
-    tessel::DynamicLinker mLinker;
-    tessel::ResourceModules mResources{tessel::toWide((mFolder / "HostResources").native())};
+    tessel::CommandStack mCommands{mCommandLine, mCalls};
+    tessel::MessageBox mMessageBox{mCommandLine};
+    tessel::DynamicLinker mLinker{mCommandLine, mCalls, mCommands, mMessageBox};
+    tessel::ResourceModules mResources{tessel::toWide((mFolder / "HostResources").native()), mCalls};
+
+private:
+    tessel::Published<tessel::CommandLine> mPublishedCommandLine{mCommandLine};
+    tessel::Published<tessel::CallingApplication> mPublishedCalls{mCalls};
+    tessel::Published<tessel::CommandStack> mPublishedCommands{mCommands};
+    tessel::Published<tessel::MessageBox> mPublishedMessageBox{mMessageBox};
+    tessel::Published<tessel::DynamicLinker> mPublishedLinker{mLinker};
+    tessel::Published<tessel::ResourceModules> mPublishedResources{mResources};
 };

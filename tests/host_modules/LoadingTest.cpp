@@ -78,19 +78,17 @@ TEST_F(Loading, AnswersTrueAtOnceForAFileThatIsLoadedHoweverItsPathIsSpelled)
 
 TEST_F(Loading, ExplainsAFailureInTheBoxThatNamesTheFile)
 {
-    tessel::MessageBox box;
     std::wstring detail;
-    box.setPresenter(
+    mMessageBox.setPresenter(
         [&](const tessel::MessageBox::Box& shown)
         {
             detail = shown.detail;
             return IDOK;
         });
-    tessel::services().messageBox = &box;
     const auto path = mFolder / "missing.zmb";
     EXPECT_FALSE(load(path));
     const std::string said = output();
-    box.show((tessel::toWide(path.native()) + L" was not loaded.").c_str(), MB_OK, nullptr);
+    mMessageBox.show((tessel::toWide(path.native()) + L" was not loaded.").c_str(), MB_OK, nullptr);
     EXPECT_FALSE(detail.empty());
     EXPECT_EQ(said,
               "The application \"" + path.native() + "\" is not loaded: " + tessel::toUtf8(detail) + "\n");

@@ -7,8 +7,8 @@
 #include <set>
 #include <string>
 
-#include "host/Services.h"
 #include "host/files/RemoteFiles.h"
+#include "host/text/Running.h"
 #include "host/text/Unicode.h"
 #include "tests/host_app/HostParts.h"
 #include "tests/support/TemporaryFolder.h"
@@ -19,9 +19,7 @@ public:
     static constexpr std::uint64_t kMostBytes = 100'000;
     static constexpr std::size_t kLongestPath = 1023;
 
-    RemoteHost() { tessel::services().remote = &mRemote; }
-
-    tessel::RemoteFiles& remote() { return mRemote; }
+    tessel::RemoteFiles& remote() { return *mRemote; }
     CapturedOutput& output() { return mOutput; }
     const TemporaryFolder& folder() const { return mFolder; }
     std::filesystem::path cache() const { return mFolder / "cache"; }
@@ -34,7 +32,7 @@ public:
 
     tessel::RemoteFiles::Copy fetch(const std::wstring& url, bool ignoreCache = false)
     {
-        return told(mRemote.fetch(url, kLongestPath, ignoreCache));
+        return told(mRemote->fetch(url, kLongestPath, ignoreCache));
     }
     // The copy, or a status alone and what went wrong in the output, as applications find it.
     tessel::RemoteFiles::Copy told(const tessel::Result<tessel::RemoteFiles::Copy>& fetched)
@@ -66,6 +64,7 @@ public:
 private:
     TemporaryFolder mFolder;
     CapturedOutput mOutput;
-    tessel::RemoteFiles mRemote{
-        cache(), {kMostBytes, std::chrono::milliseconds(5000), std::chrono::milliseconds(30'000)}};
+    tessel::Owned<tessel::RemoteFiles> mRemote{
+        cache(), tessel::RemoteFiles::Limits{kMostBytes, std::chrono::milliseconds(5000),
+                                             std::chrono::milliseconds(30'000)}};
 };

@@ -6,7 +6,6 @@
 
 #include <tessel/tsappinfo.h>
 
-#include "host/app/ApplicationServices.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
 #include "tests/host_store/RegistryHost.h"
@@ -27,10 +26,20 @@ class ApplicationRecords : public testing::Test
 protected:
     ApplicationRecords()
     {
-        tessel::services().application = &application;
-        tessel::services().commands = &commands;
-        tessel::services().callingApplication = &calls;
+        start();
         call.emplace(calls, kModule);
+    }
+
+    // The host starts, on the registry that is open.
+    void start() { records.emplace(host.registry(), commands, calls, L"Software\\Tessel\\R21"); }
+    void end()
+    {
+        records.reset();
+        host.close();
+    }
+    std::vector<tessel::ApplicationRecord> allRecords() const
+    {
+        return records ? (*records)->all() : std::vector<tessel::ApplicationRecord>();
     }
 
     static int store(const wchar_t* name, unsigned reasons, bool withCommands = false)
@@ -49,9 +58,9 @@ protected:
     }
 
     RegistryHost host;
-    tessel::ApplicationServices application{L"/profile"};
-    tessel::CommandStack commands;
     tessel::CallingApplication calls;
+    tessel::CommandStack commands{host.output().commandLine(), calls};
+    std::optional<tessel::Owned<tessel::ApplicationRecords>> records;
     std::optional<tessel::CallingApplication::Scope> call;
 };
 } // namespace
@@ -60,7 +69,9 @@ TEST_F(ApplicationRecords, ComeBackAsTheyWereStored)
 {
     EXPECT_EQ(store(L"Tool", TSRX_LOAD_AT_HOST_START | TSRX_LOAD_ON_COMMAND), TSRX_APPINFO_OK);
     EXPECT_TRUE(host.registry().endOfCommand());
+    end();
     host.open();
+    start();
     TesselAppInfo info;
     info.setAppName(L"TOOL");
     EXPECT_EQ(info.readFromRegistry(), TSRX_APPINFO_OK);
@@ -95,12 +106,12 @@ TEST_F(ApplicationRecords, AreReplacedUnderTheSameName)
     EXPECT_EQ(store(L"Tool", 6), TSRX_APPINFO_OK);
     EXPECT_EQ(store(L"Other", 2), TSRX_APPINFO_OK);
     EXPECT_EQ(store(L"tool", 4), TSRX_APPINFO_OK);
-    const auto records = tessel::allApplicationRecords();
-    ASSERT_EQ(records.size(), 2u);
-    EXPECT_EQ(records[0].name, L"Tool");
-    EXPECT_EQ(records[0].loadReasons, 4u);
-    EXPECT_EQ(records[0].module, kModule);
-    EXPECT_EQ(records[1].name, L"Other");
+    const auto all = allRecords();
+    ASSERT_EQ(all.size(), 2u);
+    EXPECT_EQ(all[0].name, L"Tool");
+    EXPECT_EQ(all[0].loadReasons, 4u);
+    EXPECT_EQ(all[0].module, kModule);
+    EXPECT_EQ(all[1].name, L"Other");
 }
 
 TEST_F(ApplicationRecords, HoldTheCommandsOfTheApplicationThatIsCalled)
@@ -112,9 +123,9 @@ TEST_F(ApplicationRecords, HoldTheCommandsOfTheApplicationThatIsCalled)
         addCommand(L"OTHER", L"OTHER");
     }
     EXPECT_EQ(store(L"Tool", 4, true), TSRX_APPINFO_OK);
-    const auto records = tessel::allApplicationRecords();
-    ASSERT_EQ(records.size(), 1u);
-    EXPECT_THAT(records[0].commands, ElementsAre(Pair(L"TOOL", L"WERKZEUG"), Pair(L"BÜRO", L"BÜRO")));
+    const auto all = allRecords();
+    ASSERT_EQ(all.size(), 1u);
+    EXPECT_THAT(all[0].commands, ElementsAre(Pair(L"TOOL", L"WERKZEUG"), Pair(L"BÜRO", L"BÜRO")));
 }
 
 TEST_F(ApplicationRecords, ForgetTheCommandsOfAnEarlierVersion)
@@ -124,9 +135,9 @@ TEST_F(ApplicationRecords, ForgetTheCommandsOfAnEarlierVersion)
     EXPECT_EQ(commands.removeGroup(L"GROUP"), 0);
     addCommand(L"NEW", L"NEW");
     EXPECT_EQ(store(L"Tool", 4, false), TSRX_APPINFO_OK);
-    EXPECT_THAT(tessel::allApplicationRecords().at(0).commands, ElementsAre(Pair(L"OLD", L"OLD")));
+    EXPECT_THAT(allRecords().at(0).commands, ElementsAre(Pair(L"OLD", L"OLD")));
     EXPECT_EQ(store(L"Tool", 4, true), TSRX_APPINFO_OK);
-    EXPECT_THAT(tessel::allApplicationRecords().at(0).commands, ElementsAre(Pair(L"NEW", L"NEW")));
+    EXPECT_THAT(allRecords().at(0).commands, ElementsAre(Pair(L"NEW", L"NEW")));
 }
 
 TEST_F(ApplicationRecords, NeedANameThatIsOneKey)
@@ -139,7 +150,7 @@ TEST_F(ApplicationRecords, NeedANameThatIsOneKey)
         EXPECT_EQ(info.readFromRegistry(), TSRX_APPINFO_ERROR) << name;
     }
     EXPECT_EQ(store(nullptr, 4), TSRX_APPINFO_ERROR);
-    EXPECT_TRUE(tessel::allApplicationRecords().empty());
+    EXPECT_TRUE(allRecords().empty());
 }
 
 TEST_F(ApplicationRecords, AreNoneWhenHalfOfThemIsMissing)
@@ -151,10 +162,10 @@ TEST_F(ApplicationRecords, AreNoneWhenHalfOfThemIsMissing)
     {
         EXPECT_TRUE(host.registry().write(key + L"Odd", L"Module", kModule));
         EXPECT_TRUE(host.registry().write(key + L"Odd", L"LoadReasons", reasons));
-        EXPECT_TRUE(tessel::allApplicationRecords().empty()) << reasons;
+        EXPECT_TRUE(allRecords().empty()) << reasons;
     }
     EXPECT_EQ(store(L"Whole", 4), TSRX_APPINFO_OK);
-    EXPECT_EQ(tessel::allApplicationRecords().size(), 1u);
+    EXPECT_EQ(allRecords().size(), 1u);
     TesselAppInfo info;
     info.setAppName(L"Odd");
     EXPECT_EQ(info.readFromRegistry(), TSRX_APPINFO_NOT_FOUND);
@@ -166,21 +177,22 @@ TEST_F(ApplicationRecords, AreStoredForTheCurrentUserWhenMeantForAll)
     info.setAppName(L"Tool");
     info.setModuleName(kModule);
     EXPECT_EQ(info.writeToRegistry(true, false), TSRX_APPINFO_OK);
-    EXPECT_EQ(tessel::allApplicationRecords().size(), 1u);
+    EXPECT_EQ(allRecords().size(), 1u);
 }
 
 TEST_F(ApplicationRecords, FailWhereTheRegistryMayNotBeWritten)
 {
     EXPECT_EQ(store(L"Tool", 4), TSRX_APPINFO_OK);
-    host.close();
+    end();
     EXPECT_EQ(store(L"Tool", 4), TSRX_APPINFO_ERROR);
-    EXPECT_TRUE(tessel::allApplicationRecords().empty());
+    EXPECT_TRUE(allRecords().empty());
     std::filesystem::permissions(host.file(), std::filesystem::perms::owner_read);
     host.open();
+    start();
     EXPECT_EQ(store(L"Tool", 6), TSRX_APPINFO_ERROR);
     EXPECT_EQ(store(L"Tool", 6, true), TSRX_APPINFO_ERROR);
-    ASSERT_EQ(tessel::allApplicationRecords().size(), 1u);
-    EXPECT_EQ(tessel::allApplicationRecords()[0].loadReasons, 4u);
+    ASSERT_EQ(allRecords().size(), 1u);
+    EXPECT_EQ(allRecords()[0].loadReasons, 4u);
 }
 
 TEST_F(ApplicationRecords, CopyTheirTexts)

@@ -2,7 +2,7 @@
 
 #include <gtest/gtest.h>
 
-#include "host/Services.h"
+#include "host/text/Running.h"
 
 TEST(Document, ListsWhatWasLoadedOnceInOrderOfFirstLoad)
 {
@@ -40,7 +40,6 @@ TEST(Document, IsWhatTheHostGivesApplications)
 {
     EXPECT_EQ(curDoc(), nullptr);
     tessel::Document document;
-    tessel::services().document = &document;
+    const tessel::Published<tessel::Document> published(document);
     EXPECT_EQ(curDoc(), &document);
-    tessel::services() = {};
 }

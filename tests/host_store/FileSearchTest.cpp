@@ -6,8 +6,8 @@
 
 #include <tessel/tsed.h>
 
-#include "host/Services.h"
 #include "host/registry/SystemVariables.h"
+#include "host/text/Running.h"
 #include "host/text/Unicode.h"
 #include "tests/host_store/CurrentFolder.h"
 #include "tests/support/TemporaryFolder.h"
@@ -26,11 +26,8 @@ protected:
         for (const char* name : {"current", "host", "first", "second", "größe 100%"})
             fs::create_directory(folder / name);
         current.emplace(folder / "current");
-        tessel::services().variables = &variables;
-        tessel::services().files = &files;
         setSearchPath((folder / "first").string() + ";" + (folder / "second").string());
     }
-    ~FileSearch() override { tessel::services() = {}; }
 
     void setSearchPath(const std::string& path)
     {
@@ -44,8 +41,9 @@ protected:
     std::string in(const char* name) { return (folder / name).string(); }
 
     TemporaryFolder folder;
-    tessel::SystemVariables variables;
-    tessel::FileSearch files{folder / "host"};
+    tessel::SystemVariables variables{nullptr, L""};
+    tessel::FileSearch files{folder / "host", variables};
+    std::optional<tessel::Published<tessel::FileSearch>> published{files};
     std::optional<CurrentFolder> current;
 };
 } // namespace
@@ -149,7 +147,7 @@ TEST_F(FileSearch, AnswersApplicationsWithAnError)
     EXPECT_EQ(tsedFindFile(L"", found, kPathRoom), TS_ERROR);
     EXPECT_EQ(tsedFindFile(nullptr, found, kPathRoom), TS_ERROR);
     EXPECT_EQ(tsedFindFile(L"other.lsp", nullptr, kPathRoom), TS_ERROR);
-    tessel::services().files = nullptr;
+    published.reset();
     EXPECT_EQ(tsedFindFile(L"other.lsp", found, kPathRoom), TS_ERROR);
     EXPECT_STREQ(found, L"untouched");
 }

@@ -148,7 +148,7 @@ bool rewriteByCalls(int generation, int count)
         well = well && RegDeleteValueW(key, stored.c_str()) == ERROR_SUCCESS;
         RegCloseKey(key);
     }
-    return well && writeList(*tessel::services().registry, generation, count);
+    return well && writeList(*tessel::running<Registry>(), generation, count);
 }
 } // namespace
 

@@ -2,6 +2,7 @@
 
 #include <gmock/gmock.h>
 
+#include "host/registry/Profiles.h"
 #include "tests/host_store/RegistryHost.h"
 #include "tests/host_store/StoredList.h"
 
@@ -208,10 +209,10 @@ TEST_F(RegistryStore, WalksTwoKeysAtTheSameTime)
 
 TEST_F(RegistryStore, GivesANewRegistryItsFirstProfileOnly)
 {
-    tessel::ensureCurrentProfile(registry(), L"Product");
+    const tessel::Profiles first(registry(), L"Product");
     EXPECT_EQ(registry().read(L"Product\\Profiles", L""), L"Default");
     EXPECT_TRUE(registry().write(L"Product\\Profiles", L"", L"Zweites Büro"));
-    tessel::ensureCurrentProfile(registry(), L"Product");
+    const tessel::Profiles second(registry(), L"Product");
     EXPECT_EQ(registry().read(L"Product\\Profiles", L""), L"Zweites Büro");
 }
 

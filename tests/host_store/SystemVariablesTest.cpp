@@ -2,9 +2,10 @@
 
 #include <gmock/gmock.h>
 
+#include <optional>
+
 #include <tessel/tsed.h>
 
-#include "host/app/ApplicationServices.h"
 #include "tests/host_store/RegistryHost.h"
 
 using tessel::SystemVariables;
@@ -21,14 +22,15 @@ protected:
     // The host starts, with what the registry holds.
     void start()
     {
-        tessel::services().application = &application;
-        variables = std::make_unique<SystemVariables>();
-        tessel::services().variables = variables.get();
+        auto* registry = tessel::running<tessel::Registry>();
+        published.reset();
+        variables = std::make_unique<SystemVariables>(registry, L"Software\\Tessel\\R21");
+        published.emplace(*variables);
     }
 
     RegistryHost host;
-    tessel::ApplicationServices application{L"/profile"};
     std::unique_ptr<SystemVariables> variables;
+    std::optional<tessel::Published<SystemVariables>> published;
 };
 } // namespace
 
@@ -142,7 +144,7 @@ TEST_F(Variables, LeaveTheResultAloneWhenThereIsNone)
     EXPECT_EQ(tsedGetVar(L"NOSUCH", &result), TS_ERROR);
     EXPECT_EQ(tsedGetVar(nullptr, &result), TS_ERROR);
     EXPECT_EQ(tsedGetVar(L"LISPENABLED", nullptr), TS_ERROR);
-    tessel::services().variables = nullptr;
+    published.reset();
     EXPECT_EQ(tsedGetVar(L"LISPENABLED", &result), TS_ERROR);
     EXPECT_EQ(result.type, TS_NIL);
 }

@@ -6,7 +6,6 @@
 
 #include <gmock/gmock.h>
 
-#include "host/Services.h"
 #include "host/files/RemoteFiles.h"
 #include "tests/support/HttpServer.h"
 
@@ -30,7 +29,10 @@ class RemoteFiles : public ModrigInHost
 protected:
     RemoteFiles()
     {
-        tessel::services().remote = &mWithLimits; // a test does not wait for a minute
+        // A test does not wait for a minute.
+        options.downloads = {.bytes = 5000, .connecting = 2000ms, .whole = 300ms};
+        restart();
+        loadModrig();
         said();
     }
 
@@ -71,7 +73,6 @@ protected:
 
 private:
     std::map<std::string, HttpServer::Answer> mAnswers; // changed only between requests
-    tessel::RemoteFiles mWithLimits{cache(), {.bytes = 5000, .connecting = 2000ms, .whole = 300ms}};
 
 protected:
     HttpServer server{[this](const std::string& target)

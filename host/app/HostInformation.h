@@ -1,4 +1,4 @@
-// What the host is, and the road to remote files.
+// What the host tells applications of itself, and their road to remote files.
 #pragma once
 
 #include <string>
@@ -10,10 +10,16 @@
 
 namespace tessel
 {
-class ApplicationServices : public TsDbHostApplicationServices
+class CommandLine;
+
+class HostInformation : public TsDbHostApplicationServices
 {
 public:
-    explicit ApplicationServices(std::wstring profileFolder) : mProfileFolder(std::move(profileFolder)) {}
+    // Why a file could not be fetched is said on the command line.
+    HostInformation(std::wstring profileFolder, RemoteFiles& remote, CommandLine& commandLine)
+        : mProfileFolder(std::move(profileFolder)), mRemote(remote), mCommandLine(commandLine)
+    {
+    }
 
     const wchar_t* productRegistryRoot() const override;
     const wchar_t* profileFolder() const override { return mProfileFolder.c_str(); }
@@ -26,5 +32,7 @@ private:
     Result<RemoteFiles::Copy> fetch(const std::wstring& url, std::size_t capacity, bool ignoreCache) const;
 
     std::wstring mProfileFolder;
+    RemoteFiles& mRemote;
+    CommandLine& mCommandLine;
 };
 } // namespace tessel

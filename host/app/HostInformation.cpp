@@ -1,27 +1,28 @@
-#include "host/app/ApplicationServices.h"
+#include "host/app/HostInformation.h"
 
 #include <algorithm>
 #include <cwchar>
 #include <string>
 #include <string_view>
 
-#include "host/Services.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Running.h"
 #include "host/text/Unicode.h"
+#include "host/text/Version.h"
 
 namespace tessel
 {
-const wchar_t* ApplicationServices::productRegistryRoot() const
+const wchar_t* HostInformation::productRegistryRoot() const
 {
-    return L"Software\\Tessel\\R21";
+    return kProductRegistryRoot;
 }
 
-const wchar_t* ApplicationServices::product() const
+const wchar_t* HostInformation::product() const
 {
     return L"Tessel";
 }
 
-bool ApplicationServices::isUrl(const wchar_t* text) const
+bool HostInformation::isUrl(const wchar_t* text) const
 {
     constexpr std::wstring_view kSchemes[] = {L"http://", L"https://"};
     const std::wstring_view url = text ? text : L"";
@@ -32,24 +33,22 @@ bool ApplicationServices::isUrl(const wchar_t* text) const
                        });
 }
 
-Result<RemoteFiles::Copy> ApplicationServices::fetch(const std::wstring& url, std::size_t capacity,
-                                                     bool ignoreCache) const
+Result<RemoteFiles::Copy> HostInformation::fetch(const std::wstring& url, std::size_t capacity,
+                                                 bool ignoreCache) const
 {
     if (!isUrl(url.c_str()))
         return Failure{L"\"" + url + L"\" is no http or https address.", TS_FETCH_FAILED};
     if (capacity == 0)
         return Failure{url + L" could not be fetched: there is no room for the path of its local copy.",
                        TS_FETCH_FAILED};
-    return services().remote->fetch(url, capacity - 1, ignoreCache);
+    return mRemote.fetch(url, capacity - 1, ignoreCache);
 }
 
-int ApplicationServices::fetchRemoteFile(const wchar_t* url, wchar_t* localPath, std::size_t capacity,
-                                         bool ignoreCache)
+int HostInformation::fetchRemoteFile(const wchar_t* url, wchar_t* localPath, std::size_t capacity,
+                                     bool ignoreCache)
 {
-    if (!services().remote)
-        return TS_FETCH_FAILED;
     const auto copy = fetch(url ? url : L"", localPath ? capacity : 0, ignoreCache);
-    if (!services().commandLine->tell(copy) || !localPath) // without room for the path it has failed
+    if (!mCommandLine.tell(copy) || !localPath) // without room for the path it has failed
         return copy.code();
     std::wmemcpy(localPath, copy->path.c_str(), copy->path.size() + 1);
     return copy->status;
@@ -58,5 +57,5 @@ int ApplicationServices::fetchRemoteFile(const wchar_t* url, wchar_t* localPath,
 
 TsDbHostApplicationServices* tsdbHostApplicationServices()
 {
-    return tessel::services().application;
+    return tessel::running<tessel::HostInformation>();
 }

@@ -1,0 +1,76 @@
+// The parts of the running host, listed once: in the order in which they are made, each given those before it that
+// it needs. They are taken down in the reverse order.
+//
+// The owned ones are also what the SDK's free functions find (see `running` in host/text/Running.h).
+#pragma once
+
+#include <filesystem>
+#include <memory>
+
+#include "host/app/HostInformation.h"
+#include "host/app/Layout.h"
+#include "host/applications/ApplicationRecords.h"
+#include "host/applications/DemandLoading.h"
+#include "host/applications/Document.h"
+#include "host/applications/DynamicLinker.h"
+#include "host/commands/CallingApplication.h"
+#include "host/commands/CommandStack.h"
+#include "host/commands/EndRequest.h"
+#include "host/files/FileSearch.h"
+#include "host/files/RemoteFiles.h"
+#include "host/lisp/LispInterpreter.h"
+#include "host/messages/Help.h"
+#include "host/messages/MessageBox.h"
+#include "host/registry/Profiles.h"
+#include "host/registry/Registry.h"
+#include "host/registry/SystemVariables.h"
+#include "host/resources/ResourceModules.h"
+#include "host/text/CommandLine.h"
+#include "host/text/Running.h"
+#include "host/text/Unicode.h"
+#include "host/text/Version.h"
+
+namespace tessel
+{
+// What the parts are made from.
+struct Foundations
+{
+    CommandLine& commandLine;
+    EndRequest& endRequest;
+    const std::filesystem::path& profileFolder; // is there
+    const RemoteFiles::Limits& downloads;
+};
+
+struct Parts
+{
+    explicit Parts(const Foundations& given) : foundations(given) {}
+    Parts(const Parts&) = delete;
+    Parts& operator=(const Parts&) = delete;
+
+    const Foundations foundations;
+    const Layout layout = runningLayout();
+    Published<CommandLine> commandLine{foundations.commandLine};
+    Published<EndRequest> endRequest{foundations.endRequest};
+    Owned<Registry> registry{foundations.profileFolder / "registry.db"};
+    Profiles profiles{*registry, kProductRegistryRoot};
+    Owned<SystemVariables> variables{&*registry, kProductRegistryRoot};
+    Owned<CallingApplication> callingApplication;
+    Owned<CommandStack> commands{*commandLine, *callingApplication};
+    Owned<ResourceModules> resources{toWide(layout.resources.string()), *callingApplication};
+    Owned<MessageBox> messageBox{*commandLine};
+    Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands, *messageBox};
+    Owned<ApplicationRecords> records{*registry, *commands, *callingApplication, kProductRegistryRoot};
+    DemandLoading demandLoading{layout.plugIns, *records, *linker};
+    Owned<Document> document;
+    Owned<FileSearch> files{layout.resources, *variables};
+    Owned<RemoteFiles> remote{foundations.profileFolder / "remote-files", foundations.downloads};
+    Owned<HostInformation> information{toWide(foundations.profileFolder.string()), *remote, *commandLine};
+    Owned<Help> help{layout.resources / "help", openInBrowser};
+    // Publishes itself. The variable is read here, before any application is loaded, and holds for the session.
+    Result<std::unique_ptr<LispInterpreter>> startedLisp = LispInterpreter::start(
+        {.removingTsLisp = variables->number(kRemovingTsLisp) != 0}, *commandLine, *document, *endRequest);
+
+    // Only of parts whose Lisp has started.
+    LispInterpreter& lisp() const { return **startedLisp; }
+};
+} // namespace tessel
