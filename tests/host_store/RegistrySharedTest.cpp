@@ -1,6 +1,7 @@
 // Two processes on one registry.
 #include <gtest/gtest.h>
 
+#include <chrono>
 #include <memory>
 #include <vector>
 
@@ -16,6 +17,11 @@
 #include "tests/host_store/StoredList.h"
 
 using tessel::Registry;
+
+namespace
+{
+constexpr std::chrono::milliseconds kShortTimeout{50};
+} // namespace
 
 TEST(SharedRegistry, ShowsAnotherProcessNothingBeforeTheCommandEnds)
 {
@@ -38,7 +44,7 @@ TEST(SharedRegistry, ShowsAnotherProcessNothingBeforeTheCommandEnds)
     EXPECT_EQ(seenByOther(), "2");
 }
 
-TEST(SharedRegistry, IsReadAnewAfterAnotherProcessWrote)
+TEST(SharedRegistry, IsReadAgainAfterAnotherProcessWrote)
 {
     RegistryHost host;
     Registry other(host.file());
@@ -249,7 +255,7 @@ TEST(SharedRegistry, StoresWhatWasWrittenBeforeAWait)
 
 TEST(SharedRegistry, ForgetsAFailureWhenTheActionIsOverAndNotBefore)
 {
-    RegistryHost host;
+    RegistryHost host(kShortTimeout);
     Registry other(host.file());
     ASSERT_TRUE(other.write(L"A", L"name", L"other"));
     EXPECT_FALSE(host.registry().write(L"A", L"name", L"mine"));
@@ -266,7 +272,7 @@ TEST(SharedRegistry, ForgetsAFailureWhenTheActionIsOverAndNotBefore)
 
 TEST(SharedRegistry, RefusesAWriteWhileAnotherCommandTakesTooLong)
 {
-    RegistryHost host;
+    RegistryHost host(kShortTimeout);
     Registry other(host.file());
     ASSERT_TRUE(other.write(L"A", L"name", L"other"));
     EXPECT_FALSE(host.registry().write(L"A", L"name", L"mine"));
@@ -279,4 +285,16 @@ TEST(SharedRegistry, RefusesAWriteWhileAnotherCommandTakesTooLong)
     EXPECT_TRUE(host.registry().write(L"A", L"name", L"mine"));
     EXPECT_TRUE(host.registry().endOfCommand());
     EXPECT_EQ(other.read(L"A", L"name"), L"mine");
+}
+
+TEST(SharedRegistry, WaitsForAnotherCommandAsLongAsItIsTold)
+{
+    RegistryHost host(kShortTimeout);
+    Registry other(host.file());
+    ASSERT_TRUE(other.write(L"A", L"name", L"other"));
+    const auto begin = std::chrono::steady_clock::now();
+    EXPECT_FALSE(host.registry().write(L"A", L"name", L"mine"));
+    const auto waited = std::chrono::steady_clock::now() - begin;
+    EXPECT_GE(waited, kShortTimeout);
+    EXPECT_LT(waited, Registry::kBusyTimeout);
 }
