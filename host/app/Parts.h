@@ -1,5 +1,5 @@
-// The parts of the running host, listed once: in the order in which they are made, each given those before it that
-// it needs. They are taken down in the reverse order.
+// The parts of the running host, listed once: in the order in which they are made, each given those before it
+// that it needs. They are taken down in the reverse order.
 //
 // The owned ones are also what the SDK's free functions find (see `running` in host/text/Running.h).
 #pragma once
@@ -66,7 +66,8 @@ struct Parts
     Owned<RemoteFiles> remote{foundations.profileFolder / "remote-files", foundations.downloads};
     Owned<HostInformation> information{toWide(foundations.profileFolder.string()), *remote, *commandLine};
     Owned<Help> help{layout.resources / "help", openInBrowser};
-    // Publishes itself. The variable is read here, before any application is loaded, and holds for the session.
+    // Publishes itself. The variable is read here, before any application is loaded, and holds for the
+    // session.
     Result<std::unique_ptr<LispInterpreter>> startedLisp = LispInterpreter::start(
         {.removingTsLisp = variables->number(kRemovingTsLisp) != 0}, *commandLine, *document, *endRequest);
 

@@ -14,7 +14,7 @@ struct Completion
     std::vector<std::wstring> candidates; // the names to choose from when there are several
 };
 
-// Names compare without regard to case. One name that fits is completed whole, with a blank behind it; of
+// Names compare without regard to case. One name that fits is completed whole, with a blank after it; of
 // several, as far as they agree. Nothing when no name fits, or when the line holds more than one word.
 std::optional<Completion> completeCommand(std::wstring_view line, const std::vector<std::wstring>& names);
 } // namespace tessel

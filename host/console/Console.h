@@ -29,7 +29,7 @@ public:
     // fresh prompt, or stops the Lisp that is running.
     void converse(LineEditor& editor);
 
-    // Runs lines as if typed; each is printed behind the prompt, so that the output is a transcript. A line
+    // Runs lines as if typed; each is printed after the prompt, so that the output is a transcript. A line
     // that fails does not keep the following ones from running. True when none failed.
     bool runLines(std::istream& lines);
     bool runLine(std::string_view line);

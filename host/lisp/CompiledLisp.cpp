@@ -16,7 +16,7 @@ constexpr std::uint32_t kFormatVersion = 1;
 constexpr std::uint32_t kLispVersion = ECL_VERSION_NUMBER;
 
 constexpr std::size_t kNumberSize = 4;
-// Behind the magic: format version, Lisp version, length of the byte code, checksum of all that and the byte
+// After the magic: format version, Lisp version, length of the byte code, checksum of all that and the byte
 // code.
 constexpr std::size_t kLispVersionAt = kNumberSize;
 constexpr std::size_t kLengthAt = 2 * kNumberSize;

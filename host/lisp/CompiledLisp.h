@@ -1,4 +1,4 @@
-// The file format of compiled Lisp (.qbc): byte code behind a header that tells a file that is whole and
+// The file format of compiled Lisp (.qbc): byte code after a header that tells a file that is whole and
 // meant for this Lisp from every other one.
 //
 // The byte code itself is trusted: Lisp does not survive damaged byte code, so nothing else may reach it.

@@ -202,7 +202,7 @@ void connectLispPrimitives(LispSurroundings* surroundings, LispInterrupter* inte
 
 // ECL lets a stack that has overflowed reach into its reserve, for the error to be handled, and must take
 // that back afterwards. Its own way replaces the stack of frames by a new one while frames are being left,
-// and measures the machine's stack anew, by a limit that is meant for other things.
+// and measures the machine's stack again, by a limit that is meant for other things.
 void restoreLispStackLimits()
 {
     const cl_env_ptr environment = ecl_process_env();

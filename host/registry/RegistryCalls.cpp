@@ -13,7 +13,7 @@ using tessel::Registry;
 
 namespace
 {
-// The registry and the key behind a handle, if both are there.
+// The registry and the key that a handle stands for, if both are there.
 struct Target
 {
     Registry* registry = nullptr;

@@ -35,7 +35,7 @@ public:
         return *this;
     }
 
-    // SQLITE_ROW: a row stands ready. After anything else, or `reset`, the statement can be bound anew.
+    // SQLITE_ROW: a row stands ready. After anything else, or `reset`, the statement can be bound again.
     int step()
     {
         const int status = sqlite3_step(mStatement);

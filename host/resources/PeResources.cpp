@@ -177,7 +177,7 @@ Extent blockBelow(const Node& languages, const ByteReader& tree, std::uint32_t t
     return {address - treeAddress, size};
 }
 
-// Sixteen texts, each behind its length, have to stand in the block.
+// Sixteen texts, each after its length, have to stand in the block.
 void checkTexts(const ByteReader& block)
 {
     std::size_t offset = 0;

@@ -21,7 +21,7 @@ public:
     void print(std::wstring_view text);
 
     // Prints one sentence on a line of its own: after a line break if something stands on the line already,
-    // and with a line break behind it.
+    // and with a line break after it.
     void say(std::wstring_view sentence);
 
     // Says what went wrong, if anything did. Answers whether all went well.

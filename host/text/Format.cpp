@@ -32,7 +32,7 @@ struct Conversion
     int width = 0;
     int precision = -1; // none
     wchar_t letter = L'\0';
-    const wchar_t* end = nullptr; // behind it
+    const wchar_t* end = nullptr; // after it
 };
 
 int takeNumber(const wchar_t*& at)
@@ -43,7 +43,7 @@ int takeNumber(const wchar_t*& at)
     return number;
 }
 
-// Reads what stands behind a per cent sign.
+// Reads what stands after a per cent sign.
 Conversion parse(const wchar_t* at)
 {
     Conversion conversion;

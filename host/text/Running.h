@@ -1,5 +1,6 @@
-// The parts of the running host, as the SDK's free functions find them. The parts themselves are given what they
-// need when they are made; only a function that an application calls from outside has nothing else to go by.
+// The parts of the running host, as the SDK's free functions find them. The parts themselves are given what
+// they need when they are made; only a function that an application calls from outside has nothing else to go
+// by.
 //
 //     Owned<Document> document;                        // a part, made and published
 //     if (auto* current = running<Document>()) ...     // in a free function; null outside of a session

@@ -38,7 +38,7 @@ void prepare()
     tessel::windowing::completeBehaviour();
     tessel::windowing::showEveryScript();
     tessel::windowing::takeTextKeys();
-    // The host's own loop waits for the terminal; these two are what the toolkit's would have done first.
+    // The host's own loop waits for the terminal, and the toolkit's never runs: this is what that does first.
     [NSApp finishLaunching];
     tessel::closeWindowsWhenTheSessionEnds();
     tessel::storeBeforeEachWait();

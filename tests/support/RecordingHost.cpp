@@ -19,7 +19,7 @@ RecordingHost::RecordingHost()
 void RecordingHost::reset()
 {
     recording_loans::forgetAll();
-    // Made anew in place: the parts keep their addresses, which a module under test may have kept.
+    // Made again in place: the parts keep their addresses, which a module under test may have kept.
     std::destroy_at(this);
     std::construct_at(this);
 }

@@ -31,7 +31,7 @@ ElfW(Addr) dynamicEntry(const link_map& map, ElfW(Sxword) tag)
     return 0;
 }
 
-// The index behind the last symbol that the library only refers to: these stand in front of those that it
+// The index after the last symbol that the library only refers to: these stand in front of those that it
 // defines, which the hash table begins with.
 std::uint32_t endOfReferences(const link_map& map)
 {

@@ -112,7 +112,7 @@
   (member character '(#\Space #\Newline #\Tab #\Return #\Page)))
 
 (defun block-comment-end (text start)
-  "Behind the comment, which may hold others; nil when it is never closed."
+  "After the comment, which may hold others; nil when it is never closed."
   (loop with depth = 0
         for mark = (position #\| text :start start) then (position #\| text :start (1+ mark))
         while mark
@@ -124,7 +124,7 @@
                     (return (1+ mark)))))))
 
 (defun form-start (text position)
-  "Where the next form begins, behind white space and comments; nil when there is none."
+  "Where the next form begins, after white space and comments; nil when there is none."
   (loop
     (let ((start (position-if-not #'white-space-p text :start position)))
       (cond ((null start)

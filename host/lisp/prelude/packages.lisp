@@ -1,5 +1,5 @@
 ;;; The packages of the host's Lisp. TESSEL offers the system's own functions; TESSEL-HOST is how they are made.
-;;; What a person types is read in TESSEL-USER, which every session makes anew.
+;;; What a person types is read in TESSEL-USER, which is new in every session.
 
 (defpackage "TESSEL"
   (:use)

@@ -22,7 +22,7 @@ NSString* absolute(NSString* path)
     return [whole stringByStandardizingPath];
 }
 
-// The host's theme: colours only, in the resources of the host that this library lies in.
+// The colours and pictures of the host's theme, in the resources of the host that this library lies in.
 NSString* themePath()
 {
     Dl_info info;
