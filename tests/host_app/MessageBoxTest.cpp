@@ -68,7 +68,7 @@ TEST(MessageBox, SaysInItsDetailWhatIsKnownOfTheFileThatItNames)
 TEST(MessageBox, BeginsItsDetailWithACapitalUnlessThatIsAName)
 {
     CapturedOutput output;
-    tessel::MessageBox box;
+    tessel::MessageBox box(output.commandLine());
     std::vector<std::wstring> details;
     box.setPresenter(
         [&](const tessel::MessageBox::Box& shown)

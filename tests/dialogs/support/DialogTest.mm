@@ -135,6 +135,7 @@ void OpenDialogTest::close()
 void OpenDialogTest::show()
 {
     [mPanel makeKeyAndOrderFront:nil];
+    static_cast<void>([mPanel filenames]); // who asks what is chosen has the folder listed first
     events::pump();
 }
 
