@@ -10,7 +10,7 @@ namespace tessel
 {
 namespace
 {
-constexpr wchar_t kGroup[] = L"Applications";
+constexpr wchar_t kApplicationsGroup[] = L"Applications";
 constexpr std::size_t kNameColumn = 24;
 constexpr std::size_t kFolderColumn = 48;
 constexpr std::array kLispExtensions = {L".lsp", L".qbc"};
@@ -102,8 +102,9 @@ Result<> listApplications(Parts& parts, const CommandStack::Arguments&)
 
 void addApplicationCommands(Parts& parts)
 {
-    addBuiltIn(parts, {kGroup, L"LOAD", L"file", L"Loads a compiled module or a Lisp file"}, load);
-    addBuiltIn(parts, {kGroup, L"UNLOAD", L"file", L"Unloads a compiled module"}, unload);
-    addBuiltIn(parts, {kGroup, L"APPS", L"", L"Lists what is loaded"}, listApplications);
+    addBuiltIn(parts, {kApplicationsGroup, L"LOAD", L"file", L"Loads a compiled module or a Lisp file"},
+               load);
+    addBuiltIn(parts, {kApplicationsGroup, L"UNLOAD", L"file", L"Unloads a compiled module"}, unload);
+    addBuiltIn(parts, {kApplicationsGroup, L"APPS", L"", L"Lists what is loaded"}, listApplications);
 }
 } // namespace tessel

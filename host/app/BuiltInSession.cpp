@@ -9,7 +9,7 @@ namespace tessel
 {
 namespace
 {
-constexpr wchar_t kGroup[] = L"Session";
+constexpr wchar_t kSessionGroup[] = L"Session";
 constexpr std::size_t kUsageColumn = 50;
 
 void sayCommand(Parts& parts, const CommandStack::Description& command)
@@ -79,12 +79,14 @@ void addSessionCommands(Parts& parts, SessionActions actions)
     {
         return arguments.size() == 1 ? run(toPath(arguments.front())) : wrongUsage(parts, L"SCRIPT");
     };
-    addBuiltIn(parts, {kGroup, L"HELP", L"[name]", L"Lists the commands, or tells about one or a help topic"},
+    addBuiltIn(parts,
+               {kSessionGroup, L"HELP", L"[name]", L"Lists the commands, or tells about one or a help topic"},
                help);
-    parts.commands->addBuiltIn({kGroup, L"QUIT", L"", L"Ends the session"}, quit);
-    parts.commands->addBuiltIn({kGroup, L"EXIT", L"", L"Ends the session"}, quit);
-    parts.commands->addBuiltIn({kGroup, L"SCRIPT", L"file", L"Runs the commands in a file"}, script);
-    addBuiltIn(parts, {kGroup, L"CD", L"[folder]", L"Shows or changes the current folder"}, changeFolder);
-    addBuiltIn(parts, {kGroup, L"VERSION", L"", L"Shows the version"}, tellVersion);
+    parts.commands->addBuiltIn({kSessionGroup, L"QUIT", L"", L"Ends the session"}, quit);
+    parts.commands->addBuiltIn({kSessionGroup, L"EXIT", L"", L"Ends the session"}, quit);
+    parts.commands->addBuiltIn({kSessionGroup, L"SCRIPT", L"file", L"Runs the commands in a file"}, script);
+    addBuiltIn(parts, {kSessionGroup, L"CD", L"[folder]", L"Shows or changes the current folder"},
+               changeFolder);
+    addBuiltIn(parts, {kSessionGroup, L"VERSION", L"", L"Shows the version"}, tellVersion);
 }
 } // namespace tessel

@@ -7,7 +7,7 @@ namespace tessel
 {
 namespace
 {
-constexpr wchar_t kGroup[] = L"Settings";
+constexpr wchar_t kSettingsGroup[] = L"Settings";
 constexpr std::size_t kVariableColumn = 34;
 
 std::wstring assignment(const SystemVariables::Variable& variable)
@@ -55,7 +55,9 @@ Result<> profile(Parts& parts, const CommandStack::Arguments& arguments)
 
 void addSettingCommands(Parts& parts)
 {
-    addBuiltIn(parts, {kGroup, L"SETVAR", L"[name [value]]", L"Shows or sets system variables"}, setVariable);
-    addBuiltIn(parts, {kGroup, L"PROFILE", L"[name]", L"Shows or changes the current profile"}, profile);
+    addBuiltIn(parts, {kSettingsGroup, L"SETVAR", L"[name [value]]", L"Shows or sets system variables"},
+               setVariable);
+    addBuiltIn(parts, {kSettingsGroup, L"PROFILE", L"[name]", L"Shows or changes the current profile"},
+               profile);
 }
 } // namespace tessel

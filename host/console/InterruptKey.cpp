@@ -11,13 +11,13 @@ namespace tessel
 namespace
 {
 // A signal handler can be given nothing.
-LineRunner* theRunner = nullptr;
+LineRunner* theKeysRunner = nullptr;
 volatile std::sig_atomic_t theWriteEnd = -1;
 
 void onKey(int)
 {
     const int before = errno;
-    theRunner->interrupt();
+    theKeysRunner->interrupt();
     // A pipe that is full has notes enough.
     [[maybe_unused]] const auto written = write(theWriteEnd, "", 1);
     errno = before;
@@ -32,7 +32,7 @@ void makeIndependent(int descriptor)
 
 InterruptKey::InterruptKey(LineRunner& runner)
 {
-    theRunner = &runner;
+    theKeysRunner = &runner;
     std::array<int, 2> ends{-1, -1};
     if (pipe(ends.data()) == 0)
         for (const int end : ends)

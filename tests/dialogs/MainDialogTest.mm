@@ -15,9 +15,6 @@ using testing::IsEmpty;
 
 namespace
 {
-constexpr int kLoadedTab = 0;
-constexpr int kHistoryTab = 1;
-
 class MainDialog : public OpenDialogTest
 {
 protected:

@@ -20,8 +20,6 @@ using testing::IsEmpty;
 
 namespace
 {
-constexpr int kLoadedTab = 0;
-
 // The button with that action in the view.
 NSButton* buttonIn(NSView* view, SEL action)
 {

@@ -17,20 +17,20 @@ namespace
 {
 constexpr NSUInteger kLispFilter = 3;
 constexpr NSUInteger kBundleFilter = 1;
-const std::wstring kSettings = L"Software\\Tessel\\R21\\Profiles\\Default\\DialogSettings\\Modrig";
+const std::wstring kPanelSettings = L"Software\\Tessel\\R21\\Profiles\\Default\\DialogSettings\\Modrig";
 
 class OpenPanel : public OpenDialogTest
 {
 protected:
     void openIn(const std::filesystem::path& folder)
     {
-        host().registry.setValue(kSettings, L"InitialPath", folder.wstring());
+        host().registry.setValue(kPanelSettings, L"InitialPath", folder.wstring());
         open();
     }
     // Runs the dialog in a folder; the steps are followed by the one that closes it.
     void runIn(const std::filesystem::path& folder, std::vector<ModalStep> steps)
     {
-        host().registry.setValue(kSettings, L"InitialPath", folder.wstring());
+        host().registry.setValue(kPanelSettings, L"InitialPath", folder.wstring());
         steps.insert(steps.begin(), ModalStep(
                                         [this]
                                         {
@@ -252,7 +252,7 @@ TEST_F(OpenPanel, RemembersTheFolderThatTheUserWentTo)
     mFolder.write("folder/one.zmb", "");
     runIn(mFolder.path(), {[this] { enter(L"folder"); }, [this] { return isIn(mFolder / "folder"); },
                            [this] { click({L"one.zmb"}); }, [this] { [mController onLoad:nil]; }});
-    EXPECT_EQ((mFolder / "folder").wstring(), host().registry.value(kSettings, L"InitialPath"));
+    EXPECT_EQ((mFolder / "folder").wstring(), host().registry.value(kPanelSettings, L"InitialPath"));
 }
 
 TEST_F(OpenPanel, KnowsTheHostsFolderInAnyCase)
@@ -267,7 +267,7 @@ TEST_F(OpenPanel, KnowsTheHostsFolderInAnyCase)
 
 TEST_F(OpenPanel, LoadsWithReturnAndClosesWithEscape)
 {
-    host().registry.setValue(kSettings, L"InitialPath", mFolder.path().wstring());
+    host().registry.setValue(kPanelSettings, L"InitialPath", mFolder.path().wstring());
     file("one.zmb");
     const ModalSteps steps({[this]
                             {

@@ -14,8 +14,6 @@ using testing::ElementsAre;
 
 namespace
 {
-constexpr int kLoadedTab = 0;
-
 std::wstring nameOf(NSView* view)
 {
     if ([view isKindOfClass:[NSPopUpButton class]])

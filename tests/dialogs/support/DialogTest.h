@@ -15,6 +15,10 @@
 
 #import "modrig/dialogs/ModrigController.h"
 
+// The tabs of the main dialog.
+inline constexpr int kLoadedTab = 0;
+inline constexpr int kHistoryTab = 1;
+
 class DialogTest : public ModuleTest
 {
 protected:

@@ -21,7 +21,6 @@ NSArray* const kStepModes = [[NSArray alloc]
     initWithObjects:NSModalPanelRunLoopMode, NSDefaultRunLoopMode, NSEventTrackingRunLoopMode, nil];
 
 constexpr int kMostTries = 400;
-constexpr int kHistoryTab = 1;
 
 std::vector<std::wstring> pathsOf(NSArray* rows)
 {

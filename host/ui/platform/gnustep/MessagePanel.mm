@@ -11,18 +11,18 @@ using tessel::windowing::themeColor;
 
 namespace
 {
-constexpr CGFloat kMargin = 22;
+constexpr CGFloat kBoxMargin = 22;
 constexpr CGFloat kIconSize = 44;
 constexpr CGFloat kIconGap = 18;
 constexpr CGFloat kWidestText = 440;
 constexpr CGFloat kNarrowestText = 220;
 constexpr CGFloat kTextHeightAllowed = 10000;
 constexpr CGFloat kFieldPadding = 6; // of a field around its text
-constexpr CGFloat kFontSize = 13;
+constexpr CGFloat kMessageFontSize = 13;
 constexpr CGFloat kDetailFontSize = 11;
 constexpr CGFloat kDetailGap = 10;
 const NSSize kButtonSize = {88, 28};
-constexpr unichar kEscape = 033;
+constexpr unichar kEscapeKey = 033;
 
 NSBezierPath* triangleIn(NSRect frame)
 {
@@ -108,7 +108,7 @@ NSBezierPath* triangleIn(NSRect frame)
 - (NSView*)wordsFor:(NSString*)text detail:(NSString*)detail
 {
     NSView* words = [[[NSView alloc] initWithFrame:NSZeroRect] autorelease];
-    NSTextField* first = [self fieldFor:text size:kFontSize];
+    NSTextField* first = [self fieldFor:text size:kMessageFontSize];
     NSSize size = [first frame].size;
     if ([detail length])
     {
@@ -129,7 +129,7 @@ NSBezierPath* triangleIn(NSRect frame)
     NSButton* button = [[[NSButton alloc]
         initWithFrame:NSMakeRect(origin.x, origin.y, kButtonSize.width, kButtonSize.height)] autorelease];
     [button setTitle:@"OK"];
-    [button setFont:[NSFont systemFontOfSize:kFontSize]];
+    [button setFont:[NSFont systemFontOfSize:kMessageFontSize]];
     [button setBezelStyle:NSRoundedBezelStyle];
     [button setKeyEquivalent:@"\r"];
     [button setTarget:self];
@@ -142,8 +142,8 @@ NSBezierPath* triangleIn(NSRect frame)
     NSView* words = [self wordsFor:text detail:detail];
     const NSSize size = [words frame].size;
     const CGFloat height = std::max(size.height, kIconSize);
-    const NSRect content = NSMakeRect(0, 0, 2 * kMargin + kIconSize + kIconGap + size.width,
-                                      3 * kMargin + kButtonSize.height + height);
+    const NSRect content = NSMakeRect(0, 0, 2 * kBoxMargin + kIconSize + kIconGap + size.width,
+                                      3 * kBoxMargin + kButtonSize.height + height);
     self = [super initWithContentRect:content
                             styleMask:NSTitledWindowMask | NSClosableWindowMask
                               backing:NSBackingStoreBuffered
@@ -152,12 +152,13 @@ NSBezierPath* triangleIn(NSRect frame)
         return nil;
     [self setTitle:@"Tessel"];
     [self setReleasedWhenClosed:NO];
-    const CGFloat middle = 2 * kMargin + kButtonSize.height + height / 2;
-    [words setFrameOrigin:NSMakePoint(kMargin + kIconSize + kIconGap, middle - size.height / 2)];
-    NSRect sign = NSMakeRect(kMargin, middle - kIconSize / 2, kIconSize, kIconSize);
+    const CGFloat middle = 2 * kBoxMargin + kButtonSize.height + height / 2;
+    [words setFrameOrigin:NSMakePoint(kBoxMargin + kIconSize + kIconGap, middle - size.height / 2)];
+    NSRect sign = NSMakeRect(kBoxMargin, middle - kIconSize / 2, kIconSize, kIconSize);
     [[self contentView] addSubview:[[[TsMessageSign alloc] initWithFrame:sign warning:warning] autorelease]];
     [[self contentView] addSubview:words];
-    NSButton* button = [self answerAt:NSMakePoint(NSWidth(content) - kMargin - kButtonSize.width, kMargin)];
+    NSButton* button =
+        [self answerAt:NSMakePoint(NSWidth(content) - kBoxMargin - kButtonSize.width, kBoxMargin)];
     [[self contentView] addSubview:button];
     [self recalculateKeyViewLoop]; // the detail can be selected
     [self setInitialFirstResponder:button];
@@ -178,7 +179,7 @@ NSBezierPath* triangleIn(NSRect frame)
 - (void)keyDown:(NSEvent*)event
 {
     NSString* characters = [event characters];
-    if ([characters length] == 1 && [characters characterAtIndex:0] == kEscape)
+    if ([characters length] == 1 && [characters characterAtIndex:0] == kEscapeKey)
         [self answer:nil];
     else
         [super keyDown:event];

@@ -10,7 +10,7 @@ namespace tessel::windowing
 {
 namespace
 {
-constexpr CGFloat kPadding = 6;
+constexpr CGFloat kTipPadding = 6;
 
 using SetText = void (*)(id, SEL, NSAttributedString*);
 SetText toolkitSetText;
@@ -40,8 +40,8 @@ void setFrame(id window, SEL selector, NSRect frame, BOOL display)
     const NSRect screen = [[NSScreen mainScreen] frame];
     const CGFloat top = NSMaxY(frame);
     const CGFloat scale = [window userSpaceScaleFactor];
-    frame.size = NSMakeSize((std::ceil(text.width) + 2 * kPadding) * scale,
-                            (std::ceil(text.height) + kPadding) * scale);
+    frame.size = NSMakeSize((std::ceil(text.width) + 2 * kTipPadding) * scale,
+                            (std::ceil(text.height) + kTipPadding) * scale);
     frame.origin.x = std::max(NSMinX(screen), std::min(NSMinX(frame), NSMaxX(screen) - NSWidth(frame)));
     frame.origin.y = std::max(NSMinY(screen), top - NSHeight(frame));
     toolkitSetFrame(window, selector, frame, display);
@@ -55,7 +55,7 @@ void drawTip(id view, SEL, NSRect)
     [themeColor(@"lineColor") set];
     NSFrameRect(bounds);
     NSAttributedString* text = [view valueForKey:@"text"];
-    [text drawAtPoint:NSMakePoint(NSMinX(bounds) + kPadding, NSMinY(bounds) + kPadding / 2)];
+    [text drawAtPoint:NSMakePoint(NSMinX(bounds) + kTipPadding, NSMinY(bounds) + kTipPadding / 2)];
 }
 } // namespace
 

@@ -37,7 +37,7 @@ NSTextField* makeText(NSString* title)
     return text;
 }
 
-NSWindow* makeLabel(NSString* title)
+NSWindow* makeDragLabel(NSString* title)
 {
     NSTextField* text = makeText(title);
     NSWindow* label = [[NSWindow alloc] initWithContentRect:[text frame]
@@ -73,7 +73,7 @@ NSView* viewThatTakesFiles(NSWindow* window, NSPoint place)
         return nil;
     mPaths = [paths copy];
     mSource = source;
-    mLabel = makeLabel(labelOf(paths));
+    mLabel = makeDragLabel(labelOf(paths));
     return self;
 }
 

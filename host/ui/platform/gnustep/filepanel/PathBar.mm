@@ -11,7 +11,7 @@ using namespace tessel::filepanel;
 
 namespace
 {
-constexpr CGFloat kFontSize = 12;
+constexpr CGFloat kStepFontSize = 12;
 constexpr CGFloat kPadding = 20; // a button beyond its title
 constexpr CGFloat kSmallest = 30;
 constexpr CGFloat kWidest = 180;
@@ -20,7 +20,8 @@ constexpr CGFloat kGap = 2;
 NSButton* makeStep(const Step& step, bool isShown)
 {
     NSButton* button = [[[NSButton alloc] initWithFrame:NSZeroRect] autorelease];
-    NSFont* font = isShown ? [NSFont boldSystemFontOfSize:kFontSize] : [NSFont systemFontOfSize:kFontSize];
+    NSFont* font =
+        isShown ? [NSFont boldSystemFontOfSize:kStepFontSize] : [NSFont systemFontOfSize:kStepFontSize];
     NSString* title = string(shownName(step.title));
     [button setTitle:title];
     [button setFont:font];
