@@ -135,7 +135,7 @@ NSMutableArray* readyRows(std::size_t entries)
 {
     fillHistory(entries);
     NSMutableArray* rows = [NSMutableArray array];
-    for (NSString* path : tsuiEach<NSString*>(ModrigUtils::StringsFromList(gHistoryList)))
+    for (NSString* path : tsuiEach<NSString*>(ModrigUtils::StringsFromPaths(gHistoryList)))
         [rows addObject:[[[ModrigFilePath alloc] initWithFilePathName:path] autorelease]];
     return rows;
 }
@@ -253,7 +253,8 @@ double nameFiles(std::size_t files)
         [&]
         {
             BOOL isFolder = NO;
-            for (NSString* name : tsuiEach<NSString*>([manager contentsOfDirectoryAtPath:folder error:NULL]))
+            for (NSString* name : tsuiEach<NSString*>([manager contentsOfDirectoryAtPath:folder
+                                                                                   error:nullptr]))
                 if ([manager fileExistsAtPath:[folder stringByAppendingPathComponent:name]
                                   isDirectory:&isFolder])
                     ++found;

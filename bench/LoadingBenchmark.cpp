@@ -88,6 +88,7 @@ template <bool (*kLoad)(const std::wstring&)>
 double secondsBy(const std::vector<std::string>& paths)
 {
     std::vector<std::wstring> widePaths;
+    widePaths.reserve(paths.size());
     for (const std::string& path : paths)
         widePaths.push_back(bench::wide(path));
     return secondsForAll(widePaths, kLoad);
