@@ -1,6 +1,7 @@
 #include "tests/e2e_dialogs/DialogTest.h"
 
 #include <algorithm>
+#include <cstdlib>
 
 using testing::HasSubstr;
 
@@ -21,6 +22,14 @@ std::vector<std::string> listCommands(const std::string& list, const std::string
     for (std::size_t index = 0; index < paths.size(); ++index)
         commands.push_back(set + std::to_string(index + 1) + list + " " + quoted(paths[index]));
     return commands;
+}
+
+std::string pictureOf(const std::string& step)
+{
+    const auto* test = testing::UnitTest::GetInstance()->current_test_info();
+    std::string name = std::string(test->test_suite_name()) + "." + test->name() + "-" + step;
+    std::ranges::replace(name, '/', '.'); // tests with parameters have one in their names
+    return name;
 }
 } // namespace
 
@@ -148,12 +157,16 @@ void DialogTest::typeName(const std::string& name) const
     mScreen.text(name);
 }
 
+void DialogTest::TearDown()
+{
+    if (HasFailure())
+        mScreen.shoot(pictureOf("failed"));
+}
+
 void DialogTest::shoot(const std::string& step) const
 {
-    const auto* test = testing::UnitTest::GetInstance()->current_test_info();
-    std::string name = std::string(test->test_suite_name()) + "." + test->name() + "-" + step;
-    std::ranges::replace(name, '/', '.'); // tests with parameters have one in their names
-    mScreen.shoot(name);
+    if (std::getenv("MODRIG_STEP_PICTURES"))
+        mScreen.shoot(pictureOf(step));
 }
 
 bool DialogTest::prints(const std::string& text) const

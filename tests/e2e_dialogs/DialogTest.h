@@ -61,8 +61,10 @@ protected:
     bool changes(Place place, const std::string& before) const;
     // Types a name into the name field, which is empty so far.
     void typeName(const std::string& name) const;
-    // Takes a picture: <test>-<step>.png.
+    // Takes a picture, <test>-<step>.png, when the environment asks for one of every step.
     void shoot(const std::string& step) const;
+    // What is on the screen when a test has failed: <test>-failed.png.
+    void TearDown() override;
     // Waits until the host has printed the text.
     bool prints(const std::string& text) const;
     // Waits for a message box and ends it.

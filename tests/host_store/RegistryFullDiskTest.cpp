@@ -110,7 +110,7 @@ TEST_F(FullDisk, ShowsAtTheWriteInALongListToo)
 {
     constexpr int kEntries = 5000;
     makeFile(kEntries);
-    for (const rlim_t bytes : {0, 100'000, 400'000, 650'000})
+    for (const rlim_t bytes : {rlim_t{0}, rlim_t{100'000}, rlim_t{400'000}, rlim_t{650'000}})
     {
         EXPECT_THAT(rewriteWithin(bytes, kEntries),
                     StartsWith("write failed, reads 1, undone, reads 1, said: The registry"))
@@ -142,7 +142,7 @@ TEST_F(FullDisk, IsUsedAgainOnceThereIsRoom)
 
 TEST_F(FullDisk, IsToldWhenANewRegistryCannotBeMade)
 {
-    for (const rlim_t bytes : {0, 4096, 20'000})
+    for (const rlim_t bytes : {rlim_t{0}, rlim_t{4096}, rlim_t{20'000}})
     {
         const std::string answer = askChild(
             [=, this]

@@ -181,8 +181,8 @@ TEST_F(Texts, NeitherBeginNorEndWithBlanksOrLineEnds)
 {
     for (const auto& [id, text] : mTexts)
     {
-        EXPECT_FALSE(std::iswspace(text.front())) << id;
-        EXPECT_FALSE(std::iswspace(text.back())) << id;
+        EXPECT_FALSE(std::iswspace(static_cast<std::wint_t>(text.front()))) << id;
+        EXPECT_FALSE(std::iswspace(static_cast<std::wint_t>(text.back()))) << id;
         EXPECT_EQ(text.find(L'\n'), std::wstring::npos) << id;
     }
 }
