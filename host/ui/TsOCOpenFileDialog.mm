@@ -5,25 +5,13 @@
 #include <tesselui/tsuieach.h>
 #include <tesselui/tsuifilepanel.h>
 
+#include "host/ui/Label.h"
+
 namespace
 {
 const NSRect kFilterBar = {{0, 0}, {420, 44}};
 const NSRect kFilterLabel = {{16, 14}, {72, 18}}; // in line with the panel's name field
 const NSRect kFilterChoice = {{104, 10}, {308, 26}};
-constexpr CGFloat kFontSize = 13;
-
-NSTextField* makeLabel(NSString* text)
-{
-    NSTextField* label = [[[NSTextField alloc] initWithFrame:kFilterLabel] autorelease];
-    [label setStringValue:text];
-    [label setFont:[NSFont systemFontOfSize:kFontSize]];
-    [label setEditable:NO];
-    [label setSelectable:NO];
-    [label setBordered:NO];
-    [label setBezeled:NO];
-    [label setDrawsBackground:NO];
-    return label;
-}
 } // namespace
 
 // Shows the files of the chosen type: the panel's delegate while it runs.
@@ -58,14 +46,14 @@ NSTextField* makeLabel(NSString* text)
 - (NSView*)view
 {
     NSPopUpButton* choice = [[[NSPopUpButton alloc] initWithFrame:kFilterChoice pullsDown:NO] autorelease];
-    [choice setFont:[NSFont systemFontOfSize:kFontSize]];
+    [choice setFont:[NSFont systemFontOfSize:tessel::windowing::kControlFontSize]];
     for (TsOCFileFilter* filter : tsuiEach<TsOCFileFilter*>(mFilters))
         [choice addItemWithTitle:[filter description]];
     [choice setTarget:self];
     [choice setAction:@selector(onChoice:)];
     [choice setAutoresizingMask:NSViewWidthSizable];
     NSView* bar = [[[NSView alloc] initWithFrame:kFilterBar] autorelease];
-    [bar addSubview:makeLabel(@"Show:")];
+    [bar addSubview:tessel::windowing::makeLabel(@"Show:", kFilterLabel)];
     [bar addSubview:choice];
     [bar setAutoresizingMask:NSViewWidthSizable];
     return bar;

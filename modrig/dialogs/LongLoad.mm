@@ -11,7 +11,20 @@ namespace ModrigUtils
 namespace
 {
 using Clock = std::chrono::steady_clock;
+
+// Whether Escape has been pressed. The keys that have been pressed until now are taken, whatever they were.
+bool TakeEscape()
+{
+    constexpr unichar kEscape = 0x1B;
+    bool escape = false;
+    while (NSEvent* event = [NSApp nextEventMatchingMask:NSKeyDownMask
+                                               untilDate:[NSDate distantPast]
+                                                  inMode:NSEventTrackingRunLoopMode
+                                                 dequeue:YES])
+        escape |= [[event characters] length] == 1 && [[event characters] characterAtIndex:0] == kEscape;
+    return escape;
 }
+} // namespace
 
 LongLoad::LongLoad(ModrigController* controller, std::size_t files)
     : mController(controller), mWindow([[[controller view] window] retain]), mFiles(files),
@@ -31,7 +44,7 @@ bool LongLoad::IsStopped(std::size_t done)
     const LoadProgress::Time now = Clock::now();
     if (mProgress.IsTimeToTell(now))
         Say(@"IDS_MODRIG_LOADING", done);
-    if (!mProgress.IsTimeToLook(now) || !ModrigPlatform::TakeEscape())
+    if (!mProgress.IsTimeToLook(now) || !TakeEscape())
         return false;
     Say(@"IDS_MODRIG_LOADING_STOPPED", done);
     return true;

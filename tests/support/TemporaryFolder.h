@@ -59,16 +59,21 @@ private:
         return code != MAP_FAILED && munmap(code, 1) == 0;
     }
 
-    static std::filesystem::path place()
+    static bool memoryHasRoom()
     {
-        constexpr const char* kInMemory = "/dev/shm";
         constexpr std::uintmax_t kRoom = 512U << 20U;
         std::error_code missing;
         const auto space = std::filesystem::space(kInMemory, missing);
-        return !missing && space.available >= kRoom && allowsModules(kInMemory)
-                   ? std::filesystem::path(kInMemory)
-                   : std::filesystem::temp_directory_path();
+        return !missing && space.available >= kRoom && allowsModules(kInMemory);
     }
+
+    static std::filesystem::path place()
+    {
+        static const bool inMemory = memoryHasRoom(); // asked once in a program
+        return inMemory ? std::filesystem::path(kInMemory) : std::filesystem::temp_directory_path();
+    }
+
+    static constexpr const char* kInMemory = "/dev/shm";
 
     std::filesystem::path mPath;
 };

@@ -11,7 +11,4 @@ void EndWaitCursor(NSWindow* window);
 
 // Draws at once what has changed in the window.
 void DrawNow(NSWindow* window);
-
-// Whether Escape has been pressed. The keys that have been pressed until now are taken, whatever they were.
-bool TakeEscape();
 } // namespace ModrigPlatform

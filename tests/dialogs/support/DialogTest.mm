@@ -322,35 +322,13 @@ void typeNameInto(NSOpenPanel* panel, NSString* name)
 
 void clickRow(NSTableView* table, NSInteger row, NSUInteger modifiers, NSInteger clicks)
 {
-    NSWindow* window = [table window];
-    const NSRect place = [table rectOfRow:row];
-    const NSPoint point = [table convertPoint:NSMakePoint(NSMinX(place) + 10, NSMidY(place)) toView:nil];
-    for (const NSEventType type : {NSLeftMouseDown, NSLeftMouseUp})
-        [NSApp postEvent:[NSEvent mouseEventWithType:type
-                                            location:point
-                                       modifierFlags:modifiers
-                                           timestamp:0
-                                        windowNumber:[window windowNumber]
-                                             context:[window graphicsContext]
-                                         eventNumber:0
-                                          clickCount:clicks
-                                            pressure:1]
-                 atStart:NO];
+    events::postClick(table, events::placeOnRow(table, row), static_cast<unsigned>(modifiers),
+                      static_cast<int>(clicks));
 }
 
 void pressKey(NSWindow* window, NSString* characters, NSUInteger modifiers)
 {
-    [NSApp postEvent:[NSEvent keyEventWithType:NSKeyDown
-                                            location:NSZeroPoint
-                                       modifierFlags:modifiers
-                                           timestamp:0
-                                        windowNumber:[window windowNumber]
-                                             context:[window graphicsContext]
-                                          characters:characters
-                         charactersIgnoringModifiers:characters
-                                           isARepeat:NO
-                                             keyCode:0]
-             atStart:NO];
+    events::postKey(window, characters, static_cast<unsigned>(modifiers));
 }
 
 // Stands for the pasteboard and the drag itself; answers what the drop targets ask.

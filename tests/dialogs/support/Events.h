@@ -9,10 +9,16 @@ namespace events
 {
 // Clicks there, in the view's coordinates, so many times as one double or triple click is.
 void click(NSView* view, NSPoint place, unsigned modifiers = 0, int clicks = 1);
-// Clicks on the row, in the table's first column.
+// A place on the row, in the table's first column.
+NSPoint placeOnRow(NSTableView* table, NSInteger row);
+// Clicks on the row, there.
 void clickRow(NSTableView* table, NSInteger row, unsigned modifiers = 0, int clicks = 1);
 
 void press(NSWindow* window, NSString* characters, unsigned modifiers = 0);
+
+// The same for a run of events that is still to come: a modal one, say. They wait for it.
+void postClick(NSView* view, NSPoint place, unsigned modifiers, int clicks);
+void postKey(NSWindow* window, NSString* characters, unsigned modifiers);
 
 // Moves the pointer there, in the view's coordinates.
 void movePointerTo(NSView* view, NSPoint place);

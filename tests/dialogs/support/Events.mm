@@ -79,23 +79,32 @@ bool comesTrue(const std::function<bool()>& condition)
     return condition();
 }
 
+void postClick(NSView* view, NSPoint place, unsigned modifiers, int clicks)
+{
+    const NSPoint point = [view convertPoint:place toView:nil];
+    for (const NSEventType type : {NSLeftMouseDown, NSLeftMouseUp})
+        [NSApp postEvent:mouse(type, [view window], point, modifiers, clicks) atStart:NO];
+}
+
 void click(NSView* view, NSPoint place, unsigned modifiers, int clicks)
 {
-    NSWindow* window = [view window];
-    const NSPoint point = [view convertPoint:place toView:nil];
     for (int count = 1; count <= clicks; ++count)
-        for (const NSEventType type : {NSLeftMouseDown, NSLeftMouseUp})
-            [NSApp postEvent:mouse(type, window, point, modifiers, count) atStart:NO];
+        postClick(view, place, modifiers, count);
     pump();
+}
+
+NSPoint placeOnRow(NSTableView* table, NSInteger row)
+{
+    const NSRect place = [table rectOfRow:row];
+    return NSMakePoint(NSMinX(place) + 10, NSMidY(place));
 }
 
 void clickRow(NSTableView* table, NSInteger row, unsigned modifiers, int clicks)
 {
-    const NSRect place = [table rectOfRow:row];
-    click(table, NSMakePoint(NSMinX(place) + 10, NSMidY(place)), modifiers, clicks);
+    click(table, placeOnRow(table, row), modifiers, clicks);
 }
 
-void press(NSWindow* window, NSString* characters, unsigned modifiers)
+void postKey(NSWindow* window, NSString* characters, unsigned modifiers)
 {
     [NSApp postEvent:[NSEvent keyEventWithType:NSKeyDown
                                             location:NSZeroPoint
@@ -108,6 +117,11 @@ void press(NSWindow* window, NSString* characters, unsigned modifiers)
                                            isARepeat:NO
                                              keyCode:0]
              atStart:NO];
+}
+
+void press(NSWindow* window, NSString* characters, unsigned modifiers)
+{
+    postKey(window, characters, modifiers);
     pump();
 }
 } // namespace events

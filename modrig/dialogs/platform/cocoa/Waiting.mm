@@ -15,16 +15,4 @@ void DrawNow(NSWindow* window)
 {
     [window displayIfNeeded];
 }
-
-bool TakeEscape()
-{
-    constexpr unichar kEscape = 0x1B;
-    bool escape = false;
-    while (NSEvent* event = [NSApp nextEventMatchingMask:NSKeyDownMask
-                                               untilDate:[NSDate distantPast]
-                                                  inMode:NSEventTrackingRunLoopMode
-                                                 dequeue:YES])
-        escape |= [[event characters] length] == 1 && [[event characters] characterAtIndex:0] == kEscape;
-    return escape;
-}
 } // namespace ModrigPlatform

@@ -3,6 +3,7 @@
 #include <tesselui/tsuieach.h>
 #include <tesselui/tsuifilepanel.h>
 
+#include "host/ui/Label.h"
 #import "host/ui/platform/gnustep/filepanel/FileNameCell.h"
 #import "host/ui/platform/gnustep/filepanel/FilePanel.h"
 #import "host/ui/platform/gnustep/filepanel/FileTable.h"
@@ -11,6 +12,8 @@
 #include "host/ui/platform/gnustep/filepanel/Words.h"
 
 using namespace tessel::filepanel;
+using tessel::windowing::kControlFontSize;
+using tessel::windowing::makeLabel;
 
 // Places its parts by the panel's own rule whenever its size changes.
 @interface TsFilePanelView : NSView
@@ -39,30 +42,16 @@ constexpr CGFloat kRowHeight = 20;
 constexpr CGFloat kKindWidth = 110;
 constexpr CGFloat kDateWidth = 150;
 constexpr CGFloat kSmallestColumn = 60;
-constexpr CGFloat kFontSize = 13;
 
 NSButton* makeButton(NSString* title, id target, SEL action)
 {
     NSButton* button = [[[NSButton alloc] initWithFrame:NSMakeRect(0, 0, kButtonWidth, 28)] autorelease];
     [button setTitle:title];
     [button setBezelStyle:NSRoundedBezelStyle];
-    [button setFont:[NSFont systemFontOfSize:kFontSize]];
+    [button setFont:[NSFont systemFontOfSize:kControlFontSize]];
     [button setTarget:target];
     [button setAction:action];
     return button;
-}
-
-NSTextField* makeLabel(NSString* text, NSRect frame)
-{
-    NSTextField* label = [[[NSTextField alloc] initWithFrame:frame] autorelease];
-    [label setStringValue:text];
-    [label setFont:[NSFont systemFontOfSize:kFontSize]];
-    [label setEditable:NO];
-    [label setSelectable:NO];
-    [label setBordered:NO];
-    [label setBezeled:NO];
-    [label setDrawsBackground:NO];
-    return label;
 }
 
 NSView* makeRow(NSView* content)
@@ -124,7 +113,7 @@ NSTextFieldCell* makeTextCell()
     place(makeButton(word(@"UP"), self, @selector(goUp:)), row, kMargin, 56, kControlHeight);
     place(makeButton(word(@"HOME"), self, @selector(goHome:)), row, kMargin + 60, 84, kControlHeight);
     mRecent = [[[NSPopUpButton alloc] initWithFrame:NSMakeRect(0, 0, 100, 26) pullsDown:YES] autorelease];
-    [mRecent setFont:[NSFont systemFontOfSize:kFontSize]];
+    [mRecent setFont:[NSFont systemFontOfSize:kControlFontSize]];
     [mRecent setTarget:self];
     [mRecent setAction:@selector(goToRecent:)];
     [mRecent setToolTip:word(@"RECENT_TIP")];
@@ -165,7 +154,7 @@ NSTextFieldCell* makeTextCell()
 {
     place(makeLabel(word(@"NAME_FIELD"), NSZeroRect), row, 16, 72, 18);
     mName = [[[NSTextField alloc] initWithFrame:NSZeroRect] autorelease];
-    [mName setFont:[NSFont systemFontOfSize:kFontSize]];
+    [mName setFont:[NSFont systemFontOfSize:kControlFontSize]];
     [mName setDelegate:(id)self];
     [[mName cell] setSendsActionOnEndEditing:NO];
     [[mName cell] setScrollable:YES];
@@ -174,7 +163,7 @@ NSTextFieldCell* makeTextCell()
     mHidden = [[[NSButton alloc] initWithFrame:NSZeroRect] autorelease];
     [mHidden setButtonType:NSSwitchButton];
     [mHidden setTitle:word(@"HIDDEN_FILES")];
-    [mHidden setFont:[NSFont systemFontOfSize:kFontSize]];
+    [mHidden setFont:[NSFont systemFontOfSize:kControlFontSize]];
     [mHidden setTarget:self];
     [mHidden setAction:@selector(toggleHidden:)];
     place(mHidden, row, kMargin, kSwitchWidth, 20, true);
