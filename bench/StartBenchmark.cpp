@@ -19,7 +19,7 @@ extern char** environ;
 
 namespace
 {
-constexpr int kRepetitions = 15;
+constexpr int kStartRepetitions = 15;
 
 double secondsOf(const timeval& time)
 {
@@ -66,7 +66,7 @@ void add(const std::string& name, const std::vector<std::string>& arguments)
                                  })
         ->UseManualTime()
         ->Iterations(1)
-        ->Repetitions(kRepetitions);
+        ->Repetitions(kStartRepetitions);
 }
 } // namespace
 

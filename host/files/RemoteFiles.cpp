@@ -23,7 +23,7 @@ namespace
 {
 constexpr const char* kOriginFile = ".url";
 constexpr const char* kUnnamedFile = "download";
-constexpr std::size_t kLongestName = 200; // in bytes; a file system takes 255
+constexpr std::size_t kLongestFileName = 200; // in bytes; a file system takes 255
 
 // FNV-1a; the URL beside the copy tells two with the same hash apart.
 std::uint64_t hashOf(const std::string& text)
@@ -50,8 +50,8 @@ std::string fileNameOf(const std::string& url)
     const std::size_t slash = path.rfind('/');
     std::string name = slash == std::string::npos || slash < host ? "" : path.substr(slash + 1);
     std::replace(name.begin(), name.end(), '\\', '_');
-    if (name.size() > kLongestName) // the end tells the kind
-        name.erase(0, firstCharacter(name, name.size() - kLongestName));
+    if (name.size() > kLongestFileName) // the end tells the kind
+        name.erase(0, firstCharacter(name, name.size() - kLongestFileName));
     const bool unusable = name.empty() || name == "." || name == ".." || name == kOriginFile;
     return unusable ? kUnnamedFile : name;
 }

@@ -37,7 +37,7 @@ std::string modrigBundle()
     return MODRIG_BUNDLE;
 }
 
-std::string quoted(const std::string& text)
+std::string inQuotes(const std::string& text)
 {
     std::string result = "\"";
     for (const char character : text)
@@ -47,7 +47,7 @@ std::string quoted(const std::string& text)
 
 std::string setInSuite(const std::string& name, const std::string& data)
 {
-    return std::string("REGISTRY SET ") + kSuiteKey + " " + name + " " + quoted(data);
+    return std::string("REGISTRY SET ") + kSuiteKey + " " + name + " " + inQuotes(data);
 }
 
 std::vector<std::string> byArguments(const std::vector<std::string>& commands)

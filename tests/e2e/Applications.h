@@ -26,7 +26,7 @@ std::string lispFixture(const std::string& name);
 std::string modrigBundle();
 
 // An argument of a command, in quotes.
-std::string quoted(const std::string& text);
+std::string inQuotes(const std::string& text);
 
 // A command that puts a value into the stored Startup Suite.
 std::string setInSuite(const std::string& name, const std::string& data);

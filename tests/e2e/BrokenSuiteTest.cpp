@@ -76,7 +76,7 @@ class BrokenModules : public BrokenSuite, public testing::WithParamInterface<Bro
 {
 };
 
-std::string nameOf(const testing::TestParamInfo<BrokenModule>& info)
+std::string nameOfModule(const testing::TestParamInfo<BrokenModule>& info)
 {
     return fs::path(info.param.file).stem();
 }
@@ -125,7 +125,7 @@ INSTANTIATE_TEST_SUITE_P(
         BrokenModule{"Raises.bundle",
                      "its entry point threw an exception: NSInvalidArgumentException: the tea is cold"},
         BrokenModule{"Missing.bundle", "No such file or directory"}),
-    nameOf);
+    nameOfModule);
 
 TEST_F(BrokenSuite, SaysThatAModuleIsCutShort)
 {
