@@ -38,7 +38,7 @@ protected:
     {
         const auto last = session.folder().write("last.lsp", "(write-line \"last.lsp: loaded\")\n").string();
         storeSuite(session, {lispFixture("good.lsp"), path, last});
-        // Every file but the last is followed by the prompt, and what comes next stands behind it.
+        // Every file but the last is followed by the prompt, and what comes next stands after it.
         return between(std::string(kGoodLisp) + "\nReady. ",
                        std::string("\nReady. last.lsp: loaded\n") + kLispReady + kStillThere);
     }
@@ -84,7 +84,7 @@ std::string nameOfModule(const testing::TestParamInfo<BrokenModule>& info)
 struct BrokenLisp
 {
     const char* file;
-    const char* reason; // behind the path
+    const char* reason; // after the path
     const char* saidBefore = "";
 };
 

@@ -25,7 +25,7 @@ protected:
         session.startBy("exec '" + (copy / "Tessel").string() + "' \"$@\"");
     }
 
-    // What is said behind the banner.
+    // What is said after the banner.
     HostResult run(const std::vector<std::string>& commands) const
     {
         HostResult result = session.run(commands);

@@ -40,7 +40,7 @@ public:
     HostResult runScript(const std::string& lines) const;
     HostResult runPipe(const std::string& lines) const;
 
-    // Starts the host with these arguments behind `--profile-dir`, and gives it the text to read.
+    // Starts the host with these arguments after `--profile-dir`, and gives it the text to read.
     HostResult start(const std::vector<std::string>& arguments, const std::string& input = {}) const;
 
     // Arguments that are put in front of all others, such as "--safe".

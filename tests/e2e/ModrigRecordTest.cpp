@@ -20,7 +20,7 @@ std::string modrigLoaded()
 class ModrigRecord : public testing::Test
 {
 protected:
-    // Runs the commands and answers what is said behind the banner.
+    // Runs the commands and answers what is said after the banner.
     std::string run(const std::vector<std::string>& commands) const
     {
         const auto result = session.run(commands);

@@ -25,7 +25,7 @@ constexpr char kFebruary2027[] = "   February 2027\n"
 class StartupSuite : public testing::Test
 {
 protected:
-    // Starts with the Suite and lists what is loaded; the output behind the banner.
+    // Starts with the Suite and lists what is loaded; the output after the banner.
     std::string startWith(const Paths& suite)
     {
         storeSuite(session, suite);
@@ -104,7 +104,7 @@ TEST_F(StartupSuite, LoadsADuplicateInOtherLetterCaseOnce)
                   listed(lispFixture("good.lsp"), "Lisp"));
 }
 
-TEST_F(StartupSuite, GoesOnBehindMissingFilesAndNamesThem)
+TEST_F(StartupSuite, GoesOnAfterMissingFilesAndNamesThem)
 {
     const std::string module = "/nowhere/at all/100%s.zmb";
     const std::string lisp = "/nowhere/größe.lsp";

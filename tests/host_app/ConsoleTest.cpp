@@ -55,7 +55,7 @@ protected:
 };
 } // namespace
 
-TEST_F(Console, EchoesEachLineBehindThePrompt)
+TEST_F(Console, EchoesEachLineAfterThePrompt)
 {
     EXPECT_TRUE(runLines("HELP\n\nVERSION"));
     EXPECT_THAT(runner.inputs, ElementsAre(L"HELP", L"VERSION"));

@@ -45,7 +45,7 @@ struct Parts
     {
         return drive[0] == L'\0' && folder[0] == L'\0' && name[0] == L'\0' && extension[0] == L'\0';
     }
-    bool areUntouchedBehindTheFirst() const
+    bool areUntouchedAfterTheFirst() const
     {
         const std::wstring rest(kPartRoom - 1, L'?');
         return drive.substr(1) == rest && folder.substr(1) == rest && name.substr(1) == rest &&
@@ -105,7 +105,7 @@ TEST(SplitPathBuffers, AreAllEmptiedWhenOnePartDoesNotFit)
         Parts parts;
         EXPECT_EQ(parts.split(L"C:/xy/tool.lsp", size[0], size[1], size[2], size[3]), ERANGE);
         EXPECT_TRUE(parts.areEmpty());
-        EXPECT_TRUE(parts.areUntouchedBehindTheFirst());
+        EXPECT_TRUE(parts.areUntouchedAfterTheFirst());
     }
 }
 
