@@ -53,6 +53,8 @@ Result<> Host::makeParts()
     mParts = std::make_unique<Parts>(
         Foundations{mCommandLine, mEndRequest, mOptions.profileFolder, mOptions.downloads});
     mCommandLine.tell(mParts->registry->canStore());
+    if (const std::wstring& notice = mParts->registry->notice(); !notice.empty())
+        mCommandLine.say(notice);
     if (const Outcome& started = mParts->startedLisp; !started)
         return started.failure();
     mInterruptible = &mParts->lisp();
@@ -131,6 +133,7 @@ void Host::end()
         mCommandLine.print(L"\n");
     mParts->linker->unloadAll();
     mCommandLine.tell(mParts->registry->endOfCommand());
+    mCommandLine.tell(mParts->registry->keepCopy());
     mInterruptible = nullptr;
     mParts.reset();
 }
