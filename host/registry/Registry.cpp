@@ -32,6 +32,12 @@ std::wstring_view takePart(std::wstring_view& path)
     return part;
 }
 
+// The store has tried for ten seconds, and would for every row.
+bool isLockRefused(int status)
+{
+    return status == SQLITE_PROTOCOL;
+}
+
 Failure noSuchValue()
 {
     return {L"There is no such value.", ERROR_FILE_NOT_FOUND};
@@ -58,7 +64,7 @@ Registry::~Registry()
 Registry::Key Registry::findChild(Key parent, std::wstring_view name)
 {
     Statement& find = mStatements->findKey;
-    if (!isRow(find, find.bind(parent).bind(foldCase(name)).step()))
+    if (step(find.bind(parent).bind(foldCase(name))) != SQLITE_ROW)
         return kNoKey;
     const Key key = find.number(0);
     find.reset();
@@ -122,7 +128,7 @@ std::vector<std::wstring> Registry::subKeys(Key key)
     beginReading();
     Statement& list = mStatements->subKeys;
     list.bind(key);
-    for (std::int64_t last = 0; isNext(list, list.step(), last);)
+    for (std::int64_t last = 0; isNext(list, last);)
         names.push_back(list.text(kThird));
     return names;
 }
@@ -145,8 +151,8 @@ Result<std::wstring> Registry::readValue(Key key, std::wstring_view name)
         return noSuchValue();
     lookInto(key);
     Statement& read = mStatements->readValue;
-    const int status = read.bind(key).bind(foldCase(name)).step();
-    if (!isRow(read, status))
+    const int status = step(read.bind(key).bind(foldCase(name)));
+    if (status != SQLITE_ROW)
         return status == SQLITE_DONE ? noSuchValue() : Failure{mCommand.sentence(), ERROR_READ_FAULT};
     std::wstring data = read.text(kThird);
     read.reset();
@@ -183,7 +189,7 @@ Result<std::wstring> Registry::valueName(Key key, DWORD index)
     find.bind(key).bind(next ? mCursor.sequence : std::int64_t{index});
     std::int64_t sequence = next ? mCursor.sequence : 0;
     // A store that cannot be read has no more items either: whoever walks it must come to an end.
-    if (!isNext(find, find.step(), sequence))
+    if (!isNext(find, sequence))
         return noMoreValues();
     mCursor = {key, index, sequence};
     std::wstring name = find.text(kThird);
@@ -199,7 +205,7 @@ std::vector<Registry::Value> Registry::values(Key key)
     lookInto(key);
     Statement& list = mStatements->values;
     list.bind(key);
-    for (std::int64_t last = 0; isNext(list, list.step(), last);)
+    for (std::int64_t last = 0; isNext(list, last);)
         found.push_back({list.text(kThird), list.text(kFourth)});
     return found;
 }
@@ -290,28 +296,28 @@ Result<> Registry::finishWrite(int status)
 }
 
 // What could not be read must not be mistaken for what is not there and then be overwritten. The command's
-// end tells it. Every row says in its second column whether it is what was stored.
-bool Registry::isRow(Statement& statement, int status)
+// end tells it. Every row says in its second column whether it is what was stored; one that is not is no row.
+int Registry::step(Statement& statement)
 {
-    if (status == SQLITE_DONE)
-        return false;
-    if (status == SQLITE_ROW && statement.number(1) == 1)
-        return true;
-    if (status == SQLITE_ROW)
+    const int status = mCannotLock ? SQLITE_PROTOCOL : statement.step();
+    if (status == SQLITE_DONE || (status == SQLITE_ROW && statement.number(1) == 1))
+        return status;
+    if (status != SQLITE_ROW)
     {
-        statement.reset();
-        static_cast<void>(failRead(L"a row of it is not what was stored there", SQLITE_CORRUPT));
+        mCannotLock = isLockRefused(status);
+        static_cast<void>(failRead(toWide(sqlite3_errstr(status)), status));
+        return status;
     }
-    else
-        static_cast<void>(failRead(storeFailure(mDatabase, status).sentence, status));
-    return false;
+    statement.reset();
+    static_cast<void>(failRead(L"a row of it is not what was stored there", SQLITE_CORRUPT));
+    return SQLITE_CORRUPT;
 }
 
 // Of rows that come in the order of their first column, which only an index that is damaged does not keep: it
 // could lead round and round.
-bool Registry::isNext(Statement& statement, int status, std::int64_t& last)
+bool Registry::isNext(Statement& statement, std::int64_t& last)
 {
-    if (!isRow(statement, status))
+    if (step(statement) != SQLITE_ROW)
         return false;
     if (const std::int64_t number = statement.number(0); number > last)
     {

@@ -143,8 +143,8 @@ private:
     Result<> checkBeforeRemoval();
     Result<> checkPlace();
     Result<> finishWrite(int status);
-    bool isRow(Statement& statement, int status);
-    bool isNext(Statement& statement, int status, std::int64_t& last);
+    int step(Statement& statement);
+    bool isNext(Statement& statement, std::int64_t& last);
     Failure fail(int status, const wchar_t* done);
     Failure failRead(const std::wstring& words, int status);
     Failure giveUp(Failure failure);
@@ -161,6 +161,7 @@ private:
     bool mLookedAt = false;  // the file is known to be sound
     bool mHasStored = false; // since the copy was made
     bool mDamaged = false;
+    bool mCannotLock = false; // for as long as the session lasts: the file system refuses
     std::unique_ptr<Statements> mStatements;
     Cursor mCursor;
     Result<> mCommand;                         // the running one, or what failed in it first

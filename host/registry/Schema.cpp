@@ -58,7 +58,8 @@ constexpr std::array kTakeOver = {
     " WHERE name='key' AND EXISTS(SELECT 1 FROM sqlite_sequence WHERE name='old_key')",
     "UPDATE sqlite_sequence SET seq=(SELECT seq FROM sqlite_sequence WHERE name='old_value')"
     " WHERE name='value' AND EXISTS(SELECT 1 FROM sqlite_sequence WHERE name='old_value')",
-    "DROP TABLE old_value", "DROP TABLE old_key"};
+    "DROP TABLE old_value",
+    "DROP TABLE old_key"};
 
 constexpr std::array kMakeRoom = {"DROP INDEX value_order", "DROP INDEX key_order",
                                   "ALTER TABLE value RENAME TO old_value",
@@ -153,7 +154,8 @@ bool isDefined(const Definitions& definitions, const std::string& name, const st
     return false;
 }
 
-// What the store makes for itself and runs nothing: indexes of unique columns, numbers given away, statistics.
+// What the store makes for itself and runs nothing: indexes of unique columns, numbers given away,
+// statistics.
 bool isOfTheStore(const std::string& type, const std::string& name)
 {
     return (type == "table" || type == "index") && name.starts_with("sqlite_");

@@ -184,8 +184,8 @@ Result<std::filesystem::path> putSoundCopyBack(const std::filesystem::path& file
         return notRestored(file, L"there is no copy of an earlier state");
     const auto bytes = readCopy(copy);
     if (!bytes)
-        return notRestored(file, L"its copy " + toWide(copy.string()) + L" cannot be used: " +
-                                     bytes.sentence());
+        return notRestored(file,
+                           L"its copy " + toWide(copy.string()) + L" cannot be used: " + bytes.sentence());
     const auto kept = beside(file, ".damaged");
     auto done = nameToo(file, kept);
     if (done)

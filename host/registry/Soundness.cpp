@@ -9,7 +9,8 @@ namespace
 {
 constexpr int kDeepestKey = 100; // of a path that is told
 
-// A start takes a fifth of a second where it is quick, and a look at so many pages of 4096 bytes a tenth of it.
+// A start takes a fifth of a second where it is quick, and a look at so many pages of 4096 bytes a tenth of
+// it.
 constexpr std::int64_t kPagesInATenthOfAStart = 500;
 
 Result<> checkPages(sqlite3* database)
@@ -62,9 +63,8 @@ Result<> checkSoundness(sqlite3* database, int version)
                       "SELECT parent, name FROM key WHERE sum IS NOT row_sum(parent, name, fold) LIMIT 1");
     if (!sound)
         return sound;
-    return checkRows(
-        database, L"the value",
-        "SELECT key, name FROM value WHERE sum IS NOT row_sum(key, name, fold, data) LIMIT 1");
+    return checkRows(database, L"the value",
+                     "SELECT key, name FROM value WHERE sum IS NOT row_sum(key, name, fold, data) LIMIT 1");
 }
 
 unsigned startsBetweenLooks(sqlite3* database)

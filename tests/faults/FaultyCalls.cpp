@@ -1,11 +1,14 @@
-// Preloaded into a program, makes system calls on a registry's files fail, as a disk, a network or a quota would.
+// Preloaded into a program, makes system calls on a registry's files fail, as a disk, a network or a quota
+// would.
 //
-//     MODRIG_FAULT="pwrite 3 once"     the third call fails; "ever": that one and all after it
+//     MODRIG_FAULT="pwrite 3 once"     the third call fails; "ever": that one and all after it; a number
+//     after
+//                                      that is the error, in place of the usual one
 //     MODRIG_FAULT_COUNTS=file         tells at the end how many calls of each kind there were
 //     MODRIG_FAULT_NETWORK=1           every folder lies on another machine
 //
-// What a failing call would have done is not done; of a write, half of it is, and a file that is to be closed is
-// closed.
+// What a failing call would have done is not done; of a write, half of it is, and a file that is to be closed
+// is closed.
 #include <array>
 #include <atomic>
 #include <cerrno>
@@ -46,7 +49,7 @@ Kind kPwrite{"pwrite", ENOSPC};
 Kind kFsync{"fsync", EIO};
 Kind kFdatasync{"fdatasync", EIO};
 Kind kFtruncate{"ftruncate", EFBIG};
-Kind kFcntl{"fcntl", ENOLCK};
+Kind kFcntl{"fcntl", EIO};
 Kind kUnlink{"unlink", EACCES};
 Kind kMmap{"mmap", ENOMEM};
 Kind kMunmap{"munmap", EINVAL};
@@ -59,9 +62,9 @@ Kind kLink{"link", EPERM};
 Kind kFchmod{"fchmod", EPERM};
 Kind kMkostemp{"mkostemp", ENOSPC};
 
-const std::array kKinds = {&kOpen, &kRead,   &kPread, &kWrite, &kPwrite, &kFsync,  &kFdatasync,
-                           &kFtruncate, &kFcntl, &kUnlink, &kMmap, &kMunmap, &kClose, &kStat,
-                           &kFstat, &kAccess, &kRename, &kLink, &kFchmod, &kMkostemp};
+const std::array kKinds = {&kOpen,      &kRead,   &kPread,  &kWrite, &kPwrite, &kFsync,   &kFdatasync,
+                           &kFtruncate, &kFcntl,  &kUnlink, &kMmap,  &kMunmap, &kClose,   &kStat,
+                           &kFstat,     &kAccess, &kRename, &kLink,  &kFchmod, &kMkostemp};
 
 // The maps of the files, by their addresses.
 std::array<std::atomic<void*>, 64> theMaps = {};
@@ -92,6 +95,7 @@ struct Fault
     char kind[16] = {};
     unsigned number = 0;
     bool lasting = false;
+    int error = 0;
 };
 
 Fault readFault()
@@ -99,7 +103,7 @@ Fault readFault()
     Fault fault;
     char duration[8] = {};
     if (const char* text = std::getenv("MODRIG_FAULT"))
-        std::sscanf(text, "%15s %u %7s", fault.kind, &fault.number, duration);
+        std::sscanf(text, "%15s %u %7s %d", fault.kind, &fault.number, duration, &fault.error);
     fault.lasting = std::string_view(duration) == "ever";
     return fault;
 }
@@ -112,7 +116,7 @@ bool fails(Kind& kind)
     if (std::string_view(fault.kind) != kind.name || number < fault.number ||
         (number > fault.number && !fault.lasting))
         return false;
-    errno = kind.error;
+    errno = fault.error != 0 ? fault.error : kind.error;
     return true;
 }
 
@@ -144,14 +148,14 @@ struct Counts
 } theCounts;
 } // namespace
 
-#define OPENING(function)                                                                                   \
-    INTERPOSED int function(const char* path, int flags, ...)                                              \
-    {                                                                                                      \
-        va_list arguments;                                                                                 \
-        va_start(arguments, flags);                                                                        \
-        const mode_t mode = va_arg(arguments, mode_t);                                                     \
-        va_end(arguments);                                                                                 \
-        return fails(kOpen, path) ? -1 : next<int(const char*, int, ...)>(#function)(path, flags, mode);   \
+#define OPENING(function)                                                                                    \
+    INTERPOSED int function(const char* path, int flags, ...)                                                \
+    {                                                                                                        \
+        va_list arguments;                                                                                   \
+        va_start(arguments, flags);                                                                          \
+        const mode_t mode = va_arg(arguments, mode_t);                                                       \
+        va_end(arguments);                                                                                   \
+        return fails(kOpen, path) ? -1 : next<int(const char*, int, ...)>(#function)(path, flags, mode);     \
     }
 OPENING(open)
 OPENING(open64)
@@ -161,10 +165,10 @@ INTERPOSED ssize_t read(int file, void* bytes, size_t count)
     return fails(kRead, file) ? -1 : next<decltype(read)>("read")(file, bytes, count);
 }
 
-#define READING(function)                                                                                   \
-    INTERPOSED ssize_t function(int file, void* bytes, size_t count, off_t offset)                         \
-    {                                                                                                      \
-        return fails(kPread, file) ? -1 : next<decltype(pread)>(#function)(file, bytes, count, offset);    \
+#define READING(function)                                                                                    \
+    INTERPOSED ssize_t function(int file, void* bytes, size_t count, off_t offset)                           \
+    {                                                                                                        \
+        return fails(kPread, file) ? -1 : next<decltype(pread)>(#function)(file, bytes, count, offset);      \
     }
 READING(pread)
 READING(pread64)
@@ -180,16 +184,16 @@ INTERPOSED ssize_t write(int file, const void* bytes, size_t count)
     return -1;
 }
 
-#define WRITING(function)                                                                                   \
-    INTERPOSED ssize_t function(int file, const void* bytes, size_t count, off_t offset)                   \
-    {                                                                                                      \
-        const auto perform = next<decltype(pwrite)>(#function);                                            \
-        if (!fails(kPwrite, file))                                                                         \
-            return perform(file, bytes, count, offset);                                                    \
-        const int error = errno;                                                                           \
-        static_cast<void>(perform(file, bytes, count / 2, offset));                                        \
-        errno = error;                                                                                     \
-        return -1;                                                                                         \
+#define WRITING(function)                                                                                    \
+    INTERPOSED ssize_t function(int file, const void* bytes, size_t count, off_t offset)                     \
+    {                                                                                                        \
+        const auto perform = next<decltype(pwrite)>(#function);                                              \
+        if (!fails(kPwrite, file))                                                                           \
+            return perform(file, bytes, count, offset);                                                      \
+        const int error = errno;                                                                             \
+        static_cast<void>(perform(file, bytes, count / 2, offset));                                          \
+        errno = error;                                                                                       \
+        return -1;                                                                                           \
     }
 WRITING(pwrite)
 WRITING(pwrite64)
@@ -204,22 +208,22 @@ INTERPOSED int fdatasync(int file)
     return fails(kFdatasync, file) ? -1 : next<decltype(fdatasync)>("fdatasync")(file);
 }
 
-#define TRUNCATING(function)                                                                                \
-    INTERPOSED int function(int file, off_t size) noexcept                                                 \
-    {                                                                                                      \
-        return fails(kFtruncate, file) ? -1 : next<int(int, off_t)>(#function)(file, size);                \
+#define TRUNCATING(function)                                                                                 \
+    INTERPOSED int function(int file, off_t size) noexcept                                                   \
+    {                                                                                                        \
+        return fails(kFtruncate, file) ? -1 : next<int(int, off_t)>(#function)(file, size);                  \
     }
 TRUNCATING(ftruncate)
 TRUNCATING(ftruncate64)
 
-#define CONTROLLING(function)                                                                               \
-    INTERPOSED int function(int file, int command, ...)                                                    \
-    {                                                                                                      \
-        va_list arguments;                                                                                 \
-        va_start(arguments, command);                                                                      \
-        void* const argument = va_arg(arguments, void*);                                                   \
-        va_end(arguments);                                                                                 \
-        return fails(kFcntl, file) ? -1 : next<int(int, int, ...)>(#function)(file, command, argument);    \
+#define CONTROLLING(function)                                                                                \
+    INTERPOSED int function(int file, int command, ...)                                                      \
+    {                                                                                                        \
+        va_list arguments;                                                                                   \
+        va_start(arguments, command);                                                                        \
+        void* const argument = va_arg(arguments, void*);                                                     \
+        va_end(arguments);                                                                                   \
+        return fails(kFcntl, file) ? -1 : next<int(int, int, ...)>(#function)(file, command, argument);      \
     }
 CONTROLLING(fcntl)
 CONTROLLING(fcntl64)
@@ -229,20 +233,19 @@ INTERPOSED int unlink(const char* path) noexcept
     return fails(kUnlink, path) ? -1 : next<int(const char*)>("unlink")(path);
 }
 
-#define MAPPING(function)                                                                                   \
-    INTERPOSED void* function(void* at, size_t size, int protection, int flags, int file,                  \
-                              off_t offset) noexcept                                                       \
-    {                                                                                                      \
-        const bool meant = file >= 0 && isMeant(file);                                                     \
-        if (meant && fails(kMmap))                                                                         \
-            return MAP_FAILED;                                                                             \
-        void* const map =                                                                                  \
-            next<void*(void*, size_t, int, int, int, off_t)>(#function)(at, size, protection, flags, file, \
-                                                                        offset);                           \
-        for (auto& known : theMaps)                                                                        \
-            if (void* none = nullptr; meant && known.compare_exchange_strong(none, map))                   \
-                break;                                                                                     \
-        return map;                                                                                        \
+#define MAPPING(function)                                                                                    \
+    INTERPOSED void* function(void* at, size_t size, int protection, int flags, int file,                    \
+                              off_t offset) noexcept                                                         \
+    {                                                                                                        \
+        const bool meant = file >= 0 && isMeant(file);                                                       \
+        if (meant && fails(kMmap))                                                                           \
+            return MAP_FAILED;                                                                               \
+        void* const map = next<void*(void*, size_t, int, int, int, off_t)>(#function)(at, size, protection,  \
+                                                                                      flags, file, offset);  \
+        for (auto& known : theMaps)                                                                          \
+            if (void* none = nullptr; meant && known.compare_exchange_strong(none, map))                     \
+                break;                                                                                       \
+        return map;                                                                                          \
     }
 MAPPING(mmap)
 MAPPING(mmap64)
@@ -266,19 +269,19 @@ INTERPOSED int close(int file)
     return failing ? -1 : status;
 }
 
-#define ASKING(function, kind, Which)                                                                       \
-    INTERPOSED int function(Which which, struct stat* status) noexcept                                     \
-    {                                                                                                      \
-        return fails(kind, which) ? -1 : next<int(Which, struct stat*)>(#function)(which, status);         \
+#define ASKING(function, kind, Which)                                                                        \
+    INTERPOSED int function(Which which, struct stat* status) noexcept                                       \
+    {                                                                                                        \
+        return fails(kind, which) ? -1 : next<int(Which, struct stat*)>(#function)(which, status);           \
     }
 ASKING(stat, kStat, const char*)
 ASKING(lstat, kStat, const char*)
 ASKING(fstat, kFstat, int)
 
-#define ASKING_64(function, kind, Which)                                                                    \
-    INTERPOSED int function(Which which, struct stat64* status) noexcept                                   \
-    {                                                                                                      \
-        return fails(kind, which) ? -1 : next<int(Which, struct stat64*)>(#function)(which, status);       \
+#define ASKING_64(function, kind, Which)                                                                     \
+    INTERPOSED int function(Which which, struct stat64* status) noexcept                                     \
+    {                                                                                                        \
+        return fails(kind, which) ? -1 : next<int(Which, struct stat64*)>(#function)(which, status);         \
     }
 ASKING_64(stat64, kStat, const char*)
 ASKING_64(lstat64, kStat, const char*)
@@ -306,8 +309,9 @@ INTERPOSED int fchmod(int file, mode_t mode) noexcept
 
 INTERPOSED int mkostemp(char* name, int flags)
 {
-    return fails(kMkostemp, static_cast<const char*>(name)) ? -1
-                                                            : next<decltype(mkostemp)>("mkostemp")(name, flags);
+    return fails(kMkostemp, static_cast<const char*>(name))
+               ? -1
+               : next<decltype(mkostemp)>("mkostemp")(name, flags);
 }
 
 INTERPOSED int statfs(const char* path, struct statfs* system) noexcept

@@ -1,5 +1,6 @@
-// An application that keeps the History and the Startup Suite as Modrig does: it makes sure of the key, lists the
-// old names, deletes them one by one, and writes the count and the entries. All of one writing carry its number.
+// An application that keeps the History and the Startup Suite as Modrig does: it makes sure of the key, lists
+// the old names, deletes them one by one, and writes the count and the entries. All of one writing carry its
+// number.
 #include <cwchar>
 #include <string>
 #include <vector>
@@ -57,8 +58,8 @@ class OpenKey
 public:
     explicit OpenKey(const List& list)
     {
-        mOpen = RegCreateKeyEx(HKEY_CURRENT_USER, keyOf(list).c_str(), 0, nullptr, 0, KEY_WRITE, nullptr, &mKey,
-                               nullptr) == ERROR_SUCCESS;
+        mOpen = RegCreateKeyEx(HKEY_CURRENT_USER, keyOf(list).c_str(), 0, nullptr, 0, KEY_WRITE, nullptr,
+                               &mKey, nullptr) == ERROR_SUCCESS;
     }
     ~OpenKey()
     {

@@ -157,7 +157,8 @@ TEST_F(DamagedRegistry, IsToldByWhatIsDamagedAndWhatHelps)
     ASSERT_EQ(runSql(file(), "UPDATE value SET data='other' WHERE name='7History'"), "");
     Registry registry(file());
     EXPECT_THAT(sentenceOf(registry.canStore()),
-                AllOf(HasSubstr("The registry " + file().string() + " is damaged: the value \"7History\" in "
+                AllOf(HasSubstr("The registry " + file().string() +
+                                " is damaged: the value \"7History\" in "
                                 "\"Software\\Tessel\\R21\\Profiles\\Default\\Dialogs\\Modrig\\History\" is "
                                 "not what was stored there. It was left as it is, and nothing will be "
                                 "stored. REGISTRY RESTORE puts back the copy of 2"),
@@ -203,7 +204,8 @@ TEST_F(DamagedRegistry, IsNotWrittenOverInTheSessionInWhichAReadFailed)
     EXPECT_TRUE(registry.endOfCommand()) << "that it fails was told";
     EXPECT_EQ(runSql(file(), "SELECT count(*) FROM value"), std::to_string(kStoredEntries + 1));
     ASSERT_TRUE(registry.keepCopy());
-    EXPECT_THAT(sentenceOf(Registry(file()).canStore()), HasSubstr("is damaged")) << "the next session sees it";
+    EXPECT_THAT(sentenceOf(Registry(file()).canStore()), HasSubstr("is damaged"))
+        << "the next session sees it";
 }
 
 TEST_F(DamagedRegistry, IsStoredAgainByTheNextSessionWhenWhatFailedWasPassing)
@@ -273,7 +275,8 @@ TEST_F(DamagedRegistry, ThatIsHugeIsNotWrittenOverEither)
     makeFile(kHuge);
     const auto pages = pagesOf("sqlite_autoindex_value_1");
     std::string changed = contentOf(file());
-    changed[pages.back() * kPageBytes - 100] = static_cast<char>(changed[pages.back() * kPageBytes - 100] ^ 1);
+    changed[pages.back() * kPageBytes - 100] =
+        static_cast<char>(changed[pages.back() * kPageBytes - 100] ^ 1);
     for (int round = 0; round < 6; ++round)
     {
         putFile(changed);

@@ -1,4 +1,5 @@
-// Registries that come from elsewhere: of an older Tessel, with a stranger's triggers, with another file's log.
+// Registries that come from elsewhere: of an older Tessel, with a stranger's triggers, with another file's
+// log.
 #include <gmock/gmock.h>
 
 #include <csignal>
@@ -142,8 +143,9 @@ TEST_F(TakenOver, FromAnOlderTesselForReadingWhereTheDiskIsFull)
                 expectOldContent(registry);
                 return (HasFailure() ? "read wrong" : "read right, ") + said(registry);
             });
-        EXPECT_THAT(answer, AllOf(HasSubstr("read right, Nothing can be stored in the registry " + file().string()),
-                                  HasSubstr("What is stored there is used.")));
+        EXPECT_THAT(answer,
+                    AllOf(HasSubstr("read right, Nothing can be stored in the registry " + file().string()),
+                          HasSubstr("What is stored there is used.")));
         EXPECT_TRUE(contentOf(file()) == before);
     }
 }
@@ -181,7 +183,8 @@ TEST_F(TakenOver, NotWithWhatAStrangerPutThere)
         const std::string before = contentOf(file());
         {
             Registry registry(file());
-            EXPECT_THAT(said(registry), AllOf(HasSubstr(file().string()), HasSubstr("not as Tessel makes it")))
+            EXPECT_THAT(said(registry),
+                        AllOf(HasSubstr(file().string()), HasSubstr("not as Tessel makes it")))
                 << hostile;
             EXPECT_FALSE(registry.write(L"A", L"name", L"1")) << hostile;
         }
