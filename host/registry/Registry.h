@@ -123,6 +123,7 @@ private:
     Result<> makeMissingFile();
     Result<> openFile();
     Result<> connect(const std::string& name, int flags);
+    void leaveSharedLog();
     Result<> openWithoutJournal(const Failure& reason);
     Result<> readIntoMemory();
     Result<int> checkOrigin();

@@ -1,8 +1,10 @@
 // Opening the registry's file: whose it is, whether it is sound, and whether it may be written.
 #include <sys/stat.h>
 
+#include <chrono>
 #include <cstring>
 #include <random>
+#include <thread>
 
 #include "host/platform/NetworkFolder.h"
 #include "host/registry/Journals.h"
@@ -17,6 +19,8 @@ namespace tessel
 namespace
 {
 constexpr const char* kAskVersion = "PRAGMA user_version";
+constexpr const char* kUseLog = "PRAGMA journal_mode=WAL";
+constexpr const char* kUseJournal = "PRAGMA journal_mode=DELETE";
 
 // Where a file says that it has a write-ahead log: 2, or 1 when it has none.
 constexpr std::size_t kJournalKind = 18;
@@ -154,8 +158,29 @@ Result<> Registry::openFile()
     if (!opened)
         return opened;
     mReadOnly = sqlite3_db_readonly(mDatabase, "main") == 1;
+    if (!mReadOnly && isOnNetwork(mFile.parent_path().string()) && checkOrigin())
+        leaveSharedLog(); // of a file that is ours to change
     const auto asked = firstNumber(mDatabase, kAskVersion);
     return asked || !isRefusal(asked.code()) ? Result<>() : openWithoutJournal(asked.failure());
+}
+
+// A profile that was moved to the network has its file's journal changed by the first session there. Of
+// several at once each stands in the way of the others, and lets go for a moment. What comes of it
+// `chooseJournal` sees.
+void Registry::leaveSharedLog()
+{
+    constexpr std::chrono::milliseconds kPause{20};
+    std::random_device random;
+    const auto end = std::chrono::steady_clock::now() + mBusyTimeout;
+    while (firstText(mDatabase, kUseJournal).code() == SQLITE_BUSY && std::chrono::steady_clock::now() < end)
+    {
+        close();
+        std::this_thread::sleep_for(kPause * (1 + random() % 5));
+        if (!connect(mFile.string(), SQLITE_OPEN_READWRITE))
+            return;
+        sqlite3_busy_timeout(mDatabase, 0);
+    }
+    sqlite3_busy_timeout(mDatabase, static_cast<int>(mBusyTimeout.count()));
 }
 
 // Where the journal's files cannot be made, what is stored can be read all the same.

@@ -134,7 +134,7 @@ TEST_F(FailingLocks, EndTheSessionsReadingSoon)
 }
 
 INSTANTIATE_TEST_SUITE_P(OfEachKind, FailingCalls,
-                         testing::Values("open", "pread", "write", "pwrite", "fsync", "fdatasync",
+                         testing::Values("open", "create", "pread", "write", "pwrite", "fsync", "fdatasync",
                                          "ftruncate", "fcntl", "unlink", "mmap", "munmap", "close", "stat",
                                          "fstat", "rename", "mkostemp"),
                          [](const auto& kind) { return kind.param; });

@@ -42,6 +42,7 @@ struct Kind
 };
 
 Kind kOpen{"open", EMFILE};
+Kind kCreate{"create", EACCES}; // an open that makes a file
 Kind kRead{"read", EIO};
 Kind kPread{"pread", EIO};
 Kind kWrite{"write", ENOSPC};
@@ -133,6 +134,17 @@ bool fails(Kind& kind, Which which)
     return fails(kind);
 }
 
+bool failsToOpen(const char* path, int flags)
+{
+    if (fails(kOpen, path))
+        return true;
+    const int before = errno;
+    struct stat status = {};
+    const bool makes = (flags & O_CREAT) != 0 && isMeant(path) && fstatat(AT_FDCWD, path, &status, 0) != 0;
+    errno = before;
+    return makes && fails(kCreate);
+}
+
 struct Counts
 {
     ~Counts()
@@ -155,7 +167,8 @@ struct Counts
         va_start(arguments, flags);                                                                          \
         const mode_t mode = va_arg(arguments, mode_t);                                                       \
         va_end(arguments);                                                                                   \
-        return fails(kOpen, path) ? -1 : next<int(const char*, int, ...)>(#function)(path, flags, mode);     \
+        return failsToOpen(path, flags) ? -1                                                                 \
+                                        : next<int(const char*, int, ...)>(#function)(path, flags, mode);    \
     }
 OPENING(open)
 OPENING(open64)
