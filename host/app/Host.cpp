@@ -58,6 +58,8 @@ Result<> Host::makeParts()
     if (const Outcome& started = mParts->startedLisp; !started)
         return started.failure();
     mInterruptible = &mParts->lisp();
+    mParts->registry->tellProgressBy([this](const std::wstring& sentence) { mCommandLine.say(sentence); });
+    mInterruptibleRegistry = &*mParts->registry;
     mParts->messageBox->setPresenter(windowBoxes(mParts->layout.binaries));
     addCommands();
     return {};
@@ -135,6 +137,7 @@ void Host::end()
     mCommandLine.tell(mParts->registry->endOfCommand());
     mCommandLine.tell(mParts->registry->keepCopy());
     mInterruptible = nullptr;
+    mInterruptibleRegistry = nullptr;
     mParts.reset();
 }
 
@@ -142,12 +145,16 @@ void Host::interrupt() noexcept
 {
     if (LispInterpreter* lisp = mInterruptible)
         lisp->interrupt();
+    if (Registry* registry = mInterruptibleRegistry)
+        registry->interrupt();
 }
 
+// The registry goes on: what an end in good order stores may be much.
 void Host::requestEnd() noexcept
 {
     mEndRequest.make();
-    interrupt();
+    if (LispInterpreter* lisp = mInterruptible)
+        lisp->interrupt();
 }
 
 std::vector<std::wstring> Host::commandNames() const

@@ -29,6 +29,7 @@
 namespace tessel
 {
 class LispInterpreter;
+class Registry;
 struct Parts;
 
 struct HostOptions
@@ -82,7 +83,8 @@ private:
     HostOptions mOptions;
     CommandLine mCommandLine;
     std::unique_ptr<Parts> mParts;
-    std::atomic<LispInterpreter*> mInterruptible = nullptr; // read by a signal handler
+    std::atomic<LispInterpreter*> mInterruptible = nullptr; // read by a signal handler, as the next
+    std::atomic<Registry*> mInterruptibleRegistry = nullptr;
     EndRequest mEndRequest;
     int mScriptDepth = 0;
 };

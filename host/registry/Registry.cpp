@@ -150,6 +150,7 @@ Result<std::wstring> Registry::readValue(Key key, std::wstring_view name)
     if (!mDatabase)
         return noSuchValue();
     lookInto(key);
+    mWork.count();
     Statement& read = mStatements->readValue;
     const int status = step(read.bind(key).bind(foldCase(name)));
     if (status != SQLITE_ROW)
@@ -229,6 +230,9 @@ Result<> Registry::beginWriting()
 {
     if (!mCanStore)
         return mCanStore;
+    mWork.count();
+    if (mCommand && mWork.isInterrupted())
+        return fail(SQLITE_INTERRUPT, L"written");
     if (!mCommand || mWriting)
         return mCommand;
     // What was read by now is of a moment that may be over; the writes are to stand on what is stored now.
@@ -299,7 +303,11 @@ Result<> Registry::finishWrite(int status)
 // end tells it. Every row says in its second column whether it is what was stored; one that is not is no row.
 int Registry::step(Statement& statement)
 {
-    const int status = mCannotLock ? SQLITE_PROTOCOL : statement.step();
+    int status = mCannotLock ? SQLITE_PROTOCOL : SQLITE_INTERRUPT;
+    if (mCannotLock || mWork.isInterrupted())
+        statement.reset();
+    else
+        status = statement.step();
     if (status == SQLITE_DONE || (status == SQLITE_ROW && statement.number(1) == 1))
         return status;
     if (status != SQLITE_ROW)
@@ -317,6 +325,7 @@ int Registry::step(Statement& statement)
 // could lead round and round.
 bool Registry::isNext(Statement& statement, std::int64_t& last)
 {
+    mWork.count();
     if (step(statement) != SQLITE_ROW)
         return false;
     if (const std::int64_t number = statement.number(0); number > last)
@@ -415,8 +424,10 @@ void Registry::commit()
 
 void Registry::storeSoFar()
 {
-    if (mDatabase)
-        commit();
+    if (!mDatabase)
+        return;
+    commit();
+    mWork.end();
 }
 
 Result<> Registry::endOfCommand()
@@ -424,6 +435,7 @@ Result<> Registry::endOfCommand()
     if (!mDatabase)
         return {};
     commit();
+    mWork.end();
     mOpenedForWriting.clear();
     return std::exchange(mCommand, {});
 }

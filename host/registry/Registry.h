@@ -28,8 +28,10 @@
 #include <string_view>
 #include <unordered_map>
 #include <unordered_set>
+#include <utility>
 #include <vector>
 
+#include "host/registry/LongWork.h"
 #include "host/text/Result.h"
 
 struct sqlite3;
@@ -102,6 +104,12 @@ public:
     // about it. Nothing can be stored before the next session: what applications have read is of before.
     Result<std::wstring> restoreCopy();
 
+    // Says by this how far a command has come that reads or writes very many values.
+    void tellProgressBy(LongWork::Say say) { mWork.tellBy(std::move(say)); }
+
+    // Makes such a command fail, as a store that cannot be read does. Safe in a signal handler.
+    void interrupt() noexcept { mWork.interrupt(); }
+
     // Handles for the registry calls. A handle that is not open is recognised, never followed.
     HKEY openHandle(Key key);
     std::optional<Key> keyOf(HKEY handle) const;
@@ -165,6 +173,7 @@ private:
     bool mCannotLock = false; // for as long as the session lasts: the file system refuses
     std::unique_ptr<Statements> mStatements;
     Cursor mCursor;
+    LongWork mWork;
     Result<> mCommand;                         // the running one, or what failed in it first
     bool mWriting = false;                     // the running transaction is one that writes
     unsigned mWrites = 0;                      // in it

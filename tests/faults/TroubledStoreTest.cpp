@@ -143,7 +143,8 @@ TEST_F(TroubledStore, IsRestoredByTheCommand)
     std::ofstream(file(), std::ios::binary) << whole.substr(0, whole.size() / 2);
     const auto damaged = session.run({"REGISTRY RESTORE", "REGISTRY SET Software\\Trial name 1"});
     EXPECT_EQ(damaged.exitStatus, 1);
-    EXPECT_THAT(damaged.output, HasSubstr("nothing will be stored. REGISTRY RESTORE puts back the copy of 2"));
+    EXPECT_THAT(damaged.output,
+                HasSubstr("nothing will be stored. REGISTRY RESTORE puts back the copy of 2"));
     EXPECT_THAT(damaged.output, HasSubstr("was restored from the copy of 2"));
     EXPECT_THAT(damaged.output, HasSubstr("Start Tessel again: this session stores nothing more.\n"));
     EXPECT_THAT(damaged.output, HasSubstr("cannot be written: "));
