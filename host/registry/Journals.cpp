@@ -122,6 +122,9 @@ std::filesystem::path logOf(const std::filesystem::path& file)
 
 bool isForeign(const std::filesystem::path& file)
 {
+    std::error_code missing;
+    if (!std::filesystem::exists(logOf(file), missing)) // as mostly
+        return false;
     const auto before = identityOf(file);
     const auto log = identityOfLog(logOf(file));
     const auto after = identityOf(file);

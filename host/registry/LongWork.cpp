@@ -4,7 +4,7 @@ namespace tessel
 {
 namespace
 {
-constexpr unsigned kLookAtClock = 1024;       // values between two looks
+constexpr unsigned kLookAtClock = 1024;         // values between two looks
 constexpr unsigned kWorthInterrupting = 10'000; // values, some hundredths of a second
 constexpr std::chrono::seconds kPatience{2};
 } // namespace

@@ -1,5 +1,5 @@
-// The reading and writing of very many values in one command: a person is told how far it has come, and can stop
-// it. Used by the Registry alone.
+// The reading and writing of very many values in one command: a person is told how far it has come, and can
+// stop it. Used by the Registry alone.
 #pragma once
 
 #include <atomic>

@@ -39,12 +39,14 @@ TEST(HugeHistory, IsToldAboutWhileItIsReadAndKeptWhenThePersonStopsThat)
     HostTerminal terminal(session);
     ASSERT_TRUE(terminal.shows("values so far. Ctrl-C stops it.")) << terminal.screen();
     terminal.type(kControlC);
-    EXPECT_TRUE(terminal.shows(file.string() + " could not be read: interrupted. Nothing more is stored in this "
-                                               "session"))
+    EXPECT_TRUE(terminal.shows(file.string() +
+                               " could not be read: interrupted. Nothing more is stored in this "
+                               "session"))
         << terminal.screen();
     EXPECT_TRUE(terminal.shows("Command: ")) << terminal.screen();
     terminal.type("REGISTRY GET Software\\Tessel\\R21\\Profiles\r");
-    EXPECT_TRUE(terminal.shows("\nDefault\r\n")) << "what is read after it is not stopped" << terminal.screen();
+    EXPECT_TRUE(terminal.shows("\nDefault\r\n"))
+        << "what is read after it is not stopped" << terminal.screen();
     terminal.type("QUIT\r");
     EXPECT_EQ(terminal.waitForEnd(), 0);
     EXPECT_EQ(runSql(file, "SELECT count(*) FROM value WHERE key=9"), "300001");
