@@ -1,6 +1,7 @@
 // LOAD, UNLOAD, APPS: applications without the dialog.
 #include <algorithm>
 #include <array>
+#include <limits>
 
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
@@ -13,6 +14,7 @@ namespace
 constexpr wchar_t kApplicationsGroup[] = L"Applications";
 constexpr std::size_t kNameColumn = 24;
 constexpr std::size_t kFolderColumn = 48;
+constexpr std::size_t kAnyLength = std::numeric_limits<std::size_t>::max();
 constexpr std::array kLispExtensions = {L".lsp", L".qbc"};
 
 // Where the file is, along the host's search path; a file that is not found is looked for where the user is,
@@ -52,11 +54,23 @@ Result<> loadLisp(Parts& parts, const std::wstring& path)
     return value ? succeed(parts, path + L" is loaded.") : value.failure();
 }
 
+// The file to load; that of an address is fetched first.
+Result<std::wstring> localFile(Parts& parts, const std::wstring& typed)
+{
+    if (!parts.information->isUrl(typed.c_str()))
+        return fullPath(parts, typed);
+    const auto copy = parts.remote->fetch(typed, kAnyLength, false);
+    return copy ? Result<std::wstring>(copy->path) : copy.failure();
+}
+
 Result<> load(Parts& parts, const CommandStack::Arguments& arguments)
 {
     if (arguments.size() != 1)
         return wrongUsage(parts, L"LOAD");
-    const std::wstring path = fullPath(parts, arguments.front());
+    const auto file = localFile(parts, arguments.front());
+    if (!file)
+        return file.failure();
+    const std::wstring& path = *file;
     if (isLispFile(path))
         return loadLisp(parts, path);
     if (!parts.linker->loadModule(path.c_str(), true, true))
@@ -102,7 +116,8 @@ Result<> listApplications(Parts& parts, const CommandStack::Arguments&)
 
 void addApplicationCommands(Parts& parts)
 {
-    addBuiltIn(parts, {kApplicationsGroup, L"LOAD", L"file", L"Loads a compiled module or a Lisp file"},
+    addBuiltIn(parts,
+               {kApplicationsGroup, L"LOAD", L"file or address", L"Loads a compiled module or a Lisp file"},
                load);
     addBuiltIn(parts, {kApplicationsGroup, L"UNLOAD", L"file", L"Unloads a compiled module"}, unload);
     addBuiltIn(parts, {kApplicationsGroup, L"APPS", L"", L"Lists what is loaded"}, listApplications);

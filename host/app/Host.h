@@ -22,6 +22,7 @@
 
 #include "host/app/Export.h"
 #include "host/commands/EndRequest.h"
+#include "host/commands/Interruption.h"
 #include "host/console/LineRunner.h"
 #include "host/files/RemoteFiles.h"
 #include "host/text/CommandLine.h"
@@ -63,7 +64,7 @@ public:
     void end();
 
     bool isEnding() const override { return mEndRequest.isMade(); }
-    void interrupt() noexcept override;
+    bool interrupt() noexcept override;
     void requestEnd() noexcept override;
 
     // Can be read from when the session is to end (see EndRequest).
@@ -77,6 +78,7 @@ public:
 private:
     Result<> makeParts();
     Result<> prepareProfileFolder();
+    void tellWhoElseWritesTheProfile();
     void addCommands();
     bool finishLine();
 
@@ -86,6 +88,7 @@ private:
     std::atomic<LispInterpreter*> mInterruptible = nullptr; // read by a signal handler, as the next
     std::atomic<Registry*> mInterruptibleRegistry = nullptr;
     EndRequest mEndRequest;
+    Interruption mInterruption{mEndRequest};
     int mScriptDepth = 0;
 };
 } // namespace tessel

@@ -16,6 +16,7 @@
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
 #include "host/commands/EndRequest.h"
+#include "host/commands/Interruption.h"
 #include "host/files/FileSearch.h"
 #include "host/files/RemoteFiles.h"
 #include "host/lisp/LispInterpreter.h"
@@ -37,6 +38,7 @@ struct Foundations
 {
     CommandLine& commandLine;
     EndRequest& endRequest;
+    Interruption& interruption;
     const std::filesystem::path& profileFolder; // is there
     const RemoteFiles::Limits& downloads;
 };
@@ -63,7 +65,8 @@ struct Parts
     DemandLoading demandLoading{layout.plugIns, *records, *linker};
     Owned<Document> document;
     Owned<FileSearch> files{layout.resources, *variables};
-    Owned<RemoteFiles> remote{foundations.profileFolder / "remote-files", foundations.downloads};
+    Owned<RemoteFiles> remote{foundations.profileFolder / "remote-files", foundations.downloads,
+                              foundations.interruption};
     Owned<HostInformation> information{toWide(foundations.profileFolder.string()), *remote, *commandLine};
     Owned<Help> help{layout.resources / "help", openInBrowser};
     // Publishes itself. The variable is read here, before any application is loaded, and holds for the

@@ -95,4 +95,9 @@ bool LispInterpreter::running() const noexcept
 {
     return mMachine->running();
 }
+
+unsigned LispInterpreter::evaluations() const noexcept
+{
+    return mMachine->evaluations();
+}
 } // namespace tessel

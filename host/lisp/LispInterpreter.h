@@ -66,6 +66,9 @@ public:
     void interrupt() noexcept;
     bool running() const noexcept;
 
+    // Changes whenever an evaluation begins or ends. Safe in a signal handler.
+    unsigned evaluations() const noexcept;
+
 private:
     LispInterpreter(std::unique_ptr<LispMachine> machine, bool removingTsLisp, CommandLine& commandLine,
                     const EndRequest& endRequest);

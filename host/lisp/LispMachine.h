@@ -56,6 +56,9 @@ public:
     void interrupt() noexcept;
     bool running() const noexcept;
 
+    // Changes whenever an evaluation begins or ends. Safe in a signal handler.
+    unsigned evaluations() const noexcept;
+
 private:
     struct Parts;
     explicit LispMachine(std::unique_ptr<Parts> parts);

@@ -23,7 +23,8 @@ public:
     void type(std::string_view keys) const;
 
     // Waits until the text appears after what was waited for before. False when the time is over.
-    bool shows(std::string_view text);
+    bool shows(std::string_view text) { return showsWithin(text, kHostTimeLimit); }
+    bool showsWithin(std::string_view text, std::chrono::milliseconds time);
 
     // Waits for the end; the exit status as in HostResult. A host that does not end is killed.
     int waitForEnd();
