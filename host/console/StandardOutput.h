@@ -8,8 +8,8 @@ namespace tessel
 class StandardOutput
 {
 public:
-    // Waits until the text is written, whatever signals come meanwhile. After a failure the next text is tried
-    // again: a full disk may have room again.
+    // Waits until the text is written, whatever signals come meanwhile. After a failure the next text is
+    // tried again: a full disk may have room again.
     void write(std::string_view text);
 
     bool isWhole() const { return mError == 0; }

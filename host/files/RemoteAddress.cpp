@@ -15,7 +15,7 @@ constexpr std::string_view kSecureScheme = "https";
 constexpr std::string_view kChecksum = "sha256=";
 constexpr std::size_t kChecksumDigits = 64;
 constexpr const char* kUnnamedFile = "download";
-constexpr std::size_t kLongestName = 200; // in bytes; a file system takes 255
+constexpr std::size_t kLongestFileName = 200; // in bytes; a file system takes 255
 
 char lower(char character)
 {
@@ -151,8 +151,8 @@ std::string fileNameOf(const std::string& url)
     std::string name = slash == path.npos || slash < host ? "" : path.substr(slash + 1);
     std::ranges::replace(name, '\\', '_');
     std::ranges::replace(name, '\0', '_');
-    if (name.size() > kLongestName) // the end tells the kind
-        name.erase(0, firstCharacter(name, name.size() - kLongestName));
+    if (name.size() > kLongestFileName) // the end tells the kind
+        name.erase(0, firstCharacter(name, name.size() - kLongestFileName));
     const bool unusable = name.empty() || name == "." || name == ".." || name == kOriginFile;
     return unusable ? kUnnamedFile : name;
 }

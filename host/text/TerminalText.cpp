@@ -8,11 +8,13 @@ namespace tessel
 namespace
 {
 constexpr wchar_t kDelete = 0x7F;
-constexpr wchar_t kLastControl = 0x9F; // those from U+0080 are what some terminals take for an escape and a letter
+constexpr wchar_t kLastControl =
+    0x9F; // those from U+0080 are what some terminals take for an escape and a letter
 
 bool isOrder(wchar_t character)
 {
-    const bool isControl = (character >= 0 && character < L' ') || (character >= kDelete && character <= kLastControl);
+    const bool isControl =
+        (character >= 0 && character < L' ') || (character >= kDelete && character <= kLastControl);
     return isControl && character != L'\n' && character != L'\t';
 }
 

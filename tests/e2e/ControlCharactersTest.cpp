@@ -38,8 +38,9 @@ protected:
 
 TEST_F(ControlCharacters, OfAFileNameAreShown)
 {
-    const auto result = session.run({std::string("LOAD /nowhere/") + kOrder + ".zmb", std::string("CD /nowhere/") + kOrder,
-                                     std::string("SCRIPT /nowhere/") + kOrder, std::string("x") + kOrder});
+    const auto result =
+        session.run({std::string("LOAD /nowhere/") + kOrder + ".zmb", std::string("CD /nowhere/") + kOrder,
+                     std::string("SCRIPT /nowhere/") + kOrder, std::string("x") + kOrder});
     expectReadable(result);
     EXPECT_THAT(result.output, AllOf(HasSubstr(linkerRefuses(std::string("/nowhere/") + kOrderShown + ".zmb",
                                                              "No such file or directory")),
@@ -50,11 +51,13 @@ TEST_F(ControlCharacters, OfAFileNameAreShown)
 
 TEST_F(ControlCharacters, OfALoadedFilesNameAreShown)
 {
-    const auto file = session.folder().write(std::string("a") + kOrder + "\rb.lsp", "(write-line \"it runs\")\n");
+    const auto file =
+        session.folder().write(std::string("a") + kOrder + "\rb.lsp", "(write-line \"it runs\")\n");
     const auto result = session.run({"LOAD \"" + file.string() + "\"", "APPS"});
     EXPECT_EQ(result.exitStatus, 0);
     expectReadable(result);
-    EXPECT_THAT(result.output, AllOf(HasSubstr("\nit runs\n"), HasSubstr(std::string("/a") + kOrderShown + "\\x0Db.lsp is loaded."),
+    EXPECT_THAT(result.output, AllOf(HasSubstr("\nit runs\n"),
+                                     HasSubstr(std::string("/a") + kOrderShown + "\\x0Db.lsp is loaded."),
                                      HasSubstr(std::string("  a") + kOrderShown + "\\x0Db.lsp ")));
 }
 
@@ -75,13 +78,13 @@ TEST_F(ControlCharacters, OfTheLinkersWordsAreShown)
 
 TEST_F(ControlCharacters, OfLispAreShown)
 {
-    const auto result = session.run({"(princ (coerce (list (code-char 27) #\\[ (code-char 155) (code-char 13) (code-char 8)) 'string))",
-                                     "(format nil \"a~Cb\" (code-char 27))", "(error \"a~Cb\" (code-char 7))",
-                                     "(princ (format nil \"one~C~Ctwo~Cthree\" (code-char 13) (code-char 10) (code-char 9)))"});
+    const auto result = session.run(
+        {"(princ (coerce (list (code-char 27) #\\[ (code-char 155) (code-char 13) (code-char 8)) 'string))",
+         "(format nil \"a~Cb\" (code-char 27))", "(error \"a~Cb\" (code-char 7))",
+         "(princ (format nil \"one~C~Ctwo~Cthree\" (code-char 13) (code-char 10) (code-char 9)))"});
     expectReadable(result);
-    EXPECT_THAT(result.output,
-                AllOf(HasSubstr("\\x1B[\\x9B\\x0D\\x08"), HasSubstr("\"a\\x1Bb\""), HasSubstr("a\\x07b"),
-                      HasSubstr("one\ntwo\tthree")));
+    EXPECT_THAT(result.output, AllOf(HasSubstr("\\x1B[\\x9B\\x0D\\x08"), HasSubstr("\"a\\x1Bb\""),
+                                     HasSubstr("a\\x07b"), HasSubstr("one\ntwo\tthree")));
 }
 
 TEST_F(ControlCharacters, OfArgumentsThatAreNotKnownAreShown)

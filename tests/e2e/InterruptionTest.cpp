@@ -12,7 +12,8 @@ using testing::Not;
 
 namespace
 {
-constexpr char kQuestion[] = "What is running does not come back. End Tessel? What is not stored yet is lost. [y/N] ";
+constexpr char kQuestion[] =
+    "What is running does not come back. End Tessel? What is not stored yet is lost. [y/N] ";
 constexpr int kEndedByKey = 128 + SIGINT;
 constexpr int kInVain = 3;
 constexpr std::chrono::milliseconds kMoment{200};
@@ -71,7 +72,8 @@ protected:
 TEST_F(Interruption, StopsACleanUpThatNeverEnds)
 {
     HostTerminal terminal(session);
-    type(terminal, "(unwind-protect (progn (princ \"be\") (princ \"gun\") (loop)) (princ \"clea\") (princ \"ning\") (loop))");
+    type(terminal, "(unwind-protect (progn (princ \"be\") (princ \"gun\") (loop)) (princ \"clea\") (princ "
+                   "\"ning\") (loop))");
     ASSERT_TRUE(terminal.shows("begun")) << terminal.screen();
     terminal.type(kControlC);
     ASSERT_TRUE(terminal.shows("cleaning")) << terminal.screen();
@@ -155,10 +157,11 @@ TEST_F(Interruption, DoesNotAskAPersonWhoLeansOnTheKeyAtThePrompt)
 // Each of them comes back at the first key.
 TEST_F(Interruption, DoesNotAskWhileLispObeys)
 {
-    const auto lisp = session.folder().write("three.script", "(progn (princ \"one\") (finish-output) (loop))\n"
-                                                             "(progn (princ \"two\") (finish-output) (loop))\n"
-                                                             "(progn (princ \"three\") (finish-output) (loop))\n"
-                                                             "(progn (princ \"four\") (finish-output) (loop))\n");
+    const auto lisp =
+        session.folder().write("three.script", "(progn (princ \"one\") (finish-output) (loop))\n"
+                                               "(progn (princ \"two\") (finish-output) (loop))\n"
+                                               "(progn (princ \"three\") (finish-output) (loop))\n"
+                                               "(progn (princ \"four\") (finish-output) (loop))\n");
     HostTerminal terminal(session);
     type(terminal, "SCRIPT " + lisp.string());
     for (const char* word : {"one", "two", "three", "four"})
@@ -173,9 +176,10 @@ TEST_F(Interruption, DoesNotAskWhileLispObeys)
 
 TEST_F(Interruption, WithoutATerminalAsksNobody)
 {
-    session.startBy("setsid \"$0\" \"$@\" & until [ -e '" + file().string() +
-                    ".begun' ]; do :; done; for press in 1 2 3 4; do kill -INT $!; sleep 0.05; done; touch '" +
-                    file().string() + "'; wait $!");
+    session.startBy(
+        "setsid \"$0\" \"$@\" & until [ -e '" + file().string() +
+        ".begun' ]; do :; done; for press in 1 2 3 4; do kill -INT $!; sleep 0.05; done; touch '" +
+        file().string() + "'; wait $!");
     const auto result = session.run({"LOAD " + fixtureModule("Hangs.zmb"), "HANG"});
     EXPECT_EQ(result.exitStatus, 0) << result.output;
     EXPECT_THAT(result.output, HasSubstr("hanging\nback again\n"));

@@ -35,7 +35,8 @@ protected:
 };
 
 // Runs the commands with a shell's redirection of the host's output, errors aside; answers its status.
-HostResult runInto(HostSession& session, const std::string& redirection, const std::vector<std::string>& arguments)
+HostResult runInto(HostSession& session, const std::string& redirection,
+                   const std::vector<std::string>& arguments)
 {
     session.startBy("exec \"$0\" \"$@\" " + redirection);
     return session.start(arguments);
@@ -83,7 +84,8 @@ TEST(Output, ThatCannotBeWrittenGivesAStatusThatTellsSo)
     {
         const auto result = runInto(session, ">/dev/full", arguments);
         EXPECT_EQ(result.exitStatus, 1);
-        EXPECT_EQ(result.output, "Tessel: some of the output could not be written: No space left on device.\n");
+        EXPECT_EQ(result.output,
+                  "Tessel: some of the output could not be written: No space left on device.\n");
     }
 }
 
@@ -96,6 +98,8 @@ TEST(Output, ThatCannotBeWrittenLeavesAWorseStatusAlone)
 TEST(Output, ThatCannotBeWrittenDoesNotKeepAnythingFromBeingDone)
 {
     HostSession session;
-    EXPECT_EQ(runInto(session, ">/dev/full", {"-c", R"(REGISTRY SET Software\Trial name kept)"}).exitStatus, 1);
-    EXPECT_THAT(runInto(session, "", {"-c", R"(REGISTRY GET Software\Trial name)"}).output, EndsWith("\nkept\n"));
+    EXPECT_EQ(runInto(session, ">/dev/full", {"-c", R"(REGISTRY SET Software\Trial name kept)"}).exitStatus,
+              1);
+    EXPECT_THAT(runInto(session, "", {"-c", R"(REGISTRY GET Software\Trial name)"}).output,
+                EndsWith("\nkept\n"));
 }

@@ -29,10 +29,11 @@ class SecureServer
 public:
     explicit SecureServer(const fs::path& folder) : mFolder(folder)
     {
-        const std::string make = "cd '" + folder.string() +
-                                 "' && openssl req -x509 -newkey ec -pkeyopt ec_paramgen_curve:prime256v1 -nodes "
-                                 "-keyout key -out certificate -days 2 -subj /CN=127.0.0.1 "
-                                 "-addext subjectAltName=IP:127.0.0.1 2>/dev/null";
+        const std::string make =
+            "cd '" + folder.string() +
+            "' && openssl req -x509 -newkey ec -pkeyopt ec_paramgen_curve:prime256v1 -nodes "
+            "-keyout key -out certificate -days 2 -subj /CN=127.0.0.1 "
+            "-addext subjectAltName=IP:127.0.0.1 2>/dev/null";
         if (std::system(make.c_str()) != 0)
             throw std::runtime_error("no certificate");
         mProcess = std::make_unique<ChildProcess>([this](int output) { run(output); });
@@ -76,7 +77,8 @@ protected:
     HostResult load(const std::string& address) const { return session.run({"LOAD " + address}); }
 
     HostSession session;
-    SecureServer server{session.folder().write("server/tool.lsp", httpAnswer("200 OK", "(write-line \"it runs\")\n"))
+    SecureServer server{session.folder()
+                            .write("server/tool.lsp", httpAnswer("200 OK", "(write-line \"it runs\")\n"))
                             .parent_path()};
 };
 } // namespace
@@ -104,15 +106,17 @@ TEST_F(SecureAddresses, MayLeadToOthersOfTheirKind)
 
 TEST_F(SecureAddresses, DoNotLeadToWhatAnybodyCanReadAlong)
 {
-    const HttpServer open([](const std::string&)
-                          { return HttpServer::Answer{httpAnswer("200 OK", "(write-line \"taken\")\n"), "", {}}; });
+    const HttpServer open(
+        [](const std::string&) {
+            return HttpServer::Answer{httpAnswer("200 OK", "(write-line \"taken\")\n"), "", {}};
+        });
     const std::wstring address = open.url(L"/tool.lsp");
     offer("old.lsp",
           httpAnswer("302 Found", "", "Location: " + std::string(address.begin(), address.end()) + "\r\n"));
     const auto result = load(server.url("/old.lsp"));
     EXPECT_EQ(result.exitStatus, 1);
-    EXPECT_THAT(result.output,
-                EndsWith("\n" + server.url("/old.lsp") + " could not be fetched: the server leads from https to http.\n"));
+    EXPECT_THAT(result.output, EndsWith("\n" + server.url("/old.lsp") +
+                                        " could not be fetched: the server leads from https to http.\n"));
     EXPECT_THAT(open.heads(), Each(IsEmpty())) << "nothing is sent";
     EXPECT_TRUE(fs::is_empty(session.profile() / "remote-files"));
 }
@@ -123,8 +127,9 @@ TEST_F(SecureAddresses, DoNotLeadThereRoundAboutEither)
         [this](const std::string& target)
         {
             const std::string on = "Location: " + server.url("/old.lsp") + "\r\n";
-            return HttpServer::Answer{target == "/start.lsp" ? httpAnswer("302 Found", "", on)
-                                                             : httpAnswer("200 OK", "(write-line \"taken\")\n"),
+            return HttpServer::Answer{target == "/start.lsp"
+                                          ? httpAnswer("302 Found", "", on)
+                                          : httpAnswer("200 OK", "(write-line \"taken\")\n"),
                                       "",
                                       {}};
         });

@@ -29,10 +29,7 @@ protected:
         return {std::istreambuf_iterator<char>(stream), {}};
     }
 
-    void put(const std::string& content) const
-    {
-        session.folder().write("profile/history", content);
-    }
+    void put(const std::string& content) const { session.folder().write("profile/history", content); }
 
     static void type(HostTerminal& terminal, const std::string& line)
     {
@@ -60,8 +57,9 @@ protected:
         type(terminal, "(+ 30 13)");
         terminal.type(kControlD);
         EXPECT_EQ(terminal.waitForEnd(), 0);
-        EXPECT_EQ(terminal.screen().find("history of typed", terminal.screen().find(sentence) + sentence.size()),
-                  std::string::npos)
+        EXPECT_EQ(
+            terminal.screen().find("history of typed", terminal.screen().find(sentence) + sentence.size()),
+            std::string::npos)
             << "said once";
     }
 
