@@ -17,6 +17,7 @@ namespace tessel
 namespace
 {
 constexpr std::string_view kPrefix = ".part-";
+constexpr mode_t kForAll = 0666;
 
 Failure lastError()
 {
@@ -73,6 +74,13 @@ bool PartFile::write(std::string_view bytes)
         bytes.remove_prefix(count > 0 ? static_cast<std::size_t>(count) : 0);
     }
     return true;
+}
+
+bool PartFile::letOthersRead()
+{
+    const mode_t taken = umask(0);
+    umask(taken);
+    return fchmod(mFile.number(), kForAll & ~taken) == 0;
 }
 
 Result<> PartFile::moveTo(const std::filesystem::path& place)

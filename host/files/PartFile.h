@@ -26,6 +26,9 @@ public:
 
     bool write(std::string_view bytes);
 
+    // As is usual for new files of the person's; without it nobody else can read it.
+    bool letOthersRead();
+
     // Puts it in place of what stands there. Fails with the system's words.
     Result<> moveTo(const std::filesystem::path& place);
 
