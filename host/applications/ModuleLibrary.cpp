@@ -69,11 +69,15 @@ Result<std::unique_ptr<ModuleLibrary>> ModuleLibrary::open(const ModuleFile& fil
 
 Result<std::unique_ptr<ModuleLibrary>> ModuleLibrary::openBundle(const ModuleFile& file, bool resolveNow)
 {
-    void* handle = loadBundle(file.path) ? mappedLibrary(file.program) : nullptr;
+    const auto loaded = loadBundle(file.path);
+    // Where the platform keeps the reason to itself, the system's linker has the same one.
+    if (loaded.code() == kBundleNotAccepted && !map(file.program, true))
+        return Failure{linkersWords(file.program)};
+    if (!loaded)
+        return loaded.failure();
+    void* handle = mappedLibrary(file.program);
     if (!handle)
-        // The platform keeps the reason to itself; the system's linker has the same one.
-        return Failure{map(file.program, true) ? L"the platform does not accept it as a bundle"
-                                               : linkersWords(file.program)};
+        return Failure{L"the platform has loaded another program in its place"};
     if (const std::string missing = resolveNow ? firstUnresolvedFunction(handle) : ""; !missing.empty())
         return Failure{L"undefined symbol: " + toWide(missing)};
     return std::unique_ptr<ModuleLibrary>(new ModuleLibrary(file, handle, true));
@@ -86,9 +90,8 @@ TsRxEntryPoint ModuleLibrary::entryPoint() const
 
 bool ModuleLibrary::close()
 {
-    if (mByPlatform)
-        unloadBundle(mFile.path);
-    if (mustStayMapped(mHandle))
+    const bool released = !mByPlatform || unloadBundle(mFile.path);
+    if (!released || mustStayMapped(mHandle))
         return false;
     return dlclose(mHandle) == 0 && !isMapped(mFile.program);
 }
