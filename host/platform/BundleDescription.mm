@@ -17,7 +17,7 @@ namespace
 {
 // Descriptions have some thousand bytes and some dozen lists.
 constexpr std::uint64_t kMostBytes = 1U << 20U;
-constexpr std::ptrdiff_t kMostLists = 10000; // one in the other, they take half of a small stack
+constexpr std::ptrdiff_t kMostLists = 10000;    // one in the other, they take half of a small stack
 constexpr std::string_view kBeginnings = "({<"; // of a list, a table, an element
 
 Result<std::string> contentOf(const RegularFile& file)
@@ -30,9 +30,7 @@ Result<std::string> contentOf(const RegularFile& file)
     if (!file.read(0, content.data(), content.size()))
         return Failure{L"it cannot be read to its end"};
     const auto beginsList = [](char character)
-    {
-        return kBeginnings.find(character) != std::string_view::npos;
-    };
+    { return kBeginnings.find(character) != std::string_view::npos; };
     if (std::ranges::count_if(content, beginsList) > kMostLists)
         return Failure{L"it holds too many lists for a description"};
     return content;
@@ -51,7 +49,8 @@ Result<> checkList(const std::string& content)
                    ? Result<>()
                    : Failure{L"it is no table of names and values"};
     NSString* why = [error localizedDescription];
-    return Failure{L"it is no property list" + (why ? L" (" + NSStringToWstring(why) + L")" : std::wstring())};
+    return Failure{L"it is no property list" +
+                   (why ? L" (" + NSStringToWstring(why) + L")" : std::wstring())};
 }
 
 Result<> checkFile(const RegularFile& file)
@@ -75,7 +74,8 @@ Result<> checkDescription(const std::string& folder)
             continue;
         const auto checked = checkFile(file);
         return checked ? checked
-                       : Failure{L"its description \"" + toWide(path) + L"\" cannot be used: " + checked.sentence()};
+                       : Failure{L"its description \"" + toWide(path) + L"\" cannot be used: " +
+                                 checked.sentence()};
     }
     return {};
 }

@@ -80,7 +80,8 @@ TEST_F(BrokenBundles, AreToldWhenTheyAreLoadedByHand)
         EXPECT_THAT(result.output, StartsWith(kBanner + ("Command: LOAD " + pathOf(broken) + "\n") +
                                               refusal(pathOf(broken), broken)));
         EXPECT_THAT(result.output, HasSubstr(fixtureModule("Good.zmb") + " is loaded.\n"));
-        expectNoOtherLines(result.output, {"Tessel R21", "Command: ", "Good.zmb: ", fixtureModule("Good.zmb")});
+        expectNoOtherLines(result.output,
+                           {"Tessel R21", "Command: ", "Good.zmb: ", fixtureModule("Good.zmb")});
     }
 }
 

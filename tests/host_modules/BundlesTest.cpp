@@ -48,8 +48,8 @@ protected:
 
 TEST_F(Bundles, MayNameTheirProgramByEitherKeyAndInAFolderOfTheirOwn)
 {
-    for (const char* text : {"{ NSExecutable = Good; }", "{ CFBundleExecutable = Good; }",
-                             "{ NSExecutable = \"inner/Good\"; }"})
+    for (const char* text :
+         {"{ NSExecutable = Good; }", "{ CFBundleExecutable = Good; }", "{ NSExecutable = \"inner/Good\"; }"})
     {
         std::filesystem::create_directory(bundle / "inner");
         std::filesystem::copy_file(bundle / "Good", bundle / "inner" / "Good",
@@ -85,8 +85,9 @@ TEST_F(Bundles, AreRefusedWhenTheNameOfTheProgramLeadsOut)
 {
     fixture("Good.bundle");
     const std::string absolute = (mFolder / "Good.bundle" / "Good").native();
-    for (const std::string& name : {std::string("../Good.bundle/Good"), std::string("Resources/../../Good.bundle/Good"),
-                                    std::string("Resources/../Good"), absolute, (bundle / "Good").native()})
+    for (const std::string& name :
+         {std::string("../Good.bundle/Good"), std::string("Resources/../../Good.bundle/Good"),
+          std::string("Resources/../Good"), absolute, (bundle / "Good").native()})
         for (const char* key : {"NSExecutable", "CFBundleExecutable"})
             EXPECT_EQ(refusalOf(std::string("{ ") + key + " = \"" + name + "\"; }"),
                       "its description names the program \"" + name + "\", which leads out of the bundle.\n");
@@ -105,9 +106,12 @@ TEST_F(Bundles, SayWhichProgramIsMissing)
 
 TEST_F(Bundles, AreToldWhenTheDescriptionIsNoPropertyList)
 {
-    for (const char* text : {"Once upon { a time", "(Good", "{ NSExecutable = Good", "{ NSExecutable = \"Good",
-                             "<?xml version=\"1.0\"?><plist version=\"1.0\"><dict><key>NSExecutable",
-                             "<?xml version=\"1.0\"?>", "\xFF\xFE\xFF", "bplist00\1\2", "\x7F""ELF\2\1\1"})
+    for (const char* text :
+         {"Once upon { a time", "(Good", "{ NSExecutable = Good", "{ NSExecutable = \"Good",
+          "<?xml version=\"1.0\"?><plist version=\"1.0\"><dict><key>NSExecutable", "<?xml version=\"1.0\"?>",
+          "\xFF\xFE\xFF", "bplist00\1\2",
+          "\x7F"
+          "ELF\2\1\1"})
     {
         const std::string said = refusalOf(text);
         EXPECT_THAT(said, StartsWith("its description \"" + description().native() +
@@ -119,8 +123,8 @@ TEST_F(Bundles, AreToldWhenTheDescriptionIsNoPropertyList)
 
 TEST_F(Bundles, AreToldWhenTheDescriptionIsNoTable)
 {
-    for (const char* text : {"(Good)", "Good", "<476f6f64>",
-                             "<?xml version=\"1.0\"?><plist version=\"1.0\"><array/></plist>"})
+    for (const char* text :
+         {"(Good)", "Good", "<476f6f64>", "<?xml version=\"1.0\"?><plist version=\"1.0\"><array/></plist>"})
         EXPECT_EQ(refusalOf(text), unusable("it is no table of names and values")) << text;
 }
 
@@ -183,5 +187,6 @@ TEST_F(Bundles, AreDescribedAtTheirTopWhereNoResourcesAre)
     EXPECT_TRUE(unload(bundle));
     output();
     std::ofstream(bundle / "Info.plist") << "(";
-    EXPECT_THAT(refusal(), StartsWith("its description \"" + (bundle / "Info.plist").native() + "\" cannot be used: "));
+    EXPECT_THAT(refusal(),
+                StartsWith("its description \"" + (bundle / "Info.plist").native() + "\" cannot be used: "));
 }

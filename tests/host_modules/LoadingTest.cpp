@@ -167,9 +167,12 @@ TEST_F(Loading, PassesOnTheSystemLinkersOwnWords)
 
 TEST_F(Loading, FindsAMissingFunctionInABundleWithObjectiveCBeforeItRuns)
 {
-    const auto bundle = fixture("UnresolvedClasses.bundle");
-    EXPECT_FALSE(load(bundle));
-    EXPECT_EQ(output(), notLoaded(bundle, "undefined symbol: aFunctionThatNobodyHas"));
+    for (const char* name : {"UnresolvedClasses.bundle", "ReadOnlyUnresolved.bundle"})
+    {
+        const auto bundle = fixture(name);
+        EXPECT_FALSE(load(bundle));
+        EXPECT_EQ(output(), notLoaded(bundle, "undefined symbol: aFunctionThatNobodyHas"));
+    }
 }
 
 TEST_F(Loading, LeavesFunctionsToTheirFirstCallWhenAskedTo)

@@ -202,6 +202,25 @@ TEST_F(Unloading, TakesOutOfServiceWhatTheSystemKeepsMapped)
     }
 }
 
+TEST_F(Unloading, TakesOutALibraryWhoseDynamicSectionCannotBeWritten)
+{
+    const auto library = fixture("ReadOnlyDynamic.zmb");
+    EXPECT_TRUE(load(library));
+    EXPECT_TRUE(unload(library));
+    EXPECT_EQ(output(), "ReadOnlyDynamic.zmb: message 1\nReadOnlyDynamic.zmb: message 2\n");
+    EXPECT_FALSE(isMapped(library));
+}
+
+TEST_F(Unloading, KeepsMappedWhatBringsClassesInALibraryWhoseDynamicSectionCannotBeWritten)
+{
+    const auto bundle = fixture("ReadOnlyDynamic.bundle");
+    EXPECT_TRUE(load(bundle));
+    output();
+    EXPECT_TRUE(unload(bundle));
+    EXPECT_EQ(output(), "ReadOnlyDynamic.bundle: message 2\n" + staysInMemory(bundle));
+    EXPECT_TRUE(isMapped(bundle / "ReadOnlyDynamic"));
+}
+
 TEST_F(Unloading, PutsBackIntoServiceWhatStayedMappedWithoutMappingItAgain)
 {
     for (const char* name : {"StaysMapped.zmb", "Classes.bundle"})
