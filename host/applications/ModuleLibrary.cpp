@@ -4,6 +4,7 @@
 
 #include <dlfcn.h>
 
+#include "host/applications/LinkersWords.h"
 #include "host/applications/platform/ObjectiveCRuntime.h"
 #include "host/platform/Bundle.h"
 #include "host/text/Unicode.h"
@@ -20,7 +21,7 @@ std::wstring linkersWords(const std::string& program)
     const char* error = dlerror();
     std::string words = error ? error : "the system does not say why";
     const std::string start = program + ": ";
-    return toWide(words.starts_with(start) ? words.substr(start.size()) : words);
+    return toWide(withReadableSymbols(words.starts_with(start) ? words.substr(start.size()) : words));
 }
 
 void* map(const std::string& program, bool resolveNow)
@@ -79,7 +80,7 @@ Result<std::unique_ptr<ModuleLibrary>> ModuleLibrary::openBundle(const ModuleFil
     if (!handle)
         return Failure{L"the platform has loaded another program in its place"};
     if (const std::string missing = resolveNow ? firstUnresolvedFunction(handle) : ""; !missing.empty())
-        return Failure{L"undefined symbol: " + toWide(missing)};
+        return Failure{L"undefined symbol: " + toWide(withReadableSymbols(missing))};
     return std::unique_ptr<ModuleLibrary>(new ModuleLibrary(file, handle, true));
 }
 

@@ -58,6 +58,7 @@ INSTANTIATE_TEST_SUITE_P(
         BadModule{"NoEntry.zmb", "it has no entry point \"tsrxEntryPoint\""},
         BadModule{"Unresolved.zmb", "undefined symbol: aFunctionThatNobodyHas"},
         BadModule{"UnresolvedClasses.bundle", "undefined symbol: aFunctionThatNobodyHas"},
+        BadModule{"UnresolvedMember.zmb", "undefined symbol: moon::phaseOf(wchar_t const*, int).\n"},
         BadModule{"MissingDependency.zmb", "libfixture_absent.so: cannot open shared object file"},
         BadModule{"Answers3.zmb", "its entry point answered 3"},
         BadModule{"Throws.zmb", "its entry point threw an exception: the coffee is cold"},

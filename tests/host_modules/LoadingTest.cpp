@@ -175,6 +175,16 @@ TEST_F(Loading, FindsAMissingFunctionInABundleWithObjectiveCBeforeItRuns)
     }
 }
 
+TEST_F(Loading, NamesAMissingFunctionAsItStandsInTheSource)
+{
+    for (const char* name : {"UnresolvedMember.zmb", "UnresolvedMember.bundle"})
+    {
+        const auto path = fixture(name);
+        EXPECT_FALSE(load(path));
+        EXPECT_EQ(output(), notLoaded(path, "undefined symbol: moon::phaseOf(wchar_t const*, int)"));
+    }
+}
+
 TEST_F(Loading, LeavesFunctionsToTheirFirstCallWhenAskedTo)
 {
     const auto path = tessel::toWide(fixture("Unresolved.zmb").native());
