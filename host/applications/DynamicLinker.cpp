@@ -1,16 +1,15 @@
 #include "host/applications/DynamicLinker.h"
 
 #include <algorithm>
-#include <exception>
 #include <filesystem>
 #include <ranges>
 #include <utility>
 
+#include "host/applications/ExceptionGuard.h"
 #include "host/applications/ImageCheck.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
 #include "host/messages/MessageBox.h"
-#include "host/platform/ObjectiveCGuard.h"
 #include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
 
@@ -118,7 +117,13 @@ Result<> DynamicLinker::load(const std::wstring& path, bool resolveNow)
         return file.failure();
     if (auto loadable = checkLoadable(program); !loadable)
         return loadable;
+    if (mHalfMapped.contains(program.identity()))
+        return Failure{
+            L"it threw an exception before while it was being mapped, and what is in memory of it since "
+            L"cannot be used"};
     auto opened = open(*file, resolveNow);
+    if (opened.code() == ModuleLibrary::kThrew)
+        mHalfMapped.insert(program.identity());
     if (!opened)
         return opened.failure();
     std::unique_ptr<Module> module = *std::move(opened);
@@ -151,22 +156,9 @@ Result<> DynamicLinker::start(Module& module)
 Result<> DynamicLinker::send(Module& module, unsigned message) const
 {
     const CallingApplication::Scope calling(mCalls, module.path);
-    constexpr wchar_t kThrew[] = L"its entry point threw an exception: ";
     int answer = TSRX_RET_OK;
-    try
-    {
-        const auto returned = catchObjectiveC([&] { answer = module.entryPoint(message, &module); });
-        if (!returned)
-            return Failure{kThrew + returned.sentence()};
-    }
-    catch (const std::exception& error)
-    {
-        return Failure{kThrew + toWide(error.what())};
-    }
-    catch (...)
-    {
-        return Failure{L"its entry point threw something that is not an error of the standard library"};
-    }
+    if (const auto returned = catchAnything([&] { answer = module.entryPoint(message, &module); }); !returned)
+        return Failure{L"its entry point threw " + returned.sentence()};
     if (answer != TSRX_RET_OK)
         return Failure{L"its entry point answered " + std::to_wstring(answer)};
     return {};

@@ -11,6 +11,7 @@
 #pragma once
 
 #include <optional>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -79,6 +80,9 @@ private:
     CommandStack& mCommands;
     MessageBox& mMessageBox;
     LoadedModules mModules;
+    // Libraries that threw while they were being mapped. The system keeps them, and would not make their
+    // variables at another attempt.
+    std::set<FileIdentity> mHalfMapped;
     bool mEnding = false;
 };
 } // namespace tessel

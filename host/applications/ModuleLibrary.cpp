@@ -4,6 +4,7 @@
 
 #include <dlfcn.h>
 
+#include "host/applications/ExceptionGuard.h"
 #include "host/applications/LinkersWords.h"
 #include "host/applications/platform/ObjectiveCRuntime.h"
 #include "host/platform/Bundle.h"
@@ -24,9 +25,19 @@ std::wstring linkersWords(const std::string& program)
     return toWide(withReadableSymbols(words.starts_with(start) ? words.substr(start.size()) : words));
 }
 
+// The headers promise that these never throw, and the compiler believes them; but the code that they call
+// may. What it cannot see through it calls with care.
+void* (*volatile const openLibrary)(const char* path, int mode) = dlopen;
+int (*volatile const closeLibrary)(void* library) = dlclose;
+
 void* map(const std::string& program, bool resolveNow)
 {
-    return dlopen(program.c_str(), (resolveNow ? RTLD_NOW : RTLD_LAZY) | RTLD_LOCAL);
+    return openLibrary(program.c_str(), (resolveNow ? RTLD_NOW : RTLD_LAZY) | RTLD_LOCAL);
+}
+
+Failure threwInMapping(const std::wstring& what)
+{
+    return {L"while it was being mapped, its code threw " + what, ModuleLibrary::kThrew};
 }
 
 // A handle of its own for a library that is mapped, or null.
@@ -61,6 +72,13 @@ ModuleLibrary::ModuleLibrary(ModuleFile file, void* handle, bool byPlatform)
 
 Result<std::unique_ptr<ModuleLibrary>> ModuleLibrary::open(const ModuleFile& file, bool resolveNow)
 {
+    Result<std::unique_ptr<ModuleLibrary>> library = Failure{};
+    const auto returned = catchAnything([&] { library = openUnguarded(file, resolveNow); });
+    return returned ? std::move(library) : threwInMapping(returned.sentence());
+}
+
+Result<std::unique_ptr<ModuleLibrary>> ModuleLibrary::openUnguarded(const ModuleFile& file, bool resolveNow)
+{
     if (file.isBundle && needsBundleLoading(file.program))
         return openBundle(file, resolveNow);
     if (void* handle = map(file.program, resolveNow))
@@ -74,6 +92,8 @@ Result<std::unique_ptr<ModuleLibrary>> ModuleLibrary::openBundle(const ModuleFil
     // Where the platform keeps the reason to itself, the system's linker has the same one.
     if (loaded.code() == kBundleNotAccepted && !map(file.program, true))
         return Failure{linkersWords(file.program)};
+    if (loaded.code() == kBundleRaised)
+        return threwInMapping(L"an exception: " + loaded.sentence());
     if (!loaded)
         return loaded.failure();
     void* handle = mappedLibrary(file.program);
@@ -94,6 +114,8 @@ bool ModuleLibrary::close()
     const bool released = !mByPlatform || unloadBundle(mFile.path);
     if (!released || mustStayMapped(mHandle))
         return false;
-    return dlclose(mHandle) == 0 && !isMapped(mFile.program);
+    bool closed = false;
+    const auto returned = catchAnything([&] { closed = closeLibrary(mHandle) == 0; });
+    return returned && closed && !isMapped(mFile.program);
 }
 } // namespace tessel

@@ -26,6 +26,11 @@ class ModuleLibrary
 public:
     // Maps the file, which has been checked. Why the system refuses is the end of a sentence, in its own
     // words.
+    //
+    // Variables that are made and classes that are loaded on the way may throw, which has a code of its own:
+    // the library then stays in memory, half made. The system's linker is also left with its lock on this
+    // thread, so that another thread that wants something from it waits to the end of the session.
+    static constexpr int kThrew = 2;
     static Result<std::unique_ptr<ModuleLibrary>> open(const ModuleFile& file, bool resolveNow);
 
     // Leaves the library mapped.
@@ -41,6 +46,7 @@ public:
 
 private:
     ModuleLibrary(ModuleFile file, void* handle, bool byPlatform);
+    static Result<std::unique_ptr<ModuleLibrary>> openUnguarded(const ModuleFile& file, bool resolveNow);
     static Result<std::unique_ptr<ModuleLibrary>> openBundle(const ModuleFile& file, bool resolveNow);
 
     ModuleFile mFile;

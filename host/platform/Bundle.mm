@@ -30,11 +30,6 @@ char lowerAscii(char character)
     return character >= 'A' && character <= 'Z' ? static_cast<char>(character - 'A' + 'a') : character;
 }
 
-Failure threw(const Outcome& returned)
-{
-    return {L"the platform's bundles threw an exception: " + returned.sentence()};
-}
-
 bool leadsInside(const std::filesystem::path& name)
 {
     return name.is_relative() && std::find(name.begin(), name.end(), "..") == name.end();
@@ -97,7 +92,7 @@ Result<std::string> programOfBundle(const std::string& folder)
         return checked.failure();
     Result<std::string> program = Failure{};
     const auto returned = catchObjectiveC([&] { program = askForProgram(folder); });
-    return returned ? program : threw(returned);
+    return returned ? program : Failure{L"the platform's bundles raised " + returned.sentence()};
 }
 
 Result<> loadBundle(const std::string& folder)
@@ -106,7 +101,7 @@ Result<> loadBundle(const std::string& folder)
     bool loaded = false;
     const auto returned = catchObjectiveC([&] { loaded = [bundleAt(folder) load] == YES; });
     if (!returned)
-        return threw(returned);
+        return Failure{returned.sentence(), kBundleRaised};
     return loaded ? Result<>() : Failure{L"the platform does not accept it as a bundle", kBundleNotAccepted};
 }
 
@@ -114,6 +109,6 @@ Result<> unloadBundle(const std::string& folder)
 {
     const AutoreleasePool pool;
     const auto returned = catchObjectiveC([&] { [bundleAt(folder) unload]; });
-    return returned ? returned : threw(returned);
+    return returned ? returned : Failure{returned.sentence(), kBundleRaised};
 }
 } // namespace tessel

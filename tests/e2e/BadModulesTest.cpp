@@ -63,6 +63,10 @@ INSTANTIATE_TEST_SUITE_P(
         BadModule{"Answers3.zmb", "its entry point answered 3"},
         BadModule{"Throws.zmb", "its entry point threw an exception: the coffee is cold"},
         BadModule{"ThrowsNumber.omp", "its entry point threw something"},
+        BadModule{"ThrowsInMapping.zmb",
+                  "while it was being mapped, its code threw an exception: the ruler is broken.\n"},
+        BadModule{"RaisesInMapping.bundle", "while it was being mapped, its code threw an exception: "
+                                            "NSInternalInconsistencyException: the kettle is empty.\n"},
         BadModule{"Raises.bundle",
                   "its entry point threw an exception: NSInvalidArgumentException: the tea is cold"},
         BadModule{"Missing.bundle", "No such file or directory"}),

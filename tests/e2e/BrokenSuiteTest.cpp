@@ -122,6 +122,12 @@ INSTANTIATE_TEST_SUITE_P(
         BrokenModule{"Throws.zmb", "its entry point threw an exception: the coffee is cold"},
         BrokenModule{"ThrowsNumber.omp",
                      "its entry point threw something that is not an error of the standard library"},
+        BrokenModule{"ThrowsInMapping.zmb",
+                     "while it was being mapped, its code threw an exception: the ruler is broken"},
+        BrokenModule{"ThrowsWithClasses.bundle",
+                     "while it was being mapped, its code threw an exception: the ruler is broken"},
+        BrokenModule{"RaisesInMapping.bundle", "while it was being mapped, its code threw an exception: "
+                                               "NSInternalInconsistencyException: the kettle is empty"},
         BrokenModule{"Raises.bundle",
                      "its entry point threw an exception: NSInvalidArgumentException: the tea is cold"},
         BrokenModule{"Missing.bundle", "No such file or directory"}),
