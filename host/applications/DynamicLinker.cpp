@@ -58,11 +58,17 @@ Result<> checkLoadable(const RegularFile& program)
                          { return program.read(offset, buffer, size); });
 }
 
-Result<std::unique_ptr<Module>> open(const ModuleFile& file, bool resolveNow)
+// The path may have come to lead to another file since the program was checked, or the system may hold an
+// earlier file of that path.
+Result<std::unique_ptr<Module>> open(const ModuleFile& file, const RegularFile& program, bool resolveNow)
 {
     auto library = ModuleLibrary::open(file, resolveNow);
     if (!library)
         return library.failure();
+    if (!(*library)->isFrom(program))
+        return Failure{(*library)->close()
+                           ? L"its file was replaced while it was being loaded"
+                           : L"the code of another file is in memory in its place, until the session ends"};
     auto module = std::make_unique<Module>();
     module->library = *std::move(library);
     module->entryPoint = module->library->entryPoint();
@@ -121,7 +127,7 @@ Result<> DynamicLinker::load(const std::wstring& path, bool resolveNow)
         return Failure{
             L"it threw an exception before while it was being mapped, and what is in memory of it since "
             L"cannot be used"};
-    auto opened = open(*file, resolveNow);
+    auto opened = open(*file, program, resolveNow);
     if (opened.code() == ModuleLibrary::kThrew)
         mHalfMapped.insert(program.identity());
     if (!opened)

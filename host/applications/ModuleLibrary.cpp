@@ -6,6 +6,7 @@
 
 #include "host/applications/ExceptionGuard.h"
 #include "host/applications/LinkersWords.h"
+#include "host/applications/platform/MappedImage.h"
 #include "host/applications/platform/ObjectiveCRuntime.h"
 #include "host/platform/Bundle.h"
 #include "host/text/Unicode.h"
@@ -102,6 +103,11 @@ Result<std::unique_ptr<ModuleLibrary>> ModuleLibrary::openBundle(const ModuleFil
     if (const std::string missing = resolveNow ? firstUnresolvedFunction(handle) : ""; !missing.empty())
         return Failure{L"undefined symbol: " + toWide(withReadableSymbols(missing))};
     return std::unique_ptr<ModuleLibrary>(new ModuleLibrary(file, handle, true));
+}
+
+bool ModuleLibrary::isFrom(const RegularFile& program) const
+{
+    return isMappedFrom(mHandle, program.descriptor()) && program.keepsItsSize();
 }
 
 TsRxEntryPoint ModuleLibrary::entryPoint() const

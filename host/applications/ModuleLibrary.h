@@ -6,6 +6,7 @@
 
 #include <tessel/tsrx.h>
 
+#include "host/platform/RegularFile.h"
 #include "host/text/Result.h"
 
 namespace tessel
@@ -37,6 +38,10 @@ public:
     ~ModuleLibrary() = default;
     ModuleLibrary(const ModuleLibrary&) = delete;
     ModuleLibrary& operator=(const ModuleLibrary&) = delete;
+
+    // Whether this is the file's code that is in memory, and the file is as long as it was when it was
+    // opened.
+    bool isFrom(const RegularFile& program) const;
 
     // Null when the library has none.
     TsRxEntryPoint entryPoint() const;

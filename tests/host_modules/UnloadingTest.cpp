@@ -242,6 +242,35 @@ TEST_F(Unloading, PutsBackIntoServiceWhatStayedMappedWithoutMappingItAgain)
     }
 }
 
+TEST_F(Unloading, RefusesAnotherFileAtThePathOfWhatStayedMapped)
+{
+    for (const char* name : {"StaysMapped.zmb", "Classes.bundle"})
+    {
+        const auto path = fixture(name);
+        const auto program = name == std::string("StaysMapped.zmb") ? path : path / "Classes";
+        load(path);
+        EXPECT_TRUE(unload(path));
+        output();
+        std::filesystem::copy_file(program, mFolder / "next");
+        std::filesystem::rename(mFolder / "next", program);
+        EXPECT_FALSE(load(path));
+        EXPECT_EQ(output(),
+                  notLoaded(path, "the code of another file is in memory in its place, until the session "
+                                  "ends"));
+        EXPECT_EQ(names(), L"");
+    }
+}
+
+TEST_F(Unloading, LoadsAnotherFileAtThePathOfWhatWentOut)
+{
+    const auto path = fixture("Good.zmb");
+    load(path);
+    EXPECT_TRUE(unload(path));
+    std::filesystem::copy_file(path, mFolder / "next");
+    std::filesystem::rename(mFolder / "next", path);
+    EXPECT_TRUE(load(path)) << output();
+}
+
 TEST_F(Unloading, SaysNothingOfWhatStaysMappedWhenNotAskedTo)
 {
     const auto path = fixture("StaysMapped.zmb");
