@@ -1,7 +1,10 @@
 // LOAD, UNLOAD, APPS: applications without the dialog.
 #include <algorithm>
 #include <array>
+#include <chrono>
+#include <iomanip>
 #include <limits>
+#include <sstream>
 
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
@@ -100,16 +103,52 @@ void sayApplication(Parts& parts, const std::wstring& path, const std::wstring& 
                        padded(toText(file.parent_path()), kFolderColumn) + L" " + state);
 }
 
+// "0.4 ms", "37 ms", "2.1 s".
+std::wstring duration(std::chrono::microseconds time)
+{
+    using Milliseconds = std::chrono::duration<double, std::milli>;
+    constexpr Milliseconds kWithoutTenths{10};
+    constexpr Milliseconds kSecond{1000};
+    const Milliseconds milliseconds = time;
+    std::wostringstream text;
+    text << std::fixed << std::setprecision(milliseconds < kWithoutTenths || milliseconds >= kSecond ? 1 : 0);
+    if (milliseconds < kSecond)
+        text << milliseconds.count() << L" ms";
+    else
+        text << milliseconds / kSecond << L" s";
+    return text.str();
+}
+
+std::wstring withTime(const Parts& parts, const std::wstring& path, const std::wstring& state)
+{
+    const LoadOutcome* outcome = parts.loadOutcomes.of(path);
+    return outcome && outcome->loaded ? state + L", loaded in " + duration(outcome->took) : state;
+}
+
+void sayNotLoaded(Parts& parts)
+{
+    const auto failed = parts.loadOutcomes.failed();
+    if (!failed.empty())
+        sayLine(parts, L"Not loaded in this session:");
+    for (const LoadOutcome& outcome : failed)
+        sayApplication(parts, outcome.path, outcome.loaded.sentence());
+}
+
 Result<> listApplications(Parts& parts, const CommandStack::Arguments&)
 {
     const auto modules = parts.linker->loadedModules();
     for (const auto& module : modules)
-        sayApplication(parts, module.path, module.locked ? L"locked" : L"may be unloaded");
+        sayApplication(parts, module.path,
+                       withTime(parts, module.path, module.locked ? L"locked" : L"may be unloaded"));
     const int lispFiles = parts.document->loadedApplicationCount();
     for (int index = 0; index < lispFiles; ++index)
-        sayApplication(parts, parts.document->loadedApplicationName(index), L"Lisp");
+    {
+        const std::wstring path = parts.document->loadedApplicationName(index);
+        sayApplication(parts, path, withTime(parts, path, L"Lisp"));
+    }
     if (modules.empty() && lispFiles == 0)
         sayLine(parts, L"No application is loaded.");
+    sayNotLoaded(parts);
     return {};
 }
 } // namespace
@@ -120,6 +159,7 @@ void addApplicationCommands(Parts& parts)
                {kApplicationsGroup, L"LOAD", L"file or address", L"Loads a compiled module or a Lisp file"},
                load);
     addBuiltIn(parts, {kApplicationsGroup, L"UNLOAD", L"file", L"Unloads a compiled module"}, unload);
-    addBuiltIn(parts, {kApplicationsGroup, L"APPS", L"", L"Lists what is loaded"}, listApplications);
+    addBuiltIn(parts, {kApplicationsGroup, L"APPS", L"", L"Lists what is loaded, and what could not be"},
+               listApplications);
 }
 } // namespace tessel

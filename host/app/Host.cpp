@@ -5,6 +5,7 @@
 
 #include "host/app/BuiltIn.h"
 #include "host/app/Parts.h"
+#include "host/applications/StartSummary.h"
 #include "host/console/Console.h"
 #include "host/messages/WindowBox.h"
 #include "host/platform/AutoreleasePool.h"
@@ -38,10 +39,20 @@ bool Host::start()
     const Interruption::Work work(mInterruption);
     if (!mCommandLine.tell(makeParts()))
         return false;
+    mParts->messageBox->collect();
     if (!mOptions.safe)
         mParts->demandLoading.loadAtStart();
     finishLine();
+    tellOfStart();
     return true;
+}
+
+void Host::tellOfStart()
+{
+    const auto boxes = mParts->messageBox->takeCollected();
+    noteRefusedFiles(boxes, mParts->loadOutcomes);
+    if (const auto summary = summarize(mParts->loadOutcomes.failed(), boxes))
+        mParts->messageBox->show(summary->box, summary->lines);
 }
 
 Result<> Host::makeParts()

@@ -79,6 +79,7 @@ private:
     Result<> makeParts();
     Result<> prepareProfileFolder();
     void tellWhoElseWritesTheProfile();
+    void tellOfStart();
     void addCommands();
     bool finishLine();
 

@@ -13,6 +13,7 @@
 #include "host/applications/DemandLoading.h"
 #include "host/applications/Document.h"
 #include "host/applications/DynamicLinker.h"
+#include "host/applications/LoadOutcomes.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
 #include "host/commands/EndRequest.h"
@@ -60,7 +61,8 @@ struct Parts
     Owned<CommandStack> commands{*commandLine, *callingApplication};
     Owned<ResourceModules> resources{toWide(layout.resources.string()), *callingApplication};
     Owned<MessageBox> messageBox{*commandLine};
-    Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands, *messageBox};
+    LoadOutcomes loadOutcomes;
+    Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands, *messageBox, loadOutcomes};
     Owned<ApplicationRecords> records{*registry, *commands, *callingApplication, kProductRegistryRoot};
     DemandLoading demandLoading{layout.plugIns, *records, *linker};
     Owned<Document> document;
@@ -72,7 +74,8 @@ struct Parts
     // Publishes itself. The variable is read here, before any application is loaded, and holds for the
     // session.
     Result<std::unique_ptr<LispInterpreter>> startedLisp = LispInterpreter::start(
-        {.removingTsLisp = variables->number(kRemovingTsLisp) != 0}, *commandLine, *document, *endRequest);
+        {.removingTsLisp = variables->number(kRemovingTsLisp) != 0, .outcomes = &loadOutcomes}, *commandLine,
+        *document, *endRequest);
 
     // Only of parts whose Lisp has started.
     LispInterpreter& lisp() const { return **startedLisp; }

@@ -7,6 +7,7 @@
 
 #include "host/applications/ExceptionGuard.h"
 #include "host/applications/ImageCheck.h"
+#include "host/applications/LoadOutcomes.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
 #include "host/messages/MessageBox.h"
@@ -83,8 +84,9 @@ RegularFile programOf(const Result<ModuleFile>& file)
 } // namespace
 
 DynamicLinker::DynamicLinker(CommandLine& commandLine, CallingApplication& calls, CommandStack& commands,
-                             MessageBox& messageBox)
-    : mCommandLine(commandLine), mCalls(calls), mCommands(commands), mMessageBox(messageBox)
+                             MessageBox& messageBox, LoadOutcomes& outcomes)
+    : mCommandLine(commandLine), mCalls(calls), mCommands(commands), mMessageBox(messageBox),
+      mOutcomes(outcomes)
 {
 }
 
@@ -99,7 +101,12 @@ bool DynamicLinker::registerApplication(void* application)
 bool DynamicLinker::loadModule(const wchar_t* path, bool sayWhyNot, bool resolveNow)
 {
     const std::wstring fullPath = fullPathOf(path);
+    const bool wasKnown = mModules.withPath(fullPath) != nullptr;
+    const auto begun = LoadOutcomes::Clock::now();
     const auto loaded = load(fullPath, resolveNow);
+    // By a link to what is there already nothing is loaded.
+    if (!loaded || (!wasKnown && mModules.withPath(fullPath)))
+        mOutcomes.note(fullPath, loaded, begun);
     if (loaded)
         return true;
     mMessageBox.explain(fullPath, loaded.sentence() + L".");

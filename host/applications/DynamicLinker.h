@@ -24,6 +24,7 @@ namespace tessel
 class CallingApplication;
 class CommandLine;
 class CommandStack;
+class LoadOutcomes;
 class MessageBox;
 
 class DynamicLinker : public TsRxDynamicLinker
@@ -37,9 +38,9 @@ public:
     };
 
     // Says on the command line why something failed, tells `calls` whose entry point runs, takes the commands
-    // of what goes out of `commands`, and gives the message box its detail.
+    // of what goes out of `commands`, gives the message box its detail, and notes how loading came off.
     DynamicLinker(CommandLine& commandLine, CallingApplication& calls, CommandStack& commands,
-                  MessageBox& messageBox);
+                  MessageBox& messageBox, LoadOutcomes& outcomes);
 
     bool registerApplication(void* application) override;
     bool loadModule(const wchar_t* path, bool sayWhyNot, bool resolveNow) override;
@@ -79,6 +80,7 @@ private:
     CallingApplication& mCalls;
     CommandStack& mCommands;
     MessageBox& mMessageBox;
+    LoadOutcomes& mOutcomes;
     LoadedModules mModules;
     // Libraries that threw while they were being mapped. The system keeps them, and would not make their
     // variables at another attempt.

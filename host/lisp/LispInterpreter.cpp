@@ -6,6 +6,7 @@
 
 #include "host/applications/Document.h"
 #include "host/commands/EndRequest.h"
+#include "host/lisp/LispLoads.h"
 #include "host/lisp/LispMachine.h"
 #include "host/text/CommandLine.h"
 
@@ -14,24 +15,30 @@ namespace tessel
 namespace
 {
 LispSurroundings surroundings(const LispInterpreter::Options& options, CommandLine& commandLine,
-                              Document& document)
+                              Document& document, LispLoads& loads)
 {
     return {.removingTsLisp = options.removingTsLisp,
             .heapBytes = options.heapBytes != 0 ? options.heapBytes : kLispHeapBytes,
             .write = [&commandLine](std::wstring_view text) { commandLine.print(text); },
             .column = [&commandLine] { return commandLine.openLine().size(); },
             .fileLoaded =
-                [&document](const std::wstring& path)
+                [&document, &loads](const std::wstring& path)
             {
                 document.add(path);
+                loads.loaded(path);
+            },
+            .fileAsked =
+                [&loads](const std::wstring& path)
+            {
+                loads.asked(path);
             }};
 }
 } // namespace
 
-LispInterpreter::LispInterpreter(std::unique_ptr<LispMachine> machine, bool removingTsLisp,
-                                 CommandLine& commandLine, const EndRequest& endRequest)
-    : mMachine(std::move(machine)), mRemovingTsLisp(removingTsLisp), mCommandLine(commandLine),
-      mEndRequest(endRequest)
+LispInterpreter::LispInterpreter(std::unique_ptr<LispMachine> machine, std::unique_ptr<LispLoads> loads,
+                                 bool removingTsLisp, CommandLine& commandLine, const EndRequest& endRequest)
+    : mLoads(std::move(loads)), mMachine(std::move(machine)), mRemovingTsLisp(removingTsLisp),
+      mCommandLine(commandLine), mEndRequest(endRequest)
 {
 }
 
@@ -39,18 +46,22 @@ Result<std::unique_ptr<LispInterpreter>> LispInterpreter::start(const Options& o
                                                                 CommandLine& commandLine, Document& document,
                                                                 const EndRequest& endRequest)
 {
-    auto machine = LispMachine::start(surroundings(options, commandLine, document));
+    auto loads = std::make_unique<LispLoads>(options.outcomes);
+    auto machine = LispMachine::start(surroundings(options, commandLine, document, *loads));
     if (!machine)
         return machine.failure();
-    return std::unique_ptr<LispInterpreter>(
-        new LispInterpreter(*std::move(machine), options.removingTsLisp, commandLine, endRequest));
+    return std::unique_ptr<LispInterpreter>(new LispInterpreter(
+        *std::move(machine), std::move(loads), options.removingTsLisp, commandLine, endRequest));
 }
 
 LispInterpreter::~LispInterpreter() = default;
 
 Result<std::wstring> LispInterpreter::evaluate(std::wstring_view expressions)
 {
-    return mMachine->evaluate(expressions);
+    mLoads->begin();
+    auto value = mMachine->evaluate(expressions);
+    mLoads->end(value);
+    return value;
 }
 
 void LispInterpreter::queue(std::wstring expression)

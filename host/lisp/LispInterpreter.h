@@ -17,15 +17,18 @@ namespace tessel
 class CommandLine;
 class Document;
 class EndRequest;
+class LispLoads;
 class LispMachine;
+class LoadOutcomes;
 
 class LispInterpreter
 {
 public:
     struct Options
     {
-        bool removingTsLisp = true; // compiled and packaged Lisp can be loaded
-        std::size_t heapBytes = 0;  // memory for Lisp's objects; 0: as much as is usual
+        bool removingTsLisp = true;       // compiled and packaged Lisp can be loaded
+        std::size_t heapBytes = 0;        // memory for Lisp's objects; 0: as much as is usual
+        LoadOutcomes* outcomes = nullptr; // where it is noted how loading files came off
     };
 
     // Starts Lisp, on the thread on which everything but `interrupt` is to be called. A later interpreter in
@@ -70,9 +73,10 @@ public:
     unsigned evaluations() const noexcept;
 
 private:
-    LispInterpreter(std::unique_ptr<LispMachine> machine, bool removingTsLisp, CommandLine& commandLine,
-                    const EndRequest& endRequest);
+    LispInterpreter(std::unique_ptr<LispMachine> machine, std::unique_ptr<LispLoads> loads,
+                    bool removingTsLisp, CommandLine& commandLine, const EndRequest& endRequest);
 
+    std::unique_ptr<LispLoads> mLoads;
     std::unique_ptr<LispMachine> mMachine;
     bool mRemovingTsLisp;
     CommandLine& mCommandLine;

@@ -28,6 +28,7 @@ struct LispSurroundings
     std::function<void(std::wstring_view)> write;             // what Lisp prints, in pieces
     std::function<std::size_t()> column;                      // characters on the line that is not ended yet
     std::function<void(const std::wstring& path)> fileLoaded; // without an error; the path as it was given
+    std::function<void(const std::wstring& path)> fileAsked = {}; // before it is looked for; the same path
 };
 
 class LispMachine

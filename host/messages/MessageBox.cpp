@@ -49,14 +49,37 @@ std::wstring MessageBox::takeDetailFor(const std::wstring& text)
     return !path.empty() && text.find(path) != std::wstring::npos ? asSentence(why) : std::wstring();
 }
 
+void MessageBox::collect()
+{
+    mCollected.emplace();
+}
+
+std::vector<MessageBox::Box> MessageBox::takeCollected()
+{
+    return std::exchange(mCollected, std::nullopt).value_or(std::vector<Box>());
+}
+
+void MessageBox::show(const Box& box, const std::wstring& lines)
+{
+    static_cast<void>(present(box, lines)); // nothing depends on the button
+}
+
+int MessageBox::present(const Box& box, const std::wstring& lines)
+{
+    if (const int answer = mPresenter ? mPresenter(box) : 0)
+        return answer;
+    mCommandLine.say(L"Message: " + lines);
+    return IDOK; // every style begins with the button OK
+}
+
 int MessageBox::show(const wchar_t* text, unsigned style, void* parent)
 {
     const std::wstring message = text ? text : L"";
-    const std::wstring detail = takeDetailFor(message);
-    if (const int answer = mPresenter ? mPresenter({message, detail, style, parent}) : 0)
-        return answer;
-    mCommandLine.say(L"Message: " + message);
-    return IDOK; // every style begins with the button OK
+    const Box box{message, takeDetailFor(message), style, parent};
+    if (!mCollected || parent)
+        return present(box, message);
+    mCollected->push_back(box);
+    return IDOK;
 }
 } // namespace tessel
 

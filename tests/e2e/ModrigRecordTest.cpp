@@ -126,6 +126,9 @@ TEST_F(ModrigRecord, OfAModrigThatIsGoneIsTold)
     run({"APPS"});
     setInRecord("Module", "/nowhere/Modrig.bundle");
     const std::string refusal = linkerRefuses("/nowhere/Modrig.bundle", "No such file or directory");
-    EXPECT_EQ(run({"APPS"}), refusal + kPrimes + modrigLoaded() + listed(sample("primes.zmb")))
+    EXPECT_EQ(run({"APPS"}), refusal + kPrimes +
+                                 startSummary({{"/nowhere/Modrig.bundle", "No such file or directory."}}) +
+                                 modrigLoaded() + listed(sample("primes.zmb")) +
+                                 listedAsNotLoaded({{"/nowhere/Modrig.bundle", "No such file or directory"}}))
         << "the one in the PlugIns folder has no record and is loaded";
 }

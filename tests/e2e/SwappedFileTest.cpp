@@ -70,4 +70,5 @@ TEST_P(SwappedFile, IsLoadedWhenItIsTheSame)
 }
 
 INSTANTIATE_TEST_SUITE_P(OfEveryKind, SwappedFile,
-                         testing::Values("Good.zmb", "Good.omp", "Good.bundle", "Classes.bundle"), nameOfSwapped);
+                         testing::Values("Good.zmb", "Good.omp", "Good.bundle", "Classes.bundle"),
+                         nameOfSwapped);

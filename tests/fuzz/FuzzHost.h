@@ -1,5 +1,5 @@
-// What the targets share that run on the host's own parts: a folder that goes with the process, and outcomes that are
-// worth keeping an input for. The parts are built without telling which of their lines were reached.
+// What the targets share that run on the host's own parts: a folder that goes with the process, and outcomes
+// that are worth keeping an input for. The parts are built without telling which of their lines were reached.
 #pragma once
 
 #include <cstdint>

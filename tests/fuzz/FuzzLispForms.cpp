@@ -1,5 +1,5 @@
-// Lisp forms as they are typed, read by the host's Lisp with any text: each text is read to its end or answered with one
-// line, and Lisp goes on. Nothing of it is evaluated: that could do whatever a person can.
+// Lisp forms as they are typed, read by the host's Lisp with any text: each text is read to its end or
+// answered with one line, and Lisp goes on. Nothing of it is evaluated: that could do whatever a person can.
 #include <algorithm>
 #include <memory>
 
@@ -20,7 +20,8 @@ constexpr wchar_t kReader[] =
 
 struct Session
 {
-    tessel::CommandLine commandLine{[](std::string_view) {}};
+    tessel::CommandLine commandLine{[](std::string_view) {
+    }};
     tessel::Document document;
     tessel::EndRequest endRequest;
     std::unique_ptr<tessel::LispInterpreter> lisp = start();

@@ -1,5 +1,5 @@
-// Modrig's lists in the host's real registry: a list comes back as it was stored, whatever its entries are, and of a
-// list that somebody else has written, whatever it holds, something sensible is read.
+// Modrig's lists in the host's real registry: a list comes back as it was stored, whatever its entries are,
+// and of a list that somebody else has written, whatever it holds, something sensible is read.
 #include <algorithm>
 #include <memory>
 #include <string>
@@ -27,7 +27,8 @@ struct Session
         tessel::HostOptions options;
         options.profileFolder = fuzzFolder() / "profile";
         options.safe = true;
-        options.output = [](std::string_view) {};
+        options.output = [](std::string_view) {
+        };
         auto started = std::make_unique<tessel::Host>(options);
         require(started->start());
         return started;
@@ -72,7 +73,8 @@ void checkOwnList(const Session& session, const std::vector<std::wstring>& texts
 {
     CStringList list;
     for (const std::wstring& text : texts)
-        if (!text.empty() && text.size() <= kLongestEntry && !ModrigUtils::FoundinSpecificList(CStdStr(text), list))
+        if (!text.empty() && text.size() <= kLongestEntry &&
+            !ModrigUtils::FoundinSpecificList(CStdStr(text), list))
             list.AddTail(CStdStr(text));
     ModrigUtils::WriteStoredList(kStoredHistory, list);
     session.endLine();
@@ -83,9 +85,13 @@ void checkOwnList(const Session& session, const std::vector<std::wstring>& texts
 void checkForeignList(const Session& session, const std::vector<std::wstring>& texts)
 {
     ModrigUtils::WriteStoredList(kStoredHistory, {});
-    const CStdStr key = ModrigUtils::GetModrigProfileRegKey() + CStdStr(L"\\") + CStdStr(kStoredHistory.subKey);
+    const CStdStr key =
+        ModrigUtils::GetModrigProfileRegKey() + CStdStr(L"\\") + CStdStr(kStoredHistory.subKey);
     const auto write = [&key](const std::wstring& name, const std::wstring& data)
-    { static_cast<void>(ModrigUtils::WriteModrigRegString(HKEY_CURRENT_USER, key, CStdStr(name), CStdStr(data))); };
+    {
+        static_cast<void>(
+            ModrigUtils::WriteModrigRegString(HKEY_CURRENT_USER, key, CStdStr(name), CStdStr(data)));
+    };
     if (!texts.empty())
         write(kStoredHistory.count, texts.front());
     for (std::size_t index = 1; index + 1 < texts.size(); index += 2)

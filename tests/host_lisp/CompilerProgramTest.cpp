@@ -154,10 +154,12 @@ TEST_F(LispCompiler, WritesIntoNoFileThatStandsBesideItsOutput)
     const auto other = write("other", "somebody else's");
     for (const char* name : {"app.qbc.part", ".part-1", "app.qbc"})
         std::filesystem::create_symlink(other, folder / name);
-    EXPECT_TRUE(std::filesystem::is_regular_file(std::filesystem::symlink_status(compile("app", kApplication))));
+    EXPECT_TRUE(
+        std::filesystem::is_regular_file(std::filesystem::symlink_status(compile("app", kApplication))));
     EXPECT_EQ(bytesOf(other), "somebody else's");
     for (const auto& entry : std::filesystem::directory_iterator(folder.path()))
-        EXPECT_THAT(entry.path().filename().string(), AnyOf("app.lsp", "app.qbc", "app.qbc.part", "other", ".part-1"));
+        EXPECT_THAT(entry.path().filename().string(),
+                    AnyOf("app.lsp", "app.qbc", "app.qbc.part", "other", ".part-1"));
 }
 
 TEST_F(LispCompiler, MakesFilesThatOthersMayReadAsIsUsual)
@@ -174,8 +176,11 @@ TEST_F(LispCompiler, ShowsControlCharactersAsEscapes)
     EXPECT_EQ(run.status, 1);
     EXPECT_THAT(run.errors, HasSubstr("/nowhere/\\x1B]0;taken\\x07.lsp"));
     EXPECT_THAT(tesselc({"--\x1b]0;taken\x07"}).errors, HasSubstr("\\x1B]0;taken\\x07"));
-    EXPECT_THAT(tesselc({write("app.lsp", "(eval-when (:compile-toplevel :load-toplevel :execute) (princ (code-char 27)))")}).output,
-                Not(HasSubstr("\x1b")));
+    EXPECT_THAT(
+        tesselc({write("app.lsp",
+                       "(eval-when (:compile-toplevel :load-toplevel :execute) (princ (code-char 27)))")})
+            .output,
+        Not(HasSubstr("\x1b")));
 }
 
 TEST_F(LispCompiler, RefusesWrongArgumentsAndExplainsItself)

@@ -7,6 +7,7 @@
 #include <gtest/gtest.h>
 
 #include "host/applications/DynamicLinker.h"
+#include "host/applications/LoadOutcomes.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
 #include "host/messages/MessageBox.h"
@@ -54,7 +55,8 @@ protected:
     tessel::CallingApplication mCalls;
     tessel::CommandStack mCommands{mCommandLine, mCalls};
     tessel::MessageBox mMessageBox{mCommandLine};
-    tessel::DynamicLinker mLinker{mCommandLine, mCalls, mCommands, mMessageBox};
+    tessel::LoadOutcomes mOutcomes;
+    tessel::DynamicLinker mLinker{mCommandLine, mCalls, mCommands, mMessageBox, mOutcomes};
     tessel::ResourceModules mResources{tessel::toWide((mFolder / "HostResources").native()), mCalls};
 
 private:

@@ -46,7 +46,10 @@ public:
     MappedPage(const MappedPage&) = delete;
     MappedPage& operator=(const MappedPage&) = delete;
 
-    std::uintptr_t address() const { return mPage == MAP_FAILED ? 0 : reinterpret_cast<std::uintptr_t>(mPage); }
+    std::uintptr_t address() const
+    {
+        return mPage == MAP_FAILED ? 0 : reinterpret_cast<std::uintptr_t>(mPage);
+    }
 
 private:
     void* mPage;

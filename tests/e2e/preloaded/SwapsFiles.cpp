@@ -1,6 +1,6 @@
 // Loaded in front of the system's libraries: replaces a file at the moment at which it is to be mapped.
-// The environment says which: SWAP_FILE, and SWAP_WITH for what comes in its place. GROW_FILE names one that gets
-// a further byte at that moment.
+// The environment says which: SWAP_FILE, and SWAP_WITH for what comes in its place. GROW_FILE names one that
+// gets a further byte at that moment.
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
