@@ -52,7 +52,7 @@ void Host::tellOfStart()
     const auto boxes = mParts->messageBox->takeCollected();
     noteRefusedFiles(boxes, mParts->loadOutcomes);
     if (const auto summary = summarize(mParts->loadOutcomes.failed(), boxes))
-        mParts->messageBox->show(summary->box, summary->lines);
+        mParts->messageBox->show(summary->box, summary->lines, !summary->fits);
 }
 
 Result<> Host::makeParts()

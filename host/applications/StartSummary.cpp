@@ -1,9 +1,9 @@
 #include "host/applications/StartSummary.h"
 
 #include <algorithm>
-#include <iterator>
 #include <map>
 #include <string_view>
+#include <unordered_set>
 
 #include <tessel/tsmessagebox.h>
 
@@ -11,11 +11,13 @@ namespace tessel
 {
 namespace
 {
-// More would not fit on a small screen.
-constexpr std::size_t kMostInBox = 8;
+// More would not fit on a small screen; the command line has it all.
+constexpr std::size_t kMostInBox = 5;
+constexpr std::size_t kLongestInBox = 240;
 constexpr std::wstring_view kEndsOfSentences = L".!?…";
 
 using Boxes = std::vector<MessageBox::Box>;
+using Texts = std::vector<std::wstring>;
 
 struct Entry
 {
@@ -31,16 +33,20 @@ std::wstring quotedIn(const std::wstring& text)
     return end == text.npos ? std::wstring() : text.substr(start + 1, end - start - 1);
 }
 
-bool names(const MessageBox::Box& box, const Entry& entry)
-{
-    return box.text.find(entry.file) != std::wstring::npos;
-}
-
+// Boxes that name one of the files. A quoted one is looked up, which thousands of them would feel.
 void dropKnown(Boxes& boxes, const std::vector<Entry>& entries)
 {
-    std::erase_if(
-        boxes, [&](const MessageBox::Box& box)
-        { return std::ranges::any_of(entries, [&](const Entry& entry) { return names(box, entry); }); });
+    std::unordered_set<std::wstring> files;
+    for (const Entry& entry : entries)
+        files.insert(entry.file);
+    const auto isKnown = [&](const MessageBox::Box& box)
+    {
+        const std::wstring quoted = quotedIn(box.text);
+        return quoted.empty() ? std::ranges::any_of(files, [&](const std::wstring& file)
+                                                    { return box.text.find(file) != file.npos; })
+                              : files.contains(quoted);
+    };
+    std::erase_if(boxes, isKnown);
 }
 
 std::vector<Entry> entriesOf(const std::vector<LoadOutcome>& failed)
@@ -58,7 +64,7 @@ std::wstring lineFor(const Entry& entry)
     return entry.file + L": " + entry.why + (isEnded ? L"" : L".");
 }
 
-std::wstring joined(const std::vector<std::wstring>& texts, const std::wstring& between)
+std::wstring joined(const Texts& texts, const std::wstring& between)
 {
     std::wstring result;
     for (const std::wstring& text : texts)
@@ -72,27 +78,55 @@ std::wstring countOf(std::size_t applications)
                              : std::to_wstring(applications) + L" applications could not be loaded";
 }
 
-std::wstring detailOf(const std::vector<Entry>& entries, const std::vector<std::wstring>& messages)
+// As many as fit into a box, each on as many lines as fit.
+std::wstring fitted(const Texts& texts)
 {
-    std::vector<std::wstring> paragraphs;
-    for (const Entry& entry : entries)
-        if (paragraphs.size() < kMostInBox)
-            paragraphs.push_back(lineFor(entry));
-    if (entries.size() > kMostInBox)
-        paragraphs.push_back(L"And " + std::to_wstring(entries.size() - kMostInBox) +
-                             L" more: the command line has told of all of them, and APPS lists them.");
-    std::ranges::copy(messages, std::back_inserter(paragraphs));
-    return joined(paragraphs, L"\n\n");
+    Texts shown(texts.begin(),
+                texts.begin() + static_cast<std::ptrdiff_t>(std::min(texts.size(), kMostInBox)));
+    for (std::wstring& text : shown)
+        if (text.size() > kLongestInBox)
+            text.replace(kLongestInBox - 1, text.npos, 1, L'…');
+    if (texts.size() > kMostInBox)
+        shown.push_back(L"And " + std::to_wstring(texts.size() - kMostInBox) +
+                        L" more: the command line lists them all.");
+    return joined(shown, L"\n\n");
 }
 
-std::wstring linesOf(const std::vector<Entry>& entries, const std::vector<std::wstring>& messages)
+Texts textsOf(const Boxes& boxes)
 {
+    Texts texts;
+    for (const MessageBox::Box& box : boxes)
+        texts.push_back(box.text);
+    return texts;
+}
+
+StartSummary summaryOf(const std::vector<Entry>& entries, const Texts& messages)
+{
+    Texts texts;
     std::wstring lines = countOf(entries.size()) + L":";
     for (const Entry& entry : entries)
-        lines += L"\n  " + lineFor(entry);
+    {
+        texts.push_back(lineFor(entry));
+        lines += L"\n  " + texts.back();
+    }
     for (const std::wstring& message : messages)
+    {
+        texts.push_back(message);
         lines += L"\n" + message;
-    return lines;
+    }
+    const std::wstring detail = fitted(texts);
+    return {{.text = countOf(entries.size()) + L".", .detail = detail, .style = MB_ICONEXCLAMATION},
+            lines,
+            detail == joined(texts, L"\n\n")};
+}
+
+StartSummary summaryOf(const Boxes& boxes)
+{
+    const Texts texts = textsOf(boxes);
+    MessageBox::Box box = boxes.front();
+    if (texts.size() > 1)
+        box.text = fitted(texts);
+    return {box, joined(texts, L"\n"), box.text == joined(texts, L"\n\n")};
 }
 } // namespace
 
@@ -113,18 +147,8 @@ std::optional<StartSummary> summarize(const std::vector<LoadOutcome>& failed, co
     Boxes others = boxes;
     const std::vector<Entry> entries = entriesOf(failed);
     dropKnown(others, entries);
-    std::vector<std::wstring> messages;
-    for (const MessageBox::Box& box : others)
-        messages.push_back(box.text);
     if (!entries.empty())
-        return StartSummary{{.text = countOf(entries.size()) + L".",
-                             .detail = detailOf(entries, messages),
-                             .style = MB_ICONEXCLAMATION},
-                            linesOf(entries, messages)};
-    if (others.empty())
-        return std::nullopt;
-    MessageBox::Box box = others.front();
-    box.text = joined(messages, L"\n\n");
-    return StartSummary{box, joined(messages, L"\n")};
+        return summaryOf(entries, textsOf(others));
+    return others.empty() ? std::nullopt : std::optional(summaryOf(others));
 }
 } // namespace tessel

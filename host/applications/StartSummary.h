@@ -14,6 +14,7 @@ struct StartSummary
 {
     MessageBox::Box box;
     std::wstring lines; // the same for the command line, whole
+    bool fits = true;   // the box holds all of it, too
 };
 
 // Whoever loads files says first what is wrong with one, and then that it was not loaded. Files that two

@@ -59,27 +59,35 @@ std::vector<MessageBox::Box> MessageBox::takeCollected()
     return std::exchange(mCollected, std::nullopt).value_or(std::vector<Box>());
 }
 
-void MessageBox::show(const Box& box, const std::wstring& lines)
+void MessageBox::show(const Box& box, const std::wstring& lines, bool linesToo)
 {
-    static_cast<void>(present(box, lines)); // nothing depends on the button
+    if (linesToo || present(box) == 0)
+        sayMessage(lines);
+    if (linesToo)
+        static_cast<void>(present(box)); // nothing depends on the button
 }
 
-int MessageBox::present(const Box& box, const std::wstring& lines)
+int MessageBox::present(const Box& box) const
 {
-    if (const int answer = mPresenter ? mPresenter(box) : 0)
-        return answer;
-    mCommandLine.say(L"Message: " + lines);
-    return IDOK; // every style begins with the button OK
+    return mPresenter ? mPresenter(box) : 0;
+}
+
+void MessageBox::sayMessage(const std::wstring& text)
+{
+    mCommandLine.say(L"Message: " + text);
 }
 
 int MessageBox::show(const wchar_t* text, unsigned style, void* parent)
 {
     const std::wstring message = text ? text : L"";
     const Box box{message, takeDetailFor(message), style, parent};
-    if (!mCollected || parent)
-        return present(box, message);
-    mCollected->push_back(box);
-    return IDOK;
+    if (mCollected && !parent)
+        mCollected->push_back(box);
+    else if (const int answer = present(box))
+        return answer;
+    else
+        sayMessage(message);
+    return IDOK; // every style begins with the button OK
 }
 } // namespace tessel
 

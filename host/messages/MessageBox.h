@@ -41,15 +41,16 @@ public:
     // The boxes that were kept; from now on they are shown again.
     std::vector<Box> takeCollected();
 
-    // A box of the host's own; where the presenter cannot show it, the lines.
-    void show(const Box& box, const std::wstring& lines);
+    // A box of the host's own; where the presenter cannot show it, or if they are wanted anyway, the lines.
+    void show(const Box& box, const std::wstring& lines, bool linesToo);
 
     // As text, without the detail, which has been said on the command line by then: "Message: ..." on lines
     // of its own, and the first button counts as chosen.
     int show(const wchar_t* text, unsigned style, void* parent) override;
 
 private:
-    int present(const Box& box, const std::wstring& lines);
+    int present(const Box& box) const;
+    void sayMessage(const std::wstring& text);
     std::wstring takeDetailFor(const std::wstring& text);
 
     CommandLine& mCommandLine;

@@ -132,7 +132,7 @@ TEST(MessageBox, OfTheHostIsWrittenOutInLinesWhereItCannotBeShown)
 {
     CapturedOutput output;
     tessel::MessageBox box(output.commandLine());
-    box.show({.text = L"2 things.", .detail = L"One, two."}, L"2 things:\n  one\n  two");
+    box.show({.text = L"2 things.", .detail = L"One, two."}, L"2 things:\n  one\n  two", false);
     EXPECT_EQ(output.text(), "Message: 2 things:\n  one\n  two\n");
     std::wstring seen;
     box.setPresenter(
@@ -141,9 +141,12 @@ TEST(MessageBox, OfTheHostIsWrittenOutInLinesWhereItCannotBeShown)
             seen = shown.text + shown.detail;
             return IDOK;
         });
-    box.show({.text = L"2 things.", .detail = L"One, two."}, L"lines");
+    box.show({.text = L"2 things.", .detail = L"One, two."}, L"lines", false);
     EXPECT_EQ(seen, L"2 things.One, two.");
     EXPECT_EQ(output.text(), "Message: 2 things:\n  one\n  two\n");
+    box.show({.text = L"3 things.", .detail = L"One."}, L"all three", true);
+    EXPECT_EQ(seen, L"3 things.One.");
+    EXPECT_EQ(output.text(), "Message: 2 things:\n  one\n  two\nMessage: all three\n");
 }
 
 TEST(MessageBox, IsThereEvenWithoutAHost)

@@ -70,6 +70,7 @@ TEST(StartSummary, ShowsAnOnlyBoxAboutSomethingElseAsItIs)
     EXPECT_EQ(summary->box.detail, L"Really.");
     EXPECT_EQ(summary->box.style, MB_OK);
     EXPECT_EQ(summary->lines, L"The list is full.");
+    EXPECT_TRUE(summary->fits);
 }
 
 TEST(StartSummary, PutsSeveralBoxesAboutOtherThingsIntoOne)
@@ -80,7 +81,7 @@ TEST(StartSummary, PutsSeveralBoxesAboutOtherThingsIntoOne)
     EXPECT_EQ(summary->lines, L"One.\nTwo.");
 }
 
-TEST(StartSummary, ShowsEightFilesInTheBoxAndAllOnTheCommandLine)
+TEST(StartSummary, ShowsFiveFilesInTheBoxAndAllOnTheCommandLine)
 {
     std::vector<LoadOutcome> many;
     for (int number = 1; number <= 11; ++number)
@@ -88,11 +89,36 @@ TEST(StartSummary, ShowsEightFilesInTheBoxAndAllOnTheCommandLine)
     const auto summary = summarize(many, {});
     ASSERT_TRUE(summary);
     EXPECT_EQ(summary->box.text, L"11 applications could not be loaded.");
-    EXPECT_NE(summary->box.detail.find(L"/a/8.zmb: it is gone.\n\nAnd 3 more: "), std::wstring::npos);
-    EXPECT_EQ(summary->box.detail.find(L"/a/9.zmb"), std::wstring::npos);
+    EXPECT_NE(
+        summary->box.detail.find(L"/a/5.zmb: it is gone.\n\nAnd 6 more: the command line lists them all."),
+        std::wstring::npos);
+    EXPECT_EQ(summary->box.detail.find(L"/a/6.zmb"), std::wstring::npos);
     EXPECT_NE(summary->lines.find(L"/a/11.zmb: it is gone."), std::wstring::npos);
-    many.resize(8);
+    EXPECT_FALSE(summary->fits);
+    many.resize(5);
     EXPECT_EQ(summarize(many, {})->box.detail.find(L"more"), std::wstring::npos);
+    EXPECT_TRUE(summarize(many, {})->fits);
+    EXPECT_FALSE(summarize(many, {box(L"One more.")})->fits);
+}
+
+TEST(StartSummary, CutsALongReasonInTheBoxAndNotOnTheCommandLine)
+{
+    const std::wstring fits(240 - 4, L'y'); // with "/a: "
+    EXPECT_EQ(summarize({failed(L"/a", fits.substr(1))}, {})->box.detail, L"/a: " + fits.substr(1) + L".");
+    const auto summary = summarize({failed(L"/a", fits)}, {});
+    EXPECT_EQ(summary->box.detail, L"/a: " + fits.substr(1) + L"…");
+    EXPECT_EQ(summary->lines, L"1 application could not be loaded:\n  /a: " + fits + L".");
+    EXPECT_FALSE(summary->fits);
+}
+
+TEST(StartSummary, ShowsFiveOfManyBoxesAboutOtherThings)
+{
+    const std::vector<MessageBox::Box> boxes(7, box(L"One."));
+    const auto summary = summarize({}, boxes);
+    EXPECT_EQ(summary->box.text,
+              L"One.\n\nOne.\n\nOne.\n\nOne.\n\nOne.\n\nAnd 2 more: the command line lists them all.");
+    EXPECT_EQ(summary->lines, L"One.\nOne.\nOne.\nOne.\nOne.\nOne.\nOne.");
+    EXPECT_FALSE(summary->fits);
 }
 
 TEST(RefusedFiles, AreThoseThatTwoBoxesQuoteAndOfWhichNothingElseIsKnown)
