@@ -52,6 +52,7 @@ void dropKnown(Boxes& boxes, const std::vector<Entry>& entries)
 std::vector<Entry> entriesOf(const std::vector<LoadOutcome>& failed)
 {
     std::vector<Entry> entries;
+    entries.reserve(failed.size());
     for (const LoadOutcome& outcome : failed)
         entries.push_back({outcome.path, outcome.loaded.sentence()});
     return entries;

@@ -4,7 +4,7 @@
 #include <wincompat/winstring.h>
 
 #include <algorithm>
-#include <optional>
+#include <filesystem>
 
 #include "host/platform/DescriptionPlaces.h"
 #include "host/platform/ObjectiveCGuard.h"
@@ -68,7 +68,7 @@ Result<> checkDescription(const std::string& folder)
 {
     for (const std::string& place : descriptionPlaces())
     {
-        const std::string path = folder + "/" + place;
+        const std::string path = std::filesystem::path(folder) / place;
         const RegularFile file(path);
         if (file.opened().code() == RegularFile::kMissing)
             continue;

@@ -109,9 +109,7 @@ TEST_F(Bundles, AreToldWhenTheDescriptionIsNoPropertyList)
     for (const char* text :
          {"Once upon { a time", "(Good", "{ NSExecutable = Good", "{ NSExecutable = \"Good",
           "<?xml version=\"1.0\"?><plist version=\"1.0\"><dict><key>NSExecutable", "<?xml version=\"1.0\"?>",
-          "\xFF\xFE\xFF", "bplist00\1\2",
-          "\x7F"
-          "ELF\2\1\1"})
+          "\xFF\xFE\xFF", "bplist00\1\2", "\177ELF\2\1\1"})
     {
         const std::string said = refusalOf(text);
         EXPECT_THAT(said, StartsWith("its description \"" + description().native() +

@@ -10,11 +10,11 @@
 #include <string>
 #include <string_view>
 
-#include <dlfcn.h>
 #include <fcntl.h>
-#include <link.h>
 #include <sys/mman.h>
 #include <unistd.h>
+
+#include "host/applications/platform/ElfLinkMap.h"
 
 namespace tessel
 {
@@ -22,12 +22,6 @@ namespace
 {
 constexpr std::size_t kPage = 4096;
 constexpr std::size_t kPiece = 1024; // some ten entries, of which each costs the system its time
-
-const link_map* linkMapOf(void* library)
-{
-    link_map* map = nullptr;
-    return dlinfo(library, RTLD_DI_LINKMAP, &map) == 0 ? map : nullptr;
-}
 
 // The first page of a file, in memory.
 class MappedPage

@@ -9,18 +9,14 @@
 #include <dlfcn.h>
 #include <link.h>
 
+#include "host/applications/platform/ElfLinkMap.h"
+
 namespace tessel
 {
 namespace
 {
 // What every compiled Objective-C file calls to make its classes and categories known.
 constexpr std::string_view kRegistration = "__objc_exec_class";
-
-const link_map* linkMapOf(void* library)
-{
-    link_map* map = nullptr;
-    return dlinfo(library, RTLD_DI_LINKMAP, &map) == 0 ? map : nullptr;
-}
 
 // An entry of the mapped library's dynamic section; 0 when it is not there.
 ElfW(Addr) dynamicEntry(const link_map& map, ElfW(Sxword) tag)
