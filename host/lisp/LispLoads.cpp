@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "host/lisp/LispMachine.h"
+
 namespace tessel
 {
 namespace
@@ -35,9 +37,18 @@ void LispLoads::loaded(const std::wstring& path)
     mFiles.erase(std::prev(found.base()), mFiles.end());
 }
 
+// An error that names no file came after one that was caught: what an expression does next is no file's
+// fault.
+bool LispLoads::isOfFile(const std::wstring& words) const
+{
+    return std::ranges::any_of(
+        mFiles, [&](const File& file)
+        { return words.starts_with(file.path) || words.starts_with(L"Cannot load \"" + file.path); });
+}
+
 void LispLoads::end(const Outcome& value)
 {
-    if (!value && !mFiles.empty())
+    if (!value && (value.code() == LispMachine::kLeftByJump || isOfFile(value.sentence())) && !mFiles.empty())
         note(mFiles.front(), Failure{reasonIn(value.sentence(), mFiles.front().path)});
     mFiles.clear();
 }

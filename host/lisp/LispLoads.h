@@ -30,6 +30,7 @@ private:
         LoadOutcomes::Clock::time_point begun;
     };
 
+    bool isOfFile(const std::wstring& words) const;
     void note(const File& file, const Result<>& loaded) const;
 
     LoadOutcomes* mOutcomes;

@@ -141,7 +141,7 @@ struct LispMachine::Parts
         restoreLispStackLimits();
         flushLispOutput();
         if (!ECL_CONSP(pair))
-            return Failure{recover(cl_core.max_heap_size > memoryBefore, interrupted)};
+            return Failure{recover(cl_core.max_heap_size > memoryBefore, interrupted), kLeftByJump};
         if (cl_car(pair) == ecl_make_keyword("DONE"))
             return cl_cdr(pair);
         releaseForgottenLock();

@@ -41,7 +41,9 @@ public:
     LispMachine(const LispMachine&) = delete;
     LispMachine& operator=(const LispMachine&) = delete;
 
-    // What each of these says of a failure is one line of error text.
+    // What each of these says of a failure is one line of error text, with this code where Lisp gave up all
+    // that it was doing, and knew no longer where it was.
+    static constexpr int kLeftByJump = 2;
 
     // Every form, one after the other; the printed value of the last, empty where there is none to print.
     Result<std::wstring> evaluate(std::wstring_view forms);

@@ -75,6 +75,13 @@ TEST_F(LoadTimes, StandAloneOnceWhatHadFailedIsLoaded)
     EXPECT_THAT(output, ContainsRegex("Command: APPS\n  later.lsp  .* Lisp, loaded in [0-9.]+ ms\n$"));
 }
 
+TEST_F(LoadTimes, LeaveOutAFileThatNeedNotBeThereWhateverComesAfterIt)
+{
+    const auto output =
+        session.run({"(progn (load \"/nowhere/a.lsp\" :if-does-not-exist nil) (car 5))", "APPS"}).output;
+    EXPECT_THAT(output, EndsWith("Command: APPS\nNo application is loaded.\n"));
+}
+
 TEST_F(LoadTimes, LeaveOutAFileWhoseErrorAnotherFileHasCaught)
 {
     const auto inner = session.folder().write("inner.lsp", "(car 5)\n").string();
