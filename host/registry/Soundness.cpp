@@ -30,7 +30,7 @@ std::wstring pathOf(sqlite3* database, std::int64_t key)
     std::wstring path;
     for (int depth = 0; depth < kDeepestKey && find.bind(key).step() == SQLITE_ROW; ++depth)
     {
-        path = find.text(1) + (path.empty() ? L"" : L"\\") + path;
+        path.insert(0, path.empty() ? find.text(1) : find.text(1).append(1, L'\\'));
         key = find.number(0);
         find.reset();
     }

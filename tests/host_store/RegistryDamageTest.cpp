@@ -126,7 +126,8 @@ TEST_F(DamagedRegistry, WithAFlippedBitInItsHeadIsReadRightOrTold)
 {
     makeFile();
     const std::string whole = contentOf(file());
-    for (std::size_t bit = 0; bit < 100 * 8; ++bit)
+    constexpr std::size_t kHeadBits = 800;
+    for (std::size_t bit = 0; bit < kHeadBits; ++bit)
     {
         std::string flipped = whole;
         flipped[bit / 8] = static_cast<char>(flipped[bit / 8] ^ (1 << bit % 8));

@@ -164,15 +164,16 @@ TEST_F(TakenOver, NotFromAnOlderTesselWhereItIsDamaged)
 
 TEST_F(TakenOver, NotWithWhatAStrangerPutThere)
 {
+    constexpr const char* kReservedName =
+        "PRAGMA writable_schema=1; INSERT INTO sqlite_master VALUES('trigger','sqlite_t','value',0,"
+        "'CREATE TRIGGER sqlite_t AFTER INSERT ON value BEGIN DELETE FROM key; END')";
     for (const char* hostile :
          {"CREATE TRIGGER t AFTER INSERT ON value BEGIN DELETE FROM key; END",
           "CREATE TRIGGER t AFTER UPDATE ON value BEGIN DELETE FROM key; END",
           "CREATE TEMP TABLE x(y); CREATE VIEW v AS SELECT * FROM key",
           "ALTER TABLE value RENAME TO v; CREATE VIEW value AS SELECT * FROM v",
           "CREATE INDEX i ON value(length(data))", "CREATE TABLE other(x)",
-          "DROP INDEX value_order; CREATE INDEX value_order ON value(key)",
-          "PRAGMA writable_schema=1; INSERT INTO sqlite_master VALUES('trigger','sqlite_t','value',0,"
-          "'CREATE TRIGGER sqlite_t AFTER INSERT ON value BEGIN DELETE FROM key; END')"})
+          "DROP INDEX value_order; CREATE INDEX value_order ON value(key)", kReservedName})
     {
         fs::remove(file());
         {
