@@ -63,9 +63,9 @@ Kind kLink{"link", EPERM};
 Kind kFchmod{"fchmod", EPERM};
 Kind kMkostemp{"mkostemp", ENOSPC};
 
-const std::array kKinds = {&kOpen,      &kRead,   &kPread,  &kWrite, &kPwrite, &kFsync,   &kFdatasync,
-                           &kFtruncate, &kFcntl,  &kUnlink, &kMmap,  &kMunmap, &kClose,   &kStat,
-                           &kFstat,     &kAccess, &kRename, &kLink,  &kFchmod, &kMkostemp};
+const std::array kKinds = {&kOpen,      &kCreate,    &kRead,   &kPread,  &kWrite, &kPwrite, &kFsync,
+                           &kFdatasync, &kFtruncate, &kFcntl,  &kUnlink, &kMmap,  &kMunmap, &kClose,
+                           &kStat,      &kFstat,     &kAccess, &kRename, &kLink,  &kFchmod, &kMkostemp};
 
 // The maps of the files, by their addresses.
 std::array<std::atomic<void*>, 64> theMaps = {};
