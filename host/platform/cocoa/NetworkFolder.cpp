@@ -1,7 +1,6 @@
 #include "host/platform/NetworkFolder.h"
 
 #include <sys/mount.h>
-#include <sys/param.h>
 
 namespace tessel
 {
