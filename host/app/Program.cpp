@@ -7,6 +7,7 @@
 #include <istream>
 #include <string_view>
 
+#include <fcntl.h>
 #include <langinfo.h>
 #include <unistd.h>
 
@@ -47,6 +48,15 @@ void surviveFailingWrites()
 {
     std::signal(SIGPIPE, SIG_IGN);
     std::signal(SIGXFSZ, SIG_IGN);
+}
+
+// Where nobody has opened one of these the next file would take its place, and what is printed land in that.
+// Writing to what is opened for reading fails, so that the loss is noticed.
+void takeStandardDescriptors()
+{
+    for (const int descriptor : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO})
+        if (fcntl(descriptor, F_GETFD) < 0)
+            static_cast<void>(open("/dev/null", O_RDONLY)); // the lowest number that is free
 }
 
 void greet(CommandLine& commandLine)
@@ -110,6 +120,7 @@ int runProgram(int count, const char* const* arguments)
 {
     useUtf8();
     surviveFailingWrites();
+    takeStandardDescriptors();
     const auto parsed = parseOptions(count, arguments);
     StandardOutput output;
     int status = parsed.exitStatus;

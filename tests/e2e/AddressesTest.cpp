@@ -12,6 +12,7 @@
 
 #include "tests/e2e/HostTerminal.h"
 #include "tests/host_store/ChildProcess.h"
+#include "tests/support/Content.h"
 #include "tests/support/HttpServer.h"
 
 namespace fs = std::filesystem;
@@ -30,12 +31,6 @@ namespace
 constexpr char kToolSha256[] = "3003552d396e1fdf7ceaf7cdafe6fc3229176aca0fc9fc6a983c7b222f2a1f22";
 constexpr char kOtherSha256[] = "f41f3fa625ff120ddca7ef456bf66371ecea23c129f4e4c32367101edb516cf8";
 constexpr char kTool[] = "(write-line \"it runs\")\n";
-
-std::string contentOf(const fs::path& file)
-{
-    std::ifstream stream(file, std::ios::binary);
-    return {std::istreambuf_iterator<char>(stream), {}};
-}
 
 class Addresses : public testing::Test
 {

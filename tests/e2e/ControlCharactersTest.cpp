@@ -2,11 +2,10 @@
 #include <gmock/gmock.h>
 
 #include <algorithm>
-#include <fstream>
-#include <iterator>
 
 #include "tests/e2e/Applications.h"
 #include "tests/e2e/HostTerminal.h"
+#include "tests/support/Content.h"
 
 namespace fs = std::filesystem;
 
@@ -64,8 +63,7 @@ TEST_F(ControlCharacters, OfALoadedFilesNameAreShown)
 // The linker repeats the name of the library that is missing, which is any bytes.
 TEST_F(ControlCharacters, OfTheLinkersWordsAreShown)
 {
-    std::ifstream stream(fixtureModule("MissingDependency.zmb"), std::ios::binary);
-    std::string library{std::istreambuf_iterator<char>(stream), {}};
+    std::string library = contentOf(fixtureModule("MissingDependency.zmb"));
     const std::string name = "libfixture_absent.so";
     const std::size_t place = library.find(name);
     ASSERT_NE(place, library.npos);

@@ -1,11 +1,10 @@
 // Files that a person names, and that may be anything; and output that cannot be written.
 #include <gmock/gmock.h>
 
-#include <fstream>
-
 #include <sys/stat.h>
 
 #include "tests/e2e/HostTerminal.h"
+#include "tests/support/Content.h"
 
 namespace fs = std::filesystem;
 
@@ -87,6 +86,19 @@ TEST(Output, ThatCannotBeWrittenGivesAStatusThatTellsSo)
         EXPECT_EQ(result.output,
                   "Tessel: some of the output could not be written: No space left on device.\n");
     }
+}
+
+TEST(Output, ThatIsClosedGivesAStatusThatTellsSoAndLandsInNoFile)
+{
+    HostSession session;
+    const std::vector<std::string> call = {"-c", R"(REGISTRY SET Software\Trial name kept)"};
+    EXPECT_EQ(runInto(session, ">&-", call).exitStatus, 1);
+    EXPECT_EQ(runInto(session, "<&- >&- 2>&-", call).exitStatus, 1);
+    EXPECT_EQ(runInto(session, "<&-", call).exitStatus, 0);
+    for (const auto& entry : fs::recursive_directory_iterator(session.profile()))
+        EXPECT_FALSE(entry.is_regular_file() &&
+                     contentOf(entry.path()).find("reference host") != std::string::npos)
+            << entry.path();
 }
 
 TEST(Output, ThatCannotBeWrittenLeavesAWorseStatusAlone)

@@ -2,12 +2,12 @@
 #include <gmock/gmock.h>
 
 #include <csignal>
-#include <fstream>
 #include <iterator>
 
 #include <sys/stat.h>
 
 #include "tests/e2e/HostTerminal.h"
+#include "tests/support/Content.h"
 
 namespace fs = std::filesystem;
 
@@ -23,11 +23,7 @@ class TypedHistory : public testing::Test
 protected:
     fs::path file() const { return session.profile() / "history"; }
 
-    std::string content() const
-    {
-        std::ifstream stream(file(), std::ios::binary);
-        return {std::istreambuf_iterator<char>(stream), {}};
-    }
+    std::string content() const { return contentOf(file()); }
 
     void put(const std::string& content) const { session.folder().write("profile/history", content); }
 
