@@ -20,6 +20,13 @@ constexpr std::uint64_t kMostBytes = 1U << 20U;
 constexpr std::ptrdiff_t kMostLists = 10000;    // one in the other, they take half of a small stack
 constexpr std::string_view kBeginnings = "({<"; // of a list, a table, an element
 
+// The toolkit's own older format, for machines alone: some bytes of it may ask for all memory there is, or
+// for more time than anybody has.
+bool isForMachines(const std::string& content)
+{
+    return content.front() == 0 || content.front() == 1;
+}
+
 Result<std::string> contentOf(const RegularFile& file)
 {
     if (!file.opened())
@@ -29,6 +36,8 @@ Result<std::string> contentOf(const RegularFile& file)
     std::string content(file.size(), '\0');
     if (!file.read(0, content.data(), content.size()))
         return Failure{L"it cannot be read to its end"};
+    if (isForMachines(content))
+        return Failure{L"it is no property list that a person or a tool for bundles writes"};
     const auto beginsList = [](char character)
     { return kBeginnings.find(character) != std::string_view::npos; };
     if (std::ranges::count_if(content, beginsList) > kMostLists)

@@ -70,6 +70,19 @@ protected:
 };
 } // namespace
 
+TEST_F(BrokenBundles, DescribedForMachinesAloneTakeNeitherMemoryNorTime)
+{
+    const std::string path = session.folder() / "machine.bundle";
+    fs::copy(fixtureModule("Good.bundle"), path, fs::copy_options::recursive);
+    session.folder().write(fs::path(path) / "Resources" / "Info-gnustep.plist",
+                           std::string("\0\6\1\3\0\0\0\0\0", 9));
+    const HostResult result = session.run({"LOAD \"" + path + "\""});
+    EXPECT_FALSE(result.timedOut);
+    EXPECT_THAT(result.output, HasSubstr("is not loaded: its description \""));
+    EXPECT_THAT(result.output,
+                EndsWith("it is no property list that a person or a tool for bundles writes.\n"));
+}
+
 TEST_F(BrokenBundles, AreToldWhenTheyAreLoadedByHand)
 {
     session.alwaysWith({"--safe"});

@@ -119,6 +119,14 @@ TEST_F(Bundles, AreToldWhenTheDescriptionIsNoPropertyList)
     }
 }
 
+// The toolkit takes gigabytes for these bytes, or does not come back.
+TEST_F(Bundles, AreToldWhenTheDescriptionIsForMachinesAlone)
+{
+    for (const char first : {'\0', '\1'})
+        EXPECT_EQ(refusalOf(first + std::string("\6\1\3\0\0\0\0\0", 8)),
+                  unusable("it is no property list that a person or a tool for bundles writes"));
+}
+
 TEST_F(Bundles, AreToldWhenTheDescriptionIsNoTable)
 {
     for (const char* text :
