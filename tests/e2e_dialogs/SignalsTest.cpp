@@ -3,6 +3,7 @@
 
 #include "tests/e2e/HostTerminal.h"
 #include "tests/e2e_dialogs/DialogTest.h"
+#include "tests/support/Content.h"
 
 namespace
 {
@@ -110,6 +111,25 @@ TEST_F(DialogSignals, StopLispAndClearTheLineAfterADialogToo)
     EXPECT_TRUE(terminal.shows("\n42")) << terminal.screen();
     kill(terminal.process(), SIGTERM);
     EXPECT_EQ(terminal.waitForEnd(), 128 + SIGTERM);
+}
+
+TEST_F(DialogSignals, KeepWhatWasTypedWithTheDialogOpen)
+{
+    for (const int signal : {SIGTERM, SIGHUP})
+    {
+        HostTerminal terminal(mSession);
+        ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+        terminal.type("REGISTRY SET Software\\Mine name " + std::to_string(signal) + "\r");
+        ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+        terminal.type("MODRIG\r");
+        ASSERT_FALSE(mScreen.waitForWindow(kDialog).empty()) << terminal.screen();
+        kill(terminal.process(), signal);
+        EXPECT_EQ(terminal.waitForEnd(), 128 + signal) << terminal.screen();
+        const std::string kept = contentOf(mSession.profile() / "history");
+        EXPECT_TRUE(kept.ends_with("name\\040" + std::to_string(signal) + "\nMODRIG\n")) << kept;
+        EXPECT_THAT(mSession.run({"REGISTRY GET Software\\Mine name"}).output,
+                    testing::EndsWith("\n" + std::to_string(signal) + "\n"));
+    }
 }
 
 // At a terminal a message box is a window, and may be the first one.
