@@ -175,7 +175,7 @@ TEST_F(LispCompiler, ShowsControlCharactersAsEscapes)
     const auto run = tesselc({"/nowhere/\x1b]0;taken\x07.lsp"});
     EXPECT_EQ(run.status, 1);
     EXPECT_THAT(run.errors, HasSubstr("/nowhere/\\x1B]0;taken\\x07.lsp"));
-    EXPECT_THAT(tesselc({"--\x1b]0;taken\x07"}).errors, HasSubstr("\\x1B]0;taken\\x07"));
+    EXPECT_THAT(tesselc({"a.lsp", "--\x1b]0;taken\x07"}).errors, HasSubstr("\\x1B]0;taken\\x07"));
     EXPECT_THAT(
         tesselc({write("app.lsp",
                        "(eval-when (:compile-toplevel :load-toplevel :execute) (princ (code-char 27)))")})
