@@ -21,6 +21,7 @@
 #include "host/lisp/LispInterpreter.h"
 #include "host/messages/Help.h"
 #include "host/messages/MessageBox.h"
+#include "host/platform/RunningMarker.h"
 #include "host/registry/Profiles.h"
 #include "host/registry/Registry.h"
 #include "host/registry/SystemVariables.h"
@@ -32,6 +33,9 @@
 
 namespace tessel
 {
+// In the profile: what is at work, and what is kept out.
+inline constexpr char kApplicationsFolder[] = "applications";
+
 // What the parts are made from.
 struct Foundations
 {
@@ -54,7 +58,8 @@ struct Parts
     Owned<Registry> registry{foundations.profileFolder / "registry.db"};
     Profiles profiles{*registry, kProductRegistryRoot};
     Owned<SystemVariables> variables{&*registry, kProductRegistryRoot};
-    Owned<CallingApplication> callingApplication;
+    Owned<RunningMarker> marker{foundations.profileFolder / kApplicationsFolder};
+    Owned<CallingApplication> callingApplication{*marker};
     Owned<CommandStack> commands{*commandLine, *callingApplication};
     Owned<ResourceModules> resources{toWide(layout.resources.string()), *callingApplication};
     Owned<MessageBox> messageBox{*commandLine};
@@ -69,7 +74,8 @@ struct Parts
     // Publishes itself. The variable is read here, before any application is loaded, and holds for the
     // session.
     Result<std::unique_ptr<LispInterpreter>> startedLisp = LispInterpreter::start(
-        {.removingTsLisp = variables->number(kRemovingTsLisp) != 0}, *commandLine, *document, *endRequest);
+        {.removingTsLisp = variables->number(kRemovingTsLisp) != 0, .marker = &*marker}, *commandLine,
+        *document, *endRequest);
 
     // Only of parts whose Lisp has started.
     LispInterpreter& lisp() const { return **startedLisp; }

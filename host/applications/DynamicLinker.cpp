@@ -118,7 +118,11 @@ Result<> DynamicLinker::load(const std::wstring& path, bool resolveNow)
         return file.failure();
     if (auto loadable = checkLoadable(program); !loadable)
         return loadable;
-    auto opened = open(*file, resolveNow);
+    auto opened = Result<std::unique_ptr<Module>>(nullptr);
+    {
+        const RunningMarker::Scope loading(mCalls.marker(), RunningMarker::Deed::kLoading, file->path);
+        opened = open(*file, resolveNow);
+    }
     if (!opened)
         return opened.failure();
     std::unique_ptr<Module> module = *std::move(opened);
@@ -150,7 +154,9 @@ Result<> DynamicLinker::start(Module& module)
 
 Result<> DynamicLinker::send(Module& module, unsigned message) const
 {
-    const CallingApplication::Scope calling(mCalls, module.path);
+    const CallingApplication::Scope calling(mCalls, module.path,
+                                            message == TSRX_MSG_UNLOAD ? RunningMarker::Deed::kUnloading
+                                                                       : RunningMarker::Deed::kEntryPoint);
     constexpr wchar_t kThrew[] = L"its entry point threw an exception: ";
     int answer = TSRX_RET_OK;
     try
@@ -213,6 +219,7 @@ Result<> DynamicLinker::checkFreeToGo(const Module* module) const
 bool DynamicLinker::takeOut(Module& module)
 {
     mCommands.removeCommandsOf(module.path);
+    const RunningMarker::Scope closing(mCalls.marker(), RunningMarker::Deed::kUnloading, toUtf8(module.path));
     const bool closed = module.library->close();
     mModules.remove(module);
     return closed;

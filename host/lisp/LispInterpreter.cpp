@@ -13,25 +13,46 @@ namespace tessel
 {
 namespace
 {
+void mark(LispSurroundings& surroundings, RunningMarker& marker)
+{
+    surroundings.fileBegins = [&marker](const std::wstring&, const std::filesystem::path& file)
+    {
+        marker.begin(RunningMarker::Deed::kLispFile, file.native());
+        return Result<>();
+    };
+    surroundings.filesOpen = [&marker]
+    {
+        return marker.depth();
+    };
+    surroundings.filesEnd = [&marker](std::size_t depth)
+    {
+        marker.endTo(depth);
+    };
+}
+
 LispSurroundings surroundings(const LispInterpreter::Options& options, CommandLine& commandLine,
                               Document& document)
 {
-    return {.removingTsLisp = options.removingTsLisp,
-            .heapBytes = options.heapBytes != 0 ? options.heapBytes : kLispHeapBytes,
-            .write = [&commandLine](std::wstring_view text) { commandLine.print(text); },
-            .column = [&commandLine] { return commandLine.openLine().size(); },
-            .fileLoaded =
-                [&document](const std::wstring& path)
-            {
-                document.add(path);
-            }};
+    LispSurroundings surroundings = {.removingTsLisp = options.removingTsLisp,
+                                     .heapBytes = options.heapBytes != 0 ? options.heapBytes : kLispHeapBytes,
+                                     .write = [&commandLine](std::wstring_view text)
+                                     { commandLine.print(text); },
+                                     .column = [&commandLine] { return commandLine.openLine().size(); },
+                                     .fileLoaded =
+                                         [&document](const std::wstring& path)
+                                     {
+                                         document.add(path);
+                                     }};
+    if (options.marker)
+        mark(surroundings, *options.marker);
+    return surroundings;
 }
 } // namespace
 
-LispInterpreter::LispInterpreter(std::unique_ptr<LispMachine> machine, bool removingTsLisp,
+LispInterpreter::LispInterpreter(std::unique_ptr<LispMachine> machine, const Options& options,
                                  CommandLine& commandLine, const EndRequest& endRequest)
-    : mMachine(std::move(machine)), mRemovingTsLisp(removingTsLisp), mCommandLine(commandLine),
-      mEndRequest(endRequest)
+    : mMachine(std::move(machine)), mRemovingTsLisp(options.removingTsLisp), mCommandLine(commandLine),
+      mEndRequest(endRequest), mMarker(options.marker ? *options.marker : mNoMarker)
 {
 }
 
@@ -43,19 +64,22 @@ Result<std::unique_ptr<LispInterpreter>> LispInterpreter::start(const Options& o
     if (!machine)
         return machine.failure();
     return std::unique_ptr<LispInterpreter>(
-        new LispInterpreter(*std::move(machine), options.removingTsLisp, commandLine, endRequest));
+        new LispInterpreter(*std::move(machine), options, commandLine, endRequest));
 }
 
 LispInterpreter::~LispInterpreter() = default;
 
 Result<std::wstring> LispInterpreter::evaluate(std::wstring_view expressions)
 {
-    return mMachine->evaluate(expressions);
+    const std::size_t depth = mMarker.depth();
+    auto value = mMachine->evaluate(expressions);
+    mMarker.endTo(depth); // Lisp may have been left by a jump
+    return value;
 }
 
 void LispInterpreter::queue(std::wstring expression)
 {
-    mQueue.push_back(std::move(expression));
+    mQueue.push_back({std::move(expression), mMarker.reason()});
 }
 
 bool LispInterpreter::runQueue()
@@ -66,9 +90,10 @@ bool LispInterpreter::runQueue()
     bool allRan = true;
     while (!mQueue.empty() && !mEndRequest.isMade())
     {
-        const std::wstring expression = std::move(mQueue.front());
+        const Queued next = std::move(mQueue.front());
         mQueue.pop_front();
-        allRan = mCommandLine.tell(evaluate(expression)) && allRan;
+        const RunningMarker::ReasonScope reason(mMarker, next.reason);
+        allRan = mCommandLine.tell(evaluate(next.expression)) && allRan;
     }
     mRunningQueue = false;
     return allRan;

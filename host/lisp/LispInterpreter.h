@@ -7,6 +7,7 @@
 #include <string>
 #include <string_view>
 
+#include "host/platform/RunningMarker.h"
 #include "host/text/Result.h"
 #include "host/text/Running.h"
 
@@ -24,8 +25,9 @@ class LispInterpreter
 public:
     struct Options
     {
-        bool removingTsLisp = true; // compiled and packaged Lisp can be loaded
-        std::size_t heapBytes = 0;  // memory for Lisp's objects; 0: as much as is usual
+        bool removingTsLisp = true;      // compiled and packaged Lisp can be loaded
+        std::size_t heapBytes = 0;       // memory for Lisp's objects; 0: as much as is usual
+        RunningMarker* marker = nullptr; // where files that are being loaded are marked, if anywhere
     };
 
     // Starts Lisp, on the thread on which everything but `interrupt` is to be called. A later interpreter in
@@ -67,14 +69,22 @@ public:
     bool running() const noexcept;
 
 private:
-    LispInterpreter(std::unique_ptr<LispMachine> machine, bool removingTsLisp, CommandLine& commandLine,
+    LispInterpreter(std::unique_ptr<LispMachine> machine, const Options& options, CommandLine& commandLine,
                     const EndRequest& endRequest);
+
+    struct Queued
+    {
+        std::wstring expression;
+        RunningMarker::Reason reason; // for what it loads
+    };
 
     std::unique_ptr<LispMachine> mMachine;
     bool mRemovingTsLisp;
     CommandLine& mCommandLine;
     const EndRequest& mEndRequest;
-    std::deque<std::wstring> mQueue;
+    RunningMarker mNoMarker;
+    RunningMarker& mMarker;
+    std::deque<Queued> mQueue;
     bool mRunningQueue = false;
     Published<LispInterpreter> mPublished{*this};
 };

@@ -127,7 +127,8 @@ cl_object readFile(cl_object path)
         [=]
         {
             const auto* surroundings = connection().surroundings;
-            connection().file = readLispFile(fromLisp(path), surroundings && surroundings->removingTsLisp);
+            connection().file = readLispFile(fromLisp(path), surroundings && surroundings->removingTsLisp,
+                                             surroundings ? surroundings->fileBegins : LispFileBegins());
         });
     const Result<LispFile>& file = connection().file;
     cl_object text = toLisp(file ? file->text : file.sentence());
@@ -135,6 +136,30 @@ cl_object readFile(cl_object path)
     cl_object kind = kindOf(file);
     callHost([] { connection().file = LispFile(); });
     return answer(cl_list(3, kind, name, text));
+}
+
+cl_object filesOpen()
+{
+    std::size_t count = 0;
+    callHost(
+        [&count]
+        {
+            const auto* surroundings = connection().surroundings;
+            count = surroundings && surroundings->filesOpen ? surroundings->filesOpen() : 0;
+        });
+    return answer(ecl_make_fixnum(static_cast<cl_fixnum>(count)));
+}
+
+cl_object endFiles(cl_object count)
+{
+    callHost(
+        [=]
+        {
+            const auto* surroundings = connection().surroundings;
+            if (surroundings && surroundings->filesEnd)
+                surroundings->filesEnd(static_cast<std::size_t>(ecl_fixnum(count)));
+        });
+    return answer(ECL_NIL);
 }
 
 cl_object recordLoaded(cl_object path)
@@ -184,6 +209,8 @@ void defineLispPrimitives()
     define("%FLUSH", flush);
     define("%COLUMN", column);
     define("%READ-FILE", readFile);
+    define("%FILES-OPEN", filesOpen);
+    define("%END-FILES", endFiles);
     define("%RECORD-LOADED", recordLoaded);
     define("%RESTORE-STACK-LIMITS", restoreStackLimits);
     define("%INTERRUPT-WANTED", interruptWanted);
