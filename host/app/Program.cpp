@@ -18,6 +18,7 @@
 #include "host/console/InterruptKey.h"
 #include "host/console/LineEditor.h"
 #include "host/console/PipedInput.h"
+#include "host/platform/LastWords.h"
 #include "host/text/Unicode.h"
 #include "host/text/Version.h"
 
@@ -90,6 +91,7 @@ int runHost(Options options)
 {
     if (options.profileFolder.empty())
         options.profileFolder = personalFolder();
+    const LastWords lastWords; // before Lisp takes a signal of them
     Host host({options.profileFolder, options.safe, writeToStandardOutput});
     const InterruptKey interruptKey(host); // applications that load at start may run away too
     const EndSignals endSignals(host);

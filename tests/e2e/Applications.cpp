@@ -27,6 +27,16 @@ std::string fixtureModule(const std::string& name)
     return std::string(FIXTURE_MODULES) + "/" + name;
 }
 
+std::string deadly(const HostSession& session, const std::string& way)
+{
+    const auto path = session.folder() / (way + ".zmb");
+    std::filesystem::copy_file(fixtureModule("Deadly.zmb"), path);
+    const auto good = session.folder() / "Good.zmb";
+    if (!std::filesystem::exists(good))
+        std::filesystem::copy_file(fixtureModule("Good.zmb"), good);
+    return path;
+}
+
 std::string lispFixture(const std::string& name)
 {
     return std::string(LISP_FIXTURES) + "/" + name;

@@ -22,6 +22,8 @@ inline constexpr char kPrimes[] = "Primes: type PRIMES to see them on a spiral.\
 
 std::string sample(const std::string& name);
 std::string fixtureModule(const std::string& name);
+// An application in the session's folder that ends the host in that way (see fixtures/modules/Deadly.cpp).
+std::string deadly(const HostSession& session, const std::string& way);
 std::string lispFixture(const std::string& name);
 std::string modrigBundle();
 
