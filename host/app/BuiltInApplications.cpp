@@ -96,6 +96,9 @@ Result<> listApplications(Parts& parts, const CommandStack::Arguments&)
         sayApplication(parts, parts.document->loadedApplicationName(index), L"Lisp");
     if (modules.empty() && lispFiles == 0)
         sayLine(parts, L"No application is loaded.");
+    for (const auto& application : parts.keptOut.all())
+        if (application.isOut())
+            sayApplication(parts, toWide(application.path), reasonOf(application));
     return {};
 }
 } // namespace

@@ -36,10 +36,21 @@ bool Host::start()
     const AutoreleasePool pool;
     if (!mCommandLine.tell(makeParts()))
         return false;
+    judgeEarlierSessions();
+    const RunningMarker::ReasonScope atStart(*mParts->marker, RunningMarker::Reason::kAtStart);
     if (!mOptions.safe)
         mParts->demandLoading.loadAtStart();
     finishLine();
     return true;
+}
+
+void Host::judgeEarlierSessions()
+{
+    const bool givesTrials = !mOptions.safe;
+    for (const auto& sentence : mParts->keptOut.begin(mParts->marker->leftovers(), givesTrials))
+        mCommandLine.say(sentence);
+    if (mParts->keptOut.isStored())
+        mParts->marker->forgetLeftovers();
 }
 
 Result<> Host::makeParts()
@@ -51,7 +62,7 @@ Result<> Host::makeParts()
     // The applications that are loaded next may bring Objective-C along.
     static_cast<void>(keepToolkitFilesIn(mOptions.profileFolder / kToolkitFolder));
     mParts = std::make_unique<Parts>(
-        Foundations{mCommandLine, mEndRequest, mOptions.profileFolder, mOptions.downloads});
+        Foundations{mCommandLine, mEndRequest, mOptions.profileFolder, mOptions.downloads, mOptions.safe});
     mCommandLine.tell(mParts->registry->canStore());
     if (const Outcome& started = mParts->startedLisp; !started)
         return started.failure();
@@ -130,6 +141,7 @@ void Host::end()
     if (!mCommandLine.atLineStart())
         mCommandLine.print(L"\n");
     mParts->linker->unloadAll();
+    mParts->keptOut.noteGoodEnd();
     mCommandLine.tell(mParts->registry->endOfCommand());
     mInterruptible = nullptr;
     mParts.reset();

@@ -76,6 +76,7 @@ public:
 private:
     Result<> makeParts();
     Result<> prepareProfileFolder();
+    void judgeEarlierSessions();
     void addCommands();
     bool finishLine();
 

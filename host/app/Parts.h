@@ -9,10 +9,12 @@
 
 #include "host/app/HostInformation.h"
 #include "host/app/Layout.h"
+#include "host/applications/Admission.h"
 #include "host/applications/ApplicationRecords.h"
 #include "host/applications/DemandLoading.h"
 #include "host/applications/Document.h"
 #include "host/applications/DynamicLinker.h"
+#include "host/applications/KeptOut.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
 #include "host/commands/EndRequest.h"
@@ -43,6 +45,7 @@ struct Foundations
     EndRequest& endRequest;
     const std::filesystem::path& profileFolder; // is there
     const RemoteFiles::Limits& downloads;
+    bool safe; // load nothing by itself
 };
 
 struct Parts
@@ -59,13 +62,15 @@ struct Parts
     Profiles profiles{*registry, kProductRegistryRoot};
     Owned<SystemVariables> variables{&*registry, kProductRegistryRoot};
     Owned<RunningMarker> marker{foundations.profileFolder / kApplicationsFolder};
+    KeptOut keptOut{foundations.profileFolder / kApplicationsFolder};
+    Admission admission{*marker, keptOut, foundations.safe};
     Owned<CallingApplication> callingApplication{*marker};
     Owned<CommandStack> commands{*commandLine, *callingApplication};
     Owned<ResourceModules> resources{toWide(layout.resources.string()), *callingApplication};
     Owned<MessageBox> messageBox{*commandLine};
-    Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands, *messageBox};
+    Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands, *messageBox, admission};
     Owned<ApplicationRecords> records{*registry, *commands, *callingApplication, kProductRegistryRoot};
-    DemandLoading demandLoading{layout.plugIns, *records, *linker};
+    DemandLoading demandLoading{layout.plugIns, *records, *linker, *marker};
     Owned<Document> document;
     Owned<FileSearch> files{layout.resources, *variables};
     Owned<RemoteFiles> remote{foundations.profileFolder / "remote-files", foundations.downloads};
@@ -74,7 +79,7 @@ struct Parts
     // Publishes itself. The variable is read here, before any application is loaded, and holds for the
     // session.
     Result<std::unique_ptr<LispInterpreter>> startedLisp = LispInterpreter::start(
-        {.removingTsLisp = variables->number(kRemovingTsLisp) != 0, .marker = &*marker}, *commandLine,
+        {.removingTsLisp = variables->number(kRemovingTsLisp) != 0, .admission = &admission}, *commandLine,
         *document, *endRequest);
 
     // Only of parts whose Lisp has started.

@@ -48,8 +48,8 @@ bool lists(const ApplicationRecord& record, std::wstring_view typedName)
 } // namespace
 
 DemandLoading::DemandLoading(std::filesystem::path plugInsFolder, const ApplicationRecords& records,
-                             DynamicLinker& linker)
-    : mPlugInsFolder(std::move(plugInsFolder)), mRecords(records), mLinker(linker)
+                             DynamicLinker& linker, RunningMarker& marker)
+    : mPlugInsFolder(std::move(plugInsFolder)), mRecords(records), mLinker(linker), mMarker(marker)
 {
 }
 
@@ -92,6 +92,7 @@ bool DemandLoading::isDue(const ApplicationRecord& record, std::wstring_view com
 
 bool DemandLoading::loadForCommand(std::wstring_view name) const
 {
+    const RunningMarker::ReasonScope onCommand(mMarker, RunningMarker::Reason::kOnCommand);
     const auto records = mRecords.all();
     return std::ranges::any_of(records, [&](const ApplicationRecord& record)
                                { return isDue(record, name) && load(record.module); });

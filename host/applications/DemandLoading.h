@@ -8,6 +8,8 @@
 #include <string_view>
 #include <vector>
 
+#include "host/platform/RunningMarker.h"
+
 namespace tessel
 {
 class ApplicationRecords;
@@ -18,7 +20,7 @@ class DemandLoading
 {
 public:
     DemandLoading(std::filesystem::path plugInsFolder, const ApplicationRecords& records,
-                  DynamicLinker& linker);
+                  DynamicLinker& linker, RunningMarker& marker);
 
     // Loads what is due at the start: by the records, in their order, then from the PlugIns folder, by name.
     // What cannot be loaded is explained on the command line, and the start goes on.
@@ -39,5 +41,6 @@ private:
     std::filesystem::path mPlugInsFolder;
     const ApplicationRecords& mRecords;
     DynamicLinker& mLinker;
+    RunningMarker& mMarker;
 };
 } // namespace tessel

@@ -6,6 +6,7 @@
 #include <ranges>
 #include <utility>
 
+#include "host/applications/Admission.h"
 #include "host/applications/ImageCheck.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
@@ -59,17 +60,6 @@ Result<> checkLoadable(const RegularFile& program)
                          { return program.read(offset, buffer, size); });
 }
 
-Result<std::unique_ptr<Module>> open(const ModuleFile& file, bool resolveNow)
-{
-    auto library = ModuleLibrary::open(file, resolveNow);
-    if (!library)
-        return library.failure();
-    auto module = std::make_unique<Module>();
-    module->library = *std::move(library);
-    module->entryPoint = module->library->entryPoint();
-    return module;
-}
-
 // The program at a path, or a file that is not open.
 RegularFile programOf(const Result<ModuleFile>& file)
 {
@@ -78,8 +68,9 @@ RegularFile programOf(const Result<ModuleFile>& file)
 } // namespace
 
 DynamicLinker::DynamicLinker(CommandLine& commandLine, CallingApplication& calls, CommandStack& commands,
-                             MessageBox& messageBox)
-    : mCommandLine(commandLine), mCalls(calls), mCommands(commands), mMessageBox(messageBox)
+                             MessageBox& messageBox, const Admission& admission)
+    : mCommandLine(commandLine), mCalls(calls), mCommands(commands), mMessageBox(messageBox),
+      mAdmission(admission)
 {
 }
 
@@ -109,6 +100,16 @@ Result<> DynamicLinker::load(const std::wstring& path, bool resolveNow)
         return Failure{L"the host is ending"};
     if (const Module* known = mModules.withPath(path))
         return answerForKnown(*known);
+    if (auto admitted = mAdmission.check(path); !admitted)
+        return admitted;
+    auto loaded = loadNew(path, resolveNow);
+    if (loaded)
+        mAdmission.noteLoaded(path);
+    return loaded;
+}
+
+Result<> DynamicLinker::loadNew(const std::wstring& path, bool resolveNow)
+{
     const auto file = moduleFileAt(toUtf8(path));
     const RegularFile program = programOf(file);
     const std::wstring realPath = realPathOf(path);
@@ -118,11 +119,7 @@ Result<> DynamicLinker::load(const std::wstring& path, bool resolveNow)
         return file.failure();
     if (auto loadable = checkLoadable(program); !loadable)
         return loadable;
-    auto opened = Result<std::unique_ptr<Module>>(nullptr);
-    {
-        const RunningMarker::Scope loading(mCalls.marker(), RunningMarker::Deed::kLoading, file->path);
-        opened = open(*file, resolveNow);
-    }
+    auto opened = open(*file, resolveNow);
     if (!opened)
         return opened.failure();
     std::unique_ptr<Module> module = *std::move(opened);
@@ -131,6 +128,20 @@ Result<> DynamicLinker::load(const std::wstring& path, bool resolveNow)
     module->name = nameIn(path);
     module->identity = program.identity();
     return start(mModules.add(std::move(module)));
+}
+
+// Constructors may load others; nobody has asked for those by name.
+Result<std::unique_ptr<Module>> DynamicLinker::open(const ModuleFile& file, bool resolveNow) const
+{
+    const RunningMarker::Scope loading(mCalls.marker(), RunningMarker::Deed::kLoading, file.path);
+    const RunningMarker::ReasonScope forIt(mCalls.marker(), RunningMarker::Reason::kForAnother);
+    auto library = ModuleLibrary::open(file, resolveNow);
+    if (!library)
+        return library.failure();
+    auto module = std::make_unique<Module>();
+    module->library = *std::move(library);
+    module->entryPoint = module->library->entryPoint();
+    return module;
 }
 
 Result<> DynamicLinker::answerForKnown(const Module& module) const
@@ -157,6 +168,7 @@ Result<> DynamicLinker::send(Module& module, unsigned message) const
     const CallingApplication::Scope calling(mCalls, module.path,
                                             message == TSRX_MSG_UNLOAD ? RunningMarker::Deed::kUnloading
                                                                        : RunningMarker::Deed::kEntryPoint);
+    const RunningMarker::ReasonScope forIt(mCalls.marker(), RunningMarker::Reason::kForAnother);
     constexpr wchar_t kThrew[] = L"its entry point threw an exception: ";
     int answer = TSRX_RET_OK;
     try

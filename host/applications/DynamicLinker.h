@@ -20,6 +20,7 @@
 
 namespace tessel
 {
+class Admission;
 class CallingApplication;
 class CommandLine;
 class CommandStack;
@@ -37,8 +38,9 @@ public:
 
     // Says on the command line why something failed, tells `calls` whose entry point runs, takes the commands
     // of what goes out of `commands`, and gives the message box its detail.
+    // Loads what `admission` does not refuse.
     DynamicLinker(CommandLine& commandLine, CallingApplication& calls, CommandStack& commands,
-                  MessageBox& messageBox);
+                  MessageBox& messageBox, const Admission& admission);
 
     bool registerApplication(void* application) override;
     bool loadModule(const wchar_t* path, bool sayWhyNot, bool resolveNow) override;
@@ -63,6 +65,8 @@ public:
 private:
     // What these say of a failure is the end of a sentence.
     Result<> load(const std::wstring& path, bool resolveNow);
+    Result<> loadNew(const std::wstring& path, bool resolveNow);
+    Result<std::unique_ptr<Module>> open(const ModuleFile& file, bool resolveNow) const;
     Result<> answerForKnown(const Module& module) const;
     Result<> start(Module& module);
     Result<> unload(Module* module);
@@ -78,6 +82,7 @@ private:
     CallingApplication& mCalls;
     CommandStack& mCommands;
     MessageBox& mMessageBox;
+    const Admission& mAdmission;
     LoadedModules mModules;
     bool mEnding = false;
 };

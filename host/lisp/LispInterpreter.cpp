@@ -4,47 +4,55 @@
 
 #include <tessel/tsdefs.h>
 
+#include "host/applications/Admission.h"
 #include "host/applications/Document.h"
 #include "host/commands/EndRequest.h"
 #include "host/lisp/LispMachine.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Unicode.h"
 
 namespace tessel
 {
 namespace
 {
-void mark(LispSurroundings& surroundings, RunningMarker& marker)
+void admitFilesBy(const Admission& admission, LispSurroundings& surroundings)
 {
-    surroundings.fileBegins = [&marker](const std::wstring&, const std::filesystem::path& file)
+    surroundings.fileBegins = [&admission](const std::wstring& name,
+                                           const std::filesystem::path& file) -> Result<>
     {
-        marker.begin(RunningMarker::Deed::kLispFile, file.native());
-        return Result<>();
+        if (const auto admitted = admission.check(toWide(file.native())); !admitted)
+            return Failure{L"Cannot load \"" + name + L"\": " + admitted.sentence() + L"."};
+        admission.marker().begin(RunningMarker::Deed::kLispFile, file.native());
+        return {};
     };
-    surroundings.filesOpen = [&marker]
+    surroundings.filesOpen = [&admission]
     {
-        return marker.depth();
+        return admission.marker().depth();
     };
-    surroundings.filesEnd = [&marker](std::size_t depth)
+    surroundings.filesEnd = [&admission](std::size_t depth)
     {
-        marker.endTo(depth);
+        admission.marker().endTo(depth);
     };
 }
 
 LispSurroundings surroundings(const LispInterpreter::Options& options, CommandLine& commandLine,
                               Document& document)
 {
+    const auto fileLoaded = [&document, admission = options.admission](const std::wstring& path)
+    {
+        document.add(path);
+        RunningMarker::AtWork file{};
+        if (admission && admission->marker().innermost(file))
+            admission->noteLoaded(toWide(file.path));
+    };
     LispSurroundings surroundings = {.removingTsLisp = options.removingTsLisp,
                                      .heapBytes = options.heapBytes != 0 ? options.heapBytes : kLispHeapBytes,
                                      .write = [&commandLine](std::wstring_view text)
                                      { commandLine.print(text); },
                                      .column = [&commandLine] { return commandLine.openLine().size(); },
-                                     .fileLoaded =
-                                         [&document](const std::wstring& path)
-                                     {
-                                         document.add(path);
-                                     }};
-    if (options.marker)
-        mark(surroundings, *options.marker);
+                                     .fileLoaded = fileLoaded};
+    if (options.admission)
+        admitFilesBy(*options.admission, surroundings);
     return surroundings;
 }
 } // namespace
@@ -52,7 +60,7 @@ LispSurroundings surroundings(const LispInterpreter::Options& options, CommandLi
 LispInterpreter::LispInterpreter(std::unique_ptr<LispMachine> machine, const Options& options,
                                  CommandLine& commandLine, const EndRequest& endRequest)
     : mMachine(std::move(machine)), mRemovingTsLisp(options.removingTsLisp), mCommandLine(commandLine),
-      mEndRequest(endRequest), mMarker(options.marker ? *options.marker : mNoMarker)
+      mEndRequest(endRequest), mMarker(options.admission ? options.admission->marker() : mNoMarker)
 {
 }
 

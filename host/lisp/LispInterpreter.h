@@ -15,6 +15,7 @@ struct TsResultBuffer;
 
 namespace tessel
 {
+class Admission;
 class CommandLine;
 class Document;
 class EndRequest;
@@ -25,9 +26,9 @@ class LispInterpreter
 public:
     struct Options
     {
-        bool removingTsLisp = true;      // compiled and packaged Lisp can be loaded
-        std::size_t heapBytes = 0;       // memory for Lisp's objects; 0: as much as is usual
-        RunningMarker* marker = nullptr; // where files that are being loaded are marked, if anywhere
+        bool removingTsLisp = true;           // compiled and packaged Lisp can be loaded
+        std::size_t heapBytes = 0;            // memory for Lisp's objects; 0: as much as is usual
+        const Admission* admission = nullptr; // of files, if it is to be asked; it marks them, too
     };
 
     // Starts Lisp, on the thread on which everything but `interrupt` is to be called. A later interpreter in

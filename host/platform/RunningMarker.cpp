@@ -2,9 +2,7 @@
 
 #include <algorithm>
 #include <array>
-#include <cerrno>
 #include <csignal>
-#include <cstring>
 #include <ctime>
 #include <memory>
 #include <utility>
@@ -12,6 +10,8 @@
 #include <fcntl.h>
 #include <sys/mman.h>
 #include <unistd.h>
+
+#include "host/platform/SmallFile.h"
 
 namespace tessel
 {
@@ -40,44 +40,6 @@ struct Slot
 
 static_assert(std::atomic<std::uint32_t>::is_always_lock_free, "a signal handler must not wait");
 
-// Locks of this kind belong to the process: a child that an application has left behind does not hold them.
-bool lock(int descriptor, int command)
-{
-    struct flock whole = {};
-    whole.l_type = F_WRLCK;
-    whole.l_whence = SEEK_SET;
-    int status = 0;
-    do
-        status = fcntl(descriptor, command, &whole);
-    while (status != 0 && errno == EINTR);
-    return status == 0;
-}
-
-// Held while a session looks for what others have left and makes its own file: one that has no lock yet would
-// be taken for one of the dead.
-class FolderLock
-{
-public:
-    explicit FolderLock(const std::filesystem::path& folder)
-        : mDescriptor(open((folder / kLockName).c_str(), O_RDWR | O_CREAT | O_CLOEXEC, kOwnersOnly))
-    {
-        mHeld = mDescriptor >= 0 && lock(mDescriptor, F_SETLKW);
-    }
-    ~FolderLock()
-    {
-        if (mDescriptor >= 0)
-            close(mDescriptor);
-    }
-    FolderLock(const FolderLock&) = delete;
-    FolderLock& operator=(const FolderLock&) = delete;
-
-    bool held() const { return mHeld; }
-
-private:
-    int mDescriptor;
-    bool mHeld = false;
-};
-
 bool readWhole(int descriptor, void* buffer, std::size_t size)
 {
     return pread(descriptor, buffer, size, 0) == static_cast<ssize_t>(size);
@@ -100,10 +62,7 @@ struct RunningMarker::Page
     std::array<Slot, kDeepest> slots;
     std::array<char, kTextBytes> texts;
 
-    std::string_view text(std::size_t at, std::size_t length) const
-    {
-        return {texts.data() + at, length};
-    }
+    std::string_view text(std::size_t at, std::size_t length) const { return {texts.data() + at, length}; }
     // The innermost that was written down; null when there is none, or where the file is damaged.
     const Slot* top() const
     {
@@ -118,7 +77,9 @@ RunningMarker::RunningMarker(std::filesystem::path folder)
 {
     std::error_code failed;
     std::filesystem::create_directories(folder, failed);
-    const FolderLock locked(folder);
+    // Held while we look for what others have left and make our own file: one that has no lock yet would be
+    // taken for one of the dead.
+    const FileLock locked(folder / kLockName);
     if (!locked.held())
         return;
     collect(folder);
@@ -148,7 +109,7 @@ void RunningMarker::collect(const std::filesystem::path& folder)
         if (!path.filename().native().starts_with(kFilePrefix))
             continue;
         const int descriptor = open(path.c_str(), O_RDWR | O_CLOEXEC | O_NOFOLLOW | O_NONBLOCK);
-        if (descriptor < 0 || !lock(descriptor, F_SETLK))
+        if (descriptor < 0 || !lockNow(descriptor))
         {
             if (descriptor >= 0)
                 close(descriptor);
@@ -192,7 +153,7 @@ void RunningMarker::make(const std::filesystem::path& folder)
 void RunningMarker::map()
 {
     const int file = mFile.descriptor;
-    if (file < 0 || !lock(file, F_SETLK) || !fillWithZeros(file, sizeof(Page)))
+    if (file < 0 || !lockNow(file) || !fillWithZeros(file, sizeof(Page)))
         return;
     void* mapped = mmap(nullptr, sizeof(Page), PROT_READ | PROT_WRITE, MAP_SHARED, file, 0);
     if (mapped == MAP_FAILED)
@@ -302,7 +263,7 @@ std::string_view wordsForEnding(int ending) noexcept
         int ending;
         std::string_view text;
     };
-    static constexpr Words kWords[] = {{RunningMarker::kVanished, "it ended without a word"},
+    static constexpr Words kWords[] = {{RunningMarker::kVanished, "killed or switched off"},
                                        {RunningMarker::kCalledExit, "it called \"exit\""},
                                        {SIGSEGV, "memory fault (SIGSEGV)"},
                                        {SIGBUS, "memory fault (SIGBUS)"},

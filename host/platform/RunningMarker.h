@@ -1,8 +1,9 @@
 // Which application is at work, in a small file of the profile: it is still there when the process is not.
 //
-// The file is mapped into the process, so that marking costs a copy of the path and no call of the system, and
-// nothing needs to be done at the end: whatever ends the process, the file says what was going on. Each process
-// has a file of its own and holds a lock on it; a file that nobody holds belongs to a session that is over.
+// The file is mapped into the process, so that marking costs a copy of the path and no call of the system,
+// and nothing needs to be done at the end: whatever ends the process, the file says what was going on. Each
+// process has a file of its own and holds a lock on it; a file that nobody holds belongs to a session that is
+// over.
 #pragma once
 
 #include <atomic>

@@ -79,6 +79,14 @@ void storeSuite(const HostSession& session, const Paths& paths)
     ASSERT_EQ(result.exitStatus, 0) << result.output;
 }
 
+void putOffModrig(const HostSession& session)
+{
+    const std::string set = std::string("REGISTRY SET ") + kRecordKey;
+    const auto result = session.start(
+        {"--safe", "-c", set + " Module " + quoted(modrigBundle()), "-c", set + " LoadReasons 4"});
+    ASSERT_EQ(result.exitStatus, 0) << result.output;
+}
+
 std::string listed(const std::string& path, const std::string& state)
 {
     const std::filesystem::path file = path;

@@ -34,6 +34,9 @@ std::string quoted(const std::string& text);
 std::string setInSuite(const std::string& name, const std::string& data);
 // Stores the Startup Suite, in a session that loads nothing.
 void storeSuite(const HostSession& session, const Paths& paths);
+// Makes the host leave Modrig alone until somebody asks for it. Otherwise nothing can be done before it is
+// loaded.
+void putOffModrig(const HostSession& session);
 // The arguments that run the commands one after the other.
 std::vector<std::string> byArguments(const std::vector<std::string>& commands);
 

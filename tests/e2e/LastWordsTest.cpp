@@ -50,25 +50,25 @@ TEST_P(LastWords, NameTheApplicationAndWhatItWasDoing)
 
 INSTANTIATE_TEST_SUITE_P(
     OfEveryEnd, LastWords,
-    testing::Values(Way{"segv", -SIGSEGV, "while its entry point ran: memory fault (SIGSEGV)"},
-                    Way{"raise", -SIGSEGV, "while its entry point ran: memory fault (SIGSEGV)"},
-                    Way{"stack", -SIGSEGV, "while its entry point ran: memory fault (SIGSEGV)"},
-                    Way{"abort", -SIGABRT, "while its entry point ran: it was given up (SIGABRT)"},
-                    Way{"noexcept", -SIGABRT, "while its entry point ran: it was given up (SIGABRT)"},
-                    Way{"pthread_exit", -SIGABRT, "while its entry point ran: it was given up (SIGABRT)"},
-                    Way{"exit", 1, "while its entry point ran: it called \"exit\""},
-                    Way{"exit-command", 1, "while its command \"PERISH\" ran: it called \"exit\""},
-                    Way{"segv-command", -SIGSEGV, "while its command \"PERISH\" ran: memory fault (SIGSEGV)"},
-                    Way{"stack-command", -SIGSEGV,
-                        "while its command \"PERISH\" ran: memory fault (SIGSEGV)"},
-                    Way{"abort-constructor", -SIGABRT,
-                        "while it was being loaded: it was given up (SIGABRT)"},
-                    Way{"segv-nested", -SIGSEGV, "while its entry point ran: memory fault (SIGSEGV)"},
-                    Way{"kill", -SIGKILL, ""}, Way{"_exit", 0, ""}),
+    testing::Values(
+        Way{"segv", -SIGSEGV, "while its entry point ran: memory fault (SIGSEGV)"},
+        Way{"raise", -SIGSEGV, "while its entry point ran: memory fault (SIGSEGV)"},
+        Way{"stack", -SIGSEGV, "while its entry point ran: memory fault (SIGSEGV)"},
+        Way{"abort", -SIGABRT, "while its entry point ran: it was given up (SIGABRT)"},
+        Way{"noexcept", -SIGABRT, "while its entry point ran: it was given up (SIGABRT)"},
+        Way{"pthread_exit", -SIGABRT, "while its entry point ran: it was given up (SIGABRT)"},
+        Way{"exit", 1, "while its entry point ran: it called \"exit\""},
+        Way{"exit-command", 1, "while its command \"PERISH\" ran: it called \"exit\""},
+        Way{"segv-command", -SIGSEGV, "while its command \"PERISH\" ran: memory fault (SIGSEGV)"},
+        Way{"stack-command", -SIGSEGV, "while its command \"PERISH\" ran: memory fault (SIGSEGV)"},
+        Way{"abort-constructor", -SIGABRT, "while it was being loaded: it was given up (SIGABRT)"},
+        Way{"segv-nested", -SIGSEGV, "while its entry point ran: memory fault (SIGSEGV)"},
+        Way{"kill", -SIGKILL, ""}, Way{"_exit", 0, ""}),
     [](const auto& way)
     {
         std::string name = way.param.file;
-        std::erase_if(name, [](char character) { return std::isalnum(static_cast<unsigned char>(character)) == 0; });
+        std::erase_if(name, [](char character)
+                      { return std::isalnum(static_cast<unsigned char>(character)) == 0; });
         return name + (*way.param.file == '_' ? "AtOnce" : "");
     });
 
@@ -87,8 +87,9 @@ TEST(LastWordsOf, ALispFile)
     const auto path = session.folder().write("deadly.lsp", "(ext:system \"kill -SEGV $PPID\")\n").string();
     const auto result = session.run({"LOAD " + path, "VERSION"});
     EXPECT_EQ(result.exitStatus, -SIGSEGV) << result.output;
-    EXPECT_THAT(result.output, testing::EndsWith("The application \"" + path +
-                                                 "\" has ended Tessel while its Lisp ran: " + kFault + ".\n"));
+    EXPECT_THAT(result.output,
+                testing::EndsWith("The application \"" + path +
+                                  "\" has ended Tessel while its Lisp ran: " + kFault + ".\n"));
 }
 
 TEST(LastWordsOf, AChildThatEndsAreNone)

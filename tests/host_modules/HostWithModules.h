@@ -6,7 +6,9 @@
 
 #include <gtest/gtest.h>
 
+#include "host/applications/Admission.h"
 #include "host/applications/DynamicLinker.h"
+#include "host/applications/KeptOut.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
 #include "host/messages/MessageBox.h"
@@ -51,10 +53,13 @@ protected:
                                      {
                                          mOutput += piece;
                                      }};
-    tessel::CallingApplication mCalls;
+    tessel::RunningMarker mMarker;
+    tessel::KeptOut mKeptOut;
+    tessel::Admission mAdmission{mMarker, mKeptOut, false};
+    tessel::CallingApplication mCalls{mMarker};
     tessel::CommandStack mCommands{mCommandLine, mCalls};
     tessel::MessageBox mMessageBox{mCommandLine};
-    tessel::DynamicLinker mLinker{mCommandLine, mCalls, mCommands, mMessageBox};
+    tessel::DynamicLinker mLinker{mCommandLine, mCalls, mCommands, mMessageBox, mAdmission};
     tessel::ResourceModules mResources{tessel::toWide((mFolder / "HostResources").native()), mCalls};
 
 private:

@@ -1,0 +1,37 @@
+// Who may be loaded. What a person asks for always may; what is loaded without being asked for (at the start,
+// for another application that is being loaded, for a command) only if nothing speaks against it.
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "host/platform/RunningMarker.h"
+#include "host/text/Result.h"
+
+namespace tessel
+{
+class KeptOut;
+
+class Admission
+{
+public:
+    // `safe`: nothing is loaded by itself in this session but what a person needs for a command.
+    Admission(RunningMarker& marker, KeptOut& keptOut, bool safe)
+        : mMarker(marker), mKeptOut(keptOut), mSafe(safe)
+    {
+    }
+
+    RunningMarker& marker() const { return mMarker; }
+    bool isSafe() const { return mSafe; }
+
+    // Asked with a full path before its file is opened. Why not is the end of a sentence, without its stop.
+    Result<> check(const std::wstring& path) const;
+    // What was let in is loaded.
+    void noteLoaded(const std::wstring& path) const;
+
+private:
+    RunningMarker& mMarker;
+    KeptOut& mKeptOut;
+    bool mSafe;
+};
+} // namespace tessel
