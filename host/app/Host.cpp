@@ -20,6 +20,18 @@ std::wstring wideText(const std::filesystem::path& path)
 {
     return toWide(path.string());
 }
+
+// What is refused in a safe session was meant to be: a box for each, before the person gets to the window
+// that they have asked for, would tell nothing that they do not know.
+MessageBox::Presenter quietWhenSafe(MessageBox::Presenter show, const Admission& admission)
+{
+    return [show = std::move(show), &admission](const MessageBox::Box& box)
+    {
+        return admission.isSafe() && admission.marker().reason() == RunningMarker::Reason::kForAnother
+                   ? 0
+                   : show(box);
+    };
+}
 } // namespace
 
 Host::Host(HostOptions options) : mOptions(std::move(options)), mCommandLine(mOptions.output)
@@ -67,7 +79,7 @@ Result<> Host::makeParts()
     if (const Outcome& started = mParts->startedLisp; !started)
         return started.failure();
     mInterruptible = &mParts->lisp();
-    mParts->messageBox->setPresenter(windowBoxes(mParts->layout.binaries));
+    mParts->messageBox->setPresenter(quietWhenSafe(windowBoxes(mParts->layout.binaries), mParts->admission));
     addCommands();
     return {};
 }

@@ -70,7 +70,7 @@ struct Parts
     Owned<MessageBox> messageBox{*commandLine};
     Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands, *messageBox, admission};
     Owned<ApplicationRecords> records{*registry, *commands, *callingApplication, kProductRegistryRoot};
-    DemandLoading demandLoading{layout.plugIns, *records, *linker, *marker};
+    DemandLoading demandLoading{layout.plugIns, *records, *linker, admission};
     Owned<Document> document;
     Owned<FileSearch> files{layout.resources, *variables};
     Owned<RemoteFiles> remote{foundations.profileFolder / "remote-files", foundations.downloads};

@@ -8,10 +8,9 @@
 #include <string_view>
 #include <vector>
 
-#include "host/platform/RunningMarker.h"
-
 namespace tessel
 {
+class Admission;
 class ApplicationRecords;
 class DynamicLinker;
 struct ApplicationRecord;
@@ -20,7 +19,7 @@ class DemandLoading
 {
 public:
     DemandLoading(std::filesystem::path plugInsFolder, const ApplicationRecords& records,
-                  DynamicLinker& linker, RunningMarker& marker);
+                  DynamicLinker& linker, const Admission& admission);
 
     // Loads what is due at the start: by the records, in their order, then from the PlugIns folder, by name.
     // What cannot be loaded is explained on the command line, and the start goes on.
@@ -30,10 +29,16 @@ public:
     // and that wants to be loaded for it. A "_" in front means the global name alone. False when nothing was
     // loaded: nobody has such a command, its application is loaded already, or it cannot be loaded, which the
     // command line has then been told.
+    //
+    // In a safe session, where nothing in the PlugIns folder was loaded at the start, one there that is
+    // called like the command is loaded for it as well: the dialog that could mend things must be there,
+    // whatever the records say.
     bool loadForCommand(std::wstring_view name) const;
 
 private:
+    std::vector<std::filesystem::path> plugIns() const;
     std::vector<std::filesystem::path> unrecordedPlugIns() const;
+    bool loadNamesake(std::wstring_view command) const;
 
     bool load(const std::wstring& path) const;
     bool isDue(const ApplicationRecord& record, std::wstring_view command) const;
@@ -41,6 +46,6 @@ private:
     std::filesystem::path mPlugInsFolder;
     const ApplicationRecords& mRecords;
     DynamicLinker& mLinker;
-    RunningMarker& mMarker;
+    const Admission& mAdmission;
 };
 } // namespace tessel

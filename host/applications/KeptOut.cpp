@@ -75,21 +75,21 @@ std::string lineOf(const KeptOutApplication& application)
     {
         return std::to_string(static_cast<std::int64_t>(value));
     };
-    const std::array<std::string, kFields> fields = {
-        escaped(application.path),
-        escaped(application.realPath),
-        number(application.stage),
-        number(application.since),
-        number(application.deed),
-        number(application.reason),
-        number(application.ending),
-        escaped(application.detail),
-        std::to_string(application.facts.size),
-        number(application.facts.contentTime),
-        number(application.facts.statusTime),
-        std::to_string(application.facts.inode),
-        application.hash ? std::to_string(*application.hash) : std::string("-"),
-        "."};
+    const std::array<std::string, kFields> fields = {escaped(application.path),
+                                                     escaped(application.realPath),
+                                                     number(application.stage),
+                                                     number(application.since),
+                                                     number(application.deed),
+                                                     number(application.reason),
+                                                     number(application.ending),
+                                                     escaped(application.detail),
+                                                     std::to_string(application.facts.size),
+                                                     number(application.facts.contentTime),
+                                                     number(application.facts.statusTime),
+                                                     std::to_string(application.facts.inode),
+                                                     application.hash ? std::to_string(*application.hash)
+                                                                      : std::string("-"),
+                                                     "."};
     std::string line;
     for (const std::string& field : fields)
         line += field + (&field == &fields.back() ? '\n' : '\t');
@@ -213,8 +213,8 @@ void giveTrials(std::vector<KeptOutApplication>& applications, std::vector<std::
             continue;
         application.stage = Stage::kOnTrial;
         application.hash = contentHash(application.path); // it is about to be opened in any case
-        sentences.push_back(L"The application \"" + toWide(application.path) +
-                            L"\" is tried once more: it " + whatHappened(application) + L".");
+        sentences.push_back(L"The application \"" + toWide(application.path) + L"\" is tried once more: it " +
+                            whatHappened(application) + L".");
     }
 }
 } // namespace

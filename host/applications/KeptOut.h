@@ -56,8 +56,8 @@ public:
     // Of the folder, which is there; a file that is damaged is left as it is, and nothing is kept out.
     explicit KeptOut(std::filesystem::path folder);
 
-    // A start, with what earlier sessions have left: judges them, and gives those a trial whose time has come,
-    // unless nothing will be loaded by itself anyway. Answers what a person is to be told.
+    // A start, with what earlier sessions have left: judges them, and gives those a trial whose time has
+    // come, unless nothing will be loaded by itself anyway. Answers what a person is to be told.
     std::vector<std::wstring> begin(const std::vector<RunningMarker::Leftover>& leftovers, bool givesTrials);
     // Whether all that was learnt is stored.
     bool isStored() const { return mStored; }

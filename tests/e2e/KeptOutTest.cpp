@@ -25,8 +25,9 @@ using testing::Not;
 namespace
 {
 constexpr char kThisTime[] = "It is not loaded by itself at this start, and tried once more at the next.\n";
-constexpr char kForGood[] = "It is not loaded by itself any more, until you load it by hand or let it in (ENABLE), "
-                            "or its file changes.\n";
+constexpr char kForGood[] =
+    "It is not loaded by itself any more, until you load it by hand or let it in (ENABLE), "
+    "or its file changes.\n";
 constexpr char kDay[] = "on [0-9]{4}-[0-9]{2}-[0-9]{2} [0-9]{2}:[0-9]{2}";
 
 // Whether anybody opens the file while this object lives.
@@ -79,7 +80,8 @@ TEST_F(KeptOut, IsWhatEndedTheHostFromTheStartupSuiteAndEverythingElseIsLoaded)
     EXPECT_EQ(next.exitStatus, 0) << next.output;
     EXPECT_THAT(next.output, ContainsRegex(named(bad, kInSuite)));
     EXPECT_THAT(next.output, HasSubstr(kThisTime));
-    EXPECT_THAT(next.output, ContainsRegex("The application \"" + bad + "\" is not loaded: it is kept out: it ended "));
+    EXPECT_THAT(next.output,
+                ContainsRegex("The application \"" + bad + "\" is not loaded: it is kept out: it ended "));
     EXPECT_THAT(next.output, HasSubstr("Good.zmb: message 1\n"));
     EXPECT_THAT(next.output, HasSubstr("good.lsp: loaded\n"));
     EXPECT_THAT(next.output, Not(HasSubstr("segv.zmb: message 1")));
@@ -94,14 +96,16 @@ TEST_F(KeptOut, IsTriedOnceMoreAndThenKeptOutForGood)
     EXPECT_EQ(session.run({"VERSION"}).exitStatus, 0);
     const auto third = session.run({"VERSION"});
     EXPECT_EQ(third.exitStatus, -SIGABRT);
-    EXPECT_THAT(third.output, HasSubstr("The application \"" + bad + "\" is tried once more: it ended Tessel "));
+    EXPECT_THAT(third.output,
+                HasSubstr("The application \"" + bad + "\" is tried once more: it ended Tessel "));
     EXPECT_THAT(startSays(), HasSubstr(kForGood));
     for (int start = 0; start < 3; ++start)
     {
         const auto result = session.run({"VERSION"});
         EXPECT_EQ(result.exitStatus, 0) << result.output;
-        EXPECT_THAT(result.output, AllOf(HasSubstr("\"" + bad + "\" is not loaded: it is kept out: it ended "),
-                                         Not(HasSubstr(kForGood))));
+        EXPECT_THAT(result.output,
+                    AllOf(HasSubstr("\"" + bad + "\" is not loaded: it is kept out: it ended "),
+                          Not(HasSubstr(kForGood))));
     }
 }
 
@@ -112,15 +116,16 @@ TEST_F(KeptOut, StaysInTheStartupSuiteAndIsShownWithTheReasonAndTheDay)
     session.run({});
     const auto result = session.run({"APPS", std::string("REGISTRY GET ") + kSuiteKey + " 1Startup"});
     EXPECT_THAT(result.output, HasSubstr("\n" + bad + "\n"));
-    EXPECT_THAT(result.output, ContainsRegex("  segv\\.zmb .* kept out: it ended Tessel " + std::string(kDay) + " " +
-                                             kInSuite));
+    EXPECT_THAT(result.output, ContainsRegex("  segv\\.zmb .* kept out: it ended Tessel " +
+                                             std::string(kDay) + " " + kInSuite));
 }
 
 TEST_F(KeptOut, IsNotForGoodWhatWasAtWorkWhenThePowerWent)
 {
     const auto flag = session.folder().write("flag", "");
-    const auto file = session.folder().write("slow.lsp", "(write-line \"slow.lsp: begun\")\n(when (probe-file \"" +
-                                                             flag.string() + "\") (loop))\n");
+    const auto file =
+        session.folder().write("slow.lsp", "(write-line \"slow.lsp: begun\")\n(when (probe-file \"" +
+                                               flag.string() + "\") (loop))\n");
     storeSuite(session, {file.string()});
     {
         HostTerminal terminal(session);
@@ -130,7 +135,10 @@ TEST_F(KeptOut, IsNotForGoodWhatWasAtWorkWhenThePowerWent)
     }
     fs::remove(flag);
     const std::string second = startSays();
-    EXPECT_THAT(second, ContainsRegex(named(file, R"(while its Lisp ran \(loaded from the Startup Suite\): killed or switched off\.)")));
+    EXPECT_THAT(
+        second,
+        ContainsRegex(named(
+            file, R"(while its Lisp ran \(loaded from the Startup Suite\): killed or switched off\.)")));
     EXPECT_THAT(second, HasSubstr("Cannot load \"" + file.string() + "\": it is kept out: it ended Tessel "));
     EXPECT_THAT(second, Not(HasSubstr("slow.lsp: begun")));
     EXPECT_THAT(startSays(), AllOf(HasSubstr("is tried once more"), HasSubstr("slow.lsp: begun")));
@@ -278,7 +286,8 @@ TEST_F(KeptOut, AreThoseOfAllSessionsThatAreOver)
         EXPECT_EQ(one.waitForEnd(), -SIGKILL);
         EXPECT_EQ(other.waitForEnd(), -SIGKILL);
     }
-    EXPECT_THAT(startSays(), AllOf(HasSubstr("\"" + first + "\" ended Tessel"), HasSubstr("\"" + second + "\" ended Tessel")));
+    EXPECT_THAT(startSays(), AllOf(HasSubstr("\"" + first + "\" ended Tessel"),
+                                   HasSubstr("\"" + second + "\" ended Tessel")));
     EXPECT_THAT(startSays(), HasSubstr("is tried once more"));
 }
 
