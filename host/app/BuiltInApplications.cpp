@@ -15,17 +15,6 @@ constexpr std::size_t kNameColumn = 24;
 constexpr std::size_t kFolderColumn = 48;
 constexpr std::array kLispExtensions = {L".lsp", L".qbc"};
 
-// Where the file is, along the host's search path; a file that is not found is looked for where the user is,
-// so that what is said about it names a whole path.
-std::wstring fullPath(const Parts& parts, const std::wstring& typed)
-{
-    if (const auto found = parts.files->find(toPath(typed)))
-        return toText(*found);
-    std::error_code currentFolderIsGone;
-    const auto path = std::filesystem::absolute(toPath(typed), currentFolderIsGone);
-    return toText(path.has_filename() ? path : path.parent_path());
-}
-
 bool isLispFile(const std::wstring& path)
 {
     const std::wstring extension = toText(toPath(path).extension());

@@ -107,6 +107,7 @@ void Host::addCommands()
                                      return runScript(script);
                                  }});
     addApplicationCommands(*mParts);
+    addKeptOutCommands(*mParts);
     addSettingCommands(*mParts);
     addRegistryCommands(*mParts);
     mParts->commands->setLoader([this](const std::wstring& name)

@@ -15,6 +15,7 @@
 #include "host/applications/Document.h"
 #include "host/applications/DynamicLinker.h"
 #include "host/applications/KeptOut.h"
+#include "host/applications/KeptOutService.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
 #include "host/commands/EndRequest.h"
@@ -64,6 +65,7 @@ struct Parts
     Owned<RunningMarker> marker{foundations.profileFolder / kApplicationsFolder};
     KeptOut keptOut{foundations.profileFolder / kApplicationsFolder};
     Admission admission{*marker, keptOut, foundations.safe};
+    Owned<KeptOutService> keptOutService{keptOut, admission, *commandLine};
     Owned<CallingApplication> callingApplication{*marker};
     Owned<CommandStack> commands{*commandLine, *callingApplication};
     Owned<ResourceModules> resources{toWide(layout.resources.string()), *callingApplication};

@@ -35,6 +35,12 @@ Result<> Admission::check(const std::wstring& path) const
     return {};
 }
 
+std::wstring Admission::whyKeptOut(const std::wstring& path) const
+{
+    const KeptOutApplication* known = mKeptOut.find(toUtf8(path));
+    return known && known->isOut() ? reasonOf(*known) : std::wstring();
+}
+
 void Admission::noteLoaded(const std::wstring& path) const
 {
     mKeptOut.noteLoaded(toUtf8(path), mMarker.reason() == Reason::kByHand);

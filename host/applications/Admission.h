@@ -26,6 +26,8 @@ public:
 
     // Asked with a full path before its file is opened. Why not is the end of a sentence, without its stop.
     Result<> check(const std::wstring& path) const;
+    // Why the application is kept out at starts, as a part of a sentence; empty for one that is not.
+    std::wstring whyKeptOut(const std::wstring& path) const;
     // What was let in is loaded.
     void noteLoaded(const std::wstring& path) const;
 

@@ -118,6 +118,6 @@ bool DemandLoading::loadForCommand(std::wstring_view name) const
     const auto records = mRecords.all();
     return std::ranges::any_of(records, [&](const ApplicationRecord& record)
                                { return isDue(record, name) && load(record.module); }) ||
-           (mAdmission.isSafe() && loadNamesake(name));
+           loadNamesake(name);
 }
 } // namespace tessel

@@ -30,9 +30,8 @@ public:
     // loaded: nobody has such a command, its application is loaded already, or it cannot be loaded, which the
     // command line has then been told.
     //
-    // In a safe session, where nothing in the PlugIns folder was loaded at the start, one there that is
-    // called like the command is loaded for it as well: the dialog that could mend things must be there,
-    // whatever the records say.
+    // What stands in the PlugIns folder, is called like the command and was kept out at the start is loaded
+    // for it as well: the dialog that could mend things must be there, whatever the records say.
     bool loadForCommand(std::wstring_view name) const;
 
 private:

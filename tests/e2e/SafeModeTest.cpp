@@ -1,5 +1,5 @@
-// A session that loads nothing by itself: MODRIG is there all the same, whatever the profile holds, and nothing
-// that Modrig would load with itself.
+// A session that loads nothing by itself: MODRIG is there all the same, whatever the profile holds, and
+// nothing that Modrig would load with itself.
 #include <csignal>
 #include <ostream>
 
@@ -74,7 +74,8 @@ TEST_P(SafeMode, HasModrigAndNothingOfItsSuite)
 
 TEST_P(SafeMode, LoadsEverythingByHand)
 {
-    const auto result = session.run({"LOAD " + fixtureModule("Good.zmb"), "LOAD " + lisp, "MODRIG", "LOAD " + lisp});
+    const auto result =
+        session.run({"LOAD " + fixtureModule("Good.zmb"), "LOAD " + lisp, "MODRIG", "LOAD " + lisp});
     EXPECT_EQ(result.exitStatus, 0) << result.output;
     EXPECT_THAT(result.output, AllOf(HasSubstr("Good.zmb: message 1"), HasSubstr("good.lsp: loaded")));
     EXPECT_EQ(session.run({"LOAD " + bad}).exitStatus, -SIGABRT);
@@ -117,6 +118,7 @@ TEST(SafeModeCommands, LoadNoPlugInThatIsNotCalledLikeThem)
     HostSession session;
     session.alwaysWith({"--safe"});
     const auto result = session.run({"NOBODYS", "APPS"});
-    EXPECT_EQ(result.output, kBanner + std::string("Command: NOBODYS\nUnknown command \"NOBODYS\". Type HELP for the "
-                                                   "list of commands.\nCommand: APPS\nNo application is loaded.\n"));
+    EXPECT_EQ(result.output,
+              kBanner + std::string("Command: NOBODYS\nUnknown command \"NOBODYS\". Type HELP for the "
+                                    "list of commands.\nCommand: APPS\nNo application is loaded.\n"));
 }
