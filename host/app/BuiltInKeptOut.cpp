@@ -1,4 +1,4 @@
-// DISABLE, ENABLE: which applications are loaded at starts.
+// DISABLE, ENABLE, BISECT: which applications are loaded at starts.
 #include <algorithm>
 
 #include "host/app/BuiltIn.h"
@@ -47,6 +47,26 @@ Result<> enable(Parts& parts, const CommandStack::Arguments& arguments)
         return let;
     return succeed(parts, path + L" is loaded at starts again.");
 }
+Result<std::wstring> runBisect(Parts& parts, const std::wstring& word)
+{
+    if (equalIgnoringCase(word, L"START"))
+        return parts.bisecting.begin(parts.admission.suspects());
+    if (equalIgnoringCase(word, L"GOOD"))
+        return parts.bisecting.answer(true);
+    if (equalIgnoringCase(word, L"BAD"))
+        return parts.bisecting.answer(false);
+    if (equalIgnoringCase(word, L"STOP"))
+        return parts.bisecting.stop();
+    return word.empty() ? parts.bisecting.tell() : wrongUsage(parts, L"BISECT");
+}
+
+Result<> bisect(Parts& parts, const CommandStack::Arguments& arguments)
+{
+    if (arguments.size() > 1)
+        return wrongUsage(parts, L"BISECT");
+    const auto said = runBisect(parts, arguments.empty() ? std::wstring() : arguments.front());
+    return said ? succeed(parts, *said) : said.failure();
+}
 } // namespace
 
 void addKeptOutCommands(Parts& parts)
@@ -59,5 +79,9 @@ void addKeptOutCommands(Parts& parts)
                {kApplicationsGroup, L"ENABLE", L"file",
                 L"Lets an application in again that was disabled or that ended Tessel"},
                enable);
+    addBuiltIn(parts,
+               {kApplicationsGroup, L"BISECT", L"[START|GOOD|BAD|STOP]",
+                L"Finds the application that makes trouble, in a few starts"},
+               bisect);
 }
 } // namespace tessel

@@ -63,6 +63,8 @@ void Host::judgeEarlierSessions()
         mCommandLine.say(sentence);
     if (mParts->keptOut.isStored())
         mParts->marker->forgetLeftovers();
+    for (const auto& line : mParts->bisecting.sentencesAtStart())
+        mCommandLine.say(line);
 }
 
 Result<> Host::makeParts()

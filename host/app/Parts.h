@@ -11,6 +11,7 @@
 #include "host/app/Layout.h"
 #include "host/applications/Admission.h"
 #include "host/applications/ApplicationRecords.h"
+#include "host/applications/Bisecting.h"
 #include "host/applications/DemandLoading.h"
 #include "host/applications/Document.h"
 #include "host/applications/DynamicLinker.h"
@@ -64,7 +65,8 @@ struct Parts
     Owned<SystemVariables> variables{&*registry, kProductRegistryRoot};
     Owned<RunningMarker> marker{foundations.profileFolder / kApplicationsFolder};
     KeptOut keptOut{foundations.profileFolder / kApplicationsFolder};
-    Admission admission{*marker, keptOut, foundations.safe};
+    Bisecting bisecting{foundations.profileFolder / kApplicationsFolder, !foundations.safe};
+    Admission admission{*marker, keptOut, bisecting, foundations.safe};
     Owned<KeptOutService> keptOutService{keptOut, admission, *commandLine};
     Owned<CallingApplication> callingApplication{*marker};
     Owned<CommandStack> commands{*commandLine, *callingApplication};

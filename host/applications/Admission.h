@@ -2,6 +2,8 @@
 // for another application that is being loaded, for a command) only if nothing speaks against it.
 #pragma once
 
+#include <functional>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -10,14 +12,15 @@
 
 namespace tessel
 {
+class Bisecting;
 class KeptOut;
 
 class Admission
 {
 public:
     // `safe`: nothing is loaded by itself in this session but what a person needs for a command.
-    Admission(RunningMarker& marker, KeptOut& keptOut, bool safe)
-        : mMarker(marker), mKeptOut(keptOut), mSafe(safe)
+    Admission(RunningMarker& marker, KeptOut& keptOut, const Bisecting& bisecting, bool safe)
+        : mMarker(marker), mKeptOut(keptOut), mBisecting(bisecting), mSafe(safe)
     {
     }
 
@@ -25,15 +28,24 @@ public:
     bool isSafe() const { return mSafe; }
 
     // Asked with a full path before its file is opened. Why not is the end of a sentence, without its stop.
-    Result<> check(const std::wstring& path) const;
+    Result<> check(const std::wstring& path);
     // Why the application is kept out at starts, as a part of a sentence; empty for one that is not.
     std::wstring whyKeptOut(const std::wstring& path) const;
     // What was let in is loaded.
     void noteLoaded(const std::wstring& path) const;
+    // The application at work has others loaded with it, now or later.
+    void noteCarrier();
+
+    // What was let in at the start without being asked for by name, but for those that others came with: in
+    // the order in which it was asked for.
+    std::vector<std::string> suspects() const;
 
 private:
     RunningMarker& mMarker;
     KeptOut& mKeptOut;
+    const Bisecting& mBisecting;
     bool mSafe;
+    std::vector<std::string> mAskedFor;
+    std::set<std::string, std::less<>> mCarriers;
 };
 } // namespace tessel

@@ -68,7 +68,7 @@ RegularFile programOf(const Result<ModuleFile>& file)
 } // namespace
 
 DynamicLinker::DynamicLinker(CommandLine& commandLine, CallingApplication& calls, CommandStack& commands,
-                             MessageBox& messageBox, const Admission& admission)
+                             MessageBox& messageBox, Admission& admission)
     : mCommandLine(commandLine), mCalls(calls), mCommands(commands), mMessageBox(messageBox),
       mAdmission(admission)
 {

@@ -40,7 +40,7 @@ public:
     // of what goes out of `commands`, and gives the message box its detail.
     // Loads what `admission` does not refuse.
     DynamicLinker(CommandLine& commandLine, CallingApplication& calls, CommandStack& commands,
-                  MessageBox& messageBox, const Admission& admission);
+                  MessageBox& messageBox, Admission& admission);
 
     bool registerApplication(void* application) override;
     bool loadModule(const wchar_t* path, bool sayWhyNot, bool resolveNow) override;
@@ -82,7 +82,7 @@ private:
     CallingApplication& mCalls;
     CommandStack& mCommands;
     MessageBox& mMessageBox;
-    const Admission& mAdmission;
+    Admission& mAdmission;
     LoadedModules mModules;
     bool mEnding = false;
 };

@@ -41,34 +41,6 @@ auto findIn(auto& applications, const std::string& path)
                                 { return known.path == path || isWithin(real, known.realPath); });
 }
 
-std::string escaped(std::string_view text)
-{
-    std::string result;
-    for (const char character : text)
-        if (character == '\\')
-            result += "\\\\";
-        else if (character == '\t')
-            result += "\\t";
-        else if (character == '\n')
-            result += "\\n";
-        else
-            result += character;
-    return result;
-}
-
-std::string unescaped(std::string_view text)
-{
-    std::string result;
-    for (std::size_t at = 0; at < text.size(); ++at)
-        if (text[at] != '\\' || at + 1 == text.size())
-            result += text[at];
-        else if (const char code = text[++at]; code == 't' || code == 'n')
-            result += code == 't' ? '\t' : '\n';
-        else
-            result += code;
-    return result;
-}
-
 std::string lineOf(const KeptOutApplication& application)
 {
     const auto number = [](auto value)
@@ -236,7 +208,7 @@ Result<KeptOut::Applications> KeptOut::read() const
     if (!(*content)->starts_with(kHeader) || !(*content)->ends_with('\n'))
         return Failure{L"The file " + toWide(mFile.string()) +
                        L" is damaged; without it Tessel does not know which applications to keep out."};
-    for (const auto line : split(std::string_view(**content).substr(kHeader.size()), '\n'))
+    for (const auto line : linesOf(std::string_view(**content).substr(kHeader.size())))
         if (auto application = parseLine(line))
             applications.push_back(*std::move(application));
     return applications;

@@ -15,7 +15,7 @@ namespace tessel
 {
 namespace
 {
-void admitFilesBy(const Admission& admission, LispSurroundings& surroundings)
+void admitFilesBy(Admission& admission, LispSurroundings& surroundings)
 {
     surroundings.fileBegins = [&admission](const std::wstring& name,
                                            const std::filesystem::path& file) -> Result<>
@@ -60,7 +60,8 @@ LispSurroundings surroundings(const LispInterpreter::Options& options, CommandLi
 LispInterpreter::LispInterpreter(std::unique_ptr<LispMachine> machine, const Options& options,
                                  CommandLine& commandLine, const EndRequest& endRequest)
     : mMachine(std::move(machine)), mRemovingTsLisp(options.removingTsLisp), mCommandLine(commandLine),
-      mEndRequest(endRequest), mMarker(options.admission ? options.admission->marker() : mNoMarker)
+      mEndRequest(endRequest), mAdmission(options.admission),
+      mMarker(options.admission ? options.admission->marker() : mNoMarker)
 {
 }
 
@@ -87,6 +88,8 @@ Result<std::wstring> LispInterpreter::evaluate(std::wstring_view expressions)
 
 void LispInterpreter::queue(std::wstring expression)
 {
+    if (mAdmission)
+        mAdmission->noteCarrier();
     mQueue.push_back({std::move(expression), mMarker.reason()});
 }
 

@@ -26,9 +26,9 @@ class LispInterpreter
 public:
     struct Options
     {
-        bool removingTsLisp = true;           // compiled and packaged Lisp can be loaded
-        std::size_t heapBytes = 0;            // memory for Lisp's objects; 0: as much as is usual
-        const Admission* admission = nullptr; // of files, if it is to be asked; it marks them, too
+        bool removingTsLisp = true;     // compiled and packaged Lisp can be loaded
+        std::size_t heapBytes = 0;      // memory for Lisp's objects; 0: as much as is usual
+        Admission* admission = nullptr; // of files, if it is to be asked; it marks them, too
     };
 
     // Starts Lisp, on the thread on which everything but `interrupt` is to be called. A later interpreter in
@@ -83,6 +83,7 @@ private:
     bool mRemovingTsLisp;
     CommandLine& mCommandLine;
     const EndRequest& mEndRequest;
+    Admission* mAdmission;
     RunningMarker mNoMarker;
     RunningMarker& mMarker;
     std::deque<Queued> mQueue;

@@ -105,6 +105,45 @@ Result<std::optional<std::string>> readSmallFile(const std::filesystem::path& fi
     return std::optional(content);
 }
 
+std::string escaped(std::string_view text)
+{
+    std::string result;
+    for (const char character : text)
+        if (character == '\\')
+            result += "\\\\";
+        else if (character == '\t')
+            result += "\\t";
+        else if (character == '\n')
+            result += "\\n";
+        else
+            result += character;
+    return result;
+}
+
+std::string unescaped(std::string_view text)
+{
+    std::string result;
+    for (std::size_t at = 0; at < text.size(); ++at)
+        if (text[at] != '\\' || at + 1 == text.size())
+            result += text[at];
+        else if (const char code = text[++at]; code == 't' || code == 'n')
+            result += code == 't' ? '\t' : '\n';
+        else
+            result += code;
+    return result;
+}
+
+std::vector<std::string_view> linesOf(std::string_view text)
+{
+    std::vector<std::string_view> lines;
+    for (std::size_t end = text.find('\n'); end != text.npos; end = text.find('\n'))
+    {
+        lines.push_back(text.substr(0, end));
+        text.remove_prefix(end + 1);
+    }
+    return lines;
+}
+
 Result<> replaceSmallFile(const std::filesystem::path& file, std::string_view content)
 {
     constexpr wchar_t kNotWritten[] = L" cannot be written: ";

@@ -5,6 +5,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "host/text/Result.h"
 
@@ -33,6 +34,12 @@ bool lockNow(int descriptor);
 
 // The content; nothing when there is no such file. What is no ordinary file of sensible size is refused.
 Result<std::optional<std::string>> readSmallFile(const std::filesystem::path& file);
+
+// Text as a part of a line, without tabs and line breaks, and back.
+std::string escaped(std::string_view text);
+std::string unescaped(std::string_view text);
+// The lines of a text whose last line is ended too; what comes after that is none.
+std::vector<std::string_view> linesOf(std::string_view text);
 
 // The file has the new content or the old one, whatever happens meanwhile.
 Result<> replaceSmallFile(const std::filesystem::path& file, std::string_view content);

@@ -16,13 +16,13 @@ public:
         return object && object->isKindOf(kClassName) ? static_cast<TsRxKeptOut*>(object) : nullptr;
     }
 
-    // One sentence about why the application at the full path is kept out, and since when; null for one that is
-    // not. The text is the host's and stays until the next call.
+    // One sentence about why the application at the full path is kept out, and since when; null for one that
+    // is not. The text is the host's and stays until the next call.
     virtual const wchar_t* whyKeptOut(const wchar_t* path) = 0;
 
-    // Keeps the application at the full path out at starts, from the next one on, without opening its file, or
-    // lets it in again, whatever has kept it out. False, with a line on the command line, when that cannot be
-    // stored or when it was not kept out.
+    // Keeps the application at the full path out at starts, from the next one on, without opening its file,
+    // or lets it in again, whatever has kept it out. False, with a line on the command line, when that cannot
+    // be stored or when it was not kept out.
     virtual bool keepOut(const wchar_t* path) = 0;
     virtual bool letIn(const wchar_t* path) = 0;
 

@@ -33,7 +33,8 @@ TEST_F(KeptOutByHand, IsAModuleUntilItIsLetIn)
     storeSuite(session, {good, lisp});
     const auto disabled = session.run({"DISABLE Good.zmb"});
     EXPECT_EQ(disabled.exitStatus, 0);
-    EXPECT_THAT(disabled.output, HasSubstr(good + " is kept out at starts from now on; ENABLE lets it in again.\n"));
+    EXPECT_THAT(disabled.output,
+                HasSubstr(good + " is kept out at starts from now on; ENABLE lets it in again.\n"));
     for (int start = 0; start < 3; ++start)
     {
         const std::string said = startSays();

@@ -7,6 +7,7 @@
 #include <gtest/gtest.h>
 
 #include "host/applications/Admission.h"
+#include "host/applications/Bisecting.h"
 #include "host/applications/DynamicLinker.h"
 #include "host/applications/KeptOut.h"
 #include "host/commands/CallingApplication.h"
@@ -55,7 +56,8 @@ protected:
                                      }};
     tessel::RunningMarker mMarker;
     tessel::KeptOut mKeptOut;
-    tessel::Admission mAdmission{mMarker, mKeptOut, false};
+    tessel::Bisecting mBisecting;
+    tessel::Admission mAdmission{mMarker, mKeptOut, mBisecting, false};
     tessel::CallingApplication mCalls{mMarker};
     tessel::CommandStack mCommands{mCommandLine, mCalls};
     tessel::MessageBox mMessageBox{mCommandLine};

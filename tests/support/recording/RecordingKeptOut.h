@@ -1,4 +1,5 @@
-// The applications that a host keeps out; a test sets it into the services of the recording host, which has none.
+// The applications that a host keeps out; a test sets it into the services of the recording host, which has
+// none.
 #pragma once
 
 #include <map>
