@@ -115,15 +115,15 @@ std::vector<std::wstring> Bisecting::sentencesAtStart() const
 Result<std::wstring> Bisecting::begin(const std::vector<std::string>& suspects)
 {
     if (suspects.empty())
-        return Failure{L"There is nothing to search among: no application was loaded by itself in this session."};
+        return Failure{
+            L"There is nothing to search among: no application was loaded by itself in this session."};
     Search search;
     std::ranges::transform(suspects, std::back_inserter(search.suspects), realPathOf);
     if (auto stored = store(search); !stored)
         return stored.failure();
     mReadAtStart = {};
     mApplied.reset();
-    return L"BISECT searches among " +
-           counted(suspects.size(), L" application", L" applications") + L"; " +
+    return L"BISECT searches among " + counted(suspects.size(), L" application", L" applications") + L"; " +
            startsLeft(search.bisection()) + L". Start Tessel again.";
 }
 
@@ -143,8 +143,9 @@ Result<std::wstring> Bisecting::answer(bool wasGood)
     if (!search)
         return search.failure();
     if (mApplied != *search)
-        return Failure{L"This session cannot be judged: it was not started with the suspects that are to be tried. "
-                       L"Start Tessel again, without --safe."};
+        return Failure{
+            L"This session cannot be judged: it was not started with the suspects that are to be tried. "
+            L"Start Tessel again, without --safe."};
     search->answers.push_back(wasGood);
     const Bisection bisection = search->bisection();
     const bool isOpen = bisection.verdict() == Bisection::Verdict::kOpen;

@@ -1,5 +1,5 @@
-// A search for the application that makes trouble, from one start to the next: its suspects and the answers so
-// far stand in a file of the profile. See Bisection.
+// A search for the application that makes trouble, from one start to the next: its suspects and the answers
+// so far stand in a file of the profile. See Bisection.
 #pragma once
 
 #include <filesystem>
@@ -17,8 +17,8 @@ class Bisecting
 public:
     // Never searches.
     Bisecting() = default;
-    // Goes on with what stands in the folder, which is there. `applies`: this session keeps suspects out, and so
-    // can be judged.
+    // Goes on with what stands in the folder, which is there. `applies`: this session keeps suspects out, and
+    // so can be judged.
     Bisecting(std::filesystem::path folder, bool applies);
 
     // Whether this session keeps the application at that full path out.

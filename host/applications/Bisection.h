@@ -1,5 +1,5 @@
-// Finds the one among several applications that makes trouble, by starts with some of them only. A person says
-// after each whether the trouble was there.
+// Finds the one among several applications that makes trouble, by starts with some of them only. A person
+// says after each whether the trouble was there.
 //
 // At each start half of those that are still suspected are loaded, and none of the other suspects: trouble is
 // then the loaded half's. The last start tells the one that is left from no application at all (nothing is
@@ -18,8 +18,8 @@ public:
     enum class Verdict
     {
         kOpen,
-        kFound,  // `culprit`
-        kNone,   // the trouble is there without them
+        kFound,   // `culprit`
+        kNone,    // the trouble is there without them
         kTogether // it takes several of them
     };
 

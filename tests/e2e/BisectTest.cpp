@@ -20,7 +20,9 @@ protected:
     // Lisp files that each say their name, and what else they are told to.
     std::string write(const std::string& name, const std::string& lisp = {}) const
     {
-        return session.folder().write(name + ".lsp", "(write-line \"" + name + " runs\")\n" + lisp + "\n").string();
+        return session.folder()
+            .write(name + ".lsp", "(write-line \"" + name + " runs\")\n" + lisp + "\n")
+            .string();
     }
     std::string makesTrouble() const { return write("culprit", "(write-line \"TROUBLE\")"); }
 
@@ -29,7 +31,8 @@ protected:
         storeSuite(session, suite);
         const auto result = session.run({"BISECT START"});
         EXPECT_EQ(result.exitStatus, 0) << result.output;
-        EXPECT_THAT(result.output, HasSubstr("BISECT searches among " + std::to_string(suite.size()) + " application"));
+        EXPECT_THAT(result.output,
+                    HasSubstr("BISECT searches among " + std::to_string(suite.size()) + " application"));
         EXPECT_THAT(result.output, HasSubstr(kAgain));
     }
 
@@ -54,7 +57,8 @@ protected:
 TEST_F(Bisect, NamesTheCulpritAndLeavesEverythingAsItWas)
 {
     const std::string culprit = makesTrouble();
-    const Paths suite = {write("a"), fixtureModule("Good.zmb"), culprit, write("b"), write("c"), write("d"), write("e")};
+    const Paths suite = {write("a"), fixtureModule("Good.zmb"), culprit, write("b"), write("c"), write("d"),
+                         write("e")};
     begin(suite);
     std::size_t starts = 0;
     EXPECT_THAT(search(starts), HasSubstr("BISECT has found it: \"" + culprit + "\" makes the trouble."));
@@ -71,16 +75,20 @@ TEST_F(Bisect, SaysWhichItKeepsOutAtEachStart)
     for (int start = 0; start < 2; ++start) // nothing was answered in between
     {
         const auto result = session.run({"BISECT"});
-        EXPECT_THAT(result.output, HasSubstr("BISECT keeps 2 of 4 suspects out at this start:\n  " + suite[2] + "\n  " +
-                                             suite[3] + "\nType BISECT GOOD when the trouble is gone, BISECT BAD when "
-                                                        "it is there; at most 3 starts are left.\n"));
+        EXPECT_THAT(result.output, HasSubstr("BISECT keeps 2 of 4 suspects out at this start:\n  " +
+                                             suite[2] + "\n  " + suite[3] +
+                                             "\nType BISECT GOOD when the trouble is gone, BISECT BAD when "
+                                             "it is there; at most 3 starts are left.\n"));
         EXPECT_THAT(result.output, AllOf(HasSubstr("a runs"), HasSubstr("b runs"), Not(HasSubstr("c runs")),
                                          Not(HasSubstr("d runs"))));
-        EXPECT_THAT(result.output, HasSubstr("Cannot load \"" + suite[2] + "\": it is kept out at this start by BISECT.\n"));
-        EXPECT_THAT(result.output, HasSubstr("4 applications are still suspected; at most 3 starts are left.\n"));
+        EXPECT_THAT(result.output,
+                    HasSubstr("Cannot load \"" + suite[2] + "\": it is kept out at this start by BISECT.\n"));
+        EXPECT_THAT(result.output,
+                    HasSubstr("4 applications are still suspected; at most 3 starts are left.\n"));
     }
-    EXPECT_THAT(session.run({"BISECT bad"}).output,
-                HasSubstr("2 applications are still suspected; at most 2 starts are left. Start Tessel again.\n"));
+    EXPECT_THAT(
+        session.run({"BISECT bad"}).output,
+        HasSubstr("2 applications are still suspected; at most 2 starts are left. Start Tessel again.\n"));
     EXPECT_THAT(session.run({"VERSION"}).output, AllOf(HasSubstr("a runs"), Not(HasSubstr("b runs"))));
 }
 
@@ -89,11 +97,14 @@ TEST_F(Bisect, SaysThatItIsNone)
     begin({write("a"), write("b"), write("c")});
     EXPECT_THAT(session.run({"BISECT BAD"}).output,
                 HasSubstr("1 application is still suspected; at most 1 start is left. "));
-    EXPECT_THAT(session.run({"VERSION"}).output, AllOf(HasSubstr("BISECT keeps 3 of 3 suspects out"), Not(HasSubstr("runs"))));
-    EXPECT_THAT(session.run({"BISECT BAD"}).output,
-                HasSubstr("BISECT says that it is none of them: the trouble is there when all of the 3 suspects "
-                          "are kept out.\n"));
-    EXPECT_THAT(session.run({"BISECT"}).output, HasSubstr("No search is going on; BISECT START begins one.\n"));
+    EXPECT_THAT(session.run({"VERSION"}).output,
+                AllOf(HasSubstr("BISECT keeps 3 of 3 suspects out"), Not(HasSubstr("runs"))));
+    EXPECT_THAT(
+        session.run({"BISECT BAD"}).output,
+        HasSubstr("BISECT says that it is none of them: the trouble is there when all of the 3 suspects "
+                  "are kept out.\n"));
+    EXPECT_THAT(session.run({"BISECT"}).output,
+                HasSubstr("No search is going on; BISECT START begins one.\n"));
 }
 
 TEST_F(Bisect, SaysThatSeveralAreNeededTogether)
@@ -128,8 +139,10 @@ TEST_F(Bisect, SuspectsNoneThatOthersCameWithAndNoneThatIsOutAlready)
 TEST_F(Bisect, JudgesOnlySessionsThatWereStartedForIt)
 {
     storeSuite(session, {write("a"), write("b")});
-    EXPECT_THAT(session.run({"BISECT START", "BISECT GOOD"}).output, HasSubstr("This session cannot be judged: "));
-    EXPECT_THAT(session.start({"--safe", "-c", "BISECT GOOD"}).output, HasSubstr("This session cannot be judged: "));
+    EXPECT_THAT(session.run({"BISECT START", "BISECT GOOD"}).output,
+                HasSubstr("This session cannot be judged: "));
+    EXPECT_THAT(session.start({"--safe", "-c", "BISECT GOOD"}).output,
+                HasSubstr("This session cannot be judged: "));
     const auto result = session.run({"BISECT GOOD", "BISECT GOOD"});
     EXPECT_EQ(result.exitStatus, 1);
     EXPECT_THAT(result.output, HasSubstr("This session cannot be judged: "));
@@ -139,14 +152,18 @@ TEST_F(Bisect, EndsWhenItIsStopped)
 {
     begin({write("a"), write("b")});
     EXPECT_EQ(session.run({"BISECT STOP"}).exitStatus, 0);
-    EXPECT_THAT(session.run({"VERSION"}).output, AllOf(HasSubstr("a runs"), HasSubstr("b runs"), Not(HasSubstr("BISECT"))));
+    EXPECT_THAT(session.run({"VERSION"}).output,
+                AllOf(HasSubstr("a runs"), HasSubstr("b runs"), Not(HasSubstr("BISECT"))));
 }
 
 TEST_F(Bisect, TellsWhyItDoesNotBegin)
 {
-    EXPECT_THAT(session.start({"--safe", "-c", "BISECT START"}).output,
-                HasSubstr("There is nothing to search among: no application was loaded by itself in this session.\n"));
-    EXPECT_THAT(session.run({"BISECT GOOD"}).output, HasSubstr("No search is going on; BISECT START begins one.\n"));
+    EXPECT_THAT(
+        session.start({"--safe", "-c", "BISECT START"}).output,
+        HasSubstr(
+            "There is nothing to search among: no application was loaded by itself in this session.\n"));
+    EXPECT_THAT(session.run({"BISECT GOOD"}).output,
+                HasSubstr("No search is going on; BISECT START begins one.\n"));
     EXPECT_THAT(session.run({"BISECT SIDEWAYS"}).output, HasSubstr("Usage: BISECT [START|GOOD|BAD|STOP]\n"));
 }
 
@@ -155,6 +172,7 @@ TEST_F(Bisect, TellsThatItsFileIsDamaged)
     begin({write("a"), write("b")});
     const auto file = session.folder().write(session.profile() / "applications" / "bisection", "gibberish");
     const auto result = session.run({"BISECT GOOD", "BISECT STOP", "BISECT"});
-    EXPECT_THAT(result.output, AllOf(HasSubstr("The file " + file.string() + " is damaged; "), HasSubstr("a runs"),
-                                     HasSubstr("b runs"), HasSubstr("No search is going on")));
+    EXPECT_THAT(result.output,
+                AllOf(HasSubstr("The file " + file.string() + " is damaged; "), HasSubstr("a runs"),
+                      HasSubstr("b runs"), HasSubstr("No search is going on")));
 }

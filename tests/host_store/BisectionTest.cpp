@@ -59,7 +59,8 @@ TEST(Bisection, NamesEveryCulpritInAsManyStartsAsItMay)
     for (std::size_t suspects = 1; suspects <= kMost; ++suspects)
         for (std::size_t culprit = 0; culprit < suspects; ++culprit)
         {
-            const auto course = follow(suspects, [=](const auto& loaded) { return loaded.contains(culprit); });
+            const auto course =
+                follow(suspects, [=](const auto& loaded) { return loaded.contains(culprit); });
             EXPECT_EQ(course.bisection.verdict(), Verdict::kFound) << culprit << " of " << suspects;
             EXPECT_EQ(course.bisection.culprit(), culprit) << "of " << suspects;
             EXPECT_LE(course.starts, mostStarts(suspects)) << culprit << " of " << suspects;
@@ -82,8 +83,8 @@ TEST(Bisection, SaysThatSeveralAreNeededForEveryPair)
         for (std::size_t one = 0; one < suspects; ++one)
             for (std::size_t other = one + 1; other < suspects; ++other)
             {
-                const auto course = follow(
-                    suspects, [=](const auto& loaded) { return loaded.contains(one) && loaded.contains(other); });
+                const auto course = follow(suspects, [=](const auto& loaded)
+                                           { return loaded.contains(one) && loaded.contains(other); });
                 EXPECT_EQ(course.bisection.verdict(), Verdict::kTogether)
                     << one << " and " << other << " of " << suspects;
             }
@@ -93,8 +94,7 @@ TEST(Bisection, SaysThatSeveralAreNeededWhenItTakesAll)
 {
     for (std::size_t suspects = 2; suspects <= kMost; ++suspects)
     {
-        const auto course =
-            follow(suspects, [=](const auto& loaded) { return loaded.size() == suspects; });
+        const auto course = follow(suspects, [=](const auto& loaded) { return loaded.size() == suspects; });
         EXPECT_EQ(course.bisection.verdict(), Verdict::kTogether) << suspects;
     }
 }
@@ -105,8 +105,8 @@ TEST(Bisection, FindsOneOfTwoThatMakeTheTroubleEach)
         for (std::size_t one = 0; one < suspects; ++one)
             for (std::size_t other = one + 1; other < suspects; ++other)
             {
-                const auto course = follow(
-                    suspects, [=](const auto& loaded) { return loaded.contains(one) || loaded.contains(other); });
+                const auto course = follow(suspects, [=](const auto& loaded)
+                                           { return loaded.contains(one) || loaded.contains(other); });
                 EXPECT_EQ(course.bisection.verdict(), Verdict::kFound);
                 EXPECT_TRUE(course.bisection.culprit() == one || course.bisection.culprit() == other);
             }
