@@ -31,6 +31,8 @@ public:
     Result<> check(const std::wstring& path);
     // Why the application is kept out at starts, as a part of a sentence; empty for one that is not.
     std::wstring whyKeptOut(const std::wstring& path) const;
+    // Whether this session has not loaded it by itself, or would not have.
+    bool keptOutAtStart(const std::wstring& path) const { return mSafe || !whyKeptOut(path).empty(); }
     // What was let in is loaded.
     void noteLoaded(const std::wstring& path) const;
     // The application at work has others loaded with it, now or later.

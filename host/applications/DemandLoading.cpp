@@ -79,6 +79,7 @@ bool DemandLoading::loadNamesake(std::wstring_view command) const
                                {
                                    const std::wstring path = toWide(plugIn.native());
                                    return equalIgnoringCase(toWide(plugIn.stem().native()), command) &&
+                                          mAdmission.keptOutAtStart(path) &&
                                           !mLinker.isModuleLoaded(path.c_str()) && load(path);
                                });
 }
