@@ -12,8 +12,8 @@ namespace bench
 // did not come to its end.
 double inChild(const std::function<double()>& work);
 
-// Runs this program anew with the arguments and answers the seconds that it printed; negative when it did not
-// end well.
+// Runs this program again with the arguments and answers the seconds that it printed; negative when it did
+// not end well.
 double inNewProcess(const std::vector<std::string>& arguments);
 
 // Seconds of processor time, the system's included, that the work takes of this process. Machines are shared:

@@ -21,7 +21,7 @@ namespace
 {
 constexpr std::size_t kFew = 1'000;
 constexpr std::size_t kMany = 100'000;
-constexpr int kRepetitions = 7;
+constexpr int kListRepetitions = 7;
 constexpr int kFewRepetitions = 31; // short ones are noisy
 constexpr DWORD kBufferCharacters = 1024;
 
@@ -226,7 +226,7 @@ void addLookup(const std::string& name, std::size_t count, std::size_t firstAske
                                              asked[next++ % asked.size()], *list));
                                      }
                                  })
-        ->Repetitions(kRepetitions)
+        ->Repetitions(kListRepetitions)
         ->MinTime(0.05);
 }
 
@@ -278,7 +278,7 @@ void addListBenchmarks()
 {
     bench::startHost();
     addHistory(kFew, kFewRepetitions);
-    addHistory(kMany, kRepetitions);
+    addHistory(kMany, kListRepetitions);
     addHistoryRatios("read");
     addHistoryRatios("write");
     addLookups();

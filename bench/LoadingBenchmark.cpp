@@ -20,7 +20,7 @@
 namespace
 {
 constexpr std::size_t kModules = 500;
-constexpr int kRepetitions = 15;
+constexpr int kLoadingRepetitions = 15;
 constexpr const char* kEntry = "tsrxEntryPoint";
 
 bool callEntry(void* entry)
@@ -121,7 +121,7 @@ void add(const Loader& loader, const std::string& folder)
     benchmark::RegisterBenchmark(benchmarkOf(loader.name).c_str(), run)
         ->UseManualTime()
         ->Iterations(1)
-        ->Repetitions(kRepetitions);
+        ->Repetitions(kLoadingRepetitions);
 }
 
 void addLoadingRatio(const std::string& what, const std::string& base, double most = 0)

@@ -22,7 +22,7 @@ constexpr int kFewModules = 100;
 constexpr int kManyModules = 1'000;
 constexpr int kLispFilesPerModule = 10;
 constexpr int kPaths = 1'000;
-constexpr int kRepetitions = 9;
+constexpr int kRebuildRepetitions = 9;
 
 // Whether all of them were loaded.
 bool loadModules(int count)
@@ -79,7 +79,7 @@ void addRebuild(const std::string& name, int modules)
                                  })
         ->UseManualTime()
         ->Iterations(1)
-        ->Repetitions(kRepetitions);
+        ->Repetitions(kRebuildRepetitions);
 }
 
 const std::vector<CStdStr>& existingPaths()
@@ -117,7 +117,7 @@ void addValidation(const std::string& name, Check check)
                                      if (!all)
                                          state.SkipWithError("a path is not there");
                                  })
-        ->Repetitions(kRepetitions)
+        ->Repetitions(kRebuildRepetitions)
         ->MinTime(0.05);
 }
 } // namespace

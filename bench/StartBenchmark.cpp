@@ -7,6 +7,7 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <cstdio>
 #include <functional>
 #include <string>
 #include <vector>
@@ -19,7 +20,7 @@ extern char** environ;
 
 namespace
 {
-constexpr int kRepetitions = 15;
+constexpr int kStartRepetitions = 15;
 
 double secondsOf(const timeval& time)
 {
@@ -66,7 +67,20 @@ void add(const std::string& name, const std::vector<std::string>& arguments)
                                  })
         ->UseManualTime()
         ->Iterations(1)
-        ->Repetitions(kRepetitions);
+        ->Repetitions(kStartRepetitions);
+}
+
+// A start with a long History, which Modrig reads, against the parts and as many values read bare.
+void addHistoryStart()
+{
+    const std::string count = "100000";
+    const std::string profile = profileFolder("history");
+    if (runProgram({START_PARTS, profile, MODRIG_BUNDLE, count, "fill"}) < 0)
+        std::fputs("The long History could not be stored.\n", stderr);
+    add("start: host with 100000 of History", {TESSEL_PROGRAM, "--profile-dir", profile});
+    add("start: the parts, and 100000 values bare", {START_PARTS, profile, MODRIG_BUNDLE, count});
+    bench::addRatio({"host start with 100000 of History / parts and bare values",
+                     "start: host with 100000 of History", "start: the parts, and 100000 values bare", 1.3});
 }
 } // namespace
 
@@ -77,4 +91,5 @@ void addStartBenchmarks()
     add("start: the parts, one after the other", {START_PARTS, profileFolder("parts"), MODRIG_BUNDLE});
     bench::addRatio({"host start to prompt / sum of its parts", "start: host to prompt",
                      "start: the parts, one after the other", 1.3});
+    addHistoryStart();
 }

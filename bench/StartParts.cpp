@@ -1,7 +1,14 @@
 // What the host cannot start without, one part after the other and nothing else: the registry, Lisp, and the
 // Modrig bundle mapped by the platform. Linked with the host's objects, since its library hides its parts.
+// With a number after the folders it also reads so many values of the History, one after the other, by the
+// calls of the SDK; with "fill" after that it stores them first, and does nothing else.
+#include <wincompat/winreg.h>
+
 #include <cstdio>
+#include <cstdlib>
+#include <cstring>
 #include <filesystem>
+#include <string>
 
 #include "host/applications/Document.h"
 #include "host/applications/ModuleLibrary.h"
@@ -10,20 +17,63 @@
 #include "host/registry/Profiles.h"
 #include "host/registry/Registry.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Running.h"
 #include "host/text/Version.h"
+
+namespace
+{
+constexpr wchar_t kHistory[] = L"Software\\Tessel\\R21\\Profiles\\Default\\Dialogs\\Modrig\\History";
+constexpr DWORD kDataCharacters = 1024;
+
+std::wstring entryName(long number)
+{
+    return std::to_wstring(number) + L"History";
+}
+
+bool fill(tessel::Registry& registry, long count)
+{
+    bool written = static_cast<bool>(registry.write(kHistory, L"NumHistory", std::to_wstring(count)));
+    for (long number = 1; number <= count; ++number)
+        written = registry.write(kHistory, entryName(number),
+                                 L"/home/user/Applications/library" + std::to_wstring(number / 100) +
+                                     L"/tool" + std::to_wstring(number) + L".lsp") &&
+                  written;
+    return registry.endOfCommand() && written;
+}
+
+bool readAll(long count)
+{
+    bool all = true;
+    for (long number = 1; number <= count; ++number)
+    {
+        HKEY key = nullptr;
+        wchar_t data[kDataCharacters];
+        DWORD size = sizeof data;
+        all = RegOpenKeyExW(HKEY_CURRENT_USER, kHistory, 0, KEY_READ, &key) == ERROR_SUCCESS &&
+              tsRegGetValue(key, entryName(number).c_str(), 0, nullptr, data, &size) == ERROR_SUCCESS && all;
+        RegCloseKey(key);
+    }
+    return all;
+}
+} // namespace
 
 int main(int argc, char** argv)
 {
-    if (argc != 3)
+    if (argc < 3 || argc > 5)
     {
-        std::fputs("usage: bench_start_parts PROFILE-FOLDER BUNDLE\n", stderr);
+        std::fputs("usage: bench_start_parts PROFILE-FOLDER BUNDLE [COUNT [fill]]\n", stderr);
         return 2;
     }
+    const long count = argc > 3 ? std::atol(argv[3]) : 0;
     std::filesystem::create_directories(argv[1]);
     tessel::CommandLine commandLine([](std::string_view) {});
-    tessel::Registry registry(std::filesystem::path(argv[1]) / "registry.db");
-    const tessel::Profiles profiles(registry, tessel::kProductRegistryRoot);
-    if (!registry.endOfCommand())
+    tessel::Owned<tessel::Registry> registry(std::filesystem::path(argv[1]) / "registry.db");
+    const tessel::Profiles profiles(*registry, tessel::kProductRegistryRoot);
+    if (!registry->endOfCommand())
+        return 1;
+    if (argc > 4)
+        return std::strcmp(argv[4], "fill") == 0 && fill(*registry, count) ? 0 : 1;
+    if (!readAll(count))
         return 1;
     tessel::Document document;
     const tessel::EndRequest endRequest;

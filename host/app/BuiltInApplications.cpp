@@ -1,6 +1,10 @@
 // LOAD, UNLOAD, APPS: applications without the dialog.
 #include <algorithm>
 #include <array>
+#include <chrono>
+#include <iomanip>
+#include <limits>
+#include <sstream>
 
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
@@ -13,6 +17,7 @@ namespace
 constexpr wchar_t kApplicationsGroup[] = L"Applications";
 constexpr std::size_t kNameColumn = 24;
 constexpr std::size_t kFolderColumn = 48;
+constexpr std::size_t kAnyLength = std::numeric_limits<std::size_t>::max();
 constexpr std::array kLispExtensions = {L".lsp", L".qbc"};
 
 bool isLispFile(const std::wstring& path)
@@ -41,11 +46,23 @@ Result<> loadLisp(Parts& parts, const std::wstring& path)
     return value ? succeed(parts, path + L" is loaded.") : value.failure();
 }
 
+// The file to load; that of an address is fetched first.
+Result<std::wstring> localFile(Parts& parts, const std::wstring& typed)
+{
+    if (!parts.information->isUrl(typed.c_str()))
+        return fullPath(parts, typed);
+    const auto copy = parts.remote->fetch(typed, kAnyLength, false);
+    return copy ? Result<std::wstring>(copy->path) : copy.failure();
+}
+
 Result<> load(Parts& parts, const CommandStack::Arguments& arguments)
 {
     if (arguments.size() != 1)
         return wrongUsage(parts, L"LOAD");
-    const std::wstring path = fullPath(parts, arguments.front());
+    const auto file = localFile(parts, arguments.front());
+    if (!file)
+        return file.failure();
+    const std::wstring& path = *file;
     if (isLispFile(path))
         return loadLisp(parts, path);
     if (!parts.linker->loadModule(path.c_str(), true, true))
@@ -75,28 +92,76 @@ void sayApplication(Parts& parts, const std::wstring& path, const std::wstring& 
                        padded(toText(file.parent_path()), kFolderColumn) + L" " + state);
 }
 
+// "0.4 ms", "37 ms", "2.1 s".
+std::wstring duration(std::chrono::microseconds time)
+{
+    using Milliseconds = std::chrono::duration<double, std::milli>;
+    constexpr Milliseconds kWithoutTenths{10};
+    constexpr Milliseconds kSecond{1000};
+    const Milliseconds milliseconds = time;
+    std::wostringstream text;
+    text << std::fixed << std::setprecision(milliseconds < kWithoutTenths || milliseconds >= kSecond ? 1 : 0);
+    if (milliseconds < kSecond)
+        text << milliseconds.count() << L" ms";
+    else
+        text << milliseconds / kSecond << L" s";
+    return text.str();
+}
+
+std::wstring withTime(const Parts& parts, const std::wstring& path, const std::wstring& state)
+{
+    const LoadOutcome* outcome = parts.loadOutcomes.of(path);
+    return outcome && outcome->loaded ? state + L", loaded in " + duration(outcome->took) : state;
+}
+
+void sayNotLoaded(Parts& parts)
+{
+    const auto failed = parts.loadOutcomes.failed();
+    if (!failed.empty())
+        sayLine(parts, L"Not loaded in this session:");
+    for (const LoadOutcome& outcome : failed)
+        sayApplication(parts, outcome.path, outcome.loaded.sentence());
+}
+
+// What was asked for in vain stands among those that were not loaded, with the same reason.
+void sayKeptOut(Parts& parts)
+{
+    for (const auto& application : parts.keptOut.all())
+    {
+        const std::wstring path = toWide(application.path);
+        const LoadOutcome* outcome = parts.loadOutcomes.of(path);
+        if (application.isOut() && (!outcome || outcome->loaded))
+            sayApplication(parts, path, reasonOf(application));
+    }
+}
+
 Result<> listApplications(Parts& parts, const CommandStack::Arguments&)
 {
     const auto modules = parts.linker->loadedModules();
     for (const auto& module : modules)
-        sayApplication(parts, module.path, module.locked ? L"locked" : L"may be unloaded");
+        sayApplication(parts, module.path,
+                       withTime(parts, module.path, module.locked ? L"locked" : L"may be unloaded"));
     const int lispFiles = parts.document->loadedApplicationCount();
     for (int index = 0; index < lispFiles; ++index)
-        sayApplication(parts, parts.document->loadedApplicationName(index), L"Lisp");
+    {
+        const std::wstring path = parts.document->loadedApplicationName(index);
+        sayApplication(parts, path, withTime(parts, path, L"Lisp"));
+    }
     if (modules.empty() && lispFiles == 0)
         sayLine(parts, L"No application is loaded.");
-    for (const auto& application : parts.keptOut.all())
-        if (application.isOut())
-            sayApplication(parts, toWide(application.path), reasonOf(application));
+    sayKeptOut(parts);
+    sayNotLoaded(parts);
     return {};
 }
 } // namespace
 
 void addApplicationCommands(Parts& parts)
 {
-    addBuiltIn(parts, {kApplicationsGroup, L"LOAD", L"file", L"Loads a compiled module or a Lisp file"},
+    addBuiltIn(parts,
+               {kApplicationsGroup, L"LOAD", L"file or address", L"Loads a compiled module or a Lisp file"},
                load);
     addBuiltIn(parts, {kApplicationsGroup, L"UNLOAD", L"file", L"Unloads a compiled module"}, unload);
-    addBuiltIn(parts, {kApplicationsGroup, L"APPS", L"", L"Lists what is loaded"}, listApplications);
+    addBuiltIn(parts, {kApplicationsGroup, L"APPS", L"", L"Lists what is loaded, and what could not be"},
+               listApplications);
 }
 } // namespace tessel

@@ -81,6 +81,13 @@ Result<> remove(Parts& parts, const std::wstring& path, const Arguments& argumen
     return done ? done : failureAt(path, writeReason(registry, done));
 }
 
+// What is damaged gives way to the copy of what it held.
+Result<> restore(Parts& parts)
+{
+    const auto restored = parts.registry->restoreCopy();
+    return restored ? succeed(parts, *restored) : restored.failure();
+}
+
 Result<> registryCommand(Parts& parts, const Arguments& arguments)
 {
     const std::wstring action = at(arguments, 0);
@@ -93,6 +100,8 @@ Result<> registryCommand(Parts& parts, const Arguments& arguments)
         return set(parts, path, arguments);
     if (equalIgnoringCase(action, L"DELETE") && (arguments.size() == 2 || arguments.size() == 3))
         return remove(parts, path, arguments);
+    if (equalIgnoringCase(action, L"RESTORE") && arguments.size() == 1)
+        return restore(parts);
     return wrongUsage(parts, kCommand);
 }
 } // namespace
@@ -100,8 +109,8 @@ Result<> registryCommand(Parts& parts, const Arguments& arguments)
 void addRegistryCommands(Parts& parts)
 {
     addBuiltIn(parts,
-               {L"Settings", kCommand, L"LIST|GET|SET|DELETE key [name] [data]",
-                L"Works on the registry, below HKEY_CURRENT_USER"},
+               {L"Settings", kCommand, L"LIST|GET|SET|DELETE key [name] [data] | RESTORE",
+                L"Works on the registry, below HKEY_CURRENT_USER; puts back the copy of a damaged one"},
                registryCommand);
 }
 } // namespace tessel

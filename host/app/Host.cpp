@@ -5,9 +5,11 @@
 
 #include "host/app/BuiltIn.h"
 #include "host/app/Parts.h"
+#include "host/applications/StartSummary.h"
 #include "host/console/Console.h"
 #include "host/messages/WindowBox.h"
 #include "host/platform/AutoreleasePool.h"
+#include "host/platform/PrivateFolder.h"
 #include "host/platform/ToolkitPlaces.h"
 
 namespace tessel
@@ -46,13 +48,16 @@ Host::~Host()
 bool Host::start()
 {
     const AutoreleasePool pool;
+    const Interruption::Work work(mInterruption);
     if (!mCommandLine.tell(makeParts()))
         return false;
     judgeEarlierSessions();
     const RunningMarker::ReasonScope atStart(*mParts->marker, RunningMarker::Reason::kAtStart);
+    mParts->messageBox->collect();
     if (!mOptions.safe)
         mParts->demandLoading.loadAtStart();
     finishLine();
+    tellOfStart();
     return true;
 }
 
@@ -67,20 +72,33 @@ void Host::judgeEarlierSessions()
         mCommandLine.say(line);
 }
 
+void Host::tellOfStart()
+{
+    const auto boxes = mParts->messageBox->takeCollected();
+    noteRefusedFiles(boxes, mParts->loadOutcomes);
+    if (const auto summary = summarize(mParts->loadOutcomes.failed(), boxes))
+        mParts->messageBox->show(summary->box, summary->lines, !summary->fits);
+}
+
 Result<> Host::makeParts()
 {
     if (running<CommandLine>())
         return Failure{L"Another session runs in this process already."};
     if (auto prepared = prepareProfileFolder(); !prepared)
         return prepared;
+    tellWhoElseWritesTheProfile();
     // The applications that are loaded next may bring Objective-C along.
     static_cast<void>(keepToolkitFilesIn(mOptions.profileFolder / kToolkitFolder));
-    mParts = std::make_unique<Parts>(
-        Foundations{mCommandLine, mEndRequest, mOptions.profileFolder, mOptions.downloads, mOptions.safe});
+    mParts = std::make_unique<Parts>(Foundations{mCommandLine, mEndRequest, mInterruption,
+                                                 mOptions.profileFolder, mOptions.downloads, mOptions.safe});
     mCommandLine.tell(mParts->registry->canStore());
+    if (const std::wstring& notice = mParts->registry->notice(); !notice.empty())
+        mCommandLine.say(notice);
     if (const Outcome& started = mParts->startedLisp; !started)
         return started.failure();
     mInterruptible = &mParts->lisp();
+    mParts->registry->tellProgressBy([this](const std::wstring& sentence) { mCommandLine.say(sentence); });
+    mInterruptibleRegistry = &*mParts->registry;
     mParts->messageBox->setPresenter(quietWhenSafe(windowBoxes(mParts->layout.binaries), mParts->admission));
     addCommands();
     return {};
@@ -91,14 +109,24 @@ Result<> Host::prepareProfileFolder()
     if (mOptions.profileFolder.empty())
         return Failure{
             L"Tessel does not know where to keep its profile: HOME is not set, and no folder was given."};
+    const auto failed = [this](const std::wstring& reason)
+    {
+        return Failure{L"The profile folder " + wideText(mOptions.profileFolder) + L" cannot be made: " +
+                       reason + L"."};
+    };
+    if (const auto made = makePrivateFolder(mOptions.profileFolder); !made)
+        return failed(made.sentence());
     std::error_code error;
-    std::filesystem::create_directories(mOptions.profileFolder, error);
-    if (!error)
-        mOptions.profileFolder = std::filesystem::canonical(mOptions.profileFolder, error);
-    if (!error)
-        return {};
-    return Failure{L"The profile folder " + wideText(mOptions.profileFolder) + L" cannot be made: " +
-                   toWide(error.message()) + L"."};
+    mOptions.profileFolder = std::filesystem::canonical(mOptions.profileFolder, error);
+    return error ? failed(toWide(error.message())) : Result<>();
+}
+
+// What stands in the profile decides which programs run.
+void Host::tellWhoElseWritesTheProfile()
+{
+    if (const auto checked = checkNobodyElseWrites(mOptions.profileFolder); !checked)
+        mCommandLine.say(L"The profile folder " + wideText(mOptions.profileFolder) + L" is not safe: " +
+                         checked.sentence() + L", and so could change what Tessel loads.");
 }
 
 void Host::addCommands()
@@ -120,6 +148,7 @@ void Host::addCommands()
 bool Host::run(const std::wstring& input)
 {
     const AutoreleasePool pool;
+    const Interruption::Work work(mInterruption);
     if (!isLisp(input))
         return mParts->commands->run(input);
     const auto value = mParts->lisp().evaluate(input);
@@ -152,26 +181,35 @@ void Host::end()
     if (!mParts)
         return;
     const AutoreleasePool pool;
+    const Interruption::Work work(mInterruption);
     // A Lisp file may have left its prompt standing; what applications say at the end is not part of it.
     if (!mCommandLine.atLineStart())
         mCommandLine.print(L"\n");
     mParts->linker->unloadAll();
     mParts->keptOut.noteGoodEnd();
     mCommandLine.tell(mParts->registry->endOfCommand());
+    mCommandLine.tell(mParts->registry->keepCopy());
     mInterruptible = nullptr;
+    mInterruptibleRegistry = nullptr;
     mParts.reset();
 }
 
-void Host::interrupt() noexcept
+bool Host::interrupt() noexcept
 {
-    if (LispInterpreter* lisp = mInterruptible)
+    LispInterpreter* lisp = mInterruptible;
+    if (lisp)
         lisp->interrupt();
+    if (Registry* registry = mInterruptibleRegistry)
+        registry->interrupt();
+    return mInterruption.press(lisp ? lisp->evaluations() : 0);
 }
 
+// The registry goes on: what an end in good order stores may be much.
 void Host::requestEnd() noexcept
 {
     mEndRequest.make();
-    interrupt();
+    if (LispInterpreter* lisp = mInterruptible)
+        lisp->interrupt();
 }
 
 std::vector<std::wstring> Host::commandNames() const

@@ -22,6 +22,7 @@
 
 #include "host/app/Export.h"
 #include "host/commands/EndRequest.h"
+#include "host/commands/Interruption.h"
 #include "host/console/LineRunner.h"
 #include "host/files/RemoteFiles.h"
 #include "host/text/CommandLine.h"
@@ -29,6 +30,7 @@
 namespace tessel
 {
 class LispInterpreter;
+class Registry;
 struct Parts;
 
 struct HostOptions
@@ -62,7 +64,7 @@ public:
     void end();
 
     bool isEnding() const override { return mEndRequest.isMade(); }
-    void interrupt() noexcept override;
+    bool interrupt() noexcept override;
     void requestEnd() noexcept override;
 
     // Can be read from when the session is to end (see EndRequest).
@@ -77,14 +79,18 @@ private:
     Result<> makeParts();
     Result<> prepareProfileFolder();
     void judgeEarlierSessions();
+    void tellWhoElseWritesTheProfile();
+    void tellOfStart();
     void addCommands();
     bool finishLine();
 
     HostOptions mOptions;
     CommandLine mCommandLine;
     std::unique_ptr<Parts> mParts;
-    std::atomic<LispInterpreter*> mInterruptible = nullptr; // read by a signal handler
+    std::atomic<LispInterpreter*> mInterruptible = nullptr; // read by a signal handler, as the next
+    std::atomic<Registry*> mInterruptibleRegistry = nullptr;
     EndRequest mEndRequest;
+    Interruption mInterruption{mEndRequest};
     int mScriptDepth = 0;
 };
 } // namespace tessel

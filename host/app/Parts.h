@@ -17,9 +17,11 @@
 #include "host/applications/DynamicLinker.h"
 #include "host/applications/KeptOut.h"
 #include "host/applications/KeptOutService.h"
+#include "host/applications/LoadOutcomes.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
 #include "host/commands/EndRequest.h"
+#include "host/commands/Interruption.h"
 #include "host/files/FileSearch.h"
 #include "host/files/RemoteFiles.h"
 #include "host/lisp/LispInterpreter.h"
@@ -45,6 +47,7 @@ struct Foundations
 {
     CommandLine& commandLine;
     EndRequest& endRequest;
+    Interruption& interruption;
     const std::filesystem::path& profileFolder; // is there
     const RemoteFiles::Limits& downloads;
     bool safe; // load nothing by itself
@@ -72,19 +75,24 @@ struct Parts
     Owned<CommandStack> commands{*commandLine, *callingApplication};
     Owned<ResourceModules> resources{toWide(layout.resources.string()), *callingApplication};
     Owned<MessageBox> messageBox{*commandLine};
-    Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands, *messageBox, admission};
+    LoadOutcomes loadOutcomes;
+    Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands,
+                                *messageBox,  loadOutcomes,        admission};
     Owned<ApplicationRecords> records{*registry, *commands, *callingApplication, kProductRegistryRoot};
     DemandLoading demandLoading{layout.plugIns, *records, *linker, admission};
     Owned<Document> document;
     Owned<FileSearch> files{layout.resources, *variables};
-    Owned<RemoteFiles> remote{foundations.profileFolder / "remote-files", foundations.downloads};
+    Owned<RemoteFiles> remote{foundations.profileFolder / "remote-files", foundations.downloads,
+                              foundations.interruption};
     Owned<HostInformation> information{toWide(foundations.profileFolder.string()), *remote, *commandLine};
     Owned<Help> help{layout.resources / "help", openInBrowser};
     // Publishes itself. The variable is read here, before any application is loaded, and holds for the
     // session.
-    Result<std::unique_ptr<LispInterpreter>> startedLisp = LispInterpreter::start(
-        {.removingTsLisp = variables->number(kRemovingTsLisp) != 0, .admission = &admission}, *commandLine,
-        *document, *endRequest);
+    Result<std::unique_ptr<LispInterpreter>> startedLisp =
+        LispInterpreter::start({.removingTsLisp = variables->number(kRemovingTsLisp) != 0,
+                                .outcomes = &loadOutcomes,
+                                .admission = &admission},
+                               *commandLine, *document, *endRequest);
 
     // Only of parts whose Lisp has started.
     LispInterpreter& lisp() const { return **startedLisp; }

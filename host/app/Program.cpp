@@ -18,7 +18,10 @@
 #include "host/console/InterruptKey.h"
 #include "host/console/LineEditor.h"
 #include "host/console/PipedInput.h"
+#include "host/console/StandardOutput.h"
+#include "host/console/TypedHistory.h"
 #include "host/platform/LastWords.h"
+#include "host/text/TerminalText.h"
 #include "host/text/Unicode.h"
 #include "host/text/Version.h"
 
@@ -47,12 +50,6 @@ void surviveFailingWrites()
     std::signal(SIGXFSZ, SIG_IGN);
 }
 
-void writeToStandardOutput(std::string_view text)
-{
-    std::fwrite(text.data(), 1, text.size(), stdout);
-    std::fflush(stdout);
-}
-
 void greet(CommandLine& commandLine)
 {
     commandLine.say(toWide(kVersionLine) + L". Type HELP for the list of commands, QUIT to leave.");
@@ -69,9 +66,12 @@ int runBatch(Host& host, const Options& options)
 
 int converse(Host& host, const std::filesystem::path& profileFolder, InputSource source)
 {
+    TypedHistory history(profileFolder / kHistoryFile);
+    const auto earlier = history.read();
     LineEditor editor(
-        profileFolder / kHistoryFile, [&host] { return host.commandNames(); }, source);
-    Console(host.commandLine(), host).converse(editor);
+        host.commandLine().tell(earlier) ? *earlier : std::vector<std::wstring>(),
+        [&host] { return host.commandNames(); }, source);
+    Console(host.commandLine(), host).converse(editor, history);
     return kAllWell;
 }
 
@@ -87,12 +87,16 @@ int runSession(Host& host, const Options& options, const InterruptKey& interrupt
     return Console(host.commandLine(), host).runLines(lines) ? kAllWell : kSomethingFailed;
 }
 
-int runHost(Options options)
+int runHost(Options options, StandardOutput& output)
 {
     if (options.profileFolder.empty())
         options.profileFolder = personalFolder();
     const LastWords lastWords; // before Lisp takes a signal of them
-    Host host({options.profileFolder, options.safe, writeToStandardOutput});
+    Host host({options.profileFolder, options.safe,
+               [&output](std::string_view text)
+               {
+                   output.write(text);
+               }});
     const InterruptKey interruptKey(host); // applications that load at start may run away too
     const EndSignals endSignals(host);
     greet(host.commandLine());
@@ -109,9 +113,17 @@ int runProgram(int count, const char* const* arguments)
     useUtf8();
     surviveFailingWrites();
     const auto parsed = parseOptions(count, arguments);
+    StandardOutput output;
+    int status = parsed.exitStatus;
     if (parsed.options)
-        return runHost(*parsed.options);
-    std::fputs(parsed.text.c_str(), parsed.exitStatus == kAllWell ? stdout : stderr);
-    return parsed.exitStatus;
+        status = runHost(*parsed.options, output);
+    else if (status == kAllWell)
+        output.write(parsed.text);
+    else // it repeats arguments that anybody may have made up
+        std::fputs(toUtf8(forTerminal(toWide(parsed.text))).c_str(), stderr);
+    if (output.isWhole())
+        return status;
+    std::fprintf(stderr, "Tessel: some of the output could not be written: %s.\n", output.whyNot());
+    return status == kAllWell ? kSomethingFailed : status;
 }
 } // namespace tessel

@@ -1,17 +1,17 @@
 #include "host/applications/DynamicLinker.h"
 
 #include <algorithm>
-#include <exception>
 #include <filesystem>
 #include <ranges>
 #include <utility>
 
 #include "host/applications/Admission.h"
+#include "host/applications/ExceptionGuard.h"
 #include "host/applications/ImageCheck.h"
+#include "host/applications/LoadOutcomes.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
 #include "host/messages/MessageBox.h"
-#include "host/platform/ObjectiveCGuard.h"
 #include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
 
@@ -68,9 +68,9 @@ RegularFile programOf(const Result<ModuleFile>& file)
 } // namespace
 
 DynamicLinker::DynamicLinker(CommandLine& commandLine, CallingApplication& calls, CommandStack& commands,
-                             MessageBox& messageBox, Admission& admission)
+                             MessageBox& messageBox, LoadOutcomes& outcomes, Admission& admission)
     : mCommandLine(commandLine), mCalls(calls), mCommands(commands), mMessageBox(messageBox),
-      mAdmission(admission)
+      mOutcomes(outcomes), mAdmission(admission)
 {
 }
 
@@ -85,7 +85,12 @@ bool DynamicLinker::registerApplication(void* application)
 bool DynamicLinker::loadModule(const wchar_t* path, bool sayWhyNot, bool resolveNow)
 {
     const std::wstring fullPath = fullPathOf(path);
+    const bool wasKnown = mModules.withPath(fullPath) != nullptr;
+    const auto begun = LoadOutcomes::Clock::now();
     const auto loaded = load(fullPath, resolveNow);
+    // By a link to what is there already nothing is loaded.
+    if (!loaded || (!wasKnown && mModules.withPath(fullPath)))
+        mOutcomes.note(fullPath, loaded, begun);
     if (loaded)
         return true;
     mMessageBox.explain(fullPath, loaded.sentence() + L".");
@@ -119,7 +124,13 @@ Result<> DynamicLinker::loadNew(const std::wstring& path, bool resolveNow)
         return file.failure();
     if (auto loadable = checkLoadable(program); !loadable)
         return loadable;
-    auto opened = open(*file, resolveNow);
+    if (mHalfMapped.contains(program.identity()))
+        return Failure{
+            L"it threw an exception before while it was being mapped, and what is in memory of it since "
+            L"cannot be used"};
+    auto opened = open(*file, program, resolveNow);
+    if (opened.code() == ModuleLibrary::kThrew)
+        mHalfMapped.insert(program.identity());
     if (!opened)
         return opened.failure();
     std::unique_ptr<Module> module = *std::move(opened);
@@ -130,14 +141,20 @@ Result<> DynamicLinker::loadNew(const std::wstring& path, bool resolveNow)
     return start(mModules.add(std::move(module)));
 }
 
-// Constructors may load others; nobody has asked for those by name.
-Result<std::unique_ptr<Module>> DynamicLinker::open(const ModuleFile& file, bool resolveNow) const
+// The path may have come to lead to another file since the program was checked, or the system may hold an
+// earlier file of that path. Constructors may load others; nobody has asked for those by name.
+Result<std::unique_ptr<Module>> DynamicLinker::open(const ModuleFile& file, const RegularFile& program,
+                                                    bool resolveNow) const
 {
     const RunningMarker::Scope loading(mCalls.marker(), RunningMarker::Deed::kLoading, file.path);
     const RunningMarker::ReasonScope forIt(mCalls.marker(), RunningMarker::Reason::kForAnother);
     auto library = ModuleLibrary::open(file, resolveNow);
     if (!library)
         return library.failure();
+    if (!(*library)->isFrom(program))
+        return Failure{(*library)->close()
+                           ? L"its file was replaced while it was being loaded"
+                           : L"the code of another file is in memory in its place, until the session ends"};
     auto module = std::make_unique<Module>();
     module->library = *std::move(library);
     module->entryPoint = module->library->entryPoint();
@@ -169,22 +186,9 @@ Result<> DynamicLinker::send(Module& module, unsigned message) const
                                             message == TSRX_MSG_UNLOAD ? RunningMarker::Deed::kUnloading
                                                                        : RunningMarker::Deed::kEntryPoint);
     const RunningMarker::ReasonScope forIt(mCalls.marker(), RunningMarker::Reason::kForAnother);
-    constexpr wchar_t kThrew[] = L"its entry point threw an exception: ";
     int answer = TSRX_RET_OK;
-    try
-    {
-        const auto returned = catchObjectiveC([&] { answer = module.entryPoint(message, &module); });
-        if (!returned)
-            return Failure{kThrew + returned.sentence()};
-    }
-    catch (const std::exception& error)
-    {
-        return Failure{kThrew + toWide(error.what())};
-    }
-    catch (...)
-    {
-        return Failure{L"its entry point threw something that is not an error of the standard library"};
-    }
+    if (const auto returned = catchAnything([&] { answer = module.entryPoint(message, &module); }); !returned)
+        return Failure{L"its entry point threw " + returned.sentence()};
     if (answer != TSRX_RET_OK)
         return Failure{L"its entry point answered " + std::to_wstring(answer)};
     return {};

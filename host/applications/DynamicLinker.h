@@ -11,6 +11,7 @@
 #pragma once
 
 #include <optional>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -24,6 +25,7 @@ class Admission;
 class CallingApplication;
 class CommandLine;
 class CommandStack;
+class LoadOutcomes;
 class MessageBox;
 
 class DynamicLinker : public TsRxDynamicLinker
@@ -37,10 +39,10 @@ public:
     };
 
     // Says on the command line why something failed, tells `calls` whose entry point runs, takes the commands
-    // of what goes out of `commands`, and gives the message box its detail.
-    // Loads what `admission` does not refuse.
+    // of what goes out of `commands`, gives the message box its detail, and notes how loading came off. Loads
+    // what `admission` does not refuse.
     DynamicLinker(CommandLine& commandLine, CallingApplication& calls, CommandStack& commands,
-                  MessageBox& messageBox, Admission& admission);
+                  MessageBox& messageBox, LoadOutcomes& outcomes, Admission& admission);
 
     bool registerApplication(void* application) override;
     bool loadModule(const wchar_t* path, bool sayWhyNot, bool resolveNow) override;
@@ -66,7 +68,8 @@ private:
     // What these say of a failure is the end of a sentence.
     Result<> load(const std::wstring& path, bool resolveNow);
     Result<> loadNew(const std::wstring& path, bool resolveNow);
-    Result<std::unique_ptr<Module>> open(const ModuleFile& file, bool resolveNow) const;
+    Result<std::unique_ptr<Module>> open(const ModuleFile& file, const RegularFile& program,
+                                         bool resolveNow) const;
     Result<> answerForKnown(const Module& module) const;
     Result<> start(Module& module);
     Result<> unload(Module* module);
@@ -82,8 +85,12 @@ private:
     CallingApplication& mCalls;
     CommandStack& mCommands;
     MessageBox& mMessageBox;
+    LoadOutcomes& mOutcomes;
     Admission& mAdmission;
     LoadedModules mModules;
+    // Libraries that threw while they were being mapped. The system keeps them, and would not make their
+    // variables at another attempt.
+    std::set<FileIdentity> mHalfMapped;
     bool mEnding = false;
 };
 } // namespace tessel

@@ -4,6 +4,9 @@
 
 #include <dlfcn.h>
 
+#include "host/applications/ExceptionGuard.h"
+#include "host/applications/LinkersWords.h"
+#include "host/applications/platform/MappedImage.h"
 #include "host/applications/platform/ObjectiveCRuntime.h"
 #include "host/platform/Bundle.h"
 #include "host/text/Unicode.h"
@@ -20,12 +23,22 @@ std::wstring linkersWords(const std::string& program)
     const char* error = dlerror();
     std::string words = error ? error : "the system does not say why";
     const std::string start = program + ": ";
-    return toWide(words.starts_with(start) ? words.substr(start.size()) : words);
+    return toWide(withReadableSymbols(words.starts_with(start) ? words.substr(start.size()) : words));
 }
+
+// The headers promise that these never throw, and the compiler believes them; but the code that they call
+// may. What it cannot see through it calls with care.
+void* (*volatile const openLibrary)(const char* path, int mode) = dlopen;
+int (*volatile const closeLibrary)(void* library) = dlclose;
 
 void* map(const std::string& program, bool resolveNow)
 {
-    return dlopen(program.c_str(), (resolveNow ? RTLD_NOW : RTLD_LAZY) | RTLD_LOCAL);
+    return openLibrary(program.c_str(), (resolveNow ? RTLD_NOW : RTLD_LAZY) | RTLD_LOCAL);
+}
+
+Failure threwInMapping(const std::wstring& what)
+{
+    return {L"while it was being mapped, its code threw " + what, ModuleLibrary::kThrew};
 }
 
 // A handle of its own for a library that is mapped, or null.
@@ -60,6 +73,13 @@ ModuleLibrary::ModuleLibrary(ModuleFile file, void* handle, bool byPlatform)
 
 Result<std::unique_ptr<ModuleLibrary>> ModuleLibrary::open(const ModuleFile& file, bool resolveNow)
 {
+    Result<std::unique_ptr<ModuleLibrary>> library = Failure{};
+    const auto returned = catchAnything([&] { library = openUnguarded(file, resolveNow); });
+    return returned ? std::move(library) : threwInMapping(returned.sentence());
+}
+
+Result<std::unique_ptr<ModuleLibrary>> ModuleLibrary::openUnguarded(const ModuleFile& file, bool resolveNow)
+{
     if (file.isBundle && needsBundleLoading(file.program))
         return openBundle(file, resolveNow);
     if (void* handle = map(file.program, resolveNow))
@@ -69,14 +89,25 @@ Result<std::unique_ptr<ModuleLibrary>> ModuleLibrary::open(const ModuleFile& fil
 
 Result<std::unique_ptr<ModuleLibrary>> ModuleLibrary::openBundle(const ModuleFile& file, bool resolveNow)
 {
-    void* handle = loadBundle(file.path) ? mappedLibrary(file.program) : nullptr;
+    const auto loaded = loadBundle(file.path);
+    // Where the platform keeps the reason to itself, the system's linker has the same one.
+    if (loaded.code() == kBundleNotAccepted && !map(file.program, true))
+        return Failure{linkersWords(file.program)};
+    if (loaded.code() == kBundleRaised)
+        return threwInMapping(L"an exception: " + loaded.sentence());
+    if (!loaded)
+        return loaded.failure();
+    void* handle = mappedLibrary(file.program);
     if (!handle)
-        // The platform keeps the reason to itself; the system's linker has the same one.
-        return Failure{map(file.program, true) ? L"the platform does not accept it as a bundle"
-                                               : linkersWords(file.program)};
+        return Failure{L"the platform has loaded another program in its place"};
     if (const std::string missing = resolveNow ? firstUnresolvedFunction(handle) : ""; !missing.empty())
-        return Failure{L"undefined symbol: " + toWide(missing)};
+        return Failure{L"undefined symbol: " + toWide(withReadableSymbols(missing))};
     return std::unique_ptr<ModuleLibrary>(new ModuleLibrary(file, handle, true));
+}
+
+bool ModuleLibrary::isFrom(const RegularFile& program) const
+{
+    return isMappedFrom(mHandle, program.descriptor()) && program.keepsItsSize();
 }
 
 TsRxEntryPoint ModuleLibrary::entryPoint() const
@@ -86,10 +117,11 @@ TsRxEntryPoint ModuleLibrary::entryPoint() const
 
 bool ModuleLibrary::close()
 {
-    if (mByPlatform)
-        unloadBundle(mFile.path);
-    if (mustStayMapped(mHandle))
+    const bool released = !mByPlatform || unloadBundle(mFile.path);
+    if (!released || mustStayMapped(mHandle))
         return false;
-    return dlclose(mHandle) == 0 && !isMapped(mFile.program);
+    bool closed = false;
+    const auto returned = catchAnything([&] { closed = closeLibrary(mHandle) == 0; });
+    return returned && closed && !isMapped(mFile.program);
 }
 } // namespace tessel

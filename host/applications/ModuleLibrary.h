@@ -6,6 +6,7 @@
 
 #include <tessel/tsrx.h>
 
+#include "host/platform/RegularFile.h"
 #include "host/text/Result.h"
 
 namespace tessel
@@ -26,12 +27,21 @@ class ModuleLibrary
 public:
     // Maps the file, which has been checked. Why the system refuses is the end of a sentence, in its own
     // words.
+    //
+    // Variables that are made and classes that are loaded on the way may throw, which has a code of its own:
+    // the library then stays in memory, half made. The system's linker is also left with its lock on this
+    // thread, so that another thread that wants something from it waits to the end of the session.
+    static constexpr int kThrew = 2;
     static Result<std::unique_ptr<ModuleLibrary>> open(const ModuleFile& file, bool resolveNow);
 
     // Leaves the library mapped.
     ~ModuleLibrary() = default;
     ModuleLibrary(const ModuleLibrary&) = delete;
     ModuleLibrary& operator=(const ModuleLibrary&) = delete;
+
+    // Whether this is the file's code that is in memory, and the file is as long as it was when it was
+    // opened.
+    bool isFrom(const RegularFile& program) const;
 
     // Null when the library has none.
     TsRxEntryPoint entryPoint() const;
@@ -41,6 +51,7 @@ public:
 
 private:
     ModuleLibrary(ModuleFile file, void* handle, bool byPlatform);
+    static Result<std::unique_ptr<ModuleLibrary>> openUnguarded(const ModuleFile& file, bool resolveNow);
     static Result<std::unique_ptr<ModuleLibrary>> openBundle(const ModuleFile& file, bool resolveNow);
 
     ModuleFile mFile;

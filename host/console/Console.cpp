@@ -1,20 +1,26 @@
 #include "host/console/Console.h"
 
-#include <cerrno>
-#include <cstring>
-#include <fstream>
+#include <cstdint>
 #include <sstream>
+#include <utility>
 
 #include "host/console/LineEditor.h"
+#include "host/console/TypedHistory.h"
+#include "host/platform/OrdinaryFile.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
 {
+namespace
+{
+constexpr std::uintmax_t kLargestScript = std::uintmax_t{32} << 20;
+}
+
 Console::Console(CommandLine& commandLine, LineRunner& runner) : mCommandLine(commandLine), mRunner(runner)
 {
 }
 
-void Console::converse(LineEditor& editor)
+void Console::converse(LineEditor& editor, TypedHistory& history)
 {
     InputAssembler input;
     while (!mRunner.isEnding())
@@ -27,8 +33,12 @@ void Console::converse(LineEditor& editor)
         if (outcome == LineEditor::Outcome::kEnd)
             return;
         if (outcome == LineEditor::Outcome::kInterrupted)
+        {
             input.discard();
-        else if (const auto whole = input.add(line))
+            continue;
+        }
+        mCommandLine.tell(history.add(line));
+        if (const auto whole = input.add(line))
             mRunner.run(*whole);
     }
 }
@@ -57,11 +67,12 @@ bool Console::runLine(std::string_view line)
 
 Result<> Console::runScript(const std::filesystem::path& script)
 {
-    std::ifstream lines(script);
-    if (lines && !std::filesystem::is_directory(script))
-        return runLines(lines) ? Result<>() : Failure{};
-    const char* reason = lines ? std::strerror(EISDIR) : std::strerror(errno);
-    return Failure{L"The script " + toWide(script.string()) + L" cannot be read: " + toWide(reason) + L"."};
+    auto text = readOrdinaryFile(script, kLargestScript);
+    if (!text)
+        return Failure{L"The script " + toWide(script.string()) + L" cannot be read: " + text.sentence() +
+                       L"."};
+    std::istringstream lines(*std::move(text));
+    return runLines(lines) ? Result<>() : Failure{};
 }
 
 const wchar_t* Console::prompt(const InputAssembler& input) const
@@ -74,7 +85,7 @@ const wchar_t* Console::prompt(const InputAssembler& input) const
 void Console::makeRoomForPrompt(const wchar_t* prompt)
 {
     if (mCommandLine.openLine() == prompt)
-        mCommandLine.print(L"\r");
+        mCommandLine.returnToLineStart();
     else if (!mCommandLine.atLineStart())
         mCommandLine.print(L"\n");
 }

@@ -14,6 +14,7 @@
 namespace tessel
 {
 class LineEditor;
+class TypedHistory;
 
 // What the host shows when it waits for a command, and when Lisp goes on on the next line.
 inline constexpr wchar_t kPrompt[] = L"Command: ";
@@ -26,16 +27,16 @@ public:
     Console(CommandLine& commandLine, LineRunner& runner);
 
     // Talks with the person at the terminal until the session ends: Ctrl-D, or a command. Ctrl-C gives a
-    // fresh prompt, or stops the Lisp that is running.
-    void converse(LineEditor& editor);
+    // fresh prompt, or stops the Lisp that is running. Each line joins the history before it runs.
+    void converse(LineEditor& editor, TypedHistory& history);
 
     // Runs lines as if typed; each is printed after the prompt, so that the output is a transcript. A line
     // that fails does not keep the following ones from running. True when none failed.
     bool runLines(std::istream& lines);
     bool runLine(std::string_view line);
 
-    // The same with a file of commands. Fails when it cannot be read, and without a sentence when one of its
-    // lines did: each has been told.
+    // The same with an ordinary file of commands. Fails when it cannot be read, and without a sentence when
+    // one of its lines did: each has been told.
     Result<> runScript(const std::filesystem::path& script);
 
 private:

@@ -6,6 +6,8 @@
 #include <fcntl.h>
 #include <unistd.h>
 
+#include "host/console/EndQuestion.h"
+
 namespace tessel
 {
 namespace
@@ -14,10 +16,13 @@ namespace
 LineRunner* theKeysRunner = nullptr;
 volatile std::sig_atomic_t theWriteEnd = -1;
 
+constexpr int kEndedByKey = 128 + SIGINT; // as shells have it
+
 void onKey(int)
 {
     const int before = errno;
-    theKeysRunner->interrupt();
+    if (theKeysRunner->interrupt() && endIsWanted())
+        _exit(kEndedByKey); // what runs would have to come back for a better end
     // A pipe that is full has notes enough.
     [[maybe_unused]] const auto written = write(theWriteEnd, "", 1);
     errno = before;

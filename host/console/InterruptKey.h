@@ -1,4 +1,5 @@
-// Ctrl-C: it stops what is running in the host, not the host.
+// Ctrl-C: it stops what is running in the host, not the host. Where it is pressed in vain, the person at the
+// terminal is asked whether the program is to end all the same, and where it does its status is 130.
 #pragma once
 
 #include <csignal>

@@ -7,19 +7,22 @@
 
 #include "host/console/Completion.h"
 #include "host/console/TerminalInput.h"
+#include "host/console/TypedHistory.h"
+#include "host/text/Credentials.h"
+#include "host/text/TerminalText.h"
+#include "host/text/Unicode.h"
 
 namespace tessel
 {
 namespace
 {
-constexpr int kHistoryLines = 1000;
 constexpr wchar_t kCompletionFunction[] = L"tessel-complete";
 
 void showCandidates(const std::vector<std::wstring>& candidates)
 {
     std::fputc('\n', stdout);
     for (const auto& candidate : candidates)
-        std::fprintf(stdout, "%ls  ", candidate.c_str());
+        std::fprintf(stdout, "%s  ", toUtf8(forTerminal(candidate)).c_str());
     std::fputc('\n', stdout);
     std::fflush(stdout);
 }
@@ -27,7 +30,7 @@ void showCandidates(const std::vector<std::wstring>& candidates)
 
 struct LineEditor::Terminal
 {
-    Terminal(const std::filesystem::path& file, Names names, InputSource source);
+    Terminal(const std::vector<std::wstring>& earlier, Names names, InputSource source);
     ~Terminal();
     Terminal(const Terminal&) = delete;
     Terminal& operator=(const Terminal&) = delete;
@@ -44,7 +47,6 @@ struct LineEditor::Terminal
 
     void remember(const wchar_t* line);
 
-    std::string historyFile;
     Names commandNames;
     TerminalInput input;
     std::wstring promptText;
@@ -53,13 +55,14 @@ struct LineEditor::Terminal
     HistEventW event{};
 };
 
-LineEditor::Terminal::Terminal(const std::filesystem::path& file, Names names, InputSource source)
-    : historyFile(file.string()), commandNames(std::move(names)), input(source),
-      editLine(el_init("Tessel", stdin, stdout, stderr)), history(history_winit())
+LineEditor::Terminal::Terminal(const std::vector<std::wstring>& earlier, Names names, InputSource source)
+    : commandNames(std::move(names)), input(source), editLine(el_init("Tessel", stdin, stdout, stderr)),
+      history(history_winit())
 {
-    history_w(history, &event, H_SETSIZE, kHistoryLines);
+    history_w(history, &event, H_SETSIZE, static_cast<int>(kMostHistoryLines));
     history_w(history, &event, H_SETUNIQUE, 1);
-    history_w(history, &event, H_LOAD, historyFile.c_str()); // the first session has no file yet
+    for (const std::wstring& line : earlier)
+        remember(line.c_str());
     el_wset(editLine, EL_CLIENTDATA, this);
     el_wset(editLine, EL_PROMPT, &Terminal::prompt);
     el_wset(editLine, EL_HIST, history_w, history);
@@ -71,8 +74,6 @@ LineEditor::Terminal::Terminal(const std::filesystem::path& file, Names names, I
 
 LineEditor::Terminal::~Terminal()
 {
-    // A history that cannot be stored is no reason to trouble a person who is leaving.
-    history_w(history, &event, H_SAVE, historyFile.c_str());
     el_end(editLine);
     history_wend(history);
 }
@@ -112,12 +113,13 @@ int LineEditor::Terminal::readCharacter(EditLine* editor, wchar_t* character)
 
 void LineEditor::Terminal::remember(const wchar_t* line)
 {
-    if (*line != L'\n')
-        history_w(history, &event, H_ENTER, line);
+    const std::wstring kept = withoutCredentials(line); // what is not stored is not to be shown again either
+    if (kept.find_first_not_of(L'\n') != kept.npos)
+        history_w(history, &event, H_ENTER, kept.c_str());
 }
 
-LineEditor::LineEditor(const std::filesystem::path& historyFile, Names names, InputSource source)
-    : mTerminal(std::make_unique<Terminal>(historyFile, std::move(names), source))
+LineEditor::LineEditor(const std::vector<std::wstring>& earlier, Names names, InputSource source)
+    : mTerminal(std::make_unique<Terminal>(earlier, std::move(names), source))
 {
 }
 

@@ -1,7 +1,6 @@
 // A line typed at a terminal: editing, history and completion by libedit.
 #pragma once
 
-#include <filesystem>
 #include <functional>
 #include <memory>
 #include <string>
@@ -16,9 +15,9 @@ class LineEditor
 public:
     using Names = std::function<std::vector<std::wstring>()>;
 
-    // Reads standard input and writes standard output. The history is read from the file, if there is one,
-    // and stored there at the end. `names`: what the Tab key completes.
-    LineEditor(const std::filesystem::path& historyFile, Names names, InputSource source);
+    // Reads standard input and writes standard output. `earlier`: lines that the arrow keys bring back, the
+    // oldest first. `names`: what the Tab key completes.
+    LineEditor(const std::vector<std::wstring>& earlier, Names names, InputSource source);
     ~LineEditor();
     LineEditor(const LineEditor&) = delete;
     LineEditor& operator=(const LineEditor&) = delete;

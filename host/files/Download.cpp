@@ -1,13 +1,14 @@
 #include "host/files/Download.h"
 
 #include <curl/curl.h>
-#include <unistd.h>
 
-#include <cerrno>
-#include <fstream>
+#include <cstdlib>
 #include <memory>
-#include <system_error>
 
+#include "host/commands/Interruption.h"
+#include "host/files/PartFile.h"
+#include "host/files/RemoteAddress.h"
+#include "host/files/Sha256.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -20,9 +21,21 @@ constexpr long kWholeFile = 200; // of the other answers none brings the file th
 
 struct Sink
 {
-    std::ofstream file;
+    Sink(PartFile& part, std::uint64_t most, const Interruption& interruption)
+        : file(part), limit(most), interrupted(interruption)
+    {
+    }
+
+    PartFile& file;
+    std::uint64_t limit;
+    Interruption::Wish interrupted;
+    Sha256 sha256{};
     std::uint64_t received = 0;
-    std::uint64_t limit = 0;
+    bool written = true;
+    bool stopped = false;
+    bool wasSecure = false;
+    bool ledAstray = false; // from where nobody can read along to where anybody can
+    CURL* transfer = nullptr;
 
     bool isFull() const { return received > limit; }
 };
@@ -34,8 +47,28 @@ std::size_t receive(char* bytes, std::size_t size, std::size_t count, void* cont
     sink.received += size * count;
     if (sink.isFull())
         return 0;
-    sink.file.write(bytes, static_cast<std::streamsize>(size * count));
-    return sink.file ? size * count : 0;
+    sink.sha256.add({bytes, size * count});
+    sink.written = sink.file.write({bytes, size * count});
+    return sink.written ? size * count : 0;
+}
+
+int onProgress(void* context, curl_off_t, curl_off_t, curl_off_t, curl_off_t)
+{
+    auto& sink = *static_cast<Sink*>(context);
+    sink.stopped = sink.interrupted.isThere();
+    return sink.stopped ? 1 : 0;
+}
+
+// Before each request, that of a redirection too.
+int beforeRequest(void* context, char*, char*, int, int)
+{
+    auto& sink = *static_cast<Sink*>(context);
+    const char* url = nullptr;
+    curl_easy_getinfo(sink.transfer, CURLINFO_EFFECTIVE_URL, &url);
+    const bool secure = url && isSecure(url);
+    sink.ledAstray = sink.wasSecure && !secure;
+    sink.wasSecure = secure;
+    return sink.ledAstray ? CURL_PREREQFUNC_ABORT : CURL_PREREQFUNC_OK;
 }
 
 struct EndTransfer
@@ -44,15 +77,30 @@ struct EndTransfer
 };
 using Transfer = std::unique_ptr<CURL, EndTransfer>;
 
-void configure(CURL* transfer, const std::string& url, const RemoteFiles::Limits& limits, Sink& sink,
-               char* words)
+// Whom to trust is the system's to know, or that of the person who has a certificate of their own.
+void configureTrust(CURL* transfer)
 {
-    curl_easy_setopt(transfer, CURLOPT_URL, url.c_str());
-    curl_easy_setopt(transfer, CURLOPT_NOSIGNAL, 1L);
+    if (const char* certificates = std::getenv("SSL_CERT_FILE"); certificates && *certificates)
+        curl_easy_setopt(transfer, CURLOPT_CAINFO, certificates);
+}
+
+void configureAddress(CURL* transfer, const RemoteAddress& address)
+{
+    curl_easy_setopt(transfer, CURLOPT_URL, address.url.c_str());
     curl_easy_setopt(transfer, CURLOPT_PROTOCOLS_STR, kProtocols);
     curl_easy_setopt(transfer, CURLOPT_REDIR_PROTOCOLS_STR, kProtocols);
     curl_easy_setopt(transfer, CURLOPT_FOLLOWLOCATION, 1L);
     curl_easy_setopt(transfer, CURLOPT_MAXREDIRS, kMostRedirections);
+    if (!address.hasCredentials())
+        return;
+    // Sent to the server of the address alone, wherever that leads.
+    curl_easy_setopt(transfer, CURLOPT_USERNAME, address.user.c_str());
+    curl_easy_setopt(transfer, CURLOPT_PASSWORD, address.password.c_str());
+}
+
+void configure(CURL* transfer, const RemoteFiles::Limits& limits, Sink& sink, char* words)
+{
+    curl_easy_setopt(transfer, CURLOPT_NOSIGNAL, 1L);
     curl_easy_setopt(transfer, CURLOPT_FAILONERROR, 1L);
     curl_easy_setopt(transfer, CURLOPT_CONNECTTIMEOUT_MS, static_cast<long>(limits.connecting.count()));
     curl_easy_setopt(transfer, CURLOPT_TIMEOUT_MS, static_cast<long>(limits.whole.count()));
@@ -60,58 +108,54 @@ void configure(CURL* transfer, const std::string& url, const RemoteFiles::Limits
     curl_easy_setopt(transfer, CURLOPT_ERRORBUFFER, words);
     curl_easy_setopt(transfer, CURLOPT_WRITEFUNCTION, receive);
     curl_easy_setopt(transfer, CURLOPT_WRITEDATA, &sink);
+    curl_easy_setopt(transfer, CURLOPT_NOPROGRESS, 0L);
+    curl_easy_setopt(transfer, CURLOPT_XFERINFOFUNCTION, onProgress);
+    curl_easy_setopt(transfer, CURLOPT_XFERINFODATA, &sink);
+    curl_easy_setopt(transfer, CURLOPT_PREREQFUNCTION, beforeRequest);
+    curl_easy_setopt(transfer, CURLOPT_PREREQDATA, &sink);
 }
 
-Failure notMade(const std::filesystem::path& file, const std::string& reason)
+// What stopped the transfer on this side; nothing when the other one did, or nobody.
+Result<> ownOutcome(CURLcode status, const Sink& sink)
 {
-    return {toWide("the local copy " + file.string() + " cannot be made: " + reason)};
-}
-
-Result<> outcomeOf(CURL* transfer, CURLcode status, const Sink& sink, const char* words)
-{
+    if (sink.stopped)
+        return Failure{L"it was interrupted"};
+    if (sink.ledAstray)
+        return Failure{L"the server leads from https to http"};
     if (sink.isFull() || status == CURLE_FILESIZE_EXCEEDED)
         return Failure{L"it is larger than " + std::to_wstring(sink.limit) + L" bytes"};
-    if (!sink.file)
-        return Failure{L"the local copy could not be written"};
+    return sink.written ? Result<>() : Failure{L"the local copy could not be written"};
+}
+
+Result<> outcomeOf(CURLcode status, const Sink& sink, const char* words)
+{
+    if (auto own = ownOutcome(status, sink); !own)
+        return own;
     if (status != CURLE_OK)
         return Failure{toWide(*words ? words : curl_easy_strerror(status))};
     long answer = 0;
-    curl_easy_getinfo(transfer, CURLINFO_RESPONSE_CODE, &answer);
+    curl_easy_getinfo(sink.transfer, CURLINFO_RESPONSE_CODE, &answer);
     if (answer != kWholeFile)
         return Failure{L"the server answered " + std::to_wstring(answer)};
     return {};
 }
+} // namespace
 
-Result<> transferInto(const std::string& url, const std::filesystem::path& part,
-                      const RemoteFiles::Limits& limits)
+Result<std::string> download(const RemoteAddress& address, PartFile& file, const RemoteFiles::Limits& limits,
+                             Interruption& interruption)
 {
-    Sink sink{std::ofstream(part, std::ios::binary), 0, limits.bytes};
-    if (!sink.file)
-        return notMade(part, std::generic_category().message(errno));
     const Transfer transfer(curl_easy_init());
     if (!transfer)
         return Failure{L"the network library cannot be started"};
     char words[CURL_ERROR_SIZE] = "";
-    configure(transfer.get(), url, limits, sink, words);
-    const CURLcode status = curl_easy_perform(transfer.get());
-    sink.file.close();
-    return outcomeOf(transfer.get(), status, sink, words);
-}
-} // namespace
-
-Result<> download(const std::string& url, const std::filesystem::path& file,
-                  const RemoteFiles::Limits& limits)
-{
-    // Named after the process: another one may be fetching the same file.
-    const std::filesystem::path part = file.parent_path() / (".part-" + std::to_string(getpid()));
-    Result<> done = transferInto(url, part, limits);
-    std::error_code failed;
-    if (done)
-        std::filesystem::rename(part, file, failed);
-    if (failed)
-        done = notMade(file, failed.message());
-    if (!done)
-        std::filesystem::remove(part, failed); // may never have come into being
-    return done;
+    Sink sink(file, limits.bytes, interruption);
+    sink.transfer = transfer.get();
+    configureAddress(transfer.get(), address);
+    configureTrust(transfer.get());
+    configure(transfer.get(), limits, sink, words);
+    const auto outcome = outcomeOf(curl_easy_perform(transfer.get()), sink, words);
+    if (sink.stopped)
+        interruption.settle();
+    return outcome ? Result<std::string>(sink.sha256.finish()) : outcome.failure();
 }
 } // namespace tessel

@@ -1,7 +1,6 @@
 // One download, with limits.
 #pragma once
 
-#include <filesystem>
 #include <string>
 
 #include "host/files/RemoteFiles.h"
@@ -9,8 +8,10 @@
 
 namespace tessel
 {
-// Fetches the URL into the file, which appears only when all of it is there. Why not is the end of a
-// sentence.
-Result<> download(const std::string& url, const std::filesystem::path& file,
-                  const RemoteFiles::Limits& limits);
+class PartFile;
+
+// Fetches what stands at the address into the file; answers its SHA-256. Ends early when the key is pressed
+// or the session is to end. Why it failed is the end of a sentence.
+Result<std::string> download(const RemoteAddress& address, PartFile& file, const RemoteFiles::Limits& limits,
+                             Interruption& interruption);
 } // namespace tessel

@@ -15,7 +15,7 @@ namespace tessel
 {
 namespace
 {
-constexpr char kSeparator = ';';
+constexpr char kPathSeparator = ';';
 
 bool isThere(const std::filesystem::path& path)
 {
@@ -45,7 +45,7 @@ std::vector<std::filesystem::path> FileSearch::folders() const
     std::string_view rest = listed;
     while (!rest.empty())
     {
-        const std::size_t end = std::min(rest.find(kSeparator), rest.size());
+        const std::size_t end = std::min(rest.find(kPathSeparator), rest.size());
         folders.emplace_back(rest.substr(0, end));
         rest.remove_prefix(std::min(end + 1, rest.size()));
     }

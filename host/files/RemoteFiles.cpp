@@ -1,17 +1,19 @@
 #include "host/files/RemoteFiles.h"
 
 #include <tessel/tsdefs.h>
-#include <unicode/utf8.h>
 
 #include <algorithm>
+#include <cerrno>
 #include <cstdint>
 #include <cwchar>
-#include <fstream>
-#include <iterator>
-#include <optional>
 #include <system_error>
 
 #include "host/files/Download.h"
+#include "host/files/PartFile.h"
+#include "host/files/RemoteAddress.h"
+#include "host/files/Sha256.h"
+#include "host/platform/OrdinaryFile.h"
+#include "host/platform/PrivateFolder.h"
 #include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
@@ -21,9 +23,7 @@ namespace tessel
 {
 namespace
 {
-constexpr const char* kOriginFile = ".url";
-constexpr const char* kUnnamedFile = "download";
-constexpr std::size_t kLongestName = 200; // in bytes; a file system takes 255
+constexpr std::uintmax_t kLongestOrigin = std::uintmax_t{1} << 20; // servers take no longer address
 
 // FNV-1a; the URL beside the copy tells two with the same hash apart.
 std::uint64_t hashOf(const std::string& text)
@@ -34,40 +34,20 @@ std::uint64_t hashOf(const std::string& text)
     return hash;
 }
 
-// The first byte at or after the position that begins a character.
-std::size_t firstCharacter(const std::string& utf8, std::size_t position)
+// Empty when there is nothing that can be read.
+std::string originIn(const std::filesystem::path& folder)
 {
-    while (position < utf8.size() && U8_IS_TRAIL(static_cast<std::uint8_t>(utf8[position])))
-        ++position;
-    return position;
+    const auto origin = readOrdinaryFile(folder / kOriginFile, kLongestOrigin);
+    return origin ? *origin : std::string();
 }
 
-// The last part of the URL's path, without what cannot be a file's name.
-std::string fileNameOf(const std::string& url)
+Result<> writeOrigin(const std::filesystem::path& folder, const std::string& url)
 {
-    std::string path = url.substr(0, url.find_first_of("?#"));
-    const std::size_t host = path.find("://") + 3;
-    const std::size_t slash = path.rfind('/');
-    std::string name = slash == std::string::npos || slash < host ? "" : path.substr(slash + 1);
-    std::replace(name.begin(), name.end(), '\\', '_');
-    if (name.size() > kLongestName) // the end tells the kind
-        name.erase(0, firstCharacter(name, name.size() - kLongestName));
-    const bool unusable = name.empty() || name == "." || name == ".." || name == kOriginFile;
-    return unusable ? kUnnamedFile : name;
-}
-
-std::string readFile(const std::filesystem::path& file)
-{
-    std::ifstream stream(file, std::ios::binary);
-    return {std::istreambuf_iterator<char>(stream), {}};
-}
-
-bool writeFile(const std::filesystem::path& file, const std::string& text)
-{
-    std::ofstream stream(file, std::ios::binary);
-    stream << text;
-    stream.close();
-    return stream.good();
+    PartFile origin(folder);
+    if (!origin.made())
+        return origin.made();
+    return origin.write(url) ? origin.moveTo(folder / kOriginFile)
+                             : Failure{toWide(std::generic_category().message(errno))};
 }
 
 bool isFile(const std::filesystem::path& file)
@@ -82,15 +62,67 @@ std::filesystem::path resolved(const std::filesystem::path& path)
     return std::filesystem::weakly_canonical(path, unreachable);
 }
 
-Failure notFetched(const std::wstring& url, const std::wstring& reason)
+Failure notFetched(const std::string& address, const std::wstring& reason)
 {
-    return {url + L" could not be fetched: " + reason + L".", TS_FETCH_FAILED};
+    return {toWide(withoutUserInfo(address)) + L" could not be fetched: " + reason + L".", TS_FETCH_FAILED};
+}
+
+Failure about(const std::string& what, const std::filesystem::path& path, const std::wstring& reason)
+{
+    return {toWide("the " + what + " " + path.string()) + reason};
+}
+
+// A folder of the cache's own: made where it is missing, and closed to others where an older version has left
+// it open.
+Result<> prepareFolder(const std::filesystem::path& folder)
+{
+    if (const auto made = makePrivateFolder(folder); !made)
+        return about("cache folder", folder, L" cannot be made: " + made.sentence());
+    if (!checkNobodyElseWrites(folder))
+    {
+        std::error_code notOurs; // is told by the next look
+        std::filesystem::permissions(folder, std::filesystem::perms::owner_all, notOurs);
+    }
+    const auto checked = checkNobodyElseWrites(folder);
+    return checked ? checked : about("cache folder", folder, L" is not safe: " + checked.sentence());
+}
+
+Result<> checkContent(const std::string& sha256, const RemoteAddress& address)
+{
+    if (address.sha256.empty() || sha256 == address.sha256)
+        return {};
+    return Failure{L"its SHA-256 is " + toWide(sha256) + L", not the one that the address asks for"};
+}
+
+std::string sha256Of(const std::filesystem::path& file, std::uintmax_t mostBytes)
+{
+    const auto content = readOrdinaryFile(file, mostBytes);
+    Sha256 checksum;
+    checksum.add(content ? *content : "");
+    return content ? checksum.finish() : "";
+}
+
+// Puts the copy into its place, and its origin beside it.
+Result<> store(PartFile& part, const std::filesystem::path& copy, const std::string& url)
+{
+    const std::filesystem::path folder = copy.parent_path();
+    // What an earlier fetch wrote stays: a copy without its origin would be lost.
+    const bool isKnown = originIn(folder) == url && checkNobodyElseWrites(folder / kOriginFile);
+    if (const auto moved = part.moveTo(copy); !moved)
+        return about("local copy", copy, L" cannot be made: " + moved.sentence());
+    const auto noted = isKnown ? Result<>() : writeOrigin(folder, url);
+    if (noted)
+        return noted;
+    std::error_code gone;
+    std::filesystem::remove(copy, gone);
+    return about("cache folder", folder, L" cannot be written: " + noted.sentence());
 }
 } // namespace
 
-RemoteFiles::RemoteFiles(std::filesystem::path cacheFolder, Limits limits)
-    : mCacheFolder(std::move(cacheFolder)), mLimits(limits)
+RemoteFiles::RemoteFiles(std::filesystem::path cacheFolder, Limits limits, Interruption& interruption)
+    : mCacheFolder(std::move(cacheFolder)), mLimits(limits), mInterruption(interruption)
 {
+    PartFile::clearLeftOvers(mCacheFolder);
 }
 
 std::filesystem::path RemoteFiles::copyOf(const std::string& url) const
@@ -98,39 +130,62 @@ std::filesystem::path RemoteFiles::copyOf(const std::string& url) const
     return mCacheFolder / std::to_string(hashOf(url)) / fileNameOf(url);
 }
 
+// Another user could have put something else there, if any of these is theirs to write.
+bool RemoteFiles::canBeTrusted(const std::filesystem::path& copy) const
+{
+    const std::filesystem::path folder = copy.parent_path();
+    return checkNobodyElseWrites(mCacheFolder) && checkNobodyElseWrites(folder) &&
+           checkNobodyElseWrites(copy) && checkNobodyElseWrites(folder / kOriginFile);
+}
+
+bool RemoteFiles::hasCopy(const std::filesystem::path& copy, const RemoteAddress& address) const
+{
+    return isFile(copy) && canBeTrusted(copy) && originIn(copy.parent_path()) == address.url &&
+           (address.sha256.empty() || sha256Of(copy, mLimits.bytes) == address.sha256);
+}
+
 Result<RemoteFiles::Copy> RemoteFiles::fetch(const std::wstring& url, std::size_t longestPath,
                                              bool ignoreCache)
 {
-    const std::string address = toUtf8(url);
-    const std::filesystem::path copy = copyOf(address);
+    const std::string text = toUtf8(url);
+    const auto address = parseRemoteAddress(text);
+    if (!address)
+        return notFetched(text, address.sentence());
+    const std::filesystem::path copy = copyOf(address->url);
     const std::wstring path = toWide(copy.string());
     if (path.size() > longestPath)
-        return notFetched(url, L"the path of its local copy has more than " + std::to_wstring(longestPath) +
-                                   L" characters");
-    if (!ignoreCache && isFile(copy) && readFile(copy.parent_path() / kOriginFile) == address)
+        return notFetched(text, L"the path of its local copy has more than " + std::to_wstring(longestPath) +
+                                    L" characters");
+    if (!ignoreCache && !address->hasCredentials() && hasCopy(copy, *address))
         return Copy{TS_FROM_CACHE, path};
-    if (const auto fetched = fetchInto(copy, address); !fetched)
-        return notFetched(url, fetched.sentence());
+    if (const auto fetched = fetchInto(copy, *address); !fetched)
+        return notFetched(text, fetched.sentence());
     return Copy{TS_FETCHED, path};
 }
 
 // What this says of a failure is the end of a sentence.
-Result<> RemoteFiles::fetchInto(const std::filesystem::path& copy, const std::string& url) const
+Result<> RemoteFiles::fetchInto(const std::filesystem::path& copy, const RemoteAddress& address) const
 {
+    if (const auto prepared = prepareFolder(mCacheFolder); !prepared)
+        return prepared;
+    PartFile part(mCacheFolder);
+    if (!part.made())
+        return about("local copy", copy, L" cannot be made: " + part.made().sentence());
+    const auto sha256 = download(address, part, mLimits, mInterruption);
+    if (!sha256)
+        return sha256.failure();
+    if (const auto checked = checkContent(*sha256, address); !checked)
+        return checked;
     const std::filesystem::path folder = copy.parent_path();
-    std::error_code failed;
-    const bool isNew = std::filesystem::create_directories(folder, failed);
-    if (failed)
-        return Failure{
-            toWide("the cache folder " + folder.string() + " cannot be made: " + failed.message())};
-    Result<> fetched = download(url, copy, mLimits);
-    // What an earlier fetch wrote stays: a copy without its origin would be lost.
-    const bool isKnown = readFile(folder / kOriginFile) == url;
-    if (fetched && !isKnown && !writeFile(folder / kOriginFile, url))
-        fetched = Failure{toWide("the cache folder " + folder.string() + " cannot be written")};
-    if (!fetched && isNew)
-        std::filesystem::remove_all(folder, failed);
-    return fetched;
+    PartFile::clearLeftOvers(folder); // of older versions, which wrote there
+    const bool isNew = !std::filesystem::exists(folder);
+    auto stored = prepareFolder(folder);
+    if (stored)
+        stored = store(part, copy, address.url);
+    std::error_code gone;
+    if (!stored && isNew)
+        std::filesystem::remove_all(folder, gone);
+    return stored;
 }
 
 bool RemoteFiles::IsRemoteFile(const wchar_t* localPath, wchar_t* url, std::size_t capacity) const
@@ -139,7 +194,7 @@ bool RemoteFiles::IsRemoteFile(const wchar_t* localPath, wchar_t* url, std::size
     const std::filesystem::path folder = file.parent_path();
     if (folder.parent_path() != resolved(mCacheFolder) || !isFile(file))
         return false;
-    const std::string address = readFile(folder / kOriginFile);
+    const std::string address = canBeTrusted(file) ? originIn(folder) : std::string();
     if (address.empty() || file.filename() != fileNameOf(address))
         return false;
     const std::wstring origin = toWide(address);

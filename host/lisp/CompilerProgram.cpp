@@ -3,16 +3,18 @@
 #include <cerrno>
 #include <cstdio>
 #include <filesystem>
-#include <fstream>
 #include <iostream>
+#include <sstream>
 #include <string>
 #include <system_error>
 
 #include <CLI/CLI.hpp>
 
+#include "host/files/PartFile.h"
 #include "host/lisp/CompiledLisp.h"
 #include "host/lisp/LispFile.h"
 #include "host/lisp/LispMachine.h"
+#include "host/text/TerminalText.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -40,7 +42,7 @@ LispSurroundings terminal()
     LispSurroundings surroundings;
     surroundings.write = [](std::wstring_view text)
     {
-        std::cout << toUtf8(text) << std::flush;
+        std::cout << toUtf8(forTerminal(text)) << std::flush;
     };
     surroundings.column = []
     {
@@ -49,22 +51,23 @@ LispSurroundings terminal()
     return surroundings;
 }
 
+Failure notWritten(const fs::path& output, const std::wstring& reason)
+{
+    return {L"cannot write " + quoted(output) + L": " + reason + L"."};
+}
+
 // Whole or not at all: a build that is stopped midway must not leave a file that looks finished.
 Result<> writeWhole(const fs::path& output, const std::string& bytes)
 {
-    const fs::path part = output.string() + ".part";
-    errno = 0;
-    std::ofstream stream(part, std::ios::binary);
-    stream << bytes;
-    stream.close();
-    std::error_code error(stream.fail() ? errno : 0, std::generic_category());
-    if (!error)
-        fs::rename(part, output, error);
-    if (!error)
-        return {};
-    std::error_code ignored; // what went wrong first is what is told
-    fs::remove(part, ignored);
-    return Failure{L"cannot write " + quoted(output) + L": " + toWide(error.message()) + L"."};
+    const fs::path folder = output.has_parent_path() ? output.parent_path() : ".";
+    PartFile::clearLeftOvers(folder);
+    PartFile part(folder);
+    if (!part.made())
+        return notWritten(output, part.made().sentence());
+    if (!part.write(bytes) || !part.letOthersRead())
+        return notWritten(output, toWide(std::generic_category().message(errno)));
+    const auto moved = part.moveTo(output);
+    return moved ? moved : notWritten(output, moved.sentence());
 }
 
 Result<> compileFile(const fs::path& input, const fs::path& output)
@@ -111,12 +114,15 @@ int runCompilerProgram(int count, const char* const* arguments)
     }
     catch (const CLI::ParseError& outcome)
     {
-        return app.exit(outcome) == 0 ? 0 : kWrongArguments;
+        std::ostringstream text;
+        const bool failed = app.exit(outcome, text, text) != 0;
+        (failed ? std::cerr : std::cout) << toUtf8(forTerminal(toWide(text.str())));
+        return failed ? kWrongArguments : 0;
     }
     const auto compiled =
         compileGuarded(input, output.empty() ? fs::path(input).replace_extension(".qbc") : fs::path(output));
     if (!compiled)
-        std::cerr << "tesselc: " << toUtf8(compiled.sentence()) << '\n';
+        std::cerr << "tesselc: " << toUtf8(forTerminal(compiled.sentence())) << '\n';
     return compiled ? 0 : kNotCompiled;
 }
 } // namespace tessel

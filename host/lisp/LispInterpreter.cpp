@@ -7,6 +7,7 @@
 #include "host/applications/Admission.h"
 #include "host/applications/Document.h"
 #include "host/commands/EndRequest.h"
+#include "host/lisp/LispLoads.h"
 #include "host/lisp/LispMachine.h"
 #include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
@@ -36,31 +37,38 @@ void admitFilesBy(Admission& admission, LispSurroundings& surroundings)
 }
 
 LispSurroundings surroundings(const LispInterpreter::Options& options, CommandLine& commandLine,
-                              Document& document)
+                              Document& document, LispLoads& loads)
 {
-    const auto fileLoaded = [&document, admission = options.admission](const std::wstring& path)
+    const auto fileLoaded = [&document, &loads, admission = options.admission](const std::wstring& path)
     {
         document.add(path);
+        loads.loaded(path);
         RunningMarker::AtWork file{};
         if (admission && admission->marker().innermost(file))
             admission->noteLoaded(toWide(file.path));
+    };
+    const auto fileAsked = [&loads](const std::wstring& path)
+    {
+        loads.asked(path);
     };
     LispSurroundings surroundings = {.removingTsLisp = options.removingTsLisp,
                                      .heapBytes = options.heapBytes != 0 ? options.heapBytes : kLispHeapBytes,
                                      .write = [&commandLine](std::wstring_view text)
                                      { commandLine.print(text); },
                                      .column = [&commandLine] { return commandLine.openLine().size(); },
-                                     .fileLoaded = fileLoaded};
+                                     .fileLoaded = fileLoaded,
+                                     .fileAsked = fileAsked};
     if (options.admission)
         admitFilesBy(*options.admission, surroundings);
     return surroundings;
 }
 } // namespace
 
-LispInterpreter::LispInterpreter(std::unique_ptr<LispMachine> machine, const Options& options,
-                                 CommandLine& commandLine, const EndRequest& endRequest)
-    : mMachine(std::move(machine)), mRemovingTsLisp(options.removingTsLisp), mCommandLine(commandLine),
-      mEndRequest(endRequest), mAdmission(options.admission),
+LispInterpreter::LispInterpreter(std::unique_ptr<LispMachine> machine, std::unique_ptr<LispLoads> loads,
+                                 const Options& options, CommandLine& commandLine,
+                                 const EndRequest& endRequest)
+    : mLoads(std::move(loads)), mMachine(std::move(machine)), mRemovingTsLisp(options.removingTsLisp),
+      mCommandLine(commandLine), mEndRequest(endRequest), mAdmission(options.admission),
       mMarker(options.admission ? options.admission->marker() : mNoMarker)
 {
 }
@@ -69,11 +77,12 @@ Result<std::unique_ptr<LispInterpreter>> LispInterpreter::start(const Options& o
                                                                 CommandLine& commandLine, Document& document,
                                                                 const EndRequest& endRequest)
 {
-    auto machine = LispMachine::start(surroundings(options, commandLine, document));
+    auto loads = std::make_unique<LispLoads>(options.outcomes);
+    auto machine = LispMachine::start(surroundings(options, commandLine, document, *loads));
     if (!machine)
         return machine.failure();
     return std::unique_ptr<LispInterpreter>(
-        new LispInterpreter(*std::move(machine), options, commandLine, endRequest));
+        new LispInterpreter(*std::move(machine), std::move(loads), options, commandLine, endRequest));
 }
 
 LispInterpreter::~LispInterpreter() = default;
@@ -81,7 +90,9 @@ LispInterpreter::~LispInterpreter() = default;
 Result<std::wstring> LispInterpreter::evaluate(std::wstring_view expressions)
 {
     const std::size_t depth = mMarker.depth();
+    mLoads->begin();
     auto value = mMachine->evaluate(expressions);
+    mLoads->end(value);
     mMarker.endTo(depth); // Lisp may have been left by a jump
     return value;
 }
@@ -130,5 +141,10 @@ void LispInterpreter::interrupt() noexcept
 bool LispInterpreter::running() const noexcept
 {
     return mMachine->running();
+}
+
+unsigned LispInterpreter::evaluations() const noexcept
+{
+    return mMachine->evaluations();
 }
 } // namespace tessel

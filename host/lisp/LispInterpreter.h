@@ -19,16 +19,19 @@ class Admission;
 class CommandLine;
 class Document;
 class EndRequest;
+class LispLoads;
 class LispMachine;
+class LoadOutcomes;
 
 class LispInterpreter
 {
 public:
     struct Options
     {
-        bool removingTsLisp = true;     // compiled and packaged Lisp can be loaded
-        std::size_t heapBytes = 0;      // memory for Lisp's objects; 0: as much as is usual
-        Admission* admission = nullptr; // of files, if it is to be asked; it marks them, too
+        bool removingTsLisp = true;       // compiled and packaged Lisp can be loaded
+        std::size_t heapBytes = 0;        // memory for Lisp's objects; 0: as much as is usual
+        LoadOutcomes* outcomes = nullptr; // where it is noted how loading files came off
+        Admission* admission = nullptr;   // of files, if it is to be asked; it marks them, too
     };
 
     // Starts Lisp, on the thread on which everything but `interrupt` is to be called. A later interpreter in
@@ -69,9 +72,12 @@ public:
     void interrupt() noexcept;
     bool running() const noexcept;
 
+    // Changes whenever an evaluation begins or ends. Safe in a signal handler.
+    unsigned evaluations() const noexcept;
+
 private:
-    LispInterpreter(std::unique_ptr<LispMachine> machine, const Options& options, CommandLine& commandLine,
-                    const EndRequest& endRequest);
+    LispInterpreter(std::unique_ptr<LispMachine> machine, std::unique_ptr<LispLoads> loads,
+                    const Options& options, CommandLine& commandLine, const EndRequest& endRequest);
 
     struct Queued
     {
@@ -79,6 +85,7 @@ private:
         RunningMarker::Reason reason; // for what it loads
     };
 
+    std::unique_ptr<LispLoads> mLoads;
     std::unique_ptr<LispMachine> mMachine;
     bool mRemovingTsLisp;
     CommandLine& mCommandLine;

@@ -31,6 +31,9 @@ public:
 
     bool running() const noexcept { return isRun(mRun.load()); }
 
+    // Changes whenever an evaluation begins or ends, those within one aside.
+    unsigned evaluations() const noexcept { return mRun.load(); }
+
     // Safe in a signal handler. Without an evaluation that runs it does nothing.
     void interrupt() noexcept;
 

@@ -229,4 +229,9 @@ bool LispMachine::running() const noexcept
 {
     return mParts->interrupter.running();
 }
+
+unsigned LispMachine::evaluations() const noexcept
+{
+    return mParts->interrupter.evaluations();
+}
 } // namespace tessel

@@ -29,6 +29,7 @@ struct LispSurroundings
     std::function<void(std::wstring_view)> write;             // what Lisp prints, in pieces
     std::function<std::size_t()> column;                      // characters on the line that is not ended yet
     std::function<void(const std::wstring& path)> fileLoaded; // without an error; the path as it was given
+    std::function<void(const std::wstring& path)> fileAsked = {}; // before it is looked for; the same path
 
     // About files within files, of which the innermost runs. `fileBegins` may refuse the one with that full
     // path before it is opened; the sentence calls it by its name. `filesOpen` answers how many have begun,
@@ -63,6 +64,9 @@ public:
     // From any thread or signal handler.
     void interrupt() noexcept;
     bool running() const noexcept;
+
+    // Changes whenever an evaluation begins or ends. Safe in a signal handler.
+    unsigned evaluations() const noexcept;
 
 private:
     struct Parts;

@@ -127,6 +127,8 @@ cl_object readFile(cl_object path)
         [=]
         {
             const auto* surroundings = connection().surroundings;
+            if (surroundings && surroundings->fileAsked)
+                surroundings->fileAsked(fromLisp(path));
             connection().file = readLispFile(fromLisp(path), surroundings && surroundings->removingTsLisp,
                                              surroundings ? surroundings->fileBegins : LispFileBegins());
         });

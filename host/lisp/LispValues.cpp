@@ -7,7 +7,7 @@ namespace tessel
 {
 namespace
 {
-constexpr std::uint32_t kReplacement = 0xFFFD;
+constexpr std::uint32_t kReplacementCharacter = 0xFFFD;
 constexpr std::uint32_t kLastCharacter = 0x10FFFF;
 
 cl_object toLispValue(const TsResultBuffer& value)
@@ -56,7 +56,7 @@ cl_object toLisp(std::wstring_view text)
     {
         const auto character = static_cast<std::uint32_t>(text[index]);
         string->string.self[index] =
-            static_cast<ecl_character>(character <= kLastCharacter ? character : kReplacement);
+            static_cast<ecl_character>(character <= kLastCharacter ? character : kReplacementCharacter);
     }
     return string;
 }

@@ -49,13 +49,44 @@ std::wstring MessageBox::takeDetailFor(const std::wstring& text)
     return !path.empty() && text.find(path) != std::wstring::npos ? asSentence(why) : std::wstring();
 }
 
+void MessageBox::collect()
+{
+    mCollected.emplace();
+}
+
+std::vector<MessageBox::Box> MessageBox::takeCollected()
+{
+    return std::exchange(mCollected, std::nullopt).value_or(std::vector<Box>());
+}
+
+void MessageBox::show(const Box& box, const std::wstring& lines, bool linesToo)
+{
+    if (linesToo || present(box) == 0)
+        sayMessage(lines);
+    if (linesToo)
+        static_cast<void>(present(box)); // nothing depends on the button
+}
+
+int MessageBox::present(const Box& box) const
+{
+    return mPresenter ? mPresenter(box) : 0;
+}
+
+void MessageBox::sayMessage(const std::wstring& text)
+{
+    mCommandLine.say(L"Message: " + text);
+}
+
 int MessageBox::show(const wchar_t* text, unsigned style, void* parent)
 {
     const std::wstring message = text ? text : L"";
-    const std::wstring detail = takeDetailFor(message);
-    if (const int answer = mPresenter ? mPresenter({message, detail, style, parent}) : 0)
+    const Box box{message, takeDetailFor(message), style, parent};
+    if (mCollected && !parent)
+        mCollected->push_back(box);
+    else if (const int answer = present(box))
         return answer;
-    mCommandLine.say(L"Message: " + message);
+    else
+        sayMessage(message);
     return IDOK; // every style begins with the button OK
 }
 } // namespace tessel

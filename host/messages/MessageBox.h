@@ -2,7 +2,9 @@
 #pragma once
 
 #include <functional>
+#include <optional>
 #include <string>
+#include <vector>
 
 #include <tessel/tsmessagebox.h>
 
@@ -33,15 +35,27 @@ public:
     // Why something went wrong with the file: the detail of the next box, if that names the file.
     void explain(const std::wstring& path, const std::wstring& why);
 
+    // From now on boxes without a parent are kept, and the first button counts as chosen. Whoever shows one
+    // over a window of its own talks to a person, who gets to see it.
+    void collect();
+    // The boxes that were kept; from now on they are shown again.
+    std::vector<Box> takeCollected();
+
+    // A box of the host's own; where the presenter cannot show it, or if they are wanted anyway, the lines.
+    void show(const Box& box, const std::wstring& lines, bool linesToo);
+
     // As text, without the detail, which has been said on the command line by then: "Message: ..." on lines
     // of its own, and the first button counts as chosen.
     int show(const wchar_t* text, unsigned style, void* parent) override;
 
 private:
+    int present(const Box& box) const;
+    void sayMessage(const std::wstring& text);
     std::wstring takeDetailFor(const std::wstring& text);
 
     CommandLine& mCommandLine;
     Presenter mPresenter;
+    std::optional<std::vector<Box>> mCollected; // while they are kept
     std::wstring mExplainedPath;
     std::wstring mWhy;
 };

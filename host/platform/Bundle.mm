@@ -8,7 +8,9 @@
 #include <filesystem>
 
 #include "host/platform/AutoreleasePool.h"
+#include "host/platform/BundleDescription.h"
 #include "host/platform/FileNames.h"
+#include "host/platform/ObjectiveCGuard.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -27,6 +29,50 @@ char lowerAscii(char character)
 {
     return character >= 'A' && character <= 'Z' ? static_cast<char>(character - 'A' + 'a') : character;
 }
+
+bool leadsInside(const std::filesystem::path& name)
+{
+    return name.is_relative() && std::find(name.begin(), name.end(), "..") == name.end();
+}
+
+Result<> checkProgramName(id name)
+{
+    if (!name)
+        return {};
+    if (![name isKindOfClass:[NSString class]])
+        return Failure{L"its description has no text for the name of its program"};
+    if (leadsInside([name fileSystemRepresentation]))
+        return {};
+    return Failure{L"its description names the program \"" + NSStringToWstring(name) +
+                   L"\", which leads out of the bundle"};
+}
+
+// By either name that the platforms have for it.
+Result<> checkProgramNames(NSBundle* bundle)
+{
+    NSDictionary* description = [bundle infoDictionary];
+    const auto checked = checkProgramName([description objectForKey:@"NSExecutable"]);
+    return checked ? checkProgramName([description objectForKey:@"CFBundleExecutable"]) : checked;
+}
+
+Result<std::string> askForProgram(const std::string& folder)
+{
+    std::error_code failed;
+    NSBundle* bundle = bundleAt(folder);
+    const std::string bundleFolder = bundle ? [[bundle bundlePath] fileSystemRepresentation] : folder;
+    if (!std::filesystem::equivalent(bundleFolder, folder, failed))
+        // GNUstep answers with the bundle that it has opened before under the same identifier.
+        return Failure{L"the bundle \"" + toWide(bundleFolder) + L"\" has the same identifier"};
+    if (auto checked = checkProgramNames(bundle); !checked)
+        return checked.failure();
+    NSString* path = [bundle executablePath];
+    if (!path)
+        return Failure{L"the bundle holds no program for this system"};
+    const std::string program = [path fileSystemRepresentation];
+    if (!std::filesystem::exists(program, failed))
+        return Failure{L"its program \"" + toWide(program) + L"\" is missing"};
+    return program;
+}
 } // namespace
 
 bool isBundlePath(std::string_view path)
@@ -42,27 +88,27 @@ Result<std::string> programOfBundle(const std::string& folder)
     std::error_code failed;
     if (!std::filesystem::exists(folder, failed))
         return Failure{toWide(std::generic_category().message(failed ? failed.value() : ENOENT))};
-    NSBundle* bundle = bundleAt(folder);
-    if (bundle &&
-        !std::filesystem::equivalent([[bundle bundlePath] fileSystemRepresentation], folder, failed))
-        // GNUstep answers with the bundle that it has opened before under the same identifier.
-        return Failure{L"the bundle \"" + NSStringToWstring([bundle bundlePath]) +
-                       L"\" has the same identifier"};
-    NSString* program = [bundle executablePath];
-    if (!program)
-        return Failure{L"the bundle holds no program for this system"};
-    return std::string([program fileSystemRepresentation]);
+    if (auto checked = checkDescription(folder); !checked)
+        return checked.failure();
+    Result<std::string> program = Failure{};
+    const auto returned = catchObjectiveC([&] { program = askForProgram(folder); });
+    return returned ? program : Failure{L"the platform's bundles raised " + returned.sentence()};
 }
 
-bool loadBundle(const std::string& folder)
+Result<> loadBundle(const std::string& folder)
 {
     const AutoreleasePool pool;
-    return [bundleAt(folder) load] == YES;
+    bool loaded = false;
+    const auto returned = catchObjectiveC([&] { loaded = [bundleAt(folder) load] == YES; });
+    if (!returned)
+        return Failure{returned.sentence(), kBundleRaised};
+    return loaded ? Result<>() : Failure{L"the platform does not accept it as a bundle", kBundleNotAccepted};
 }
 
-void unloadBundle(const std::string& folder)
+Result<> unloadBundle(const std::string& folder)
 {
     const AutoreleasePool pool;
-    [bundleAt(folder) unload];
+    const auto returned = catchObjectiveC([&] { [bundleAt(folder) unload]; });
+    return returned ? returned : Failure{returned.sentence(), kBundleRaised};
 }
 } // namespace tessel

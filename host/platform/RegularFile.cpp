@@ -45,6 +45,12 @@ void RegularFile::refuse(Failure failure)
     mDescriptor = -1;
 }
 
+bool RegularFile::keepsItsSize() const
+{
+    struct stat status = {};
+    return fstat(mDescriptor, &status) == 0 && static_cast<std::uint64_t>(status.st_size) == mSize;
+}
+
 void RegularFile::readHead() const
 {
     const ssize_t length = pread(mDescriptor, mHead.data(), mHead.size(), 0);

@@ -40,6 +40,11 @@ public:
 
     const FileIdentity& identity() const { return mIdentity; }
     std::uint64_t size() const { return mSize; }
+    // Whether that is still so.
+    bool keepsItsSize() const;
+
+    // While the file is open.
+    int descriptor() const { return mDescriptor; }
 
     // Fills the buffer from an offset; false when the file does not hold that many bytes there.
     bool read(std::uint64_t offset, void* buffer, std::size_t size) const;

@@ -22,6 +22,8 @@ Profiles::Profiles(Registry& registry, const std::wstring& productRoot)
     if (!mRegistry.read(mKey, kCurrentProfileValue))
         // What is wrong is told by `canStore`.
         static_cast<void>(mRegistry.write(mKey, kCurrentProfileValue, kFirstProfile));
+    // The rest of the start takes its time, and other sessions may start too.
+    mRegistry.storeSoFar();
 }
 
 std::wstring Profiles::current() const

@@ -5,6 +5,9 @@
 #include <algorithm>
 #include <utility>
 
+#include "host/registry/Schema.h"
+#include "host/registry/SoundCopy.h"
+#include "host/registry/Soundness.h"
 #include "host/registry/Statements.h"
 #include "host/text/Unicode.h"
 
@@ -17,12 +20,22 @@ constexpr std::uintptr_t kFirstHandle = 0x1000;
 // later, so that a full disk shows at the write that it hits and the caller can tell its user.
 constexpr unsigned kWritesFlushedAtOnce = 64;
 
+// Columns of what the statements find, after the row's number and whether it is what was stored.
+constexpr int kThird = 2;
+constexpr int kFourth = 3;
+
 std::wstring_view takePart(std::wstring_view& path)
 {
     const std::size_t end = std::min(path.find(L'\\'), path.size());
     const std::wstring_view part = path.substr(0, end);
     path.remove_prefix(std::min(end + 1, path.size()));
     return part;
+}
+
+// The store has tried for ten seconds, and would for every row.
+bool isLockRefused(int status)
+{
+    return status == SQLITE_PROTOCOL;
 }
 
 Failure noSuchValue()
@@ -45,14 +58,13 @@ Registry::Registry(std::filesystem::path file, std::chrono::milliseconds busyTim
 Registry::~Registry()
 {
     static_cast<void>(endOfCommand()); // who wants to know whether it was stored has asked before
-    mStatements.reset();
-    sqlite3_close(mDatabase);
+    close();
 }
 
 Registry::Key Registry::findChild(Key parent, std::wstring_view name)
 {
     Statement& find = mStatements->findKey;
-    if (!isRow(find.bind(parent).bind(foldCase(name)).step()))
+    if (step(find.bind(parent).bind(foldCase(name))) != SQLITE_ROW)
         return kNoKey;
     const Key key = find.number(0);
     find.reset();
@@ -116,8 +128,8 @@ std::vector<std::wstring> Registry::subKeys(Key key)
     beginReading();
     Statement& list = mStatements->subKeys;
     list.bind(key);
-    while (isRow(list.step()))
-        names.push_back(list.text(0));
+    for (std::int64_t last = 0; isNext(list, last);)
+        names.push_back(list.text(kThird));
     return names;
 }
 
@@ -127,6 +139,8 @@ Result<> Registry::removeKey(Key key)
         return Failure{L"Only a key below the root can be removed.", ERROR_INVALID_PARAMETER};
     if (auto writing = beginWriting(); !writing)
         return writing;
+    if (auto sound = checkBeforeRemoval(); !sound)
+        return sound;
     mCursor = {};
     return finishWrite(mStatements->deleteKey.bind(key).run());
 }
@@ -136,11 +150,12 @@ Result<std::wstring> Registry::readValue(Key key, std::wstring_view name)
     if (!mDatabase)
         return noSuchValue();
     lookInto(key);
+    mWork.count();
     Statement& read = mStatements->readValue;
-    const int status = read.bind(key).bind(foldCase(name)).step();
-    if (!isRow(status))
+    const int status = step(read.bind(key).bind(foldCase(name)));
+    if (status != SQLITE_ROW)
         return status == SQLITE_DONE ? noSuchValue() : Failure{mCommand.sentence(), ERROR_READ_FAULT};
-    std::wstring data = read.text(0);
+    std::wstring data = read.text(kThird);
     read.reset();
     return data;
 }
@@ -156,6 +171,8 @@ Result<> Registry::removeValue(Key key, std::wstring_view name)
 {
     if (auto writing = beginWriting(); !writing)
         return writing;
+    if (auto sound = checkBeforeRemoval(); !sound)
+        return sound;
     mCursor = {};
     auto removed = finishWrite(mStatements->deleteValue.bind(key).bind(foldCase(name)).run());
     if (removed && sqlite3_changes(mDatabase) == 0)
@@ -171,11 +188,12 @@ Result<std::wstring> Registry::valueName(Key key, DWORD index)
     const bool next = mCursor.key == key && index == mCursor.index + 1;
     Statement& find = next || index == 0 ? mStatements->nextValue : mStatements->valueAt;
     find.bind(key).bind(next ? mCursor.sequence : std::int64_t{index});
+    std::int64_t sequence = next ? mCursor.sequence : 0;
     // A store that cannot be read has no more items either: whoever walks it must come to an end.
-    if (!isRow(find.step()))
+    if (!isNext(find, sequence))
         return noMoreValues();
-    mCursor = {key, index, find.number(0)};
-    std::wstring name = find.text(1);
+    mCursor = {key, index, sequence};
+    std::wstring name = find.text(kThird);
     find.reset();
     return name;
 }
@@ -188,8 +206,8 @@ std::vector<Registry::Value> Registry::values(Key key)
     lookInto(key);
     Statement& list = mStatements->values;
     list.bind(key);
-    while (isRow(list.step()))
-        found.push_back({list.text(0), list.text(1)});
+    for (std::int64_t last = 0; isNext(list, last);)
+        found.push_back({list.text(kThird), list.text(kFourth)});
     return found;
 }
 
@@ -212,14 +230,45 @@ Result<> Registry::beginWriting()
 {
     if (!mCanStore)
         return mCanStore;
+    mWork.count();
+    if (mCommand && mWork.isInterrupted())
+        return fail(SQLITE_INTERRUPT, L"written");
     if (!mCommand || mWriting)
         return mCommand;
     // What was read by now is of a moment that may be over; the writes are to stand on what is stored now.
     commit();
+    if (auto there = checkPlace(); !there)
+        return there;
     mWrites = 0;
-    const int status = mStatements->begin.run();
+    int status = mStatements->begin.run();
     mWriting = status == SQLITE_DONE;
-    return mWriting ? Result<>() : fail(status, L"written");
+    if (mWriting)
+        status = mStatements->mark.run();
+    return status == SQLITE_DONE ? Result<>() : fail(status, L"written");
+}
+
+// What is written to a file that has lost its name is lost with it.
+Result<> Registry::checkPlace()
+{
+    int moved = 0;
+    sqlite3_file_control(mDatabase, "main", SQLITE_FCNTL_HAS_MOVED, &moved);
+    if (moved == 0)
+        return {};
+    return giveUp(
+        {L"Nothing more can be stored in the registry " + toWide(mFile.string()) +
+             L" in this session: it was removed, or another file was put in its place. Start Tessel "
+             L"again.",
+         ERROR_WRITE_FAULT});
+}
+
+// What a removal rests on was read, and damage may have left some of it out.
+Result<> Registry::checkBeforeRemoval()
+{
+    if (mLookedAt)
+        return {};
+    const auto sound = checkSoundness(mDatabase, kSchemaVersion);
+    mLookedAt = static_cast<bool>(sound);
+    return sound ? sound : giveUp(damage(sound.sentence()));
 }
 
 // Where this fails, the reading that follows says so.
@@ -250,13 +299,69 @@ Result<> Registry::finishWrite(int status)
     return status == SQLITE_OK || status == SQLITE_BUSY ? Result<>() : fail(status, L"written");
 }
 
-// What could not be read must not be mistaken for what is not there and then be overwritten: no write of the
-// command is stored after that.
-bool Registry::isRow(int status)
+// What could not be read must not be mistaken for what is not there and then be overwritten. The command's
+// end tells it. Every row says in its second column whether it is what was stored; one that is not is no row.
+int Registry::step(Statement& statement)
 {
-    if (status != SQLITE_ROW && status != SQLITE_DONE)
-        static_cast<void>(fail(status, L"read")); // the command's end tells it
-    return status == SQLITE_ROW;
+    int status = mCannotLock ? SQLITE_PROTOCOL : SQLITE_INTERRUPT;
+    if (mCannotLock || mWork.isInterrupted())
+        statement.reset();
+    else
+        status = statement.step();
+    if (status == SQLITE_DONE || (status == SQLITE_ROW && statement.number(1) == 1))
+        return status;
+    if (status != SQLITE_ROW)
+    {
+        mCannotLock = isLockRefused(status);
+        static_cast<void>(failRead(toWide(sqlite3_errstr(status)), status));
+        return status;
+    }
+    statement.reset();
+    static_cast<void>(failRead(L"a row of it is not what was stored there", SQLITE_CORRUPT));
+    return SQLITE_CORRUPT;
+}
+
+// Of rows that come in the order of their first column, which only an index that is damaged does not keep: it
+// could lead round and round.
+bool Registry::isNext(Statement& statement, std::int64_t& last)
+{
+    mWork.count();
+    if (step(statement) != SQLITE_ROW)
+        return false;
+    if (const std::int64_t number = statement.number(0); number > last)
+    {
+        last = number;
+        return true;
+    }
+    statement.reset();
+    static_cast<void>(failRead(L"an index of it is out of order", SQLITE_CORRUPT));
+    return false;
+}
+
+// Nothing is written any more: who asked knows less than is stored, and will know no more.
+Failure Registry::failRead(const std::wstring& words, int status)
+{
+    const std::wstring file = toWide(mFile.string());
+    const bool damaged = (status & 0xFF) == SQLITE_CORRUPT || (status & 0xFF) == SQLITE_NOTADB;
+    mDamaged = mDamaged || damaged;
+    mLookedAt = false;
+    const std::wstring help = damaged ? helpAgainstDamage(mFile) : L"Start Tessel again.";
+    Failure failure =
+        giveUp({L"The registry " + file + L" could not be read: " + words +
+                    L". Nothing more is stored in this session, so that nothing is lost. " + help,
+                ERROR_READ_FAULT});
+    return failure;
+}
+
+// For the rest of the session. The command that it happens in tells it, unless it has failed before.
+Failure Registry::giveUp(Failure failure)
+{
+    if (mCanStore)
+        mCanStore = failure;
+    if (mCommand)
+        mCommand = std::move(failure);
+    undoCommand();
+    return mCommand.failure();
 }
 
 // Undoes the command at once: until it ends it reads what was stored before, and not what half a command
@@ -274,10 +379,15 @@ Failure Registry::fail(int status, const wchar_t* done)
     mCommand = Failure{L"The registry " + toWide(mFile.string()) + L" could not be " + done + L": " +
                            toWide(words) + L". What was stored before is unchanged.",
                        statusOf(status)};
+    undoCommand();
+    return mCommand.failure();
+}
+
+void Registry::undoCommand()
+{
     rollBack();
     mCursor = {};
     closeHandlesOfLostKeys();
-    return mCommand.failure();
 }
 
 void Registry::rollBack()
@@ -305,15 +415,19 @@ void Registry::commit()
 {
     if (sqlite3_get_autocommit(mDatabase))
         return;
-    if (const int status = mStatements->commit.run(); status != SQLITE_DONE)
+    const int status = mStatements->commit.run();
+    mHasStored = mHasStored || (mWriting && status == SQLITE_DONE);
+    if (status != SQLITE_DONE)
         static_cast<void>(fail(status, L"written")); // the command's end tells it
     mWriting = false;
 }
 
 void Registry::storeSoFar()
 {
-    if (mDatabase)
-        commit();
+    if (!mDatabase)
+        return;
+    commit();
+    mWork.end();
 }
 
 Result<> Registry::endOfCommand()
@@ -321,6 +435,7 @@ Result<> Registry::endOfCommand()
     if (!mDatabase)
         return {};
     commit();
+    mWork.end();
     mOpenedForWriting.clear();
     return std::exchange(mCommand, {});
 }

@@ -9,6 +9,11 @@
 // the store could not be written or read, all that the command wrote is undone and the rest of its writes
 // fail too.
 //
+// Each row carries a checksum, and the file is looked at as a whole when it is opened after a session that
+// did not end in good order, or when that costs little, and at the latest before the first removal. Once
+// anything could not be read, nothing is written until the registry is opened again: what an application
+// knows may be less than what is stored. A copy of the last sound state stands beside the file.
+//
 // The codes of failures are those of the Windows-style registry calls (wincompat/wintypes.h).
 #pragma once
 
@@ -23,14 +28,18 @@
 #include <string_view>
 #include <unordered_map>
 #include <unordered_set>
+#include <utility>
 #include <vector>
 
+#include "host/registry/LongWork.h"
 #include "host/text/Result.h"
 
 struct sqlite3;
 
 namespace tessel
 {
+class Statement;
+
 class Registry
 {
 public:
@@ -46,7 +55,7 @@ public:
     };
 
     // Opens the file or makes it. A file that cannot be used is left as it is: reads then find nothing and
-    // writes fail. A file marked read-only is only read.
+    // writes fail. A file that is damaged or may not be written is only read.
     // A write waits that long for another process that is writing, and then fails.
     explicit Registry(std::filesystem::path file, std::chrono::milliseconds busyTimeout = kBusyTimeout);
     ~Registry();
@@ -55,6 +64,9 @@ public:
 
     // Whether anything can be stored; one sentence about why not.
     const Result<>& canStore() const { return mCanStore; }
+
+    // What a person should know although the registry can be used: a sentence, or an empty text.
+    const std::wstring& notice() const { return mNotice; }
 
     // Paths are relative to `from`; the parts are separated by one backslash, empty parts are passed over.
     Key find(std::wstring_view path, Key from = kRoot);
@@ -84,6 +96,20 @@ public:
     // command's, and is told at its end.
     void storeSoFar();
 
+    // Makes the copy of the last sound state, if something was stored since the last one and the file is
+    // known to be sound. A failure is a whole sentence.
+    Result<> keepCopy();
+
+    // Puts the copy in the place of a registry that is damaged, and reads it from now on. Answers a sentence
+    // about it. Nothing can be stored before the next session: what applications have read is of before.
+    Result<std::wstring> restoreCopy();
+
+    // Says by this how far a command has come that reads or writes very many values.
+    void tellProgressBy(LongWork::Say say) { mWork.tellBy(std::move(say)); }
+
+    // Makes such a command fail, as a store that cannot be read does. Safe in a signal handler.
+    void interrupt() noexcept { mWork.interrupt(); }
+
     // Handles for the registry calls. A handle that is not open is recognised, never followed.
     HKEY openHandle(Key key);
     std::optional<Key> keyOf(HKEY handle) const;
@@ -99,9 +125,23 @@ private:
     };
 
     void open();
+    void close();
+    void refuse(const Result<>& reason);
+    void forgetAll();
+    Result<> makeMissingFile();
     Result<> openFile();
+    Result<> connect(const std::string& name, int flags);
+    void leaveSharedLog();
+    Result<> openWithoutJournal(const Failure& reason);
+    Result<> readIntoMemory();
     Result<int> checkOrigin();
     Result<> prepare();
+    Result<> bringUpToDate(int version);
+    Result<> prepareStatements();
+    Result<> chooseJournal();
+    void lookAtAll(int version);
+    void renewCopy(bool changed);
+    Failure damage(const std::wstring& reason);
     Key findChild(Key parent, std::wstring_view name);
     Result<Key> createChild(Key parent, std::wstring_view name);
     Result<> beginWriting();
@@ -109,18 +149,31 @@ private:
     void lookInto(Key key);
     void commit();
     void rollBack();
+    Result<> checkBeforeRemoval();
+    Result<> checkPlace();
     Result<> finishWrite(int status);
-    bool isRow(int status);
+    int step(Statement& statement);
+    bool isNext(Statement& statement, std::int64_t& last);
     Failure fail(int status, const wchar_t* done);
+    Failure failRead(const std::wstring& words, int status);
+    Failure giveUp(Failure failure);
+    void undoCommand();
     void closeHandlesOfLostKeys();
 
     std::filesystem::path mFile;
     std::chrono::milliseconds mBusyTimeout;
     Result<> mCanStore;
+    std::wstring mNotice;
     sqlite3* mDatabase = nullptr;
     bool mReadOnly = false;
+    bool mLeftOpen = false;  // a session has left its journal
+    bool mLookedAt = false;  // the file is known to be sound
+    bool mHasStored = false; // since the copy was made
+    bool mDamaged = false;
+    bool mCannotLock = false; // for as long as the session lasts: the file system refuses
     std::unique_ptr<Statements> mStatements;
     Cursor mCursor;
+    LongWork mWork;
     Result<> mCommand;                         // the running one, or what failed in it first
     bool mWriting = false;                     // the running transaction is one that writes
     unsigned mWrites = 0;                      // in it

@@ -4,6 +4,8 @@
 
 #include <sqlite3.h>
 
+#include <cstdint>
+#include <string>
 #include <utility>
 
 #include "host/registry/Registry.h"
@@ -15,24 +17,35 @@ struct Registry::Statements
 {
     Statement findKey, keyExists, insertKey, deleteKey, subKeys;
     Statement readValue, writeValue, deleteValue, values, nextValue, valueAt;
-    Statement begin, beginReading, commit, rollback;
+    Statement begin, mark, beginReading, commit, rollback;
 
-    int prepare(sqlite3* database)
+    // `mark` writes the number of the file, by which its journals are known. A row that is found comes with
+    // whether it is what was stored under what was asked for: an index may lead to another one.
+    int prepare(sqlite3* database, std::int64_t fileNumber)
     {
+        const std::string marking = "PRAGMA application_id=" + std::to_string(fileNumber);
         const std::pair<Statement&, const char*> all[] = {
-            {findKey, "SELECT id FROM key WHERE parent=? AND fold=? AND id<>1"},
+            {findKey,
+             "SELECT id, sum IS row_sum(?1, name, ?2) FROM key WHERE parent=?1 AND fold=?2 AND id<>1"},
             {keyExists, "SELECT 1 FROM key WHERE id=?"},
-            {insertKey, "INSERT INTO key(parent,name,fold) VALUES(?,?,?)"},
+            {insertKey, "INSERT INTO key(parent, name, fold, sum) VALUES(?1, ?2, ?3, row_sum(?1, ?2, ?3))"},
             {deleteKey, "DELETE FROM key WHERE id=?"},
-            {subKeys, "SELECT name FROM key WHERE parent=? AND id<>1 ORDER BY id"},
-            {readValue, "SELECT data FROM value WHERE key=? AND fold=?"},
-            {writeValue, "INSERT INTO value(key,name,fold,data) VALUES(?,?,?,?)"
-                         " ON CONFLICT(key,fold) DO UPDATE SET data=excluded.data"},
+            {subKeys, "SELECT id, sum IS row_sum(?1, name, fold), name FROM key WHERE parent=?1 AND id<>1 "
+                      "ORDER BY id"},
+            {readValue,
+             "SELECT seq, sum IS row_sum(?1, name, ?2, data), data FROM value WHERE key=?1 AND fold=?2"},
+            {writeValue, "INSERT INTO value(key, name, fold, data, sum)"
+                         " VALUES(?1, ?2, ?3, ?4, row_sum(?1, ?2, ?3, ?4)) ON CONFLICT(key, fold)"
+                         " DO UPDATE SET data=?4, sum=row_sum(?1, value.name, ?3, ?4)"},
             {deleteValue, "DELETE FROM value WHERE key=? AND fold=?"},
-            {values, "SELECT name,data FROM value WHERE key=? ORDER BY seq"},
-            {nextValue, "SELECT seq,name FROM value WHERE key=? AND seq>? ORDER BY seq LIMIT 1"},
-            {valueAt, "SELECT seq,name FROM value WHERE key=? ORDER BY seq LIMIT 1 OFFSET ?"},
+            {values, "SELECT seq, sum IS row_sum(?1, name, fold, data), name, data FROM value WHERE key=?1"
+                     " ORDER BY seq"},
+            {nextValue, "SELECT seq, sum IS row_sum(?1, name, fold, data), name FROM value"
+                        " WHERE key=?1 AND seq>?2 ORDER BY seq LIMIT 1"},
+            {valueAt, "SELECT seq, sum IS row_sum(?1, name, fold, data), name FROM value"
+                      " WHERE key=?1 ORDER BY seq LIMIT 1 OFFSET ?2"},
             {begin, "BEGIN IMMEDIATE"},
+            {mark, marking.c_str()},
             {beginReading, "BEGIN"},
             {commit, "COMMIT"},
             {rollback, "ROLLBACK"}};

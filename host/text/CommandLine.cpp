@@ -6,6 +6,7 @@
 #include <tessel/tsformat.h>
 
 #include "host/text/Running.h"
+#include "host/text/TerminalText.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -18,11 +19,18 @@ void CommandLine::print(std::wstring_view text)
 {
     if (text.empty())
         return;
-    mWrite(toUtf8(withReadableBytes(text)));
-    const auto lastBreak = text.find_last_of(L"\r\n");
-    if (lastBreak != text.npos)
+    const std::wstring shown = forTerminal(text);
+    mWrite(toUtf8(shown));
+    const auto lastBreak = shown.rfind(L'\n');
+    if (lastBreak != shown.npos)
         mOpenLine.clear();
-    mOpenLine += text.substr(lastBreak == text.npos ? 0 : lastBreak + 1);
+    mOpenLine += shown.substr(lastBreak == shown.npos ? 0 : lastBreak + 1);
+}
+
+void CommandLine::returnToLineStart()
+{
+    mWrite("\r");
+    mOpenLine.clear();
 }
 
 void CommandLine::say(std::wstring_view sentence)

@@ -17,8 +17,11 @@ public:
 
     explicit CommandLine(Sink write);
 
-    // Prints the text as it stands.
+    // Prints the text as it stands, but for what a terminal would take for orders (see `forTerminal`).
     void print(std::wstring_view text);
+
+    // Goes back to where the open line begins: what is printed next stands in its place.
+    void returnToLineStart();
 
     // Prints one sentence on a line of its own: after a line break if something stands on the line already,
     // and with a line break after it.

@@ -27,7 +27,7 @@
 // Appends the file types that the dialogs offer, `TsOCFileFilter`s: all applications, then kind by kind.
 + (void)populateModrigFileFilter:(NSMutableArray*)filters;
 
-// Whether the file has the extension of an application kind. A path without one: message 2 and NO.
+// Whether the file has the extension of an application kind. A path without one: kCannotLoadFile and NO.
 + (BOOL)isValidFileForModrig:(NSString*)path;
 
 // The path at which the file is found, which may be another one of that name; nil when it is not found.

@@ -22,13 +22,13 @@ inline constexpr signed char kUnload = 0;
 // non-zero, in the History. A Lisp file is loaded each time it is asked for; a compiled module that is in the
 // list already answers kAlreadyLoaded. While Lisp is switched off, Lisp and macro files answer kNotLoaded
 // silently; any other failure is reported: by the loader's own messages and, with `reportFailure` non-zero,
-// by message 38. `loadAll` non-zero: all parts of a Lisp application, where the host knows how.
+// by kLoadFailed. `loadAll` non-zero: all parts of a Lisp application, where the host knows how.
 [[nodiscard]] int PerformModrig(CStdStr path, int addToHistory, signed char loadAll,
                                 signed char reportFailure);
 
 // Hands the file to the host's linker or Lisp, by its extension; `load` 0 unloads. The lists are not touched.
 // For Lisp, success means that the expressions are queued: what they do shows later. Files of other kinds are
-// refused with message 2.
+// refused with kCannotLoadFile.
 [[nodiscard]] bool LoadApplication(CStdStr path, signed char load, signed char loadAll);
 
 // The two roads of `LoadApplication`.

@@ -18,11 +18,11 @@ void PopulateLoadedApps();
 [[nodiscard]] std::vector<CStdStr> ApplicationsShownAsLoaded();
 
 // Whether the host has the compiled module loaded (asked by file name). True for files of every other kind. A
-// path without a dot: message 2 and false.
+// path without a dot: kCannotLoadFile and false.
 [[nodiscard]] bool ApplicationIsLoaded(CStdStr path);
 
 // Whether the compiled module may be unloaded. False for files of every other kind. A path without a dot:
-// message 2 and true.
+// kCannotLoadFile and true.
 [[nodiscard]] bool IsAppUnloadAble(CStdStr path);
 
 // An application that the user wants unloaded, and whether it could be unloaded when it was listed.

@@ -15,7 +15,7 @@ namespace ModrigUtils
 // The description of the filter last chosen, or an empty text.
 [[nodiscard]] CStdStr GetRegFileFilterListIndex();
 
-// Remembers the description of the chosen filter. A failure is told in message box 24.
+// Remembers the description of the chosen filter. A failure is told in a box, kFilterNotStored.
 [[nodiscard]] bool SetRegFileFilterListIndex(const CStdStr& filter);
 
 // Replaces the string with the module's own filters, "description|*.a;*.b|" one after the other, every entry

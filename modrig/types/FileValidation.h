@@ -6,7 +6,7 @@
 namespace ModrigUtils
 {
 // Whether the file has the extension of an application kind. A path without a dot, or ending with one:
-// message 2 and false; an unknown extension is refused silently.
+// kCannotLoadFile and false; an unknown extension is refused silently.
 [[nodiscard]] bool IsValidFileForModrig(const CStdStr& path);
 
 // The attributes of the file, or INVALID_FILE_ATTRIBUTES when it is not found. A file that is missing where
@@ -19,6 +19,6 @@ namespace ModrigUtils
 [[nodiscard]] bool IsTempInternetFile(const CStdStr& path);
 
 // Turns a URL into the path of a local copy. Any other path stays as it was given. When the fetch fails:
-// message 39, and the path is left without its closing separators. The second argument is not used.
+// kUrlNotFetched, and the path is left without its closing separators. The second argument is not used.
 void ValidateURLFile(CStdStr& path, void* reserved);
 } // namespace ModrigUtils

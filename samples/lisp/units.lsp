@@ -21,7 +21,7 @@
       (/ (* number from-size) to-size))))
 
 (defun units-number (number)
-  "Four significant digits, or all that stand before the point; at most nine behind it, to keep the columns."
+  "Four significant digits, or all that stand before the point; at most nine after it, to keep the columns."
   (let* ((exponent (floor (log number 10)))
          (decimals (max 0 (min 9 (- 3 exponent))))
          (text (format nil "~,vf" decimals (coerce number 'double-float))))

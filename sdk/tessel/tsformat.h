@@ -3,7 +3,7 @@
 // Conversions: %d %i %u %x %X %o %c %s %f %e %g with flags, width and precision as in C (the length modifiers
 // h, l, ll, j, z, t are accepted and change nothing: an argument brings its own size), and %% for one per
 // cent sign. A conversion without an argument left, or whose argument is of another kind, and anything else
-// behind a per cent sign, prints as it stands; such a misfit consumes no argument. %n is never obeyed. A text
+// after a per cent sign, prints as it stands; such a misfit consumes no argument. %n is never obeyed. A text
 // that is itself the format may therefore hold whatever a file name may hold.
 #pragma once
 

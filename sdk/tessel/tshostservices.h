@@ -28,7 +28,8 @@ public:
     // Makes a local copy of a remote file, of at most the host's size and within its time limit. Unless
     // `ignoreCache`, an earlier copy is taken. TS_FETCHED or TS_FROM_CACHE: `localPath` (capacity in
     // characters) holds the copy's full path. TS_FETCH_FAILED: nothing is left behind, and the reason
-    // stands on the command line.
+    // stands on the command line. The address may ask for a checksum (`#sha256=` and 64 hexadecimal
+    // digits), and carry a name and a password, which are neither told nor stored.
     virtual int fetchRemoteFile(const wchar_t* url, wchar_t* localPath, std::size_t capacity,
                                 bool ignoreCache) = 0;
 };

@@ -20,6 +20,7 @@ public:
 
     // Shows the text until the user answers, over `parent` (a window of the platform, or null for the active
     // one), and answers the button's code. Without a display the text is printed on the command line, marked
-    // as a message, and the first button counts as chosen.
+    // as a message, and the first button counts as chosen. So it does while the host starts, unless there is
+    // a `parent`: the text is then shown with all others when the start is over.
     virtual int show(const wchar_t* text, unsigned style, void* parent) = 0;
 };

@@ -4,6 +4,7 @@
 #include <limits>
 #include <string>
 
+#include "modrig/messages/MessageIds.h"
 #include "tests/support/ModuleTest.h"
 
 namespace
@@ -131,7 +132,7 @@ TEST_F(StdStr, TrimsOneCharacterFromEitherEnd)
     EXPECT_EQ(L" a ", CStdStr(L" a ").TrimLeft(L'*').TrimRight(L'*').Text());
 }
 
-TEST_F(StdStr, GivesTheTextBehindTheLastDotOfTheWholePath)
+TEST_F(StdStr, GivesTheTextAfterTheLastDotOfTheWholePath)
 {
     EXPECT_EQ(L"lsp", CStdStr(L"/a.b/tool.old.lsp").AfterLastDot().Text());
     EXPECT_EQ(L"old/tool", CStdStr(L"/dir.old/tool").AfterLastDot().Text());
@@ -155,7 +156,7 @@ TEST_F(StdStr, JoinsTexts)
 TEST_F(StdStr, LoadsFromTheCurrentResourceModuleWhenNoneIsNamed)
 {
     CStdStr text(L"before");
-    EXPECT_TRUE(text.Load(15));
+    EXPECT_TRUE(text.Load(ModrigMessages::kLispPrompt));
     EXPECT_EQ(L"Command:", text.Text());
 }
 
@@ -163,7 +164,7 @@ TEST_F(StdStr, LoadsFromTheModuleThatIsNamed)
 {
     host().resources.addModule(L"other.dll", {{15, L"other"}});
     CStdStr text;
-    EXPECT_TRUE(text.Load(15, host().resources.load(L"other.dll")));
+    EXPECT_TRUE(text.Load(ModrigMessages::kLispPrompt, host().resources.load(L"other.dll")));
     EXPECT_EQ(L"other", text.Text());
 }
 
@@ -174,7 +175,7 @@ TEST_F(StdStr, KeepsItsValueWhenTheTextToLoadIsMissingOrEmpty)
     EXPECT_FALSE(text.Load(4711));
     EXPECT_FALSE(text.Load(5000));
     host().resources.current = nullptr;
-    EXPECT_FALSE(text.Load(15));
+    EXPECT_FALSE(text.Load(ModrigMessages::kLispPrompt));
     EXPECT_EQ(L"before", text.Text());
 }
 
@@ -219,8 +220,8 @@ TEST_F(StdStr, LoadsATextThatIsNotEmptyWhateverItsFirstCharacter)
 TEST_F(StdStr, FormatsByTheTextOfAnId)
 {
     CStdStr text;
-    EXPECT_TRUE(text.Format(12, L"tool.lsp"));
-    EXPECT_EQ(Message(12, L"tool.lsp"), text.Text());
+    EXPECT_TRUE(text.Format(ModrigMessages::kOneUnloaded, L"tool.lsp"));
+    EXPECT_EQ(Message(ModrigMessages::kOneUnloaded, L"tool.lsp"), text.Text());
 }
 
 TEST_F(StdStr, FormatsNothingWhenTheIdIsMissing)

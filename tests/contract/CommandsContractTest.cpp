@@ -39,7 +39,7 @@ TEST_F(CommandsContract, RunsACommandByItsLocalName)
     EXPECT_EQ(runsOf(L"contracteins"), 1);
 }
 
-TEST_F(CommandsContract, RunsACommandByItsGlobalNameBehindAnUnderscore)
+TEST_F(CommandsContract, RunsACommandByItsGlobalNameAfterAnUnderscore)
 {
     EXPECT_EQ(add(L"CONTRACT", L"CONTRACTONE", L"CONTRACTEINS"), TSED_COMMAND_OK);
     EXPECT_EQ(runsOf(L"_CONTRACTONE"), 1);

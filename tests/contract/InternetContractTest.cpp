@@ -86,7 +86,7 @@ TEST_F(InternetContract, TakesTheEarlierCopyOfWhatItHasFetched)
     EXPECT_TRUE(isFile(path));
 }
 
-TEST_F(InternetContract, FetchesAnewWhenToldToIgnoreTheCache)
+TEST_F(InternetContract, FetchesAgainWhenToldToIgnoreTheCache)
 {
     const std::wstring url = host->serve(L"tool.lsp");
     const std::wstring path = fetch(url).path;
@@ -180,7 +180,7 @@ TEST_F(InternetContract, CutsAUrlThatDoesNotFit)
     EXPECT_TRUE(CProxyInet::GetProxyInet()->IsRemoteFile(path.c_str(), nullptr, kPathSize));
 }
 
-TEST_F(InternetContract, TouchesNothingBehindTheUrl)
+TEST_F(InternetContract, TouchesNothingAfterTheUrl)
 {
     const std::wstring path = fetch(host->serve(L"tool.lsp")).path;
     wchar_t url[8] = L"???????";

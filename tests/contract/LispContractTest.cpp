@@ -59,7 +59,7 @@ TEST_F(LispContract, EvaluatesQueuedExpressionsWhenIdleAndInOrder)
     EXPECT_FALSE(contains(newlySeen(), L"one;"));
 }
 
-TEST_F(LispContract, GoesOnBehindAnExpressionThatFails)
+TEST_F(LispContract, GoesOnAfterAnExpressionThatFails)
 {
     newlySeen();
     queue(prompt(L"one"));

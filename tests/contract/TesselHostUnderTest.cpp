@@ -151,7 +151,7 @@ public:
 
     bool type(const std::wstring& command) override { return mHost.run(command); }
 
-    // Any line will do: what is queued is evaluated behind it.
+    // Any line will do: what is queued is evaluated after it.
     void becomeIdle() override { mHost.run(L"(princ)"); }
 
     void tellLisp(const std::wstring&, const std::optional<std::wstring>&) override {}

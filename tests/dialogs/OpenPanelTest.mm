@@ -125,7 +125,7 @@ TEST_F(OpenPanel, OpensInTheNearestFolderThatIsLeftOfTheRememberedOne)
     EXPECT_EQ(mFolder.path().wstring(), wide([mPanel directory]));
 }
 
-TEST_F(OpenPanel, FiltersAnewInsideAPackageThatTheFilterHides)
+TEST_F(OpenPanel, FiltersAgainInsideAPackageThatTheFilterHides)
 {
     mFolder.write("tool.bundle/inner.lsp", "");
     openIn(mFolder / "tool.bundle");
@@ -196,7 +196,7 @@ TEST_F(OpenPanel, HidesEverythingWithoutAFilter)
     EXPECT_FALSE(shows(file("tool.lsp")));
 }
 
-TEST_F(OpenPanel, FiltersTheListingAnewInTheSameFolder)
+TEST_F(OpenPanel, FiltersTheListingAgainInTheSameFolder)
 {
     for (const char* name : {"one.lsp", "two.zmb", "three.txt"})
         file(name);
@@ -287,7 +287,7 @@ TEST_F(OpenPanel, LoadsWithReturnAndClosesWithEscape)
     EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"one.zmb")));
 }
 
-TEST_F(OpenPanel, ForgetsTheSelectedFileWhenTheListingIsFilteredAnew)
+TEST_F(OpenPanel, ForgetsTheSelectedFileWhenTheListingIsFilteredAgain)
 {
     for (const char* name : {"one.lsp", "two.zmb"})
         file(name);

@@ -14,7 +14,7 @@ using testing::ElementsAre;
 
 namespace
 {
-std::wstring nameOf(NSView* view)
+std::wstring stopName(NSView* view)
 {
     if ([view isKindOfClass:[NSPopUpButton class]])
         return L"menu " + wide([(NSPopUpButton*)view title]);
@@ -30,10 +30,10 @@ std::wstring nameOf(NSView* view)
 
 std::vector<std::wstring> stopsFrom(NSView* first)
 {
-    std::vector<std::wstring> stops = {nameOf(first)};
+    std::vector<std::wstring> stops = {stopName(first)};
     for (NSView* view = [first nextValidKeyView]; view && view != first && stops.size() < 40;
          view = [view nextValidKeyView])
-        stops.push_back(nameOf(view));
+        stops.push_back(stopName(view));
     return stops;
 }
 

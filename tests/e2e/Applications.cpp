@@ -10,10 +10,12 @@ namespace
 constexpr std::size_t kNameColumn = 24;
 constexpr std::size_t kFolderColumn = 48;
 
-std::string padded(std::string text, std::size_t width)
+// The width is in characters, which begin with every byte but 10xxxxxx.
+std::string padded(const std::string& text, std::size_t width)
 {
-    text.resize(std::max(text.size(), width), ' ');
-    return text;
+    const auto length = static_cast<std::size_t>(
+        std::ranges::count_if(text, [](char byte) { return (byte & '\xC0') != '\x80'; }));
+    return text + std::string(width - std::min(width, length), ' ');
 }
 } // namespace
 
@@ -47,7 +49,7 @@ std::string modrigBundle()
     return MODRIG_BUNDLE;
 }
 
-std::string quoted(const std::string& text)
+std::string inQuotes(const std::string& text)
 {
     std::string result = "\"";
     for (const char character : text)
@@ -57,7 +59,7 @@ std::string quoted(const std::string& text)
 
 std::string setInSuite(const std::string& name, const std::string& data)
 {
-    return std::string("REGISTRY SET ") + kSuiteKey + " " + name + " " + quoted(data);
+    return std::string("REGISTRY SET ") + kSuiteKey + " " + name + " " + inQuotes(data);
 }
 
 std::vector<std::string> byArguments(const std::vector<std::string>& commands)
@@ -99,12 +101,35 @@ std::string linkerRefuses(const std::string& path, const std::string& reason)
     return "The application \"" + path + "\" is not loaded: " + reason + ".\n";
 }
 
+std::string notOfAType(const std::string& path)
+{
+    return "“" + path + "” is not of a type that can be loaded.";
+}
+
+std::string listedAsNotLoaded(const std::vector<NotLoaded>& files)
+{
+    std::string text = "Not loaded in this session:\n";
+    for (const auto& [file, why] : files)
+        text += listed(file, why);
+    return text;
+}
+
 std::string modrigDoesNotKnow(const std::string& path)
 {
-    return "Message: “" + path + "” is not of a type that can be loaded.\n";
+    return "Message: " + notOfAType(path) + "\n";
 }
 
 std::string modrigDoesNotLoad(const std::string& path)
 {
     return "Message: “" + path + "” could not be loaded.\n";
+}
+
+std::string startSummary(const std::vector<NotLoaded>& files)
+{
+    std::string text = files.size() == 1 ? "Message: 1 application"
+                                         : "Message: " + std::to_string(files.size()) + " applications";
+    text += " could not be loaded:\n";
+    for (const auto& [file, why] : files)
+        text.append("  ").append(file).append(": ").append(why).append("\n");
+    return text;
 }

@@ -28,7 +28,7 @@ std::string lispFixture(const std::string& name);
 std::string modrigBundle();
 
 // An argument of a command, in quotes.
-std::string quoted(const std::string& text);
+std::string inQuotes(const std::string& text);
 
 // A command that puts a value into the stored Startup Suite.
 std::string setInSuite(const std::string& name, const std::string& data);
@@ -48,3 +48,15 @@ std::string listed(const std::string& path, const std::string& state = kMayBeUnl
 std::string linkerRefuses(const std::string& path, const std::string& reason);
 std::string modrigDoesNotKnow(const std::string& path);
 std::string modrigDoesNotLoad(const std::string& path);
+
+// What the boxes about a file say of which Modrig does not know the type.
+std::string notOfAType(const std::string& path);
+
+// A file that was not loaded, and why.
+using NotLoaded = std::pair<std::string, std::string>;
+
+// What APPS says of them at its end.
+std::string listedAsNotLoaded(const std::vector<NotLoaded>& files);
+
+// What the host says when a start is over in which files were not loaded: each with its reason, to the stop.
+std::string startSummary(const std::vector<NotLoaded>& files);

@@ -25,7 +25,7 @@ protected:
         session.startBy("exec '" + (copy / "Tessel").string() + "' \"$@\"");
     }
 
-    // What is said behind the banner.
+    // What is said after the banner.
     HostResult run(const std::vector<std::string>& commands) const
     {
         HostResult result = session.run(commands);
@@ -44,9 +44,17 @@ protected:
     {
         const auto result = run({"APPS", "MODRIG"});
         EXPECT_EQ(result.exitStatus, 1);
-        EXPECT_EQ(result.output, refusal(reason) + "Command: APPS\nNo application is loaded.\n" +
+        EXPECT_EQ(result.output, refusal(reason) + notStarted() +
                                      "Command: MODRIG\nUnknown command \"MODRIG\". Type HELP for the list of "
                                      "commands.\n");
+    }
+
+    // The summary of the start, and what APPS says.
+    std::string notStarted() const
+    {
+        return startSummary({{bundle, "its entry point answered 3."}}) +
+               "Command: APPS\nNo application is loaded.\n" +
+               listedAsNotLoaded({{bundle, "its entry point answered 3"}});
     }
 
     HostSession session;
@@ -83,8 +91,7 @@ TEST_F(DamagedTexts, ThatAreNoResourceModuleKeepModrigFromStarting)
     const auto result = run({"APPS"});
     EXPECT_THAT(result.output,
                 HasSubstr("The resource module \"" + texts.string() + "\" cannot be opened: "));
-    EXPECT_TRUE(result.output.ends_with(linkerRefuses(bundle, "its entry point answered 3") +
-                                        "Command: APPS\nNo application is loaded.\n"))
+    EXPECT_TRUE(result.output.ends_with(linkerRefuses(bundle, "its entry point answered 3") + notStarted()))
         << result.output;
 }
 
@@ -100,7 +107,7 @@ TEST_F(DamagedTexts, ThatAreCutShortNeverEndTheHost)
         const std::string notOpened = "The resource module \"" + texts.string() + "\" cannot be opened: ";
         const std::string notLoaded = linkerRefuses(bundle, "its entry point answered 3");
         if (result.output.starts_with(notOpened))
-            EXPECT_THAT(result.output, HasSubstr(".\n" + notLoaded + "Command: APPS\nNo application"));
+            EXPECT_THAT(result.output, HasSubstr(".\n" + notLoaded + notStarted()));
         else
             EXPECT_TRUE(result.output.starts_with("Command: APPS\n" + listed(bundle))) << result.output;
         EXPECT_TRUE(result.output.ends_with("Command: VERSION\nTessel R21, reference host for Modrig\n"))

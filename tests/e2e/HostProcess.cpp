@@ -4,6 +4,7 @@
 #include <csignal>
 #include <cstdio>
 #include <cstring>
+#include <regex>
 #include <stdexcept>
 
 #include <fcntl.h>
@@ -81,6 +82,12 @@ int waitFor(pid_t process)
 }
 } // namespace
 
+std::string withoutTimes(const std::string& output)
+{
+    static const std::regex time(", loaded in [0-9.]+ m?s\n");
+    return std::regex_replace(output, time, "\n");
+}
+
 HostSession::HostSession()
 {
     std::filesystem::create_directories(mFolder / "home");
@@ -140,6 +147,8 @@ HostResult HostSession::start(const std::vector<std::string>& arguments, const s
     if (result.timedOut)
         kill(process, SIGKILL);
     result.exitStatus = waitFor(process);
+    if (!mKeepsTimes)
+        result.output = withoutTimes(result.output);
     return result;
 }
 

@@ -20,13 +20,16 @@ inline constexpr std::chrono::seconds kHostTimeLimit{60};
 
 struct HostResult
 {
-    std::string output; // what the host printed, errors included
+    std::string output; // what the host printed, errors included, without times
     int exitStatus = 0; // of a host that a signal ended: minus the signal's number
     bool timedOut = false;
 };
 
 // A variable of the environment with its value.
 using EnvironmentChange = std::pair<std::string, std::string>;
+
+// The output without the times that loading took, which differ from run to run: ", loaded in 0.4 ms".
+std::string withoutTimes(const std::string& output);
 
 class HostSession
 {
@@ -40,7 +43,7 @@ public:
     HostResult runScript(const std::string& lines) const;
     HostResult runPipe(const std::string& lines) const;
 
-    // Starts the host with these arguments behind `--profile-dir`, and gives it the text to read.
+    // Starts the host with these arguments after `--profile-dir`, and gives it the text to read.
     HostResult start(const std::vector<std::string>& arguments, const std::string& input = {}) const;
 
     // Arguments that are put in front of all others, such as "--safe".
@@ -51,6 +54,9 @@ public:
 
     // Changes the environment that the host is started in. It has no display from the beginning.
     void set(const std::string& variable, const std::string& value);
+
+    // Leaves in the output how long loading took.
+    void keepTimes() { mKeepsTimes = true; }
 
     const TemporaryFolder& folder() const { return mFolder; } // for the files of the test
     std::filesystem::path profile() const { return mFolder / mProfile; }
@@ -65,5 +71,6 @@ private:
     std::string mProfile = "profile";
     std::vector<std::string> mLauncher;
     std::vector<std::string> mAlways;
+    bool mKeepsTimes = false;
     std::vector<EnvironmentChange> mEnvironment;
 };

@@ -63,9 +63,9 @@ bool HostTerminal::readMore(Clock::time_point deadline)
     return true;
 }
 
-bool HostTerminal::shows(std::string_view text)
+bool HostTerminal::showsWithin(std::string_view text, std::chrono::milliseconds time)
 {
-    const auto deadline = Clock::now() + kHostTimeLimit;
+    const auto deadline = Clock::now() + time;
     std::size_t place = mOutput.find(text, mSeen);
     while (place == mOutput.npos)
     {

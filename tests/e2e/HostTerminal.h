@@ -22,8 +22,9 @@ public:
     // Keys as the terminal sends them: "\t" completes, "\r" is Return, kControlC and kControlD.
     void type(std::string_view keys) const;
 
-    // Waits until the text appears behind what was waited for before. False when the time is over.
-    bool shows(std::string_view text);
+    // Waits until the text appears after what was waited for before. False when the time is over.
+    bool shows(std::string_view text) { return showsWithin(text, kHostTimeLimit); }
+    bool showsWithin(std::string_view text, std::chrono::milliseconds time);
 
     // Waits for the end; the exit status as in HostResult. A host that does not end is killed.
     int waitForEnd();

@@ -75,11 +75,11 @@ TEST(RemovingTsLisp, WhenOffMakesCompiledAndPackagedLispUnknown)
     ASSERT_EQ(session.start({"--safe", "-c", "SETVAR REMOVINGTSLISP 0"}).exitStatus, 0);
     const auto result = session.run({"APPS", "(good)"});
     EXPECT_EQ(result.exitStatus, 0);
-    EXPECT_EQ(result.output,
-              kBanner + modrigDoesNotKnow(sample("calendar.qbc")) +
-                  modrigDoesNotLoad(sample("calendar.qbc")) + modrigDoesNotKnow(sample("survey.rpk")) +
-                  modrigDoesNotLoad(sample("survey.rpk")) + kGood + kLispReady + "Command: APPS\n" +
-                  listed(modrigBundle()) + listed(lispFixture("good.lsp"), "Lisp") + "Command: (good)\n42\n");
+    const std::vector<NotLoaded> refused = {{sample("calendar.qbc"), notOfAType(sample("calendar.qbc"))},
+                                            {sample("survey.rpk"), notOfAType(sample("survey.rpk"))}};
+    EXPECT_EQ(result.output, kBanner + (kGood + (kLispReady + startSummary(refused))) + "Command: APPS\n" +
+                                 listed(modrigBundle()) + listed(lispFixture("good.lsp"), "Lisp") +
+                                 listedAsNotLoaded(refused) + "Command: (good)\n42\n");
 }
 
 TEST(RemovingTsLisp, WhenOffLoadsLispByTheFunctionLoadAlone)

@@ -10,7 +10,7 @@ constexpr char kNoDisplay[] = "Tessel cannot open a window: there is no display.
 
 const std::string kListRecord = std::string("REGISTRY LIST ") + kRecordKey;
 const std::string kListCommands = kListRecord + "\\Commands";
-const std::string kNotLoaded = "Command: APPS\nNo application is loaded.\n";
+const std::string kNothingIsLoaded = "Command: APPS\nNo application is loaded.\n";
 
 std::string modrigLoaded()
 {
@@ -20,7 +20,7 @@ std::string modrigLoaded()
 class ModrigRecord : public testing::Test
 {
 protected:
-    // Runs the commands and answers what is said behind the banner.
+    // Runs the commands and answers what is said after the banner.
     std::string run(const std::vector<std::string>& commands) const
     {
         const auto result = session.run(commands);
@@ -46,7 +46,7 @@ protected:
 
     void setInRecord(const std::string& name, const std::string& data) const
     {
-        const std::string set = std::string("REGISTRY SET ") + kRecordKey + " " + name + " " + quoted(data);
+        const std::string set = std::string("REGISTRY SET ") + kRecordKey + " " + name + " " + inQuotes(data);
         ASSERT_EQ(session.start({"--safe", "-c", set}).exitStatus, 0);
     }
 
@@ -82,7 +82,7 @@ TEST_F(ModrigRecord, LosesTheStartWhenTheSuiteIsEmptied)
     storeSuite(session, {});
     EXPECT_EQ(run({"APPS"}), modrigLoaded()) << "loaded once more, for the record says so";
     EXPECT_EQ(record(), recordWith("4"));
-    EXPECT_EQ(run({"APPS"}), kNotLoaded);
+    EXPECT_EQ(run({"APPS"}), kNothingIsLoaded);
     EXPECT_EQ(record(), recordWith("4"));
 }
 
@@ -93,7 +93,7 @@ TEST_F(ModrigRecord, LetsTheCommandLoadModrig)
     storeSuite(session, {});
     run({"APPS"});
     EXPECT_EQ(run({"APPS", "modrig", "APPS"}),
-              kNotLoaded + "Command: modrig\n" + kNoDisplay + modrigLoaded());
+              kNothingIsLoaded + "Command: modrig\n" + kNoDisplay + modrigLoaded());
     EXPECT_EQ(record(), recordWith("4"));
 }
 
@@ -104,7 +104,7 @@ TEST_F(ModrigRecord, GetsTheStartBackWhenTheSuiteIsFilledAgain)
     storeSuite(session, {});
     run({"APPS"});
     storeSuite(session, {sample("primes.zmb")});
-    EXPECT_EQ(run({"APPS", "MODRIG", "APPS"}), kNotLoaded + "Command: MODRIG\n" + kPrimes + kNoDisplay +
+    EXPECT_EQ(run({"APPS", "MODRIG", "APPS"}), kNothingIsLoaded + "Command: MODRIG\n" + kPrimes + kNoDisplay +
                                                    modrigLoaded() + listed(sample("primes.zmb")));
     EXPECT_EQ(record(), recordWith("6"));
     EXPECT_EQ(run({"APPS"}), kPrimes + modrigLoaded() + listed(sample("primes.zmb")));
@@ -126,6 +126,9 @@ TEST_F(ModrigRecord, OfAModrigThatIsGoneIsTold)
     run({"APPS"});
     setInRecord("Module", "/nowhere/Modrig.bundle");
     const std::string refusal = linkerRefuses("/nowhere/Modrig.bundle", "No such file or directory");
-    EXPECT_EQ(run({"APPS"}), refusal + kPrimes + modrigLoaded() + listed(sample("primes.zmb")))
+    EXPECT_EQ(run({"APPS"}), refusal + kPrimes +
+                                 startSummary({{"/nowhere/Modrig.bundle", "No such file or directory."}}) +
+                                 modrigLoaded() + listed(sample("primes.zmb")) +
+                                 listedAsNotLoaded({{"/nowhere/Modrig.bundle", "No such file or directory"}}))
         << "the one in the PlugIns folder has no record and is loaded";
 }

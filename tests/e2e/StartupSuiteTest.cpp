@@ -25,7 +25,7 @@ constexpr char kFebruary2027[] = "   February 2027\n"
 class StartupSuite : public testing::Test
 {
 protected:
-    // Starts with the Suite and lists what is loaded; the output behind the banner.
+    // Starts with the Suite and lists what is loaded; the output after the banner.
     std::string startWith(const Paths& suite)
     {
         storeSuite(session, suite);
@@ -104,14 +104,17 @@ TEST_F(StartupSuite, LoadsADuplicateInOtherLetterCaseOnce)
                   listed(lispFixture("good.lsp"), "Lisp"));
 }
 
-TEST_F(StartupSuite, GoesOnBehindMissingFilesAndNamesThem)
+TEST_F(StartupSuite, GoesOnAfterMissingFilesAndNamesThem)
 {
     const std::string module = "/nowhere/at all/100%s.zmb";
     const std::string lisp = "/nowhere/größe.lsp";
-    EXPECT_EQ(startWith({module, lisp, sample("primes.zmb")}),
-              linkerRefuses(module, "No such file or directory") + modrigDoesNotLoad(module) + kPrimes +
-                  "Cannot load \"" + lisp + "\": No such file or directory.\n" + kLispReady + apps +
-                  listed(sample("primes.zmb")));
+    EXPECT_EQ(
+        startWith({module, lisp, sample("primes.zmb")}),
+        linkerRefuses(module, "No such file or directory") + kPrimes + "Cannot load \"" + lisp +
+            "\": No such file or directory.\n" + kLispReady +
+            startSummary({{module, "No such file or directory."}, {lisp, "No such file or directory."}}) +
+            apps + listed(sample("primes.zmb")) +
+            listedAsNotLoaded({{module, "No such file or directory"}, {lisp, "No such file or directory"}}));
 }
 
 TEST_F(StartupSuite, KeepsAnEntryWithoutADotAndDoesNotLoadIt)
@@ -124,13 +127,14 @@ TEST_F(StartupSuite, KeepsAnEntryWithoutADotAndDoesNotLoadIt)
 TEST_F(StartupSuite, RefusesWhatCannotBeLoadedAndGoesOn)
 {
     const std::string dotOfFolder = "/some.where/tool";
-    std::string refusals;
+    std::vector<NotLoaded> refusals;
     const Paths refused = {sample("survey.rpk"), sample("plates.mcp"), "/a/readme.txt", dotOfFolder};
     for (const std::string& path : refused)
-        refusals += modrigDoesNotKnow(path) + modrigDoesNotLoad(path);
+        refusals.emplace_back(path, notOfAType(path));
     Paths suite = refused;
     suite.push_back(sample("primes.zmb"));
-    EXPECT_EQ(startWith(suite), refusals + kPrimes + apps + listed(sample("primes.zmb")));
+    EXPECT_EQ(startWith(suite), kPrimes + startSummary(refusals) + apps + listed(sample("primes.zmb")) +
+                                    listedAsNotLoaded(refusals));
 }
 
 TEST_F(StartupSuite, WithModrigItselfLoadsItOnce)

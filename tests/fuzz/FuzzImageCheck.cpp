@@ -10,7 +10,7 @@
 
 namespace
 {
-// The file goes on behind the bytes of the fuzzer, so that not every header points behind its end.
+// The file goes on after the bytes of the fuzzer, so that not every header points past its end.
 constexpr std::uint64_t kFileSize = 1 << 20;
 
 bool liesInFile(const Elf64_Phdr& segment)

@@ -18,7 +18,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     if (size < kParts)
         return 0;
     const std::wstring path = wideText(data + kParts, size - kParts);
-    std::vector<std::vector<wchar_t>> parts; // each of its own size, so that a write behind its end is seen
+    std::vector<std::vector<wchar_t>> parts; // each of its own size, so that a write past its end is seen
     for (std::size_t i = 0; i < kParts; ++i)
         parts.emplace_back(std::size_t{data[i]} * 2, L'?');
     const auto buffer = [&](std::size_t i)
@@ -33,7 +33,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     {
         complete &= !part.empty();
         if (!part.empty())
-            whole += part.data(); // reads behind the buffer if it is not terminated
+            whole += part.data(); // reads past the buffer if it is not terminated
     }
     const std::wstring expected = status == 0 ? std::wstring(path.c_str()) : std::wstring();
     if (complete ? whole != expected : whole.size() > expected.size())

@@ -1,4 +1,4 @@
-// Wide text out of the fuzzer's bytes: each character is one of the bytes' few or, behind a 0xff, four bytes
+// Wide text out of the fuzzer's bytes: each character is one of the bytes' few or, after a 0xff, four bytes
 // as they are.
 #pragma once
 

@@ -20,7 +20,7 @@ TEST(CommandLine, KnowsWhatStandsOnTheOpenLine)
     output.commandLine().print(L"first\nsecond ");
     output.commandLine().print(L"part");
     EXPECT_EQ(output.commandLine().openLine(), L"second part");
-    output.commandLine().print(L"\r");
+    output.commandLine().returnToLineStart();
     EXPECT_TRUE(output.commandLine().atLineStart());
     output.commandLine().print(L"third");
     output.commandLine().print(L"\n");

@@ -30,7 +30,7 @@ public:
         return input != L"BAD";
     }
     bool isEnding() const override { return mEnding; }
-    void interrupt() noexcept override {}
+    bool interrupt() noexcept override { return false; }
     void requestEnd() noexcept override {}
 
     std::vector<std::wstring> inputs;
@@ -55,7 +55,7 @@ protected:
 };
 } // namespace
 
-TEST_F(Console, EchoesEachLineBehindThePrompt)
+TEST_F(Console, EchoesEachLineAfterThePrompt)
 {
     EXPECT_TRUE(runLines("HELP\n\nVERSION"));
     EXPECT_THAT(runner.inputs, ElementsAre(L"HELP", L"VERSION"));
@@ -114,5 +114,5 @@ TEST_F(Console, SaysWhyAScriptCannotBeRead)
                                           " cannot be read: No such file or directory."));
     output.clear();
     EXPECT_FALSE(output.commandLine().tell(console.runScript(folder.path())));
-    EXPECT_THAT(output.text(), HasSubstr("cannot be read: Is a directory."));
+    EXPECT_THAT(output.text(), HasSubstr("cannot be read: it is a folder, not a file."));
 }

@@ -16,7 +16,7 @@ class EndingRunner : public tessel::LineRunner
 public:
     bool run(const std::wstring&) override { return true; }
     bool isEnding() const override { return mEnding; }
-    void interrupt() noexcept override {}
+    bool interrupt() noexcept override { return false; }
     void requestEnd() noexcept override { mEnding = true; }
 
 private:

@@ -4,6 +4,8 @@
 
 #include <gmock/gmock.h>
 
+#include <sys/stat.h>
+
 #include "host/lisp/CompilerProgram.h"
 #include "tests/host_lisp/LispSession.h"
 #include "tests/support/TemporaryFolder.h"
@@ -12,6 +14,7 @@ using testing::AnyOf;
 using testing::ElementsAre;
 using testing::HasSubstr;
 using testing::IsEmpty;
+using testing::Not;
 
 namespace
 {
@@ -144,6 +147,40 @@ TEST_F(LispCompiler, TellsWhyItCannotReadOrWrite)
     EXPECT_EQ(bytesOf(source), kApplication);
     EXPECT_THAT(tesselc({compile("app", kApplication), "-o", (folder / "again.qbc").string()}).errors,
                 HasSubstr("is compiled already."));
+}
+
+TEST_F(LispCompiler, WritesIntoNoFileThatStandsBesideItsOutput)
+{
+    const auto other = write("other", "somebody else's");
+    for (const char* name : {"app.qbc.part", ".part-1", "app.qbc"})
+        std::filesystem::create_symlink(other, folder / name);
+    EXPECT_TRUE(
+        std::filesystem::is_regular_file(std::filesystem::symlink_status(compile("app", kApplication))));
+    EXPECT_EQ(bytesOf(other), "somebody else's");
+    for (const auto& entry : std::filesystem::directory_iterator(folder.path()))
+        EXPECT_THAT(entry.path().filename().string(),
+                    AnyOf("app.lsp", "app.qbc", "app.qbc.part", "other", ".part-1"));
+}
+
+TEST_F(LispCompiler, MakesFilesThatOthersMayReadAsIsUsual)
+{
+    const mode_t before = umask(022);
+    const auto compiled = compile("app", kApplication);
+    umask(before);
+    EXPECT_EQ(static_cast<unsigned>(std::filesystem::status(compiled).permissions()), 0644u);
+}
+
+TEST_F(LispCompiler, ShowsControlCharactersAsEscapes)
+{
+    const auto run = tesselc({"/nowhere/\x1b]0;taken\x07.lsp"});
+    EXPECT_EQ(run.status, 1);
+    EXPECT_THAT(run.errors, HasSubstr("/nowhere/\\x1B]0;taken\\x07.lsp"));
+    EXPECT_THAT(tesselc({"--\x1b]0;taken\x07"}).errors, HasSubstr("\\x1B]0;taken\\x07"));
+    EXPECT_THAT(
+        tesselc({write("app.lsp",
+                       "(eval-when (:compile-toplevel :load-toplevel :execute) (princ (code-char 27)))")})
+            .output,
+        Not(HasSubstr("\x1b")));
 }
 
 TEST_F(LispCompiler, RefusesWrongArgumentsAndExplainsItself)

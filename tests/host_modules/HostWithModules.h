@@ -10,6 +10,7 @@
 #include "host/applications/Bisecting.h"
 #include "host/applications/DynamicLinker.h"
 #include "host/applications/KeptOut.h"
+#include "host/applications/LoadOutcomes.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
 #include "host/messages/MessageBox.h"
@@ -61,7 +62,8 @@ protected:
     tessel::CallingApplication mCalls{mMarker};
     tessel::CommandStack mCommands{mCommandLine, mCalls};
     tessel::MessageBox mMessageBox{mCommandLine};
-    tessel::DynamicLinker mLinker{mCommandLine, mCalls, mCommands, mMessageBox, mAdmission};
+    tessel::LoadOutcomes mOutcomes;
+    tessel::DynamicLinker mLinker{mCommandLine, mCalls, mCommands, mMessageBox, mOutcomes, mAdmission};
     tessel::ResourceModules mResources{tessel::toWide((mFolder / "HostResources").native()), mCalls};
 
 private:

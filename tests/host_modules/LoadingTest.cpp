@@ -167,9 +167,22 @@ TEST_F(Loading, PassesOnTheSystemLinkersOwnWords)
 
 TEST_F(Loading, FindsAMissingFunctionInABundleWithObjectiveCBeforeItRuns)
 {
-    const auto bundle = fixture("UnresolvedClasses.bundle");
-    EXPECT_FALSE(load(bundle));
-    EXPECT_EQ(output(), notLoaded(bundle, "undefined symbol: aFunctionThatNobodyHas"));
+    for (const char* name : {"UnresolvedClasses.bundle", "ReadOnlyUnresolved.bundle"})
+    {
+        const auto bundle = fixture(name);
+        EXPECT_FALSE(load(bundle));
+        EXPECT_EQ(output(), notLoaded(bundle, "undefined symbol: aFunctionThatNobodyHas"));
+    }
+}
+
+TEST_F(Loading, NamesAMissingFunctionAsItStandsInTheSource)
+{
+    for (const char* name : {"UnresolvedMember.zmb", "UnresolvedMember.bundle"})
+    {
+        const auto path = fixture(name);
+        EXPECT_FALSE(load(path));
+        EXPECT_EQ(output(), notLoaded(path, "undefined symbol: moon::phaseOf(wchar_t const*, int)"));
+    }
 }
 
 TEST_F(Loading, LeavesFunctionsToTheirFirstCallWhenAskedTo)
@@ -214,6 +227,31 @@ TEST_F(Loading, RefusesALibraryWithoutAnEntryPointAndOneWhoseEntryPointFails)
     }
     EXPECT_EQ(names(), L"");
     EXPECT_STREQ(tsedGetAppName(), L"");
+}
+
+TEST_F(Loading, RefusesWhatThrowsWhileItIsBeingMappedNowAndLater)
+{
+    const std::pair<const char*, const char*> cases[] = {
+        {"ThrowsInMapping.zmb", "the ruler is broken"},
+        {"ThrowsInMapping.bundle", "the ruler is broken"},
+        {"ThrowsWithClasses.bundle", "the ruler is broken"},
+        {"RaisesInMapping.bundle", "NSInternalInconsistencyException: the kettle is empty"}};
+    for (const auto& [name, why] : cases)
+    {
+        const auto path = fixture(name);
+        EXPECT_FALSE(load(path));
+        EXPECT_EQ(
+            output(),
+            notLoaded(path, std::string("while it was being mapped, its code threw an exception: ") + why));
+        EXPECT_FALSE(load(path));
+        EXPECT_EQ(output(),
+                  notLoaded(path, "it threw an exception before while it was being mapped, and what is "
+                                  "in memory of it since cannot be used"));
+        EXPECT_TRUE(load(
+            fixture("Classes.bundle", std::filesystem::path(std::string("with ") + name) / "After.bundle")))
+            << output();
+        EXPECT_THAT(output(), StartsWith("After.bundle: message 1\nGrüße aus dem Bündel\n"));
+    }
 }
 
 TEST_F(Loading, TakesBackWhatAnApplicationRegisteredBeforeItAnsweredAnError)

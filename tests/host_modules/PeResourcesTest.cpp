@@ -14,7 +14,7 @@ using Bytes = std::vector<std::uint8_t>;
 
 namespace
 {
-constexpr unsigned kIdsBehindTheLast = 0x10010;
+constexpr unsigned kIdsAfterTheLast = 0x10010;
 
 Bytes bytesOf(const std::filesystem::path& path)
 {
@@ -39,7 +39,7 @@ std::wstring whyNot(Bytes bytes)
     return resources.sentence();
 }
 
-// Every text of the file by an independent reader: a block holds sixteen UTF-16 texts behind their lengths.
+// Every text of the file by an independent reader: a block holds sixteen UTF-16 texts after their lengths.
 std::map<unsigned, std::u16string> textsByTheOtherReader(const Bytes& bytes)
 {
     std::map<unsigned, std::u16string> result;
@@ -82,7 +82,7 @@ std::u16string utf16(const std::wstring& text)
 std::size_t charactersIn(const PeResources& resources)
 {
     std::size_t characters = 0;
-    for (unsigned last = 15; last < kIdsBehindTheLast; last += 16)
+    for (unsigned last = 15; last < kIdsAfterTheLast; last += 16)
         characters += resources.string(last).size();
     for (unsigned id = 0; id < 64; ++id)
         characters += resources.string(id).size();
@@ -117,7 +117,7 @@ TEST(PeResources, AgreesWithAnotherReaderAboutEveryText)
     ASSERT_TRUE(resources);
     const auto others = textsByTheOtherReader(texts());
     EXPECT_GE(others.size(), 7U);
-    for (unsigned id = 0; id < kIdsBehindTheLast; ++id)
+    for (unsigned id = 0; id < kIdsAfterTheLast; ++id)
     {
         const auto other = others.find(id);
         ASSERT_EQ(utf16(resources->string(id)), other == others.end() ? u"" : other->second) << id;

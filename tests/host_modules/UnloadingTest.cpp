@@ -202,6 +202,25 @@ TEST_F(Unloading, TakesOutOfServiceWhatTheSystemKeepsMapped)
     }
 }
 
+TEST_F(Unloading, TakesOutALibraryWhoseDynamicSectionCannotBeWritten)
+{
+    const auto library = fixture("ReadOnlyDynamic.zmb");
+    EXPECT_TRUE(load(library));
+    EXPECT_TRUE(unload(library));
+    EXPECT_EQ(output(), "ReadOnlyDynamic.zmb: message 1\nReadOnlyDynamic.zmb: message 2\n");
+    EXPECT_FALSE(isMapped(library));
+}
+
+TEST_F(Unloading, KeepsMappedWhatBringsClassesInALibraryWhoseDynamicSectionCannotBeWritten)
+{
+    const auto bundle = fixture("ReadOnlyDynamic.bundle");
+    EXPECT_TRUE(load(bundle));
+    output();
+    EXPECT_TRUE(unload(bundle));
+    EXPECT_EQ(output(), "ReadOnlyDynamic.bundle: message 2\n" + staysInMemory(bundle));
+    EXPECT_TRUE(isMapped(bundle / "ReadOnlyDynamic"));
+}
+
 TEST_F(Unloading, PutsBackIntoServiceWhatStayedMappedWithoutMappingItAgain)
 {
     for (const char* name : {"StaysMapped.zmb", "Classes.bundle"})
@@ -221,6 +240,35 @@ TEST_F(Unloading, PutsBackIntoServiceWhatStayedMappedWithoutMappingItAgain)
         EXPECT_TRUE(unload(path));
         output();
     }
+}
+
+TEST_F(Unloading, RefusesAnotherFileAtThePathOfWhatStayedMapped)
+{
+    for (const char* name : {"StaysMapped.zmb", "Classes.bundle"})
+    {
+        const auto path = fixture(name);
+        const auto program = name == std::string("StaysMapped.zmb") ? path : path / "Classes";
+        load(path);
+        EXPECT_TRUE(unload(path));
+        output();
+        std::filesystem::copy_file(program, mFolder / "next");
+        std::filesystem::rename(mFolder / "next", program);
+        EXPECT_FALSE(load(path));
+        EXPECT_EQ(output(),
+                  notLoaded(path, "the code of another file is in memory in its place, until the session "
+                                  "ends"));
+        EXPECT_EQ(names(), L"");
+    }
+}
+
+TEST_F(Unloading, LoadsAnotherFileAtThePathOfWhatWentOut)
+{
+    const auto path = fixture("Good.zmb");
+    load(path);
+    EXPECT_TRUE(unload(path));
+    std::filesystem::copy_file(path, mFolder / "next");
+    std::filesystem::rename(mFolder / "next", path);
+    EXPECT_TRUE(load(path)) << output();
 }
 
 TEST_F(Unloading, SaysNothingOfWhatStaysMappedWhenNotAskedTo)

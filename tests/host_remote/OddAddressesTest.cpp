@@ -19,18 +19,18 @@ using testing::StartsWith;
 
 namespace
 {
-struct Case
+struct OddAddressCase
 {
     const wchar_t* target;
     const char* fileName; // of the local copy
 };
 
-void PrintTo(const Case& value, std::ostream* stream)
+void PrintTo(const OddAddressCase& value, std::ostream* stream)
 {
     *stream << tessel::toUtf8(value.target);
 }
 
-class OddAddress : public testing::TestWithParam<Case>
+class OddAddress : public testing::TestWithParam<OddAddressCase>
 {
 };
 
@@ -65,14 +65,17 @@ TEST_P(OddAddress, HasACopyInsideOfTheCache)
 
 INSTANTIATE_TEST_SUITE_P(
     Table, OddAddress,
-    testing::Values(Case{L"", "download"}, Case{L"/", "download"}, Case{L"/a/b/", "download"},
-                    Case{L"/tool.lsp?x=1&y=/z.txt", "tool.lsp"}, Case{L"/tool.lsp#part", "tool.lsp"},
-                    Case{L"?file=/tool.lsp", "download"}, Case{L"/my%20tool.lsp", "my%20tool.lsp"},
-                    Case{L"/%2e%2e%2f%2e%2e%2fetc%2fpasswd", "%2e%2e%2f%2e%2e%2fetc%2fpasswd"},
-                    Case{L"/..", "download"}, Case{L"/a/../../tool.lsp", "tool.lsp"}, Case{L"/.", "download"},
-                    Case{L"/.url", "download"}, Case{L"/..\\..\\tool.lsp", ".._.._tool.lsp"},
-                    Case{L"/100%25s%25n.lsp", "100%25s%25n.lsp"}, Case{L"/größe.lsp", "größe.lsp"},
-                    Case{L"//tool.lsp", "tool.lsp"}, Case{L"/tool.lsp;v=1", "tool.lsp;v=1"}),
+    testing::Values(
+        OddAddressCase{L"", "download"}, OddAddressCase{L"/", "download"},
+        OddAddressCase{L"/a/b/", "download"}, OddAddressCase{L"/tool.lsp?x=1&y=/z.txt", "tool.lsp"},
+        OddAddressCase{L"/tool.lsp#part", "tool.lsp"}, OddAddressCase{L"?file=/tool.lsp", "download"},
+        OddAddressCase{L"/my%20tool.lsp", "my%20tool.lsp"},
+        OddAddressCase{L"/%2e%2e%2f%2e%2e%2fetc%2fpasswd", "%2e%2e%2f%2e%2e%2fetc%2fpasswd"},
+        OddAddressCase{L"/..", "download"}, OddAddressCase{L"/a/../../tool.lsp", "tool.lsp"},
+        OddAddressCase{L"/.", "download"}, OddAddressCase{L"/.url", "download"},
+        OddAddressCase{L"/..\\..\\tool.lsp", ".._.._tool.lsp"},
+        OddAddressCase{L"/100%25s%25n.lsp", "100%25s%25n.lsp"}, OddAddressCase{L"/größe.lsp", "größe.lsp"},
+        OddAddressCase{L"//tool.lsp", "tool.lsp"}, OddAddressCase{L"/tool.lsp;v=1", "tool.lsp;v=1"}),
     [](const auto& which) { return caseName(which.index, which.param.target); });
 
 TEST(LongAddress, KeepsTheEndOfItsNameWhichTellsTheKind)

@@ -7,6 +7,7 @@
 #include <set>
 #include <string>
 
+#include "host/commands/Interruption.h"
 #include "host/files/RemoteFiles.h"
 #include "host/text/Running.h"
 #include "host/text/Unicode.h"
@@ -25,9 +26,11 @@ public:
     std::filesystem::path cache() const { return mFolder / "cache"; }
 
     // With little time for the whole transfer, for servers that never end.
-    tessel::RemoteFiles impatient() const
+    tessel::RemoteFiles impatient()
     {
-        return {cache(), {kMostBytes, std::chrono::milliseconds(5000), std::chrono::milliseconds(300)}};
+        return {cache(),
+                {kMostBytes, std::chrono::milliseconds(5000), std::chrono::milliseconds(300)},
+                mInterruption};
     }
 
     tessel::RemoteFiles::Copy fetch(const std::wstring& url, bool ignoreCache = false)
@@ -64,7 +67,11 @@ public:
 private:
     TemporaryFolder mFolder;
     CapturedOutput mOutput;
-    tessel::Owned<tessel::RemoteFiles> mRemote{
-        cache(), tessel::RemoteFiles::Limits{kMostBytes, std::chrono::milliseconds(5000),
-                                             std::chrono::milliseconds(30'000)}};
+    tessel::EndRequest mEndRequest;
+    tessel::Interruption mInterruption{mEndRequest};
+    tessel::Owned<tessel::RemoteFiles> mRemote{cache(),
+                                               tessel::RemoteFiles::Limits{kMostBytes,
+                                                                           std::chrono::milliseconds(5000),
+                                                                           std::chrono::milliseconds(30'000)},
+                                               mInterruption};
 };

@@ -102,7 +102,7 @@ TEST(Format, PrintsWhatIsNoConversionAsItStands)
     EXPECT_EQ(format(L"%.-3d", 7), L"%.-3d");
 }
 
-TEST(Format, LooksForAConversionBehindOneThatIsNone)
+TEST(Format, LooksForAConversionAfterOneThatIsNone)
 {
     EXPECT_EQ(format(L"%5%d", 7), L"%57");
     EXPECT_EQ(format(L"%-%s", L"x"), L"%-x");

@@ -156,5 +156,7 @@ TEST_F(FullDisk, IsToldWhenANewRegistryCannotBeMade)
             << bytes;
         Registry registry(file());
         EXPECT_EQ(registry.canStore().sentence(), L"") << "nothing of it is in the way later";
+        std::filesystem::remove(file());
+        std::filesystem::remove(file().string() + ".sound");
     }
 }

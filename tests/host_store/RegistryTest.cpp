@@ -222,3 +222,30 @@ TEST_F(RegistryStore, EndsACommandThatWroteNothingWithoutAWord)
     EXPECT_TRUE(registry().endOfCommand());
     EXPECT_THAT(host.output().text(), IsEmpty());
 }
+
+TEST_F(RegistryStore, IsInterruptedOnlyWhereMuchIsReadAndOnlyForThatCommand)
+{
+    ASSERT_TRUE(registry().write(L"A", L"name", L"1"));
+    ASSERT_TRUE(registry().endOfCommand());
+    registry().interrupt();
+    EXPECT_EQ(registry().read(L"A", L"name"), L"1") << "nobody waits for so little";
+    const Registry::Key key = registry().find(L"A");
+    for (int i = 0; i < 11'000; ++i)
+        ASSERT_TRUE(registry().writeValue(key, L"name", L"2"));
+    registry().interrupt();
+    EXPECT_FALSE(registry().writeValue(key, L"name", L"2"));
+    const auto stopped = registry().endOfCommand();
+    EXPECT_NE(
+        stopped.sentence().find(L"could not be written: interrupted. What was stored before is unchanged."),
+        std::wstring::npos);
+    EXPECT_EQ(registry().read(L"A", L"name"), L"1");
+    EXPECT_TRUE(registry().write(L"A", L"name", L"3")) << "the next command";
+    EXPECT_TRUE(registry().endOfCommand());
+    for (int i = 0; i < 11'000; ++i)
+        ASSERT_TRUE(registry().read(L"A", L"name"));
+    registry().interrupt();
+    EXPECT_FALSE(registry().read(L"A", L"name"));
+    EXPECT_FALSE(registry().endOfCommand());
+    EXPECT_EQ(registry().read(L"A", L"name"), L"3");
+    EXPECT_FALSE(registry().write(L"A", L"name", L"4")) << "who was to read it all may know less";
+}

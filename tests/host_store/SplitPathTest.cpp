@@ -11,7 +11,7 @@
 
 namespace
 {
-constexpr std::size_t kRoom = 64;
+constexpr std::size_t kPartRoom = 64;
 
 struct Case
 {
@@ -30,13 +30,13 @@ void PrintTo(const Case& value, std::ostream* stream)
 // Buffers that are known not to be empty before the call.
 struct Parts
 {
-    std::wstring drive = std::wstring(kRoom, L'?');
+    std::wstring drive = std::wstring(kPartRoom, L'?');
     std::wstring folder = drive;
     std::wstring name = drive;
     std::wstring extension = drive;
 
-    int split(const wchar_t* path, std::size_t driveSize = kRoom, std::size_t folderSize = kRoom,
-              std::size_t nameSize = kRoom, std::size_t extensionSize = kRoom)
+    int split(const wchar_t* path, std::size_t driveSize = kPartRoom, std::size_t folderSize = kPartRoom,
+              std::size_t nameSize = kPartRoom, std::size_t extensionSize = kPartRoom)
     {
         return _wsplitpath_s(path, drive.data(), driveSize, folder.data(), folderSize, name.data(), nameSize,
                              extension.data(), extensionSize);
@@ -45,9 +45,9 @@ struct Parts
     {
         return drive[0] == L'\0' && folder[0] == L'\0' && name[0] == L'\0' && extension[0] == L'\0';
     }
-    bool areUntouchedBehindTheFirst() const
+    bool areUntouchedAfterTheFirst() const
     {
-        const std::wstring rest(kRoom - 1, L'?');
+        const std::wstring rest(kPartRoom - 1, L'?');
         return drive.substr(1) == rest && folder.substr(1) == rest && name.substr(1) == rest &&
                extension.substr(1) == rest;
     }
@@ -105,7 +105,7 @@ TEST(SplitPathBuffers, AreAllEmptiedWhenOnePartDoesNotFit)
         Parts parts;
         EXPECT_EQ(parts.split(L"C:/xy/tool.lsp", size[0], size[1], size[2], size[3]), ERANGE);
         EXPECT_TRUE(parts.areEmpty());
-        EXPECT_TRUE(parts.areUntouchedBehindTheFirst());
+        EXPECT_TRUE(parts.areUntouchedAfterTheFirst());
     }
 }
 
@@ -127,16 +127,16 @@ TEST(SplitPathBuffers, TakeAPathOfFourThousandCharactersOrNothing)
 
 TEST(SplitPathBuffers, MayBeNullWithoutASize)
 {
-    wchar_t name[kRoom];
-    EXPECT_EQ(_wsplitpath_s(L"C:/x/tool.lsp", nullptr, 0, nullptr, 0, name, kRoom, nullptr, 0), 0);
+    wchar_t name[kPartRoom];
+    EXPECT_EQ(_wsplitpath_s(L"C:/x/tool.lsp", nullptr, 0, nullptr, 0, name, kPartRoom, nullptr, 0), 0);
     EXPECT_STREQ(name, L"tool");
 }
 
 TEST(SplitPathBuffers, MustAgreeWithTheirSizes)
 {
     Parts parts;
-    EXPECT_EQ(_wsplitpath_s(L"x", nullptr, kRoom, parts.folder.data(), kRoom, parts.name.data(), kRoom,
-                            parts.extension.data(), kRoom),
+    EXPECT_EQ(_wsplitpath_s(L"x", nullptr, kPartRoom, parts.folder.data(), kPartRoom, parts.name.data(),
+                            kPartRoom, parts.extension.data(), kPartRoom),
               EINVAL);
     EXPECT_EQ(parts.folder[0], L'\0');
     EXPECT_EQ(parts.name[0], L'\0');

@@ -48,7 +48,7 @@ bool isEntry(const Registry::Value& value, int generation, int number)
            data.substr(start.size()).find_first_not_of(L'x') == data.npos;
 }
 
-int generationOf(const std::vector<Registry::Value>& values)
+int generationIn(const std::vector<Registry::Value>& values)
 {
     if (values.empty())
         return 0;
@@ -84,7 +84,7 @@ bool writeList(Registry& registry, int generation, int count, std::size_t entryL
 int generationOf(Registry& registry)
 {
     const Registry::Key key = registry.find(kListKey);
-    return generationOf(key == Registry::kNoKey ? std::vector<Registry::Value>() : registry.values(key));
+    return generationIn(key == Registry::kNoKey ? std::vector<Registry::Value>() : registry.values(key));
 }
 
 int generationInOneLook(const std::filesystem::path& file)
@@ -104,5 +104,5 @@ int generationInOneLook(const std::filesystem::path& file)
         found.push_back({text(0), text(1)});
     sqlite3_finalize(values);
     sqlite3_close(database);
-    return generationOf(found);
+    return generationIn(found);
 }

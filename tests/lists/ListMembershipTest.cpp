@@ -60,7 +60,7 @@ TEST_F(ListMembership, TellsBundlesInDifferentFoldersApart)
     EXPECT_TRUE(Found(L"/A/TOOL.bundle", {L"/a/tool.Bundle"}));
 }
 
-TEST_F(ListMembership, FindsAMatchBehindOthersOfTheSameName)
+TEST_F(ListMembership, FindsAMatchAfterOthersOfTheSameName)
 {
     EXPECT_TRUE(Found(L"/c/tool.lsp", {L"/a/tool.lsp", L"/b/tool.lsp", L"/c/tool.lsp", L"/d/tool.lsp"}));
 }

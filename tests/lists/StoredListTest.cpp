@@ -153,7 +153,7 @@ TEST_P(StoredList, IsEmptyWhenTheFirstEntryIsMissing)
     EXPECT_TRUE(list().IsEmpty());
 }
 
-TEST_P(StoredList, HoldsTheSamePathInDifferentCaseOnceAndGoesOnBehindIt)
+TEST_P(StoredList, HoldsTheSamePathInDifferentCaseOnceAndGoesOnAfterIt)
 {
     StoreCount(L"3");
     StoreEntries({L"/a/Tool", L"/A/TOOL", L"/b"});
@@ -395,7 +395,7 @@ TEST_P(StoredList, WritesNoEntryWhenTheCountCannotBeWritten)
     EXPECT_THAT(StoredNames(), IsEmpty());
 }
 
-TEST_P(StoredList, GoesOnBehindAnEntryThatCannotBeWrittenAndReportsNothing)
+TEST_P(StoredList, GoesOnAfterAnEntryThatCannotBeWrittenAndReportsNothing)
 {
     FailToWrite({EntryName(1), EntryName(2)});
     Fill(list(), {L"/a", L"/b", L"/c"});

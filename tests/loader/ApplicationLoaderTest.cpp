@@ -272,7 +272,7 @@ TEST_F(PerformingALoad, DoesNotTakeALispPathThatIsTooLongToBeTakenApartForLisp)
     EXPECT_EQ(1, Perform(LongPath(4000, L"tool.lsp")));
 }
 
-TEST_F(LoadingAnApplication, ChoosesTheRoadByTheTextBehindTheLastDot)
+TEST_F(LoadingAnApplication, ChoosesTheRoadByTheTextAfterTheLastDot)
 {
     EXPECT_TRUE(LoadApplication(L"/a.lsp/tool.x.ZMB", 1, 0));
     EXPECT_TRUE(LoadApplication(L"/a.zmb/tool.x.QBC", 1, 0));

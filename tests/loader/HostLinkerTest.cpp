@@ -11,7 +11,7 @@ class HostLinker : public ModuleTest
 };
 } // namespace
 
-TEST_F(HostLinker, IsLookedUpAnewForEveryCall)
+TEST_F(HostLinker, IsLookedUpAgainForEveryCall)
 {
     EXPECT_EQ(&host().linker, ModrigUtils::HostLinker());
     EXPECT_EQ(&host().linker, ModrigUtils::HostLinker());

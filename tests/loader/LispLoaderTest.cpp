@@ -91,7 +91,7 @@ TEST_F(LispLoader, CountsTwoBackslashesAmongTheFirstFourCharactersWhereverTheySt
     EXPECT_EQ(L"\\\\\\b\\/tool.lsp", SafePath(L"\\b\\\\tool.lsp"));
 }
 
-TEST_F(LispLoader, CountsNoBackslashBehindTheFirstFourCharacters)
+TEST_F(LispLoader, CountsNoBackslashAfterTheFirstFourCharacters)
 {
     EXPECT_EQ(L"a/bc/tool.lsp", SafePath(L"a\\bc\\tool.lsp"));
     EXPECT_EQ(L"abc//tool.lsp", SafePath(L"abc\\\\tool.lsp"));

@@ -185,7 +185,7 @@ TEST_F(Rebuilding, GivesTheHostsListBackBeforeItAsksTheDocument)
     EXPECT_THAT(out, IsEmpty());
 }
 
-TEST_F(Rebuilding, AddsTheDocumentsApplicationsBehindTheModulesAsTheyAreNamed)
+TEST_F(Rebuilding, AddsTheDocumentsApplicationsAfterTheModulesAsTheyAreNamed)
 {
     host().loadedModules.add(L"/a/one.zmb");
     host().document.applications = {L"/d/Tööl 100%.lsp", L"no folder", L"/D/TÖÖL 100%.LSP", L"/A/ONE.ZMB"};
@@ -340,7 +340,7 @@ TEST_F(Unloading, DoesNotCountARowThatIsNotUnloadableAsTried)
     EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneUnloaded, L"a.zmb")));
 }
 
-TEST_F(Unloading, GoesOnBehindAModuleThatDoesNotUnload)
+TEST_F(Unloading, GoesOnAfterAModuleThatDoesNotUnload)
 {
     Load({L"/a/a.zmb", L"/a/b.zmb", L"/a/c.zmb"});
     host().linker.refuseToUnload(L"/a/a.zmb", L"it will not go");

@@ -78,7 +78,7 @@ TEST_F(StartupSuite, DoesNotLoadACompiledModuleThatTheHostHasLoadedAlready)
     EXPECT_TRUE(gLoadedAppList.IsEmpty());
 }
 
-TEST_F(StartupSuite, LoadsLispAnewAndCompiledModulesOnceWhenItStartsAgain)
+TEST_F(StartupSuite, LoadsLispAgainAndCompiledModulesOnceWhenItStartsAgain)
 {
     Store({L"/a/one.zmb", L"/a/two.lsp"});
     InitializeStartupFiles();
@@ -113,7 +113,7 @@ TEST_F(StartupSuite, HandsEveryOtherKindToTheLoaderWhichRefusesItAndSaysSo)
     EXPECT_TRUE(gLoadedAppList.IsEmpty());
 }
 
-TEST_F(StartupSuite, KeepsAnApplicationThatDoesNotLoadAndGoesOnBehindIt)
+TEST_F(StartupSuite, KeepsAnApplicationThatDoesNotLoadAndGoesOnAfterIt)
 {
     host().linker.refuseToLoad(L"/a/broken.zmb", L"it is truncated");
     Store({L"/a/good.zmb", L"/a/broken.zmb", L"/a/better.zmb"});
@@ -139,7 +139,7 @@ TEST_F(StartupSuite, LoadsADuplicateOnce)
     EXPECT_EQ(3u, host().lisp.queued.size());
 }
 
-TEST_F(StartupSuite, LoadsNothingBehindAGap)
+TEST_F(StartupSuite, LoadsNothingAfterAGap)
 {
     Store({L"/a/one.zmb", L"/a/two.zmb", L"/a/three.zmb"});
     host().registry.removeValue(host().moduleKey() + L"\\Startup", L"2Startup");

@@ -83,7 +83,7 @@ TEST_F(ModuleKey, IsMadeWithItsParentAndStaysTheSame)
     EXPECT_EQ(key, GetModrigProfileRegKey().Text());
 }
 
-TEST_F(ModuleKey, IsMadeAnewOnEveryCall)
+TEST_F(ModuleKey, IsMadeAgainOnEveryCall)
 {
     EXPECT_EQ(GetModrigProfileRegKey(), GetModrigProfileRegKey());
     std::vector<std::wstring> made;
@@ -273,7 +273,7 @@ TEST_F(ProfileRegistry, ListsNothingForAKeyWithoutValues)
     EXPECT_TRUE(names.IsEmpty());
 }
 
-TEST_F(ProfileRegistry, GoesOnListingBehindAValueThatCannotBeNamed)
+TEST_F(ProfileRegistry, GoesOnListingAfterAValueThatCannotBeNamed)
 {
     for (const wchar_t* name : {L"a", L"b", L"c"})
         registry().setValue(kKey, name, L"data");

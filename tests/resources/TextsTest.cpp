@@ -144,7 +144,7 @@ TEST_F(Texts, NameTheReleaseAndTheProductInTheFirstFilter)
               L"All release 21 applications for Tessel|" + kFilterPatterns.at(kAllApplicationsFilter));
 }
 
-TEST_F(Texts, DescribeAFilterBeforeTheBarAndListItsPatternsBehind)
+TEST_F(Texts, DescribeAFilterBeforeTheBarAndListItsPatternsAfterIt)
 {
     for (const auto& [id, patterns] : kFilterPatterns)
     {

@@ -87,6 +87,12 @@ std::vector<std::string> HttpServer::requests() const
     return mRequests;
 }
 
+std::vector<std::string> HttpServer::heads() const
+{
+    const std::lock_guard lock(mMutex);
+    return mHeads;
+}
+
 void HttpServer::serve()
 {
     while (!mEnding)
@@ -102,6 +108,7 @@ void HttpServer::answer(int connection)
     {
         const std::lock_guard lock(mMutex);
         mRequests.push_back(target);
+        mHeads.push_back(head);
     }
     const Answer reply = mHandler(target);
     bool open = sendAll(connection, reply.bytes);

@@ -38,6 +38,8 @@ public:
     std::wstring url(const std::wstring& target) const;
     // The targets asked for, in order.
     std::vector<std::string> requests() const;
+    // What was sent for each, its headers and all.
+    std::vector<std::string> heads() const;
 
 private:
     void serve();
@@ -49,6 +51,7 @@ private:
     std::atomic<bool> mEnding = false;
     mutable std::mutex mMutex;
     std::vector<std::string> mRequests;
+    std::vector<std::string> mHeads;
     std::vector<int> mStalled;
     std::thread mThread;
 };

@@ -4,7 +4,7 @@
 #include <string>
 #include <vector>
 
-// Pointers into the texts, with a null behind the last one. They are good as long as the texts are.
+// Pointers into the texts, with a null after the last one. They are good as long as the texts are.
 inline std::vector<char*> pointersTo(std::vector<std::string>& texts)
 {
     std::vector<char*> pointers;

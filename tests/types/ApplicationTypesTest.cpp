@@ -95,7 +95,7 @@ TEST_F(ApplicationTypes, IncludeTheTwoThatTheLoaderRefuses)
     EXPECT_EQ(3, FileType(L"rpk"));
 }
 
-TEST_F(ApplicationTypes, AreTakenFromTheTextBehindTheLastDotOfAPath)
+TEST_F(ApplicationTypes, AreTakenFromTheTextAfterTheLastDotOfAPath)
 {
     EXPECT_EQ(1, FileTypeOfPath(L"/a.b/tool.omp.LSP"));
     EXPECT_EQ(-1, FileTypeOfPath(L"/a.lsp/tool"));

@@ -223,7 +223,7 @@ TEST_F(FileValidation, TakesNoOtherFileForOneThatIsTooLongToBeTakenApart)
     EXPECT_THAT(host().files.searched, IsEmpty());
 }
 
-TEST_F(FileValidation, NamesAFileInACurrentFolderThatDoesNotFitByItsNameBehindASlash)
+TEST_F(FileValidation, NamesAFileInACurrentFolderThatDoesNotFitByItsNameAfterASlash)
 {
     host().files.currentFolder = L"/" + std::wstring(1023, L'c');
     host().files.addFile(L"tool.lsp");

@@ -31,11 +31,22 @@ ElfW(Addr) dynamicEntry(const link_map& map, ElfW(Sxword) tag)
     return 0;
 }
 
+// The address in such an entry. Where the section cannot be written the system has left it as the file has
+// it, counted from the library's start: it then lies below every mapped library.
+template <class Table>
+const Table* tableAt(const link_map& map, ElfW(Sxword) tag)
+{
+    const ElfW(Addr) address = dynamicEntry(map, tag);
+    if (address == 0)
+        return nullptr;
+    return reinterpret_cast<const Table*>(address < map.l_addr ? address + map.l_addr : address);
+}
+
 // The index after the last symbol that the library only refers to: these stand in front of those that it
 // defines, which the hash table begins with.
 std::uint32_t endOfReferences(const link_map& map)
 {
-    const auto* hash = reinterpret_cast<const std::uint32_t*>(dynamicEntry(map, DT_GNU_HASH));
+    const auto* hash = tableAt<std::uint32_t>(map, DT_GNU_HASH);
     return hash ? hash[1] : 0;
 }
 
@@ -59,7 +70,7 @@ bool mustStayMapped(void* library)
     const link_map* map = linkMapOf(library);
     if (!map)
         return true;
-    const auto* names = reinterpret_cast<const char*>(dynamicEntry(*map, DT_STRTAB));
+    const auto* names = tableAt<char>(*map, DT_STRTAB);
     if (!names)
         return true;
     return std::string_view(names, dynamicEntry(*map, DT_STRSZ)).find(kRegistration) !=
@@ -71,8 +82,8 @@ std::string firstUnresolvedFunction(void* library)
     const link_map* map = linkMapOf(library);
     if (!map)
         return {};
-    const auto* symbols = reinterpret_cast<const ElfW(Sym)*>(dynamicEntry(*map, DT_SYMTAB));
-    const auto* names = reinterpret_cast<const char*>(dynamicEntry(*map, DT_STRTAB));
+    const auto* symbols = tableAt<ElfW(Sym)>(*map, DT_SYMTAB);
+    const auto* names = tableAt<char>(*map, DT_STRTAB);
     if (!symbols || !names)
         return {};
     for (std::uint32_t i = 1; i < endOfReferences(*map); ++i) // the first symbol is no symbol

@@ -1,5 +1,5 @@
 // Every program on the recording host gets this check: whatever a test did, its end finds everything given
-// back. It looks behind the fixture's own end.
+// back. It looks after the fixture's own end.
 #include <gmock/gmock.h>
 
 #include "tests/support/recording/RecordingLoans.h"

@@ -41,7 +41,7 @@ public:
     const wchar_t* productRegistryRoot() const override;
     const wchar_t* profileFolder() const override;
     const wchar_t* product() const override;
-    bool isUrl(const wchar_t* text) const override; // http:// or https:// and something behind it
+    bool isUrl(const wchar_t* text) const override; // http:// or https:// and something after it
     int fetchRemoteFile(const wchar_t* url, wchar_t* localPath, std::size_t capacity,
                         bool ignoreCache) override;
 

@@ -33,7 +33,7 @@ public:
     // When set, `addCommand` answers this and adds nothing.
     std::optional<int> answerToAdd;
 
-    // Runs the command of that local name, or of that global name behind a "_", in any case. False when there
+    // Runs the command of that local name, or of that global name after a "_", in any case. False when there
     // is none.
     bool type(const std::wstring& name);
     bool has(const std::wstring& localName) const { return find(localName) != nullptr; }

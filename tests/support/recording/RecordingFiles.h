@@ -20,7 +20,7 @@ public:
     // What `GetCurrentDirectory` answers; empty makes it fail.
     std::wstring currentFolder = L"/current";
 
-    // Where `tsedFindFile` looks behind the current folder, in order.
+    // Where `tsedFindFile` looks after the current folder, in order.
     std::vector<std::wstring> searchFolders;
     // What it answers for a name, before it looks anywhere; the file need not exist.
     std::map<std::wstring, std::wstring> found;

@@ -5,6 +5,7 @@
 #include <algorithm>
 
 #include "host/ui/platform/Windowing.h"
+#include "host/ui/platform/gnustep/Keys.h"
 #include "host/ui/platform/gnustep/TesselTheme.h"
 
 using tessel::windowing::themeColor;
@@ -22,7 +23,6 @@ constexpr CGFloat kMessageFontSize = 13;
 constexpr CGFloat kDetailFontSize = 11;
 constexpr CGFloat kDetailGap = 10;
 const NSSize kButtonSize = {88, 28};
-constexpr unichar kEscapeKey = 033;
 
 NSBezierPath* triangleIn(NSRect frame)
 {
@@ -179,7 +179,7 @@ NSBezierPath* triangleIn(NSRect frame)
 - (void)keyDown:(NSEvent*)event
 {
     NSString* characters = [event characters];
-    if ([characters length] == 1 && [characters characterAtIndex:0] == kEscapeKey)
+    if ([characters length] == 1 && [characters characterAtIndex:0] == tessel::kEscapeKey)
         [self answer:nil];
     else
         [super keyDown:event];

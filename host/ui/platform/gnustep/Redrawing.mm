@@ -66,21 +66,21 @@ NSView* opaqueAncestor(id view, SEL selector)
 }
 
 using SetFrame = void (*)(id, SEL, NSRect, BOOL);
-SetFrame toolkitSetFrame;
+SetFrame toolkitSetWindowFrame;
 
 // The screen has no half pixels to show at the edge of a window.
-void setFrame(id window, SEL selector, NSRect frame, BOOL display)
+void setWindowFrame(id window, SEL selector, NSRect frame, BOOL display)
 {
-    toolkitSetFrame(window, selector,
-                    NSMakeRect(std::round(NSMinX(frame)), std::round(NSMinY(frame)),
-                               std::round(NSWidth(frame)), std::round(NSHeight(frame))),
-                    display);
+    toolkitSetWindowFrame(window, selector,
+                          NSMakeRect(std::round(NSMinX(frame)), std::round(NSMinY(frame)),
+                                     std::round(NSWidth(frame)), std::round(NSHeight(frame))),
+                          display);
 }
 } // namespace
 
 void drawWholePixels()
 {
-    toolkitSetFrame = standInFor("NSWindow", @selector(setFrame:display:), setFrame);
+    toolkitSetWindowFrame = standInFor("NSWindow", @selector(setFrame:display:), setWindowFrame);
     toolkitOpaqueAncestor = standInFor("NSView", @selector(opaqueAncestor), opaqueAncestor);
     toolkitDisplayRectIn =
         standInFor("NSView", @selector(displayRectIgnoringOpacity:inContext:), displayRectIn);

@@ -68,19 +68,19 @@ using SetFrameSize = void (*)(id, SEL, NSSize);
 SetFrameSize toolkitSetFrameSize;
 
 using DrawInterior = void (*)(id, SEL, NSRect, NSView*);
-DrawInterior toolkitDrawTitle;
+DrawInterior toolkitDrawHeaderTitle;
 
 constexpr CGFloat kTitleMargin = 8; // what a header leaves free around its title
 
 // A copy: a cell that gets another text asks to be drawn again.
-void drawTitle(id header, SEL selector, NSRect frame, NSView* view)
+void drawHeaderTitle(id header, SEL selector, NSRect frame, NSView* view)
 {
     NSString* whole = [header stringValue];
     NSString* title = fitted(whole, [header font], NSWidth(frame) - kTitleMargin);
     NSCell* shown = title == whole ? header : [[header copy] autorelease];
     if (shown != header)
         [shown setStringValue:title];
-    toolkitDrawTitle(shown, selector, frame, view);
+    toolkitDrawHeaderTitle(shown, selector, frame, view);
 }
 
 // Asked whenever the size changes, from the first one on. The buttons would take clicks where nothing is
@@ -114,6 +114,7 @@ void completeTables()
     toolkitCheckSpace = standInFor("NSScroller", @selector(checkSpaceForParts), checkSpace);
     toolkitSetFrameSize = overrideIn("NSTableHeaderView", @selector(setFrameSize:), setHeaderSize);
     overrideIn("NSTableHeaderView", @selector(resizeWithOldSuperviewSize:), growWithPlace);
-    toolkitDrawTitle = overrideIn("NSTableHeaderCell", @selector(drawInteriorWithFrame:inView:), drawTitle);
+    toolkitDrawHeaderTitle =
+        overrideIn("NSTableHeaderCell", @selector(drawInteriorWithFrame:inView:), drawHeaderTitle);
 }
 } // namespace tessel::windowing

@@ -11,7 +11,7 @@ namespace
 {
 using KeyDown = void (*)(id, SEL, NSEvent*);
 using BecomeFirstResponder = BOOL (*)(id, SEL);
-KeyDown toolkitKeyDown;
+KeyDown toolkitTextKeyDown;
 BecomeFirstResponder toolkitBecomeFirstResponder;
 
 // The letter that is pressed together with Control and no other key; 0 for everything else.
@@ -61,7 +61,7 @@ void undoIn(NSTextView* text)
         NSBeep();
 }
 
-void keyDown(NSTextView* text, SEL selector, NSEvent* event)
+void textKeyDown(NSTextView* text, SEL selector, NSEvent* event)
 {
     const unichar letter = controlledLetter(event);
     if (letter == 'z')
@@ -69,13 +69,13 @@ void keyDown(NSTextView* text, SEL selector, NSEvent* event)
     if (const SEL action = actionFor(letter))
         [text performSelector:action withObject:nil];
     else
-        toolkitKeyDown(text, selector, event);
+        toolkitTextKeyDown(text, selector, event);
 }
 } // namespace
 
 void takeTextKeys()
 {
-    toolkitKeyDown = standInFor("NSTextView", @selector(keyDown:), keyDown);
+    toolkitTextKeyDown = standInFor("NSTextView", @selector(keyDown:), textKeyDown);
     toolkitBecomeFirstResponder =
         standInFor("NSTextView", @selector(becomeFirstResponder), becomeFirstResponder);
 }

@@ -16,7 +16,7 @@ using SetText = void (*)(id, SEL, NSAttributedString*);
 SetText toolkitSetText;
 
 using SetFrame = void (*)(id, SEL, NSRect, BOOL);
-SetFrame toolkitSetFrame;
+SetFrame toolkitSetTipFrame;
 
 NSDictionary* lookOfTips()
 {
@@ -34,7 +34,7 @@ void setText(id view, SEL selector, NSAttributedString* text)
 
 // The toolkit has measured the text without room around it, and in points: the window, which is measured in
 // pixels, grows to the right and down, and stays on the screen.
-void setFrame(id window, SEL selector, NSRect frame, BOOL display)
+void setTipFrame(id window, SEL selector, NSRect frame, BOOL display)
 {
     const NSSize text = [[[window contentView] valueForKey:@"text"] size];
     const NSRect screen = [[NSScreen mainScreen] frame];
@@ -44,7 +44,7 @@ void setFrame(id window, SEL selector, NSRect frame, BOOL display)
                             (std::ceil(text.height) + kTipPadding) * scale);
     frame.origin.x = std::max(NSMinX(screen), std::min(NSMinX(frame), NSMaxX(screen) - NSWidth(frame)));
     frame.origin.y = std::max(NSMinY(screen), top - NSHeight(frame));
-    toolkitSetFrame(window, selector, frame, display);
+    toolkitSetTipFrame(window, selector, frame, display);
 }
 
 void drawTip(id view, SEL, NSRect)
@@ -65,6 +65,6 @@ void completeToolTips()
         return;
     toolkitSetText = standInFor("GSTTView", @selector(setText:), setText);
     standInFor("GSTTView", @selector(drawRect:), drawTip);
-    toolkitSetFrame = overrideIn("GSTTPanel", @selector(setFrame:display:), setFrame);
+    toolkitSetTipFrame = overrideIn("GSTTPanel", @selector(setFrame:display:), setTipFrame);
 }
 } // namespace tessel::windowing

@@ -2,6 +2,7 @@
 
 #include <string>
 
+#include "host/ui/platform/gnustep/Keys.h"
 #include "host/ui/platform/gnustep/filepanel/PanelState.h"
 #include "host/ui/platform/gnustep/filepanel/Words.h"
 
@@ -9,9 +10,8 @@ using namespace tessel::filepanel;
 
 namespace
 {
-constexpr unichar kEscape = 0x1B;
 constexpr CGFloat kLabelHeight = 22;
-constexpr CGFloat kPadding = 8;
+constexpr CGFloat kLabelPadding = 8;
 constexpr CGFloat kBesideMouse = 12;
 
 NSString* labelOf(NSArray* paths)
@@ -32,7 +32,7 @@ NSTextField* makeText(NSString* title)
     [text setBordered:YES];
     [text setBackgroundColor:[NSColor controlBackgroundColor]];
     [text sizeToFit];
-    [text setFrame:NSMakeRect(0, 0, NSWidth([text frame]) + 2 * kPadding, kLabelHeight)];
+    [text setFrame:NSMakeRect(0, 0, NSWidth([text frame]) + 2 * kLabelPadding, kLabelHeight)];
     [text setAlignment:NSCenterTextAlignment];
     return text;
 }
@@ -137,7 +137,7 @@ NSView* viewThatTakesFiles(NSWindow* window, NSPoint place)
             return [self drop];
         if ([event type] == NSLeftMouseDragged)
             [self moveTo:[event locationInWindow]];
-        else if ([[event characters] length] && [[event characters] characterAtIndex:0] == kEscape)
+        else if ([[event characters] length] && [[event characters] characterAtIndex:0] == tessel::kEscapeKey)
             break;
     }
     [mLabel orderOut:nil];

@@ -1,5 +1,6 @@
 #import <tesselui/TsUIPersistentStore.h>
 
+#include "host/ui/platform/gnustep/Keys.h"
 #import "host/ui/platform/gnustep/filepanel/FilePanel.h"
 #import "host/ui/platform/gnustep/filepanel/FileTable.h"
 #include "host/ui/platform/gnustep/filepanel/Folders.h"
@@ -11,7 +12,6 @@ using namespace tessel::filepanel;
 namespace
 {
 NSString* const kSettings = @"FilePanel";
-constexpr unichar kEscape = 0x1B;
 
 NSString* const kHiddenSetting = @"HiddenFiles";
 NSString* const kResizedColumns[] = {@"kind", @"date"};
@@ -106,7 +106,7 @@ void storeRecentFolders(const std::vector<std::string>& folders)
 {
     NSString* characters = [event charactersIgnoringModifiers];
     const unichar key = [characters length] ? [characters characterAtIndex:0] : 0;
-    if (key == kEscape)
+    if (key == tessel::kEscapeKey)
         return [self cancel:self], YES;
     // The toolkit would press the default button, which knows nothing of folders to go into.
     if ((key == NSCarriageReturnCharacter || key == NSEnterCharacter) && [self hasKeyboardInFiles])

@@ -1,0 +1,39 @@
+// How loading came off in this session, file by file: for APPS, and for the summary of the start.
+#pragma once
+
+#include <chrono>
+#include <cstddef>
+#include <string>
+#include <unordered_map>
+#include <vector>
+
+#include "host/text/Result.h"
+
+namespace tessel
+{
+struct LoadOutcome
+{
+    std::wstring path; // as it was asked for
+    Result<> loaded;   // why not is the end of a sentence, or sentences
+    std::chrono::microseconds took{0};
+};
+
+class LoadOutcomes
+{
+public:
+    using Clock = std::chrono::steady_clock;
+
+    // Takes the place of what was noted of the path before.
+    void note(const std::wstring& path, const Result<>& loaded, Clock::time_point begun);
+
+    // Null for a path of which nothing was noted.
+    const LoadOutcome* of(const std::wstring& path) const;
+
+    // What was not loaded and has not been since, in the order in which it was first tried.
+    std::vector<LoadOutcome> failed() const;
+
+private:
+    std::vector<LoadOutcome> mOutcomes;
+    std::unordered_map<std::wstring, std::size_t> mIndexes;
+};
+} // namespace tessel

@@ -1,0 +1,47 @@
+#include "host/console/StandardOutput.h"
+
+#include <cerrno>
+#include <cstdio>
+#include <cstring>
+
+#include <poll.h>
+#include <unistd.h>
+
+namespace tessel
+{
+namespace
+{
+// Another program may have set the terminal, which they share, so that it does not wait.
+bool canGoOn(int error)
+{
+    pollfd output{STDOUT_FILENO, POLLOUT, 0};
+    return error == EINTR || (error == EAGAIN && (poll(&output, 1, -1) > 0 || errno == EINTR));
+}
+
+// 0, or the number of the error.
+int writeAll(std::string_view text)
+{
+    while (!text.empty())
+    {
+        const ssize_t count = ::write(STDOUT_FILENO, text.data(), text.size());
+        if (count < 0 && !canGoOn(errno))
+            return errno;
+        text.remove_prefix(count > 0 ? static_cast<std::size_t>(count) : 0);
+    }
+    return 0;
+}
+} // namespace
+
+void StandardOutput::write(std::string_view text)
+{
+    std::fflush(stdout); // what an application has printed by itself comes before it
+    const int error = writeAll(text);
+    if (mError == 0)
+        mError = error;
+}
+
+const char* StandardOutput::whyNot() const
+{
+    return std::strerror(mError);
+}
+} // namespace tessel

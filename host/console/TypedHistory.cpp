@@ -1,0 +1,202 @@
+#include "host/console/TypedHistory.h"
+
+#include <cerrno>
+#include <cstdint>
+#include <cstring>
+#include <optional>
+#include <string_view>
+
+#include <fcntl.h>
+#include <sys/file.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include "host/platform/Descriptor.h"
+#include "host/platform/OrdinaryFile.h"
+#include "host/text/Credentials.h"
+#include "host/text/Unicode.h"
+
+// The file is that of the line editor's library: a first line that names the format, then a line each, in
+// which what would break it up stands as a backslash and three octal digits.
+namespace tessel
+{
+namespace
+{
+constexpr std::string_view kFormat = "_HiStOrY_V2_";
+constexpr std::uintmax_t kLargestFile = std::uintmax_t{16} << 20;
+// Shortened not at each start, but when half of it is of no use.
+constexpr std::size_t kMostStoredLines = 2 * kMostHistoryLines;
+constexpr mode_t kForThePersonAlone = 0600;
+
+bool isPlain(unsigned char byte)
+{
+    return byte > ' ' && byte != '\\' && byte != 0x7F;
+}
+
+std::string encoded(std::string_view line)
+{
+    std::string result;
+    for (const char character : line)
+    {
+        const auto byte = static_cast<unsigned char>(character);
+        if (isPlain(byte))
+            result += character;
+        else
+            result += {'\\', static_cast<char>('0' + (byte >> 6)), static_cast<char>('0' + (byte >> 3 & 7)),
+                       static_cast<char>('0' + (byte & 7))};
+    }
+    return result;
+}
+
+bool isOctal(char character)
+{
+    return character >= '0' && character <= '7';
+}
+
+// The byte that is written at the beginning of the text, or nothing.
+std::optional<char> octalByte(std::string_view text)
+{
+    if (text.size() < 4 || text[0] != '\\' || !isOctal(text[1]) || !isOctal(text[2]) || !isOctal(text[3]))
+        return std::nullopt;
+    return static_cast<char>((text[1] - '0') << 6 | (text[2] - '0') << 3 | (text[3] - '0'));
+}
+
+std::string decoded(std::string_view line)
+{
+    std::string result;
+    while (!line.empty())
+    {
+        const auto byte = octalByte(line);
+        const bool isBackslash = line.starts_with("\\\\");
+        result += byte ? *byte : line.front();
+        line.remove_prefix(byte ? 4 : isBackslash ? 2 : 1);
+    }
+    while (result.ends_with('\n')) // the library kept the line break
+        result.pop_back();
+    return result;
+}
+
+std::vector<std::string_view> linesOf(std::string_view content)
+{
+    std::vector<std::string_view> lines;
+    while (!content.empty())
+    {
+        const std::size_t end = std::min(content.find('\n'), content.size());
+        if (end > 0 && content.substr(0, end) != kFormat)
+            lines.push_back(content.substr(0, end));
+        content.remove_prefix(std::min(end + 1, content.size()));
+    }
+    return lines;
+}
+
+bool isSameFile(int descriptor, const std::filesystem::path& path)
+{
+    struct stat open = {};
+    struct stat named = {};
+    return fstat(descriptor, &open) == 0 && stat(path.c_str(), &named) == 0 && open.st_dev == named.st_dev &&
+           open.st_ino == named.st_ino;
+}
+
+bool isOrdinary(int descriptor)
+{
+    struct stat status = {};
+    return fstat(descriptor, &status) == 0 && S_ISREG(status.st_mode);
+}
+
+// The file, for this session alone until it is closed. Another session may put a shorter one in its place
+// while this one waits.
+Descriptor openAlone(const std::filesystem::path& path)
+{
+    for (;;)
+    {
+        Descriptor file(open(path.c_str(), O_RDWR | O_APPEND | O_CREAT | O_CLOEXEC | O_NONBLOCK | O_NOCTTY,
+                             kForThePersonAlone));
+        if (!file || !isOrdinary(file.number()) || flock(file.number(), LOCK_EX) != 0 ||
+            isSameFile(file.number(), path))
+            return file;
+    }
+}
+
+bool writeAll(int file, std::string_view bytes)
+{
+    while (!bytes.empty())
+    {
+        const ssize_t count = write(file, bytes.data(), bytes.size());
+        if (count < 0 && errno != EINTR)
+            return false;
+        bytes.remove_prefix(static_cast<std::size_t>(std::max<ssize_t>(count, 0)));
+    }
+    return true;
+}
+
+// What goes before a line that is added: a session that was killed may have left half of one.
+std::string beginning(int file)
+{
+    const off_t size = lseek(file, 0, SEEK_END);
+    if (size <= 0)
+        return std::string(kFormat) + "\n";
+    char last = '\n';
+    return pread(file, &last, 1, size - 1) == 1 && last != '\n' ? "\n" : "";
+}
+
+// Puts a file with the last lines in place of a long one.
+void shorten(const std::filesystem::path& path)
+{
+    const Descriptor lock = openAlone(path);
+    const auto content = readOrdinaryFile(path, kLargestFile);
+    if (!lock || !content)
+        return;
+    const auto lines = linesOf(*content);
+    if (lines.size() <= kMostStoredLines) // another session was faster
+        return;
+    std::string kept = std::string(kFormat) + "\n";
+    for (std::size_t index = lines.size() - kMostHistoryLines; index < lines.size(); ++index)
+        kept.append(lines[index]).append("\n");
+    std::string name = path.string() + ".XXXXXX";
+    Descriptor file(mkostemp(name.data(), O_CLOEXEC));
+    const bool written = file && writeAll(file.number(), kept) && file.close();
+    if (!written || rename(name.c_str(), path.c_str()) != 0)
+        unlink(name.c_str()); // the long one does as well
+}
+} // namespace
+
+Failure TypedHistory::giveUp(const std::wstring& whatFailed, const std::wstring& reason)
+{
+    mGivenUp = true;
+    return {L"The history of typed lines, " + toWide(mFile.string()) + L", " + whatFailed + L": " + reason +
+            L"."};
+}
+
+Result<std::vector<std::wstring>> TypedHistory::read()
+{
+    const auto content = readOrdinaryFile(mFile, kLargestFile);
+    if (!content && content.code() != kNothingThere)
+        return giveUp(L"is not used", content.sentence());
+    std::vector<std::wstring> lines;
+    if (!content)
+        return lines;
+    auto stored = linesOf(*content);
+    if (stored.size() > kMostStoredLines)
+        shorten(mFile);
+    if (stored.size() > kMostHistoryLines)
+        stored.erase(stored.begin(), stored.end() - kMostHistoryLines);
+    for (const std::string_view line : stored)
+        lines.push_back(toWide(decoded(line)));
+    return lines;
+}
+
+Result<> TypedHistory::add(const std::wstring& line)
+{
+    const std::string kept = toUtf8(withoutCredentials(line));
+    if (mGivenUp || kept.find_first_not_of(" \t") == kept.npos)
+        return {};
+    Descriptor file = openAlone(mFile);
+    if (!file)
+        return giveUp(L"cannot be written", toWide(std::strerror(errno)));
+    if (!isOrdinary(file.number()))
+        return giveUp(L"is not used", L"it is not an ordinary file");
+    const bool written =
+        writeAll(file.number(), beginning(file.number()) + encoded(kept) + "\n") && file.close();
+    return written ? Result<>() : giveUp(L"cannot be written", toWide(std::strerror(errno)));
+}
+} // namespace tessel

@@ -1,0 +1,37 @@
+// The lines that were typed at the prompt, in a file of the profile, one after the other.
+#pragma once
+
+#include <cstddef>
+#include <filesystem>
+#include <string>
+#include <vector>
+
+#include "host/text/Result.h"
+
+namespace tessel
+{
+// As many lines the arrow keys bring back.
+inline constexpr std::size_t kMostHistoryLines = 1000;
+
+// Sessions that run at the same time add to the same file, a line each time: none takes away another's, and
+// a session that is killed has kept what was typed. What the file fails at is answered once; from then on
+// this session neither reads nor writes it, and keeps quiet.
+class TypedHistory
+{
+public:
+    explicit TypedHistory(std::filesystem::path file) : mFile(std::move(file)) {}
+
+    // The last lines, the oldest first; none when there is no file yet.
+    Result<std::vector<std::wstring>> read();
+
+    // Adds a line, without its line break. A blank one is passed over; the password in an address is left
+    // out.
+    Result<> add(const std::wstring& line);
+
+private:
+    Failure giveUp(const std::wstring& whatFailed, const std::wstring& reason);
+
+    std::filesystem::path mFile;
+    bool mGivenUp = false;
+};
+} // namespace tessel

@@ -1,0 +1,45 @@
+// A file that comes into being under a name of its own, and takes its place when all of it is there.
+#pragma once
+
+#include <filesystem>
+#include <string>
+#include <string_view>
+
+#include "host/platform/Descriptor.h"
+#include "host/text/Result.h"
+
+namespace tessel
+{
+// Nobody else can have made the file, and only the person can read it. A part that has not taken its place is
+// removed at the end; what a killed process leaves is told from what a running one writes by its lock.
+class PartFile
+{
+public:
+    // In that folder, which is on the same file system as the place to be.
+    explicit PartFile(const std::filesystem::path& folder);
+    ~PartFile();
+    PartFile(const PartFile&) = delete;
+    PartFile& operator=(const PartFile&) = delete;
+
+    // Why it could not be made; the system's words.
+    const Result<>& made() const { return mMade; }
+
+    bool write(std::string_view bytes);
+
+    // As is usual for new files of the person's; without it nobody else can read it.
+    bool letOthersRead();
+
+    // Puts it in place of what stands there. Fails with the system's words.
+    Result<> moveTo(const std::filesystem::path& place);
+
+    // Removes what killed processes have left in the folder.
+    static void clearLeftOvers(const std::filesystem::path& folder);
+
+private:
+    void make(const std::filesystem::path& folder);
+
+    Result<> mMade;
+    std::string mPath; // empty when there is nothing to remove
+    Descriptor mFile{-1};
+};
+} // namespace tessel

@@ -1,0 +1,38 @@
+// How loading files of Lisp comes off, seen from outside: which file an expression loads, and what becomes of
+// it. Files load others, and may catch the errors of those.
+#pragma once
+
+#include <string>
+#include <vector>
+
+#include "host/applications/LoadOutcomes.h"
+
+namespace tessel
+{
+class LispLoads
+{
+public:
+    // What it finds out it notes there, if anywhere.
+    explicit LispLoads(LoadOutcomes* outcomes) : mOutcomes(outcomes) {}
+
+    // An expression begins, and ends with this result.
+    void begin() { mFiles.clear(); }
+    void end(const Outcome& value);
+
+    // In between: a file is to be loaded, and is loaded. The path as it was given.
+    void asked(const std::wstring& path) { mFiles.push_back({path, LoadOutcomes::Clock::now()}); }
+    void loaded(const std::wstring& path);
+
+private:
+    struct File
+    {
+        std::wstring path;
+        LoadOutcomes::Clock::time_point begun;
+    };
+
+    void note(const File& file, const Result<>& loaded) const;
+
+    LoadOutcomes* mOutcomes;
+    std::vector<File> mFiles; // that have begun and are not loaded, each within the one before it
+};
+} // namespace tessel

@@ -1,0 +1,63 @@
+#include "host/platform/OrdinaryFile.h"
+
+#include <array>
+#include <cerrno>
+#include <cstring>
+
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include "host/platform/Descriptor.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+Failure lastError()
+{
+    const bool isMissing = errno == ENOENT || errno == ENOTDIR;
+    return {toWide(std::strerror(errno)), isMissing ? kNothingThere : Failure::kUnspecified};
+}
+
+Failure tooLarge(std::uintmax_t mostBytes)
+{
+    return {L"it is larger than " + std::to_wstring(mostBytes) + L" bytes"};
+}
+
+Result<> checkKind(int file, std::uintmax_t mostBytes)
+{
+    struct stat status = {};
+    if (fstat(file, &status) != 0)
+        return lastError();
+    if (S_ISDIR(status.st_mode))
+        return Failure{L"it is a folder, not a file"};
+    if (!S_ISREG(status.st_mode))
+        return Failure{L"it is not an ordinary file"};
+    return static_cast<std::uintmax_t>(status.st_size) > mostBytes ? tooLarge(mostBytes) : Result<>();
+}
+} // namespace
+
+Result<std::string> readOrdinaryFile(const std::filesystem::path& path, std::uintmax_t mostBytes)
+{
+    // Opening a pipe that nobody writes to would wait for a writer.
+    const Descriptor file(open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOCTTY));
+    if (!file)
+        return lastError();
+    if (const auto checked = checkKind(file.number(), mostBytes); !checked)
+        return checked.failure();
+    std::string content;
+    std::array<char, 65536> piece;
+    ssize_t count = 0;
+    while ((count = read(file.number(), piece.data(), piece.size())) > 0)
+    {
+        content.append(piece.data(), static_cast<std::size_t>(count));
+        if (content.size() > mostBytes) // it grows while it is read
+            return tooLarge(mostBytes);
+    }
+    if (count < 0)
+        return lastError();
+    return content;
+}
+} // namespace tessel

@@ -1,0 +1,17 @@
+// Folders and files that are the person's own.
+#pragma once
+
+#include <filesystem>
+
+#include "host/text/Result.h"
+
+namespace tessel
+{
+// Makes the folder so that only the person can enter it, and the missing ones above it as is usual. One that
+// is there already stays as it is. Why it cannot be made is the end of a sentence.
+Result<> makePrivateFolder(const std::filesystem::path& folder);
+
+// Fails where another user could have written: what stands at the path belongs to somebody else, or others
+// have the right. Who and how is the end of a sentence. A link counts as what it leads to.
+Result<> checkNobodyElseWrites(const std::filesystem::path& path);
+} // namespace tessel

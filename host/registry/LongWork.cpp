@@ -1,0 +1,44 @@
+#include "host/registry/LongWork.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr unsigned kLookAtClock = 1024;         // values between two looks
+constexpr unsigned kWorthInterrupting = 10'000; // values, some hundredths of a second
+constexpr std::chrono::seconds kPatience{2};
+} // namespace
+
+void LongWork::count()
+{
+    if (++mValues % kLookAtClock == 1)
+        tell();
+}
+
+// Values that come now and then, while something else is done, are no work to wait for.
+void LongWork::tell()
+{
+    const auto now = Clock::now();
+    if (now - mLast > kPatience)
+        mTold = now;
+    mLast = now;
+    if (now - mTold < kPatience || !mSay)
+        return;
+    mTold = now;
+    mSay(L"The registry has read or written " + std::to_wstring(mValues) +
+         L" values so far. Ctrl-C stops it.");
+}
+
+void LongWork::end()
+{
+    mValues = 0;
+    mInterrupted = false;
+    mLast = {};
+}
+
+void LongWork::interrupt() noexcept
+{
+    if (mValues > kWorthInterrupting)
+        mInterrupted = true;
+}
+} // namespace tessel

@@ -1,0 +1,44 @@
+// The reading and writing of very many values in one command: a person is told how far it has come, and can
+// stop it. Used by the Registry alone.
+#pragma once
+
+#include <atomic>
+#include <chrono>
+#include <functional>
+#include <string>
+#include <utility>
+
+namespace tessel
+{
+class LongWork
+{
+public:
+    using Say = std::function<void(const std::wstring& sentence)>;
+
+    // What says how far it has come, about so often; nobody at first.
+    void tellBy(Say say) { mSay = std::move(say); }
+
+    // One value more.
+    void count();
+
+    bool isInterrupted() const { return mInterrupted; }
+
+    // The command is over: what comes next is counted from the beginning and is not interrupted.
+    void end();
+
+    // Stops the work, if so much has been done that it is this which the person waits for. Safe in a signal
+    // handler and from another thread.
+    void interrupt() noexcept;
+
+private:
+    using Clock = std::chrono::steady_clock;
+
+    void tell();
+
+    Say mSay;
+    std::atomic<unsigned> mValues = 0;
+    std::atomic<bool> mInterrupted = false;
+    Clock::time_point mLast;
+    Clock::time_point mTold;
+};
+} // namespace tessel

@@ -1,0 +1,209 @@
+#include "host/registry/SoundCopy.h"
+
+#include <array>
+#include <cerrno>
+#include <cstdio>
+#include <cstring>
+#include <ctime>
+#include <memory>
+
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include "host/registry/Schema.h"
+#include "host/registry/Soundness.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr std::array kJournals = {"-wal", "-journal"};
+
+struct CloseDatabase
+{
+    void operator()(sqlite3* database) const { sqlite3_close(database); }
+};
+
+using Image = std::unique_ptr<unsigned char, void (*)(void*)>;
+
+Failure systemFailure()
+{
+    return {toWide(std::strerror(errno)), errno};
+}
+
+std::filesystem::path beside(const std::filesystem::path& file, const char* ending)
+{
+    return file.string() + ending;
+}
+
+Result<> writeAll(int file, std::string_view bytes)
+{
+    while (!bytes.empty())
+    {
+        const ssize_t count = write(file, bytes.data(), bytes.size());
+        if (count < 0 && errno != EINTR)
+            return systemFailure();
+        bytes.remove_prefix(count < 0 ? 0 : static_cast<std::size_t>(count));
+    }
+    return fsync(file) == 0 ? Result<>() : systemFailure();
+}
+
+// A new file beside the other, wholly on the disk. Answers its path.
+Result<std::string> writeBeside(const std::filesystem::path& file, std::string_view bytes)
+{
+    std::string name = beside(file, ".XXXXXX").string();
+    const int descriptor = mkostemp(name.data(), O_CLOEXEC);
+    if (descriptor < 0)
+        return systemFailure();
+    auto written = writeAll(descriptor, bytes);
+    if (close(descriptor) != 0 && written)
+        written = systemFailure();
+    if (written)
+        return name;
+    unlink(name.c_str());
+    return written.failure();
+}
+
+// That a name leads to a file is on the disk only when its folder is. Not every file system can be asked.
+void storeFolderOf(const std::filesystem::path& file)
+{
+    const int folder = open(file.parent_path().c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+    if (folder < 0)
+        return;
+    static_cast<void>(fsync(folder));
+    close(folder);
+}
+
+Result<> replace(const std::filesystem::path& file, std::string_view bytes)
+{
+    const auto made = writeBeside(file, bytes);
+    if (!made)
+        return made.failure();
+    if (rename(made->c_str(), file.c_str()) != 0)
+    {
+        const Failure failure = systemFailure();
+        unlink(made->c_str());
+        return failure;
+    }
+    storeFolderOf(file);
+    return {};
+}
+
+Result<> useCopy(sqlite3* database)
+{
+    const int status = addChecksum(database);
+    if (status != SQLITE_OK)
+        return storeFailure(database, status);
+    const auto version = firstNumber(database, "PRAGMA user_version");
+    if (!version)
+        return version.failure();
+    if (*version != kSchemaVersion)
+        return Failure{L"it is of another version"};
+    auto sound = checkTables(database, kSchemaVersion);
+    return sound ? checkSoundness(database, kSchemaVersion) : sound;
+}
+
+// The copy's bytes, if it is sound.
+Result<std::string> readCopy(const std::filesystem::path& copy)
+{
+    sqlite3* opened = nullptr;
+    const int status = sqlite3_open_v2(copy.c_str(), &opened, SQLITE_OPEN_READONLY, nullptr);
+    const std::unique_ptr<sqlite3, CloseDatabase> database(opened);
+    const auto sound = status == SQLITE_OK ? useCopy(opened) : Result<>(storeFailure(opened, status));
+    if (!sound)
+        return sound.failure();
+    sqlite3_int64 size = 0;
+    const Image image(sqlite3_serialize(opened, "main", &size, 0), sqlite3_free);
+    if (!image)
+        return storeFailure(opened, SQLITE_NOMEM);
+    return std::string(image.get(), image.get() + size);
+}
+
+// What stands at the path gets a second name, in place of what had it before.
+Result<> nameToo(const std::filesystem::path& file, const std::filesystem::path& second)
+{
+    unlink(second.c_str());
+    return link(file.c_str(), second.c_str()) == 0 || errno == ENOENT ? Result<>() : systemFailure();
+}
+
+// A journal is part of the file that it was written for.
+Result<> setJournalsAside(const std::filesystem::path& file, const std::filesystem::path& kept)
+{
+    for (const char* ending : kJournals)
+        if (rename(beside(file, ending).c_str(), beside(kept, ending).c_str()) != 0 && errno != ENOENT)
+            return systemFailure();
+    unlink(beside(file, "-shm").c_str());
+    return {};
+}
+
+Failure notRestored(const std::filesystem::path& file, const std::wstring& reason)
+{
+    return {L"The registry " + toWide(file.string()) + L" was not restored: " + reason + L"."};
+}
+} // namespace
+
+std::filesystem::path soundCopyOf(const std::filesystem::path& file)
+{
+    return beside(file, ".sound");
+}
+
+std::wstring timeOfCopy(const std::filesystem::path& file)
+{
+    struct stat status = {};
+    if (stat(soundCopyOf(file).c_str(), &status) != 0)
+        return {};
+    struct tm parts = {};
+    localtime_r(&status.st_mtime, &parts);
+    char text[sizeof "2026-11-22 09:41"] = {};
+    return std::strftime(text, sizeof text, "%Y-%m-%d %H:%M", &parts) > 0 ? toWide(text) : std::wstring();
+}
+
+std::wstring helpAgainstDamage(const std::filesystem::path& file)
+{
+    const std::wstring time = timeOfCopy(file);
+    return time.empty() ? L"There is no copy of an earlier state."
+                        : L"REGISTRY RESTORE puts back the copy of " + time + L".";
+}
+
+Result<> makeSoundCopy(sqlite3* database, const std::filesystem::path& file)
+{
+    sqlite3_int64 size = 0;
+    const Image image(sqlite3_serialize(database, "main", &size, 0), sqlite3_free);
+    if (!image)
+        return storeFailure(database, sqlite3_errcode(database));
+    const auto* bytes = reinterpret_cast<const char*>(image.get());
+    return replace(soundCopyOf(file), {bytes, static_cast<std::size_t>(size)});
+}
+
+Result<std::filesystem::path> putSoundCopyBack(const std::filesystem::path& file)
+{
+    const auto copy = soundCopyOf(file);
+    if (timeOfCopy(file).empty())
+        return notRestored(file, L"there is no copy of an earlier state");
+    const auto bytes = readCopy(copy);
+    if (!bytes)
+        return notRestored(file,
+                           L"its copy " + toWide(copy.string()) + L" cannot be used: " + bytes.sentence());
+    const auto kept = beside(file, ".damaged");
+    auto done = nameToo(file, kept);
+    if (done)
+        done = setJournalsAside(file, kept);
+    if (done)
+        done = replace(file, *bytes);
+    return done ? Result<std::filesystem::path>(kept) : notRestored(file, done.sentence());
+}
+
+Result<> makeFileOnce(const std::filesystem::path& file, std::string_view bytes)
+{
+    const auto made = writeBeside(file, bytes);
+    if (!made)
+        return made.failure();
+    const bool placed = link(made->c_str(), file.c_str()) == 0 || errno == EEXIST;
+    const Failure failure = systemFailure();
+    unlink(made->c_str());
+    storeFolderOf(file);
+    return placed ? Result<>() : failure;
+}
+} // namespace tessel

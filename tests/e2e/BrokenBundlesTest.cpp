@@ -1,0 +1,131 @@
+// Bundles with a broken description, at every place where a person meets them: loaded by hand, from the
+// Startup Suite, by the records of the host. One sentence each, and the
+// host goes on.
+#include <gmock/gmock.h>
+
+#include "tests/e2e/Applications.h"
+
+namespace fs = std::filesystem;
+
+using testing::EndsWith;
+using testing::HasSubstr;
+using testing::StartsWith;
+
+namespace
+{
+struct Broken
+{
+    const char* name;
+    const char* description;
+    const char* reason; // how the sentence about it goes on
+};
+
+constexpr Broken kBroken[] = {
+    {"list", "{ NSExecutable = (Good); }", "its description has no text for the name of its program.\n"},
+    {"table", "{ NSExecutable = { a = b; }; }", "its description has no text for the name of its program.\n"},
+    {"outside", "{ NSExecutable = \"../Good.bundle/Good\"; }",
+     "its description names the program \"../Good.bundle/Good\", which leads out of the bundle.\n"},
+    {"letter", "Dear { Sir or Madam", "its description \""},
+    {"empty", "", "its description \""},
+    {"missing", "{ NSExecutable = Gone; }", "its program \""},
+};
+
+class BrokenBundles : public testing::Test
+{
+protected:
+    BrokenBundles()
+    {
+        for (const Broken& broken : kBroken)
+        {
+            fs::copy(fixtureModule("Good.bundle"), pathOf(broken), fs::copy_options::recursive);
+            session.folder().write(fs::path(pathOf(broken)) / "Resources" / "Info-gnustep.plist",
+                                   broken.description);
+        }
+    }
+
+    std::string pathOf(const Broken& broken) const
+    {
+        return session.folder() / (broken.name + std::string(".bundle"));
+    }
+
+    static std::string refusal(const std::string& path, const Broken& broken)
+    {
+        return "The application \"" + path + "\" is not loaded: " + broken.reason;
+    }
+
+    // Everything that was said is about one of them, or is in the list of other lines.
+    static void expectNoOtherLines(const std::string& output, const std::vector<std::string>& others)
+    {
+        std::istringstream lines(output);
+        for (std::string line; std::getline(lines, line);)
+        {
+            const bool isTold = line.starts_with("The application \"") && line.ends_with(".");
+            const bool isKnown = std::ranges::any_of(others, [&](const std::string& other)
+                                                     { return line.starts_with(other); });
+            EXPECT_TRUE(isTold || isKnown) << line;
+        }
+    }
+
+    HostSession session;
+};
+} // namespace
+
+TEST_F(BrokenBundles, AreToldWhenTheyAreLoadedByHand)
+{
+    session.alwaysWith({"--safe"});
+    for (const Broken& broken : kBroken)
+    {
+        const auto result = session.run({"LOAD " + pathOf(broken), "LOAD " + fixtureModule("Good.zmb")});
+        EXPECT_EQ(result.exitStatus, 1) << result.output;
+        EXPECT_THAT(result.output, StartsWith(kBanner + ("Command: LOAD " + pathOf(broken) + "\n") +
+                                              refusal(pathOf(broken), broken)));
+        EXPECT_THAT(result.output, HasSubstr(fixtureModule("Good.zmb") + " is loaded.\n"));
+        expectNoOtherLines(result.output,
+                           {"Tessel R21", "Command: ", "Good.zmb: ", fixtureModule("Good.zmb")});
+    }
+}
+
+TEST_F(BrokenBundles, InTheStartupSuiteCostOneEntryEach)
+{
+    Paths suite = {fixtureModule("Good.zmb")};
+    for (const Broken& broken : kBroken)
+        suite.push_back(pathOf(broken));
+    suite.push_back(fixtureModule("Good.omp"));
+    storeSuite(session, suite);
+    const auto result = session.run({"VERSION"});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    for (const Broken& broken : kBroken)
+        EXPECT_THAT(result.output, HasSubstr(refusal(pathOf(broken), broken)));
+    EXPECT_THAT(result.output, HasSubstr("Good.zmb: message 1\n"));
+    EXPECT_THAT(result.output, HasSubstr("Good.omp: message 1\n"));
+    EXPECT_THAT(result.output, EndsWith("Tessel R21, reference host for Modrig\n"
+                                        "Good.omp: message 2\nGood.zmb: message 2\n"));
+    expectNoOtherLines(result.output, {"Tessel R21", "Command: ", "Good.",
+                                       "Message: 6 applications could not be loaded:", "  /"});
+}
+
+TEST_F(BrokenBundles, InTheRecordsCostOneApplicationEach)
+{
+    std::vector<std::string> commands;
+    const auto record = [&](const std::string& name, const std::string& path)
+    {
+        const std::string key = R"(REGISTRY SET Software\Tessel\R21\Applications\)" + name;
+        commands.push_back(key + " Module " + quoted(path));
+        commands.push_back(key + " LoadReasons 2");
+    };
+    record("First", fixtureModule("Good.zmb"));
+    for (const Broken& broken : kBroken)
+        record(broken.name, pathOf(broken));
+    record("Last", fixtureModule("Good.omp"));
+    auto arguments = byArguments(commands);
+    arguments.emplace_back("--safe");
+    ASSERT_EQ(session.start(arguments).exitStatus, 0);
+    const auto result = session.run({"VERSION"});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    for (const Broken& broken : kBroken)
+        EXPECT_THAT(result.output, HasSubstr(refusal(pathOf(broken), broken)));
+    EXPECT_THAT(result.output, HasSubstr("Good.zmb: message 1\n"));
+    EXPECT_THAT(result.output, HasSubstr("Good.omp: message 1\n"));
+    expectNoOtherLines(result.output, {"Tessel R21", "Command: ", "Good.",
+                                       "Message: 6 applications could not be loaded:", "  /"});
+}

@@ -1,0 +1,186 @@
+// Ctrl-C at a terminal, pressed once, twice and more often.
+#include <gmock/gmock.h>
+
+#include <csignal>
+#include <fstream>
+
+#include "tests/e2e/Applications.h"
+#include "tests/e2e/HostTerminal.h"
+
+using testing::HasSubstr;
+using testing::Not;
+
+namespace
+{
+constexpr char kQuestion[] =
+    "What is running does not come back. End Tessel? What is not stored yet is lost. [y/N] ";
+constexpr int kEndedByKey = 128 + SIGINT;
+constexpr int kInVain = 3;
+constexpr std::chrono::milliseconds kMoment{200};
+
+class Interruption : public testing::Test
+{
+protected:
+    Interruption()
+    {
+        session.set("HANG_UNTIL", file().string());
+        session.alwaysWith({"--safe"});
+    }
+
+    std::filesystem::path file() const { return session.folder() / "come back"; }
+
+    // As a person does it: two keys within a moment are one wish. Whether the question came at the last one.
+    static bool asksAfter(HostTerminal& terminal, int presses)
+    {
+        bool asked = false;
+        for (int press = 0; press < presses; ++press)
+        {
+            EXPECT_FALSE(asked) << "after " << press << " times";
+            terminal.type(kControlC);
+            EXPECT_TRUE(terminal.shows("^C")) << terminal.screen();
+            const bool isLast = press + 1 == presses && presses == kInVain;
+            asked = terminal.showsWithin(kQuestion, isLast ? kHostTimeLimit : kMoment);
+        }
+        return asked;
+    }
+
+    static void type(HostTerminal& terminal, const std::string& line)
+    {
+        ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+        terminal.type(line + "\r");
+    }
+
+    static void hang(HostTerminal& terminal)
+    {
+        type(terminal, "LOAD " + fixtureModule("Hangs.zmb"));
+        type(terminal, "HANG");
+        ASSERT_TRUE(terminal.shows("hanging\r\n")) << terminal.screen();
+    }
+
+    void expectGoodEnd(HostTerminal& terminal) const
+    {
+        type(terminal, "(+ 30 12)");
+        EXPECT_TRUE(terminal.shows("\n42")) << terminal.screen();
+        type(terminal, "QUIT");
+        EXPECT_EQ(terminal.waitForEnd(), 0) << terminal.screen();
+    }
+
+    HostSession session;
+};
+} // namespace
+
+TEST_F(Interruption, StopsACleanUpThatNeverEnds)
+{
+    HostTerminal terminal(session);
+    type(terminal, "(unwind-protect (progn (princ \"be\") (princ \"gun\") (loop)) (princ \"clea\") (princ "
+                   "\"ning\") (loop))");
+    ASSERT_TRUE(terminal.shows("begun")) << terminal.screen();
+    terminal.type(kControlC);
+    ASSERT_TRUE(terminal.shows("cleaning")) << terminal.screen();
+    // What is pressed while the first one is still on its way is taken for the same wish.
+    while (!terminal.showsWithin("Lisp was interrupted.", std::chrono::milliseconds(300)))
+        terminal.type(kControlC);
+    EXPECT_THAT(terminal.screen(), Not(HasSubstr(kQuestion)));
+    expectGoodEnd(terminal);
+}
+
+TEST_F(Interruption, AsksWhetherToEndTheHostAtTheThirdTime)
+{
+    HostTerminal terminal(session);
+    hang(terminal);
+    ASSERT_TRUE(asksAfter(terminal, kInVain)) << terminal.screen();
+    terminal.type("y\r");
+    EXPECT_EQ(terminal.waitForEnd(), kEndedByKey) << terminal.screen();
+}
+
+TEST_F(Interruption, WaitsOnAfterAnyOtherAnswer)
+{
+    HostTerminal terminal(session);
+    hang(terminal);
+    for (const char* answer : {"n\r", "\r", "maybe y\r"})
+    {
+        ASSERT_TRUE(asksAfter(terminal, kInVain)) << terminal.screen();
+        terminal.type(answer);
+        ASSERT_TRUE(terminal.shows("Tessel waits on.")) << terminal.screen();
+    }
+    std::ofstream(file()) << "now";
+    ASSERT_TRUE(terminal.shows("back again")) << terminal.screen();
+    expectGoodEnd(terminal);
+}
+
+TEST_F(Interruption, AnswersAreNotWhatWasTypedBefore)
+{
+    HostTerminal terminal(session);
+    hang(terminal);
+    terminal.type("y\ry\r");
+    ASSERT_TRUE(asksAfter(terminal, kInVain)) << terminal.screen();
+    terminal.type("n\r");
+    std::ofstream(file()) << "now";
+    ASSERT_TRUE(terminal.shows("back again")) << terminal.screen();
+    expectGoodEnd(terminal);
+}
+
+TEST_F(Interruption, CountsForEachLineByItself)
+{
+    HostTerminal terminal(session);
+    std::ofstream(file()) << "at once";
+    hang(terminal);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    std::filesystem::remove(file());
+    for (int line = 0; line < 2; ++line)
+    {
+        terminal.type("HANG\r");
+        ASSERT_TRUE(terminal.shows("hanging\r\n")) << terminal.screen();
+        EXPECT_FALSE(asksAfter(terminal, kInVain - 1)) << terminal.screen();
+        std::ofstream(file()) << "now";
+        ASSERT_TRUE(terminal.shows("back again")) << terminal.screen();
+        ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+        std::filesystem::remove(file());
+    }
+    EXPECT_THAT(terminal.screen(), Not(HasSubstr(kQuestion)));
+    terminal.type(kControlD);
+    EXPECT_EQ(terminal.waitForEnd(), 0);
+}
+
+TEST_F(Interruption, DoesNotAskAPersonWhoLeansOnTheKeyAtThePrompt)
+{
+    HostTerminal terminal(session);
+    for (int press = 0; press < 10; ++press)
+    {
+        ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+        terminal.type(kControlC);
+    }
+    EXPECT_THAT(terminal.screen(), Not(HasSubstr(kQuestion)));
+    expectGoodEnd(terminal);
+}
+
+// Each of them comes back at the first key.
+TEST_F(Interruption, DoesNotAskWhileLispObeys)
+{
+    const auto lisp =
+        session.folder().write("three.script", "(progn (princ \"one\") (finish-output) (loop))\n"
+                                               "(progn (princ \"two\") (finish-output) (loop))\n"
+                                               "(progn (princ \"three\") (finish-output) (loop))\n"
+                                               "(progn (princ \"four\") (finish-output) (loop))\n");
+    HostTerminal terminal(session);
+    type(terminal, "SCRIPT " + lisp.string());
+    for (const char* word : {"one", "two", "three", "four"})
+    {
+        ASSERT_TRUE(terminal.shows(std::string("\n") + word)) << terminal.screen();
+        terminal.type(kControlC);
+        ASSERT_TRUE(terminal.shows("Lisp was interrupted.")) << terminal.screen();
+    }
+    EXPECT_THAT(terminal.screen(), Not(HasSubstr(kQuestion)));
+    expectGoodEnd(terminal);
+}
+
+TEST_F(Interruption, WithoutATerminalAsksNobody)
+{
+    session.startBy(
+        "setsid \"$0\" \"$@\" & until [ -e '" + file().string() +
+        ".begun' ]; do :; done; for press in 1 2 3 4; do kill -INT $!; sleep 0.05; done; touch '" +
+        file().string() + "'; wait $!");
+    const auto result = session.run({"LOAD " + fixtureModule("Hangs.zmb"), "HANG"});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, HasSubstr("hanging\nback again\n"));
+}

@@ -1,0 +1,89 @@
+// Whose profile it is.
+#include <gmock/gmock.h>
+
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include "tests/e2e/HostProcess.h"
+
+namespace fs = std::filesystem;
+
+using testing::HasSubstr;
+using testing::Not;
+
+namespace
+{
+mode_t rightsOf(const fs::path& path)
+{
+    struct stat status = {};
+    EXPECT_EQ(stat(path.c_str(), &status), 0) << path;
+    return status.st_mode & 07777;
+}
+
+class ProfileRights : public testing::Test
+{
+protected:
+    // Starts a host on a profile that is there already and can be used with these rights.
+    std::string outputWith(mode_t rights)
+    {
+        fs::create_directories(session.profile());
+        chmod(session.profile().c_str(), rights);
+        const auto result = session.run({"VERSION"});
+        EXPECT_EQ(result.exitStatus, 0) << result.output;
+        EXPECT_EQ(rightsOf(session.profile()), rights) << "they are the person's to change";
+        return result.output;
+    }
+
+    std::string notSafe(const std::string& reason) const
+    {
+        return "The profile folder " + session.profile().string() + " is not safe: " + reason +
+               ", and so could change what Tessel loads.\n";
+    }
+
+    HostSession session;
+};
+} // namespace
+
+TEST_F(ProfileRights, OfANewOneAreThePersonsAlone)
+{
+    session.startBy("umask 0; exec \"$0\" \"$@\"");
+    ASSERT_EQ(session.run({"VERSION"}).exitStatus, 0);
+    EXPECT_EQ(rightsOf(session.profile()), 0700u);
+}
+
+TEST_F(ProfileRights, OfThePersonsOwnFolderAreTheirsAlone)
+{
+    session.startBy("umask 0; shift 2; exec \"$0\" \"$@\"");
+    ASSERT_EQ(session.run({"VERSION"}).exitStatus, 0);
+    EXPECT_EQ(rightsOf(session.folder() / "home/.local/share/Tessel"), 0700u);
+}
+
+TEST_F(ProfileRights, OfOthersToWriteAreTold)
+{
+    EXPECT_THAT(outputWith(0770), HasSubstr(notSafe("other users may write to it")));
+    EXPECT_THAT(outputWith(0707), HasSubstr(notSafe("other users may write to it")));
+}
+
+TEST_F(ProfileRights, OfOthersToReadAreNoReasonForASentence)
+{
+    EXPECT_THAT(outputWith(0755), Not(HasSubstr("not safe")));
+}
+
+TEST_F(ProfileRights, OfAnotherUserAreTold)
+{
+    if (geteuid() != 0)
+        GTEST_SKIP() << "only the administrator can give a folder away";
+    fs::create_directories(session.profile());
+    ASSERT_EQ(chown(session.profile().c_str(), 12345, 12345), 0);
+    EXPECT_THAT(outputWith(0755), HasSubstr(notSafe("it belongs to another user")));
+}
+
+TEST_F(ProfileRights, AreAskedOfTheFolderBehindALink)
+{
+    fs::create_directories(session.folder() / "elsewhere");
+    chmod((session.folder() / "elsewhere").c_str(), 0777);
+    fs::create_directory_symlink(session.folder() / "elsewhere", session.profile());
+    const auto result = session.run({"VERSION"});
+    EXPECT_EQ(result.exitStatus, 0);
+    EXPECT_THAT(result.output, HasSubstr("elsewhere is not safe: other users may write to it"));
+}
