@@ -85,7 +85,7 @@ void putOffModrig(const HostSession& session)
 {
     const std::string set = std::string("REGISTRY SET ") + kRecordKey;
     const auto result = session.start(
-        {"--safe", "-c", set + " Module " + quoted(modrigBundle()), "-c", set + " LoadReasons 4"});
+        {"--safe", "-c", set + " Module " + inQuotes(modrigBundle()), "-c", set + " LoadReasons 4"});
     ASSERT_EQ(result.exitStatus, 0) << result.output;
 }
 

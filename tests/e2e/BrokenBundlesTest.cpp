@@ -110,7 +110,7 @@ TEST_F(BrokenBundles, InTheRecordsCostOneApplicationEach)
     const auto record = [&](const std::string& name, const std::string& path)
     {
         const std::string key = R"(REGISTRY SET Software\Tessel\R21\Applications\)" + name;
-        commands.push_back(key + " Module " + quoted(path));
+        commands.push_back(key + " Module " + inQuotes(path));
         commands.push_back(key + " LoadReasons 2");
     };
     record("First", fixtureModule("Good.zmb"));

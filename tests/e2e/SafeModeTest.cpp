@@ -92,10 +92,10 @@ INSTANTIATE_TEST_SUITE_P(
     OfAProfile, SafeMode,
     testing::Values(Profile{"WithoutARecord", {}},
                     Profile{"WithTheRecordOfASuite",
-                            {record("Module " + quoted(MODRIG_BUNDLE)), record("LoadReasons 6"),
+                            {record("Module " + inQuotes(MODRIG_BUNDLE)), record("LoadReasons 6"),
                              record(R"(Commands\ MODRIG MODRIG)")}},
                     Profile{"WithARecordOfNoCommand",
-                            {record("Module " + quoted(MODRIG_BUNDLE)), record("LoadReasons 2")}},
+                            {record("Module " + inQuotes(MODRIG_BUNDLE)), record("LoadReasons 2")}},
                     Profile{"WithARecordOfWhereItWas",
                             {record("Module /opt/old/Modrig.bundle"), record("LoadReasons 6")}}),
     [](const auto& profile) { return profile.param.name; });
