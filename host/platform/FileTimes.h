@@ -1,4 +1,4 @@
-// The times of a file as exact as the system keeps them, in nanoseconds of the calendar.
+// The times of a file, in nanoseconds of the calendar; some systems tell whole seconds only.
 #pragma once
 
 #include <cstdint>
