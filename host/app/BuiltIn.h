@@ -20,6 +20,7 @@ struct SessionActions
 
 void addSessionCommands(Parts& parts, SessionActions actions); // HELP QUIT EXIT VERSION CD SCRIPT
 void addApplicationCommands(Parts& parts);                     // LOAD UNLOAD APPS
+void addKeptOutCommands(Parts& parts);                         // DISABLE ENABLE BISECT
 void addSettingCommands(Parts& parts);                         // SETVAR PROFILE
 void addRegistryCommands(Parts& parts);                        // REGISTRY
 } // namespace tessel

@@ -20,17 +20,6 @@ constexpr std::size_t kFolderColumn = 48;
 constexpr std::size_t kAnyLength = std::numeric_limits<std::size_t>::max();
 constexpr std::array kLispExtensions = {L".lsp", L".qbc"};
 
-// Where the file is, along the host's search path; a file that is not found is looked for where the user is,
-// so that what is said about it names a whole path.
-std::wstring fullPath(const Parts& parts, const std::wstring& typed)
-{
-    if (const auto found = parts.files->find(toPath(typed)))
-        return toText(*found);
-    std::error_code currentFolderIsGone;
-    const auto path = std::filesystem::absolute(toPath(typed), currentFolderIsGone);
-    return toText(path.has_filename() ? path : path.parent_path());
-}
-
 bool isLispFile(const std::wstring& path)
 {
     const std::wstring extension = toText(toPath(path).extension());
@@ -134,6 +123,18 @@ void sayNotLoaded(Parts& parts)
         sayApplication(parts, outcome.path, outcome.loaded.sentence());
 }
 
+// What was asked for in vain stands among those that were not loaded, with the same reason.
+void sayKeptOut(Parts& parts)
+{
+    for (const auto& application : parts.keptOut.all())
+    {
+        const std::wstring path = toWide(application.path);
+        const LoadOutcome* outcome = parts.loadOutcomes.of(path);
+        if (application.isOut() && (!outcome || outcome->loaded))
+            sayApplication(parts, path, reasonOf(application));
+    }
+}
+
 Result<> listApplications(Parts& parts, const CommandStack::Arguments&)
 {
     const auto modules = parts.linker->loadedModules();
@@ -148,6 +149,7 @@ Result<> listApplications(Parts& parts, const CommandStack::Arguments&)
     }
     if (modules.empty() && lispFiles == 0)
         sayLine(parts, L"No application is loaded.");
+    sayKeptOut(parts);
     sayNotLoaded(parts);
     return {};
 }

@@ -30,6 +30,15 @@ Failure wrongUsage(const Parts& parts, const std::wstring& command)
     return {L"Usage: " + command + L" " + (found == known.end() ? L"" : found->usage)};
 }
 
+std::wstring fullPath(const Parts& parts, const std::wstring& typed)
+{
+    if (const auto found = parts.files->find(toPath(typed)))
+        return toText(*found);
+    std::error_code currentFolderIsGone;
+    const auto path = std::filesystem::absolute(toPath(typed), currentFolderIsGone);
+    return toText(path.has_filename() ? path : path.parent_path());
+}
+
 std::filesystem::path toPath(const std::wstring& text)
 {
     return toUtf8(text);

@@ -24,6 +24,10 @@ Result<> succeed(Parts& parts, const std::wstring& sentence);
 // How the command is to be typed.
 Failure wrongUsage(const Parts& parts, const std::wstring& command);
 
+// Where the file is, along the host's search path; a file that is not found is looked for where the user is,
+// so that what is said about it names a whole path.
+std::wstring fullPath(const Parts& parts, const std::wstring& typed);
+
 std::filesystem::path toPath(const std::wstring& text);
 std::wstring toText(const std::filesystem::path& path);
 

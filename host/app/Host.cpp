@@ -22,6 +22,18 @@ std::wstring wideText(const std::filesystem::path& path)
 {
     return toWide(path.string());
 }
+
+// What is refused in a safe session was meant to be: a box for each, before the person gets to the window
+// that they have asked for, would tell nothing that they do not know.
+MessageBox::Presenter quietWhenSafe(MessageBox::Presenter show, const Admission& admission)
+{
+    return [show = std::move(show), &admission](const MessageBox::Box& box)
+    {
+        return admission.isSafe() && admission.marker().reason() == RunningMarker::Reason::kForAnother
+                   ? 0
+                   : show(box);
+    };
+}
 } // namespace
 
 Host::Host(HostOptions options) : mOptions(std::move(options)), mCommandLine(mOptions.output)
@@ -39,12 +51,25 @@ bool Host::start()
     const Interruption::Work work(mInterruption);
     if (!mCommandLine.tell(makeParts()))
         return false;
+    judgeEarlierSessions();
+    const RunningMarker::ReasonScope atStart(*mParts->marker, RunningMarker::Reason::kAtStart);
     mParts->messageBox->collect();
     if (!mOptions.safe)
         mParts->demandLoading.loadAtStart();
     finishLine();
     tellOfStart();
     return true;
+}
+
+void Host::judgeEarlierSessions()
+{
+    const bool givesTrials = !mOptions.safe;
+    for (const auto& sentence : mParts->keptOut.begin(mParts->marker->leftovers(), givesTrials))
+        mCommandLine.say(sentence);
+    if (mParts->keptOut.isStored())
+        mParts->marker->forgetLeftovers();
+    for (const auto& line : mParts->bisecting.sentencesAtStart())
+        mCommandLine.say(line);
 }
 
 void Host::tellOfStart()
@@ -64,8 +89,8 @@ Result<> Host::makeParts()
     tellWhoElseWritesTheProfile();
     // The applications that are loaded next may bring Objective-C along.
     static_cast<void>(keepToolkitFilesIn(mOptions.profileFolder / kToolkitFolder));
-    mParts = std::make_unique<Parts>(
-        Foundations{mCommandLine, mEndRequest, mInterruption, mOptions.profileFolder, mOptions.downloads});
+    mParts = std::make_unique<Parts>(Foundations{mCommandLine, mEndRequest, mInterruption,
+                                                 mOptions.profileFolder, mOptions.downloads, mOptions.safe});
     mCommandLine.tell(mParts->registry->canStore());
     if (const std::wstring& notice = mParts->registry->notice(); !notice.empty())
         mCommandLine.say(notice);
@@ -74,7 +99,7 @@ Result<> Host::makeParts()
     mInterruptible = &mParts->lisp();
     mParts->registry->tellProgressBy([this](const std::wstring& sentence) { mCommandLine.say(sentence); });
     mInterruptibleRegistry = &*mParts->registry;
-    mParts->messageBox->setPresenter(windowBoxes(mParts->layout.binaries));
+    mParts->messageBox->setPresenter(quietWhenSafe(windowBoxes(mParts->layout.binaries), mParts->admission));
     addCommands();
     return {};
 }
@@ -112,6 +137,7 @@ void Host::addCommands()
                                      return runScript(script);
                                  }});
     addApplicationCommands(*mParts);
+    addKeptOutCommands(*mParts);
     addSettingCommands(*mParts);
     addRegistryCommands(*mParts);
     mParts->commands->setLoader([this](const std::wstring& name)
@@ -160,6 +186,7 @@ void Host::end()
     if (!mCommandLine.atLineStart())
         mCommandLine.print(L"\n");
     mParts->linker->unloadAll();
+    mParts->keptOut.noteGoodEnd();
     mCommandLine.tell(mParts->registry->endOfCommand());
     mCommandLine.tell(mParts->registry->keepCopy());
     mInterruptible = nullptr;

@@ -78,6 +78,7 @@ public:
 private:
     Result<> makeParts();
     Result<> prepareProfileFolder();
+    void judgeEarlierSessions();
     void tellWhoElseWritesTheProfile();
     void tellOfStart();
     void addCommands();

@@ -34,7 +34,7 @@ void declare(CLI::App& app, Options& options)
         ->expected(1)
         ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll)
         ->allow_extra_args(false);
-    app.add_flag("--safe", options.safe, "Start without loading any application");
+    app.add_flag("--safe", options.safe, "Start without loading any application by itself");
 }
 } // namespace
 

@@ -9,10 +9,14 @@
 
 #include "host/app/HostInformation.h"
 #include "host/app/Layout.h"
+#include "host/applications/Admission.h"
 #include "host/applications/ApplicationRecords.h"
+#include "host/applications/Bisecting.h"
 #include "host/applications/DemandLoading.h"
 #include "host/applications/Document.h"
 #include "host/applications/DynamicLinker.h"
+#include "host/applications/KeptOut.h"
+#include "host/applications/KeptOutService.h"
 #include "host/applications/LoadOutcomes.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
@@ -23,6 +27,7 @@
 #include "host/lisp/LispInterpreter.h"
 #include "host/messages/Help.h"
 #include "host/messages/MessageBox.h"
+#include "host/platform/RunningMarker.h"
 #include "host/registry/Profiles.h"
 #include "host/registry/Registry.h"
 #include "host/registry/SystemVariables.h"
@@ -34,6 +39,9 @@
 
 namespace tessel
 {
+// In the profile: what is at work, and what is kept out.
+inline constexpr char kApplicationsFolder[] = "applications";
+
 // What the parts are made from.
 struct Foundations
 {
@@ -42,6 +50,7 @@ struct Foundations
     Interruption& interruption;
     const std::filesystem::path& profileFolder; // is there
     const RemoteFiles::Limits& downloads;
+    bool safe; // load nothing by itself
 };
 
 struct Parts
@@ -57,14 +66,20 @@ struct Parts
     Owned<Registry> registry{foundations.profileFolder / "registry.db"};
     Profiles profiles{*registry, kProductRegistryRoot};
     Owned<SystemVariables> variables{&*registry, kProductRegistryRoot};
-    Owned<CallingApplication> callingApplication;
+    Owned<RunningMarker> marker{foundations.profileFolder / kApplicationsFolder};
+    KeptOut keptOut{foundations.profileFolder / kApplicationsFolder};
+    Bisecting bisecting{foundations.profileFolder / kApplicationsFolder, !foundations.safe};
+    Admission admission{*marker, keptOut, bisecting, foundations.safe};
+    Owned<KeptOutService> keptOutService{keptOut, admission, *commandLine};
+    Owned<CallingApplication> callingApplication{*marker};
     Owned<CommandStack> commands{*commandLine, *callingApplication};
     Owned<ResourceModules> resources{toWide(layout.resources.string()), *callingApplication};
     Owned<MessageBox> messageBox{*commandLine};
     LoadOutcomes loadOutcomes;
-    Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands, *messageBox, loadOutcomes};
+    Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands,
+                                *messageBox,  loadOutcomes,        admission};
     Owned<ApplicationRecords> records{*registry, *commands, *callingApplication, kProductRegistryRoot};
-    DemandLoading demandLoading{layout.plugIns, *records, *linker};
+    DemandLoading demandLoading{layout.plugIns, *records, *linker, admission};
     Owned<Document> document;
     Owned<FileSearch> files{layout.resources, *variables};
     Owned<RemoteFiles> remote{foundations.profileFolder / "remote-files", foundations.downloads,
@@ -73,9 +88,11 @@ struct Parts
     Owned<Help> help{layout.resources / "help", openInBrowser};
     // Publishes itself. The variable is read here, before any application is loaded, and holds for the
     // session.
-    Result<std::unique_ptr<LispInterpreter>> startedLisp = LispInterpreter::start(
-        {.removingTsLisp = variables->number(kRemovingTsLisp) != 0, .outcomes = &loadOutcomes}, *commandLine,
-        *document, *endRequest);
+    Result<std::unique_ptr<LispInterpreter>> startedLisp =
+        LispInterpreter::start({.removingTsLisp = variables->number(kRemovingTsLisp) != 0,
+                                .outcomes = &loadOutcomes,
+                                .admission = &admission},
+                               *commandLine, *document, *endRequest);
 
     // Only of parts whose Lisp has started.
     LispInterpreter& lisp() const { return **startedLisp; }

@@ -21,6 +21,7 @@
 #include "host/console/PipedInput.h"
 #include "host/console/StandardOutput.h"
 #include "host/console/TypedHistory.h"
+#include "host/platform/LastWords.h"
 #include "host/text/TerminalText.h"
 #include "host/text/Unicode.h"
 #include "host/text/Version.h"
@@ -100,6 +101,7 @@ int runHost(Options options, StandardOutput& output)
 {
     if (options.profileFolder.empty())
         options.profileFolder = personalFolder();
+    const LastWords lastWords; // before Lisp takes a signal of them
     Host host({options.profileFolder, options.safe,
                [&output](std::string_view text)
                {

@@ -4,6 +4,7 @@
 #include <tessel/tsrx.h>
 
 #include "host/applications/DynamicLinker.h"
+#include "host/applications/KeptOutService.h"
 #include "host/commands/CommandStack.h"
 #include "host/text/Running.h"
 
@@ -21,6 +22,8 @@ public:
             return running<DynamicLinker>();
         if (wanted == TSED_REGISTERED_COMMANDS)
             return running<CommandStack>();
+        if (wanted == TSRX_KEPT_OUT)
+            return running<KeptOutService>();
         return nullptr;
     }
 };

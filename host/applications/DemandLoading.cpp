@@ -7,6 +7,7 @@
 
 #include <tessel/tsappinfo.h>
 
+#include "host/applications/Admission.h"
 #include "host/applications/ApplicationRecords.h"
 #include "host/applications/DynamicLinker.h"
 #include "host/text/Unicode.h"
@@ -48,8 +49,8 @@ bool lists(const ApplicationRecord& record, std::wstring_view typedName)
 } // namespace
 
 DemandLoading::DemandLoading(std::filesystem::path plugInsFolder, const ApplicationRecords& records,
-                             DynamicLinker& linker)
-    : mPlugInsFolder(std::move(plugInsFolder)), mRecords(records), mLinker(linker)
+                             DynamicLinker& linker, const Admission& admission)
+    : mPlugInsFolder(std::move(plugInsFolder)), mRecords(records), mLinker(linker), mAdmission(admission)
 {
 }
 
@@ -69,16 +70,38 @@ void DemandLoading::loadAtStart() const
         load(toWide(plugIn.native()));
 }
 
+bool DemandLoading::loadNamesake(std::wstring_view command) const
+{
+    if (command.starts_with(kGlobalNameMark))
+        command.remove_prefix(1);
+    return std::ranges::any_of(plugIns(),
+                               [&](const std::filesystem::path& plugIn)
+                               {
+                                   const std::wstring path = toWide(plugIn.native());
+                                   return equalIgnoringCase(toWide(plugIn.stem().native()), command) &&
+                                          mAdmission.keptOutAtStart(path) &&
+                                          !mLinker.isModuleLoaded(path.c_str()) && load(path);
+                               });
+}
+
 std::vector<std::filesystem::path> DemandLoading::unrecordedPlugIns() const
 {
     std::set<std::filesystem::path> recorded;
     for (const auto& record : mRecords.all())
         recorded.insert(resolved(toUtf8(record.module)));
+    auto result = plugIns();
+    std::erase_if(result, [&](const auto& plugIn) { return recorded.contains(resolved(plugIn)); });
+    return result;
+}
+
+// By name.
+std::vector<std::filesystem::path> DemandLoading::plugIns() const
+{
     std::vector<std::filesystem::path> result;
     std::error_code failed; // without a PlugIns folder there are no plug-ins
     for (std::filesystem::directory_iterator entry(mPlugInsFolder, failed), end; !failed && entry != end;
          entry.increment(failed))
-        if (isApplication(entry->path()) && !recorded.contains(resolved(entry->path())))
+        if (isApplication(entry->path()))
             result.push_back(entry->path());
     std::ranges::sort(result);
     return result;
@@ -92,8 +115,10 @@ bool DemandLoading::isDue(const ApplicationRecord& record, std::wstring_view com
 
 bool DemandLoading::loadForCommand(std::wstring_view name) const
 {
+    const RunningMarker::ReasonScope onCommand(mAdmission.marker(), RunningMarker::Reason::kOnCommand);
     const auto records = mRecords.all();
     return std::ranges::any_of(records, [&](const ApplicationRecord& record)
-                               { return isDue(record, name) && load(record.module); });
+                               { return isDue(record, name) && load(record.module); }) ||
+           loadNamesake(name);
 }
 } // namespace tessel

@@ -10,6 +10,7 @@
 
 namespace tessel
 {
+class Admission;
 class ApplicationRecords;
 class DynamicLinker;
 struct ApplicationRecord;
@@ -18,7 +19,7 @@ class DemandLoading
 {
 public:
     DemandLoading(std::filesystem::path plugInsFolder, const ApplicationRecords& records,
-                  DynamicLinker& linker);
+                  DynamicLinker& linker, const Admission& admission);
 
     // Loads what is due at the start: by the records, in their order, then from the PlugIns folder, by name.
     // What cannot be loaded is explained on the command line, and the start goes on.
@@ -28,10 +29,15 @@ public:
     // and that wants to be loaded for it. A "_" in front means the global name alone. False when nothing was
     // loaded: nobody has such a command, its application is loaded already, or it cannot be loaded, which the
     // command line has then been told.
+    //
+    // What stands in the PlugIns folder, is called like the command and was kept out at the start is loaded
+    // for it as well: the dialog that could mend things must be there, whatever the records say.
     bool loadForCommand(std::wstring_view name) const;
 
 private:
+    std::vector<std::filesystem::path> plugIns() const;
     std::vector<std::filesystem::path> unrecordedPlugIns() const;
+    bool loadNamesake(std::wstring_view command) const;
 
     bool load(const std::wstring& path) const;
     bool isDue(const ApplicationRecord& record, std::wstring_view command) const;
@@ -39,5 +45,6 @@ private:
     std::filesystem::path mPlugInsFolder;
     const ApplicationRecords& mRecords;
     DynamicLinker& mLinker;
+    const Admission& mAdmission;
 };
 } // namespace tessel

@@ -5,6 +5,7 @@
 #include <ranges>
 #include <utility>
 
+#include "host/applications/Admission.h"
 #include "host/applications/ExceptionGuard.h"
 #include "host/applications/ImageCheck.h"
 #include "host/applications/LoadOutcomes.h"
@@ -59,23 +60,6 @@ Result<> checkLoadable(const RegularFile& program)
                          { return program.read(offset, buffer, size); });
 }
 
-// The path may have come to lead to another file since the program was checked, or the system may hold an
-// earlier file of that path.
-Result<std::unique_ptr<Module>> open(const ModuleFile& file, const RegularFile& program, bool resolveNow)
-{
-    auto library = ModuleLibrary::open(file, resolveNow);
-    if (!library)
-        return library.failure();
-    if (!(*library)->isFrom(program))
-        return Failure{(*library)->close()
-                           ? L"its file was replaced while it was being loaded"
-                           : L"the code of another file is in memory in its place, until the session ends"};
-    auto module = std::make_unique<Module>();
-    module->library = *std::move(library);
-    module->entryPoint = module->library->entryPoint();
-    return module;
-}
-
 // The program at a path, or a file that is not open.
 RegularFile programOf(const Result<ModuleFile>& file)
 {
@@ -84,9 +68,9 @@ RegularFile programOf(const Result<ModuleFile>& file)
 } // namespace
 
 DynamicLinker::DynamicLinker(CommandLine& commandLine, CallingApplication& calls, CommandStack& commands,
-                             MessageBox& messageBox, LoadOutcomes& outcomes)
+                             MessageBox& messageBox, LoadOutcomes& outcomes, Admission& admission)
     : mCommandLine(commandLine), mCalls(calls), mCommands(commands), mMessageBox(messageBox),
-      mOutcomes(outcomes)
+      mOutcomes(outcomes), mAdmission(admission)
 {
 }
 
@@ -121,6 +105,16 @@ Result<> DynamicLinker::load(const std::wstring& path, bool resolveNow)
         return Failure{L"the host is ending"};
     if (const Module* known = mModules.withPath(path))
         return answerForKnown(*known);
+    if (auto admitted = mAdmission.check(path); !admitted)
+        return admitted;
+    auto loaded = loadNew(path, resolveNow);
+    if (loaded)
+        mAdmission.noteLoaded(path);
+    return loaded;
+}
+
+Result<> DynamicLinker::loadNew(const std::wstring& path, bool resolveNow)
+{
     const auto file = moduleFileAt(toUtf8(path));
     const RegularFile program = programOf(file);
     const std::wstring realPath = realPathOf(path);
@@ -147,6 +141,26 @@ Result<> DynamicLinker::load(const std::wstring& path, bool resolveNow)
     return start(mModules.add(std::move(module)));
 }
 
+// The path may have come to lead to another file since the program was checked, or the system may hold an
+// earlier file of that path. Constructors may load others; nobody has asked for those by name.
+Result<std::unique_ptr<Module>> DynamicLinker::open(const ModuleFile& file, const RegularFile& program,
+                                                    bool resolveNow) const
+{
+    const RunningMarker::Scope loading(mCalls.marker(), RunningMarker::Deed::kLoading, file.path);
+    const RunningMarker::ReasonScope forIt(mCalls.marker(), RunningMarker::Reason::kForAnother);
+    auto library = ModuleLibrary::open(file, resolveNow);
+    if (!library)
+        return library.failure();
+    if (!(*library)->isFrom(program))
+        return Failure{(*library)->close()
+                           ? L"its file was replaced while it was being loaded"
+                           : L"the code of another file is in memory in its place, until the session ends"};
+    auto module = std::make_unique<Module>();
+    module->library = *std::move(library);
+    module->entryPoint = module->library->entryPoint();
+    return module;
+}
+
 Result<> DynamicLinker::answerForKnown(const Module& module) const
 {
     if (module.inService)
@@ -168,7 +182,10 @@ Result<> DynamicLinker::start(Module& module)
 
 Result<> DynamicLinker::send(Module& module, unsigned message) const
 {
-    const CallingApplication::Scope calling(mCalls, module.path);
+    const CallingApplication::Scope calling(mCalls, module.path,
+                                            message == TSRX_MSG_UNLOAD ? RunningMarker::Deed::kUnloading
+                                                                       : RunningMarker::Deed::kEntryPoint);
+    const RunningMarker::ReasonScope forIt(mCalls.marker(), RunningMarker::Reason::kForAnother);
     int answer = TSRX_RET_OK;
     if (const auto returned = catchAnything([&] { answer = module.entryPoint(message, &module); }); !returned)
         return Failure{L"its entry point threw " + returned.sentence()};
@@ -218,6 +235,7 @@ Result<> DynamicLinker::checkFreeToGo(const Module* module) const
 bool DynamicLinker::takeOut(Module& module)
 {
     mCommands.removeCommandsOf(module.path);
+    const RunningMarker::Scope closing(mCalls.marker(), RunningMarker::Deed::kUnloading, toUtf8(module.path));
     const bool closed = module.library->close();
     mModules.remove(module);
     return closed;

@@ -21,6 +21,7 @@
 
 namespace tessel
 {
+class Admission;
 class CallingApplication;
 class CommandLine;
 class CommandStack;
@@ -38,9 +39,10 @@ public:
     };
 
     // Says on the command line why something failed, tells `calls` whose entry point runs, takes the commands
-    // of what goes out of `commands`, gives the message box its detail, and notes how loading came off.
+    // of what goes out of `commands`, gives the message box its detail, and notes how loading came off. Loads
+    // what `admission` does not refuse.
     DynamicLinker(CommandLine& commandLine, CallingApplication& calls, CommandStack& commands,
-                  MessageBox& messageBox, LoadOutcomes& outcomes);
+                  MessageBox& messageBox, LoadOutcomes& outcomes, Admission& admission);
 
     bool registerApplication(void* application) override;
     bool loadModule(const wchar_t* path, bool sayWhyNot, bool resolveNow) override;
@@ -65,6 +67,9 @@ public:
 private:
     // What these say of a failure is the end of a sentence.
     Result<> load(const std::wstring& path, bool resolveNow);
+    Result<> loadNew(const std::wstring& path, bool resolveNow);
+    Result<std::unique_ptr<Module>> open(const ModuleFile& file, const RegularFile& program,
+                                         bool resolveNow) const;
     Result<> answerForKnown(const Module& module) const;
     Result<> start(Module& module);
     Result<> unload(Module* module);
@@ -81,6 +86,7 @@ private:
     CommandStack& mCommands;
     MessageBox& mMessageBox;
     LoadOutcomes& mOutcomes;
+    Admission& mAdmission;
     LoadedModules mModules;
     // Libraries that threw while they were being mapped. The system keeps them, and would not make their
     // variables at another attempt.

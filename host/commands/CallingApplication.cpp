@@ -5,9 +5,17 @@
 #include <tessel/tsed.h>
 
 #include "host/text/Running.h"
+#include "host/text/Unicode.h"
 
 namespace tessel
 {
+CallingApplication::Scope::Scope(CallingApplication& calls, const std::wstring& path, Deed deed,
+                                 const std::wstring& detail)
+    : mCalls(calls), mMark(calls.mMarker, deed, toUtf8(path), toUtf8(detail))
+{
+    mCalls.mPaths.push_back(path);
+}
+
 const std::wstring& CallingApplication::path() const
 {
     static const std::wstring none;

@@ -65,7 +65,8 @@ Result<> call(const TsEdCommand& command, const CommandStack::Arguments& argumen
             return command.builtIn(arguments);
         if (!arguments.empty())
             return failed(command.localName, L"it takes no arguments.");
-        const CallingApplication::Scope calling(calls, command.owner);
+        const CallingApplication::Scope calling(calls, command.owner, RunningMarker::Deed::kCommand,
+                                                command.localName);
         command.handler();
         return {};
     }

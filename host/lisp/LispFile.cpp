@@ -79,6 +79,14 @@ Result<FoundFile> find(const std::wstring& given)
     return missing(given, first);
 }
 
+// As it stands when the current folder is gone.
+fs::path fullPath(const fs::path& path)
+{
+    std::error_code failed;
+    auto full = fs::absolute(path, failed);
+    return failed ? path : full;
+}
+
 Result<LispFile> decodeSource(const std::wstring& name, std::string_view bytes)
 {
     if (bytes.starts_with(kByteOrderMark))
@@ -126,13 +134,15 @@ Result<LispFile> read(const FoundFile& found)
 }
 } // namespace
 
-Result<LispFile> readLispFile(const std::wstring& path, bool compiledFiles)
+Result<LispFile> readLispFile(const std::wstring& path, bool compiledFiles, const LispFileBegins& begins)
 {
     const auto found = find(path);
     if (!found)
         return found.failure();
     if (!compiledFiles && isCompiled(found->name))
         return refused(found->name, L"this host does not load compiled Lisp.");
+    if (auto begun = begins ? begins(found->name, fullPath(found->path)) : Result<>(); !begun)
+        return begun.failure();
     return read(*found);
 }
 } // namespace tessel

@@ -1,6 +1,8 @@
 // A Lisp file on its way to the interpreter: found, read, checked, decoded.
 #pragma once
 
+#include <filesystem>
+#include <functional>
 #include <string>
 
 #include "host/text/Result.h"
@@ -24,5 +26,8 @@ struct LispFile
 // The path may have separators of either kind, and may lack its extension. Text is taken as UTF-8; what is
 // not is replaced. What Lisp would not survive is refused: text that is nested too deep, compiled Lisp that
 // is not whole. Without `compiledFiles`, so is compiled Lisp altogether.
-Result<LispFile> readLispFile(const std::wstring& path, bool compiledFiles);
+// `begins` is told the full path before the file is opened, and may refuse it.
+using LispFileBegins = std::function<Result<>(const std::wstring& name, const std::filesystem::path& file)>;
+Result<LispFile> readLispFile(const std::wstring& path, bool compiledFiles,
+                              const LispFileBegins& begins = {});
 } // namespace tessel

@@ -4,41 +4,72 @@
 
 #include <tessel/tsdefs.h>
 
+#include "host/applications/Admission.h"
 #include "host/applications/Document.h"
 #include "host/commands/EndRequest.h"
 #include "host/lisp/LispLoads.h"
 #include "host/lisp/LispMachine.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Unicode.h"
 
 namespace tessel
 {
 namespace
 {
+void admitFilesBy(Admission& admission, LispSurroundings& surroundings)
+{
+    surroundings.fileBegins = [&admission](const std::wstring& name,
+                                           const std::filesystem::path& file) -> Result<>
+    {
+        if (const auto admitted = admission.check(toWide(file.native())); !admitted)
+            return Failure{L"Cannot load \"" + name + L"\": " + admitted.sentence() + L"."};
+        admission.marker().begin(RunningMarker::Deed::kLispFile, file.native());
+        return {};
+    };
+    surroundings.filesOpen = [&admission]
+    {
+        return admission.marker().depth();
+    };
+    surroundings.filesEnd = [&admission](std::size_t depth)
+    {
+        admission.marker().endTo(depth);
+    };
+}
+
 LispSurroundings surroundings(const LispInterpreter::Options& options, CommandLine& commandLine,
                               Document& document, LispLoads& loads)
 {
-    return {.removingTsLisp = options.removingTsLisp,
-            .heapBytes = options.heapBytes != 0 ? options.heapBytes : kLispHeapBytes,
-            .write = [&commandLine](std::wstring_view text) { commandLine.print(text); },
-            .column = [&commandLine] { return commandLine.openLine().size(); },
-            .fileLoaded =
-                [&document, &loads](const std::wstring& path)
-            {
-                document.add(path);
-                loads.loaded(path);
-            },
-            .fileAsked =
-                [&loads](const std::wstring& path)
-            {
-                loads.asked(path);
-            }};
+    const auto fileLoaded = [&document, &loads, admission = options.admission](const std::wstring& path)
+    {
+        document.add(path);
+        loads.loaded(path);
+        RunningMarker::AtWork file{};
+        if (admission && admission->marker().innermost(file))
+            admission->noteLoaded(toWide(file.path));
+    };
+    const auto fileAsked = [&loads](const std::wstring& path)
+    {
+        loads.asked(path);
+    };
+    LispSurroundings surroundings = {.removingTsLisp = options.removingTsLisp,
+                                     .heapBytes = options.heapBytes != 0 ? options.heapBytes : kLispHeapBytes,
+                                     .write = [&commandLine](std::wstring_view text)
+                                     { commandLine.print(text); },
+                                     .column = [&commandLine] { return commandLine.openLine().size(); },
+                                     .fileLoaded = fileLoaded,
+                                     .fileAsked = fileAsked};
+    if (options.admission)
+        admitFilesBy(*options.admission, surroundings);
+    return surroundings;
 }
 } // namespace
 
 LispInterpreter::LispInterpreter(std::unique_ptr<LispMachine> machine, std::unique_ptr<LispLoads> loads,
-                                 bool removingTsLisp, CommandLine& commandLine, const EndRequest& endRequest)
-    : mLoads(std::move(loads)), mMachine(std::move(machine)), mRemovingTsLisp(removingTsLisp),
-      mCommandLine(commandLine), mEndRequest(endRequest)
+                                 const Options& options, CommandLine& commandLine,
+                                 const EndRequest& endRequest)
+    : mLoads(std::move(loads)), mMachine(std::move(machine)), mRemovingTsLisp(options.removingTsLisp),
+      mCommandLine(commandLine), mEndRequest(endRequest), mAdmission(options.admission),
+      mMarker(options.admission ? options.admission->marker() : mNoMarker)
 {
 }
 
@@ -50,23 +81,27 @@ Result<std::unique_ptr<LispInterpreter>> LispInterpreter::start(const Options& o
     auto machine = LispMachine::start(surroundings(options, commandLine, document, *loads));
     if (!machine)
         return machine.failure();
-    return std::unique_ptr<LispInterpreter>(new LispInterpreter(
-        *std::move(machine), std::move(loads), options.removingTsLisp, commandLine, endRequest));
+    return std::unique_ptr<LispInterpreter>(
+        new LispInterpreter(*std::move(machine), std::move(loads), options, commandLine, endRequest));
 }
 
 LispInterpreter::~LispInterpreter() = default;
 
 Result<std::wstring> LispInterpreter::evaluate(std::wstring_view expressions)
 {
+    const std::size_t depth = mMarker.depth();
     mLoads->begin();
     auto value = mMachine->evaluate(expressions);
     mLoads->end(value);
+    mMarker.endTo(depth); // Lisp may have been left by a jump
     return value;
 }
 
 void LispInterpreter::queue(std::wstring expression)
 {
-    mQueue.push_back(std::move(expression));
+    if (mAdmission)
+        mAdmission->noteCarrier();
+    mQueue.push_back({std::move(expression), mMarker.reason()});
 }
 
 bool LispInterpreter::runQueue()
@@ -77,9 +112,10 @@ bool LispInterpreter::runQueue()
     bool allRan = true;
     while (!mQueue.empty() && !mEndRequest.isMade())
     {
-        const std::wstring expression = std::move(mQueue.front());
+        const Queued next = std::move(mQueue.front());
         mQueue.pop_front();
-        allRan = mCommandLine.tell(evaluate(expression)) && allRan;
+        const RunningMarker::ReasonScope reason(mMarker, next.reason);
+        allRan = mCommandLine.tell(evaluate(next.expression)) && allRan;
     }
     mRunningQueue = false;
     return allRan;

@@ -7,6 +7,7 @@
 #include <string>
 #include <string_view>
 
+#include "host/platform/RunningMarker.h"
 #include "host/text/Result.h"
 #include "host/text/Running.h"
 
@@ -14,6 +15,7 @@ struct TsResultBuffer;
 
 namespace tessel
 {
+class Admission;
 class CommandLine;
 class Document;
 class EndRequest;
@@ -29,6 +31,7 @@ public:
         bool removingTsLisp = true;       // compiled and packaged Lisp can be loaded
         std::size_t heapBytes = 0;        // memory for Lisp's objects; 0: as much as is usual
         LoadOutcomes* outcomes = nullptr; // where it is noted how loading files came off
+        Admission* admission = nullptr;   // of files, if it is to be asked; it marks them, too
     };
 
     // Starts Lisp, on the thread on which everything but `interrupt` is to be called. A later interpreter in
@@ -74,14 +77,23 @@ public:
 
 private:
     LispInterpreter(std::unique_ptr<LispMachine> machine, std::unique_ptr<LispLoads> loads,
-                    bool removingTsLisp, CommandLine& commandLine, const EndRequest& endRequest);
+                    const Options& options, CommandLine& commandLine, const EndRequest& endRequest);
+
+    struct Queued
+    {
+        std::wstring expression;
+        RunningMarker::Reason reason; // for what it loads
+    };
 
     std::unique_ptr<LispLoads> mLoads;
     std::unique_ptr<LispMachine> mMachine;
     bool mRemovingTsLisp;
     CommandLine& mCommandLine;
     const EndRequest& mEndRequest;
-    std::deque<std::wstring> mQueue;
+    Admission* mAdmission;
+    RunningMarker mNoMarker;
+    RunningMarker& mMarker;
+    std::deque<Queued> mQueue;
     bool mRunningQueue = false;
     Published<LispInterpreter> mPublished{*this};
 };

@@ -7,6 +7,7 @@
 #pragma once
 
 #include <cstddef>
+#include <filesystem>
 #include <functional>
 #include <memory>
 #include <string>
@@ -29,6 +30,13 @@ struct LispSurroundings
     std::function<std::size_t()> column;                      // characters on the line that is not ended yet
     std::function<void(const std::wstring& path)> fileLoaded; // without an error; the path as it was given
     std::function<void(const std::wstring& path)> fileAsked = {}; // before it is looked for; the same path
+
+    // About files within files, of which the innermost runs. `fileBegins` may refuse the one with that full
+    // path before it is opened; the sentence calls it by its name. `filesOpen` answers how many have begun,
+    // and `filesEnd` ends all above that number.
+    std::function<Result<>(const std::wstring& name, const std::filesystem::path& file)> fileBegins = {};
+    std::function<std::size_t()> filesOpen = {};
+    std::function<void(std::size_t)> filesEnd = {};
 };
 
 class LispMachine

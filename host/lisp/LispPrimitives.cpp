@@ -129,7 +129,8 @@ cl_object readFile(cl_object path)
             const auto* surroundings = connection().surroundings;
             if (surroundings && surroundings->fileAsked)
                 surroundings->fileAsked(fromLisp(path));
-            connection().file = readLispFile(fromLisp(path), surroundings && surroundings->removingTsLisp);
+            connection().file = readLispFile(fromLisp(path), surroundings && surroundings->removingTsLisp,
+                                             surroundings ? surroundings->fileBegins : LispFileBegins());
         });
     const Result<LispFile>& file = connection().file;
     cl_object text = toLisp(file ? file->text : file.sentence());
@@ -137,6 +138,30 @@ cl_object readFile(cl_object path)
     cl_object kind = kindOf(file);
     callHost([] { connection().file = LispFile(); });
     return answer(cl_list(3, kind, name, text));
+}
+
+cl_object filesOpen()
+{
+    std::size_t count = 0;
+    callHost(
+        [&count]
+        {
+            const auto* surroundings = connection().surroundings;
+            count = surroundings && surroundings->filesOpen ? surroundings->filesOpen() : 0;
+        });
+    return answer(ecl_make_fixnum(static_cast<cl_fixnum>(count)));
+}
+
+cl_object endFiles(cl_object count)
+{
+    callHost(
+        [=]
+        {
+            const auto* surroundings = connection().surroundings;
+            if (surroundings && surroundings->filesEnd)
+                surroundings->filesEnd(static_cast<std::size_t>(ecl_fixnum(count)));
+        });
+    return answer(ECL_NIL);
 }
 
 cl_object recordLoaded(cl_object path)
@@ -186,6 +211,8 @@ void defineLispPrimitives()
     define("%FLUSH", flush);
     define("%COLUMN", column);
     define("%READ-FILE", readFile);
+    define("%FILES-OPEN", filesOpen);
+    define("%END-FILES", endFiles);
     define("%RECORD-LOADED", recordLoaded);
     define("%RESTORE-STACK-LIMITS", restoreStackLimits);
     define("%INTERRUPT-WANTED", interruptWanted);

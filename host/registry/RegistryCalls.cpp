@@ -5,6 +5,7 @@
 #include <cstring>
 #include <cwchar>
 
+#include "host/platform/RunningMarker.h"
 #include "host/registry/Registry.h"
 #include "host/text/CommandLine.h"
 #include "host/text/Running.h"
@@ -140,6 +141,8 @@ LONG tsudRegSetString(HKEY key, const wchar_t* name, const wchar_t* data)
 
 void tsrxBeforeWaiting(bool actionIsOver)
 {
+    if (auto* marker = tessel::running<tessel::RunningMarker>())
+        marker->noteWaiting();
     Registry* registry = tessel::running<Registry>();
     if (!registry)
         return;

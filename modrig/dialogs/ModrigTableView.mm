@@ -14,6 +14,7 @@
 #include "modrig/dialogs/platform/Desktop.h"
 #include "modrig/dialogs/platform/Platform.h"
 #include "modrig/loader/FailedLoads.h"
+#include "modrig/loader/KeptOut.h"
 #include "modrig/types/ApplicationTypes.h"
 
 using ModrigUtils::TableAction;
@@ -134,6 +135,29 @@ NSString* ModrigUtils::HelpKey()
     [self selectRowIndexes:ModrigUtils::SetFromIndexes(rows) byExtendingSelection:NO];
 }
 
+// One that is kept out makes the menu offer to let all of them in.
+- (TableAction)keepingOutOf:(NSIndexSet*)rows
+{
+    if (!ModrigUtils::HostKeepsApplicationsOut())
+        return TableAction::kNone;
+    for (NSUInteger row = [rows firstIndex]; row != NSNotFound; row = [rows indexGreaterThanIndex:row])
+        if (!ModrigUtils::WhyKeptOut([[self fileInRow:static_cast<NSInteger>(row)] path]).IsEmpty())
+            return TableAction::kLetIn;
+    return TableAction::kKeepOut;
+}
+
+- (void)keep:(NSIndexSet*)rows out:(BOOL)out
+{
+    for (NSUInteger row = [rows firstIndex]; row != NSNotFound; row = [rows indexGreaterThanIndex:row])
+    {
+        const CStdStr path = [[self fileInRow:static_cast<NSInteger>(row)] path];
+        if (out)
+            ModrigUtils::KeepOut(path);
+        else if (!ModrigUtils::WhyKeptOut(path).IsEmpty())
+            ModrigUtils::LetIn(path);
+    }
+}
+
 - (void)perform:(TableAction)action on:(NSIndexSet*)rows
 {
     if (!ModrigUtils::IsPossible(action, [self stateWith:rows]))
@@ -144,6 +168,9 @@ NSString* ModrigUtils::HelpKey()
         return [self selectEveryRow];
     case TableAction::kCopyPath:
         return [self copyPathsOf:rows];
+    case TableAction::kKeepOut:
+    case TableAction::kLetIn:
+        return [self keep:rows out:action == TableAction::kKeepOut];
     case TableAction::kShowInFolder:
         return ModrigPlatform::ShowInFolder(
             [[self fileInRow:static_cast<NSInteger>([rows firstIndex])] filePathName]);
@@ -268,7 +295,9 @@ NSString* ModrigUtils::HelpKey()
     const NSPoint place = [self convertPoint:[event locationInWindow] fromView:nil];
     NSIndexSet* rows = [self rowsPointedAt:[self rowAtPoint:place]];
     NSMenu* menu = [[[NSMenu alloc] initWithTitle:@""] autorelease];
-    for (const TableAction action : ModrigUtils::MenuOf([(id)[self delegate] kindOfTable:self]))
+    const auto actions =
+        ModrigUtils::MenuOf([(id)[self delegate] kindOfTable:self], [self keepingOutOf:rows]);
+    for (const TableAction action : actions)
         [menu addItem:[self menuItemFor:action rows:rows]];
     return menu;
 }
@@ -320,6 +349,9 @@ NSString* ModrigUtils::HelpKey()
     if (!file)
         return nil;
     NSString* path = ModrigUtils::StringFromPath(ModrigUtils::ShownText([file path]));
+    const CStdStr whyKeptOut = ModrigUtils::WhyKeptOut([file path]);
+    if (!whyKeptOut.IsEmpty())
+        return [NSString stringWithFormat:@"%@\n%@", path, ModrigUtils::StringFromPath(whyKeptOut)];
     const char* reason = ModrigUtils::ReasonKey([self stateOfFile:file]);
     if (!reason)
         return path;

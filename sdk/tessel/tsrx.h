@@ -35,6 +35,7 @@ TESSEL_API TsRxSysRegistry* tsrxSysRegistry();
 // Names of the services in the system registry.
 inline constexpr const wchar_t* TSRX_DYNAMIC_LINKER = L"DynamicLinker";
 inline constexpr const wchar_t* TSED_REGISTERED_COMMANDS = L"TESSEL_REGISTERED_COMMANDS";
+inline constexpr const wchar_t* TSRX_KEPT_OUT = L"KeptOutApplications";
 
 // What an application exports: `extern "C" TESSEL_EXPORT int tsrxEntryPoint(unsigned message, void*
 // application)`. `application` is the host's handle of the application, valid until the application is

@@ -14,6 +14,7 @@
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
 #include "modrig/messages/MessageIds.h"
+#include "tests/support/recording/RecordingKeptOut.h"
 
 using testing::ElementsAre;
 using testing::IsEmpty;
@@ -327,6 +328,26 @@ TEST_F(TableKeys, OfTheMouseOpenAMenuWithWhatTheButtonsDo)
     EXPECT_THAT(Texts(gStartupList), ElementsAre(file("b.lsp")));
     choose(menuOn(historyTable(), 1), @"Remove");
     EXPECT_THAT(rowsOf(historyList()), ElementsAre(file("a.lsp")));
+}
+
+TEST_F(TableKeys, OfTheMouseKeepApplicationsOutAndLetThemIn)
+{
+    RecordingKeptOut service;
+    host().services.set(TSRX_KEPT_OUT, &service);
+    openHistory({"a.lsp", "b.lsp"});
+    select(historyTable(), {0, 1});
+    NSMenu* menu = menuOn(historyTable(), 1);
+    EXPECT_THAT(titlesIn(menu), ElementsAre(L"Load", L"Add to Startup Suite", L"Remove", L"-",
+                                            L"Keep Out at Starts", L"-", L"Copy Path", L"Show in Folder"));
+    choose(menu, @"Keep Out at Starts");
+    EXPECT_THAT(service.keptOut, ElementsAre(file("a.lsp"), file("b.lsp")));
+    EXPECT_EQ(file("a.lsp") + L"\nThis application is kept out.", wide([(id)historyTable() tipForRow:0]));
+    service.reasons.erase(file("a.lsp"));
+    EXPECT_EQ(file("a.lsp"), wide([(id)historyTable() tipForRow:0]));
+    choose(menuOn(historyTable(), 1), @"Let In at Starts");
+    EXPECT_THAT(service.letInAgain, ElementsAre(file("b.lsp")));
+    EXPECT_THAT(rowsOf(historyList()), ElementsAre(file("a.lsp"), file("b.lsp")));
+    host().services.miss(TSRX_KEPT_OUT);
 }
 
 TEST_F(TableKeys, OfTheMouseKeepSeveralSelectedRowsForTheMenu)

@@ -29,6 +29,16 @@ std::string fixtureModule(const std::string& name)
     return std::string(FIXTURE_MODULES) + "/" + name;
 }
 
+std::string deadly(const HostSession& session, const std::string& way)
+{
+    const auto path = session.folder() / (way + ".zmb");
+    std::filesystem::copy_file(fixtureModule("Deadly.zmb"), path);
+    const auto good = session.folder() / "Good.zmb";
+    if (!std::filesystem::exists(good))
+        std::filesystem::copy_file(fixtureModule("Good.zmb"), good);
+    return path;
+}
+
 std::string lispFixture(const std::string& name)
 {
     return std::string(LISP_FIXTURES) + "/" + name;
@@ -68,6 +78,14 @@ void storeSuite(const HostSession& session, const Paths& paths)
     std::vector<std::string> arguments = byArguments(commands);
     arguments.emplace_back("--safe");
     const HostResult result = session.start(arguments);
+    ASSERT_EQ(result.exitStatus, 0) << result.output;
+}
+
+void putOffModrig(const HostSession& session)
+{
+    const std::string set = std::string("REGISTRY SET ") + kRecordKey;
+    const auto result = session.start(
+        {"--safe", "-c", set + " Module " + inQuotes(modrigBundle()), "-c", set + " LoadReasons 4"});
     ASSERT_EQ(result.exitStatus, 0) << result.output;
 }
 

@@ -22,6 +22,8 @@ inline constexpr char kPrimes[] = "Primes: type PRIMES to see them on a spiral.\
 
 std::string sample(const std::string& name);
 std::string fixtureModule(const std::string& name);
+// An application in the session's folder that ends the host in that way (see fixtures/modules/Deadly.cpp).
+std::string deadly(const HostSession& session, const std::string& way);
 std::string lispFixture(const std::string& name);
 std::string modrigBundle();
 
@@ -32,6 +34,9 @@ std::string inQuotes(const std::string& text);
 std::string setInSuite(const std::string& name, const std::string& data);
 // Stores the Startup Suite, in a session that loads nothing.
 void storeSuite(const HostSession& session, const Paths& paths);
+// Makes the host leave Modrig alone until somebody asks for it. Otherwise nothing can be done before it is
+// loaded.
+void putOffModrig(const HostSession& session);
 // The arguments that run the commands one after the other.
 std::vector<std::string> byArguments(const std::vector<std::string>& commands);
 

@@ -39,14 +39,15 @@ TEST(FirstStart, KnowsTheCommandWhichSaysThatThereIsNoDisplay)
                                                    "Tessel cannot open a window: there is no display.\n"));
 }
 
-TEST(FirstStart, KnowsNoModrigInSafeMode)
+TEST(FirstStart, LoadsModrigInSafeModeWhenItIsAskedFor)
 {
     HostSession session;
     session.alwaysWith({"--safe"});
-    const auto result = session.run({"MODRIG", "APPS"});
-    EXPECT_EQ(result.exitStatus, 1);
-    EXPECT_EQ(result.output,
-              kBanner + std::string("Command: MODRIG\n"
-                                    "Unknown command \"MODRIG\". Type HELP for the list of commands.\n"
-                                    "Command: APPS\nNo application is loaded.\n"));
+    const auto result = session.run({"APPS", "MODRIG", "APPS"});
+    EXPECT_EQ(result.exitStatus, 0);
+    EXPECT_EQ(result.output, kBanner +
+                                 std::string("Command: APPS\nNo application is loaded.\nCommand: MODRIG\n"
+                                             "Tessel cannot open a window: there is no display.\n"
+                                             "Command: APPS\n") +
+                                 listed(modrigBundle()));
 }

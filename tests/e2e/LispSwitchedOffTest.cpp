@@ -12,9 +12,8 @@ std::string loadedWithLispEnabled(const HostSession& session, const std::string&
 {
     const std::vector<std::string> commands = {"SETVAR LISPENABLED " + value, "LOAD " + modrigBundle(),
                                                "APPS"};
-    std::vector<std::string> arguments = byArguments(commands);
-    arguments.emplace_back("--safe");
-    const auto result = session.start(arguments);
+    putOffModrig(session);
+    const auto result = session.run(commands);
     EXPECT_EQ(result.exitStatus, 0) << result.output;
     const std::string start =
         std::string(kBanner) + "Command: " + commands[0] + "\nCommand: " + commands[1] + "\n";
@@ -98,9 +97,8 @@ TEST(RemovingTsLisp, CountsFromTheNextStartOn)
 {
     const HostSession session;
     storeSuite(session, {sample("calendar.qbc")});
-    std::vector<std::string> arguments = byArguments({"SETVAR REMOVINGTSLISP 0", "LOAD " + modrigBundle()});
-    arguments.emplace_back("--safe");
-    EXPECT_EQ(session.start(arguments).output,
+    putOffModrig(session);
+    EXPECT_EQ(session.run({"SETVAR REMOVINGTSLISP 0", "LOAD " + modrigBundle()}).output,
               kBanner + ("Command: SETVAR REMOVINGTSLISP 0\nCommand: LOAD " + modrigBundle() + "\n") +
                   isLoaded(modrigBundle()) +
                   "Calendar: type (calendar) for this month, (calendar 2027 2) for another.\n" + kLispReady);

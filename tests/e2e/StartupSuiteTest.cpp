@@ -157,8 +157,8 @@ TEST_F(StartupSuite, DoesNotLoadAModuleAgainButALispFile)
     const std::string module = fixtureModule("Good.zmb");
     const std::string lisp = lispFixture("good.lsp");
     storeSuite(session, {module, lisp});
-    const auto result = session.start({"--safe", "-c", "LOAD " + module, "-c", "LOAD " + lisp, "-c",
-                                       "LOAD " + modrigBundle(), "-c", "APPS"});
+    putOffModrig(session);
+    const auto result = session.run({"LOAD " + module, "LOAD " + lisp, "LOAD " + modrigBundle(), "APPS"});
     EXPECT_EQ(result.exitStatus, 0);
     EXPECT_EQ(result.output,
               kBanner + ("Command: LOAD " + module + "\nGood.zmb: message 1\n" + module + " is loaded.\n") +

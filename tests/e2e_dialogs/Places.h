@@ -34,6 +34,7 @@ inline constexpr Place kRemove{67, 330};
 inline constexpr Place kSuiteHelp{386, 330};
 inline constexpr Place kCloseSuite{496, 330};
 inline constexpr Place kFirstSuiteRow{80, 89};
+inline constexpr Place kKeepOutInSuiteMenu{40, 130}; // from where the menu was opened
 
 // A row of the table that shows, and of the list of files; that of the Add panel stands in the same place.
 constexpr Place tableRow(int row)

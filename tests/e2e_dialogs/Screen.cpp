@@ -118,6 +118,12 @@ void Screen::click(const std::string& window, Place place) const
     run("xdotool" + moveTo(window, place) + kPress);
 }
 
+void Screen::chooseFromMenuAt(const std::string& window, Place place, Place item) const
+{
+    run("xdotool" + moveTo(window, place) + "mousedown 3 sleep 0.4");
+    run("xdotool" + moveTo(window, {place.x + item.x, place.y + item.y}) + "sleep 0.4 mouseup 3");
+}
+
 void Screen::press(const std::string& window, Place place) const
 {
     run("xdotool" + moveTo(window, place) + "mousedown 1 sleep 0.4");

@@ -46,6 +46,9 @@ public:
     void moveOn(const std::string& window, Place to) const;
     void letGo() const;
 
+    // Opens the menu of a place, by the other button, and lets go over one of its items: so far to the right
+    // and below.
+    void chooseFromMenuAt(const std::string& window, Place place, Place item) const;
     // Opens a menu and lets go over one of its items.
     void choose(const std::string& window, Place menu, Place item) const;
 

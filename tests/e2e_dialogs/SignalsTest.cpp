@@ -38,6 +38,29 @@ TEST_F(DialogSignals, EndAHostWithItsDialogOpen)
         expectGoodEnd(signal, loadOne());
 }
 
+// The dialog is a command of Modrig's; while it waits for a person, nothing of Modrig's is to blame.
+TEST_F(DialogSignals, BlameNobodyWhenTheDialogWaited)
+{
+    for (const int signal : {SIGKILL, SIGTERM, SIGHUP})
+    {
+        open();
+        mHost->signal(signal);
+        ASSERT_TRUE(mHost->waitForEnd()) << signal;
+        const std::string next = mSession.run({"APPS"}).output;
+        EXPECT_THAT(next, testing::HasSubstr("Modrig.bundle")) << signal;
+        EXPECT_THAT(next, testing::Not(testing::HasSubstr("ended Tessel"))) << signal;
+    }
+}
+
+TEST_F(DialogSignals, BlameModrigWhenItsDialogFaults)
+{
+    open();
+    mHost->signal(SIGSEGV);
+    EXPECT_EQ(mHost->waitForEnd(), -SIGSEGV);
+    EXPECT_THAT(mHost->output(), testing::HasSubstr("has ended Tessel while its command \"MODRIG\" ran: "));
+    EXPECT_THAT(mSession.run({"APPS"}).output, testing::HasSubstr("Modrig.bundle\" ended Tessel "));
+}
+
 TEST_F(DialogSignals, EndAHostWithWindowsOverItsDialog)
 {
     const std::string path = loadOne();

@@ -76,6 +76,23 @@ TEST_F(DialogStartupSuite, LosesAFileThatTheNextStartDoesNotLoad)
     EXPECT_THAT(output, Not(HasSubstr("first.lsp")));
 }
 
+TEST_F(DialogStartupSuite, KeepsAFileOutAtStartsByTheMenuOfItsRow)
+{
+    const std::string first = writeLisp("first.lsp");
+    const std::string second = writeLisp("second.lsp");
+    storeSuite({first, second});
+    openSuite();
+    mScreen.chooseFromMenuAt(mSuite, places::kFirstSuiteRow, places::kKeepOutInSuiteMenu);
+    shoot("chosen");
+    closeSuite();
+    closeAndEnd();
+    EXPECT_EQ(stored("Startup"), "NumStartup = 2\n1Startup = " + first + "\n2Startup = " + second + "\n");
+    const std::string output = mSession.run({"APPS"}).output;
+    EXPECT_THAT(output, HasSubstr("second.lsp runs"));
+    EXPECT_THAT(output, Not(HasSubstr("first.lsp runs")));
+    EXPECT_THAT(output, HasSubstr("kept out at starts by DISABLE since "));
+}
+
 TEST_F(DialogStartupSuite, IsClosedByEscapeWithTheMainDialogLeftOpen)
 {
     openSuite();

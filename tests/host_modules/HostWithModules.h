@@ -6,7 +6,10 @@
 
 #include <gtest/gtest.h>
 
+#include "host/applications/Admission.h"
+#include "host/applications/Bisecting.h"
 #include "host/applications/DynamicLinker.h"
+#include "host/applications/KeptOut.h"
 #include "host/applications/LoadOutcomes.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
@@ -52,11 +55,15 @@ protected:
                                      {
                                          mOutput += piece;
                                      }};
-    tessel::CallingApplication mCalls;
+    tessel::RunningMarker mMarker;
+    tessel::KeptOut mKeptOut;
+    tessel::Bisecting mBisecting;
+    tessel::Admission mAdmission{mMarker, mKeptOut, mBisecting, false};
+    tessel::CallingApplication mCalls{mMarker};
     tessel::CommandStack mCommands{mCommandLine, mCalls};
     tessel::MessageBox mMessageBox{mCommandLine};
     tessel::LoadOutcomes mOutcomes;
-    tessel::DynamicLinker mLinker{mCommandLine, mCalls, mCommands, mMessageBox, mOutcomes};
+    tessel::DynamicLinker mLinker{mCommandLine, mCalls, mCommands, mMessageBox, mOutcomes, mAdmission};
     tessel::ResourceModules mResources{tessel::toWide((mFolder / "HostResources").native()), mCalls};
 
 private:

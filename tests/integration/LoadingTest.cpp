@@ -157,6 +157,7 @@ TEST_F(Loading, AddsNothingToTheListsFromTheStartupSuite)
             ModrigUnderTest::replaceStartup({wide(good)});
             ModrigUnderTest::close();
         });
+    options.safe = false; // nothing of a suite is loaded otherwise
     restart();
     loadModrig();
     EXPECT_EQ(said(), "Good.zmb: message 1\n");

@@ -36,6 +36,8 @@ const std::map<std::string, std::vector<std::string>> kTexts = {
     {"IDS_MODRIG_MENU_REMOVE", {}},
     {"IDS_MODRIG_MENU_MOVE_UP", {}},
     {"IDS_MODRIG_MENU_MOVE_DOWN", {}},
+    {"IDS_MODRIG_MENU_KEEP_OUT", {}},
+    {"IDS_MODRIG_MENU_LET_IN", {}},
     {"IDS_MODRIG_MENU_COPY_PATH", {}},
     {"IDS_MODRIG_MENU_SHOW_IN_FOLDER", {}},
     {"IDS_MODRIG_ROW_MISSING", {}},

@@ -72,10 +72,13 @@
 
 (defun load-file (path if-does-not-exist)
   ;; TEXT is a sentence when there is nothing to load.
-  (destructuring-bind (kind name text) (%read-file path)
-    (cond ((member kind '(:source :compiled)) (run-file path kind name text))
-          ((and (eq kind :missing) (null if-does-not-exist)) nil)
-          (t (error "~A" text)))))
+  (let ((open (%files-open)))
+    (unwind-protect
+         (destructuring-bind (kind name text) (%read-file path)
+           (cond ((member kind '(:source :compiled)) (run-file path kind name text))
+                 ((and (eq kind :missing) (null if-does-not-exist)) nil)
+                 (t (error "~A" text))))
+      (%end-files open))))
 
 (defun compile-text (name text)
   (call-guarded

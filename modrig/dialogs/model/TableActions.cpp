@@ -56,6 +56,10 @@ const char* TitleKey(TableAction action)
         return "IDS_MODRIG_MENU_MOVE_UP";
     case TableAction::kMoveDown:
         return "IDS_MODRIG_MENU_MOVE_DOWN";
+    case TableAction::kKeepOut:
+        return "IDS_MODRIG_MENU_KEEP_OUT";
+    case TableAction::kLetIn:
+        return "IDS_MODRIG_MENU_LET_IN";
     case TableAction::kShowInFolder:
         return "IDS_MODRIG_MENU_SHOW_IN_FOLDER";
     default:
@@ -63,7 +67,7 @@ const char* TitleKey(TableAction action)
     }
 }
 
-std::vector<TableAction> MenuOf(TableKind kind)
+std::vector<TableAction> MenuOf(TableKind kind, TableAction keepingOut)
 {
     std::vector<TableAction> menu;
     switch (kind)
@@ -79,6 +83,8 @@ std::vector<TableAction> MenuOf(TableKind kind)
                 TableAction::kRemove};
         break;
     }
+    if (keepingOut != TableAction::kNone)
+        menu.insert(menu.end(), {TableAction::kNone, keepingOut});
     menu.insert(menu.end(), {TableAction::kNone, TableAction::kCopyPath, TableAction::kShowInFolder});
     return menu;
 }
@@ -105,6 +111,8 @@ bool IsPossible(TableAction action, const TableState& state)
         return true;
     case TableAction::kSelectAll:
         return state.rows > 0;
+    case TableAction::kKeepOut:
+    case TableAction::kLetIn:
     case TableAction::kCopyPath:
     case TableAction::kShowInFolder:
         return state.pointedAt > 0;

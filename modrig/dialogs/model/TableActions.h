@@ -16,6 +16,8 @@ enum class TableAction
     kRemove,
     kMoveUp,
     kMoveDown,
+    kKeepOut, // at starts
+    kLetIn,
     kCopyPath,
     kShowInFolder,
     kSelectAll
@@ -54,8 +56,9 @@ inline constexpr wchar_t kPageDownKey = 0xF72D;
 // The key of the text of its menu item.
 const char* TitleKey(TableAction action);
 
-// The menu of the table's rows, from top to bottom.
-std::vector<TableAction> MenuOf(TableKind kind);
+// The menu of the table's rows, from top to bottom. `keepingOut`: the one of the two actions about that which
+// the rows want, or `kNone` in a host that knows neither.
+std::vector<TableAction> MenuOf(TableKind kind, TableAction keepingOut = TableAction::kNone);
 
 // What the key does in the table; `kNone` for one that the table has no action for.
 TableAction ActionForKey(TableKind kind, TableKey key);

@@ -69,6 +69,18 @@ TEST(TableMenu, HasWhatTheButtonsDoAndThePathOfTheRow)
                                             TableAction::kCopyPath, TableAction::kShowInFolder));
 }
 
+TEST(TableMenu, KeepsOutOrLetsInWhereTheHostDoes)
+{
+    for (const TableAction action : {TableAction::kKeepOut, TableAction::kLetIn})
+    {
+        EXPECT_THAT(MenuOf(kLoaded, action),
+                    ElementsAre(TableAction::kUnload, TableAction::kNone, action, TableAction::kNone,
+                                TableAction::kCopyPath, TableAction::kShowInFolder));
+        EXPECT_TRUE(IsPossible(action, {.rows = 3, .pointedAt = 1}));
+        EXPECT_FALSE(IsPossible(action, {.rows = 3, .selected = 1}));
+    }
+}
+
 TEST(TableActions, NeedASelectionUnlessTheyMakeOne)
 {
     const TableState empty;
@@ -138,6 +150,8 @@ TEST(TableMenus, NameEachActionByATextOfItsOwn)
     EXPECT_STREQ("IDS_MODRIG_MENU_REMOVE", TitleKey(TableAction::kRemove));
     EXPECT_STREQ("IDS_MODRIG_MENU_MOVE_UP", TitleKey(TableAction::kMoveUp));
     EXPECT_STREQ("IDS_MODRIG_MENU_MOVE_DOWN", TitleKey(TableAction::kMoveDown));
+    EXPECT_STREQ("IDS_MODRIG_MENU_KEEP_OUT", TitleKey(TableAction::kKeepOut));
+    EXPECT_STREQ("IDS_MODRIG_MENU_LET_IN", TitleKey(TableAction::kLetIn));
     EXPECT_STREQ("IDS_MODRIG_MENU_COPY_PATH", TitleKey(TableAction::kCopyPath));
     EXPECT_STREQ("IDS_MODRIG_MENU_SHOW_IN_FOLDER", TitleKey(TableAction::kShowInFolder));
 }

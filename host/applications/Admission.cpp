@@ -1,0 +1,76 @@
+#include "host/applications/Admission.h"
+
+#include <algorithm>
+
+#include "host/applications/Bisecting.h"
+#include "host/applications/KeptOut.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+using Reason = RunningMarker::Reason;
+using Stage = KeptOutApplication::Stage;
+
+bool isOfStart(Reason reason)
+{
+    return reason == Reason::kAtStart || reason == Reason::kForAnother;
+}
+
+// A person keeps it out at starts; a command that is typed is a wish of the same person's.
+bool keepsOut(const KeptOutApplication& application, Reason reason)
+{
+    return application.isOut() && (isOfStart(reason) || application.stage != Stage::kByPerson);
+}
+} // namespace
+
+Result<> Admission::check(const std::wstring& path)
+{
+    const Reason reason = mMarker.reason();
+    if (reason == Reason::kForAnother)
+        noteCarrier();
+    if (reason == Reason::kByHand || (mSafe && !isOfStart(reason)))
+        return {};
+    if (mSafe)
+        return Failure{L"Tessel was started with --safe and loads nothing by itself"};
+    const KeptOutApplication* known = mKeptOut.find(toUtf8(path));
+    if (known && keepsOut(*known, reason))
+        return Failure{L"it is " + reasonOf(*known)};
+    if (!isOfStart(reason))
+        return {};
+    mAskedFor.push_back(toUtf8(path));
+    if (mBisecting.keepsOut(mAskedFor.back()))
+        return Failure{L"it is kept out at this start by BISECT"};
+    return {};
+}
+
+void Admission::noteCarrier()
+{
+    RunningMarker::AtWork work{};
+    if (isOfStart(mMarker.reason()) && mMarker.innermost(work) && !mCarriers.contains(work.path))
+        mCarriers.emplace(work.path);
+}
+
+std::vector<std::string> Admission::suspects() const
+{
+    std::vector<std::string> result;
+    for (const std::string& path : mAskedFor)
+        if (!mCarriers.contains(path) && std::ranges::find(result, path) == result.end())
+            result.push_back(path);
+    return result;
+}
+
+std::wstring Admission::whyKeptOut(const std::wstring& path) const
+{
+    const KeptOutApplication* known = mKeptOut.find(toUtf8(path));
+    if (known && known->isOut())
+        return reasonOf(*known);
+    return mBisecting.keepsOut(toUtf8(path)) ? L"kept out at this start by BISECT" : L"";
+}
+
+void Admission::noteLoaded(const std::wstring& path) const
+{
+    mKeptOut.noteLoaded(toUtf8(path), mMarker.reason() == Reason::kByHand);
+}
+} // namespace tessel

@@ -1,0 +1,53 @@
+// Who may be loaded. What a person asks for always may; what is loaded without being asked for (at the start,
+// for another application that is being loaded, for a command) only if nothing speaks against it.
+#pragma once
+
+#include <functional>
+#include <set>
+#include <string>
+#include <vector>
+
+#include "host/platform/RunningMarker.h"
+#include "host/text/Result.h"
+
+namespace tessel
+{
+class Bisecting;
+class KeptOut;
+
+class Admission
+{
+public:
+    // `safe`: nothing is loaded by itself in this session but what a person needs for a command.
+    Admission(RunningMarker& marker, KeptOut& keptOut, const Bisecting& bisecting, bool safe)
+        : mMarker(marker), mKeptOut(keptOut), mBisecting(bisecting), mSafe(safe)
+    {
+    }
+
+    RunningMarker& marker() const { return mMarker; }
+    bool isSafe() const { return mSafe; }
+
+    // Asked with a full path before its file is opened. Why not is the end of a sentence, without its stop.
+    Result<> check(const std::wstring& path);
+    // Why the application is kept out at starts, as a part of a sentence; empty for one that is not.
+    std::wstring whyKeptOut(const std::wstring& path) const;
+    // Whether this session has not loaded it by itself, or would not have.
+    bool keptOutAtStart(const std::wstring& path) const { return mSafe || !whyKeptOut(path).empty(); }
+    // What was let in is loaded.
+    void noteLoaded(const std::wstring& path) const;
+    // The application at work has others loaded with it, now or later.
+    void noteCarrier();
+
+    // What was let in at the start without being asked for by name, but for those that others came with: in
+    // the order in which it was asked for.
+    std::vector<std::string> suspects() const;
+
+private:
+    RunningMarker& mMarker;
+    KeptOut& mKeptOut;
+    const Bisecting& mBisecting;
+    bool mSafe;
+    std::vector<std::string> mAskedFor;
+    std::set<std::string, std::less<>> mCarriers;
+};
+} // namespace tessel

@@ -1,0 +1,54 @@
+// A search for the application that makes trouble, from one start to the next: its suspects and the answers
+// so far stand in a file of the profile. See Bisection.
+#pragma once
+
+#include <filesystem>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "host/applications/Bisection.h"
+#include "host/text/Result.h"
+
+namespace tessel
+{
+class Bisecting
+{
+public:
+    // Never searches.
+    Bisecting() = default;
+    // Goes on with what stands in the folder, which is there. `applies`: this session keeps suspects out, and
+    // so can be judged.
+    Bisecting(std::filesystem::path folder, bool applies);
+
+    // Whether this session keeps the application at that full path out.
+    bool keepsOut(const std::string& path) const;
+    // What a person is to be told at the start, line by line.
+    std::vector<std::wstring> sentencesAtStart() const;
+
+    // Each answers what a person is to be told.
+    Result<std::wstring> begin(const std::vector<std::string>& suspects);
+    Result<std::wstring> answer(bool wasGood);
+    Result<std::wstring> stop();
+    Result<std::wstring> tell() const;
+
+private:
+    struct Search
+    {
+        std::vector<std::string> suspects; // full paths, links followed
+        std::vector<bool> answers;
+
+        Bisection bisection() const { return Bisection(suspects.size(), answers); }
+        bool operator==(const Search&) const = default;
+    };
+
+    Result<std::optional<Search>> read() const;
+    Result<> store(const Search& search) const;
+    Result<> forget() const;
+    Result<Search> current() const;
+
+    std::filesystem::path mFile;
+    std::optional<Search> mApplied; // what this session was started with
+    Result<> mReadAtStart;
+};
+} // namespace tessel

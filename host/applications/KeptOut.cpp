@@ -1,0 +1,358 @@
+#include "host/applications/KeptOut.h"
+
+#include <algorithm>
+#include <array>
+#include <charconv>
+#include <ctime>
+#include <string_view>
+
+#include "host/platform/SmallFile.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+using Stage = KeptOutApplication::Stage;
+
+constexpr char kFileName[] = "kept-out";
+constexpr char kLockName[] = "kept-out.lock";
+constexpr std::string_view kHeader = "Tessel keeps these applications out, 1\n";
+constexpr std::size_t kFields = 14;
+constexpr std::int64_t kNanoseconds = 1'000'000'000;
+
+std::string realPathOf(const std::string& path)
+{
+    std::error_code failed;
+    const auto real = std::filesystem::weakly_canonical(path, failed);
+    return failed ? path : real.native();
+}
+
+// The program inside a bundle is the same application as the bundle.
+bool isWithin(std::string_view path, std::string_view folder)
+{
+    return path == folder || (path.starts_with(folder) && path.substr(folder.size()).starts_with('/'));
+}
+
+auto findIn(auto& applications, const std::string& path)
+{
+    const std::string real = realPathOf(path);
+    return std::ranges::find_if(applications, [&](const KeptOutApplication& known)
+                                { return known.path == path || isWithin(real, known.realPath); });
+}
+
+std::string lineOf(const KeptOutApplication& application)
+{
+    const auto number = [](auto value)
+    {
+        return std::to_string(static_cast<std::int64_t>(value));
+    };
+    const std::array<std::string, kFields> fields = {escaped(application.path),
+                                                     escaped(application.realPath),
+                                                     number(application.stage),
+                                                     number(application.since),
+                                                     number(application.deed),
+                                                     number(application.reason),
+                                                     number(application.ending),
+                                                     escaped(application.detail),
+                                                     std::to_string(application.facts.size),
+                                                     number(application.facts.contentTime),
+                                                     number(application.facts.statusTime),
+                                                     std::to_string(application.facts.inode),
+                                                     application.hash ? std::to_string(*application.hash)
+                                                                      : std::string("-"),
+                                                     "."};
+    std::string line;
+    for (const std::string& field : fields)
+        line += field + (&field == &fields.back() ? '\n' : '\t');
+    return line;
+}
+
+std::string serialized(const std::vector<KeptOutApplication>& applications)
+{
+    std::string content(kHeader);
+    for (const auto& application : applications)
+        content += lineOf(application);
+    return content;
+}
+
+std::vector<std::string_view> split(std::string_view text, char separator)
+{
+    std::vector<std::string_view> parts;
+    for (std::size_t end = text.find(separator); end != text.npos; end = text.find(separator))
+    {
+        parts.push_back(text.substr(0, end));
+        text.remove_prefix(end + 1);
+    }
+    parts.push_back(text);
+    return parts;
+}
+
+template <class Number>
+bool parse(std::string_view text, Number& number)
+{
+    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), number);
+    return error == std::errc() && end == text.data() + text.size();
+}
+
+template <class Enumeration>
+bool parseEnumeration(std::string_view text, Enumeration last, Enumeration& value)
+{
+    std::uint32_t number = 0;
+    if (!parse(text, number) || number == 0 || number > static_cast<std::uint32_t>(last))
+        return false;
+    value = static_cast<Enumeration>(number);
+    return true;
+}
+
+std::optional<KeptOutApplication> parseLine(std::string_view line)
+{
+    const auto fields = split(line, '\t');
+    KeptOutApplication result;
+    std::uint64_t hash = 0;
+    const bool isWhole =
+        fields.size() == kFields && parseEnumeration(fields[2], Stage::kByPerson, result.stage) &&
+        parse(fields[3], result.since) &&
+        parseEnumeration(fields[4], RunningMarker::Deed::kLispFile, result.deed) &&
+        parseEnumeration(fields[5], RunningMarker::Reason::kOnCommand, result.reason) &&
+        parse(fields[6], result.ending) && parse(fields[8], result.facts.size) &&
+        parse(fields[9], result.facts.contentTime) && parse(fields[10], result.facts.statusTime) &&
+        parse(fields[11], result.facts.inode) && (fields[12] == "-" || parse(fields[12], hash));
+    if (!isWhole)
+        return std::nullopt;
+    result.path = unescaped(fields[0]);
+    result.realPath = unescaped(fields[1]);
+    result.detail = unescaped(fields[7]);
+    if (fields[12] != "-")
+        result.hash = hash;
+    return result;
+}
+
+std::wstring dayAndTime(std::int64_t seconds)
+{
+    const auto time = static_cast<std::time_t>(seconds);
+    std::tm local = {};
+    std::array<char, 32> text = {};
+    localtime_r(&time, &local);
+    return toWide({text.data(), std::strftime(text.data(), text.size(), "%Y-%m-%d %H:%M", &local)});
+}
+
+std::wstring whatHappened(const KeptOutApplication& application)
+{
+    const DeedWords words = wordsFor(application.deed);
+    const std::string deed = std::string(words.before) + application.detail + std::string(words.after);
+    return L"ended Tessel on " + dayAndTime(application.since) + L" " + toWide(deed) + L" (" +
+           toWide(wordsFor(application.reason)) + L"): " + toWide(wordsForEnding(application.ending));
+}
+
+// Gone is not changed: there is nothing else to be tried.
+bool isUnchanged(KeptOutApplication& application)
+{
+    const auto facts = factsOf(application.path);
+    if (!facts || *facts == application.facts)
+        return true;
+    if (!facts->mayBeTheSame(application.facts) || !application.hash)
+        return false;
+    if (contentHash(application.path) != application.hash)
+        return false;
+    application.facts = *facts;
+    return true;
+}
+
+// Whoever leaves or switches off while a window waits for them has nothing to complain of.
+bool isGuilty(const RunningMarker::Leftover& leftover)
+{
+    const bool fromOutside =
+        leftover.ending == RunningMarker::kVanished || leftover.ending == RunningMarker::kCalledExit;
+    return !leftover.work.path.empty() && !(leftover.work.waitsForPerson && fromOutside);
+}
+
+// A new version is tried without being asked for.
+void forgetChanged(std::vector<KeptOutApplication>& applications)
+{
+    std::vector<KeptOutApplication> staying;
+    for (KeptOutApplication& application : applications)
+        if (application.stage == Stage::kByPerson || isUnchanged(application))
+            staying.push_back(application);
+    applications = std::move(staying);
+}
+
+void giveTrials(std::vector<KeptOutApplication>& applications, std::vector<std::wstring>& sentences)
+{
+    for (KeptOutApplication& application : applications)
+    {
+        if (application.stage != Stage::kThisTime)
+            continue;
+        application.stage = Stage::kOnTrial;
+        application.hash = contentHash(application.path); // it is about to be opened in any case
+        sentences.push_back(L"The application \"" + toWide(application.path) + L"\" is tried once more: it " +
+                            whatHappened(application) + L".");
+    }
+}
+} // namespace
+
+KeptOut::KeptOut(std::filesystem::path folder) : mFile(folder / kFileName)
+{
+    if (auto known = read())
+        mApplications = *std::move(known);
+}
+
+Result<KeptOut::Applications> KeptOut::read() const
+{
+    const auto content = readSmallFile(mFile);
+    if (!content)
+        return content.failure();
+    Applications applications;
+    if (!*content)
+        return applications;
+    if (!(*content)->starts_with(kHeader) || !(*content)->ends_with('\n'))
+        return Failure{L"The file " + toWide(mFile.string()) +
+                       L" is damaged; without it Tessel does not know which applications to keep out."};
+    for (const auto line : linesOf(std::string_view(**content).substr(kHeader.size())))
+        if (auto application = parseLine(line))
+            applications.push_back(*std::move(application));
+    return applications;
+}
+
+Result<> KeptOut::change(const std::function<void(Applications&)>& work)
+{
+    if (mFile.empty())
+        return {};
+    const FileLock locked(mFile.parent_path() / kLockName);
+    auto applications = read();
+    if (!applications)
+    {
+        work(mApplications); // for this session it holds all the same
+        return applications.failure();
+    }
+    const auto before = serialized(*applications);
+    work(*applications);
+    mApplications = *std::move(applications);
+    const auto after = serialized(mApplications);
+    return before == after ? Result<>() : replaceSmallFile(mFile, after);
+}
+
+std::vector<std::wstring> KeptOut::begin(const std::vector<RunningMarker::Leftover>& leftovers,
+                                         bool givesTrials)
+{
+    std::vector<std::wstring> sentences;
+    const auto stored = change(
+        [&](Applications& applications)
+        {
+            forgetChanged(applications);
+            if (givesTrials)
+                giveTrials(applications, sentences);
+            for (const auto& leftover : leftovers)
+                if (isGuilty(leftover))
+                    sentences.push_back(judge(leftover, applications));
+        });
+    mStored = static_cast<bool>(stored);
+    if (!stored)
+        sentences.push_back(stored.sentence());
+    return sentences;
+}
+
+std::wstring KeptOut::judge(const RunningMarker::Leftover& leftover, Applications& applications)
+{
+    KeptOutApplication guilty;
+    guilty.path = leftover.work.path;
+    guilty.realPath = realPathOf(guilty.path);
+    guilty.since = leftover.work.since;
+    guilty.deed = leftover.work.deed;
+    guilty.reason = leftover.work.reason;
+    guilty.ending = leftover.ending;
+    guilty.detail = leftover.work.detail;
+    const std::wstring sentence =
+        L"The application \"" + toWide(guilty.path) + L"\" " + whatHappened(guilty) + L". ";
+    const auto facts = factsOf(guilty.path);
+    if (facts && facts->statusTime / kNanoseconds > guilty.since)
+        return sentence + L"Its file is another one by now, and is tried.";
+    guilty.facts = facts.value_or(FileFacts());
+    const auto known = findIn(applications, guilty.path);
+    if (known == applications.end())
+    {
+        applications.push_back(guilty);
+        return sentence + L"It is not loaded by itself at this start, and tried once more at the next.";
+    }
+    guilty.hash = known->hash;
+    guilty.stage = known->stage == Stage::kByPerson ? Stage::kByPerson : Stage::kForGood;
+    *known = guilty;
+    return sentence + L"It is not loaded by itself any more, until you load it by hand or let it in "
+                      L"(ENABLE), or its file changes.";
+}
+
+const KeptOutApplication* KeptOut::find(const std::string& path) const
+{
+    if (mApplications.empty())
+        return nullptr;
+    const auto found = findIn(mApplications, path);
+    return found == mApplications.end() ? nullptr : &*found;
+}
+
+Result<> KeptOut::keepOut(const std::string& path)
+{
+    return change(
+        [&](Applications& applications)
+        {
+            auto known = findIn(applications, path);
+            if (known == applications.end())
+                known = applications.insert(known, KeptOutApplication{});
+            *known = {};
+            known->path = path;
+            known->realPath = realPathOf(path);
+            known->stage = Stage::kByPerson;
+            known->since = std::time(nullptr);
+        });
+}
+
+Result<> KeptOut::letIn(const std::string& path)
+{
+    bool found = false;
+    auto changed = change(
+        [&](Applications& applications)
+        {
+            const auto known = findIn(applications, path);
+            found = known != applications.end();
+            if (found)
+                applications.erase(known);
+        });
+    if (changed && !found)
+        return Failure{L"The application \"" + toWide(path) + L"\" is not kept out."};
+    return changed;
+}
+
+void KeptOut::noteLoaded(const std::string& path, bool byHand)
+{
+    const KeptOutApplication* known = find(path);
+    if (!known || known->stage == Stage::kByPerson)
+        return;
+    const std::string stored = known->path;
+    mSurvived.push_back(stored);
+    // What cannot be stored now is no worse than it was: it is tried or loaded by hand again.
+    if (byHand)
+        static_cast<void>(letIn(stored));
+}
+
+void KeptOut::noteGoodEnd()
+{
+    if (mSurvived.empty())
+        return;
+    static_cast<void>(change(
+        [this](Applications& applications)
+        {
+            std::erase_if(applications,
+                          [this](const KeptOutApplication& application)
+                          {
+                              return application.stage == Stage::kOnTrial &&
+                                     std::ranges::find(mSurvived, application.path) != mSurvived.end();
+                          });
+        }));
+}
+
+std::wstring reasonOf(const KeptOutApplication& application)
+{
+    if (application.stage == Stage::kByPerson)
+        return L"kept out at starts by DISABLE since " + dayAndTime(application.since);
+    return L"kept out: it " + whatHappened(application);
+}
+} // namespace tessel

@@ -1,0 +1,94 @@
+// The applications that the host does not load by itself: those that ended it, and those that a person keeps
+// out. They stay in every list that they are in.
+//
+// What ended the host is kept out at the next start, and tried once more at the one after that: a power cut
+// must not cost an application for good. If it ends the host again, it stays out until a person loads it with
+// success or lets it in, or until its file is another one. An application that was tried is forgotten here
+// when a session in which it was loaded ends in good order.
+//
+// All of it stands in a text file of the profile, which several sessions may change.
+#pragma once
+
+#include <cstdint>
+#include <filesystem>
+#include <functional>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "host/platform/FileFacts.h"
+#include "host/platform/RunningMarker.h"
+#include "host/text/Result.h"
+
+namespace tessel
+{
+struct KeptOutApplication
+{
+    // The numbers stand in the file.
+    enum class Stage : std::uint32_t
+    {
+        kThisTime = 1, // it has ended the host once, in the last session
+        kOnTrial,      // it is let in once more
+        kForGood,      // it has ended the host again
+        kByPerson
+    };
+
+    std::string path; // full
+    std::string realPath;
+    Stage stage = Stage::kThisTime;
+    std::int64_t since = 0; // seconds of the calendar
+    RunningMarker::Deed deed = RunningMarker::Deed::kLoading;
+    RunningMarker::Reason reason = RunningMarker::Reason::kByHand;
+    int ending = RunningMarker::kVanished;
+    std::string detail;
+    FileFacts facts;
+    std::optional<std::uint64_t> hash; // known once it is on trial
+
+    // It is not loaded by itself.
+    bool isOut() const { return stage != Stage::kOnTrial; }
+};
+
+class KeptOut
+{
+public:
+    // Keeps nothing out, and nothing in mind.
+    KeptOut() = default;
+    // Of the folder, which is there; a file that is damaged is left as it is, and nothing is kept out.
+    explicit KeptOut(std::filesystem::path folder);
+
+    // A start, with what earlier sessions have left: judges them, and gives those a trial whose time has
+    // come, unless nothing will be loaded by itself anyway. Answers what a person is to be told.
+    std::vector<std::wstring> begin(const std::vector<RunningMarker::Leftover>& leftovers, bool givesTrials);
+    // Whether all that was learnt is stored.
+    bool isStored() const { return mStored; }
+
+    // What is known of the application at that full path, links followed; null for most.
+    const KeptOutApplication* find(const std::string& path) const;
+    const std::vector<KeptOutApplication>& all() const { return mApplications; }
+
+    // A person keeps it out, or lets it in whatever kept it out. The second fails when nothing does.
+    Result<> keepOut(const std::string& path);
+    Result<> letIn(const std::string& path);
+
+    // It was loaded, by a person's wish or without: the host has survived it.
+    void noteLoaded(const std::string& path, bool byHand);
+    // The session ends in good order.
+    void noteGoodEnd();
+
+private:
+    using Applications = std::vector<KeptOutApplication>;
+
+    Result<Applications> read() const;
+    // Changes what is stored now, which another session may have changed since it was read.
+    Result<> change(const std::function<void(Applications&)>& work);
+    static std::wstring judge(const RunningMarker::Leftover& leftover, Applications& applications);
+
+    std::filesystem::path mFile;
+    Applications mApplications;
+    std::vector<std::string> mSurvived; // on trial, and loaded in this session
+    bool mStored = true;
+};
+
+// Why it is kept out: a part of a sentence, with the day.
+std::wstring reasonOf(const KeptOutApplication& application);
+} // namespace tessel

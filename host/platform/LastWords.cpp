@@ -1,0 +1,122 @@
+#include "host/platform/LastWords.h"
+
+#include <algorithm>
+#include <cerrno>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <string_view>
+
+#include <unistd.h>
+
+#include "host/platform/RunningMarker.h"
+#include "host/text/Running.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr int kSomethingFailed = 1;
+
+// A full stack has no room for a handler.
+alignas(16) std::array<char, std::size_t{64} << 10> theStack;
+
+// A signal handler can be given nothing. Written before the handlers are in place.
+std::array<struct sigaction, NSIG> theFormer;
+
+// A line in pieces, made without memory of the system.
+class Line
+{
+public:
+    void add(std::string_view text)
+    {
+        const std::size_t count = std::min(text.size(), mBytes.size() - 1 - mLength);
+        // What a file is called must not steer the terminal.
+        std::transform(text.begin(), text.begin() + static_cast<std::ptrdiff_t>(count),
+                       mBytes.begin() + static_cast<std::ptrdiff_t>(mLength),
+                       [](char byte) { return byte >= 0 && byte < ' ' ? '?' : byte; });
+        mLength += count;
+    }
+    void print()
+    {
+        mBytes[mLength++] = '\n';
+        [[maybe_unused]] const auto written = write(STDERR_FILENO, mBytes.data(), mLength);
+    }
+
+private:
+    std::array<char, 6000> mBytes; // a path may have 4096
+    std::size_t mLength = 0;
+};
+
+// False when no application is at work.
+bool speak(int ending)
+{
+    RunningMarker* marker = running<RunningMarker>();
+    RunningMarker::AtWork work{};
+    if (!marker || !marker->innermost(work) || (ending == RunningMarker::kCalledExit && work.waitsForPerson))
+        return false;
+    marker->noteEnding(ending);
+    static Line line;
+    line.add("The application \"");
+    line.add(work.path);
+    line.add("\" has ended Tessel ");
+    const DeedWords words = wordsFor(work.deed);
+    line.add(words.before);
+    line.add(work.detail);
+    line.add(words.after);
+    line.add(": ");
+    line.add(wordsForEnding(ending));
+    line.add(".");
+    line.print();
+    return true;
+}
+
+void onSignal(int signal, siginfo_t* information, void*)
+{
+    const int error = errno;
+    speak(signal);
+    sigaction(signal, &theFormer[static_cast<std::size_t>(signal)], nullptr);
+    // A fault comes again by itself when the instruction does; what somebody has sent does not.
+    if (information->si_code <= 0)
+        raise(signal);
+    errno = error;
+}
+
+void onExit()
+{
+    if (!speak(RunningMarker::kCalledExit))
+        return;
+    std::fflush(nullptr);
+    _exit(kSomethingFailed);
+}
+} // namespace
+
+LastWords::LastWords()
+{
+    stack_t stack = {};
+    stack.ss_sp = theStack.data();
+    stack.ss_size = theStack.size();
+    sigaltstack(&stack, &mPreviousStack);
+    struct sigaction action = {};
+    action.sa_sigaction = onSignal;
+    action.sa_flags = SA_SIGINFO | SA_ONSTACK;
+    sigemptyset(&action.sa_mask);
+    for (std::size_t index = 0; index < kSignals.size(); ++index)
+    {
+        sigaction(kSignals[index], nullptr, &mPrevious[index]);
+        theFormer[static_cast<std::size_t>(kSignals[index])] = mPrevious[index];
+        if (mPrevious[index].sa_handler != SIG_IGN)
+            sigaction(kSignals[index], &action, nullptr);
+    }
+    // Nobody can take it back; without an application at work it does nothing.
+    static const int once = std::atexit(onExit);
+    static_cast<void>(once);
+}
+
+LastWords::~LastWords()
+{
+    for (std::size_t index = 0; index < kSignals.size(); ++index)
+        sigaction(kSignals[index], &mPrevious[index], nullptr);
+    sigaltstack(&mPreviousStack, nullptr);
+}
+} // namespace tessel

@@ -1,0 +1,178 @@
+// The search for an application that makes trouble without ending the host.
+#include <gmock/gmock.h>
+
+#include <algorithm>
+
+#include "tests/e2e/Applications.h"
+
+using testing::AllOf;
+using testing::HasSubstr;
+using testing::Not;
+
+namespace
+{
+constexpr char kTrouble[] = "TROUBLE\n";
+constexpr char kAgain[] = "Start Tessel again.\n";
+
+class Bisect : public testing::Test
+{
+protected:
+    // Lisp files that each say their name, and what else they are told to.
+    std::string write(const std::string& name, const std::string& lisp = {}) const
+    {
+        return session.folder()
+            .write(name + ".lsp", "(write-line \"" + name + " runs\")\n" + lisp + "\n")
+            .string();
+    }
+    std::string makesTrouble() const { return write("culprit", "(write-line \"TROUBLE\")"); }
+
+    void begin(const Paths& suite)
+    {
+        storeSuite(session, suite);
+        const auto result = session.run({"BISECT START"});
+        EXPECT_EQ(result.exitStatus, 0) << result.output;
+        EXPECT_THAT(result.output,
+                    HasSubstr("BISECT searches among " + std::to_string(suite.size()) + " application"));
+        EXPECT_THAT(result.output, HasSubstr(kAgain));
+    }
+
+    // Starts, looks and answers until there is no more to ask; the last words, and how many answers it took.
+    std::string search(std::size_t& starts)
+    {
+        std::string said;
+        for (starts = 1; starts <= 10; ++starts)
+        {
+            const bool isBad = session.run({"VERSION"}).output.find(kTrouble) != std::string::npos;
+            said = session.run({isBad ? "BISECT BAD" : "BISECT GOOD"}).output;
+            if (said.find(kAgain) == std::string::npos)
+                break;
+        }
+        return said.substr(std::min(said.size(), said.find("Command: BISECT")));
+    }
+
+    HostSession session;
+};
+} // namespace
+
+TEST_F(Bisect, NamesTheCulpritAndLeavesEverythingAsItWas)
+{
+    const std::string culprit = makesTrouble();
+    const Paths suite = {write("a"), fixtureModule("Good.zmb"), culprit, write("b"), write("c"), write("d"),
+                         write("e")};
+    begin(suite);
+    std::size_t starts = 0;
+    EXPECT_THAT(search(starts), HasSubstr("BISECT has found it: \"" + culprit + "\" makes the trouble."));
+    EXPECT_LE(starts, 4U);
+    const std::string after = session.run({"APPS"}).output;
+    EXPECT_THAT(after, AllOf(HasSubstr("a runs"), HasSubstr("e runs"), HasSubstr("Good.zmb: message 1"),
+                             HasSubstr(kTrouble), Not(HasSubstr("kept out"))));
+}
+
+TEST_F(Bisect, SaysWhichItKeepsOutAtEachStart)
+{
+    const Paths suite = {write("a"), write("b"), write("c"), write("d")};
+    begin(suite);
+    for (int start = 0; start < 2; ++start) // nothing was answered in between
+    {
+        const auto result = session.run({"BISECT"});
+        EXPECT_THAT(result.output, HasSubstr("BISECT keeps 2 of 4 suspects out at this start:\n  " +
+                                             suite[2] + "\n  " + suite[3] +
+                                             "\nType BISECT GOOD when the trouble is gone, BISECT BAD when "
+                                             "it is there; at most 3 starts are left.\n"));
+        EXPECT_THAT(result.output, AllOf(HasSubstr("a runs"), HasSubstr("b runs"), Not(HasSubstr("c runs")),
+                                         Not(HasSubstr("d runs"))));
+        EXPECT_THAT(result.output,
+                    HasSubstr("Cannot load \"" + suite[2] + "\": it is kept out at this start by BISECT.\n"));
+        EXPECT_THAT(result.output,
+                    HasSubstr("4 applications are still suspected; at most 3 starts are left.\n"));
+    }
+    EXPECT_THAT(
+        session.run({"BISECT bad"}).output,
+        HasSubstr("2 applications are still suspected; at most 2 starts are left. Start Tessel again.\n"));
+    EXPECT_THAT(session.run({"VERSION"}).output, AllOf(HasSubstr("a runs"), Not(HasSubstr("b runs"))));
+}
+
+TEST_F(Bisect, SaysThatItIsNone)
+{
+    begin({write("a"), write("b"), write("c")});
+    EXPECT_THAT(session.run({"BISECT BAD"}).output,
+                HasSubstr("1 application is still suspected; at most 1 start is left. "));
+    EXPECT_THAT(session.run({"VERSION"}).output,
+                AllOf(HasSubstr("BISECT keeps 3 of 3 suspects out"), Not(HasSubstr("runs"))));
+    EXPECT_THAT(
+        session.run({"BISECT BAD"}).output,
+        HasSubstr("BISECT says that it is none of them: the trouble is there when all of the 3 suspects "
+                  "are kept out.\n"));
+    EXPECT_THAT(session.run({"BISECT"}).output,
+                HasSubstr("No search is going on; BISECT START begins one.\n"));
+}
+
+TEST_F(Bisect, SaysThatSeveralAreNeededTogether)
+{
+    const std::string one = write("one", "(defvar *one* t)");
+    const std::string other = write("other", "(when (boundp '*one*) (write-line \"TROUBLE\"))");
+    begin({one, write("a"), write("b"), other});
+    std::size_t starts = 0;
+    EXPECT_THAT(search(starts), HasSubstr("several are needed together."));
+    EXPECT_LE(starts, 3U);
+}
+
+TEST_F(Bisect, DoesNotTouchTheStartupSuite)
+{
+    const Paths suite = {write("a"), makesTrouble(), write("b")};
+    const std::string list = std::string("REGISTRY LIST ") + kSuiteKey;
+    begin(suite);
+    const std::string before = session.start({"--safe", "-c", list}).output;
+    std::size_t starts = 0;
+    search(starts);
+    EXPECT_EQ(session.start({"--safe", "-c", list}).output, before);
+}
+
+TEST_F(Bisect, SuspectsNoneThatOthersCameWithAndNoneThatIsOutAlready)
+{
+    const std::string out = write("out");
+    storeSuite(session, {write("a"), out});
+    session.run({"DISABLE " + out});
+    EXPECT_THAT(session.run({"BISECT START"}).output, HasSubstr("BISECT searches among 1 application; "));
+}
+
+TEST_F(Bisect, JudgesOnlySessionsThatWereStartedForIt)
+{
+    storeSuite(session, {write("a"), write("b")});
+    EXPECT_THAT(session.run({"BISECT START", "BISECT GOOD"}).output,
+                HasSubstr("This session cannot be judged: "));
+    EXPECT_THAT(session.start({"--safe", "-c", "BISECT GOOD"}).output,
+                HasSubstr("This session cannot be judged: "));
+    const auto result = session.run({"BISECT GOOD", "BISECT GOOD"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, HasSubstr("This session cannot be judged: "));
+}
+
+TEST_F(Bisect, EndsWhenItIsStopped)
+{
+    begin({write("a"), write("b")});
+    EXPECT_EQ(session.run({"BISECT STOP"}).exitStatus, 0);
+    EXPECT_THAT(session.run({"VERSION"}).output,
+                AllOf(HasSubstr("a runs"), HasSubstr("b runs"), Not(HasSubstr("BISECT"))));
+}
+
+TEST_F(Bisect, TellsWhyItDoesNotBegin)
+{
+    EXPECT_THAT(
+        session.start({"--safe", "-c", "BISECT START"}).output,
+        HasSubstr(
+            "There is nothing to search among: no application was loaded by itself in this session.\n"));
+    EXPECT_THAT(session.run({"BISECT GOOD"}).output,
+                HasSubstr("No search is going on; BISECT START begins one.\n"));
+    EXPECT_THAT(session.run({"BISECT SIDEWAYS"}).output, HasSubstr("Usage: BISECT [START|GOOD|BAD|STOP]\n"));
+}
+
+TEST_F(Bisect, TellsThatItsFileIsDamaged)
+{
+    begin({write("a"), write("b")});
+    const auto file = session.folder().write(session.profile() / "applications" / "bisection", "gibberish");
+    const auto result = session.run({"BISECT GOOD", "BISECT STOP", "BISECT"});
+    EXPECT_THAT(result.output,
+                AllOf(HasSubstr("The file " + file.string() + " is damaged; "), HasSubstr("a runs"),
+                      HasSubstr("b runs"), HasSubstr("No search is going on")));
+}

@@ -1,0 +1,36 @@
+// Somebody ends the host from outside while no application is at work: the next start has nothing to ask.
+#include <csignal>
+
+#include <gmock/gmock.h>
+
+#include "tests/e2e/Applications.h"
+#include "tests/e2e/HostTerminal.h"
+
+namespace
+{
+class OutsideEnd : public testing::TestWithParam<int>
+{
+};
+} // namespace
+
+TEST_P(OutsideEnd, BlamesNobodyAtThePrompt)
+{
+    const HostSession session;
+    storeSuite(session, {fixtureModule("Good.zmb"), lispFixture("good.lsp")});
+    const std::string usual = session.run({"APPS"}).output;
+    {
+        HostTerminal terminal(session);
+        ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+        terminal.type("LOAD " + fixtureModule("Command.zmb") + "\r");
+        ASSERT_TRUE(terminal.shows("is loaded.")) << terminal.screen();
+        terminal.type("PFAD\r");
+        ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+        ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+        kill(terminal.process(), GetParam());
+        terminal.waitForEnd();
+    }
+    EXPECT_EQ(session.run({"APPS"}).output, usual);
+}
+
+INSTANTIATE_TEST_SUITE_P(By, OutsideEnd, testing::Values(SIGTERM, SIGHUP, SIGKILL),
+                         [](const auto& signal) { return std::string(sigabbrev_np(signal.param)); });
