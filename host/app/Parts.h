@@ -7,7 +7,6 @@
 #include <filesystem>
 #include <memory>
 
-#include "host/app/HostInformation.h"
 #include "host/app/Layout.h"
 #include "host/applications/Admission.h"
 #include "host/applications/ApplicationRecords.h"
@@ -23,6 +22,7 @@
 #include "host/commands/EndRequest.h"
 #include "host/commands/Interruption.h"
 #include "host/files/FileSearch.h"
+#include "host/files/HostInformation.h"
 #include "host/files/RemoteFiles.h"
 #include "host/lisp/LispInterpreter.h"
 #include "host/messages/Help.h"

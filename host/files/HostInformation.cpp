@@ -1,4 +1,4 @@
-#include "host/app/HostInformation.h"
+#include "host/files/HostInformation.h"
 
 #include <algorithm>
 #include <cwchar>
