@@ -121,11 +121,6 @@ bool LispInterpreter::runQueue()
     return allRan;
 }
 
-bool LispInterpreter::idle() const
-{
-    return mQueue.empty() && !running();
-}
-
 int LispInterpreter::invoke(const TsResultBuffer* call, TsResultBuffer** result)
 {
     const auto values = mMachine->call(call);

@@ -59,9 +59,6 @@ public:
     // when the session is to end nothing more. False when an expression failed.
     bool runQueue();
 
-    // Whether nothing is queued and nothing runs.
-    bool idle() const;
-
     // As `tsedInvoke`. A list comes back with its values in their order, lists within it flattened, and nil
     // within it as TS_NIL. Integers are TS_SHORT if they fit, then TS_LONG; other numbers are TS_REAL, T is
     // TS_TRUE, symbols are strings of their name, and what is none of these is the string that Lisp would

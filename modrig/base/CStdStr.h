@@ -24,7 +24,6 @@ public:
 
     const wchar_t* c_str() const { return mText.c_str(); }
     const std::wstring& Text() const { return mText; }
-    std::size_t GetLength() const { return mText.size(); }
     bool IsEmpty() const { return mText.empty(); }
 
     int CompareNoCase(const CStdStr& other) const;

@@ -113,8 +113,7 @@
     NSArray* chosen = [[mSelectedFiles copy] autorelease];
     const bool chosenInHistory = [self historyIsChosen];
     [self filterPanelAgain];
-    if (!ModrigUtils::PanelSelectionCounts(ModrigUtils::PanelChange::kFileType, [mSelectedFiles count] == 0,
-                                           chosenInHistory))
+    if (!ModrigUtils::PanelSelectionCountsAfterFileType([mSelectedFiles count] == 0, chosenInHistory))
         [mSelectedFiles setArray:chosen];
 }
 

@@ -39,7 +39,7 @@ TEST_F(StdStr, IsEmptyFromNothingFromNullAndFromAnEmptyText)
 TEST_F(StdStr, CountsCharactersAndNotBytes)
 {
     const CStdStr text(L"ä€\U0001F600");
-    EXPECT_EQ(3u, text.GetLength());
+    EXPECT_EQ(3u, text.Text().size());
     EXPECT_EQ(L"€", text.Mid(1, 1).Text());
 }
 
@@ -214,7 +214,7 @@ TEST_F(StdStr, LoadsATextThatIsNotEmptyWhateverItsFirstCharacter)
     EXPECT_EQ(whole, text.Text());
     host().resources.setText(kResourceModuleName, 5000, std::wstring(1, L'\0'));
     EXPECT_TRUE(text.Load(5000));
-    EXPECT_EQ(1u, text.GetLength());
+    EXPECT_EQ(1u, text.Text().size());
 }
 
 TEST_F(StdStr, FormatsByTheTextOfAnId)

@@ -96,7 +96,7 @@ TEST(StringList, IteratorsWalkForwardsInBothForms)
     list.AddTail(L"bc");
     auto position = list.begin();
     EXPECT_EQ(L"a", (position++)->Text());
-    EXPECT_EQ(2u, position->GetLength());
+    EXPECT_EQ(2u, position->Text().size());
     EXPECT_EQ(list.end(), ++position);
 }
 

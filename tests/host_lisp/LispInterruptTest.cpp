@@ -78,10 +78,11 @@ TEST_F(LispInterrupt, NamesTheLineOfAFile)
 TEST_F(LispInterrupt, StopsOneExpressionOfTheQueueOnly)
 {
     session.lisp().queue(L"(progn (princ \"begun\") (loop))");
-    session.lisp().queue(L"(+ 1 2)");
+    session.lisp().queue(L"(setq sum (+ 1 2))");
     EXPECT_FALSE(session.lisp().runQueue());
     EXPECT_EQ(session.output(), "begun\nLisp was interrupted.\n");
-    EXPECT_TRUE(session.lisp().idle());
+    EXPECT_FALSE(session.lisp().running());
+    EXPECT_EQ(session.value("sum"), "3");
 }
 
 TEST_F(LispInterrupt, StopsAFunctionThatIsCalled)

@@ -160,9 +160,9 @@ TEST_F(ProfileRegistry, ReadsAValueOf1023CharactersAndNoLongerOne)
     registry().setValue(kKey, L"too long", std::wstring(1024, L'x'));
     CStdStr data;
     EXPECT_TRUE(Read(L"longest", data));
-    EXPECT_EQ(1023u, data.GetLength());
+    EXPECT_EQ(1023u, data.Text().size());
     EXPECT_FALSE(Read(L"too long", data));
-    EXPECT_EQ(1023u, data.GetLength());
+    EXPECT_EQ(1023u, data.Text().size());
 }
 
 TEST_F(ProfileRegistry, WritesAValueWithWriteAccessAndClosesTheKey)

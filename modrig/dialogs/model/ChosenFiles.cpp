@@ -4,9 +4,9 @@
 
 namespace ModrigUtils
 {
-bool PanelSelectionCounts(PanelChange change, bool panelIsEmpty, bool chosenInHistory)
+bool PanelSelectionCountsAfterFileType(bool panelIsEmpty, bool chosenInHistory)
 {
-    return change == PanelChange::kChoice || !panelIsEmpty || !chosenInHistory;
+    return !panelIsEmpty || !chosenInHistory;
 }
 
 bool AreChosenInHistory(const std::vector<RowIdentity>& chosen, const std::vector<RowIdentity>& selected)

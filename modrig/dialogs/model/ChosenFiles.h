@@ -8,16 +8,10 @@
 
 namespace ModrigUtils
 {
-// Why the panel's selection has changed: somebody chose, or another file type took files out of sight.
-enum class PanelChange
-{
-    kChoice,
-    kFileType
-};
-
-// Whether the panel's selection is from now on what Load will load. A file type is not a choice of files:
-// when it leaves the panel without any, what is chosen in the History stays chosen.
-bool PanelSelectionCounts(PanelChange change, bool panelIsEmpty, bool chosenInHistory);
+// Whether the panel's selection is what Load will load after another file type took files out of sight. A
+// file type is not a choice of files: when it leaves the panel without any, what is chosen in the History
+// stays chosen.
+bool PanelSelectionCountsAfterFileType(bool panelIsEmpty, bool chosenInHistory);
 
 // A row, told from others that stand for the same file.
 using RowIdentity = const void*;

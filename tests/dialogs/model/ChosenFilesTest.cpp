@@ -4,27 +4,20 @@
 
 using namespace ModrigUtils;
 
-TEST(ChosenFiles, AreThePanelsWhateverSomebodyChoosesThere)
-{
-    for (const bool panelIsEmpty : {false, true})
-        for (const bool chosenInHistory : {false, true})
-            EXPECT_TRUE(PanelSelectionCounts(PanelChange::kChoice, panelIsEmpty, chosenInHistory));
-}
-
 TEST(ChosenFiles, StayThoseOfTheHistoryWhenAFileTypeEmptiesThePanel)
 {
-    EXPECT_FALSE(PanelSelectionCounts(PanelChange::kFileType, true, true));
+    EXPECT_FALSE(PanelSelectionCountsAfterFileType(true, true));
 }
 
 TEST(ChosenFiles, GoWhenAFileTypeHidesThem)
 {
-    EXPECT_TRUE(PanelSelectionCounts(PanelChange::kFileType, true, false));
+    EXPECT_TRUE(PanelSelectionCountsAfterFileType(true, false));
 }
 
 TEST(ChosenFiles, AreThoseThatTheFileTypeLeavesSelected)
 {
-    EXPECT_TRUE(PanelSelectionCounts(PanelChange::kFileType, false, true));
-    EXPECT_TRUE(PanelSelectionCounts(PanelChange::kFileType, false, false));
+    EXPECT_TRUE(PanelSelectionCountsAfterFileType(false, true));
+    EXPECT_TRUE(PanelSelectionCountsAfterFileType(false, false));
 }
 
 TEST(ChosenFiles, AreWhatIsStillSelectedWhenNoneAreLeft)

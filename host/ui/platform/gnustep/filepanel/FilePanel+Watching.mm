@@ -71,7 +71,6 @@ void* eventOf(int descriptor)
 
 - (void)receivedEvent:(void*)data type:(RunLoopEventType)type extra:(void*)extra forMode:(NSString*)mode
 {
-    (void)data, (void)type, (void)extra, (void)mode;
     mState->changes.add(mState->watch.take());
     if (std::exchange(mState->isGathering, true))
         return;
