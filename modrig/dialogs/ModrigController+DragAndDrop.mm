@@ -4,8 +4,8 @@
 
 #include "modrig/dialogs/Paths.h"
 #include "modrig/dialogs/model/Drop.h"
-#include "modrig/loader/FileIntake.h"
-#include "modrig/loader/LoadBatch.h"
+#include "modrig/dialogs/model/RowInsertion.h"
+#include "modrig/lists/FileIntake.h"
 
 namespace
 {

@@ -12,6 +12,7 @@
 #include "modrig/dialogs/Paths.h"
 #include "modrig/dialogs/Settings.h"
 #include "modrig/dialogs/model/ChosenFiles.h"
+#include "modrig/dialogs/model/RowInsertion.h"
 #include "modrig/dialogs/model/ShownTab.h"
 #include "modrig/loader/LoadBatch.h"
 #include "modrig/messages/Messages.h"

@@ -8,12 +8,12 @@
 
 #include "modrig/dialogs/Paths.h"
 #include "modrig/dialogs/model/ChosenFiles.h"
+#include "modrig/dialogs/model/RowInsertion.h"
 #include "modrig/dialogs/model/RowSelection.h"
 #include "modrig/dialogs/model/UnloadTip.h"
 #include "modrig/dialogs/platform/Platform.h"
 #include "modrig/lists/ListMembership.h"
 #include "modrig/lists/ListRemoval.h"
-#include "modrig/loader/LoadBatch.h"
 #include "modrig/loader/LoadedApplications.h"
 
 namespace

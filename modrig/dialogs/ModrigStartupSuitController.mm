@@ -12,9 +12,9 @@
 #include "modrig/dialogs/Paths.h"
 #include "modrig/dialogs/Settings.h"
 #include "modrig/dialogs/platform/Platform.h"
+#include "modrig/lists/FileIntake.h"
 #include "modrig/lists/ListMembership.h"
 #include "modrig/lists/ListRemoval.h"
-#include "modrig/loader/FileIntake.h"
 #include "modrig/messages/MessageIds.h"
 #include "modrig/messages/Messages.h"
 

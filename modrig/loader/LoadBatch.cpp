@@ -1,7 +1,5 @@
 #include "modrig/loader/LoadBatch.h"
 
-#include <algorithm>
-
 #include "modrig/loader/ApplicationLoader.h"
 #include "modrig/messages/MessageIds.h"
 #include "modrig/messages/Messages.h"
@@ -68,10 +66,5 @@ unsigned RunLoadBatch(const LoadBatch& batch)
     }
     SaySummary(progress);
     return progress.added;
-}
-
-std::size_t RowForInsertion(int insertRow, std::size_t rows)
-{
-    return insertRow < 0 ? rows : std::min(static_cast<std::size_t>(insertRow), rows);
 }
 } // namespace ModrigUtils

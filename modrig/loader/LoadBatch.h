@@ -35,10 +35,4 @@ struct LoadBatch
 // Answers how many files were newly loaded by a batch that got to its end or was stopped; 0 for one that
 // failed.
 [[nodiscard]] unsigned RunLoadBatch(const LoadBatch& batch);
-
-inline constexpr int kAppendRow = -1;
-
-// The place of a new row in a table: before the row where files were dropped, or at the end. A table with
-// fewer rows takes it at its end.
-[[nodiscard]] std::size_t RowForInsertion(int insertRow, std::size_t rows);
 } // namespace ModrigUtils

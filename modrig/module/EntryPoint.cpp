@@ -3,10 +3,10 @@
 #include <tessel/tsappinfo.h>
 #include <tessel/tsed.h>
 #include <tessel/tsedcommands.h>
-#include <tessel/tsrxlinker.h>
 
 #include "modrig/lists/Globals.h"
 #include "modrig/lists/History.h"
+#include "modrig/loader/HostLinker.h"
 #include "modrig/loader/StartupSuite.h"
 #include "modrig/messages/MessageIds.h"
 #include "modrig/messages/ResourceOverride.h"
@@ -24,7 +24,7 @@ constexpr bool kWithCommands = true;
 
 void RegisterWithLinker(void* application)
 {
-    if (TsRxDynamicLinker* linker = TsRxDynamicLinker::cast(tsrxSysRegistry()->at(TSRX_DYNAMIC_LINKER)))
+    if (TsRxDynamicLinker* linker = ModrigUtils::HostLinker())
         linker->registerApplication(application);
 }
 

@@ -144,19 +144,3 @@ TEST_F(LoadingABatch, IsNotStoppedAfterItsLastFile)
     EXPECT_EQ(2u, Load({L"/a/one.zmb", L"/a/two.zmb"}));
     EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"2")));
 }
-
-TEST(RowForInsertion, IsTheEndWhenNothingWasDropped)
-{
-    EXPECT_EQ(5u, RowForInsertion(kAppendRow, 5));
-}
-
-TEST(RowForInsertion, IsWhereFilesWereDropped)
-{
-    EXPECT_EQ(3u, RowForInsertion(3, 5));
-    EXPECT_EQ(0u, RowForInsertion(0, 5));
-}
-
-TEST(RowForInsertion, IsTheEndOfATableWithFewerRows)
-{
-    EXPECT_EQ(2u, RowForInsertion(5, 2));
-}

@@ -1,6 +1,6 @@
 #include "modrig/dialogs/model/ShownTab.h"
 
-#include "modrig/loader/LoadBatch.h"
+#include "modrig/dialogs/model/RowInsertion.h"
 
 namespace ModrigUtils
 {

@@ -1,4 +1,4 @@
-#include "modrig/loader/FileIntake.h"
+#include "modrig/lists/FileIntake.h"
 
 #include <algorithm>
 
