@@ -2,25 +2,25 @@
 
 #include <algorithm>
 #include <cmath>
+#include <optional>
 
 #import "modrig/dialogs/ModrigController.h"
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
+#include "modrig/dialogs/model/ShownTab.h"
+
 namespace
 {
-constexpr NSInteger kTabs = 2;
 constexpr CGFloat kSmallestHeight = 280; // a table of four rows, and the whole text of the Startup Suite box
 constexpr CGFloat kGap = 6;
 constexpr CGFloat kChoicePlace = 104; // in line with the panel's name field
 
-// The tab that the key stands for, or -1.
-NSInteger tabOf(NSEvent* event)
+std::optional<long> tabOf(NSEvent* event)
 {
     NSString* characters = [event charactersIgnoringModifiers];
     if (!([event modifierFlags] & NSCommandKeyMask) || [characters length] != 1)
-        return -1;
-    const NSInteger tab = [characters characterAtIndex:0] - '1';
-    return tab < kTabs ? tab : -1;
+        return std::nullopt;
+    return ModrigUtils::TabForKey([characters characterAtIndex:0]);
 }
 } // namespace
 
@@ -58,10 +58,10 @@ NSInteger tabOf(NSEvent* event)
 
 - (BOOL)performKeyEquivalent:(NSEvent*)event
 {
-    const NSInteger tab = tabOf(event);
-    if (tab < 0)
+    const std::optional<long> tab = tabOf(event);
+    if (!tab)
         return [super performKeyEquivalent:event];
-    [[TsOCModrigUtil getModrigController] setTabViewSelectedIndex:tab];
+    [[TsOCModrigUtil getModrigController] setTabViewSelectedIndex:*tab];
     return YES;
 }
 

@@ -4,6 +4,12 @@
 
 namespace ModrigUtils
 {
+std::optional<long> TabForKey(wchar_t key)
+{
+    const long tab = key - L'1';
+    return tab >= 0 && tab < kTabs ? std::optional(tab) : std::nullopt;
+}
+
 std::optional<TableKind> TableToScroll(unsigned added, int insertRow, long tab)
 {
     if (added == 0 || insertRow != kAppendRow)

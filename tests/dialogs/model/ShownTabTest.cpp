@@ -34,3 +34,15 @@ TEST(ShownTab, ScrollsNothingWhenItIsOfAnotherKind)
     EXPECT_THAT(TableToScroll(1, kAtTheEnd, 2), Eq(std::nullopt));
     EXPECT_THAT(TableToScroll(1, kAtTheEnd, -1), Eq(std::nullopt));
 }
+
+TEST(ShownTab, IsTheOneWhoseNumberIsTyped)
+{
+    EXPECT_THAT(TabForKey(L'1'), Optional(kLoadedApplicationsTab));
+    EXPECT_THAT(TabForKey(L'2'), Optional(kHistoryTab));
+}
+
+TEST(ShownTab, StaysForOtherKeys)
+{
+    for (const wchar_t key : {L'0', L'3', L'9', L'a', L'\0'})
+        EXPECT_THAT(TabForKey(key), Eq(std::nullopt)) << static_cast<int>(key);
+}
