@@ -75,9 +75,9 @@ void writeValue(NSString* group, NSString* control, NSString* value)
         return;
     const std::wstring name = NSStringToWstring(control);
     if (value)
-        static_cast<void>(tsudRegSetString(key.get(), name.c_str(), NSStringToWstring(value).c_str()));
+        tsudRegSetString(key.get(), name.c_str(), NSStringToWstring(value).c_str());
     else
-        static_cast<void>(RegDeleteValueW(key.get(), name.c_str()));
+        RegDeleteValueW(key.get(), name.c_str());
 }
 } // namespace
 

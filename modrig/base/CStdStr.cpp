@@ -35,7 +35,7 @@ CStdStr::CStdStr(const wchar_t* text)
     if (value == 0)
         return;
     if (value <= kLargestResourceId)
-        Load(static_cast<unsigned>(value));
+        *this = OfId(static_cast<unsigned>(value));
     else
         mText = text;
 }

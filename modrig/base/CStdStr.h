@@ -48,13 +48,13 @@ public:
 
     // Replaces the value with string `id` of the resource module (null: the current one). When the text is
     // missing or empty the value stays as it is and the answer is false.
-    bool Load(unsigned id, HMODULE module = nullptr);
+    [[nodiscard]] bool Load(unsigned id, HMODULE module = nullptr);
 
     // Replaces the value with the arguments formatted by string `id` of the current resource module, or, with
     // `Fmt`, by the text. The result holds at most the format's length plus 1023 characters. A conversion
     // that does not fit its argument prints as it stands. `Format` changes nothing when the id is missing.
     template <class... Arguments>
-    bool Format(unsigned id, const Arguments&... arguments)
+    [[nodiscard]] bool Format(unsigned id, const Arguments&... arguments)
     {
         CStdStr format;
         if (!format.Load(id))
@@ -72,6 +72,19 @@ public:
             const TsFormatArgument list[] = {TsFormatArgument(arguments)...};
             FormatArguments(format, list, sizeof...(arguments));
         }
+    }
+
+    // As `Load` and `Format`, for who goes on with an empty text where the id is missing.
+    [[nodiscard]] static CStdStr OfId(unsigned id)
+    {
+        CStdStr text;
+        return text.Load(id) ? text : CStdStr();
+    }
+    template <class... Arguments>
+    [[nodiscard]] static CStdStr Formatted(unsigned id, const Arguments&... arguments)
+    {
+        CStdStr text;
+        return text.Format(id, arguments...) ? text : CStdStr();
     }
 
     CStdStr& operator+=(const CStdStr& tail)

@@ -69,7 +69,7 @@ public:
     void RemoveAll();
 
     // Erases the first entry that equals the text without regard to case. Answers whether there was one.
-    bool RemoveFirstNoCase(const CStdStr& text);
+    [[nodiscard]] bool RemoveFirstNoCase(const CStdStr& text);
 
     // Whether an entry stands for the same application as the path (see `SplitPath` and `MatchesEntry`).
     [[nodiscard]] bool HoldsApplication(const CStdStr& path) const;

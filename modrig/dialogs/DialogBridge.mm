@@ -28,8 +28,7 @@ void RunDialog(void* controller)
 void SayWhatFailed(NSString* error)
 {
     const CStdStr reason = ModrigUtils::PathFromString(error);
-    CStdStr text;
-    text.Format(ModrigMessages::kDialogFailed, reason.c_str());
+    const CStdStr text = CStdStr::Formatted(ModrigMessages::kDialogFailed, reason.c_str());
     tsutPrintf(L"%s\n", text.c_str());
 }
 

@@ -52,8 +52,7 @@
     [panel setAccessoryView:[self view]];
     [self placeHelpButtonIn:panel];
     ModrigPlatform::FitAccessoryView([self view]);
-    CStdStr title;
-    title.Load(ModrigMessages::kOpenPanelTitle);
+    const CStdStr title = CStdStr::OfId(ModrigMessages::kOpenPanelTitle);
     [panel setTitle:ModrigUtils::StringFromPath(title)];
     [panel setDirectory:[self initialFolder]];
     ModrigPlatform::ShowRows(loadedAppsTableView, loadedApps);
@@ -124,7 +123,9 @@
         return NO;
     NSString* path = [name stringByResolvingSymlinksAndAliasesInPath];
     ModrigUtils::PanelFile file;
-    file.exists = ModrigPlatform::FileExists(path, file.isFolder);
+    const auto kind = ModrigPlatform::FileKindAt(path);
+    file.exists = kind.has_value();
+    file.isFolder = kind == ModrigPlatform::FileKind::kFolder;
     file.isPackage = file.isFolder && ModrigPlatform::IsFilePackage(path);
     file.extension = ModrigUtils::PathFromString([path pathExtension]);
     file.isHostFolder = [self isTesselFolder:path];

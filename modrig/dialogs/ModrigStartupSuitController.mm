@@ -91,8 +91,7 @@ constexpr NSInteger kRemoveSegment = 1;
 {
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
     TsOCOpenFileDialog* dialog = [[[TsOCOpenFileDialog alloc] init] autorelease];
-    CStdStr title;
-    title.Load(ModrigMessages::kStartupSuitePanelTitle);
+    const CStdStr title = CStdStr::OfId(ModrigMessages::kStartupSuitePanelTitle);
     [dialog setTitle:ModrigUtils::StringFromPath(title)];
     [dialog setInitialPath:[[NSBundle mainBundle] bundlePath]];
     [dialog setAllowsMultipleSelection:YES];

@@ -39,8 +39,7 @@ ModrigUtils::TypedLetters& typedLetters()
 ModrigUtils::RowFacts factsOf(ModrigFilePath* row)
 {
     ModrigUtils::RowFacts facts;
-    bool isFolder = false;
-    facts.exists = ModrigPlatform::FileExists([row filePathName], isFolder);
+    facts.exists = ModrigPlatform::FileKindAt([row filePathName]).has_value();
     facts.unloadable = [row unloadable];
     facts.isCompiledModule = ModrigUtils::FileTypeOfPath([row path]) == kCompiledModule;
     facts.hasFailed = ModrigUtils::LastLoadFailed([row path]);

@@ -44,6 +44,6 @@ bool IsALispAppFoundinList(const CStdStr& path)
 
 void RemoveInSpecificList(const CStdStr& path, CStringList& list)
 {
-    list.RemoveFirstNoCase(path);
+    static_cast<void>(list.RemoveFirstNoCase(path)); // not there is as good as removed
 }
 } // namespace ModrigUtils

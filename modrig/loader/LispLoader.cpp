@@ -72,8 +72,7 @@ void QueueWithPrompt(const CStdStr& expression)
 {
     qxr_queueexpr(expression.c_str());
     qxr_queueexpr(L"(write-line \"\")");
-    CStdStr prompt;
-    prompt.Load(ModrigMessages::kLispPrompt);
+    const CStdStr prompt = CStdStr::OfId(ModrigMessages::kLispPrompt);
     CStdStr promptExpression;
     promptExpression.Fmt(L"(prompt \"%s \")", prompt.c_str());
     qxr_queueexpr(promptExpression.c_str());

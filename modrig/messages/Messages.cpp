@@ -20,12 +20,7 @@ constexpr unsigned kMessageBoxStyle = MB_OK | MB_ICONEXCLAMATION;
 
 CStdStr MessageText(unsigned id, const CStdStr& subject, const CStdStr& argument)
 {
-    CStdStr text;
-    if (subject.IsEmpty())
-        text.Load(id);
-    else
-        text.Format(id, argument.c_str());
-    return text;
+    return subject.IsEmpty() ? CStdStr::OfId(id) : CStdStr::Formatted(id, argument.c_str());
 }
 
 // The text is itself the format. The host's formatting prints a conversion without an argument as it stands,
@@ -85,13 +80,13 @@ void ModrigAfxMessageBox(unsigned id, CStdStr argument)
 void ModrigAfxMessageBox(const CStdStr& text)
 {
     // One button: there is nothing to learn from the answer.
-    static_cast<void>(VqHostMessageBox::simple()->show(text.c_str(), kMessageBoxStyle, nullptr));
+    VqHostMessageBox::simple()->show(text.c_str(), kMessageBoxStyle, nullptr);
 }
 
 void OnCommandHelp(int topic)
 {
     wchar_t buffer[kHelpTopicSize];
     std::wcsncpy(buffer, HelpTopic(topic), kHelpTopicSize);
-    static_cast<void>(tsedHelp(nullptr, buffer, 0)); // the host says so itself when there is no such page
+    tsedHelp(nullptr, buffer, 0); // the host says so itself when there is no such page
 }
 } // namespace ModrigUtils

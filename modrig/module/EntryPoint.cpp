@@ -43,9 +43,8 @@ void RegisterCommand()
     if (!commands)
         return;
     // After an unload and a load the command is there already, which is as good as added.
-    static_cast<void>(commands->addCommand(group.c_str(), globalName.c_str(), localName.c_str(),
-                                           kPlainCommand, ModrigUtils::ModrigCreate, nullptr, kNoFunctionCode,
-                                           nullptr, nullptr));
+    commands->addCommand(group.c_str(), globalName.c_str(), localName.c_str(), kPlainCommand,
+                         ModrigUtils::ModrigCreate, nullptr, kNoFunctionCode, nullptr, nullptr);
 }
 
 int Load(void* application)
@@ -61,7 +60,7 @@ int Load(void* application)
 // A record that cannot be written costs the user a command typed at the next start, and nothing else.
 void WriteRecord(TesselAppInfo& record)
 {
-    static_cast<void>(record.writeToRegistry(kForCurrentUser, kWithCommands));
+    record.writeToRegistry(kForCurrentUser, kWithCommands);
 }
 
 void CreateRecord(TesselAppInfo& record)

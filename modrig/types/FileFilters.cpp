@@ -28,20 +28,15 @@ struct FilterEntry
 CStdStr AllApplicationsFilter()
 {
     const TsDbHostApplicationServices* services = tsdbHostApplicationServices();
-    CStdStr text;
-    text.Format(ModrigMessages::kAllApplicationsFilter, kHostRelease, services ? services->product() : L"");
-    return text;
+    return CStdStr::Formatted(ModrigMessages::kAllApplicationsFilter, kHostRelease,
+                              services ? services->product() : L"");
 }
 
 std::vector<CStdStr> FilterTexts()
 {
     std::vector<CStdStr> texts = {AllApplicationsFilter()};
     for (const ApplicationKind& kind : KindsByFilter())
-    {
-        CStdStr text;
-        text.Load(kind.filterText);
-        texts.push_back(text);
-    }
+        texts.push_back(CStdStr::OfId(kind.filterText));
     return texts;
 }
 

@@ -200,7 +200,7 @@ TEST_F(StdStr, FetchesATextAgainOnlyWhenItFillsTheRoom)
         host().resources.setText(kResourceModuleName, 5000, std::wstring(length, L'x'));
         host().journal.clear();
         CStdStr text;
-        text.Load(5000);
+        EXPECT_TRUE(text.Load(5000));
         EXPECT_EQ(expected, host().journal.count(L"loadStringFromWin32ResourceDLL")) << length;
     }
 }

@@ -56,7 +56,7 @@ TEST(StringList, ErasesTheFirstEqualEntryAmongManyThatWereAppendedAndErasedBefor
     {
         const std::wstring head = list.begin()->Text();
         EXPECT_EQ(round % 2 == 0 ? L"/a/TOOL.lsp" : L"/a/tool.lsp", head);
-        list.RemoveFirstNoCase(L"/a/tool.LSP");
+        EXPECT_TRUE(list.RemoveFirstNoCase(L"/a/tool.LSP"));
     }
     EXPECT_TRUE(list.IsEmpty());
 }
@@ -85,7 +85,7 @@ TEST(StringList, FindsNoEntryThatWasErased)
 {
     CStringList list;
     list.AddTail(L"/a/tool.omp");
-    list.RemoveFirstNoCase(L"/A/TOOL.OMP");
+    EXPECT_TRUE(list.RemoveFirstNoCase(L"/A/TOOL.OMP"));
     EXPECT_FALSE(list.HoldsApplication(L"/a/tool.omp"));
 }
 

@@ -17,7 +17,7 @@ struct DraggedFiles
 };
 
 // Whether there is an application among the files: one is enough. Says nothing about any of them.
-bool HasApplication(const DraggedFiles& files);
+[[nodiscard]] bool HasApplication(const DraggedFiles& files);
 
 // What the toolkit suggests for a drop on a table.
 struct ProposedDrop
@@ -34,5 +34,5 @@ enum class DropAnswer
     kTakenAtEnd // after the last row
 };
 
-DropAnswer AnswerDrop(const ProposedDrop& drop, const DraggedFiles& files);
+[[nodiscard]] DropAnswer AnswerDrop(const ProposedDrop& drop, const DraggedFiles& files);
 } // namespace ModrigUtils

@@ -19,5 +19,6 @@ struct PanelFile
 
 // Whether the file shows under a filter with the given extensions. Folders always do, for the way through
 // them; so does the host's own application folder, where the applications that come with the host are.
-bool IsShownInPanel(const PanelFile& file, bool packagesAreFolders, const std::vector<CStdStr>& extensions);
+[[nodiscard]] bool IsShownInPanel(const PanelFile& file, bool packagesAreFolders,
+                                  const std::vector<CStdStr>& extensions);
 } // namespace ModrigUtils

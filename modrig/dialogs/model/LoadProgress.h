@@ -14,10 +14,10 @@ public:
 
     // Whether it is time to look for the key that stops the load. Every look costs more than many a file, so
     // there are not many of them; short loads see none.
-    bool IsTimeToLook(Time now);
+    [[nodiscard]] bool IsTimeToLook(Time now);
 
     // Whether it is time to say how far the load has come: after a second, and then a few times a second.
-    bool IsTimeToTell(Time now);
+    [[nodiscard]] bool IsTimeToTell(Time now);
 
 private:
     Time mNextLook;

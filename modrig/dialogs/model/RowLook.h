@@ -26,12 +26,12 @@ struct RowFacts
 };
 
 // All but usable rows are shown in grey.
-RowState StateOf(TableKind kind, const RowFacts& facts);
+[[nodiscard]] RowState StateOf(TableKind kind, const RowFacts& facts);
 
 // The key of the text that says why a row is grey; null for one that is not.
-const char* ReasonKey(RowState state);
+[[nodiscard]] const char* ReasonKey(RowState state);
 
 // The text itself when it fits, or as much of its beginning as fits with an ellipsis after it. `fits` answers
 // whether a text does; a shorter one does when a longer one does.
-CStdStr Shortened(const CStdStr& text, const std::function<bool(const CStdStr&)>& fits);
+[[nodiscard]] CStdStr Shortened(const CStdStr& text, const std::function<bool(const CStdStr&)>& fits);
 } // namespace ModrigUtils

@@ -14,13 +14,14 @@ using RowTest = std::function<bool(std::size_t row)>;
 
 // Whether the row may be selected. All that can be done with a loaded application is to unload it, so in that
 // table only those may be that can be unloaded, and no place without a row. Other tables refuse nothing.
-bool MayBeSelected(TableKind kind, long row, std::size_t rows, const RowTest& isUnloadable);
+[[nodiscard]] bool MayBeSelected(TableKind kind, long row, std::size_t rows, const RowTest& isUnloadable);
 
 // Those of the rows that may be selected, in their order: what stays of a selection that somebody else made.
-std::vector<std::size_t> SelectableOf(const std::vector<std::size_t>& rows, const RowTest& mayBeSelected);
+[[nodiscard]] std::vector<std::size_t> SelectableOf(const std::vector<std::size_t>& rows,
+                                                    const RowTest& mayBeSelected);
 
 // Every row of the table that may be selected.
-std::vector<std::size_t> AllSelectable(std::size_t rows, const RowTest& mayBeSelected);
+[[nodiscard]] std::vector<std::size_t> AllSelectable(std::size_t rows, const RowTest& mayBeSelected);
 
 // The rows that a menu is for.
 enum class MenuRows
@@ -32,5 +33,5 @@ enum class MenuRows
 };
 
 // `row`: where the menu was opened, negative beside the rows.
-MenuRows RowsOfMenu(long row, bool isSelected, bool mayBeSelected);
+[[nodiscard]] MenuRows RowsOfMenu(long row, bool isSelected, bool mayBeSelected);
 } // namespace ModrigUtils

@@ -16,11 +16,11 @@ struct RowPlaces
 
 // The row that an arrow, page, Home or End key goes to: the nearest beyond its goal that can be selected, or
 // else before it. None for other keys, and where no row can be selected.
-std::optional<std::size_t> RowForKey(wchar_t key, const RowPlaces& places,
-                                     const std::function<bool(std::size_t)>& canBeSelected);
+[[nodiscard]] std::optional<std::size_t> RowForKey(wchar_t key, const RowPlaces& places,
+                                                   const std::function<bool(std::size_t)>& canBeSelected);
 
 // The same where a toolkit that does not ask which rows can be selected would go to another row; none where
 // it goes there by itself.
-std::optional<std::size_t> RowPassedOverFor(wchar_t key, const RowPlaces& places,
-                                            const std::function<bool(std::size_t)>& canBeSelected);
+[[nodiscard]] std::optional<std::size_t>
+RowPassedOverFor(wchar_t key, const RowPlaces& places, const std::function<bool(std::size_t)>& canBeSelected);
 } // namespace ModrigUtils

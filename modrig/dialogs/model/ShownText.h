@@ -7,5 +7,5 @@ namespace ModrigUtils
 {
 // The text in one line: what is no visible character, a line break in a file's name, say, is written as the
 // escape that programmers know: \n, \t, \x1B; so is what is no text at all, \xFF.
-CStdStr ShownText(const CStdStr& text);
+[[nodiscard]] CStdStr ShownText(const CStdStr& text);
 } // namespace ModrigUtils

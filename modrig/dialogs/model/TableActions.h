@@ -39,7 +39,7 @@ struct TableKey
 };
 
 // The key as the tables know it: some displays send Control-A as the first of the control characters.
-TableKey KnownKey(TableKey key);
+[[nodiscard]] TableKey KnownKey(TableKey key);
 
 // Keys that are no characters, as the tables are told of them.
 inline constexpr wchar_t kInsertKey = 0xF727;
@@ -54,14 +54,14 @@ inline constexpr wchar_t kPageUpKey = 0xF72C;
 inline constexpr wchar_t kPageDownKey = 0xF72D;
 
 // The key of the text of its menu item.
-const char* TitleKey(TableAction action);
+[[nodiscard]] const char* TitleKey(TableAction action);
 
 // The menu of the table's rows, from top to bottom. `keepingOut`: the one of the two actions about that which
 // the rows want, or `kNone` in a host that knows neither.
-std::vector<TableAction> MenuOf(TableKind kind, TableAction keepingOut = TableAction::kNone);
+[[nodiscard]] std::vector<TableAction> MenuOf(TableKind kind, TableAction keepingOut = TableAction::kNone);
 
 // What the key does in the table; `kNone` for one that the table has no action for.
-TableAction ActionForKey(TableKind kind, TableKey key);
+[[nodiscard]] TableAction ActionForKey(TableKind kind, TableKey key);
 
 // The rows of a table as far as they decide what can be done.
 struct TableState
@@ -73,7 +73,7 @@ struct TableState
     bool lastIsSelected = false;
 };
 
-bool IsPossible(TableAction action, const TableState& state);
+[[nodiscard]] bool IsPossible(TableAction action, const TableState& state);
 
 // The places that rows move to: one after the other, from `from` to `to`, each a step.
 struct RowMove
@@ -83,5 +83,6 @@ struct RowMove
 };
 
 // How the selected rows (ascending) move up or down by one, all together. None when there is no room.
-std::vector<RowMove> MovesOf(const std::vector<std::size_t>& selected, std::size_t rows, bool up);
+[[nodiscard]] std::vector<RowMove> MovesOf(const std::vector<std::size_t>& selected, std::size_t rows,
+                                           bool up);
 } // namespace ModrigUtils

@@ -19,10 +19,10 @@ public:
     const CStdStr& Add(wchar_t letter, Time now);
 
     // Whether a word has begun that a space may go on with.
-    bool IsTyping(Time now) const;
+    [[nodiscard]] bool IsTyping(Time now) const;
 
     // Whether the key is a letter of a word, and no key that does something.
-    bool Take(TableKey key, Time now) const;
+    [[nodiscard]] bool Take(TableKey key, Time now) const;
 
 private:
     CStdStr mLetters;
@@ -31,7 +31,7 @@ private:
 
 // The row whose name begins with the letters, whatever their case: `current` itself or the first after it,
 // then from the top. With one letter typed it is the next one, so that the same letter again goes on.
-std::optional<std::size_t> RowBeginningWith(const CStdStr& letters, std::size_t rows,
-                                            std::optional<std::size_t> current,
-                                            const std::function<CStdStr(std::size_t)>& nameOf);
+[[nodiscard]] std::optional<std::size_t> RowBeginningWith(const CStdStr& letters, std::size_t rows,
+                                                          std::optional<std::size_t> current,
+                                                          const std::function<CStdStr(std::size_t)>& nameOf);
 } // namespace ModrigUtils

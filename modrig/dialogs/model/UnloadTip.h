@@ -8,5 +8,5 @@
 namespace ModrigUtils
 {
 // The keys of its lines. `rows`: the states of all rows in the list of loaded applications.
-std::vector<const char*> UnloadTip(bool someAreSelected, const std::vector<RowState>& rows);
+[[nodiscard]] std::vector<const char*> UnloadTip(bool someAreSelected, const std::vector<RowState>& rows);
 } // namespace ModrigUtils

@@ -15,5 +15,5 @@ struct Frame
 // The remembered frame, or as much of it as fits the part of the screen that windows may use, which may be
 // another screen than last time's; no smaller than the least size. The title bar is on the screen in any
 // case.
-Frame OnScreen(Frame remembered, const Frame& screen, double leastWidth, double leastHeight);
+[[nodiscard]] Frame OnScreen(Frame remembered, const Frame& screen, double leastWidth, double leastHeight);
 } // namespace ModrigUtils

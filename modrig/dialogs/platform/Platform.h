@@ -3,6 +3,8 @@
 
 #import <AppKit/AppKit.h>
 
+#include <optional>
+
 namespace ModrigPlatform
 {
 // Makes the panel's accessory view as wide as the panel, at any size of it.
@@ -11,8 +13,14 @@ void FitAccessoryView(NSView* view);
 // Lets Tab walk through everything that the window shows now.
 void UpdateKeyViews(NSWindow* window);
 
-// Whether the file exists; `isFolder` then says whether it is a folder.
-bool FileExists(NSString* path, bool& isFolder);
+enum class FileKind
+{
+    kFile,
+    kFolder
+};
+
+// What stands at the path, links followed; none when nothing does.
+[[nodiscard]] std::optional<FileKind> FileKindAt(NSString* path);
 // Whether its user sees the folder as one file.
 bool IsFilePackage(NSString* path);
 

@@ -40,15 +40,14 @@ void UpdateKeyViews(NSWindow*)
 {
 }
 
-bool FileExists(NSString* path, bool& isFolder)
+std::optional<FileKind> FileKindAt(NSString* path)
 {
     FSRef reference;
     Boolean folder = false;
     const auto text = reinterpret_cast<const UInt8*>([path UTF8String]);
     if (FSPathMakeRef(text, &reference, &folder) != noErr)
-        return false;
-    isFolder = folder;
-    return true;
+        return std::nullopt;
+    return folder ? FileKind::kFolder : FileKind::kFile;
 }
 
 bool IsFilePackage(NSString* path)

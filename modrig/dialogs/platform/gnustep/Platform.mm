@@ -42,13 +42,12 @@ void UpdateKeyViews(NSWindow* window)
     [window recalculateKeyViewLoop];
 }
 
-bool FileExists(NSString* path, bool& isFolder)
+std::optional<FileKind> FileKindAt(NSString* path)
 {
     struct stat status;
     if (stat([path fileSystemRepresentation], &status) != 0)
-        return false;
-    isFolder = S_ISDIR(status.st_mode);
-    return true;
+        return std::nullopt;
+    return S_ISDIR(status.st_mode) ? FileKind::kFolder : FileKind::kFile;
 }
 
 bool IsFilePackage(NSString* path)
