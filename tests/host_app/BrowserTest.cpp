@@ -7,6 +7,7 @@
 #include <optional>
 
 #include <sys/stat.h>
+#include <sys/wait.h>
 
 #include "host/messages/Help.h"
 #include "host/messages/platform/Desktop.h"
@@ -92,6 +93,27 @@ TEST_F(Browser, IsTheNextOneWhereAnotherIsMissingOrIsNoProgram)
     install(pageOpeners().back());
     ASSERT_TRUE(openInBrowser("/page.html"));
     EXPECT_EQ(opened(), "/page.html in " + pageOpeners().back());
+}
+
+TEST_F(Browser, IsPutAwayWhenTheNextOneStarts)
+{
+    install(pageOpeners().front());
+    ASSERT_TRUE(openInBrowser("/one.html"));
+    opened();
+    siginfo_t ended{};
+    ASSERT_EQ(waitid(P_ALL, 0, &ended, WEXITED | WNOWAIT), 0);
+    ASSERT_TRUE(openInBrowser("/two.html"));
+    opened();
+    const pid_t second = waitpid(-1, nullptr, 0);
+    EXPECT_GT(second, 0);
+    EXPECT_NE(second, ended.si_pid);
+    EXPECT_EQ(waitpid(-1, nullptr, 0), -1);
+}
+
+TEST_F(Browser, IsSoughtInNoPlaceWhenThePathIsEmpty)
+{
+    const Variable path("PATH", "");
+    EXPECT_FALSE(openInBrowser("/page.html"));
 }
 
 TEST_F(Browser, ThatIsNotThereOpensNothing)

@@ -99,6 +99,7 @@ std::vector<const char*> pointersTo(const std::vector<std::string>& texts)
     _exit(EXIT_FAILURE);
 }
 
+// By fork: spawning a program gives no occasion to ask for a signal when its parent ends.
 void startHelper(const std::vector<std::string>& command)
 {
     const auto variables = environmentWith(kTemporaryFolder, sessionFolder());

@@ -6,9 +6,12 @@
 #import <AppKit/AppKit.h>
 
 #include <algorithm>
+#include <array>
 #include <map>
 #include <utility>
 #include <vector>
+
+#include <unicode/utf16.h>
 
 #include "host/platform/gnustep/StandIn.h"
 #include "host/ui/platform/gnustep/FontCoverage.h"
@@ -52,12 +55,13 @@ NSFont* fontFor(char32_t character, NSFont* font)
 // The character that begins there, and how many units it takes.
 std::pair<char32_t, NSUInteger> characterAt(NSString* text, NSUInteger index)
 {
-    const unichar high = [text characterAtIndex:index];
-    const bool isPair = high >= 0xD800 && high < 0xDC00 && index + 1 < [text length];
-    const unichar low = isPair ? [text characterAtIndex:index + 1] : 0;
-    if (low < 0xDC00 || low >= 0xE000)
-        return {high, 1};
-    return {0x10000 + ((static_cast<char32_t>(high) - 0xD800) << 10) + (low - 0xDC00), 2};
+    std::array<unichar, U16_MAX_LENGTH> units{};
+    const NSUInteger count = std::min<NSUInteger>(units.size(), [text length] - index);
+    [text getCharacters:units.data() range:NSMakeRange(index, count)];
+    UChar32 character = 0;
+    NSUInteger length = 0;
+    U16_NEXT(units, length, count, character);
+    return {static_cast<char32_t>(character), length};
 }
 
 bool isDrawn(char32_t character)

@@ -8,6 +8,7 @@
 #import "host/ui/platform/gnustep/filepanel/FileDrag.h"
 #import "host/ui/platform/gnustep/filepanel/FilePanel.h"
 #import "host/ui/platform/gnustep/filepanel/FileTable.h"
+#include "host/ui/platform/gnustep/filepanel/Folders.h"
 #include "host/ui/platform/gnustep/filepanel/PanelState.h"
 #include "host/ui/platform/gnustep/filepanel/TypedNames.h"
 #include "host/ui/platform/gnustep/filepanel/Words.h"
@@ -20,12 +21,6 @@ bool fileExists(const std::string& path)
 {
     struct stat status;
     return stat(path.c_str(), &status) == 0;
-}
-
-bool isFolder(const std::string& path)
-{
-    struct stat status;
-    return stat(path.c_str(), &status) == 0 && S_ISDIR(status.st_mode);
 }
 
 bool isHost(NSString* path)

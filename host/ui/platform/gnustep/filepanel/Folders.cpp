@@ -8,14 +8,11 @@
 
 namespace tessel::filepanel
 {
-namespace
-{
 bool isFolder(const std::string& path)
 {
     struct stat status;
     return stat(path.c_str(), &status) == 0 && S_ISDIR(status.st_mode);
 }
-} // namespace
 
 std::vector<Step> wayTo(const std::string& folder)
 {

@@ -15,6 +15,9 @@ struct Step
     std::string path;
 };
 
+// Whether a folder stands there, links followed.
+bool isFolder(const std::string& path);
+
 // The way from the root to the folder itself.
 std::vector<Step> wayTo(const std::string& folder);
 
