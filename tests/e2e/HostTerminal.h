@@ -6,6 +6,7 @@
 #include <string_view>
 #include <vector>
 
+#include <gtest/gtest.h>
 #include <sys/types.h>
 
 #include "tests/e2e/HostProcess.h"
@@ -26,6 +27,12 @@ public:
     bool shows(std::string_view text) { return showsWithin(text, kHostTimeLimit); }
     bool showsWithin(std::string_view text, std::chrono::milliseconds time);
 
+    // The same for the prompt; what appeared instead is told.
+    testing::AssertionResult awaitPrompt()
+    {
+        return shows("Command: ") ? testing::AssertionSuccess() : testing::AssertionFailure() << screen();
+    }
+
     // Waits for the end; the exit status as in HostResult. A host that does not end is killed.
     int waitForEnd();
 
@@ -45,3 +52,6 @@ private:
 
 inline constexpr std::string_view kControlC = "\x03";
 inline constexpr std::string_view kControlD = "\x04";
+
+// Lisp that never ends. It tells by "begun" that it runs, which stands nowhere in the line that is typed.
+inline const std::string kRunaway = "(progn (princ \"be\") (princ \"gun\") (loop))";

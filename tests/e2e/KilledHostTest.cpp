@@ -12,7 +12,7 @@ TEST(KilledHost, KeepsTheStartupSuiteThatWasChangedInIt)
     storeSuite(session, {fixtureModule("Good.zmb")});
     {
         HostTerminal terminal(session);
-        ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+        ASSERT_TRUE(terminal.awaitPrompt());
         terminal.type(setInSuite("NumStartup", "2") + "\r");
         ASSERT_TRUE(terminal.shows("\r\nCommand: ")) << terminal.screen();
         terminal.type(setInSuite("2Startup", lispFixture("good.lsp")) + "\r");

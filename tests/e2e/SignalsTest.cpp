@@ -23,7 +23,7 @@ protected:
 TEST_P(Signals, EndAHostThatWaitsForALine)
 {
     HostTerminal terminal(session);
-    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    ASSERT_TRUE(terminal.awaitPrompt());
     kill(terminal.process(), GetParam());
     EXPECT_EQ(terminal.waitForEnd(), 128 + GetParam()) << terminal.screen();
 }
@@ -32,22 +32,22 @@ TEST_P(Signals, KeepWhatWasTypedAndStored)
 {
     {
         HostTerminal terminal(session);
-        ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+        ASSERT_TRUE(terminal.awaitPrompt());
         terminal.type("REGISTRY SET Software\\Mine name kept\r");
-        ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+        ASSERT_TRUE(terminal.awaitPrompt());
         terminal.type("LOAD " + fixtureModule("Good.zmb") + "\r");
         ASSERT_TRUE(terminal.shows("is loaded.")) << terminal.screen();
-        ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+        ASSERT_TRUE(terminal.awaitPrompt());
         kill(terminal.process(), GetParam());
         EXPECT_EQ(terminal.waitForEnd(), 128 + GetParam());
         EXPECT_THAT(terminal.screen(), HasSubstr("Good.zmb: message 2"));
     }
     HostTerminal next(session);
-    ASSERT_TRUE(next.shows("Command: ")) << next.screen();
+    ASSERT_TRUE(next.awaitPrompt());
     next.type("\x1b[A"); // the up arrow
     EXPECT_TRUE(next.shows("LOAD")) << next.screen();
     next.type(kControlC);
-    ASSERT_TRUE(next.shows("Command: ")) << next.screen();
+    ASSERT_TRUE(next.awaitPrompt());
     next.type("REGISTRY GET Software\\Mine name\r");
     EXPECT_TRUE(next.shows("kept")) << next.screen();
 }
@@ -55,8 +55,8 @@ TEST_P(Signals, KeepWhatWasTypedAndStored)
 TEST_P(Signals, EndAHostWhoseLispRunsAway)
 {
     HostTerminal terminal(session);
-    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
-    terminal.type("(progn (princ \"be\") (princ \"gun\") (loop))\r");
+    ASSERT_TRUE(terminal.awaitPrompt());
+    terminal.type(kRunaway + "\r");
     ASSERT_TRUE(terminal.shows("begun")) << terminal.screen();
     kill(terminal.process(), GetParam());
     EXPECT_EQ(terminal.waitForEnd(), 128 + GetParam());
@@ -77,7 +77,7 @@ TEST_P(Signals, EndAHostWhoseSuiteRunsAway)
 
 TEST_P(Signals, KeepTheRestOfABatchFromRunning)
 {
-    HostTerminal terminal(session, {"-c", "(progn (princ \"be\") (princ \"gun\") (loop))", "-c", "VERSION"});
+    HostTerminal terminal(session, {"-c", kRunaway, "-c", "VERSION"});
     ASSERT_TRUE(terminal.shows("begun")) << terminal.screen();
     kill(terminal.process(), GetParam());
     EXPECT_EQ(terminal.waitForEnd(), 128 + GetParam());
@@ -91,7 +91,7 @@ TEST(SignalsOnce, BothAtOnceAreOne)
 {
     const HostSession session;
     HostTerminal terminal(session);
-    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    ASSERT_TRUE(terminal.awaitPrompt());
     for (const int signal : {SIGTERM, SIGHUP, SIGTERM, SIGHUP})
         kill(terminal.process(), signal);
     EXPECT_THAT(terminal.waitForEnd(), testing::AnyOf(kEndedBySigterm, kEndedBySighup));
@@ -103,7 +103,7 @@ TEST(SignalsOnce, AreLeftAloneWhereTheyAreToBeIgnored)
     HostSession session;
     session.startBy("trap '' HUP; exec \"$0\" \"$@\"");
     HostTerminal terminal(session);
-    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    ASSERT_TRUE(terminal.awaitPrompt());
     kill(terminal.process(), SIGHUP);
     terminal.type("(+ 30 12)\r");
     EXPECT_TRUE(terminal.shows("\n42")) << terminal.screen();

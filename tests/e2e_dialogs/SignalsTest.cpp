@@ -115,21 +115,21 @@ TEST_F(DialogSignals, LetAHostReadOnFromAPipeAfterCtrlC)
 TEST_F(DialogSignals, StopLispAndClearTheLineAfterADialogToo)
 {
     HostTerminal terminal(mSession);
-    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    ASSERT_TRUE(terminal.awaitPrompt());
     terminal.type("MODRIG\r");
     mDialog = mScreen.waitForWindow(kDialog);
     ASSERT_FALSE(mDialog.empty()) << terminal.screen();
     ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
     mScreen.key("Escape");
-    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
-    terminal.type("(progn (princ \"be\") (princ \"gun\") (loop))\r");
+    ASSERT_TRUE(terminal.awaitPrompt());
+    terminal.type(kRunaway + "\r");
     ASSERT_TRUE(terminal.shows("begun")) << terminal.screen();
     terminal.type(kControlC);
-    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    ASSERT_TRUE(terminal.awaitPrompt());
     terminal.type("rubbish");
     ASSERT_TRUE(terminal.shows("rubbish")) << terminal.screen();
     terminal.type(kControlC);
-    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    ASSERT_TRUE(terminal.awaitPrompt());
     terminal.type("(+ 30 12)\r");
     EXPECT_TRUE(terminal.shows("\n42")) << terminal.screen();
     kill(terminal.process(), SIGTERM);
@@ -162,10 +162,10 @@ TEST_F(DialogSignals, EndAHostAfterAMessageBoxOfItsStart)
     HostTerminal terminal(mSession);
     ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty()) << terminal.screen();
     mScreen.key("Return");
-    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    ASSERT_TRUE(terminal.awaitPrompt());
     terminal.type("(loop)\r");
     terminal.type(kControlC);
-    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    ASSERT_TRUE(terminal.awaitPrompt());
     kill(terminal.process(), SIGTERM);
     EXPECT_EQ(terminal.waitForEnd(), 128 + SIGTERM);
 }
