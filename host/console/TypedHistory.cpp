@@ -11,6 +11,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include "host/files/PartFile.h"
 #include "host/platform/Descriptor.h"
 #include "host/platform/OrdinaryFile.h"
 #include "host/text/Credentials.h"
@@ -117,18 +118,6 @@ Descriptor openAlone(const std::filesystem::path& path)
     }
 }
 
-bool writeAll(int file, std::string_view bytes)
-{
-    while (!bytes.empty())
-    {
-        const ssize_t count = write(file, bytes.data(), bytes.size());
-        if (count < 0 && errno != EINTR)
-            return false;
-        bytes.remove_prefix(static_cast<std::size_t>(std::max<ssize_t>(count, 0)));
-    }
-    return true;
-}
-
 // What goes before a line that is added: a session that was killed may have left half of one.
 std::string beginning(int file)
 {
@@ -152,11 +141,9 @@ void shorten(const std::filesystem::path& path)
     std::string kept = std::string(kFormat) + "\n";
     for (std::size_t index = lines.size() - kMostHistoryLines; index < lines.size(); ++index)
         kept.append(lines[index]).append("\n");
-    std::string name = path.string() + ".XXXXXX";
-    Descriptor file(mkostemp(name.data(), O_CLOEXEC));
-    const bool written = file && writeAll(file.number(), kept) && file.close();
-    if (!written || rename(name.c_str(), path.c_str()) != 0)
-        unlink(name.c_str()); // the long one does as well
+    PartFile file(path.parent_path());
+    if (file.made() && file.write(kept))
+        static_cast<void>(file.moveTo(path)); // the long one does as well
 }
 } // namespace
 
@@ -195,8 +182,7 @@ Result<> TypedHistory::add(const std::wstring& line)
         return giveUp(L"cannot be written", toWide(std::strerror(errno)));
     if (!isOrdinary(file.number()))
         return giveUp(L"is not used", L"it is not an ordinary file");
-    const bool written =
-        writeAll(file.number(), beginning(file.number()) + encoded(kept) + "\n") && file.close();
+    const bool written = file.write(beginning(file.number()) + encoded(kept) + "\n") && file.close();
     return written ? Result<>() : giveUp(L"cannot be written", toWide(std::strerror(errno)));
 }
 } // namespace tessel

@@ -66,14 +66,7 @@ void PartFile::make(const std::filesystem::path& folder)
 
 bool PartFile::write(std::string_view bytes)
 {
-    while (!bytes.empty())
-    {
-        const ssize_t count = ::write(mFile.number(), bytes.data(), bytes.size());
-        if (count < 0 && errno != EINTR)
-            return false;
-        bytes.remove_prefix(count > 0 ? static_cast<std::size_t>(count) : 0);
-    }
-    return true;
+    return mFile.write(bytes);
 }
 
 bool PartFile::letOthersRead()

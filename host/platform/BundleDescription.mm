@@ -79,7 +79,7 @@ Result<> checkDescription(const std::string& folder)
     {
         const std::string path = std::filesystem::path(folder) / place;
         const RegularFile file(path);
-        if (file.opened().code() == RegularFile::kMissing)
+        if (file.opened().code() == kNothingThere)
             continue;
         const auto checked = checkFile(file);
         return checked ? checked

@@ -1,6 +1,8 @@
 // A descriptor of the system that is closed with its scope.
 #pragma once
 
+#include <cerrno>
+#include <string_view>
 #include <utility>
 
 #include <unistd.h>
@@ -24,6 +26,19 @@ public:
 
     explicit operator bool() const { return mNumber >= 0; }
     int number() const { return mNumber; }
+
+    // All of it; false with the reason in `errno`.
+    bool write(std::string_view bytes) const
+    {
+        while (!bytes.empty())
+        {
+            const ssize_t count = ::write(mNumber, bytes.data(), bytes.size());
+            if (count < 0 && errno != EINTR)
+                return false;
+            bytes.remove_prefix(count > 0 ? static_cast<std::size_t>(count) : 0);
+        }
+        return true;
+    }
 
     // False when the system tells only now that something could not be written.
     bool close() { return mNumber < 0 || ::close(std::exchange(mNumber, -1)) == 0; }

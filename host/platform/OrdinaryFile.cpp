@@ -25,32 +25,33 @@ Failure tooLarge(std::uintmax_t mostBytes)
 {
     return {L"it is larger than " + std::to_wstring(mostBytes) + L" bytes"};
 }
+} // namespace
 
-Result<> checkKind(int file, std::uintmax_t mostBytes)
+Result<Descriptor> openOrdinaryFile(const std::filesystem::path& path, struct stat& status)
 {
-    struct stat status = {};
-    if (fstat(file, &status) != 0)
+    // Opening a pipe that nobody writes to would wait for a writer.
+    Descriptor file(open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOCTTY));
+    if (!file || fstat(file.number(), &status) != 0)
         return lastError();
     if (S_ISDIR(status.st_mode))
         return Failure{L"it is a folder, not a file"};
     if (!S_ISREG(status.st_mode))
         return Failure{L"it is not an ordinary file"};
-    return static_cast<std::uintmax_t>(status.st_size) > mostBytes ? tooLarge(mostBytes) : Result<>();
+    return file;
 }
-} // namespace
 
 Result<std::string> readOrdinaryFile(const std::filesystem::path& path, std::uintmax_t mostBytes)
 {
-    // Opening a pipe that nobody writes to would wait for a writer.
-    const Descriptor file(open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOCTTY));
+    struct stat status = {};
+    const auto file = openOrdinaryFile(path, status);
     if (!file)
-        return lastError();
-    if (const auto checked = checkKind(file.number(), mostBytes); !checked)
-        return checked.failure();
+        return file.failure();
+    if (static_cast<std::uintmax_t>(status.st_size) > mostBytes)
+        return tooLarge(mostBytes);
     std::string content;
     std::array<char, 65536> piece;
     ssize_t count = 0;
-    while ((count = read(file.number(), piece.data(), piece.size())) > 0)
+    while ((count = read(file->number(), piece.data(), piece.size())) > 0)
     {
         content.append(piece.data(), static_cast<std::size_t>(count));
         if (content.size() > mostBytes) // it grows while it is read

@@ -5,6 +5,9 @@
 #include <filesystem>
 #include <string>
 
+#include <sys/stat.h>
+
+#include "host/platform/Descriptor.h"
 #include "host/text/Result.h"
 
 namespace tessel
@@ -12,7 +15,10 @@ namespace tessel
 // The code of a failure when nothing stands at the path at all.
 inline constexpr int kNothingThere = 2;
 
-// All bytes of an ordinary file of at most that size. Neither a pipe nor a device is waited for: they are
-// refused, as folders are. Why is the end of a sentence.
+// An ordinary file, open for reading, and what the system says of it. Neither a pipe nor a device is waited
+// for: they are refused, as folders are. Why is the end of a sentence, here and below.
+Result<Descriptor> openOrdinaryFile(const std::filesystem::path& path, struct stat& status);
+
+// All bytes of an ordinary file of at most that size.
 Result<std::string> readOrdinaryFile(const std::filesystem::path& path, std::uintmax_t mostBytes);
 } // namespace tessel

@@ -10,7 +10,7 @@
 
 #include <sys/types.h>
 
-#include "host/text/Result.h"
+#include "host/platform/OrdinaryFile.h"
 
 namespace tessel
 {
@@ -28,14 +28,8 @@ class RegularFile
 {
 public:
     explicit RegularFile(const std::string& path);
-    ~RegularFile();
-    RegularFile(const RegularFile&) = delete;
-    RegularFile& operator=(const RegularFile&) = delete;
 
-    // The code of a failure when nothing stands at the path at all.
-    static constexpr int kMissing = 2;
-
-    // Whether the file is open; why not is the end of a sentence.
+    // Whether the file is open; why not is the end of a sentence. kNothingThere is a code of it.
     const Result<>& opened() const { return mOpened; }
 
     const FileIdentity& identity() const { return mIdentity; }
@@ -44,7 +38,7 @@ public:
     bool keepsItsSize() const;
 
     // While the file is open.
-    int descriptor() const { return mDescriptor; }
+    int descriptor() const { return mFile.number(); }
 
     // Fills the buffer from an offset; false when the file does not hold that many bytes there.
     bool read(std::uint64_t offset, void* buffer, std::size_t size) const;
@@ -53,10 +47,9 @@ private:
     // Everything that tells whether a library can be mapped usually stands here, so that one read serves.
     static constexpr std::size_t kHeadSize = 1024;
 
-    void refuse(Failure failure);
     void readHead() const;
 
-    int mDescriptor = -1;
+    Descriptor mFile{-1};
     Result<> mOpened;
     FileIdentity mIdentity;
     std::uint64_t mSize = 0;

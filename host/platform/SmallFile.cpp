@@ -4,9 +4,9 @@
 #include <cstdio>
 
 #include <fcntl.h>
-#include <sys/stat.h>
 #include <unistd.h>
 
+#include "host/platform/OrdinaryFile.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -14,33 +14,11 @@ namespace tessel
 namespace
 {
 constexpr mode_t kOwnersOnly = 0600;
-constexpr off_t kLargest = off_t{4} << 20;
+constexpr std::uintmax_t kLargest = std::uintmax_t{4} << 20;
 
-class Descriptor
+Failure failed(const std::filesystem::path& file, const wchar_t* what, const std::wstring& why)
 {
-public:
-    Descriptor(const std::filesystem::path& file, int flags)
-        : mNumber(open(file.c_str(), flags | O_CLOEXEC | O_NOFOLLOW | O_NONBLOCK, kOwnersOnly))
-    {
-    }
-    ~Descriptor()
-    {
-        if (mNumber >= 0)
-            close(mNumber);
-    }
-    Descriptor(const Descriptor&) = delete;
-    Descriptor& operator=(const Descriptor&) = delete;
-
-    int number() const { return mNumber; }
-
-private:
-    int mNumber;
-};
-
-Failure failed(const std::filesystem::path& file, const wchar_t* what, int error)
-{
-    return {L"The file " + toWide(file.string()) + what + toWide(std::generic_category().message(error)) +
-            L"."};
+    return {L"The file " + toWide(file.string()) + what + why + L"."};
 }
 
 // Locks of this kind belong to the process: a child that an application has left behind does not hold them.
@@ -55,30 +33,12 @@ bool lock(int descriptor, int command)
     while (status != 0 && errno == EINTR);
     return status == 0;
 }
-
-bool writeAll(int descriptor, std::string_view content)
-{
-    while (!content.empty())
-    {
-        const ssize_t count = write(descriptor, content.data(), content.size());
-        if (count < 0 && errno != EINTR)
-            return false;
-        content.remove_prefix(count < 0 ? 0 : static_cast<std::size_t>(count));
-    }
-    return fsync(descriptor) == 0;
-}
 } // namespace
 
 FileLock::FileLock(const std::filesystem::path& file)
-    : mDescriptor(open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, kOwnersOnly))
+    : mFile(open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, kOwnersOnly)),
+      mHeld(mFile && lock(mFile.number(), F_SETLKW))
 {
-    mHeld = mDescriptor >= 0 && lock(mDescriptor, F_SETLKW);
-}
-
-FileLock::~FileLock()
-{
-    if (mDescriptor >= 0)
-        close(mDescriptor);
 }
 
 bool lockNow(int descriptor)
@@ -88,21 +48,12 @@ bool lockNow(int descriptor)
 
 Result<std::optional<std::string>> readSmallFile(const std::filesystem::path& file)
 {
-    constexpr wchar_t kNotRead[] = L" cannot be read: ";
-    const Descriptor descriptor(file, O_RDONLY);
-    if (descriptor.number() < 0 && errno == ENOENT)
+    auto content = readOrdinaryFile(file, kLargest);
+    if (content)
+        return std::optional(*std::move(content));
+    if (content.code() == kNothingThere)
         return std::optional<std::string>();
-    struct stat status = {};
-    if (descriptor.number() < 0 || fstat(descriptor.number(), &status) != 0)
-        return failed(file, kNotRead, errno);
-    if (!S_ISREG(status.st_mode) || status.st_size > kLargest)
-        return failed(file, kNotRead, EINVAL);
-    std::string content(static_cast<std::size_t>(status.st_size), '\0');
-    const ssize_t count = pread(descriptor.number(), content.data(), content.size(), 0);
-    if (count < 0)
-        return failed(file, kNotRead, errno);
-    content.resize(static_cast<std::size_t>(count));
-    return std::optional(content);
+    return failed(file, L" cannot be read: ", content.sentence());
 }
 
 std::string escaped(std::string_view text)
@@ -146,17 +97,14 @@ std::vector<std::string_view> linesOf(std::string_view text)
 
 Result<> replaceSmallFile(const std::filesystem::path& file, std::string_view content)
 {
-    constexpr wchar_t kNotWritten[] = L" cannot be written: ";
     const std::filesystem::path next = file.string() + ".new";
     unlink(next.c_str()); // of a session that came to its end in the middle of this
-    const Descriptor descriptor(next, O_WRONLY | O_CREAT | O_EXCL);
-    if (descriptor.number() < 0 || !writeAll(descriptor.number(), content) ||
-        std::rename(next.c_str(), file.c_str()) != 0)
-    {
-        const int error = errno;
-        unlink(next.c_str());
-        return failed(file, kNotWritten, error);
-    }
-    return {};
+    const Descriptor descriptor(open(next.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, kOwnersOnly));
+    if (descriptor && descriptor.write(content) && fsync(descriptor.number()) == 0 &&
+        std::rename(next.c_str(), file.c_str()) == 0)
+        return {};
+    const std::wstring why = toWide(std::generic_category().message(errno));
+    unlink(next.c_str());
+    return failed(file, L" cannot be written: ", why);
 }
 } // namespace tessel

@@ -7,6 +7,7 @@
 #include <string_view>
 #include <vector>
 
+#include "host/platform/Descriptor.h"
 #include "host/text/Result.h"
 
 namespace tessel
@@ -18,15 +19,11 @@ class FileLock
 public:
     // Makes the file if need be.
     explicit FileLock(const std::filesystem::path& file);
-    ~FileLock();
-    FileLock(const FileLock&) = delete;
-    FileLock& operator=(const FileLock&) = delete;
-
     bool held() const { return mHeld; }
 
 private:
-    int mDescriptor;
-    bool mHeld = false;
+    Descriptor mFile;
+    bool mHeld;
 };
 
 // Locks an open file as a whole for this process: at once or not at all.

@@ -11,6 +11,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include "host/platform/Descriptor.h"
 #include "host/registry/Schema.h"
 #include "host/registry/Soundness.h"
 #include "host/text/Unicode.h"
@@ -38,42 +39,26 @@ std::filesystem::path beside(const std::filesystem::path& file, const char* endi
     return file.string() + ending;
 }
 
-Result<> writeAll(int file, std::string_view bytes)
-{
-    while (!bytes.empty())
-    {
-        const ssize_t count = write(file, bytes.data(), bytes.size());
-        if (count < 0 && errno != EINTR)
-            return systemFailure();
-        bytes.remove_prefix(count < 0 ? 0 : static_cast<std::size_t>(count));
-    }
-    return fsync(file) == 0 ? Result<>() : systemFailure();
-}
-
 // A new file beside the other, wholly on the disk. Answers its path.
 Result<std::string> writeBeside(const std::filesystem::path& file, std::string_view bytes)
 {
     std::string name = beside(file, ".XXXXXX").string();
-    const int descriptor = mkostemp(name.data(), O_CLOEXEC);
-    if (descriptor < 0)
+    Descriptor made(mkostemp(name.data(), O_CLOEXEC));
+    if (!made)
         return systemFailure();
-    auto written = writeAll(descriptor, bytes);
-    if (close(descriptor) != 0 && written)
-        written = systemFailure();
-    if (written)
+    if (made.write(bytes) && fsync(made.number()) == 0 && made.close())
         return name;
+    const Failure failure = systemFailure();
     unlink(name.c_str());
-    return written.failure();
+    return failure;
 }
 
 // That a name leads to a file is on the disk only when its folder is. Not every file system can be asked.
 void storeFolderOf(const std::filesystem::path& file)
 {
-    const int folder = open(file.parent_path().c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
-    if (folder < 0)
-        return;
-    static_cast<void>(fsync(folder));
-    close(folder);
+    const Descriptor folder(open(file.parent_path().c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
+    if (folder)
+        static_cast<void>(fsync(folder.number()));
 }
 
 Result<> replace(const std::filesystem::path& file, std::string_view bytes)

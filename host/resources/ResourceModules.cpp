@@ -82,7 +82,7 @@ Result<HMODULE> ResourceModules::open(const wchar_t* name)
     for (const std::wstring& place : places)
     {
         const RegularFile file(toUtf8(place));
-        if (file.opened().code() == RegularFile::kMissing)
+        if (file.opened().code() == kNothingThere)
             continue;
         const auto module = openFile(file);
         return module ? module : notOpened(place, module.sentence());

@@ -17,7 +17,7 @@ namespace
 constexpr char kBanner[] =
     "Tessel R21, reference host for Modrig. Type HELP for the list of commands, QUIT to leave.\n";
 constexpr unsigned kEach = 12; // of these calls each fails; of those after them some do, or all in a deep run
-constexpr unsigned kStep = 7;
+constexpr unsigned kStep = 17;
 
 // Each of the locks that is refused for ever takes the store some seconds of trying.
 constexpr const char* kWaitedFor = "fcntl";

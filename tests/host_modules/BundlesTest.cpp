@@ -143,10 +143,10 @@ TEST_F(Bundles, AreToldWhenTheDescriptionIsNoFileWithContent)
     EXPECT_EQ(refusal(), unusable("it is a folder, not a file"));
     std::filesystem::remove(description());
     ASSERT_EQ(mkfifo(description().c_str(), 0600), 0);
-    EXPECT_EQ(refusal(), unusable("it is not a regular file"));
+    EXPECT_EQ(refusal(), unusable("it is not an ordinary file"));
     std::filesystem::remove(description());
     std::filesystem::create_symlink("/dev/zero", description());
-    EXPECT_EQ(refusal(), unusable("it is not a regular file"));
+    EXPECT_EQ(refusal(), unusable("it is not an ordinary file"));
     std::filesystem::remove(description());
     EXPECT_EQ(refusal(), "the bundle holds no program for this system.\n");
 }

@@ -133,7 +133,7 @@ TEST_F(Loading, SaysInWordsWhatStandsInTheFilesPlace)
         {"folder.zmb", "it is a folder, not a file"},
         {"hollow.bundle", "the bundle holds no program for this system"},
         {"file.bundle", "the bundle holds no program for this system"},
-        {"pipe.zmb", "it is not a regular file"},
+        {"pipe.zmb", "it is not an ordinary file"},
         {"empty.zmb", "the file is empty"},
         {"text.zmb", "it is not a shared library"},
         {"program.zmb", "it is a program, not a shared library"}};
