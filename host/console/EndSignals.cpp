@@ -1,5 +1,9 @@
 #include "host/console/EndSignals.h"
 
+#include <ctime>
+
+#include "host/platform/LastWords.h"
+
 namespace tessel
 {
 namespace
@@ -7,12 +11,36 @@ namespace
 // A signal handler can be given nothing.
 LineRunner* theRunner = nullptr;
 volatile std::sig_atomic_t theSignal = 0;
+constexpr time_t kPatienceSeconds = 1; // and up to one more
 
-// Both may come together, and a terminal that closes may send its own twice: none of them means more hurry.
+timespec theFirstTime;
+
+// Both may come together, and a terminal that closes may send its own twice: that means no more hurry. Who
+// asks again some time later means it, where the code of an application does not come back.
+bool isAskedAgain()
+{
+    timespec now = {};
+    clock_gettime(CLOCK_MONOTONIC, &now);
+    return now.tv_sec - theFirstTime.tv_sec > kPatienceSeconds;
+}
+
+void endAtOnce(int signal)
+{
+    struct sigaction usual = {};
+    usual.sa_handler = SIG_DFL;
+    sigaction(signal, &usual, nullptr);
+    raise(signal);
+}
+
 void onSignal(int signal)
 {
     if (theSignal == 0)
+    {
+        clock_gettime(CLOCK_MONOTONIC, &theFirstTime);
         theSignal = signal;
+    }
+    else if (isAskedAgain() && sayLastWords(signal))
+        endAtOnce(signal);
     theRunner->requestEnd();
 }
 } // namespace

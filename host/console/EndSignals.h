@@ -9,7 +9,8 @@
 namespace tessel
 {
 // From its making to its end these signals end the runner's session in good order; after one has, they are
-// ignored for the rest of the process. One at a time.
+// ignored for the rest of the process. One that comes some seconds after the first ends the process at once
+// if an application is at work, which is then named. One object at a time.
 class EndSignals
 {
 public:

@@ -91,6 +91,11 @@ void onExit()
 }
 } // namespace
 
+bool sayLastWords(int signal)
+{
+    return speak(signal);
+}
+
 LastWords::LastWords()
 {
     stack_t stack = {};

@@ -26,4 +26,8 @@ private:
     std::array<struct sigaction, kSignals.size()> mPrevious = {};
     stack_t mPreviousStack = {};
 };
+
+// Says the line for an end by that signal. False, and nothing is said, when no application is at work. Safe
+// in a signal handler.
+bool sayLastWords(int signal);
 } // namespace tessel

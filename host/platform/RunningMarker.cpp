@@ -273,6 +273,8 @@ std::string_view wordsForEnding(int ending) noexcept
                                        {SIGTRAP, "breakpoint (SIGTRAP)"},
                                        {SIGSYS, "unknown call of the system (SIGSYS)"},
                                        {SIGQUIT, "quit from outside (SIGQUIT)"},
+                                       {SIGTERM, "it did not come back (SIGTERM)"},
+                                       {SIGHUP, "it did not come back (SIGHUP)"},
                                        {SIGXCPU, "too much time used (SIGXCPU)"}};
     for (const Words& words : kWords)
         if (words.ending == ending)
