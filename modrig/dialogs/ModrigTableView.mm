@@ -43,6 +43,7 @@ ModrigUtils::RowFacts factsOf(ModrigFilePath* row)
     facts.unloadable = [row unloadable];
     facts.isCompiledModule = ModrigUtils::FileTypeOfPath([row path]) == kCompiledModule;
     facts.hasFailed = ModrigUtils::LastLoadFailed([row path]);
+    facts.isKeptOut = !ModrigUtils::WhyKeptOut([row path]).IsEmpty();
     return facts;
 }
 
@@ -155,6 +156,7 @@ NSString* ModrigUtils::HelpKey()
         else if (!ModrigUtils::WhyKeptOut(path).IsEmpty())
             ModrigUtils::LetIn(path);
     }
+    [self setNeedsDisplay:YES]; // they look it
 }
 
 - (void)perform:(TableAction)action on:(NSIndexSet*)rows

@@ -342,8 +342,10 @@ TEST_F(TableKeys, OfTheMouseKeepApplicationsOutAndLetThemIn)
     choose(menu, @"Keep Out at Starts");
     EXPECT_THAT(service.keptOut, ElementsAre(file("a.lsp"), file("b.lsp")));
     EXPECT_EQ(file("a.lsp") + L"\nThis application is kept out.", wide([(id)historyTable() tipForRow:0]));
+    EXPECT_EQ([NSColor disabledControlTextColor], [(id)historyTable() textColorOfRow:0]);
     service.reasons.erase(file("a.lsp"));
     EXPECT_EQ(file("a.lsp"), wide([(id)historyTable() tipForRow:0]));
+    EXPECT_EQ([NSColor controlTextColor], [(id)historyTable() textColorOfRow:0]);
     choose(menuOn(historyTable(), 1), @"Let In at Starts");
     EXPECT_THAT(service.letInAgain, ElementsAre(file("b.lsp")));
     EXPECT_THAT(rowsOf(historyList()), ElementsAre(file("a.lsp"), file("b.lsp")));

@@ -24,6 +24,8 @@ RowState StateOfListed(const RowFacts& facts)
 {
     if (!facts.exists)
         return RowState::kMissing;
+    if (facts.isKeptOut)
+        return RowState::kKeptOut;
     return facts.hasFailed ? RowState::kFailed : RowState::kUsable;
 }
 } // namespace

@@ -13,6 +13,7 @@ enum class RowState
     kUsable,
     kMissing,      // there is no such file
     kFailed,       // it was not loaded when that was last tried
+    kKeptOut,      // the host does not load it by itself
     kLocked,       // a module that may not be unloaded
     kNeverUnloaded // an application of a kind that cannot be unloaded
 };
@@ -23,12 +24,14 @@ struct RowFacts
     bool unloadable = false;
     bool isCompiledModule = false;
     bool hasFailed = false;
+    bool isKeptOut = false;
 };
 
 // All but usable rows are shown in grey.
 [[nodiscard]] RowState StateOf(TableKind kind, const RowFacts& facts);
 
-// The key of the text that says why a row is grey; null for one that is not.
+// The key of the text that says why a row is grey; null for one that is not, and where the host has the
+// words.
 [[nodiscard]] const char* ReasonKey(RowState state);
 
 // The text itself when it fits, or as much of its beginning as fits with an ellipsis after it. `fits` answers

@@ -24,6 +24,18 @@ TEST(RowLook, IsGreyForAnApplicationThatFailedToLoad)
               StateOf(TableKind::kLoadedApplications, {.unloadable = true, .hasFailed = true}));
 }
 
+TEST(RowLook, IsGreyForAnApplicationThatTheHostKeepsOut)
+{
+    for (const TableKind kind : {TableKind::kHistory, TableKind::kStartupSuite})
+    {
+        EXPECT_EQ(RowState::kKeptOut, StateOf(kind, {.exists = true, .hasFailed = true, .isKeptOut = true}));
+        EXPECT_EQ(RowState::kMissing, StateOf(kind, {.exists = false, .isKeptOut = true}));
+    }
+    EXPECT_EQ(RowState::kUsable,
+              StateOf(TableKind::kLoadedApplications, {.unloadable = true, .isKeptOut = true}));
+    EXPECT_EQ(nullptr, ReasonKey(RowState::kKeptOut)) << "the host's own words";
+}
+
 TEST(RowLook, IsGreyForALoadedApplicationThatCannotBeUnloaded)
 {
     constexpr TableKind kLoaded = TableKind::kLoadedApplications;
