@@ -3,6 +3,7 @@
 #include <cerrno>
 #include <csignal>
 #include <system_error>
+#include <utility>
 
 #include <fcntl.h>
 #include <unistd.h>
@@ -28,8 +29,7 @@ void leaveSignalsToOthers()
 }
 } // namespace
 
-LispInterrupter::LispInterrupter(cl_object interrupted)
-    : mInterrupted(interrupted), mLisp(ecl_process_env()->own_process)
+LispInterrupter::LispInterrupter(Ways ways) : mWays(std::move(ways))
 {
     int ends[2];
     if (pipe(ends) != 0)
@@ -99,10 +99,10 @@ std::optional<LispInterrupter::Run> LispInterrupter::receive() const
 void LispInterrupter::watch()
 {
     leaveSignalsToOthers();
-    ecl_import_current_thread(ECL_NIL, ECL_NIL);
+    mWays.begin();
     while (const auto run = receive())
         send(*run);
-    ecl_release_current_thread();
+    mWays.end();
 }
 
 bool LispInterrupter::isOnItsWay(Run run) const
@@ -118,6 +118,6 @@ void LispInterrupter::send(Run run)
         return;
     mSent = run;
     mRequested = run;
-    mp_interrupt_process(mLisp, mInterrupted);
+    mWays.send();
 }
 } // namespace tessel

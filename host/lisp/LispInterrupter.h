@@ -1,26 +1,33 @@
 // Stops the Lisp that is running, from a signal handler or from another thread.
 //
-// Neither may call Lisp. They leave a note in a pipe; a small thread reads it and asks ECL to interrupt the
-// thread of Lisp, which then decides whether the note still concerns what it is doing. For the files that
-// know ECL.
+// Neither may call Lisp. They leave a note in a pipe; a small thread reads it and has the thread of Lisp
+// interrupted, which then decides whether the note still concerns what it is doing. When to interrupt is
+// decided here and how is not, so that this can be tried without Lisp.
 #pragma once
 
 #include <atomic>
 #include <chrono>
+#include <functional>
 #include <mutex>
 #include <optional>
 #include <thread>
-
-#include <ecl/ecl.h>
 
 namespace tessel
 {
 class LispInterrupter
 {
 public:
-    // Made on the thread of Lisp; `interrupted` is the Lisp function that runs there when it is interrupted,
-    // and is to ask `takeRequest`. Throws std::system_error when the system has no pipe or thread to give.
-    explicit LispInterrupter(cl_object interrupted);
+    // What the small thread calls.
+    struct Ways
+    {
+        std::function<void()> begin; // once, before it sends any
+        // Interrupts the thread of Lisp, which is to ask `takeRequest` then.
+        std::function<void()> send;
+        std::function<void()> end; // after the last
+    };
+
+    // Throws std::system_error when the system has no pipe or thread to give.
+    explicit LispInterrupter(Ways ways);
     ~LispInterrupter();
     LispInterrupter(const LispInterrupter&) = delete;
     LispInterrupter& operator=(const LispInterrupter&) = delete;
@@ -53,8 +60,7 @@ private:
     void send(Run run);
     std::optional<Run> receive() const;
 
-    cl_object mInterrupted; // the garbage collector knows both of these by other ways
-    cl_object mLisp;
+    Ways mWays;
     int mReadEnd = -1;
     int mWriteEnd = -1;
     int mDepth = 0;

@@ -108,6 +108,20 @@ Result<LispFunctions> boot()
                          functionNamed("INVOKE"),        functionNamed("COMPILE-TEXT"),
                          functionNamed("INTERRUPTED"),   functionNamed("MAKE-USER-SYMBOL")};
 }
+
+// The garbage collector knows the thread and the function by other ways.
+LispInterrupter::Ways waysToInterrupt()
+{
+    cl_object const thread = ecl_process_env()->own_process;
+    cl_object const interrupted = lispFunctions().interrupted;
+    return {.begin = [] { ecl_import_current_thread(ECL_NIL, ECL_NIL); },
+            .send = [=] { mp_interrupt_process(thread, interrupted); },
+            .end =
+                []
+            {
+                ecl_release_current_thread();
+            }};
+}
 } // namespace
 
 const Result<LispFunctions>& startLisp()
@@ -123,7 +137,7 @@ const LispFunctions& lispFunctions()
 
 LispInterrupter& lispInterrupter()
 {
-    static LispInterrupter interrupter(lispFunctions().interrupted);
+    static LispInterrupter interrupter(waysToInterrupt());
     return interrupter;
 }
 } // namespace tessel
