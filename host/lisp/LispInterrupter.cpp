@@ -79,10 +79,11 @@ void LispInterrupter::interrupt() noexcept
 
 bool LispInterrupter::takeRequest() noexcept
 {
+    mTaken = std::chrono::steady_clock::now(); // before: without a request and without this the watcher would
+                                               // send another
     if (mRequested.exchange(0) != mRun.load())
         return false;
     mTakenRun = mRun.load();
-    mTaken = std::chrono::steady_clock::now();
     return true;
 }
 
