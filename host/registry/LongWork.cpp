@@ -31,14 +31,15 @@ void LongWork::tell()
 
 void LongWork::end()
 {
-    mValues = 0;
-    mInterrupted = false;
+    mValues = 0; // before: who finds the next command's number is not to find the values of this one
+    ++mCommand;
     mLast = {};
 }
 
 void LongWork::interrupt() noexcept
 {
+    const unsigned command = mCommand;
     if (mValues > kWorthInterrupting)
-        mInterrupted = true;
+        mInterrupted = command;
 }
 } // namespace tessel

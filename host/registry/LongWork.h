@@ -21,7 +21,7 @@ public:
     // One value more.
     void count();
 
-    bool isInterrupted() const { return mInterrupted; }
+    bool isInterrupted() const { return mInterrupted == mCommand; }
 
     // The command is over: what comes next is counted from the beginning and is not interrupted.
     void end();
@@ -37,7 +37,8 @@ private:
 
     Say mSay;
     std::atomic<unsigned> mValues = 0;
-    std::atomic<bool> mInterrupted = false;
+    std::atomic<unsigned> mCommand = 1;     // counts up
+    std::atomic<unsigned> mInterrupted = 0; // the last command that was
     Clock::time_point mLast;
     Clock::time_point mTold;
 };
