@@ -1,5 +1,6 @@
 #include "host/console/EndSignals.h"
 
+#include <atomic>
 #include <ctime>
 
 #include "host/platform/LastWords.h"
@@ -10,10 +11,12 @@ namespace
 {
 // A signal handler can be given nothing.
 LineRunner* theRunner = nullptr;
-volatile std::sig_atomic_t theSignal = 0;
+std::atomic<int> theSignal = 0; // several threads may take one each
+std::atomic<time_t> theFirstSecond = 0;
 constexpr time_t kPatienceSeconds = 1; // and up to one more
 
-timespec theFirstTime;
+static_assert(std::atomic<int>::is_always_lock_free && std::atomic<time_t>::is_always_lock_free,
+              "a signal handler must not wait");
 
 // Both may come together, and a terminal that closes may send its own twice: that means no more hurry. Who
 // asks again some time later means it, where the code of an application does not come back.
@@ -21,7 +24,9 @@ bool isAskedAgain()
 {
     timespec now = {};
     clock_gettime(CLOCK_MONOTONIC, &now);
-    return now.tv_sec - theFirstTime.tv_sec > kPatienceSeconds;
+    time_t first = 0;
+    return !theFirstSecond.compare_exchange_strong(first, now.tv_sec) &&
+           now.tv_sec - first > kPatienceSeconds;
 }
 
 void endAtOnce(int signal)
@@ -34,12 +39,9 @@ void endAtOnce(int signal)
 
 void onSignal(int signal)
 {
-    if (theSignal == 0)
-    {
-        clock_gettime(CLOCK_MONOTONIC, &theFirstTime);
-        theSignal = signal;
-    }
-    else if (isAskedAgain() && sayLastWords(signal))
+    int none = 0;
+    theSignal.compare_exchange_strong(none, signal);
+    if (isAskedAgain() && sayLastWords(signal))
         endAtOnce(signal);
     theRunner->requestEnd();
 }
@@ -49,6 +51,7 @@ EndSignals::EndSignals(LineRunner& runner)
 {
     theRunner = &runner;
     theSignal = 0;
+    theFirstSecond = 0;
     struct sigaction action = {};
     action.sa_handler = onSignal;
     sigemptyset(&action.sa_mask);
