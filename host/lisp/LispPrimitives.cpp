@@ -52,11 +52,19 @@ void runCatching(Work work) noexcept
     }
 }
 
-// Runs code of the host for Lisp. An interrupt waits meanwhile: it would jump over destructors. What the code
-// throws becomes an error of Lisp.
+// The host's text has one writer. What a thread that the user has started prints goes nowhere.
+bool isThreadOfLisp()
+{
+    return std::this_thread::get_id() == connection().thread;
+}
+
+// Runs code of the host for Lisp, which is not made for two threads at once. An interrupt waits meanwhile: it
+// would jump over destructors. What the code throws becomes an error of Lisp.
 template <typename Work>
 void callHost(Work work)
 {
+    if (!isThreadOfLisp())
+        FEerror("Files are loaded by Lisp's main thread only.", 0);
     const cl_env_ptr environment = ecl_process_env();
     ecl_disable_interrupts_env(environment);
     runCatching(work);
@@ -69,12 +77,6 @@ cl_object answer(cl_object value)
 {
     ecl_process_env()->nvalues = 1;
     return value;
-}
-
-// The host's text has one writer. What a thread that the user has started prints goes nowhere.
-bool isThreadOfLisp()
-{
-    return std::this_thread::get_id() == connection().thread;
 }
 
 cl_object writeText(cl_object text, cl_object start, cl_object end)

@@ -215,3 +215,15 @@ TEST_F(LispFiles, NeedANameOfASensibleKind)
     EXPECT_THAT(session.error("(load 5)"), HasSubstr("5"));
     EXPECT_EQ(session.value("(load (pathname " + quoted(write("app.lsp", "1")) + "))"), "T");
 }
+
+// The host's lists of what is being loaded have one writer.
+TEST_F(LispFiles, AreLoadedByTheMainThreadAlone)
+{
+    const auto path = write("seven.lsp", "(setq seven 7)");
+    EXPECT_EQ(session.value("(mp:process-join (mp:process-run-function 'other (lambda () "
+                            "(handler-case " +
+                            load(path) + " (error (problem) (princ-to-string problem))))))"),
+              "\"Files are loaded by Lisp's main thread only.\"");
+    EXPECT_THAT(session.documentNames(), IsEmpty());
+    EXPECT_EQ(session.value(load(path)), "T");
+}
