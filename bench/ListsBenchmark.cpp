@@ -1,14 +1,17 @@
-// The History in the registry, against the same registry calls made bare; looking an application up; memory.
+// The History in the registry, against the same registry calls made bare and against the same rows by the
+// store alone; looking an application up; memory.
 #include <benchmark/benchmark.h>
 #include <malloc.h>
 #include <wincompat/winreg.h>
 
 #include <cwchar>
+#include <filesystem>
 #include <memory>
 #include <set>
 #include <string>
 #include <vector>
 
+#include "bench/BareStore.h"
 #include "bench/Child.h"
 #include "bench/Ratios.h"
 #include "bench/Session.h"
@@ -126,11 +129,34 @@ std::vector<std::wstring> pathsUpTo(std::size_t count)
     return paths;
 }
 
+std::string utf8PathOf(std::size_t number)
+{
+    const std::wstring path = pathOf(number);
+    return {path.begin(), path.end()};
+}
+
+std::filesystem::path registryFile()
+{
+    return bench::workFolder() / "profile" / "registry.db";
+}
+
+std::filesystem::path bareFile(std::size_t count)
+{
+    return bench::workFolder() / ("bare" + std::to_string(count) + ".db");
+}
+
 // Whether the last of so many entries is stored.
 bool isStored(std::size_t count)
 {
     std::wstring data;
     return bareRead(historyKey(), entryName(count), data) && data == pathOf(count - 1);
+}
+
+bool storeAll(std::size_t count)
+{
+    ModrigUtils::WriteHistoryFilesToRegistry();
+    bench::endCommand();
+    return isStored(count);
 }
 
 // Makes a History of that size the stored one: each size has a profile of its own, so that it is written only
@@ -185,18 +211,54 @@ void addHistory(std::size_t count, int repetitions)
                 return gHistoryList.GetCount() == count;
             });
     measure("read" + of + ", bare calls", repetitions, prepare, [count] { return bareReadAll(count); });
-    measure("write" + of, repetitions, prepare,
-            [count]
-            {
-                ModrigUtils::WriteHistoryFilesToRegistry();
-                return isStored(count);
-            });
+    measure("write" + of, repetitions, prepare, [count] { return storeAll(count); });
     measure("write" + of + ", bare calls", repetitions, prepare,
             [paths]
             {
                 bareWriteAll(paths);
+                bench::endCommand();
                 return isStored(paths.size());
             });
+}
+
+void emptyTheHistory()
+{
+    bench::useProfile(L"EmptyHistory");
+    gHistoryList.RemoveAll();
+    ModrigUtils::WriteHistoryFilesToRegistry();
+    bench::endCommand();
+    fill(gHistoryList, kMany);
+}
+
+// What the store needs for the same rows, when nothing stands between them and it.
+void addStoreAlone()
+{
+    const std::string of = " " + std::to_string(kMany) + " of History";
+    measure(
+        "read" + of + ", store alone", kListRepetitions, [] { store(kMany); },
+        [] { return bench::readBare(registryFile(), kMany); });
+    const auto prepare = []
+    {
+        store(kMany);
+        static const bool made = bench::makeBare(registryFile(), bareFile(kMany)) &&
+                                 bench::writeBare(bareFile(kMany), kMany, false, utf8PathOf);
+        static_cast<void>(made); // what is not there cannot be removed: the writing says so
+    };
+    measure("write" + of + ", store alone", kListRepetitions, prepare,
+            [] { return bench::writeBare(bareFile(kMany), kMany, true, utf8PathOf); });
+    measure("write" + of + ", none before", kListRepetitions, emptyTheHistory,
+            [] { return storeAll(kMany); });
+    measure(
+        "write" + of + ", none before, store alone", kListRepetitions,
+        [] { static_cast<void>(bench::makeBare(registryFile(), bareFile(0))); },
+        [] { return bench::writeBare(bareFile(0), kMany, false, utf8PathOf); });
+}
+
+void addStoreRatios()
+{
+    const std::string of = " " + std::to_string(kMany) + " of History";
+    for (const std::string& work : {"read" + of, "write" + of, "write" + of + ", none before"})
+        bench::addRatio({work + " / store alone", work, work + ", store alone", 2});
 }
 
 void addHistoryRatios(const std::string& verb)
@@ -279,6 +341,8 @@ void addListBenchmarks()
     bench::startHost();
     addHistory(kFew, kFewRepetitions);
     addHistory(kMany, kListRepetitions);
+    addStoreAlone();
+    addStoreRatios();
     addHistoryRatios("read");
     addHistoryRatios("write");
     addLookups();

@@ -1,15 +1,14 @@
 // What the host cannot start without, one part after the other and nothing else: the registry, Lisp, and the
 // Modrig bundle mapped by the platform. Linked with the host's objects, since its library hides its parts.
 // With a number after the folders it also reads so many values of the History, one after the other, by the
-// calls of the SDK; with "fill" after that it stores them first, and does nothing else.
-#include <wincompat/winreg.h>
-
+// store's own calls; with "fill" after that it stores them, and does nothing else.
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
 #include <filesystem>
 #include <string>
 
+#include "bench/BareStore.h"
 #include "host/applications/Document.h"
 #include "host/applications/ModuleLibrary.h"
 #include "host/commands/EndRequest.h"
@@ -23,7 +22,6 @@
 namespace
 {
 constexpr wchar_t kHistory[] = L"Software\\Tessel\\R21\\Profiles\\Default\\Dialogs\\Modrig\\History";
-constexpr DWORD kDataCharacters = 1024;
 
 std::wstring entryName(long number)
 {
@@ -40,21 +38,6 @@ bool fill(tessel::Registry& registry, long count)
                   written;
     return registry.endOfCommand() && written;
 }
-
-bool readAll(long count)
-{
-    bool all = true;
-    for (long number = 1; number <= count; ++number)
-    {
-        HKEY key = nullptr;
-        wchar_t data[kDataCharacters];
-        DWORD size = sizeof data;
-        all = RegOpenKeyExW(HKEY_CURRENT_USER, kHistory, 0, KEY_READ, &key) == ERROR_SUCCESS &&
-              tsRegGetValue(key, entryName(number).c_str(), 0, nullptr, data, &size) == ERROR_SUCCESS && all;
-        RegCloseKey(key);
-    }
-    return all;
-}
 } // namespace
 
 int main(int argc, char** argv)
@@ -67,13 +50,14 @@ int main(int argc, char** argv)
     const long count = argc > 3 ? std::atol(argv[3]) : 0;
     std::filesystem::create_directories(argv[1]);
     tessel::CommandLine commandLine([](std::string_view) {});
-    tessel::Owned<tessel::Registry> registry(std::filesystem::path(argv[1]) / "registry.db");
+    const auto registryFile = std::filesystem::path(argv[1]) / "registry.db";
+    tessel::Owned<tessel::Registry> registry(registryFile);
     const tessel::Profiles profiles(*registry, tessel::kProductRegistryRoot);
     if (!registry->endOfCommand())
         return 1;
     if (argc > 4)
         return std::strcmp(argv[4], "fill") == 0 && fill(*registry, count) ? 0 : 1;
-    if (!readAll(count))
+    if (count > 0 && !bench::readBare(registryFile, static_cast<std::size_t>(count)))
         return 1;
     tessel::Document document;
     const tessel::EndRequest endRequest;
