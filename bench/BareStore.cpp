@@ -81,8 +81,9 @@ std::string foldOf(std::size_t number)
 sqlite3_int64 historyOf(const Store& store, std::size_t count)
 {
     const std::string size = std::to_string(count);
-    Query find(store, "SELECT key.id FROM key CROSS JOIN value ON value.key=key.id AND value.fold='numhistory'"
-                      " WHERE value.data=?1");
+    Query find(store,
+               "SELECT key.id FROM key CROSS JOIN value ON value.key=key.id AND value.fold='numhistory'"
+               " WHERE value.data=?1");
     find.bind(1, size);
     return find.hasRow() ? find.number() : 0;
 }

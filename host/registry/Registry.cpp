@@ -71,18 +71,33 @@ Registry::Key Registry::findChild(Key parent, std::wstring_view name)
     return key;
 }
 
+bool Registry::isFollowed(std::wstring_view path, Key from) const
+{
+    return mFollowed.key != kNoKey && mFollowed.from == from && mFollowed.path == path;
+}
+
+// Within a transaction nobody else's changes are seen, and keys are not removed unnoticed.
+void Registry::noteFollowed(std::wstring_view path, Key from, Key key)
+{
+    if (sqlite3_get_autocommit(mDatabase) == 0)
+        mFollowed = {from, std::wstring(path), key};
+}
+
 Registry::Key Registry::find(std::wstring_view path, Key from)
 {
     if (!mDatabase)
         return kNoKey;
     beginReading();
+    if (isFollowed(path, from))
+        return mFollowed.key;
     Key key = from;
-    while (!path.empty() && key != kNoKey)
+    for (std::wstring_view rest = path; !rest.empty() && key != kNoKey;)
     {
-        const std::wstring_view part = takePart(path);
+        const std::wstring_view part = takePart(rest);
         if (!part.empty())
             key = findChild(key, part);
     }
+    noteFollowed(path, from, key);
     return key;
 }
 
@@ -104,10 +119,18 @@ Result<Registry::Key> Registry::create(std::wstring_view path, Key from)
     // Opening an existing key is no write, but who opens it this way is about to write.
     if (!mCanStore)
         return mCanStore.failure();
+    auto made = isFollowed(path, from) ? Result<Key>(mFollowed.key) : makePath(path, from);
+    if (made)
+        mOpenedForWriting.insert(*made);
+    return made;
+}
+
+Result<Registry::Key> Registry::makePath(std::wstring_view path, Key from)
+{
     Key key = from;
-    while (!path.empty())
+    for (std::wstring_view rest = path; !rest.empty();)
     {
-        const std::wstring_view part = takePart(path);
+        const std::wstring_view part = takePart(rest);
         if (part.empty())
             continue;
         const Key found = findChild(key, part);
@@ -116,7 +139,7 @@ Result<Registry::Key> Registry::create(std::wstring_view path, Key from)
             return child;
         key = *child;
     }
-    mOpenedForWriting.insert(key);
+    noteFollowed(path, from, key);
     return key;
 }
 
@@ -142,6 +165,7 @@ Result<> Registry::removeKey(Key key)
     if (auto sound = checkBeforeRemoval(); !sound)
         return sound;
     mCursor = {};
+    mFollowed = {};
     return finishWrite(mStatements->deleteKey.bind(key).run());
 }
 
@@ -151,13 +175,31 @@ Result<std::wstring> Registry::readValue(Key key, std::wstring_view name)
         return noSuchValue();
     lookInto(key);
     mWork.count();
+    std::string fold = toUtf8(foldCase(name));
+    int status = readAhead(key, fold);
+    if (status == SQLITE_ROW)
+        return mStatements->followingValues.text(kFourth);
     Statement& read = mStatements->readValue;
-    const int status = step(read.bind(key).bind(foldCase(name)));
+    if (status == SQLITE_DONE)
+        status = step(read.bind(key).bindUtf8(std::move(fold)));
     if (status != SQLITE_ROW)
         return status == SQLITE_DONE ? noSuchValue() : Failure{mCommand.sentence(), ERROR_READ_FAULT};
+    mReadAhead.noteFound(key, read.number(0));
     std::wstring data = read.text(kThird);
     read.reset();
     return data;
+}
+
+// SQLITE_ROW: the value is that of the row after the one that was read last, on which `followingValues`
+// stands. SQLITE_DONE: it has to be searched.
+int Registry::readAhead(Key key, std::string_view fold)
+{
+    if (mCannotLock || mWork.isInterrupted())
+        return SQLITE_DONE;
+    const int status = mReadAhead.step(mStatements->followingValues, key, fold);
+    if (status != SQLITE_ROW && status != SQLITE_DONE)
+        failStep(status);
+    return status;
 }
 
 Result<> Registry::writeValue(Key key, std::wstring_view name, std::wstring_view data)
@@ -186,15 +228,20 @@ Result<std::wstring> Registry::valueName(Key key, DWORD index)
         return noMoreValues();
     lookInto(key);
     const bool next = mCursor.key == key && index == mCursor.index + 1;
-    Statement& find = next || index == 0 ? mStatements->nextValue : mStatements->valueAt;
-    find.bind(key).bind(next ? mCursor.sequence : std::int64_t{index});
+    Statement& find = next || index == 0 ? mStatements->nextValues : mStatements->valueAt;
     std::int64_t sequence = next ? mCursor.sequence : 0;
+    if (!next || !find.isStanding())
+    {
+        mStatements->nextValues.reset();
+        find.bind(key).bind(next ? mCursor.sequence : std::int64_t{index});
+    }
     // A store that cannot be read has no more items either: whoever walks it must come to an end.
     if (!isNext(find, sequence))
         return noMoreValues();
     mCursor = {key, index, sequence};
     std::wstring name = find.text(kThird);
-    find.reset();
+    if (&find == &mStatements->valueAt)
+        find.reset(); // the other one stands there for the next index
     return name;
 }
 
@@ -230,6 +277,7 @@ Result<> Registry::beginWriting()
 {
     if (!mCanStore)
         return mCanStore;
+    letGoOfRows();
     mWork.count();
     if (mCommand && mWork.isInterrupted())
         return fail(SQLITE_INTERRUPT, L"written");
@@ -282,7 +330,7 @@ void Registry::beginReading()
 // writes fail, not the look.
 void Registry::lookInto(Key key)
 {
-    if (mOpenedForWriting.contains(key))
+    if (!mWriting && mOpenedForWriting.contains(key))
         static_cast<void>(beginWriting());
     beginReading();
 }
@@ -312,13 +360,18 @@ int Registry::step(Statement& statement)
         return status;
     if (status != SQLITE_ROW)
     {
-        mCannotLock = isLockRefused(status);
-        static_cast<void>(failRead(toWide(sqlite3_errstr(status)), status));
+        failStep(status);
         return status;
     }
     statement.reset();
     static_cast<void>(failRead(L"a row of it is not what was stored there", SQLITE_CORRUPT));
     return SQLITE_CORRUPT;
+}
+
+void Registry::failStep(int status)
+{
+    mCannotLock = isLockRefused(status);
+    static_cast<void>(failRead(toWide(sqlite3_errstr(status)), status));
 }
 
 // Of rows that come in the order of their first column, which only an index that is damaged does not keep: it
@@ -390,8 +443,23 @@ void Registry::undoCommand()
     closeHandlesOfLostKeys();
 }
 
+// The store ends no transaction while a statement stands in it, and flushes no page that one stands on.
+void Registry::letGoOfRows()
+{
+    mReadAhead.forget(mStatements->followingValues);
+    if (mStatements->nextValues.isStanding())
+        mStatements->nextValues.reset();
+}
+
+void Registry::forgetTransaction()
+{
+    letGoOfRows();
+    mFollowed = {};
+}
+
 void Registry::rollBack()
 {
+    forgetTransaction();
     // SQLite may have rolled back by itself already.
     if (!sqlite3_get_autocommit(mDatabase))
         mStatements->rollback.run();
@@ -413,6 +481,7 @@ void Registry::closeHandlesOfLostKeys()
 
 void Registry::commit()
 {
+    forgetTransaction();
     if (sqlite3_get_autocommit(mDatabase))
         return;
     const int status = mStatements->commit.run();

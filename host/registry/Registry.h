@@ -32,6 +32,7 @@
 #include <vector>
 
 #include "host/registry/LongWork.h"
+#include "host/registry/ReadAhead.h"
 #include "host/text/Result.h"
 
 struct sqlite3;
@@ -117,6 +118,13 @@ public:
 
 private:
     struct Statements;
+    // Where a path leads, for as long as the transaction lasts in which it was followed.
+    struct Followed
+    {
+        Key from = kNoKey;
+        std::wstring path;
+        Key key = kNoKey;
+    };
     struct Cursor
     {
         Key key = kNoKey;
@@ -142,17 +150,24 @@ private:
     void lookAtAll(int version);
     void renewCopy(bool changed);
     Failure damage(const std::wstring& reason);
+    bool isFollowed(std::wstring_view path, Key from) const;
+    void noteFollowed(std::wstring_view path, Key from, Key key);
     Key findChild(Key parent, std::wstring_view name);
+    Result<Key> makePath(std::wstring_view path, Key from);
     Result<Key> createChild(Key parent, std::wstring_view name);
     Result<> beginWriting();
     void beginReading();
     void lookInto(Key key);
+    void letGoOfRows();
+    void forgetTransaction();
     void commit();
     void rollBack();
     Result<> checkBeforeRemoval();
     Result<> checkPlace();
     Result<> finishWrite(int status);
+    int readAhead(Key key, std::string_view fold);
     int step(Statement& statement);
+    void failStep(int status);
     bool isNext(Statement& statement, std::int64_t& last);
     Failure fail(int status, const wchar_t* done);
     Failure failRead(const std::wstring& words, int status);
@@ -173,6 +188,8 @@ private:
     bool mCannotLock = false; // for as long as the session lasts: the file system refuses
     std::unique_ptr<Statements> mStatements;
     Cursor mCursor;
+    ReadAhead mReadAhead;
+    Followed mFollowed; // the last one: a list is read and written by one path
     LongWork mWork;
     Result<> mCommand;                         // the running one, or what failed in it first
     bool mWriting = false;                     // the running transaction is one that writes

@@ -3,8 +3,11 @@
 
 #include <sqlite3.h>
 
+#include <array>
+#include <cstdint>
 #include <string>
 #include <string_view>
+#include <utility>
 
 #include "host/text/Unicode.h"
 
@@ -28,10 +31,12 @@ public:
         sqlite3_bind_int64(mStatement, ++mBound, number);
         return *this;
     }
-    Statement& bind(std::wstring_view text)
+    Statement& bind(std::wstring_view text) { return bindUtf8(toUtf8(text)); }
+    Statement& bindUtf8(std::string utf8)
     {
-        const std::string utf8 = toUtf8(text);
-        sqlite3_bind_text(mStatement, ++mBound, utf8.data(), static_cast<int>(utf8.size()), SQLITE_TRANSIENT);
+        std::string& kept = mTexts[static_cast<std::size_t>(mBound)];
+        kept = std::move(utf8);
+        sqlite3_bind_text(mStatement, ++mBound, kept.data(), static_cast<int>(kept.size()), SQLITE_STATIC);
         return *this;
     }
 
@@ -55,17 +60,24 @@ public:
         sqlite3_reset(mStatement);
         mBound = 0;
     }
+    // Whether a row stands ready.
+    bool isStanding() const { return sqlite3_stmt_busy(mStatement) != 0; }
 
     std::int64_t number(int column) const { return sqlite3_column_int64(mStatement, column); }
-    std::wstring text(int column) const
+    std::wstring text(int column) const { return toWide(utf8(column)); }
+    // The same as it is stored; it lasts until the next step or reset.
+    std::string_view utf8(int column) const
     {
         const auto* bytes = reinterpret_cast<const char*>(sqlite3_column_text(mStatement, column));
         const auto size = static_cast<std::size_t>(sqlite3_column_bytes(mStatement, column));
-        return bytes ? toWide({bytes, size}) : std::wstring();
+        return bytes ? std::string_view(bytes, size) : std::string_view();
     }
 
 private:
+    static constexpr std::size_t kMostBound = 4;
+
     sqlite3_stmt* mStatement = nullptr;
     int mBound = 0;
+    std::array<std::string, kMostBound> mTexts; // what is bound, for as long as it is
 };
 } // namespace tessel

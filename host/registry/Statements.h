@@ -16,7 +16,7 @@ namespace tessel
 struct Registry::Statements
 {
     Statement findKey, keyExists, insertKey, deleteKey, subKeys;
-    Statement readValue, writeValue, deleteValue, values, nextValue, valueAt;
+    Statement readValue, followingValues, writeValue, deleteValue, values, nextValues, valueAt;
     Statement begin, mark, beginReading, commit, rollback;
 
     // `mark` writes the number of the file, by which its journals are known. A row that is found comes with
@@ -34,14 +34,16 @@ struct Registry::Statements
                       "ORDER BY id"},
             {readValue,
              "SELECT seq, sum IS row_sum(?1, name, ?2, data), data FROM value WHERE key=?1 AND fold=?2"},
+            {followingValues, "SELECT seq, sum IS row_sum(?1, name, fold, data), fold, data FROM value"
+                              " WHERE key=?1 AND seq>?2 ORDER BY seq"},
             {writeValue, "INSERT INTO value(key, name, fold, data, sum)"
                          " VALUES(?1, ?2, ?3, ?4, row_sum(?1, ?2, ?3, ?4)) ON CONFLICT(key, fold)"
                          " DO UPDATE SET data=?4, sum=row_sum(?1, value.name, ?3, ?4)"},
             {deleteValue, "DELETE FROM value WHERE key=? AND fold=?"},
             {values, "SELECT seq, sum IS row_sum(?1, name, fold, data), name, data FROM value WHERE key=?1"
                      " ORDER BY seq"},
-            {nextValue, "SELECT seq, sum IS row_sum(?1, name, fold, data), name FROM value"
-                        " WHERE key=?1 AND seq>?2 ORDER BY seq LIMIT 1"},
+            {nextValues, "SELECT seq, sum IS row_sum(?1, name, fold, data), name FROM value"
+                         " WHERE key=?1 AND seq>?2 ORDER BY seq"},
             {valueAt, "SELECT seq, sum IS row_sum(?1, name, fold, data), name FROM value"
                       " WHERE key=?1 ORDER BY seq LIMIT 1 OFFSET ?2"},
             {begin, "BEGIN IMMEDIATE"},

@@ -92,9 +92,20 @@ std::string cFormat(const Conversion& conversion, const char* size)
     return format;
 }
 
+bool isPlainDecimal(const Conversion& conversion)
+{
+    const bool isDecimal = isOneOf(kSignedConversions, conversion.letter) || conversion.letter == L'u';
+    return isDecimal && conversion.flags.empty() && conversion.width == 0 && conversion.precision < 0;
+}
+
 template <class Number>
 std::wstring formatNumber(const Conversion& conversion, const char* size, Number number)
 {
+    if (isPlainDecimal(conversion))
+    {
+        const std::string digits = std::to_string(number);
+        return std::wstring(digits.begin(), digits.end());
+    }
     char buffer[kNumberRoom];
     const int length = std::snprintf(buffer, sizeof buffer, cFormat(conversion, size).c_str(), number);
     return std::wstring(buffer, buffer + std::clamp(length, 0, static_cast<int>(sizeof buffer) - 1));

@@ -6,6 +6,7 @@
 
 #include <algorithm>
 #include <iterator>
+#include <type_traits>
 
 namespace tessel
 {
@@ -22,8 +23,22 @@ bool isByte(char32_t code)
     return code >= kFirstByte && code <= kLastByte;
 }
 
+// Nearly all text is ASCII, which is the same in every encoding and goes by without a look at each
+// character's properties.
+constexpr char32_t kFirstBeyondAscii = 0x80;
+
+template <class Text>
+auto endOfAscii(const Text& text)
+{
+    return std::find_if(text.begin(), text.end(),
+                        [](auto unit)
+                        { return std::make_unsigned_t<decltype(unit)>(unit) >= kFirstBeyondAscii; });
+}
+
 wchar_t foldOne(wchar_t character)
 {
+    if (character < static_cast<wchar_t>(kFirstBeyondAscii))
+        return character >= L'A' && character <= L'Z' ? character + (L'a' - L'A') : character;
     return static_cast<wchar_t>(u_foldCase(static_cast<UChar32>(character), U_FOLD_CASE_DEFAULT));
 }
 
@@ -75,19 +90,19 @@ void append(std::u16string& utf16, char32_t code)
 template <class Encoded>
 Encoded encoded(std::wstring_view text)
 {
-    Encoded result;
-    result.reserve(text.size());
-    for (const wchar_t character : text)
-        append(result, static_cast<char32_t>(character));
+    const auto rest = endOfAscii(text);
+    Encoded result(text.begin(), rest);
+    for (auto character = rest; character != text.end(); ++character)
+        append(result, static_cast<char32_t>(*character));
     return result;
 }
 } // namespace
 
 std::wstring toWide(std::string_view utf8)
 {
-    std::wstring text;
-    text.reserve(utf8.size());
-    for (std::size_t position = 0; position < utf8.size();)
+    const auto rest = endOfAscii(utf8);
+    std::wstring text(utf8.begin(), rest);
+    for (std::size_t position = text.size(); position < utf8.size();)
         text += takeCharacter(utf8, position);
     return text;
 }

@@ -3,6 +3,7 @@
 #include <wincompat/winres.h>
 
 #include <cwchar>
+#include <iterator>
 #include <vector>
 
 #include "modrig/base/CaseFolding.h"
@@ -111,7 +112,11 @@ bool CStdStr::Load(unsigned id, HMODULE module)
 
 void CStdStr::FormatArguments(const wchar_t* format, const TsFormatArgument* arguments, std::size_t count)
 {
-    std::vector<wchar_t> buffer(std::wcslen(format) + kFormattingRoom + 1);
-    tsutFormatArguments(buffer.data(), buffer.size(), format, arguments, count);
-    mText = buffer.data();
+    const std::size_t room = std::wcslen(format) + kFormattingRoom + 1;
+    // Names of entries are made by the hundred thousand.
+    wchar_t usual[2 * kFormattingRoom];
+    std::vector<wchar_t> unusual(room > std::size(usual) ? room : 0);
+    wchar_t* const buffer = unusual.empty() ? usual : unusual.data();
+    tsutFormatArguments(buffer, room, format, arguments, count);
+    mText = buffer;
 }

@@ -1,5 +1,7 @@
 #include "modrig/base/CStringList.h"
 
+#include <utility>
+
 #include "modrig/base/SplitPath.h"
 
 namespace
@@ -27,12 +29,31 @@ bool MatchesEntry(const SplitPath& entry, const SplitPath& target)
 
 void CStringList::AddTail(const CStdStr& text)
 {
-    const auto entry = mEntries.insert(mEntries.end(), Entry{text, mNextPlace++});
-    mIndex.emplace(MatchingHash(SplitPath(text)), entry);
+    const SplitPath split(text);
+    Append(text, split, split.PathHash());
+}
+
+const CStdStr* CStringList::AddTailUnlessHeld(CStdStr path)
+{
+    const SplitPath target(path);
+    const std::size_t pathHash = target.PathHash();
+    if (Holds(target, pathHash))
+        return nullptr;
+    Append(std::move(path), target, pathHash);
+    return &mEntries.back().text;
+}
+
+void CStringList::Append(CStdStr text, const SplitPath& split, std::size_t pathHash)
+{
+    const bool knownByName = IsKnownByFileNameAlone(split);
+    mKnownByName = mKnownByName || knownByName;
+    const auto entry = mEntries.insert(mEntries.end(), Entry{std::move(text), mNextPlace++});
+    mIndex.emplace(knownByName ? split.FileNameHash() : pathHash, entry);
 }
 
 void CStringList::RemoveAll()
 {
+    mKnownByName = false;
     mIndex.clear();
     mEntries.clear();
 }
@@ -60,7 +81,12 @@ bool CStringList::HoldsApplication(const CStdStr& path) const
     if (IsEmpty())
         return false;
     const SplitPath target(path);
-    return HoldsUnder(target.PathHash(), target) || HoldsUnder(target.FileNameHash(), target);
+    return Holds(target, target.PathHash());
+}
+
+bool CStringList::Holds(const SplitPath& target, std::size_t pathHash) const
+{
+    return HoldsUnder(pathHash, target) || (mKnownByName && HoldsUnder(target.FileNameHash(), target));
 }
 
 bool CStringList::HoldsUnder(std::size_t hash, const SplitPath& target) const

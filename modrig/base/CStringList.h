@@ -68,6 +68,10 @@ public:
     void AddTail(const CStdStr& text);
     void RemoveAll();
 
+    // Adds the path unless an entry stands for the same application (see `HoldsApplication`). Answers the new
+    // entry, or null.
+    [[nodiscard]] const CStdStr* AddTailUnlessHeld(CStdStr path);
+
     // Erases the first entry that equals the text without regard to case. Answers whether there was one.
     [[nodiscard]] bool RemoveFirstNoCase(const CStdStr& text);
 
@@ -78,10 +82,13 @@ private:
     // By the hash of what an entry is matched by.
     using Index = std::unordered_multimap<std::size_t, Entries::iterator>;
 
+    void Append(CStdStr text, const SplitPath& split, std::size_t pathHash);
+    bool Holds(const SplitPath& target, std::size_t pathHash) const;
     bool HoldsUnder(std::size_t hash, const SplitPath& target) const;
 
     Entries mEntries;
     Index mIndex;
+    bool mKnownByName = false; // there was an entry that is known by its file name alone
     std::uint64_t mNextPlace = 0;
 };
 

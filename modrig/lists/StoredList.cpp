@@ -3,7 +3,6 @@
 #include <cwchar>
 #include <utility>
 
-#include "modrig/lists/ListMembership.h"
 #include "modrig/messages/MessageIds.h"
 #include "modrig/messages/Messages.h"
 #include "modrig/profile/ProfileRegistry.h"
@@ -108,12 +107,8 @@ void ReadStoredList(const StoredListNames& names, CStringList& list,
         return;
     EntryReader entries(names, subKey, ReadCount(stored));
     for (CStdStr path; entries.Read(path);)
-    {
-        if (FoundinSpecificList(path, list))
-            continue;
-        list.AddTail(path);
-        appended(path);
-    }
+        if (const CStdStr* added = list.AddTailUnlessHeld(std::move(path)))
+            appended(*added);
 }
 
 void WriteStoredList(const StoredListNames& names, const CStringList& list)

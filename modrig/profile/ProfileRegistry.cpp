@@ -2,6 +2,8 @@
 
 #include <tessel/tshostservices.h>
 
+#include <cwchar>
+
 namespace ModrigUtils
 {
 namespace
@@ -75,12 +77,12 @@ bool ReadModrigRegString(HKEY root, CStdStr subKey, CStdStr valueName, CStdStr& 
     const OpenKey key(root, subKey, Access::kRead);
     if (!key)
         return false;
-    wchar_t buffer[kDataCharacters] = {};
+    wchar_t buffer[kDataCharacters];
     DWORD type = REG_SZ;
     DWORD size = kDataBytes;
     if (tsRegGetValue(key.get(), valueName.c_str(), 0, &type, buffer, &size) != ERROR_SUCCESS)
         return false;
-    data = CStdStr(std::wstring(buffer));
+    data = CStdStr(std::wstring(buffer, wcsnlen(buffer, size / sizeof(wchar_t))));
     return true;
 }
 
