@@ -15,12 +15,10 @@ namespace ModrigUtils
 [[nodiscard]] CStdStr GetModrigProfileRegKey();
 
 // Reads a value of up to 1023 characters; a longer one cannot be read. `data` is untouched on failure.
-[[nodiscard]] bool ReadModrigRegString(HKEY root, const CStdStr& subKey, const CStdStr& valueName,
-                                       CStdStr& data);
+[[nodiscard]] bool ReadModrigRegString(HKEY root, CStdStr subKey, CStdStr valueName, CStdStr& data);
 
 // Stores a value; the key and its parents are made. An empty name only makes sure that the key exists.
-[[nodiscard]] bool WriteModrigRegString(HKEY root, const CStdStr& subKey, const CStdStr& valueName,
-                                        const CStdStr& data);
+[[nodiscard]] bool WriteModrigRegString(HKEY root, CStdStr subKey, CStdStr valueName, CStdStr data);
 
 // Removes a value; the key is made if need be. False when there is no such value. An empty name removes
 // nothing and answers true.

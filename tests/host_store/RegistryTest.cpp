@@ -189,6 +189,65 @@ TEST_F(RegistryStore, WalksALongListInBothDirectionsAndByLeaps)
     EXPECT_EQ(registry().valueName(Registry::kNoKey, 0).code(), ERROR_NO_MORE_ITEMS);
 }
 
+TEST_F(RegistryStore, FindsNoKeyWhereOneWasRemovedInTheSameCommand)
+{
+    EXPECT_TRUE(registry().write(L"A\\B", L"name", L"data"));
+    const auto key = registry().find(L"A\\B");
+    ASSERT_NE(key, Registry::kNoKey);
+    EXPECT_TRUE(registry().removeKey(registry().find(L"A")));
+    ASSERT_EQ(registry().find(L"A\\B"), Registry::kNoKey);
+    EXPECT_TRUE(registry().write(L"A\\B", L"name", L"again"));
+    EXPECT_NE(registry().find(L"A\\B"), key);
+    EXPECT_EQ(registry().read(L"A\\B", L"name"), L"again");
+}
+
+TEST_F(RegistryStore, FollowsTheSamePathFromEachKey)
+{
+    EXPECT_TRUE(registry().write(L"A\\C", L"name", L"in A"));
+    EXPECT_TRUE(registry().write(L"B\\C", L"name", L"in B"));
+    for (const wchar_t* above : {L"A", L"B"})
+    {
+        const auto key = registry().find(L"C", registry().find(above));
+        EXPECT_EQ(*registry().readValue(key, L"name"), std::wstring(L"in ") + above);
+    }
+}
+
+TEST_F(RegistryStore, ReadsWhatTheCommandWroteAheadOfItsReading)
+{
+    ASSERT_TRUE(rewriteList(registry(), 1, 10));
+    const wchar_t* const path = L"Software\\Tessel\\R21\\Profiles\\Default\\Dialogs\\Modrig\\History";
+    const auto key = registry().find(path);
+    for (const wchar_t* name : {L"1History", L"2History", L"3History", L"4History"})
+        ASSERT_TRUE(registry().readValue(key, name));
+    EXPECT_TRUE(registry().writeValue(key, L"5History", L"new"));
+    EXPECT_TRUE(registry().removeValue(key, L"6History"));
+    EXPECT_EQ(*registry().readValue(key, L"5History"), L"new");
+    EXPECT_FALSE(registry().readValue(key, L"6History"));
+    EXPECT_TRUE(registry().readValue(key, L"7History"));
+    EXPECT_TRUE(registry().endOfCommand());
+    host.open();
+    EXPECT_EQ(registry().read(path, L"5History"), L"new");
+}
+
+TEST_F(RegistryStore, SeesInTheNextCommandWhatAnotherSessionHasChangedInAList)
+{
+    ASSERT_TRUE(rewriteList(registry(), 1, 10));
+    ASSERT_TRUE(registry().endOfCommand());
+    const wchar_t* const path = L"Software\\Tessel\\R21\\Profiles\\Default\\Dialogs\\Modrig\\History";
+    for (const wchar_t* name : {L"1History", L"2History", L"3History", L"4History"})
+        ASSERT_TRUE(registry().read(path, name));
+    Registry other(host.file());
+    EXPECT_TRUE(other.write(path, L"5History", L"theirs"));
+    EXPECT_TRUE(other.endOfCommand()) << "reading keeps nobody from writing";
+    EXPECT_NE(registry().read(path, L"5History"), L"theirs") << "the list is read as it stood";
+    EXPECT_TRUE(registry().endOfCommand());
+    EXPECT_EQ(registry().read(path, L"5History"), L"theirs");
+    EXPECT_TRUE(other.removeKey(other.find(path)));
+    EXPECT_TRUE(other.endOfCommand());
+    EXPECT_TRUE(registry().endOfCommand());
+    EXPECT_EQ(registry().find(path), Registry::kNoKey);
+}
+
 TEST_F(RegistryStore, WalksTwoKeysAtTheSameTime)
 {
     for (const wchar_t* name : {L"1", L"2", L"3"})
