@@ -24,6 +24,25 @@ alignas(16) std::array<char, std::size_t{64} << 10> theStack;
 // A signal handler can be given nothing. Written before the handlers are in place.
 std::array<struct sigaction, NSIG> theFormer;
 
+unsigned char byteAt(std::string_view text, std::size_t at)
+{
+    return static_cast<unsigned char>(text[at]);
+}
+
+// From U+0080 to U+009F, of which some terminals take one for an escape and a letter.
+bool isHighControl(std::string_view text, std::size_t at)
+{
+    return at + 1 < text.size() && byteAt(text, at) == 0xC2 && byteAt(text, at + 1) >= 0x80 &&
+           byteAt(text, at + 1) <= 0x9F;
+}
+
+// What a file is called must not steer the terminal.
+bool isOrder(std::string_view text, std::size_t at)
+{
+    return byteAt(text, at) < ' ' || byteAt(text, at) == 0x7F || isHighControl(text, at) ||
+           (at > 0 && isHighControl(text, at - 1));
+}
+
 // A line in pieces, made without memory of the system.
 class Line
 {
@@ -31,11 +50,8 @@ public:
     void add(std::string_view text)
     {
         const std::size_t count = std::min(text.size(), mBytes.size() - 1 - mLength);
-        // What a file is called must not steer the terminal.
-        std::transform(text.begin(), text.begin() + static_cast<std::ptrdiff_t>(count),
-                       mBytes.begin() + static_cast<std::ptrdiff_t>(mLength),
-                       [](char byte) { return byte >= 0 && byte < ' ' ? '?' : byte; });
-        mLength += count;
+        for (std::size_t at = 0; at < count; ++at)
+            mBytes[mLength++] = isOrder(text, at) ? '?' : text[at];
     }
     void print()
     {

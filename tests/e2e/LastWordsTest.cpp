@@ -92,6 +92,21 @@ TEST(LastWordsOf, ALispFile)
                                   "\" has ended Tessel while its Lisp ran: " + kFault + ".\n"));
 }
 
+// A letter of two bytes whose second one alone would be a control character stays.
+TEST(LastWordsOf, AnApplicationCalledByOrdersToTheTerminalAreReadable)
+{
+    const HostSession session;
+    const std::string folder = session.folder().path().string();
+    const auto last = deadly(session, "segv");
+    const std::string path = folder + "/segv-\xC2\x9B"
+                                      "31m\x7F\x1B[1m\xC2\x80\xC2\x9F\xC2\xA0\xC3\x9B.zmb";
+    std::filesystem::copy_file(last, path);
+    const auto result = session.start({"-c", "LOAD \"" + path + "\""});
+    EXPECT_EQ(result.exitStatus, -SIGSEGV);
+    EXPECT_THAT(result.output,
+                HasSubstr("The application \"" + folder + "/segv-??31m??[1m????\xC2\xA0\xC3\x9B.zmb\" has "));
+}
+
 TEST(LastWordsOf, AChildThatEndsAreNone)
 {
     const HostSession session;
