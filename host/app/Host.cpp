@@ -121,12 +121,29 @@ Result<> Host::prepareProfileFolder()
     return error ? failed(toWide(error.message())) : Result<>();
 }
 
-// What stands in the profile decides which programs run.
+// What stands in the profile decides which programs run. Nobody else reaches what is in a folder of the
+// person's alone.
 void Host::tellWhoElseWritesTheProfile()
 {
-    if (const auto checked = checkNobodyElseWrites(mOptions.profileFolder); !checked)
-        mCommandLine.say(L"The profile folder " + wideText(mOptions.profileFolder) + L" is not safe: " +
-                         checked.sentence() + L", and so could change what Tessel loads.");
+    const auto& profile = mOptions.profileFolder;
+    const auto applications = profile / kApplicationsFolder;
+    if (!tellWhoElseWrites(L"profile folder", profile) || !othersMayEnter(profile))
+        return;
+    tellWhoElseWrites(L"registry", profile / kRegistryFile);
+    if (tellWhoElseWrites(L"folder", applications))
+        tellWhoElseWrites(L"file", applications / KeptOut::kFileName);
+}
+
+// True when there was nothing to tell. What is not there yet will be the person's own.
+bool Host::tellWhoElseWrites(const std::wstring& kind, const std::filesystem::path& path)
+{
+    std::error_code unreachable;
+    const auto checked = checkNobodyElseWrites(path);
+    if (checked || !std::filesystem::exists(path, unreachable))
+        return true;
+    mCommandLine.say(L"The " + kind + L" " + wideText(path) + L" is not safe: " + checked.sentence() +
+                     L"; others could change what Tessel loads.");
+    return false;
 }
 
 void Host::addCommands()

@@ -80,6 +80,7 @@ private:
     Result<> prepareProfileFolder();
     void judgeEarlierSessions();
     void tellWhoElseWritesTheProfile();
+    bool tellWhoElseWrites(const std::wstring& kind, const std::filesystem::path& path);
     void tellOfStart();
     void addCommands();
     bool finishLine();

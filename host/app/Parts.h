@@ -39,8 +39,9 @@
 
 namespace tessel
 {
-// In the profile: what is at work, and what is kept out.
+// In the profile: what is at work, and what is kept out; what the host and the applications store.
 inline constexpr char kApplicationsFolder[] = "applications";
+inline constexpr char kRegistryFile[] = "registry.db";
 
 // What the parts are made from.
 struct Foundations
@@ -63,7 +64,7 @@ struct Parts
     const Layout layout = runningLayout();
     Published<CommandLine> commandLine{foundations.commandLine};
     Published<EndRequest> endRequest{foundations.endRequest};
-    Owned<Registry> registry{foundations.profileFolder / "registry.db"};
+    Owned<Registry> registry{foundations.profileFolder / kRegistryFile};
     Profiles profiles{*registry, kProductRegistryRoot};
     Owned<SystemVariables> variables{&*registry, kProductRegistryRoot};
     Owned<RunningMarker> marker{foundations.profileFolder / kApplicationsFolder};

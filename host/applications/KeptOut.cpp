@@ -15,7 +15,6 @@ namespace
 {
 using Stage = KeptOutApplication::Stage;
 
-constexpr char kFileName[] = "kept-out";
 constexpr char kLockName[] = "kept-out.lock";
 constexpr std::string_view kHeader = "Tessel keeps these applications out, 1\n";
 constexpr std::size_t kFields = 14;

@@ -51,6 +51,8 @@ struct KeptOutApplication
 class KeptOut
 {
 public:
+    static constexpr char kFileName[] = "kept-out"; // in its folder
+
     // Keeps nothing out, and nothing in mind.
     KeptOut() = default;
     // Of the folder, which is there; a file that is damaged is left as it is, and nothing is kept out.

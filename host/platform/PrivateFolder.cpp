@@ -53,4 +53,10 @@ Result<> checkNobodyElseWrites(const std::filesystem::path& path)
         return Failure{L"other users may write to it"};
     return {};
 }
+
+bool othersMayEnter(const std::filesystem::path& folder)
+{
+    struct stat status = {};
+    return stat(folder.c_str(), &status) == 0 && (status.st_mode & (S_IXGRP | S_IXOTH)) != 0;
+}
 } // namespace tessel

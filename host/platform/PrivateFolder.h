@@ -14,4 +14,7 @@ Result<> makePrivateFolder(const std::filesystem::path& folder);
 // Fails where another user could have written: what stands at the path belongs to somebody else, or others
 // have the right. Who and how is the end of a sentence. A link counts as what it leads to.
 Result<> checkNobodyElseWrites(const std::filesystem::path& path);
+
+// Whether another user may reach what is in the folder.
+bool othersMayEnter(const std::filesystem::path& folder);
 } // namespace tessel

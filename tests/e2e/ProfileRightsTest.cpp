@@ -37,7 +37,24 @@ protected:
     std::string notSafe(const std::string& reason) const
     {
         return "The profile folder " + session.profile().string() + " is not safe: " + reason +
-               ", and so could change what Tessel loads.\n";
+               "; others could change what Tessel loads.\n";
+    }
+
+    // What a start says when others may enter the folder, and something in it has these rights.
+    std::string outputWithInside(const std::string& name, mode_t rights, mode_t rightsOfFolder = 0755)
+    {
+        const auto kept = session.folder().write("one.lsp", "").string();
+        EXPECT_EQ(session.run({"DISABLE " + kept}).exitStatus, 0);
+        chmod((session.profile() / name).c_str(), rights);
+        std::string output = outputWith(rightsOfFolder);
+        EXPECT_EQ(rightsOf(session.profile() / name), rights) << "they are the person's to change";
+        return output;
+    }
+
+    std::string notSafeInside(const std::string& name, const std::string& reason) const
+    {
+        return (session.profile() / name).string() + " is not safe: " + reason +
+               "; others could change what Tessel loads.\n";
     }
 
     HostSession session;
@@ -76,6 +93,30 @@ TEST_F(ProfileRights, OfAnotherUserAreTold)
     fs::create_directories(session.profile());
     ASSERT_EQ(chown(session.profile().c_str(), 12345, 12345), 0);
     EXPECT_THAT(outputWith(0755), HasSubstr(notSafe("it belongs to another user")));
+}
+
+TEST_F(ProfileRights, AreAskedOfTheRegistryInIt)
+{
+    EXPECT_THAT(outputWithInside("registry.db", 0666),
+                HasSubstr("The registry " + notSafeInside("registry.db", "other users may write to it")));
+}
+
+TEST_F(ProfileRights, AreAskedOfTheFolderOfTheKeptOutApplications)
+{
+    EXPECT_THAT(outputWithInside("applications", 0777),
+                HasSubstr("The folder " + notSafeInside("applications", "other users may write to it")));
+}
+
+TEST_F(ProfileRights, AreAskedOfTheListOfTheKeptOutApplications)
+{
+    EXPECT_THAT(
+        outputWithInside("applications/kept-out", 0620),
+        HasSubstr("The file " + notSafeInside("applications/kept-out", "other users may write to it")));
+}
+
+TEST_F(ProfileRights, OfFilesThatNobodyElseReachesAreNoReasonForASentence)
+{
+    EXPECT_THAT(outputWithInside("registry.db", 0666, 0700), Not(HasSubstr("not safe")));
 }
 
 TEST_F(ProfileRights, AreAskedOfTheFolderBehindALink)
