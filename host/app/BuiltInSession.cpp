@@ -10,12 +10,13 @@ namespace tessel
 namespace
 {
 constexpr wchar_t kSessionGroup[] = L"Session";
-constexpr std::size_t kUsageColumn = 50;
+constexpr std::size_t kUsageColumn = 49;
 
 void sayCommand(Parts& parts, const CommandStack::Description& command)
 {
     const std::wstring usage = command.name + (command.usage.empty() ? L"" : L" ") + command.usage;
-    sayLine(parts, L"  " + (command.summary.empty() ? usage : padded(usage, kUsageColumn) + command.summary));
+    sayLine(parts,
+            L"  " + (command.summary.empty() ? usage : padded(usage, kUsageColumn) + L" " + command.summary));
 }
 
 Result<> listCommands(Parts& parts)
