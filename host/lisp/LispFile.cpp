@@ -122,7 +122,7 @@ Result<LispFile> read(const FoundFile& found)
     std::error_code error;
     // A pipe or a device might never end.
     if (!fs::is_regular_file(found.status))
-        return refused(found.name, L"it is not a file.");
+        return refused(found.name, L"it is not an ordinary file.");
     if (fs::file_size(found.path, error) > kLargestFile && !error)
         return refused(found.name, L"it is larger than 32 MB.");
     errno = 0;

@@ -233,7 +233,7 @@ TEST_F(BrokenSuite, SaysThatALispFileIsNone)
     EXPECT_EQ(summary, startSummary({{folder, "it is a folder."}}));
     const auto pipe = session.folder() / "pipe.lsp";
     ASSERT_EQ(mkfifo(pipe.c_str(), S_IRUSR | S_IWUSR), 0);
-    EXPECT_EQ(saidAboutLisp(pipe), "\nCannot load \"" + pipe.string() + "\": it is not a file.\n");
+    EXPECT_EQ(saidAboutLisp(pipe), "\nCannot load \"" + pipe.string() + "\": it is not an ordinary file.\n");
 }
 
 TEST_F(BrokenSuite, SaysThatALispFileIsNoText)

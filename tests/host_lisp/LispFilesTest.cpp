@@ -150,7 +150,7 @@ TEST_F(LispFiles, CannotBeFoldersOrDevices)
 {
     EXPECT_EQ(session.error(load(folder.path().string())),
               "Cannot load \"" + folder.path().string() + "\": it is a folder.");
-    EXPECT_EQ(session.error(load("/dev/zero")), "Cannot load \"/dev/zero\": it is not a file.");
+    EXPECT_EQ(session.error(load("/dev/zero")), "Cannot load \"/dev/zero\": it is not an ordinary file.");
 }
 
 TEST_F(LispFiles, MayHaveAnyNameThatTheSystemAllows)
