@@ -26,12 +26,14 @@ Failure failureAt(const std::wstring& path, const std::wstring& reason)
     return {L"The registry key \"" + path + L"\" " + reason + L"."};
 }
 
-// The store's own words are told at the end of the command, which undoes all of it.
-std::wstring writeReason(const Registry& registry, const Result<>& written)
+// The store's own words are told at the end of the command, which undoes all of it. Why nothing can be stored
+// at all is a sentence of its own.
+Failure writeFailure(const Registry& registry, const std::wstring& path, const Result<>& written)
 {
     const Result<>& canStore = registry.canStore();
-    return L"cannot be written: " +
-           (canStore ? L"error " + std::to_wstring(written.code()) : canStore.sentence());
+    if (canStore)
+        return failureAt(path, L"cannot be written: error " + std::to_wstring(written.code()));
+    return {failureAt(path, L"cannot be written").sentence + L" " + canStore.sentence()};
 }
 
 Result<> list(Parts& parts, const std::wstring& path)
@@ -64,7 +66,7 @@ Result<> set(Parts& parts, const std::wstring& path, const Arguments& arguments)
     Result<> done = key ? Result<>() : key.failure();
     if (key && arguments.size() > 2)
         done = registry.writeValue(*key, at(arguments, 2), at(arguments, 3));
-    return done ? done : failureAt(path, writeReason(registry, done));
+    return done ? done : writeFailure(registry, path, done);
 }
 
 // A key alone goes with everything below it; with a name, only the value.
@@ -78,7 +80,7 @@ Result<> remove(Parts& parts, const std::wstring& path, const Arguments& argumen
         arguments.size() > 2 ? registry.removeValue(key, at(arguments, 2)) : registry.removeKey(key);
     if (done.code() == ERROR_FILE_NOT_FOUND)
         return failureAt(path, L"has no value \"" + at(arguments, 2) + L"\"");
-    return done ? done : failureAt(path, writeReason(registry, done));
+    return done ? done : writeFailure(registry, path, done);
 }
 
 // What is damaged gives way to the copy of what it held.

@@ -27,16 +27,21 @@ Failure tooLarge(std::uintmax_t mostBytes)
 }
 } // namespace
 
+Result<> checkOrdinary(const struct stat& status)
+{
+    if (S_ISDIR(status.st_mode))
+        return Failure{L"it is a folder, not a file"};
+    return S_ISREG(status.st_mode) ? Result<>() : Failure{L"it is not an ordinary file"};
+}
+
 Result<Descriptor> openOrdinaryFile(const std::filesystem::path& path, struct stat& status)
 {
     // Opening a pipe that nobody writes to would wait for a writer.
     Descriptor file(open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOCTTY));
     if (!file || fstat(file.number(), &status) != 0)
         return lastError();
-    if (S_ISDIR(status.st_mode))
-        return Failure{L"it is a folder, not a file"};
-    if (!S_ISREG(status.st_mode))
-        return Failure{L"it is not an ordinary file"};
+    if (auto ordinary = checkOrdinary(status); !ordinary)
+        return ordinary.failure();
     return file;
 }
 

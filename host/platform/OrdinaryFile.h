@@ -15,8 +15,11 @@ namespace tessel
 // The code of a failure when nothing stands at the path at all.
 inline constexpr int kNothingThere = 2;
 
+// Whether what the system says of a path is that an ordinary file stands there.
+Result<> checkOrdinary(const struct stat& status);
+
 // An ordinary file, open for reading, and what the system says of it. Neither a pipe nor a device is waited
-// for: they are refused, as folders are. Why is the end of a sentence, here and below.
+// for: they are refused, as folders are. Why is the end of a sentence, as everywhere here.
 Result<Descriptor> openOrdinaryFile(const std::filesystem::path& path, struct stat& status);
 
 // All bytes of an ordinary file of at most that size.

@@ -7,6 +7,7 @@
 #include <thread>
 
 #include "host/platform/NetworkFolder.h"
+#include "host/platform/OrdinaryFile.h"
 #include "host/registry/Journals.h"
 #include "host/registry/Schema.h"
 #include "host/registry/SoundCopy.h"
@@ -36,6 +37,16 @@ bool holdsSomething(const std::filesystem::path& file)
 {
     struct stat status = {};
     return stat(file.c_str(), &status) == 0 && (!S_ISREG(status.st_mode) || status.st_size > 0);
+}
+
+// Opening what is no file at all would fail in words that do not say so, or wait.
+Result<> checkKind(const std::filesystem::path& file)
+{
+    struct stat status = {};
+    if (stat(file.c_str(), &status) != 0)
+        return {};
+    const auto ordinary = checkOrdinary(status);
+    return ordinary ? ordinary : Failure{ordinary.sentence(), SQLITE_NOTADB};
 }
 
 bool isThere(const std::filesystem::path& file)
@@ -85,7 +96,9 @@ void Registry::open()
 {
     mReadOnly = isMarkedReadOnly(mFile);
     mLeftOpen = hasJournal(mFile);
-    Result<> ready = makeMissingFile();
+    Result<> ready = checkKind(mFile);
+    if (ready)
+        ready = makeMissingFile();
     if (ready)
         ready = openFile();
     if (ready)
@@ -380,7 +393,7 @@ Result<std::wstring> Registry::restoreCopy()
                             L" before Tessel is started again, since it was restored.",
                         ERROR_ACCESS_DENIED};
     return L"The registry " + toWide(mFile.string()) + L" was restored from the copy of " + time +
-           L"; what stood there is kept as " + toWide(kept->string()) +
+           (kept->empty() ? L"" : L"; what stood there is kept as " + toWide(kept->string())) +
            L". Start Tessel again: this session stores nothing more.";
 }
 } // namespace tessel

@@ -12,6 +12,7 @@
 #include <unistd.h>
 
 #include "host/platform/Descriptor.h"
+#include "host/registry/Journals.h"
 #include "host/registry/Schema.h"
 #include "host/registry/Soundness.h"
 #include "host/text/Unicode.h"
@@ -94,7 +95,8 @@ Result<> useCopy(sqlite3* database)
 Result<std::string> readCopy(const std::filesystem::path& copy)
 {
     sqlite3* opened = nullptr;
-    const int status = sqlite3_open_v2(copy.c_str(), &opened, SQLITE_OPEN_READONLY, nullptr);
+    constexpr int kFlags = SQLITE_OPEN_READONLY | SQLITE_OPEN_URI;
+    const int status = sqlite3_open_v2(asFixedFile(copy).c_str(), &opened, kFlags, nullptr);
     const std::unique_ptr<sqlite3, CloseDatabase> database(opened);
     const auto sound = status == SQLITE_OK ? useCopy(opened) : Result<>(storeFailure(opened, status));
     if (!sound)
@@ -106,11 +108,17 @@ Result<std::string> readCopy(const std::filesystem::path& copy)
     return std::string(image.get(), image.get() + size);
 }
 
-// What stands at the path gets a second name, in place of what had it before.
-Result<> nameToo(const std::filesystem::path& file, const std::filesystem::path& second)
+// What stands at the path gets a second name, in place of what had it before. A folder, which can have only
+// one name, loses its first. Whether anything stood there.
+Result<bool> nameToo(const std::filesystem::path& file, const std::filesystem::path& second)
 {
-    unlink(second.c_str());
-    return link(file.c_str(), second.c_str()) == 0 || errno == ENOENT ? Result<>() : systemFailure();
+    std::error_code unreachable;
+    const bool isFolder = is_directory(symlink_status(file, unreachable));
+    static_cast<void>(std::remove(second.c_str())); // if it stays, the next fails
+    const int status = isFolder ? rename(file.c_str(), second.c_str()) : link(file.c_str(), second.c_str());
+    if (status != 0 && errno != ENOENT)
+        return systemFailure();
+    return status == 0;
 }
 
 // A journal is part of the file that it was written for.
@@ -172,12 +180,13 @@ Result<std::filesystem::path> putSoundCopyBack(const std::filesystem::path& file
         return notRestored(file,
                            L"its copy " + toWide(copy.string()) + L" cannot be used: " + bytes.sentence());
     const auto kept = beside(file, ".damaged");
-    auto done = nameToo(file, kept);
-    if (done)
-        done = setJournalsAside(file, kept);
+    const auto named = nameToo(file, kept);
+    Result<> done = named ? setJournalsAside(file, kept) : named.failure();
     if (done)
         done = replace(file, *bytes);
-    return done ? Result<std::filesystem::path>(kept) : notRestored(file, done.sentence());
+    if (!done)
+        return notRestored(file, done.sentence());
+    return *named ? kept : std::filesystem::path();
 }
 
 Result<> makeFileOnce(const std::filesystem::path& file, std::string_view bytes)

@@ -26,8 +26,9 @@ std::wstring timeOfCopy(const std::filesystem::path& file);
 Result<> makeSoundCopy(sqlite3* database, const std::filesystem::path& file);
 
 // Puts the copy in the place of the file, which nobody of this process has open. What is there now is kept
-// beside it, with its journals: answers as which file. At every moment one of the two is in its place. Fails,
-// with a whole sentence and nothing changed, when there is no copy or it is damaged itself.
+// beside it, with its journals: answers as which file, with an empty path when nothing is there. At every
+// moment one of the two is in its place, unless that was a folder. Fails, with a whole sentence and nothing
+// changed, when there is no copy or it is damaged itself.
 Result<std::filesystem::path> putSoundCopyBack(const std::filesystem::path& file);
 
 // Writes a file of its own and makes it stand at the path, wholly on the disk, unless something is there

@@ -8,6 +8,7 @@
 #include "tests/e2e/HostProcess.h"
 
 using testing::AllOf;
+using testing::ContainsRegex;
 using testing::HasSubstr;
 
 namespace
@@ -55,7 +56,7 @@ TEST(RegistryFile, MarkedReadOnlyIsReadAndKeepsWhatItHolds)
     ASSERT_EQ(chmod((session.profile() / "registry.db").c_str(), S_IRUSR), 0);
     const auto result = session.run({R"(REGISTRY SET Software\Trial "a name" new)", kGet});
     EXPECT_EQ(result.exitStatus, 1);
-    EXPECT_THAT(result.output, AllOf(HasSubstr("cannot be written: "), HasSubstr("\ngröße 100%s\n")));
+    EXPECT_THAT(result.output, AllOf(HasSubstr("cannot be written. "), HasSubstr("\ngröße 100%s\n")));
 }
 
 TEST(RegistryFile, KeepsWhatItHoldsWhenItMayNotGrow)
@@ -80,6 +81,75 @@ TEST(RegistryFile, IsToldWhenItCannotBeMade)
     EXPECT_EQ(result.exitStatus, 1);
     EXPECT_THAT(result.output, AllOf(HasSubstr((session.profile() / "registry.db").string()),
                                      HasSubstr("Command: VERSION\nTessel R21")));
+}
+
+TEST(RegistryFile, ThatIsNoFileIsToldAsWhatItIs)
+{
+    const HostSession session;
+    std::filesystem::create_directories(session.profile() / "registry.db");
+    EXPECT_THAT(session.run({"VERSION"}).output,
+                HasSubstr("registry.db cannot be used: it is a folder, not a file. It was left"));
+    std::filesystem::remove(session.profile() / "registry.db");
+    ASSERT_EQ(mkfifo((session.profile() / "registry.db").c_str(), 0600), 0);
+    EXPECT_THAT(session.run({"VERSION"}).output,
+                HasSubstr("registry.db cannot be used: it is not an ordinary file. It was left"));
+}
+
+TEST(RegistryFile, ThatIsNoFileGivesWayToTheCopy)
+{
+    const HostSession session;
+    ASSERT_EQ(session.run({kSet}).exitStatus, 0);
+    const auto file = session.profile() / "registry.db";
+    for (const bool isFolder : {true, false})
+    {
+        std::filesystem::remove(file);
+        ASSERT_TRUE(isFolder ? std::filesystem::create_directory(file) : mkfifo(file.c_str(), 0600) == 0);
+        const auto result = session.run({"REGISTRY RESTORE", kGet});
+        EXPECT_EQ(result.exitStatus, 0) << result.output;
+        EXPECT_THAT(result.output,
+                    AllOf(HasSubstr("REGISTRY RESTORE puts back the copy of 2"),
+                          HasSubstr("kept as " + file.string() + ".damaged"), HasSubstr("\ngröße 100%s\n")));
+        EXPECT_TRUE(std::filesystem::exists(file.string() + ".damaged"));
+    }
+}
+
+TEST(RegistryFile, ThatIsMissingIsRestoredWithoutMentionOfWhatStoodThere)
+{
+    const HostSession session;
+    ASSERT_EQ(session.run({kSet}).exitStatus, 0);
+    std::filesystem::remove(session.profile() / "registry.db");
+    const auto result = session.run({"REGISTRY RESTORE", kGet});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, AllOf(HasSubstr("was restored from the copy of 2"),
+                                     ContainsRegex(":[0-9][0-9]\\. Start Tessel again: this session"),
+                                     HasSubstr("\ngröße 100%s\n")));
+}
+
+TEST(RegistryFile, LeavesNoFilesBesideTheCopyThatIsPutBack)
+{
+    const HostSession session;
+    ASSERT_EQ(session.run({kSet}).exitStatus, 0);
+    std::filesystem::remove(session.profile() / "registry.db");
+    ASSERT_EQ(session.run({"REGISTRY RESTORE"}).exitStatus, 0);
+    EXPECT_TRUE(std::filesystem::exists(session.profile() / "registry.db.sound"));
+    for (const char* ending : {"-wal", "-shm"})
+        EXPECT_FALSE(
+            std::filesystem::exists(session.profile() / ("registry.db.sound" + std::string(ending))));
+}
+
+TEST(RegistryFile, ThatTakesNothingEndsItsSentencesOnce)
+{
+    const HostSession session;
+    ASSERT_EQ(session.run({kSet}).exitStatus, 0);
+    const auto file = session.profile() / "registry.db";
+    ASSERT_EQ(chmod(file.c_str(), S_IRUSR), 0);
+    const auto result = session.run({kSet, R"(REGISTRY DELETE Software\Trial)"});
+    const std::string reason = " cannot be written. The registry " + file.string() +
+                               " may only be read: what is stored there is used, and nothing new will be "
+                               "stored.\n";
+    EXPECT_THAT(result.output,
+                AllOf(HasSubstr(std::string(kSet) + "\nThe registry key \"Software\\Trial\"" + reason),
+                      HasSubstr("DELETE Software\\Trial\nThe registry key \"Software\\Trial\"" + reason)));
 }
 
 TEST(ProfileFolder, IsToldWhenItCannotBeMade)

@@ -147,7 +147,7 @@ TEST_F(TroubledStore, IsRestoredByTheCommand)
                 HasSubstr("nothing will be stored. REGISTRY RESTORE puts back the copy of 2"));
     EXPECT_THAT(damaged.output, HasSubstr("was restored from the copy of 2"));
     EXPECT_THAT(damaged.output, HasSubstr("Start Tessel again: this session stores nothing more.\n"));
-    EXPECT_THAT(damaged.output, HasSubstr("cannot be written: "));
+    EXPECT_THAT(damaged.output, HasSubstr("cannot be written. "));
     const auto next = session.run({"VERSION", "REGISTRY RESTORE"});
     EXPECT_THAT(next.output, HasSubstr("Good.zmb: message 1\ngood.lsp: loaded\n"));
     EXPECT_THAT(next.output, HasSubstr("is not known to be damaged; it was left as it is."));
