@@ -80,10 +80,12 @@ std::string decoded(std::string_view line)
 std::vector<std::string_view> linesOf(std::string_view content)
 {
     std::vector<std::string_view> lines;
+    if (content.substr(0, content.find('\n')) == kFormat) // once: such a line may have been typed, too
+        content.remove_prefix(kFormat.size());
     while (!content.empty())
     {
         const std::size_t end = std::min(content.find('\n'), content.size());
-        if (end > 0 && content.substr(0, end) != kFormat)
+        if (end > 0)
             lines.push_back(content.substr(0, end));
         content.remove_prefix(std::min(end + 1, content.size()));
     }

@@ -137,6 +137,17 @@ TEST_F(TypedHistory, EndsAHalfLineOfAKilledSession)
     EXPECT_EQ(content(), "_HiStOrY_V2_\nVERSION\nHEL\nAPPS\n");
 }
 
+TEST_F(TypedHistory, KeepsALineThatIsCalledLikeItsFormat)
+{
+    put("_HiStOrY_V2_\nVERSION\n_HiStOrY_V2_\n");
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type(kArrowUp);
+    EXPECT_TRUE(terminal.shows("_HiStOrY_V2_")) << terminal.screen();
+    terminal.type(kArrowUp);
+    EXPECT_TRUE(terminal.shows("VERSION")) << terminal.screen();
+}
+
 TEST_F(TypedHistory, IsShortenedToItsLastLines)
 {
     std::string lines = "_HiStOrY_V2_\n";
