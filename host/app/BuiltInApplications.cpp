@@ -46,10 +46,21 @@ Result<> loadLisp(Parts& parts, const std::wstring& path)
     return value ? succeed(parts, path + L" is loaded.") : value.failure();
 }
 
+// "ftp://host/file". A file may be called so all the same.
+bool seemsAnAddress(const std::wstring& typed)
+{
+    const auto scheme = typed.substr(0, typed.find(L"://"));
+    return !scheme.empty() && scheme.size() < typed.size() && scheme.find(L'/') == scheme.npos;
+}
+
 // The file to load; that of an address is fetched first.
 Result<std::wstring> localFile(Parts& parts, const std::wstring& typed)
 {
-    if (!parts.information->isUrl(typed.c_str()))
+    const bool canBeFetched = parts.information->isUrl(typed.c_str());
+    if (!canBeFetched && seemsAnAddress(typed) && !parts.files->find(toPath(typed)))
+        return Failure{L"The address " + typed +
+                       L" cannot be loaded: only http and https addresses can be fetched."};
+    if (!canBeFetched)
         return fullPath(parts, typed);
     const auto copy = parts.remote->fetch(typed, kAnyLength, false);
     return copy ? Result<std::wstring>(copy->path) : copy.failure();

@@ -50,6 +50,22 @@ TEST(Session, ListsItsCommandsByGroup)
     EXPECT_THAT(result.output, HasSubstr("Command: help load\n  LOAD"));
 }
 
+TEST(Session, PartsALongUsageFromItsSummary)
+{
+    const HostSession session;
+    EXPECT_THAT(session.run({"HELP REGISTRY"}).output, HasSubstr(" | RESTORE Works on the registry"));
+}
+
+TEST(Session, LoadsFromHttpAndHttpsAddressesOnly)
+{
+    const HostSession session;
+    const auto result = session.run({"LOAD ftp://nowhere.invalid/a.lsp", "LOAD ://a.lsp"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, HasSubstr("a.lsp\nThe address ftp://nowhere.invalid/a.lsp cannot be loaded: "
+                                         "only http and https addresses can be fetched.\n"));
+    EXPECT_THAT(result.output, HasSubstr("Cannot load \"")) << "what is no address is a file";
+}
+
 TEST(Session, ShowsTheHelpBookWithoutABrowser)
 {
     const HostSession session;
