@@ -3,6 +3,8 @@
 #include <array>
 #include <new>
 
+#include "host/text/Hexadecimal.h"
+
 namespace tessel
 {
 namespace
@@ -33,10 +35,7 @@ std::string Sha256::finish()
     expect(EVP_DigestFinal_ex(mContext.get(), digest.data(), &length));
     std::string digits;
     for (unsigned i = 0; i < length; ++i)
-    {
-        digits += "0123456789abcdef"[digest[i] >> 4];
-        digits += "0123456789abcdef"[digest[i] & 0xF];
-    }
+        digits += hexadecimal<char>(digest[i], kSmallHexDigits);
     return digits;
 }
 } // namespace tessel

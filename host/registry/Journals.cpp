@@ -4,16 +4,15 @@
 
 #include <array>
 #include <cerrno>
-#include <charconv>
 #include <cstdint>
 #include <cstdio>
 #include <cstring>
 #include <fstream>
-#include <iterator>
 #include <optional>
 #include <string_view>
 #include <vector>
 
+#include "host/text/Hexadecimal.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -158,9 +157,7 @@ std::string asFixedFile(const std::filesystem::path& file)
             uri += character;
             continue;
         }
-        char digits[2]; // each of these characters takes both
-        std::to_chars(std::begin(digits), std::end(digits), static_cast<int>(character), 16);
-        uri += '%' + std::string(digits, std::size(digits));
+        uri += '%' + hexadecimal<char>(static_cast<unsigned char>(character));
     }
     return uri + "?immutable=1";
 }

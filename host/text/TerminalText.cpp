@@ -1,6 +1,7 @@
 #include "host/text/TerminalText.h"
 
 #include "host/text/Credentials.h"
+#include "host/text/Hexadecimal.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -17,12 +18,6 @@ bool isOrder(wchar_t character)
         (character >= 0 && character < L' ') || (character >= kDelete && character <= kLastControl);
     return isControl && character != L'\n' && character != L'\t';
 }
-
-std::wstring escaped(wchar_t control)
-{
-    constexpr wchar_t kDigits[] = L"0123456789ABCDEF";
-    return {L'\\', L'x', kDigits[control >> 4], kDigits[control & 0xF]};
-}
 } // namespace
 
 std::wstring forTerminal(std::wstring_view text)
@@ -33,7 +28,7 @@ std::wstring forTerminal(std::wstring_view text)
         if (!isOrder(text[at]))
             result += text[at];
         else if (!text.substr(at).starts_with(L"\r\n"))
-            result += escaped(text[at]);
+            result += shownByte<wchar_t>(static_cast<unsigned char>(text[at]));
     return withReadableBytes(withoutCredentials(result));
 }
 } // namespace tessel

@@ -8,6 +8,8 @@
 #include <iterator>
 #include <type_traits>
 
+#include "host/text/Hexadecimal.h"
+
 namespace tessel
 {
 namespace
@@ -132,12 +134,11 @@ std::u16string toUtf16(std::wstring_view text)
 
 std::wstring withReadableBytes(std::wstring_view text)
 {
-    constexpr wchar_t kDigits[] = L"0123456789ABCDEF";
     std::wstring readable;
     readable.reserve(text.size());
     for (const wchar_t character : text)
         if (const auto code = static_cast<char32_t>(character); isByte(code))
-            readable += {L'\\', L'x', kDigits[code >> 4 & 0xF], kDigits[code & 0xF]};
+            readable += shownByte<wchar_t>(static_cast<unsigned char>(code));
         else
             readable += character;
     return readable;

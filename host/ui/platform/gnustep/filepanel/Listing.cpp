@@ -11,6 +11,7 @@
 #include <dirent.h>
 #include <sys/stat.h>
 
+#include "host/text/Hexadecimal.h"
 #include "host/text/Unicode.h"
 
 namespace tessel::filepanel
@@ -69,12 +70,6 @@ bool isFolder(const dirent& file, const std::string& folder)
 bool isListed(const std::string& name, bool withHiddenFiles)
 {
     return name != "." && name != ".." && (withHiddenFiles || !name.starts_with('.'));
-}
-
-std::string escaped(unsigned char byte)
-{
-    constexpr char kDigits[] = "0123456789ABCDEF";
-    return {'\\', 'x', kDigits[byte >> 4], kDigits[byte & 0xF]};
 }
 
 // Negative, zero or positive.
@@ -150,7 +145,7 @@ std::string shownName(const std::string& name)
         if (character == '\n')
             shown += "\\n";
         else if (std::iscntrl(static_cast<unsigned char>(character)))
-            shown += escaped(static_cast<unsigned char>(character));
+            shown += shownByte<char>(static_cast<unsigned char>(character));
         else
             shown += character;
     return readableName(shown);
