@@ -121,7 +121,7 @@ TEST_F(RegistryFile, ThatIsAFolderIsNotUsed)
     folder.write(kFile + "/in the way", "");
     Registry registry(file());
     EXPECT_THAT(tessel::toUtf8(registry.canStore().sentence()),
-                AllOf(HasSubstr(file().string()), HasSubstr("unable to open database file")));
+                AllOf(HasSubstr(file().string()), HasSubstr("it is a folder, not a file")));
     expectUseless(registry);
 }
 
