@@ -1,9 +1,11 @@
 // DISABLE, ENABLE, BISECT: which applications are loaded at starts.
 #include <algorithm>
+#include <filesystem>
 
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
+#include "host/platform/Bundle.h"
 
 namespace tessel
 {
@@ -11,42 +13,125 @@ namespace
 {
 constexpr wchar_t kApplicationsGroup[] = L"Applications";
 
-// The name alone is enough for what is loaded.
-std::wstring pathToKeepOut(const Parts& parts, const std::wstring& typed)
+using Texts = std::vector<std::wstring>;
+
+// A bundle is a folder; no other folder is an application.
+Result<> checkIsApplication(const std::wstring& path)
 {
-    const std::wstring module = parts.linker->pathOfModule(typed);
-    return module.empty() ? fullPath(parts, typed) : module;
+    std::error_code failed;
+    const auto status = std::filesystem::status(toPath(path), failed);
+    if (!std::filesystem::exists(status))
+        return Failure{L"There is no application \"" + path + L"\" that could be kept out."};
+    if (std::filesystem::is_directory(status) && !isBundlePath(toUtf8(path)))
+        return Failure{L"\"" + path + L"\" is a folder and no application."};
+    return {};
 }
 
-// The name alone is enough for what is kept out.
-std::wstring pathToLetIn(const Parts& parts, const std::wstring& typed)
+bool isCalled(const std::wstring& path, const std::wstring& name)
 {
-    const auto& all = parts.keptOut.all();
-    const auto named = std::ranges::find_if(
-        all, [&](const KeptOutApplication& application)
-        { return equalIgnoringCase(toText(toPath(toWide(application.path)).filename()), typed); });
-    return named == all.end() ? fullPath(parts, typed) : toWide(named->path);
+    return equalIgnoringCase(toText(toPath(path).filename()), name);
+}
+
+bool isSameFile(const std::wstring& path, const std::wstring& other)
+{
+    std::error_code failed; // what is not there is no other file than itself
+    return path == other || std::filesystem::equivalent(toPath(path), toPath(other), failed);
+}
+
+// Of the applications that the host knows the whole path of.
+Texts applicationsCalled(const Parts& parts, const std::wstring& name)
+{
+    Texts known;
+    for (const auto& module : parts.linker->loadedModules())
+        known.push_back(module.path);
+    for (int index = 0; index < parts.document->loadedApplicationCount(); ++index)
+        known.emplace_back(parts.document->loadedApplicationName(index));
+    for (const auto& outcome : parts.loadOutcomes.failed())
+        known.push_back(outcome.path);
+    for (const auto& record : parts.records->all())
+        known.push_back(record.module);
+    known.push_back(toText(parts.layout.plugIns / toPath(name)));
+    std::erase_if(known,
+                  [&](const auto& path) { return !isCalled(path, name) || !checkIsApplication(path); });
+    return known;
+}
+
+Texts keptOutCalled(const Parts& parts, const std::wstring& name)
+{
+    Texts result;
+    for (const auto& application : parts.keptOut.all())
+        if (isCalled(toWide(application.path), name))
+            result.push_back(toWide(application.path));
+    return result;
+}
+
+// Of at least one.
+Result<std::wstring> onlyOneOf(const Texts& paths, const std::wstring& typed)
+{
+    Texts different;
+    for (const std::wstring& path : paths)
+        if (std::ranges::none_of(different, [&](const auto& other) { return isSameFile(path, other); }))
+            different.push_back(path);
+    if (different.size() < 2)
+        return different.front();
+    std::wstring sentence =
+        L"Several applications are called \"" + typed + L"\"; type the whole path of one:";
+    for (const std::wstring& path : different)
+        sentence += L"\n  " + path;
+    return Failure{sentence};
+}
+
+// The name alone is enough for what the host knows; a file of that name where the user is counts as well.
+Result<std::wstring> pathToKeepOut(const Parts& parts, const std::wstring& typed)
+{
+    Texts candidates = applicationsCalled(parts, typed);
+    const std::wstring here = fullPath(parts, typed);
+    const auto checked = checkIsApplication(here);
+    if (checked)
+        candidates.push_back(here);
+    else if (candidates.empty())
+        return checked.failure();
+    return onlyOneOf(candidates, typed);
+}
+
+Result<std::wstring> pathToLetIn(const Parts& parts, const std::wstring& typed)
+{
+    Texts candidates = keptOutCalled(parts, typed);
+    const std::wstring here = fullPath(parts, typed);
+    if (const KeptOutApplication* known = parts.keptOut.find(toUtf8(here)); known || candidates.empty())
+        candidates.push_back(known ? toWide(known->path) : here);
+    return onlyOneOf(candidates, typed);
+}
+
+bool isOneFile(const CommandStack::Arguments& arguments)
+{
+    return arguments.size() == 1 && !arguments.front().empty();
 }
 
 Result<> disable(Parts& parts, const CommandStack::Arguments& arguments)
 {
-    if (arguments.size() != 1)
+    if (!isOneFile(arguments))
         return wrongUsage(parts, L"DISABLE");
-    const std::wstring path = pathToKeepOut(parts, arguments.front());
-    if (auto kept = parts.keptOut.keepOut(toUtf8(path)); !kept)
+    const auto path = pathToKeepOut(parts, arguments.front());
+    if (!path)
+        return path.failure();
+    if (auto kept = parts.keptOut.keepOut(toUtf8(*path)); !kept)
         return kept;
-    return succeed(parts, path + L" is kept out at starts from now on; ENABLE lets it in again.");
+    return succeed(parts, *path + L" is kept out at starts from now on; ENABLE lets it in again.");
 }
 
 Result<> enable(Parts& parts, const CommandStack::Arguments& arguments)
 {
-    if (arguments.size() != 1)
+    if (!isOneFile(arguments))
         return wrongUsage(parts, L"ENABLE");
-    const std::wstring path = pathToLetIn(parts, arguments.front());
-    if (auto let = parts.keptOut.letIn(toUtf8(path)); !let)
+    const auto path = pathToLetIn(parts, arguments.front());
+    if (!path)
+        return path.failure();
+    if (auto let = parts.keptOut.letIn(toUtf8(*path)); !let)
         return let;
-    return succeed(parts, path + L" is loaded at starts again.");
+    return succeed(parts, *path + L" is not kept out at starts any more.");
 }
+
 Result<std::wstring> runBisect(Parts& parts, const std::wstring& word)
 {
     if (equalIgnoringCase(word, L"START"))

@@ -1,4 +1,6 @@
 // A person keeps an application out at starts, and lets it in again.
+#include <fstream>
+
 #include <gmock/gmock.h>
 
 #include <sys/inotify.h>
@@ -43,7 +45,7 @@ TEST_F(KeptOutByHand, IsAModuleUntilItIsLetIn)
         EXPECT_THAT(said, AllOf(HasSubstr("good.lsp: loaded"), Not(HasSubstr("message 1"))));
     }
     const auto enabled = session.run({"ENABLE good.zmb"});
-    EXPECT_THAT(enabled.output, HasSubstr(good + " is loaded at starts again.\n"));
+    EXPECT_THAT(enabled.output, HasSubstr(good + " is not kept out at starts any more.\n"));
     EXPECT_THAT(startSays(), AllOf(HasSubstr("Good.zmb: message 1"), Not(HasSubstr("kept out"))));
 }
 
@@ -126,6 +128,131 @@ TEST_F(KeptOutByHand, LetsInWhatEndedTheHost)
     session.run({});
     EXPECT_EQ(session.run({"ENABLE abort.zmb"}).exitStatus, 0);
     EXPECT_EQ(session.run({"VERSION"}).exitStatus, -SIGABRT) << "it is tried again";
+}
+
+// Everything that is loaded lies somewhere below the root: a path that is none must not keep all of it out.
+TEST_F(KeptOutByHand, IsNothingWithoutAPath)
+{
+    const auto disabled = session.run({R"(DISABLE "")"});
+    EXPECT_EQ(disabled.exitStatus, 1);
+    EXPECT_THAT(disabled.output, HasSubstr("Usage: DISABLE file\n"));
+    EXPECT_THAT(session.run({R"(ENABLE "")"}).output, HasSubstr("Usage: ENABLE file\n"));
+    EXPECT_THAT(startSays(), AllOf(HasSubstr(listed(modrigBundle())), Not(HasSubstr("kept out"))));
+}
+
+TEST_F(KeptOutByHand, IsNothingWhereTheListHoldsAnEmptyPath)
+{
+    session.run({"DISABLE " + good});
+    const auto file = session.profile() / "applications" / "kept-out";
+    std::string content = contentOf(file);
+    for (auto at = content.find(good); at != content.npos; at = content.find(good))
+        content.erase(at, good.size());
+    std::ofstream(file) << content;
+    EXPECT_THAT(startSays(), HasSubstr(listed(modrigBundle())));
+}
+
+TEST_F(KeptOutByHand, IsNoFolder)
+{
+    const auto folder = session.folder() / "apps";
+    std::filesystem::create_directory(folder);
+    const auto result = session.run({"DISABLE " + folder.string(), "DISABLE /"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, HasSubstr("\"" + folder.string() + "\" is a folder and no application.\n"));
+    EXPECT_THAT(result.output, HasSubstr("\"/\" is a folder and no application.\n"));
+    EXPECT_THAT(startSays(), Not(HasSubstr("kept out")));
+}
+
+TEST_F(KeptOutByHand, IsNothingThatIsNotThere)
+{
+    const auto result = session.run({"DISABLE " + session.folder().path().string() + "/nothere.zmb"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, HasSubstr("There is no application \"" + session.folder().path().string() +
+                                         "/nothere.zmb\" that could be kept out.\n"));
+    EXPECT_THAT(startSays(), Not(HasSubstr("kept out")));
+}
+
+TEST_F(KeptOutByHand, MayBeModrigByNameWhileItIsNotLoaded)
+{
+    session.alwaysWith({"--safe"});
+    const auto result = session.run({"DISABLE Modrig.bundle"});
+    EXPECT_THAT(result.output, HasSubstr("\n" + modrigBundle() + " is kept out at starts from now on;"));
+    session.alwaysWith({});
+    EXPECT_THAT(startSays(), Not(HasSubstr(listed(modrigBundle()))));
+}
+
+TEST_F(KeptOutByHand, MayBeANamedFileThatCouldNotBeLoaded)
+{
+    const auto file = session.folder().write("broken.lsp", "(");
+    storeSuite(session, {file.string()});
+    const auto result = session.run({"DISABLE broken.lsp"});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, HasSubstr("\n" + file.string() + " is kept out at starts from now on;"));
+}
+
+namespace
+{
+// Two files of one name, with the second in the current folder.
+class KeptOutNamesakes : public KeptOutByHand
+{
+protected:
+    void SetUp() override
+    {
+        const auto folder = session.folder() / "here";
+        std::filesystem::create_directory(folder);
+        std::filesystem::copy_file(lisp, first);
+        std::filesystem::copy_file(lisp, second);
+        session.startBy("cd '" + folder.string() + "' && exec \"$0\" \"$@\"");
+    }
+
+    std::string first = session.folder() / "same.lsp";
+    std::string second = session.folder() / "here" / "same.lsp";
+    std::string both = "Several applications are called \"same.lsp\"; type the whole path of one:\n  " +
+                       first + "\n  " + second + "\n";
+};
+} // namespace
+
+TEST_F(KeptOutNamesakes, AreToldApartWhenOneIsToBeKeptOut)
+{
+    storeSuite(session, {first});
+    const auto result = session.run({"DISABLE same.lsp"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, HasSubstr(both));
+    EXPECT_THAT(startSays(), Not(HasSubstr("kept out")));
+}
+
+TEST_F(KeptOutNamesakes, AreToldApartWhenOneIsToBeLetIn)
+{
+    session.run({"DISABLE " + first, "DISABLE " + second});
+    const auto result = session.run({"ENABLE same.lsp"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, HasSubstr(both));
+    EXPECT_EQ(session.run({"ENABLE " + second}).exitStatus, 0);
+    EXPECT_THAT(session.run({"ENABLE same.lsp"}).output,
+                HasSubstr("\n" + first + " is not kept out at starts any more.\n"));
+}
+
+// It was wished for: nothing has gone wrong.
+TEST_F(KeptOutByHand, IsToldInOneLineAndNotAsAFailure)
+{
+    storeSuite(session, {good, lisp});
+    session.run({"DISABLE " + good, "DISABLE " + lisp});
+    const std::string said = session.run({"APPS"}).output;
+    const std::string start = said.substr(0, said.find("Command: "));
+    EXPECT_THAT(start, AllOf(Not(HasSubstr("could not be loaded")), Not(HasSubstr("Message: "))));
+    EXPECT_EQ(start.find(good), start.rfind(good)) << start;
+    EXPECT_EQ(start.find(lisp), start.rfind(lisp)) << start;
+    const std::string apps = said.substr(start.size());
+    EXPECT_THAT(apps, ContainsRegex("  Good\\.zmb .* " + std::string(kReason) + "\n"));
+    EXPECT_THAT(apps, ContainsRegex("  good\\.lsp .* " + std::string(kReason) + "\n"));
+}
+
+TEST_F(KeptOutByHand, LeavesOnlyTheOthersAsFailures)
+{
+    const std::string missing = session.folder().path().string() + "/missing.zmb";
+    storeSuite(session, {good, missing});
+    session.run({"DISABLE " + good});
+    EXPECT_THAT(startSays(), AllOf(HasSubstr("Message: 1 application could not be loaded:\n  " + missing),
+                                   Not(HasSubstr("“" + good + "”"))));
 }
 
 TEST_F(KeptOutByHand, FailsWithAWordWhereNothingCanBeStored)
