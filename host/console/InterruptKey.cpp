@@ -7,6 +7,8 @@
 #include <unistd.h>
 
 #include "host/console/EndQuestion.h"
+#include "host/platform/RunningMarker.h"
+#include "host/text/Running.h"
 
 namespace tessel
 {
@@ -18,11 +20,19 @@ volatile std::sig_atomic_t theWriteEnd = -1;
 
 constexpr int kEndedByKey = 128 + SIGINT; // as shells have it
 
+// What runs would have to come back for a better end.
+[[noreturn]] void endAtOnce()
+{
+    if (RunningMarker* marker = running<RunningMarker>())
+        marker->noteEnding(RunningMarker::kEndedByKey);
+    _exit(kEndedByKey);
+}
+
 void onKey(int)
 {
     const int before = errno;
     if (theKeysRunner->interrupt() && endIsWanted())
-        _exit(kEndedByKey); // what runs would have to come back for a better end
+        endAtOnce();
     // A pipe that is full has notes enough.
     [[maybe_unused]] const auto written = write(theWriteEnd, "", 1);
     errno = before;

@@ -265,6 +265,7 @@ std::string_view wordsForEnding(int ending) noexcept
     };
     static constexpr Words kWords[] = {{RunningMarker::kVanished, "killed or switched off"},
                                        {RunningMarker::kCalledExit, "it called \"exit\""},
+                                       {RunningMarker::kEndedByKey, "you ended it with Ctrl-C"},
                                        {SIGSEGV, "memory fault (SIGSEGV)"},
                                        {SIGBUS, "memory fault (SIGBUS)"},
                                        {SIGABRT, "it was given up (SIGABRT)"},

@@ -40,6 +40,7 @@ public:
     // How a session ended that did not end in good order: the number of a signal, or one of these.
     static constexpr int kVanished = 0; // nobody could say anything any more
     static constexpr int kCalledExit = -1;
+    static constexpr int kEndedByKey = -2; // a person wished it, after Ctrl-C in vain
 
     struct Work
     {

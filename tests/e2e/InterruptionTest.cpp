@@ -91,6 +91,9 @@ TEST_F(Interruption, AsksWhetherToEndTheHostAtTheThirdTime)
     ASSERT_TRUE(asksAfter(terminal, kInVain)) << terminal.screen();
     terminal.type("y\r");
     EXPECT_EQ(terminal.waitForEnd(), kEndedByKey) << terminal.screen();
+    EXPECT_THAT(
+        session.run({}).output,
+        testing::HasSubstr("while its command \"HANG\" ran (asked for by hand): you ended it with Ctrl-C. "));
 }
 
 TEST_F(Interruption, WaitsOnAfterAnyOtherAnswer)
