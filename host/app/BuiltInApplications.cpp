@@ -9,6 +9,7 @@
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
+#include "host/text/TerminalText.h"
 
 namespace tessel
 {
@@ -99,8 +100,12 @@ Result<> unload(Parts& parts, const CommandStack::Arguments& arguments)
 void sayApplication(Parts& parts, const std::wstring& path, const std::wstring& state)
 {
     const auto file = toPath(path);
-    sayLine(parts, L"  " + padded(toText(file.filename()), kNameColumn) + L" " +
-                       padded(toText(file.parent_path()), kFolderColumn) + L" " + state);
+    const auto column = [](const std::filesystem::path& text, std::size_t width)
+    {
+        return padded(forTerminal(toText(text)), width); // an escape is longer than what it stands for
+    };
+    sayLine(parts, L"  " + column(file.filename(), kNameColumn) + L" " +
+                       column(file.parent_path(), kFolderColumn) + L" " + state);
 }
 
 // "0.4 ms", "37 ms", "2.1 s".
