@@ -33,15 +33,16 @@ Result<> Admission::check(const std::wstring& path)
     if (reason == Reason::kByHand || (mSafe && !isOfStart(reason)))
         return {};
     if (mSafe)
-        return Failure{L"Tessel was started with --safe and loads nothing by itself"};
+        return Failure{L"Tessel was started with --safe and loads nothing by itself", kKeptOut};
     const KeptOutApplication* known = mKeptOut.find(toUtf8(path));
     if (known && keepsOut(*known, reason))
-        return Failure{L"it is " + reasonOf(*known)};
+        return Failure{L"it is " + reasonOf(*known),
+                       isOfStart(reason) && mKeptOut.wasTold(*known) ? kToldAtStart : kKeptOut};
     if (!isOfStart(reason))
         return {};
     mAskedFor.push_back(toUtf8(path));
     if (mBisecting.keepsOut(mAskedFor.back()))
-        return Failure{L"it is kept out at this start by BISECT"};
+        return Failure{L"it is kept out at this start by BISECT", kToldAtStart};
     return {};
 }
 

@@ -27,7 +27,14 @@ public:
     RunningMarker& marker() const { return mMarker; }
     bool isSafe() const { return mSafe; }
 
-    // Asked with a full path before its file is opened. Why not is the end of a sentence, without its stop.
+    // Why an application is refused that is kept out: nothing has gone wrong. The start has told of the
+    // second kind already, by its path. Other failures of loading have the system's numbers, from 1 on.
+    static constexpr int kKeptOut = -1;
+    static constexpr int kToldAtStart = -2;
+    static bool isKeptOut(int code) { return code == kKeptOut || code == kToldAtStart; }
+
+    // Asked with a full path before its file is opened. Why not is the end of a sentence, without its stop,
+    // and one of the codes above.
     Result<> check(const std::wstring& path);
     // Why the application is kept out at starts, as a part of a sentence; empty for one that is not.
     std::wstring whyKeptOut(const std::wstring& path) const;

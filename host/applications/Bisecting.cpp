@@ -157,8 +157,11 @@ Result<std::wstring> Bisecting::answer(bool wasGood)
         return L"BISECT has found it: \"" + toWide(search->suspects[bisection.culprit()]) +
                L"\" makes the trouble. DISABLE keeps it out at starts.";
     case Bisection::Verdict::kNone:
-        return L"BISECT says that it is none of them: the trouble is there when all of the " +
-               counted(search->suspects.size(), L" suspect is", L" suspects are") + L" kept out.";
+        return L"BISECT says that it is none of them: the trouble is there when " +
+               (search->suspects.size() == 1
+                    ? std::wstring(L"the only suspect is")
+                    : L"all of the " + std::to_wstring(search->suspects.size()) + L" suspects are") +
+               L" kept out.";
     case Bisection::Verdict::kTogether:
         return std::wstring(L"BISECT says that none of them does it alone: several are needed together.");
     case Bisection::Verdict::kOpen:

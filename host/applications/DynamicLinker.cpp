@@ -93,8 +93,11 @@ bool DynamicLinker::loadModule(const wchar_t* path, bool sayWhyNot, bool resolve
         mOutcomes.note(fullPath, loaded, begun);
     if (loaded)
         return true;
-    mMessageBox.explain(fullPath, loaded.sentence() + L".");
-    if (sayWhyNot)
+    if (Admission::isKeptOut(loaded.code()))
+        mMessageBox.passOver(fullPath);
+    else
+        mMessageBox.explain(fullPath, loaded.sentence() + L".");
+    if (sayWhyNot && loaded.code() != Admission::kToldAtStart)
         say(fullPath, L"is not loaded: ", loaded.sentence());
     return false;
 }

@@ -30,7 +30,8 @@ std::string realPathOf(const std::string& path)
 // The program inside a bundle is the same application as the bundle.
 bool isWithin(std::string_view path, std::string_view folder)
 {
-    return path == folder || (path.starts_with(folder) && path.substr(folder.size()).starts_with('/'));
+    return !folder.empty() &&
+           (path == folder || (path.starts_with(folder) && path.substr(folder.size()).starts_with('/')));
 }
 
 auto findIn(auto& applications, const std::string& path)
@@ -127,6 +128,14 @@ std::optional<KeptOutApplication> parseLine(std::string_view line)
     return result;
 }
 
+Failure damaged(const std::filesystem::path& file)
+{
+    return {
+        L"The file " + toWide(file.string()) +
+        L" is damaged; without it Tessel does not know which applications to keep out. Remove it to begin "
+        L"with none."};
+}
+
 std::wstring dayAndTime(std::int64_t seconds)
 {
     const auto time = static_cast<std::time_t>(seconds);
@@ -161,8 +170,9 @@ bool isUnchanged(KeptOutApplication& application)
 // Whoever leaves or switches off while a window waits for them has nothing to complain of.
 bool isGuilty(const RunningMarker::Leftover& leftover)
 {
-    const bool fromOutside =
-        leftover.ending == RunningMarker::kVanished || leftover.ending == RunningMarker::kCalledExit;
+    const bool fromOutside = leftover.ending == RunningMarker::kVanished ||
+                             leftover.ending == RunningMarker::kCalledExit ||
+                             leftover.ending == RunningMarker::kEndedByKey;
     return !leftover.work.path.empty() && !(leftover.work.waitsForPerson && fromOutside);
 }
 
@@ -176,18 +186,6 @@ void forgetChanged(std::vector<KeptOutApplication>& applications)
     applications = std::move(staying);
 }
 
-void giveTrials(std::vector<KeptOutApplication>& applications, std::vector<std::wstring>& sentences)
-{
-    for (KeptOutApplication& application : applications)
-    {
-        if (application.stage != Stage::kThisTime)
-            continue;
-        application.stage = Stage::kOnTrial;
-        application.hash = contentHash(application.path); // it is about to be opened in any case
-        sentences.push_back(L"The application \"" + toWide(application.path) + L"\" is tried once more: it " +
-                            whatHappened(application) + L".");
-    }
-}
 } // namespace
 
 KeptOut::KeptOut(std::filesystem::path folder) : mFile(folder / kFileName)
@@ -205,11 +203,14 @@ Result<KeptOut::Applications> KeptOut::read() const
     if (!*content)
         return applications;
     if (!(*content)->starts_with(kHeader) || !(*content)->ends_with('\n'))
-        return Failure{L"The file " + toWide(mFile.string()) +
-                       L" is damaged; without it Tessel does not know which applications to keep out."};
+        return damaged(mFile);
     for (const auto line : linesOf(std::string_view(**content).substr(kHeader.size())))
-        if (auto application = parseLine(line))
-            applications.push_back(*std::move(application));
+    {
+        auto application = parseLine(line);
+        if (!application)
+            return damaged(mFile);
+        applications.push_back(*std::move(application));
+    }
     return applications;
 }
 
@@ -239,16 +240,41 @@ std::vector<std::wstring> KeptOut::begin(const std::vector<RunningMarker::Leftov
         [&](Applications& applications)
         {
             forgetChanged(applications);
+            for (const auto& leftover : leftovers)
+            {
+                if (!isGuilty(leftover))
+                    continue;
+                sentences.push_back(judge(leftover, applications));
+                mTold.push_back(leftover.work.path);
+            }
             if (givesTrials)
                 giveTrials(applications, sentences);
-            for (const auto& leftover : leftovers)
-                if (isGuilty(leftover))
-                    sentences.push_back(judge(leftover, applications));
         });
     mStored = static_cast<bool>(stored);
     if (!stored)
         sentences.push_back(stored.sentence());
     return sentences;
+}
+
+void KeptOut::giveTrials(Applications& applications, std::vector<std::wstring>& sentences)
+{
+    for (KeptOutApplication& application : applications)
+    {
+        if (application.stage == Stage::kOnTrial)
+            mTried.push_back(application.path);
+        if (application.stage != Stage::kThisTime || wasTold(application))
+            continue;
+        mTried.push_back(application.path);
+        application.stage = Stage::kOnTrial;
+        application.hash = contentHash(application.path); // it is about to be opened in any case
+        sentences.push_back(L"The application \"" + toWide(application.path) + L"\" is tried once more: it " +
+                            whatHappened(application) + L".");
+    }
+}
+
+bool KeptOut::wasTold(const KeptOutApplication& application) const
+{
+    return std::ranges::find(mTold, application.path) != mTold.end();
 }
 
 std::wstring KeptOut::judge(const RunningMarker::Leftover& leftover, Applications& applications)
@@ -268,8 +294,11 @@ std::wstring KeptOut::judge(const RunningMarker::Leftover& leftover, Application
         return sentence + L"Its file is another one by now, and is tried.";
     guilty.facts = facts.value_or(FileFacts());
     const auto known = findIn(applications, guilty.path);
-    if (known == applications.end())
+    // One that has not been tried since still gets its trial.
+    if (known == applications.end() || known->stage == Stage::kThisTime)
     {
+        if (known != applications.end())
+            applications.erase(known);
         applications.push_back(guilty);
         return sentence + L"It is not loaded by itself at this start, and tried once more at the next.";
     }
@@ -290,6 +319,8 @@ const KeptOutApplication* KeptOut::find(const std::string& path) const
 
 Result<> KeptOut::keepOut(const std::string& path)
 {
+    if (path.empty())
+        return Failure{L"An application without a path cannot be kept out."};
     return change(
         [&](Applications& applications)
         {
@@ -326,7 +357,7 @@ void KeptOut::noteLoaded(const std::string& path, bool byHand)
     if (!known || known->stage == Stage::kByPerson)
         return;
     const std::string stored = known->path;
-    mSurvived.push_back(stored);
+    mTried.push_back(stored);
     // What cannot be stored now is no worse than it was: it is tried or loaded by hand again.
     if (byHand)
         static_cast<void>(letIn(stored));
@@ -334,7 +365,7 @@ void KeptOut::noteLoaded(const std::string& path, bool byHand)
 
 void KeptOut::noteGoodEnd()
 {
-    if (mSurvived.empty())
+    if (mTried.empty())
         return;
     static_cast<void>(change(
         [this](Applications& applications)
@@ -343,7 +374,7 @@ void KeptOut::noteGoodEnd()
                           [this](const KeptOutApplication& application)
                           {
                               return application.stage == Stage::kOnTrial &&
-                                     std::ranges::find(mSurvived, application.path) != mSurvived.end();
+                                     std::ranges::find(mTried, application.path) != mTried.end();
                           });
         }));
 }

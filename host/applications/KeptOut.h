@@ -3,8 +3,9 @@
 //
 // What ended the host is kept out at the next start, and tried once more at the one after that: a power cut
 // must not cost an application for good. If it ends the host again, it stays out until a person loads it with
-// success or lets it in, or until its file is another one. An application that was tried is forgotten here
-// when a session in which it was loaded ends in good order.
+// success or lets it in, or until its file is another one. An application on trial is forgotten here when the
+// session that tries it ends in good order, whether it was loaded or not: of what nothing loads by itself no
+// more can be learnt.
 //
 // All of it stands in a text file of the profile, which several sessions may change.
 #pragma once
@@ -59,8 +60,11 @@ public:
     explicit KeptOut(std::filesystem::path folder);
 
     // A start, with what earlier sessions have left: judges them, and gives those a trial whose time has
-    // come, unless nothing will be loaded by itself anyway. Answers what a person is to be told.
+    // come, unless nothing will be loaded by itself anyway. Answers what a person is to be told. What was
+    // judged now waits for the next start.
     std::vector<std::wstring> begin(const std::vector<RunningMarker::Leftover>& leftovers, bool givesTrials);
+    // Whether it was judged at this start, and a person was told.
+    bool wasTold(const KeptOutApplication& application) const;
     // Whether all that was learnt is stored.
     bool isStored() const { return mStored; }
 
@@ -72,7 +76,7 @@ public:
     Result<> keepOut(const std::string& path);
     Result<> letIn(const std::string& path);
 
-    // It was loaded, by a person's wish or without: the host has survived it.
+    // It was loaded, by a person's wish or without, and the host is still there.
     void noteLoaded(const std::string& path, bool byHand);
     // The session ends in good order.
     void noteGoodEnd();
@@ -84,10 +88,12 @@ private:
     // Changes what is stored now, which another session may have changed since it was read.
     Result<> change(const std::function<void(Applications&)>& work);
     static std::wstring judge(const RunningMarker::Leftover& leftover, Applications& applications);
+    void giveTrials(Applications& applications, std::vector<std::wstring>& sentences);
 
     std::filesystem::path mFile;
     Applications mApplications;
-    std::vector<std::string> mSurvived; // on trial, and loaded in this session
+    std::vector<std::string> mTold;  // the paths of those judged at this start
+    std::vector<std::string> mTried; // of those whose trial this session is
     bool mStored = true;
 };
 

@@ -7,6 +7,8 @@
 
 #include <tessel/tsmessagebox.h>
 
+#include "host/applications/Admission.h"
+
 namespace tessel
 {
 namespace
@@ -54,7 +56,8 @@ std::vector<Entry> entriesOf(const std::vector<LoadOutcome>& failed)
     std::vector<Entry> entries;
     entries.reserve(failed.size());
     for (const LoadOutcome& outcome : failed)
-        entries.push_back({outcome.path, outcome.loaded.sentence()});
+        if (!Admission::isKeptOut(outcome.loaded.code()))
+            entries.push_back({outcome.path, outcome.loaded.sentence()});
     return entries;
 }
 

@@ -23,7 +23,7 @@ struct StartSummary
 void noteRefusedFiles(const std::vector<MessageBox::Box>& boxes, LoadOutcomes& outcomes);
 
 // Of what was not loaded, and of the boxes that came up meanwhile. Those that name a file that was not loaded
-// say nothing new. Nothing to say: none.
+// say nothing new. What is kept out has not failed. Nothing to say: none.
 std::optional<StartSummary> summarize(const std::vector<LoadOutcome>& failed,
                                       const std::vector<MessageBox::Box>& boxes);
 } // namespace tessel

@@ -16,15 +16,19 @@ namespace tessel
 {
 namespace
 {
-void admitFilesBy(Admission& admission, LispSurroundings& surroundings)
+void admitFilesBy(Admission& admission, LispLoads& loads, LispSurroundings& surroundings)
 {
-    surroundings.fileBegins = [&admission](const std::wstring& name,
-                                           const std::filesystem::path& file) -> Result<>
+    surroundings.fileBegins = [&admission, &loads](const std::wstring& name,
+                                                   const std::filesystem::path& file) -> Result<>
     {
-        if (const auto admitted = admission.check(toWide(file.native())); !admitted)
-            return Failure{L"Cannot load \"" + name + L"\": " + admitted.sentence() + L"."};
-        admission.marker().begin(RunningMarker::Deed::kLispFile, file.native());
-        return {};
+        const auto admitted = admission.check(toWide(file.native()));
+        if (admitted)
+        {
+            admission.marker().begin(RunningMarker::Deed::kLispFile, file.native());
+            return {};
+        }
+        loads.refused(admitted);
+        return Failure{L"Cannot load \"" + name + L"\": " + admitted.sentence() + L"."};
     };
     surroundings.filesOpen = [&admission]
     {
@@ -59,7 +63,7 @@ LispSurroundings surroundings(const LispInterpreter::Options& options, CommandLi
                                      .fileLoaded = fileLoaded,
                                      .fileAsked = fileAsked};
     if (options.admission)
-        admitFilesBy(*options.admission, surroundings);
+        admitFilesBy(*options.admission, loads, surroundings);
     return surroundings;
 }
 } // namespace
@@ -92,8 +96,10 @@ Result<std::wstring> LispInterpreter::evaluate(std::wstring_view expressions)
     const std::size_t depth = mMarker.depth();
     mLoads->begin();
     auto value = mMachine->evaluate(expressions);
-    mLoads->end(value);
+    const int code = mLoads->end(value);
     mMarker.endTo(depth); // Lisp may have been left by a jump
+    if (code == Admission::kToldAtStart)
+        return Failure{{}, code};
     return value;
 }
 

@@ -46,10 +46,22 @@ bool LispLoads::isOfFile(const std::wstring& words) const
         { return words.starts_with(file.path) || words.starts_with(L"Cannot load \"" + file.path); });
 }
 
-void LispLoads::end(const Outcome& value)
+void LispLoads::refused(const Outcome& admitted)
 {
+    if (!mFiles.empty())
+        mFiles.back().failureCode = admitted.code();
+}
+
+int LispLoads::end(const Outcome& value)
+{
+    int code = 0;
     if (!value && (value.code() == LispMachine::kLeftByJump || isOfFile(value.sentence())) && !mFiles.empty())
-        note(mFiles.front(), Failure{reasonIn(value.sentence(), mFiles.front().path)});
+    {
+        const File& first = mFiles.front();
+        code = first.failureCode;
+        note(first, Failure{reasonIn(value.sentence(), first.path), code});
+    }
     mFiles.clear();
+    return code;
 }
 } // namespace tessel

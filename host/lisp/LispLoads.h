@@ -15,19 +15,23 @@ public:
     // What it finds out it notes there, if anywhere.
     explicit LispLoads(LoadOutcomes* outcomes) : mOutcomes(outcomes) {}
 
-    // An expression begins, and ends with this result.
+    // An expression begins, and ends with this result. Answers the code that was noted of the file that it
+    // failed to load, the one of its refusal if it was refused; 0 when none was noted.
     void begin() { mFiles.clear(); }
-    void end(const Outcome& value);
+    int end(const Outcome& value);
 
     // In between: a file is to be loaded, and is loaded. The path as it was given.
     void asked(const std::wstring& path) { mFiles.push_back({path, LoadOutcomes::Clock::now()}); }
     void loaded(const std::wstring& path);
+    // What was asked for last is refused.
+    void refused(const Outcome& admitted);
 
 private:
     struct File
     {
         std::wstring path;
         LoadOutcomes::Clock::time_point begun;
+        int failureCode = Failure::kUnspecified;
     };
 
     bool isOfFile(const std::wstring& words) const;

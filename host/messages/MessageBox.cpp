@@ -37,16 +37,19 @@ void MessageBox::setPresenter(Presenter presenter)
 
 void MessageBox::explain(const std::wstring& path, const std::wstring& why)
 {
-    mExplainedPath = path;
-    mWhy = why;
+    mNote = {path, why, false};
+}
+
+void MessageBox::passOver(const std::wstring& path)
+{
+    mNote = {path, {}, true};
 }
 
 // What is not used now is about something else than the box after it.
-std::wstring MessageBox::takeDetailFor(const std::wstring& text)
+MessageBox::FileNote MessageBox::takeNoteFor(const std::wstring& text)
 {
-    const std::wstring path = std::exchange(mExplainedPath, {});
-    const std::wstring why = std::exchange(mWhy, {});
-    return !path.empty() && text.find(path) != std::wstring::npos ? asSentence(why) : std::wstring();
+    FileNote note = std::exchange(mNote, {});
+    return !note.path.empty() && text.find(note.path) != std::wstring::npos ? note : FileNote();
 }
 
 void MessageBox::collect()
@@ -80,7 +83,10 @@ void MessageBox::sayMessage(const std::wstring& text)
 int MessageBox::show(const wchar_t* text, unsigned style, void* parent)
 {
     const std::wstring message = text ? text : L"";
-    const Box box{message, takeDetailFor(message), style, parent};
+    const FileNote note = takeNoteFor(message);
+    if (note.needsNoBox)
+        return IDOK;
+    const Box box{message, asSentence(note.why), style, parent};
     if (mCollected && !parent)
         mCollected->push_back(box);
     else if (const int answer = present(box))

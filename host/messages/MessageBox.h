@@ -34,6 +34,9 @@ public:
 
     // Why something went wrong with the file: the detail of the next box, if that names the file.
     void explain(const std::wstring& path, const std::wstring& why);
+    // What happened to the file was meant to: the next box, if it names the file, is not shown at all, and
+    // the first button counts as chosen.
+    void passOver(const std::wstring& path);
 
     // From now on boxes without a parent are kept, and the first button counts as chosen. Whoever shows one
     // over a window of its own talks to a person, who gets to see it.
@@ -49,14 +52,21 @@ public:
     int show(const wchar_t* text, unsigned style, void* parent) override;
 
 private:
+    // What is known of a file before a box about it comes.
+    struct FileNote
+    {
+        std::wstring path;
+        std::wstring why;
+        bool needsNoBox = false;
+    };
+
     int present(const Box& box) const;
     void sayMessage(const std::wstring& text);
-    std::wstring takeDetailFor(const std::wstring& text);
+    FileNote takeNoteFor(const std::wstring& text);
 
     CommandLine& mCommandLine;
     Presenter mPresenter;
     std::optional<std::vector<Box>> mCollected; // while they are kept
-    std::wstring mExplainedPath;
-    std::wstring mWhy;
+    FileNote mNote;
 };
 } // namespace tessel

@@ -68,6 +68,7 @@ TEST_P(SafeMode, HasModrigAndNothingOfItsSuite)
     EXPECT_THAT(result.output, HasSubstr(linkerRefuses(fixtureModule("Good.zmb"), kIsSafe)));
     EXPECT_THAT(result.output, HasSubstr(linkerRefuses(bad, kIsSafe)));
     EXPECT_THAT(result.output, HasSubstr("Cannot load \"" + lisp + "\": " + kIsSafe + ".\n"));
+    EXPECT_THAT(result.output, Not(HasSubstr("Message: "))) << "each is told once";
     EXPECT_THAT(result.output, AllOf(Not(HasSubstr("message 1")), Not(HasSubstr("good.lsp: loaded"))));
     EXPECT_EQ(storedSuite(), before);
 }
