@@ -9,6 +9,7 @@
 #include "tests/host_lisp/LispSession.h"
 
 using testing::HasSubstr;
+using testing::Not;
 
 namespace
 {
@@ -89,6 +90,16 @@ TEST_F(LispSurvival, OfDeepLists)
     session.value("(defun deep (n) (let (l) (dotimes (i n l) (setf l (list l)))))");
     EXPECT_EQ(session.value("(equal (deep 500000) (deep 500000))"), "T");
     EXPECT_EQ(session.error("(prin1-to-string (deep 500000))"), kStackOverflow);
+}
+
+TEST_F(LispSurvival, OfTextThatIsCutShortWhereAReaderWantsAnObject)
+{
+    for (const char* text :
+         {"#p", "#P ", "(a #p", "#p#p", "#1=", "#1= ; x", "#1=;", "#1=#|x|#", "#1=#|x|#;y", "#1=#p", "(#1=#"})
+        EXPECT_THAT(session.error("(read-from-string \"" + std::string(text) + "\")"),
+                    Not(testing::IsEmpty()))
+            << text;
+    EXPECT_EQ(session.value("(list #p\"/tmp/x\" #1=#|y|# 5 #1#)"), "(#P\"/tmp/x\" 5 5)");
 }
 
 TEST_F(LispSurvival, OfAttemptsToEndTheProcess)
