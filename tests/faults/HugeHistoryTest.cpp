@@ -22,8 +22,8 @@ constexpr const char* kHugeHistory =
     " (5, 4, 'Profiles', 'profiles'), (6, 5, 'Default', 'default'), (7, 6, 'Dialogs', 'dialogs'),"
     " (8, 7, 'Modrig', 'modrig'), (9, 8, 'History', 'history');"
     "INSERT INTO value(key, name, fold, data) VALUES(5, '', '', 'Default'),"
-    " (9, 'NumHistory', 'numhistory', '300000');"
-    "WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM n WHERE i < 300000)"
+    " (9, 'NumHistory', 'numhistory', '1000000');"
+    "WITH RECURSIVE n(i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM n WHERE i < 1000000)"
     " INSERT INTO value(key, name, fold, data)"
     " SELECT 9, i || 'History', i || 'history', '/nowhere/tool' || i || '.lsp' FROM n;"
     "PRAGMA user_version=1;"
@@ -49,5 +49,5 @@ TEST(HugeHistory, IsToldAboutWhileItIsReadAndKeptWhenThePersonStopsThat)
         << "what is read after it is not stopped" << terminal.screen();
     terminal.type("QUIT\r");
     EXPECT_EQ(terminal.waitForEnd(), 0);
-    EXPECT_EQ(runSql(file, "SELECT count(*) FROM value WHERE key=9"), "300001");
+    EXPECT_EQ(runSql(file, "SELECT count(*) FROM value WHERE key=9"), "1000001");
 }
