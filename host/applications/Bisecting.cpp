@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "host/platform/RealPath.h"
 #include "host/platform/SmallFile.h"
 #include "host/text/Unicode.h"
 
@@ -13,13 +14,6 @@ constexpr char kFileName[] = "bisection";
 constexpr std::string_view kHeader = "Tessel looks for the culprit, 1";
 constexpr char kGood = 'g';
 constexpr char kBad = 'b';
-
-std::string realPathOf(const std::string& path)
-{
-    std::error_code failed;
-    const auto real = std::filesystem::weakly_canonical(path, failed);
-    return failed ? path : real.native();
-}
 
 std::wstring counted(std::size_t count, const wchar_t* one, const wchar_t* many)
 {
@@ -89,7 +83,7 @@ bool Bisecting::keepsOut(const std::string& path) const
 {
     if (!mApplied)
         return false;
-    const auto found = std::ranges::find(mApplied->suspects, realPathOf(path));
+    const auto found = std::ranges::find(mApplied->suspects, realPath(path).native());
     return found != mApplied->suspects.end() &&
            !mApplied->bisection().isLoaded(static_cast<std::size_t>(found - mApplied->suspects.begin()));
 }
@@ -118,7 +112,8 @@ Result<std::wstring> Bisecting::begin(const std::vector<std::string>& suspects)
         return Failure{
             L"There is nothing to search among: no application was loaded by itself in this session."};
     Search search;
-    std::ranges::transform(suspects, std::back_inserter(search.suspects), realPathOf);
+    std::ranges::transform(suspects, std::back_inserter(search.suspects),
+                           [](const std::string& path) { return realPath(path).native(); });
     if (auto stored = store(search); !stored)
         return stored.failure();
     mReadAtStart = {};

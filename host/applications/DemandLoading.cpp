@@ -10,6 +10,7 @@
 #include "host/applications/Admission.h"
 #include "host/applications/ApplicationRecords.h"
 #include "host/applications/DynamicLinker.h"
+#include "host/platform/RealPath.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -26,14 +27,6 @@ bool isApplication(const std::filesystem::path& path)
     const std::wstring extension = toWide(path.extension().native());
     return std::ranges::any_of(kApplicationExtensions,
                                [&](std::wstring_view known) { return equalIgnoringCase(extension, known); });
-}
-
-// The path without links and detours; as it stands when it cannot be followed.
-std::filesystem::path resolved(const std::filesystem::path& path)
-{
-    std::error_code failed;
-    auto result = std::filesystem::weakly_canonical(path, failed);
-    return failed ? path : result;
 }
 
 bool lists(const ApplicationRecord& record, std::wstring_view typedName)
@@ -88,9 +81,9 @@ std::vector<std::filesystem::path> DemandLoading::unrecordedPlugIns() const
 {
     std::set<std::filesystem::path> recorded;
     for (const auto& record : mRecords.all())
-        recorded.insert(resolved(toUtf8(record.module)));
+        recorded.insert(realPath(toUtf8(record.module)));
     auto result = plugIns();
-    std::erase_if(result, [&](const auto& plugIn) { return recorded.contains(resolved(plugIn)); });
+    std::erase_if(result, [&](const auto& plugIn) { return recorded.contains(realPath(plugIn)); });
     return result;
 }
 

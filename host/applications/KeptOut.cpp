@@ -6,7 +6,9 @@
 #include <ctime>
 #include <string_view>
 
+#include "host/platform/RealPath.h"
 #include "host/platform/SmallFile.h"
+#include "host/text/DayAndTime.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -20,13 +22,6 @@ constexpr std::string_view kHeader = "Tessel keeps these applications out, 1\n";
 constexpr std::size_t kFields = 14;
 constexpr std::int64_t kNanoseconds = 1'000'000'000;
 
-std::string realPathOf(const std::string& path)
-{
-    std::error_code failed;
-    const auto real = std::filesystem::weakly_canonical(path, failed);
-    return failed ? path : real.native();
-}
-
 // The program inside a bundle is the same application as the bundle.
 bool isWithin(std::string_view path, std::string_view folder)
 {
@@ -36,7 +31,7 @@ bool isWithin(std::string_view path, std::string_view folder)
 
 auto findIn(auto& applications, const std::string& path)
 {
-    const std::string real = realPathOf(path);
+    const std::string real = realPath(path).native();
     return std::ranges::find_if(applications, [&](const KeptOutApplication& known)
                                 { return known.path == path || isWithin(real, known.realPath); });
 }
@@ -136,20 +131,11 @@ Failure damaged(const std::filesystem::path& file)
         L"with none."};
 }
 
-std::wstring dayAndTime(std::int64_t seconds)
-{
-    const auto time = static_cast<std::time_t>(seconds);
-    std::tm local = {};
-    std::array<char, 32> text = {};
-    localtime_r(&time, &local);
-    return toWide({text.data(), std::strftime(text.data(), text.size(), "%Y-%m-%d %H:%M", &local)});
-}
-
 std::wstring whatHappened(const KeptOutApplication& application)
 {
     const DeedWords words = wordsFor(application.deed);
     const std::string deed = std::string(words.before) + application.detail + std::string(words.after);
-    return L"ended Tessel on " + dayAndTime(application.since) + L" " + toWide(deed) + L" (" +
+    return L"ended Tessel on " + toWide(dayAndTime(application.since)) + L" " + toWide(deed) + L" (" +
            toWide(wordsFor(application.reason)) + L"): " + toWide(wordsForEnding(application.ending));
 }
 
@@ -281,7 +267,7 @@ std::wstring KeptOut::judge(const RunningMarker::Leftover& leftover, Application
 {
     KeptOutApplication guilty;
     guilty.path = leftover.work.path;
-    guilty.realPath = realPathOf(guilty.path);
+    guilty.realPath = realPath(guilty.path).native();
     guilty.since = leftover.work.since;
     guilty.deed = leftover.work.deed;
     guilty.reason = leftover.work.reason;
@@ -329,7 +315,7 @@ Result<> KeptOut::keepOut(const std::string& path)
                 known = applications.insert(known, KeptOutApplication{});
             *known = {};
             known->path = path;
-            known->realPath = realPathOf(path);
+            known->realPath = realPath(path).native();
             known->stage = Stage::kByPerson;
             known->since = std::time(nullptr);
         });
@@ -382,7 +368,7 @@ void KeptOut::noteGoodEnd()
 std::wstring reasonOf(const KeptOutApplication& application)
 {
     if (application.stage == Stage::kByPerson)
-        return L"kept out at starts by DISABLE since " + dayAndTime(application.since);
+        return L"kept out at starts by DISABLE since " + toWide(dayAndTime(application.since));
     return L"kept out: it " + whatHappened(application);
 }
 } // namespace tessel

@@ -4,7 +4,6 @@
 #include <cerrno>
 #include <cstdio>
 #include <cstring>
-#include <ctime>
 #include <memory>
 
 #include <fcntl.h>
@@ -15,6 +14,7 @@
 #include "host/registry/Journals.h"
 #include "host/registry/Schema.h"
 #include "host/registry/Soundness.h"
+#include "host/text/DayAndTime.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -147,10 +147,7 @@ std::wstring timeOfCopy(const std::filesystem::path& file)
     struct stat status = {};
     if (stat(soundCopyOf(file).c_str(), &status) != 0)
         return {};
-    struct tm parts = {};
-    localtime_r(&status.st_mtime, &parts);
-    char text[sizeof "2026-11-22 09:41"] = {};
-    return std::strftime(text, sizeof text, "%Y-%m-%d %H:%M", &parts) > 0 ? toWide(text) : std::wstring();
+    return toWide(dayAndTime(status.st_mtime));
 }
 
 std::wstring helpAgainstDamage(const std::filesystem::path& file)

@@ -3,6 +3,7 @@
 
 #include <tesselui/tsuieach.h>
 
+#include "host/text/DayAndTime.h"
 #include "host/ui/platform/gnustep/ThemePictures.h"
 #import "host/ui/platform/gnustep/filepanel/FileNameCell.h"
 #import "host/ui/platform/gnustep/filepanel/FilePanel.h"
@@ -24,11 +25,7 @@ NSArray* runningModes()
 
 NSString* dateText(std::time_t date)
 {
-    std::tm local{};
-    char text[32];
-    localtime_r(&date, &local);
-    std::strftime(text, sizeof text, "%Y-%m-%d %H:%M", &local);
-    return [NSString stringWithUTF8String:text];
+    return [NSString stringWithUTF8String:tessel::dayAndTime(date).c_str()];
 }
 
 NSImage* iconOf(const Entry& entry)
