@@ -15,7 +15,6 @@ namespace tessel
 {
 namespace
 {
-constexpr wchar_t kApplicationsGroup[] = L"Applications";
 constexpr std::size_t kNameColumn = 24;
 constexpr std::size_t kFolderColumn = 48;
 constexpr std::size_t kAnyLength = std::numeric_limits<std::size_t>::max();

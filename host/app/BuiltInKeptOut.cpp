@@ -11,8 +11,6 @@ namespace tessel
 {
 namespace
 {
-constexpr wchar_t kApplicationsGroup[] = L"Applications";
-
 using Texts = std::vector<std::wstring>;
 
 // A bundle is a folder; no other folder is an application.

@@ -11,6 +11,9 @@ namespace tessel
 {
 struct Parts;
 
+// Under which `HELP` lists the commands that load and keep out.
+inline constexpr wchar_t kApplicationsGroup[] = L"Applications";
+
 using BuiltInCommand = Result<>(Parts& parts, const CommandStack::Arguments& arguments);
 
 // Adds a command that works on the parts.

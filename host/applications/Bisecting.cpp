@@ -11,7 +11,7 @@ namespace tessel
 namespace
 {
 constexpr char kFileName[] = "bisection";
-constexpr std::string_view kHeader = "Tessel looks for the culprit, 1";
+constexpr std::string_view kFirstLine = "Tessel looks for the culprit, 1";
 constexpr char kGood = 'g';
 constexpr char kBad = 'b';
 
@@ -48,7 +48,7 @@ Result<std::optional<Bisecting::Search>> Bisecting::read() const
     if (!*content)
         return std::optional<Search>();
     const auto lines = linesOf(**content);
-    if (lines.size() < 3 || lines[0] != kHeader || !areAnswers(lines[1]))
+    if (lines.size() < 3 || lines[0] != kFirstLine || !areAnswers(lines[1]))
         return Failure{L"The file " + toWide(mFile.string()) +
                        L" is damaged; BISECT STOP ends the search that it is about."};
     Search search;
@@ -60,7 +60,7 @@ Result<std::optional<Bisecting::Search>> Bisecting::read() const
 
 Result<> Bisecting::store(const Search& search) const
 {
-    std::string content = std::string(kHeader) + '\n';
+    std::string content = std::string(kFirstLine) + '\n';
     for (const bool wasGood : search.answers)
         content += wasGood ? kGood : kBad;
     content += '\n';

@@ -14,6 +14,7 @@
 #include "host/files/PartFile.h"
 #include "host/platform/Descriptor.h"
 #include "host/platform/OrdinaryFile.h"
+#include "host/platform/PrivateFolder.h"
 #include "host/text/Credentials.h"
 #include "host/text/Unicode.h"
 
@@ -27,7 +28,6 @@ constexpr std::string_view kFormat = "_HiStOrY_V2_";
 constexpr std::uintmax_t kLargestFile = std::uintmax_t{16} << 20;
 // Shortened not at each start, but when half of it is of no use.
 constexpr std::size_t kMostStoredLines = 2 * kMostHistoryLines;
-constexpr mode_t kForThePersonAlone = 0600;
 
 bool isPlain(unsigned char byte)
 {
@@ -112,8 +112,8 @@ Descriptor openAlone(const std::filesystem::path& path)
 {
     for (;;)
     {
-        Descriptor file(open(path.c_str(), O_RDWR | O_APPEND | O_CREAT | O_CLOEXEC | O_NONBLOCK | O_NOCTTY,
-                             kForThePersonAlone));
+        Descriptor file(
+            open(path.c_str(), O_RDWR | O_APPEND | O_CREAT | O_CLOEXEC | O_NONBLOCK | O_NOCTTY, kOwnersOnly));
         if (!file || !isOrdinary(file.number()) || flock(file.number(), LOCK_EX) != 0 ||
             isSameFile(file.number(), path))
             return file;

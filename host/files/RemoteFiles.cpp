@@ -50,12 +50,6 @@ Result<> writeOrigin(const std::filesystem::path& folder, const std::string& url
                              : Failure{toWide(std::generic_category().message(errno))};
 }
 
-bool isFile(const std::filesystem::path& file)
-{
-    std::error_code unreachable;
-    return std::filesystem::is_regular_file(file, unreachable);
-}
-
 std::filesystem::path resolved(const std::filesystem::path& path)
 {
     std::error_code unreachable;
@@ -140,7 +134,7 @@ bool RemoteFiles::canBeTrusted(const std::filesystem::path& copy) const
 
 bool RemoteFiles::hasCopy(const std::filesystem::path& copy, const RemoteAddress& address) const
 {
-    return isFile(copy) && canBeTrusted(copy) && originIn(copy.parent_path()) == address.url &&
+    return isOrdinaryFile(copy) && canBeTrusted(copy) && originIn(copy.parent_path()) == address.url &&
            (address.sha256.empty() || sha256Of(copy, mLimits.bytes) == address.sha256);
 }
 
@@ -192,7 +186,7 @@ bool RemoteFiles::IsRemoteFile(const wchar_t* localPath, wchar_t* url, std::size
 {
     const std::filesystem::path file = resolved(toUtf8(localPath ? localPath : L""));
     const std::filesystem::path folder = file.parent_path();
-    if (folder.parent_path() != resolved(mCacheFolder) || !isFile(file))
+    if (folder.parent_path() != resolved(mCacheFolder) || !isOrdinaryFile(file))
         return false;
     const std::string address = canBeTrusted(file) ? originIn(folder) : std::string();
     if (address.empty() || file.filename() != fileNameOf(address))

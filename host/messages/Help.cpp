@@ -4,6 +4,7 @@
 
 #include <tessel/tsed.h>
 
+#include "host/platform/OrdinaryFile.h"
 #include "host/text/CommandLine.h"
 #include "host/text/Running.h"
 #include "host/text/Unicode.h"
@@ -19,12 +20,6 @@ bool isTopicName(const std::wstring& topic)
 {
     return topic.find_first_of(L"/\\") == topic.npos && topic.find(L'\0') == topic.npos;
 }
-
-bool isFile(const std::filesystem::path& path)
-{
-    std::error_code notThere;
-    return std::filesystem::is_regular_file(path, notThere);
-}
 } // namespace
 
 Help::Help(std::filesystem::path book, Browser browser) : mBook(std::move(book)), mBrowser(std::move(browser))
@@ -35,7 +30,7 @@ Result<std::wstring> Help::show(const std::wstring& topic, const std::filesystem
 {
     const std::wstring name = topic.empty() ? kFirstPage : topic;
     const auto page = (otherBook.empty() ? mBook : otherBook) / (toUtf8(name) + ".html");
-    if (!isTopicName(name) || !isFile(page))
+    if (!isTopicName(name) || !isOrdinaryFile(page))
         return Failure{L"There is no help on \"" + name + L"\"."};
     const bool shown = mBrowser(page);
     return (shown ? L"The help opens in the browser: " : L"Help: ") + toWide(page.string());

@@ -3,6 +3,7 @@
 #include <array>
 #include <cerrno>
 #include <cstring>
+#include <system_error>
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -26,6 +27,12 @@ Failure tooLarge(std::uintmax_t mostBytes)
     return {L"it is larger than " + std::to_wstring(mostBytes) + L" bytes"};
 }
 } // namespace
+
+bool isOrdinaryFile(const std::filesystem::path& path)
+{
+    std::error_code unreachable;
+    return std::filesystem::is_regular_file(path, unreachable);
+}
 
 Result<> checkOrdinary(const struct stat& status)
 {

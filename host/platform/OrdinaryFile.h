@@ -15,6 +15,9 @@ namespace tessel
 // The code of a failure when nothing stands at the path at all.
 inline constexpr int kNothingThere = 2;
 
+// Whether an ordinary file stands at the path, links followed; no where the system cannot say.
+bool isOrdinaryFile(const std::filesystem::path& path);
+
 // Whether what the system says of a path is that an ordinary file stands there.
 Result<> checkOrdinary(const struct stat& status);
 

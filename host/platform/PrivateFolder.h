@@ -3,10 +3,15 @@
 
 #include <filesystem>
 
+#include <sys/types.h>
+
 #include "host/text/Result.h"
 
 namespace tessel
 {
+// The rights of a file that only the person may read and write.
+inline constexpr mode_t kOwnersOnly = 0600;
+
 // Makes the folder so that only the person can enter it, and the missing ones above it as is usual. One that
 // is there already stays as it is. Why it cannot be made is the end of a sentence.
 Result<> makePrivateFolder(const std::filesystem::path& folder);

@@ -11,6 +11,7 @@
 #include <sys/mman.h>
 #include <unistd.h>
 
+#include "host/platform/PrivateFolder.h"
 #include "host/platform/SmallFile.h"
 
 namespace tessel
@@ -23,20 +24,6 @@ constexpr char kFilePrefix[] = "running.";
 constexpr char kLockName[] = "lock";
 constexpr std::size_t kDeepest = 128;
 constexpr std::size_t kTextBytes = 56000;
-constexpr mode_t kOwnersOnly = 0600;
-
-struct Slot
-{
-    RunningMarker::Deed deed;
-    RunningMarker::Reason reason;
-    std::atomic<std::uint32_t> waits;
-    std::uint32_t textAt;
-    std::uint32_t pathLength;
-    std::uint32_t detailLength;
-    std::int64_t since;
-
-    std::size_t textEnd() const { return std::size_t{textAt} + pathLength + detailLength; }
-};
 
 static_assert(std::atomic<std::uint32_t>::is_always_lock_free, "a signal handler must not wait");
 
@@ -52,6 +39,19 @@ bool fillWithZeros(int descriptor, std::size_t size)
     return pwrite(descriptor, zeros.data(), size, 0) == static_cast<ssize_t>(size);
 }
 } // namespace
+
+struct RunningMarker::Slot
+{
+    Deed deed;
+    Reason reason;
+    std::atomic<std::uint32_t> waits;
+    std::uint32_t textAt;
+    std::uint32_t pathLength;
+    std::uint32_t detailLength;
+    std::int64_t since;
+
+    std::size_t textEnd() const { return std::size_t{textAt} + pathLength + detailLength; }
+};
 
 struct RunningMarker::Page
 {

@@ -131,6 +131,7 @@ public:
     void noteEnding(int ending) noexcept;
 
 private:
+    struct Slot;
     struct Page;
     struct OpenFile
     {

@@ -7,13 +7,13 @@
 #include <unistd.h>
 
 #include "host/platform/OrdinaryFile.h"
+#include "host/platform/PrivateFolder.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
 {
 namespace
 {
-constexpr mode_t kOwnersOnly = 0600;
 constexpr std::uintmax_t kLargest = std::uintmax_t{4} << 20;
 
 Failure failed(const std::filesystem::path& file, const wchar_t* what, const std::wstring& why)

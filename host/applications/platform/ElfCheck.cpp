@@ -20,8 +20,8 @@ namespace
 using Header = ElfW(Ehdr);
 using Segment = ElfW(Phdr);
 
-constexpr std::size_t kMostSegments = 128; // linkers write about a dozen
-constexpr std::uint64_t kPage = 4096;      // the smallest page that segments are laid out for
+constexpr std::size_t kMostSegments = 128;    // linkers write about a dozen
+constexpr std::uint64_t kSmallestPage = 4096; // the smallest page that segments are laid out for
 
 constexpr std::wstring_view kNoLibrary = L"it is not a shared library";
 constexpr std::wstring_view kProgram = L"it is a program, not a shared library";
@@ -42,12 +42,12 @@ bool fits(std::uint64_t offset, std::uint64_t size, std::uint64_t whole)
 
 std::uint64_t pageStart(std::uint64_t address)
 {
-    return address & ~(kPage - 1);
+    return address & ~(kSmallestPage - 1);
 }
 
 std::uint64_t pageEnd(std::uint64_t address)
 {
-    return pageStart(address + kPage - 1);
+    return pageStart(address + kSmallestPage - 1);
 }
 
 Result<> checkKind(const Header& header)
@@ -84,8 +84,8 @@ Result<> checkLoadedSegment(const Segment& segment, std::uint64_t fileSize)
     if (!fits(segment.p_offset, segment.p_filesz, fileSize))
         return refused(kCutShort);
     const bool alignmentIsPower = (segment.p_align & (segment.p_align - 1)) == 0;
-    const bool samePlaceInPage = (segment.p_vaddr - segment.p_offset) % kPage == 0;
-    const bool endsInAddressSpace = segment.p_vaddr + segment.p_memsz + kPage > segment.p_vaddr;
+    const bool samePlaceInPage = (segment.p_vaddr - segment.p_offset) % kSmallestPage == 0;
+    const bool endsInAddressSpace = segment.p_vaddr + segment.p_memsz + kSmallestPage > segment.p_vaddr;
     // Only what can be written has a part that the file does not hold.
     const bool sizesAgree = (segment.p_flags & PF_W) != 0 ? segment.p_filesz <= segment.p_memsz
                                                           : segment.p_filesz == segment.p_memsz;
@@ -103,8 +103,8 @@ std::uint64_t shiftOf(const Segment& segment)
 // that the file does not hold: one farther away has been moved, and what is written there ends the host.
 bool isNear(const Segment& segment, const Segment& previous)
 {
-    const std::uint64_t room =
-        std::max<std::uint64_t>(segment.p_align, kPage) + pageEnd(previous.p_memsz - previous.p_filesz);
+    const std::uint64_t room = std::max<std::uint64_t>(segment.p_align, kSmallestPage) +
+                               pageEnd(previous.p_memsz - previous.p_filesz);
     return static_cast<std::int64_t>(shiftOf(segment) - shiftOf(previous)) <= static_cast<std::int64_t>(room);
 }
 
