@@ -21,6 +21,17 @@ namespace
 {
 using Clock = std::chrono::steady_clock;
 
+// Signals that whoever started the tests ignores, by nohup or in the background of a shell: hosts would
+// ignore them as well.
+struct UsualSignals
+{
+    UsualSignals()
+    {
+        for (const int number : {SIGHUP, SIGINT, SIGQUIT, SIGPIPE})
+            std::signal(number, SIG_DFL);
+    }
+} const atTheStart;
+
 class Pipe
 {
 public:
