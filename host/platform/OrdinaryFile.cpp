@@ -61,6 +61,7 @@ Result<std::string> readOrdinaryFile(const std::filesystem::path& path, std::uin
     if (static_cast<std::uintmax_t>(status.st_size) > mostBytes)
         return tooLarge(mostBytes);
     std::string content;
+    content.reserve(static_cast<std::size_t>(status.st_size));
     std::array<char, 65536> piece;
     ssize_t count = 0;
     while ((count = read(file->number(), piece.data(), piece.size())) > 0)

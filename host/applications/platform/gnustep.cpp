@@ -2,14 +2,14 @@
 // Objective-C is loaded and unloaded as the plain library it is, and what brings some stays.
 #include "host/applications/platform/ObjectiveCRuntime.h"
 
-#include <fstream>
-#include <iterator>
+#include <cstdint>
 #include <string_view>
 
 #include <dlfcn.h>
 #include <link.h>
 
 #include "host/applications/platform/ElfLinkMap.h"
+#include "host/platform/OrdinaryFile.h"
 
 namespace tessel
 {
@@ -17,6 +17,7 @@ namespace
 {
 // What every compiled Objective-C file calls to make its classes and categories known.
 constexpr std::string_view kRegistration = "__objc_exec_class";
+constexpr std::uintmax_t kLargestProgram = std::uintmax_t{1} << 30;
 
 // An entry of the mapped library's dynamic section; 0 when it is not there.
 ElfW(Addr) dynamicEntry(const link_map& map, ElfW(Sxword) tag)
@@ -56,9 +57,8 @@ bool isMissing(void* library, const ElfW(Sym) & symbol, const char* name)
 
 bool needsBundleLoading(const std::string& program)
 {
-    std::ifstream file(program, std::ios::binary);
-    const std::string content(std::istreambuf_iterator<char>(file), {});
-    return content.find(kRegistration) != content.npos;
+    const auto content = readOrdinaryFile(program, kLargestProgram);
+    return content && content->find(kRegistration) != content->npos;
 }
 
 bool mustStayMapped(void* library)
