@@ -11,7 +11,7 @@
 #include <unistd.h>
 
 #include "tests/e2e/HostTerminal.h"
-#include "tests/host_store/ChildProcess.h"
+#include "tests/support/ChildProcess.h"
 #include "tests/support/Content.h"
 #include "tests/support/HttpServer.h"
 

@@ -9,7 +9,7 @@
 #include <unistd.h>
 
 #include "tests/e2e/HostProcess.h"
-#include "tests/host_store/ChildProcess.h"
+#include "tests/support/ChildProcess.h"
 #include "tests/support/HttpServer.h"
 
 namespace fs = std::filesystem;

@@ -2,7 +2,7 @@
 #include <gtest/gtest.h>
 
 #include "tests/e2e/HostTerminal.h"
-#include "tests/host_store/Database.h"
+#include "tests/support/Database.h"
 
 namespace
 {

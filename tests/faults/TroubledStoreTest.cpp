@@ -7,7 +7,7 @@
 
 #include "tests/e2e/Applications.h"
 #include "tests/e2e/HostTerminal.h"
-#include "tests/host_store/Database.h"
+#include "tests/support/Database.h"
 
 namespace fs = std::filesystem;
 

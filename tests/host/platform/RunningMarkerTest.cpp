@@ -1,0 +1,237 @@
+#include "host/platform/RunningMarker.h"
+
+#include <csignal>
+#include <optional>
+
+#include <gtest/gtest.h>
+
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include "tests/support/ChildProcess.h"
+#include "tests/support/TemporaryFolder.h"
+
+using tessel::RunningMarker;
+using Deed = tessel::RunningMarker::Deed;
+using Reason = tessel::RunningMarker::Reason;
+
+namespace
+{
+class Marker : public testing::Test
+{
+protected:
+    // Runs the work in a session of its own, which then ends without a word.
+    template <class Work>
+    void vanishAfter(Work work)
+    {
+        const pid_t child = fork();
+        if (child == 0)
+        {
+            RunningMarker marker(mFolder.path());
+            work(marker);
+            kill(getpid(), SIGKILL);
+        }
+        int status = 0;
+        waitpid(child, &status, 0);
+        EXPECT_EQ(WTERMSIG(status), SIGKILL);
+    }
+
+    std::vector<RunningMarker::Leftover> leftovers() { return RunningMarker(mFolder.path()).leftovers(); }
+
+    std::size_t filesOfSessions()
+    {
+        std::size_t count = 0;
+        for (const auto& entry : std::filesystem::directory_iterator(mFolder.path()))
+            count += entry.path().filename().native().starts_with("running.") ? 1 : 0;
+        return count;
+    }
+
+    TemporaryFolder mFolder;
+};
+} // namespace
+
+TEST_F(Marker, IsThereWhenTheProcessIsNot)
+{
+    const std::int64_t before = std::time(nullptr);
+    vanishAfter(
+        [](RunningMarker& marker)
+        {
+            const RunningMarker::ReasonScope reason(marker, Reason::kForAnother);
+            marker.begin(Deed::kCommand, "/apps/Grüße.zmb", "HELLO");
+        });
+    const auto found = leftovers();
+    ASSERT_EQ(found.size(), 1U);
+    EXPECT_EQ(found[0].ending, RunningMarker::kVanished);
+    EXPECT_EQ(found[0].work.deed, Deed::kCommand);
+    EXPECT_EQ(found[0].work.reason, Reason::kForAnother);
+    EXPECT_EQ(found[0].work.path, "/apps/Grüße.zmb");
+    EXPECT_EQ(found[0].work.detail, "HELLO");
+    EXPECT_FALSE(found[0].work.waitsForPerson);
+    EXPECT_GE(found[0].work.since, before);
+    EXPECT_LE(found[0].work.since, std::time(nullptr));
+}
+
+TEST_F(Marker, SaysNothingOfASessionInWhichNothingWasAtWork)
+{
+    vanishAfter([](RunningMarker& marker) { const RunningMarker::Scope over(marker, Deed::kLoading, "/a"); });
+    EXPECT_TRUE(leftovers().empty());
+}
+
+TEST_F(Marker, NamesTheInnermost)
+{
+    vanishAfter(
+        [](RunningMarker& marker)
+        {
+            marker.begin(Deed::kEntryPoint, "/outer");
+            marker.begin(Deed::kLispFile, "/inner");
+        });
+    EXPECT_EQ(leftovers().at(0).work.path, "/inner");
+}
+
+TEST_F(Marker, NamesTheOuterAgainAfterTheInner)
+{
+    vanishAfter(
+        [](RunningMarker& marker)
+        {
+            marker.begin(Deed::kCommand, "/outer", "OUT");
+            const RunningMarker::Scope inner(marker, Deed::kLispFile, "/a/much/longer/inner");
+            marker.endTo(1);
+        });
+    const auto found = leftovers();
+    EXPECT_EQ(found.at(0).work.path, "/outer");
+    EXPECT_EQ(found.at(0).work.detail, "OUT");
+}
+
+TEST_F(Marker, KeepsWhatASessionLeftUntilItIsForgotten)
+{
+    vanishAfter([](RunningMarker& marker) { marker.begin(Deed::kLoading, "/a"); });
+    EXPECT_EQ(leftovers().size(), 1U);
+    {
+        RunningMarker marker(mFolder.path());
+        EXPECT_EQ(marker.leftovers().size(), 1U);
+        marker.forgetLeftovers();
+    }
+    EXPECT_TRUE(leftovers().empty());
+    EXPECT_EQ(filesOfSessions(), 0U);
+}
+
+TEST_F(Marker, ReadsWhatSeveralSessionsLeft)
+{
+    for (const char* path : {"/a", "/b", "/c"})
+        vanishAfter([path](RunningMarker& marker) { marker.begin(Deed::kLoading, path); });
+    std::string paths;
+    for (const auto& leftover : leftovers())
+        paths += leftover.work.path;
+    EXPECT_EQ(paths.size(), 6U);
+    for (const char* path : {"/a", "/b", "/c"})
+        EXPECT_NE(paths.find(path), std::string::npos) << paths;
+}
+
+TEST_F(Marker, DoesNotTakeARunningSessionForOneThatIsOver)
+{
+    const ChildProcess other(
+        [this](int output)
+        {
+            RunningMarker marker(mFolder.path());
+            marker.begin(Deed::kLoading, "/a");
+            [[maybe_unused]] const auto told = write(output, "ready\n", 6);
+            for (;;)
+                pause();
+        });
+    ASSERT_EQ(other.readLine(), "ready");
+    EXPECT_TRUE(leftovers().empty());
+    EXPECT_EQ(filesOfSessions(), 1U) << "the other's is still there, and ours is gone";
+}
+
+// An application may start programs of its own that outlive the host.
+TEST_F(Marker, DoesNotTakeAChildOfTheSessionForTheSession)
+{
+    int ends[2];
+    ASSERT_EQ(pipe(ends), 0);
+    vanishAfter(
+        [&](RunningMarker& marker)
+        {
+            marker.begin(Deed::kLoading, "/a");
+            if (fork() != 0)
+                return;
+            char byte = 0;
+            close(ends[1]);
+            [[maybe_unused]] const auto over = read(ends[0], &byte, 1);
+            _exit(0);
+        });
+    EXPECT_EQ(leftovers().size(), 1U);
+    close(ends[0]);
+    close(ends[1]);
+}
+
+TEST_F(Marker, TellsHowTheSessionEnded)
+{
+    vanishAfter(
+        [](RunningMarker& marker)
+        {
+            marker.begin(Deed::kLoading, "/a");
+            marker.noteEnding(SIGSEGV);
+        });
+    EXPECT_EQ(leftovers().at(0).ending, SIGSEGV);
+}
+
+TEST_F(Marker, TellsThatACommandWaitedForAPersonAndNothingElseDoes)
+{
+    vanishAfter(
+        [](RunningMarker& marker)
+        {
+            marker.begin(Deed::kCommand, "/a", "A");
+            marker.noteWaiting();
+        });
+    EXPECT_TRUE(leftovers().at(0).work.waitsForPerson);
+    {
+        RunningMarker(mFolder.path()).forgetLeftovers();
+    }
+    vanishAfter(
+        [](RunningMarker& marker)
+        {
+            marker.begin(Deed::kEntryPoint, "/a");
+            marker.noteWaiting();
+        });
+    EXPECT_FALSE(leftovers().at(0).work.waitsForPerson);
+}
+
+TEST_F(Marker, CountsWhatIsDeeperThanItWritesDown)
+{
+    vanishAfter(
+        [](RunningMarker& marker)
+        {
+            for (int depth = 0; depth < 1000; ++depth)
+                marker.begin(Deed::kLispFile, "/" + std::to_string(depth));
+            marker.endTo(2);
+        });
+    EXPECT_EQ(leftovers().at(0).work.path, "/1");
+}
+
+TEST_F(Marker, BlamesNobodyWherePathsDoNotFit)
+{
+    vanishAfter(
+        [](RunningMarker& marker)
+        {
+            for (int depth = 0; depth < 100; ++depth)
+                marker.begin(Deed::kLispFile, std::string(4000, 'x'));
+        });
+    EXPECT_EQ(leftovers().at(0).work.path, "");
+}
+
+TEST_F(Marker, PassesOverFilesThatAreNone)
+{
+    mFolder.write("running.1.0", "too short");
+    mFolder.write("running.2.0", std::string(100000, '\xff'));
+    std::filesystem::create_directory(mFolder / "running.3.0");
+    EXPECT_TRUE(leftovers().empty());
+}
+
+TEST_F(Marker, MarksNothingWhereItsFolderCannotBeMade)
+{
+    const auto file = mFolder.write("file", "");
+    RunningMarker marker(file / "folder");
+    const RunningMarker::Scope scope(marker, Deed::kLoading, "/a");
+    RunningMarker::AtWork work{};
+    EXPECT_FALSE(marker.innermost(work));
+}
