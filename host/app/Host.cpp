@@ -7,7 +7,6 @@
 #include "host/app/Parts.h"
 #include "host/applications/StartSummary.h"
 #include "host/console/Console.h"
-#include "host/messages/WindowBox.h"
 #include "host/platform/AutoreleasePool.h"
 #include "host/platform/PrivateFolder.h"
 #include "host/platform/ToolkitPlaces.h"
@@ -21,18 +20,6 @@ constexpr int kDeepestScript = 16;
 std::wstring wideText(const std::filesystem::path& path)
 {
     return toWide(path.string());
-}
-
-// What is refused in a safe session was meant to be: a box for each, before the person gets to the window
-// that they have asked for, would tell nothing that they do not know.
-MessageBox::Presenter quietWhenSafe(MessageBox::Presenter show, const Admission& admission)
-{
-    return [show = std::move(show), &admission](const MessageBox::Box& box)
-    {
-        return admission.isSafe() && admission.marker().reason() == RunningMarker::Reason::kForAnother
-                   ? 0
-                   : show(box);
-    };
 }
 } // namespace
 
@@ -99,7 +86,6 @@ Result<> Host::makeParts()
     mInterruptible = &mParts->lisp();
     mParts->registry->tellProgressBy([this](const std::wstring& sentence) { mCommandLine.say(sentence); });
     mInterruptibleRegistry = &*mParts->registry;
-    mParts->messageBox->setPresenter(quietWhenSafe(windowBoxes(mParts->layout.binaries), mParts->admission));
     addCommands();
     return {};
 }

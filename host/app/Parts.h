@@ -8,6 +8,7 @@
 #include <memory>
 
 #include "host/app/Layout.h"
+#include "host/app/WindowBox.h"
 #include "host/applications/Admission.h"
 #include "host/applications/ApplicationRecords.h"
 #include "host/applications/Bisecting.h"
@@ -75,7 +76,7 @@ struct Parts
     Owned<CallingApplication> callingApplication{*marker};
     Owned<CommandStack> commands{*commandLine, *callingApplication};
     Owned<ResourceModules> resources{toWide(layout.resources.string()), *callingApplication};
-    Owned<MessageBox> messageBox{*commandLine};
+    Owned<MessageBox> messageBox{*commandLine, quietWhenSafe(windowBoxes(layout.binaries), admission)};
     LoadOutcomes loadOutcomes;
     Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands,
                                 *messageBox,  loadOutcomes,        admission};

@@ -26,13 +26,9 @@ std::wstring asSentence(std::wstring text)
 }
 } // namespace
 
-MessageBox::MessageBox(CommandLine& commandLine) : mCommandLine(commandLine)
+MessageBox::MessageBox(CommandLine& commandLine, Presenter presenter)
+    : mCommandLine(commandLine), mPresenter(std::move(presenter))
 {
-}
-
-void MessageBox::setPresenter(Presenter presenter)
-{
-    mPresenter = std::move(presenter);
 }
 
 void MessageBox::explain(const std::wstring& path, const std::wstring& why)

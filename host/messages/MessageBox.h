@@ -1,4 +1,5 @@
-// The host's message box: text on the command line, until something graphical takes over.
+// The host's message box: a window where there is something to show it with, text on the command line
+// otherwise.
 #pragma once
 
 #include <functional>
@@ -26,11 +27,8 @@ public:
     // Shows a box and answers the button's code, or 0 when it cannot. Must not throw.
     using Presenter = std::function<int(const Box& box)>;
 
-    explicit MessageBox(CommandLine& commandLine);
-
-    // From now on boxes are shown by the presenter, and as text where it cannot; an empty one brings the
-    // text back.
-    void setPresenter(Presenter presenter);
+    // Boxes are shown by the presenter, and as text where it cannot or where there is none.
+    explicit MessageBox(CommandLine& commandLine, Presenter presenter = {});
 
     // Why something went wrong with the file: the detail of the next box, if that names the file.
     void explain(const std::wstring& path, const std::wstring& why);

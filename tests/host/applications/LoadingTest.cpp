@@ -79,12 +79,11 @@ TEST_F(Loading, AnswersTrueAtOnceForAFileThatIsLoadedHoweverItsPathIsSpelled)
 TEST_F(Loading, ExplainsAFailureInTheBoxThatNamesTheFile)
 {
     std::wstring detail;
-    mMessageBox.setPresenter(
-        [&](const tessel::MessageBox::Box& shown)
-        {
-            detail = shown.detail;
-            return IDOK;
-        });
+    mShowBox = [&](const tessel::MessageBox::Box& shown)
+    {
+        detail = shown.detail;
+        return IDOK;
+    };
     const auto path = mFolder / "missing.zmb";
     EXPECT_FALSE(load(path));
     const std::string said = output();

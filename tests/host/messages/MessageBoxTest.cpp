@@ -18,30 +18,28 @@ TEST(MessageBox, IsTextWithTheFirstButtonChosenWithoutADisplay)
 TEST(MessageBox, IsShownByThePresenterWhenThereIsOne)
 {
     CapturedOutput output;
-    tessel::MessageBox box(output.commandLine());
     std::wstring seen;
     unsigned seenStyle = 0;
-    box.setPresenter(
-        [&](const tessel::MessageBox::Box& shown)
-        {
-            seen = shown.text;
-            seenStyle = shown.style;
-            return 7;
-        });
+    tessel::MessageBox box(output.commandLine(),
+                           [&](const tessel::MessageBox::Box& shown)
+                           {
+                               seen = shown.text;
+                               seenStyle = shown.style;
+                               return 7;
+                           });
     EXPECT_EQ(box.show(L"text", 48, nullptr), 7);
     EXPECT_EQ(seen, L"text");
     EXPECT_EQ(seenStyle, 48u);
     EXPECT_EQ(output.text(), "");
-    box.setPresenter({});
-    EXPECT_EQ(box.show(L"text", 48, nullptr), IDOK);
+    tessel::MessageBox without(output.commandLine(), {});
+    EXPECT_EQ(without.show(L"text", 48, nullptr), IDOK);
     EXPECT_EQ(output.text(), "Message: text\n");
 }
 
 TEST(MessageBox, IsTextWhereThePresenterCannotShowIt)
 {
     CapturedOutput output;
-    tessel::MessageBox box(output.commandLine());
-    box.setPresenter([](const tessel::MessageBox::Box&) { return 0; });
+    tessel::MessageBox box(output.commandLine(), [](const tessel::MessageBox::Box&) { return 0; });
     EXPECT_EQ(box.show(L"text", MB_OK, nullptr), IDOK);
     EXPECT_EQ(output.text(), "Message: text\n");
 }
@@ -49,14 +47,13 @@ TEST(MessageBox, IsTextWhereThePresenterCannotShowIt)
 TEST(MessageBox, SaysInItsDetailWhatIsKnownOfTheFileThatItNames)
 {
     CapturedOutput output;
-    tessel::MessageBox box(output.commandLine());
     std::vector<std::wstring> details;
-    box.setPresenter(
-        [&](const tessel::MessageBox::Box& shown)
-        {
-            details.push_back(shown.detail);
-            return IDOK;
-        });
+    tessel::MessageBox box(output.commandLine(),
+                           [&](const tessel::MessageBox::Box& shown)
+                           {
+                               details.push_back(shown.detail);
+                               return IDOK;
+                           });
     box.explain(L"/a/tool.zmb", L"it has no entry point.");
     box.show(L"/a/tool.zmb was not loaded.", 48, nullptr);
     box.show(L"/a/tool.zmb was not loaded.", 48, nullptr);
@@ -68,14 +65,13 @@ TEST(MessageBox, SaysInItsDetailWhatIsKnownOfTheFileThatItNames)
 TEST(MessageBox, BeginsItsDetailWithACapitalUnlessThatIsAName)
 {
     CapturedOutput output;
-    tessel::MessageBox box(output.commandLine());
     std::vector<std::wstring> details;
-    box.setPresenter(
-        [&](const tessel::MessageBox::Box& shown)
-        {
-            details.push_back(shown.detail);
-            return IDOK;
-        });
+    tessel::MessageBox box(output.commandLine(),
+                           [&](const tessel::MessageBox::Box& shown)
+                           {
+                               details.push_back(shown.detail);
+                               return IDOK;
+                           });
     for (const wchar_t* why : {L"cut", L"it is", L"libc.so: gone", L"/a/b: gone", L"xy7 is", L"It is", L""})
     {
         box.explain(L"/a/tool.zmb", why);
@@ -97,9 +93,8 @@ TEST(MessageBox, LeavesTheDetailToTheCommandLineWithoutADisplay)
 TEST(MessageBox, IsKeptWhileBoxesAreCollected)
 {
     CapturedOutput output;
-    tessel::MessageBox box(output.commandLine());
     int shown = 0;
-    box.setPresenter([&](const tessel::MessageBox::Box&) { return ++shown; });
+    tessel::MessageBox box(output.commandLine(), [&](const tessel::MessageBox::Box&) { return ++shown; });
     box.collect();
     box.explain(L"/a/tool.zmb", L"it is gone.");
     EXPECT_EQ(box.show(L"/a/tool.zmb was not loaded.", 48, nullptr), IDOK);
@@ -135,16 +130,16 @@ TEST(MessageBox, OfTheHostIsWrittenOutInLinesWhereItCannotBeShown)
     box.show({.text = L"2 things.", .detail = L"One, two."}, L"2 things:\n  one\n  two", false);
     EXPECT_EQ(output.text(), "Message: 2 things:\n  one\n  two\n");
     std::wstring seen;
-    box.setPresenter(
-        [&](const tessel::MessageBox::Box& shown)
-        {
-            seen = shown.text + shown.detail;
-            return IDOK;
-        });
-    box.show({.text = L"2 things.", .detail = L"One, two."}, L"lines", false);
+    tessel::MessageBox window(output.commandLine(),
+                              [&](const tessel::MessageBox::Box& shown)
+                              {
+                                  seen = shown.text + shown.detail;
+                                  return IDOK;
+                              });
+    window.show({.text = L"2 things.", .detail = L"One, two."}, L"lines", false);
     EXPECT_EQ(seen, L"2 things.One, two.");
     EXPECT_EQ(output.text(), "Message: 2 things:\n  one\n  two\n");
-    box.show({.text = L"3 things.", .detail = L"One."}, L"all three", true);
+    window.show({.text = L"3 things.", .detail = L"One."}, L"all three", true);
     EXPECT_EQ(seen, L"3 things.One.");
     EXPECT_EQ(output.text(), "Message: 2 things:\n  one\n  two\nMessage: all three\n");
 }

@@ -61,7 +61,11 @@ protected:
     tessel::Admission mAdmission{mMarker, mKeptOut, mBisecting, false};
     tessel::CallingApplication mCalls{mMarker};
     tessel::CommandStack mCommands{mCommandLine, mCalls};
-    tessel::MessageBox mMessageBox{mCommandLine};
+    tessel::MessageBox::Presenter mShowBox; // boxes are text while there is none
+    tessel::MessageBox mMessageBox{mCommandLine, [this](const tessel::MessageBox::Box& box)
+                                   {
+                                       return mShowBox ? mShowBox(box) : 0;
+                                   }};
     tessel::LoadOutcomes mOutcomes;
     tessel::DynamicLinker mLinker{mCommandLine, mCalls, mCommands, mMessageBox, mOutcomes, mAdmission};
     tessel::ResourceModules mResources{tessel::toWide((mFolder / "HostResources").native()), mCalls};

@@ -7,7 +7,13 @@
 
 namespace tessel
 {
+class Admission;
+
 // Loads the library that stands in that folder when the first box is to be shown and there is a display: a
 // session that shows none does not carry the toolkit.
 MessageBox::Presenter windowBoxes(const std::filesystem::path& libraryFolder);
+
+// What is refused in a safe session was meant to be: a box for each, before the person gets to the window
+// that they have asked for, would tell nothing that they do not know.
+MessageBox::Presenter quietWhenSafe(MessageBox::Presenter show, const Admission& admission);
 } // namespace tessel

@@ -1,7 +1,10 @@
-#include "host/messages/WindowBox.h"
+#include "host/app/WindowBox.h"
+
+#include <utility>
 
 #include <dlfcn.h>
 
+#include "host/applications/Admission.h"
 #include "host/messages/platform/Desktop.h"
 
 namespace tessel
@@ -27,6 +30,16 @@ MessageBox::Presenter windowBoxes(const std::filesystem::path& libraryFolder)
     {
         static const ShowBox showBox = hasDisplay() ? findShowBox(library) : nullptr;
         return showBox ? showBox(box.text.c_str(), box.detail.c_str(), box.style, box.parent) : 0;
+    };
+}
+
+MessageBox::Presenter quietWhenSafe(MessageBox::Presenter show, const Admission& admission)
+{
+    return [show = std::move(show), &admission](const MessageBox::Box& box)
+    {
+        return admission.isSafe() && admission.marker().reason() == RunningMarker::Reason::kForAnother
+                   ? 0
+                   : show(box);
     };
 }
 } // namespace tessel
