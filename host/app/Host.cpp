@@ -77,7 +77,11 @@ Result<> Host::makeParts()
     // The applications that are loaded next may bring Objective-C along.
     static_cast<void>(keepToolkitFilesIn(mOptions.profileFolder / kToolkitFolder));
     mParts = std::make_unique<Parts>(Foundations{mCommandLine, mEndRequest, mInterruption,
-                                                 mOptions.profileFolder, mOptions.downloads, mOptions.safe});
+                                                 mOptions.profileFolder, mOptions.downloads, mOptions.safe,
+                                                 [this]
+                                                 {
+                                                     return finishLine();
+                                                 }});
     mCommandLine.tell(mParts->registry->canStore());
     if (const std::wstring& notice = mParts->registry->notice(); !notice.empty())
         mCommandLine.say(notice);
@@ -143,9 +147,6 @@ void Host::addCommands()
     addKeptOutCommands(*mParts);
     addSettingCommands(*mParts);
     addRegistryCommands(*mParts);
-    mParts->commands->setLoader([this](const std::wstring& name)
-                                { return mParts->demandLoading.loadForCommand(name); });
-    mParts->commands->setAfterLine([this] { return finishLine(); });
 }
 
 bool Host::run(const std::wstring& input)
@@ -153,7 +154,7 @@ bool Host::run(const std::wstring& input)
     const AutoreleasePool pool;
     const Interruption::Work work(mInterruption);
     if (!isLisp(input))
-        return mParts->commands->run(input);
+        return mParts->commandRunner.run(input);
     const auto value = mParts->lisp().evaluate(input);
     if (mCommandLine.tell(value) && !value->empty())
         mCommandLine.say(*value);

@@ -19,6 +19,7 @@
 #include "host/applications/KeptOutService.h"
 #include "host/applications/LoadOutcomes.h"
 #include "host/commands/CallingApplication.h"
+#include "host/commands/CommandRunner.h"
 #include "host/commands/CommandStack.h"
 #include "host/commands/EndRequest.h"
 #include "host/commands/Interruption.h"
@@ -53,6 +54,7 @@ struct Foundations
     const std::filesystem::path& profileFolder; // is there
     const RemoteFiles::Limits& downloads;
     bool safe; // load nothing by itself
+    CommandRunner::AfterLine afterLine;
 };
 
 struct Parts
@@ -74,7 +76,7 @@ struct Parts
     Admission admission{*marker, keptOut, bisecting, foundations.safe};
     Owned<KeptOutService> keptOutService{keptOut, admission, *commandLine};
     Owned<CallingApplication> callingApplication{*marker};
-    Owned<CommandStack> commands{*commandLine, *callingApplication};
+    Owned<CommandStack> commands{*callingApplication};
     Owned<ResourceModules> resources{toWide(layout.resources.string()), *callingApplication};
     Owned<MessageBox> messageBox{*commandLine, quietWhenSafe(windowBoxes(layout.binaries), admission)};
     LoadOutcomes loadOutcomes;
@@ -95,6 +97,10 @@ struct Parts
                                 .outcomes = &loadOutcomes,
                                 .admission = &admission},
                                *commandLine, *document, *endRequest);
+    CommandRunner commandRunner{*commands, *commandLine, *callingApplication,
+                                [this](const std::wstring& name)
+                                { return demandLoading.loadForCommand(name); },
+                                foundations.afterLine};
 
     // Only of parts whose Lisp has started.
     LispInterpreter& lisp() const { return **startedLisp; }

@@ -15,7 +15,6 @@
 namespace tessel
 {
 class CallingApplication;
-class CommandLine;
 
 class CommandStack : public TsEdCommandStack
 {
@@ -32,19 +31,12 @@ public:
         std::wstring summary; // one line, for commands of the host
     };
 
-    // Asked with the typed name when nobody has registered it; true when it has loaded an application that
-    // may have done so.
-    using Loader = std::function<bool(const std::wstring& name)>;
+    // Shared: a handler may remove the command that runs it.
+    using Command = std::shared_ptr<const TsEdCommand>;
 
-    // Called at the end of every line that ran, whatever came of it; false makes the line one that failed.
-    using AfterLine = std::function<bool()>;
-
-    // Says on the command line what became of a line, and tells `calls` whose command runs.
-    CommandStack(CommandLine& commandLine, CallingApplication& calls);
+    // `calls` knows whose a command is that is added.
+    explicit CommandStack(const CallingApplication& calls);
     ~CommandStack() override;
-
-    void setLoader(Loader loader);
-    void setAfterLine(AfterLine afterLine);
 
     // A command of the host itself: its arguments follow on the line, and no application can remove it.
     void addBuiltIn(const Description& description, BuiltIn handler);
@@ -56,11 +48,9 @@ public:
     int removeCommand(const wchar_t* group, const wchar_t* globalName) override;
     int removeGroup(const wchar_t* group) override;
 
-    // Runs one line: a command's name and its arguments (see `splitLine`). A blank line does nothing. Where
-    // several commands share a name, the one registered first runs, so that nobody can take the host's own
-    // away. False when the command is unknown or failed, which has been told by then. Nothing that a
-    // handler throws comes out of here.
-    bool run(std::wstring_view line);
+    // The command that a person types so, or null. Where several share a name, it is the one that was
+    // registered first, so that nobody can take the host's own away.
+    Command find(std::wstring_view typedName) const;
 
     // The commands that the application at that path has registered, in the order of registration.
     std::vector<Names> commandsOf(const std::wstring& applicationPath) const;
@@ -75,22 +65,9 @@ public:
     std::vector<Description> descriptions() const;
 
 private:
-    using Command = std::shared_ptr<TsEdCommand>; // shared: a handler may remove the command that runs it
-
-    Command find(std::wstring_view typedName) const;
-    Command findOrLoad(const std::wstring& typedName) const;
-    Result<> runParts(const Arguments& parts) const;
     std::size_t removeIf(const std::function<bool(const TsEdCommand&)>& goes);
 
-    CommandLine& mCommandLine;
-    CallingApplication& mCalls;
+    const CallingApplication& mCalls;
     std::vector<Command> mCommands;
-    Loader mLoader;
-    AfterLine mAfterLine;
 };
-
-// The parts of a line: split at blanks; double quotes keep blanks together and are taken away. Within them a
-// doubled quote stands for one, so that a file with a quote in its name can be named. A quote that is not
-// closed reaches to the end of the line.
-CommandStack::Arguments splitLine(std::wstring_view line);
 } // namespace tessel

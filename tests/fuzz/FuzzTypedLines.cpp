@@ -4,6 +4,7 @@
 #include <string>
 
 #include "host/commands/CallingApplication.h"
+#include "host/commands/CommandRunner.h"
 #include "host/commands/CommandStack.h"
 #include "host/console/InputAssembler.h"
 #include "host/text/CommandLine.h"
@@ -49,10 +50,11 @@ void runCommand(const std::wstring& line)
     static std::string said;
     static tessel::CommandLine commandLine([](std::string_view text) { said += text; });
     static tessel::CallingApplication calls;
-    static tessel::CommandStack stack(commandLine, calls);
+    static tessel::CommandStack stack(calls);
+    static tessel::CommandRunner runner(stack, commandLine, calls);
     const bool isBlank = tessel::splitLine(line).empty();
     said.clear();
-    require(stack.run(line) == isBlank); // there are no commands
+    require(runner.run(line) == isBlank); // there are no commands
     require(said.empty() == isBlank &&
             (isBlank || said.ends_with(". Type HELP for the list of commands.\n")));
 }

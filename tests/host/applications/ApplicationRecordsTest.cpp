@@ -59,7 +59,7 @@ protected:
 
     RegistryHost host;
     tessel::CallingApplication calls;
-    tessel::CommandStack commands{host.output().commandLine(), calls};
+    tessel::CommandStack commands{calls};
     std::optional<tessel::Owned<tessel::ApplicationRecords>> records;
     std::optional<tessel::CallingApplication::Scope> call;
 };

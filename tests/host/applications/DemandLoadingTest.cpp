@@ -80,12 +80,13 @@ TEST_F(Demand, LoadsTheApplicationThatHasTheCommand)
     record(L"Commands", path, 4);
     unload(path);
     output();
-    mCommands.setLoader([this](const std::wstring& name) { return mDemand.loadForCommand(name); });
-    EXPECT_TRUE(mCommands.run(L"pfad"));
+    tessel::CommandRunner runner(mCommands, mCommandLine, mCalls,
+                                 [this](const std::wstring& name) { return mDemand.loadForCommand(name); });
+    EXPECT_TRUE(runner.run(L"pfad"));
     EXPECT_EQ(output(), "Command.zmb: message 1\n" + path.native() + "\n");
     unload(path);
     output();
-    EXPECT_TRUE(mCommands.run(L"_tellpath"));
+    EXPECT_TRUE(runner.run(L"_tellpath"));
     EXPECT_EQ(output(), "Command.zmb: message 1\n" + path.native() + "\n");
 }
 

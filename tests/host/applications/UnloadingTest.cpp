@@ -87,7 +87,7 @@ TEST_F(UnloadingThroughLinks, AnswersForEitherPath)
         loadLinked("LocksItself.zmb", byLink);
         expectKnownBy(real);
         expectKnownBy(link);
-        mCommands.run(L"UNLOCK");
+        mRunner.run(L"UNLOCK");
         EXPECT_FALSE(mLinker.isModuleLocked(wide(byLink ? real : link).c_str()));
         EXPECT_TRUE(unload(byLink ? real : link));
         EXPECT_EQ(names(), L"");
@@ -117,7 +117,7 @@ TEST_F(UnloadingThroughLinks, AnswersForEitherPathOfAFileThatWasReplaced)
         replace();
         expectKnownBy(real);
         expectKnownBy(link);
-        mCommands.run(L"UNLOCK");
+        mRunner.run(L"UNLOCK");
         EXPECT_TRUE(unload(byLink ? real : link));
         EXPECT_EQ(names(), L"");
         std::filesystem::remove(link);
@@ -129,7 +129,7 @@ TEST_F(Unloading, TakesTheCommandsAlong)
 {
     const auto path = fixture("Command.zmb");
     load(path);
-    EXPECT_TRUE(mCommands.run(L"pfad"));
+    EXPECT_TRUE(mRunner.run(L"pfad"));
     EXPECT_EQ(output(), "Command.zmb: message 1\n" + path.native() + "\n");
     EXPECT_TRUE(unload(path));
     EXPECT_TRUE(mCommands.names().empty());
@@ -169,7 +169,7 @@ TEST_F(Unloading, KeepsALockedApplicationUntilItAllowsIt)
     EXPECT_TRUE(mLinker.loadedModules()[0].locked);
     EXPECT_FALSE(unload(path));
     EXPECT_EQ(output(), notUnloaded(path, "it is locked"));
-    mCommands.run(L"UNLOCK");
+    mRunner.run(L"UNLOCK");
     EXPECT_FALSE(mLinker.isModuleLocked(widePath.c_str()));
     EXPECT_TRUE(unload(path));
     EXPECT_EQ(output(), "LocksItself.zmb: message 2\n");
@@ -180,7 +180,7 @@ TEST_F(Unloading, KeepsAnApplicationWhileOneOfItsCommandsRuns)
     const auto path = fixture("Command.zmb");
     load(path);
     output();
-    EXPECT_TRUE(mCommands.run(L"UNLOADMYSELF"));
+    EXPECT_TRUE(mRunner.run(L"UNLOADMYSELF"));
     EXPECT_EQ(output(), notUnloaded(path, "it is at work") + "still here\n");
     EXPECT_EQ(names(), L"Command.zmb ");
 }

@@ -3,6 +3,7 @@
 #include <stdexcept>
 
 #include "host/commands/CallingApplication.h"
+#include "host/commands/CommandRunner.h"
 #include "host/commands/CommandStack.h"
 #include "tests/host/support/HostParts.h"
 
@@ -47,7 +48,8 @@ protected:
 
     CapturedOutput output;
     CallingApplication calling;
-    tessel::CommandStack stack{output.commandLine(), calling};
+    tessel::CommandStack stack{calling};
+    tessel::CommandRunner runner{stack, output.commandLine(), calling};
     tessel::Published<CallingApplication> publishedCalling{calling};
     tessel::Published<tessel::CommandStack> publishedStack{stack};
 };
@@ -56,32 +58,32 @@ protected:
 TEST_F(Commands, RunByLocalNameInAnyCaseAndByMarkedGlobalName)
 {
     ASSERT_EQ(add(kFirst, L"DRAW", L"CIRCLE", L"KREIS"), TSED_COMMAND_OK);
-    EXPECT_TRUE(stack.run(L"  kreis  "));
-    EXPECT_TRUE(stack.run(L"_circle"));
+    EXPECT_TRUE(runner.run(L"  kreis  "));
+    EXPECT_TRUE(runner.run(L"_circle"));
     EXPECT_EQ(calls, 2);
-    EXPECT_FALSE(stack.run(L"CIRCLE"));
+    EXPECT_FALSE(runner.run(L"CIRCLE"));
     EXPECT_EQ(calls, 2);
 }
 
 TEST_F(Commands, RunAsTheApplicationThatRegisteredThem)
 {
     add(kFirst, L"DRAW", L"CIRCLE", L"CIRCLE");
-    stack.run(L"CIRCLE");
+    runner.run(L"CIRCLE");
     EXPECT_EQ(caller, kFirst);
     EXPECT_EQ(calling.path(), L"");
 }
 
 TEST_F(Commands, AreUnknownInOneSentence)
 {
-    EXPECT_FALSE(stack.run(L"FOO bar"));
+    EXPECT_FALSE(runner.run(L"FOO bar"));
     EXPECT_EQ(output.text(), "Unknown command \"FOO\". Type HELP for the list of commands.\n");
 }
 
 TEST_F(Commands, ABlankLineIsNoCommand)
 {
     int lines = 0;
-    stack.setAfterLine([&] { return ++lines > 0; });
-    EXPECT_TRUE(stack.run(L" \t "));
+    tessel::CommandRunner counting(stack, output.commandLine(), calling, {}, [&] { return ++lines > 0; });
+    EXPECT_TRUE(counting.run(L" \t "));
     EXPECT_EQ(output.text(), "");
     EXPECT_EQ(lines, 0);
 }
@@ -144,9 +146,9 @@ TEST_F(Commands, MayRemoveThemselvesWhileTheyRun)
             running<tessel::CommandStack>()->removeCommandsOf(kFirst);
             ++calls;
         });
-    EXPECT_TRUE(stack.run(L"GO"));
+    EXPECT_TRUE(runner.run(L"GO"));
     EXPECT_EQ(calls, 1);
-    EXPECT_FALSE(stack.run(L"GO"));
+    EXPECT_FALSE(runner.run(L"GO"));
 }
 
 TEST_F(Commands, EndWithWhatTheyThrow)
@@ -154,11 +156,11 @@ TEST_F(Commands, EndWithWhatTheyThrow)
     add(kFirst, L"DRAW", L"A", L"BROKEN", [] { throw std::runtime_error("no größe"); });
     add(kFirst, L"DRAW", L"B", L"ODD", [] { throw 42; });
     int lines = 0;
-    stack.setAfterLine([&] { return ++lines > 0; });
-    EXPECT_FALSE(stack.run(L"broken"));
+    tessel::CommandRunner counting(stack, output.commandLine(), calling, {}, [&] { return ++lines > 0; });
+    EXPECT_FALSE(counting.run(L"broken"));
     EXPECT_EQ(output.text(), "The command \"BROKEN\" failed: no größe\n");
     output.clear();
-    EXPECT_FALSE(stack.run(L"odd"));
+    EXPECT_FALSE(counting.run(L"odd"));
     EXPECT_THAT(output.text(), HasSubstr("The command \"ODD\" failed: "));
     EXPECT_EQ(lines, 2);
     EXPECT_EQ(calling.path(), L"");
@@ -167,15 +169,15 @@ TEST_F(Commands, EndWithWhatTheyThrow)
 TEST_F(Commands, FailWhenWhatFollowsTheLineFails)
 {
     add(kFirst, L"DRAW", L"A", L"A");
-    stack.setAfterLine([] { return false; });
-    EXPECT_FALSE(stack.run(L"A"));
+    tessel::CommandRunner failing(stack, output.commandLine(), calling, {}, [] { return false; });
+    EXPECT_FALSE(failing.run(L"A"));
     EXPECT_EQ(calls, 1);
 }
 
 TEST_F(Commands, OfApplicationsTakeNoArguments)
 {
     add(kFirst, L"DRAW", L"A", L"A");
-    EXPECT_FALSE(stack.run(L"A 1"));
+    EXPECT_FALSE(runner.run(L"A 1"));
     EXPECT_EQ(calls, 0);
     EXPECT_EQ(output.text(), "The command \"A\" failed: it takes no arguments.\n");
 }
@@ -189,15 +191,15 @@ TEST_F(Commands, OfTheHostTakeArgumentsAndStay)
                          seen = arguments;
                          return arguments.size() != 1 ? tessel::Result<>() : tessel::Failure{L"Too few."};
                      });
-    EXPECT_TRUE(stack.run(LR"(echo "a b" c)"));
+    EXPECT_TRUE(runner.run(LR"(echo "a b" c)"));
     EXPECT_THAT(seen, ElementsAre(L"a b", L"c"));
-    EXPECT_FALSE(stack.run(L"ECHO x"));
+    EXPECT_FALSE(runner.run(L"ECHO x"));
     EXPECT_EQ(output.text(), "Too few.\n");
     EXPECT_EQ(stack.removeGroup(L"Session"), TSED_COMMAND_UNKNOWN);
     EXPECT_EQ(stack.removeCommand(L"Session", L"ECHO"), TSED_COMMAND_UNKNOWN);
     stack.removeCommandsOf(L"");
     add(kFirst, L"DRAW", L"ECHO", L"ECHO");
-    EXPECT_TRUE(stack.run(L"ECHO"));
+    EXPECT_TRUE(runner.run(L"ECHO"));
     EXPECT_EQ(calls, 0);
     EXPECT_THAT(stack.commandsOf(L""), IsEmpty());
 }
@@ -205,15 +207,15 @@ TEST_F(Commands, OfTheHostTakeArgumentsAndStay)
 TEST_F(Commands, AreLoadedWhenNobodyHasRegisteredThem)
 {
     std::vector<std::wstring> asked;
-    stack.setLoader(
-        [&](const std::wstring& name)
-        {
-            asked.push_back(name);
-            return name == L"later" && add(kSecond, L"DRAW", L"LATER", L"LATER") == TSED_COMMAND_OK;
-        });
-    EXPECT_TRUE(stack.run(L"later"));
-    EXPECT_TRUE(stack.run(L"LATER"));
-    EXPECT_FALSE(stack.run(L"NEVER"));
+    const auto load = [&](const std::wstring& name)
+    {
+        asked.push_back(name);
+        return name == L"later" && add(kSecond, L"DRAW", L"LATER", L"LATER") == TSED_COMMAND_OK;
+    };
+    tessel::CommandRunner loading(stack, output.commandLine(), calling, load);
+    EXPECT_TRUE(loading.run(L"later"));
+    EXPECT_TRUE(loading.run(L"LATER"));
+    EXPECT_FALSE(loading.run(L"NEVER"));
     EXPECT_EQ(calls, 2);
     EXPECT_THAT(asked, ElementsAre(L"later", L"NEVER"));
 }

@@ -12,6 +12,7 @@
 #include "host/applications/KeptOut.h"
 #include "host/applications/LoadOutcomes.h"
 #include "host/commands/CallingApplication.h"
+#include "host/commands/CommandRunner.h"
 #include "host/commands/CommandStack.h"
 #include "host/messages/MessageBox.h"
 #include "host/resources/ResourceModules.h"
@@ -60,7 +61,8 @@ protected:
     tessel::Bisecting mBisecting;
     tessel::Admission mAdmission{mMarker, mKeptOut, mBisecting, false};
     tessel::CallingApplication mCalls{mMarker};
-    tessel::CommandStack mCommands{mCommandLine, mCalls};
+    tessel::CommandStack mCommands{mCalls};
+    tessel::CommandRunner mRunner{mCommands, mCommandLine, mCalls};
     tessel::MessageBox::Presenter mShowBox; // boxes are text while there is none
     tessel::MessageBox mMessageBox{mCommandLine, [this](const tessel::MessageBox::Box& box)
                                    {

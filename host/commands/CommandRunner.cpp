@@ -1,0 +1,103 @@
+#include "host/commands/CommandRunner.h"
+
+#include <exception>
+#include <utility>
+
+#include "host/commands/CallingApplication.h"
+#include "host/commands/Command.h"
+#include "host/text/CommandLine.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+bool isBlank(wchar_t character)
+{
+    return character == L' ' || character == L'\t' || character == L'\r' || character == L'\n';
+}
+
+Failure failed(const std::wstring& name, const std::wstring& reason)
+{
+    return {L"The command \"" + name + L"\" failed: " + reason};
+}
+
+// What runs here may come from anybody's application: whatever it throws ends with the command.
+Result<> call(const TsEdCommand& command, const CommandStack::Arguments& arguments, CallingApplication& calls)
+{
+    try
+    {
+        if (command.builtIn)
+            return command.builtIn(arguments);
+        if (!arguments.empty())
+            return failed(command.localName, L"it takes no arguments.");
+        const CallingApplication::Scope calling(calls, command.owner, RunningMarker::Deed::kCommand,
+                                                command.localName);
+        command.handler();
+        return {};
+    }
+    catch (const std::exception& error)
+    {
+        return failed(command.localName, toWide(error.what()));
+    }
+    catch (...)
+    {
+        return failed(command.localName, L"it threw something that is not an error of the standard library.");
+    }
+}
+} // namespace
+
+CommandRunner::CommandRunner(const CommandStack& commands, CommandLine& commandLine,
+                             CallingApplication& calls, Loader loader, AfterLine afterLine)
+    : mCommands(commands), mCommandLine(commandLine), mCalls(calls), mLoader(std::move(loader)),
+      mAfterLine(std::move(afterLine))
+{
+}
+
+bool CommandRunner::run(std::wstring_view line)
+{
+    const CommandStack::Arguments parts = splitLine(line);
+    if (parts.empty())
+        return true;
+    const bool done = mCommandLine.tell(runParts(parts));
+    const bool finished = !mAfterLine || mAfterLine();
+    return done && finished;
+}
+
+Result<> CommandRunner::runParts(const CommandStack::Arguments& parts) const
+{
+    // Kept alive here: the handler may unload the application and so remove its own command.
+    if (const CommandStack::Command command = findOrLoad(parts.front()))
+        return call(*command, CommandStack::Arguments(parts.begin() + 1, parts.end()), mCalls);
+    return Failure{L"Unknown command \"" + parts.front() + L"\". Type HELP for the list of commands."};
+}
+
+CommandStack::Command CommandRunner::findOrLoad(const std::wstring& typedName) const
+{
+    CommandStack::Command command = mCommands.find(typedName);
+    if (!command && mLoader && mLoader(typedName))
+        command = mCommands.find(typedName);
+    return command;
+}
+
+CommandStack::Arguments splitLine(std::wstring_view line)
+{
+    CommandStack::Arguments parts;
+    bool quoted = false;
+    bool inPart = false; // also true for a pair of quotes with nothing between them
+    for (std::size_t at = 0; at < line.size(); ++at)
+    {
+        const bool separates = !quoted && isBlank(line[at]);
+        if (!separates && !inPart)
+            parts.emplace_back();
+        inPart = !separates;
+        const bool doubled = quoted && line.substr(at).starts_with(L"\"\"");
+        if (line[at] == L'"' && !doubled)
+            quoted = !quoted;
+        else if (!separates)
+            parts.back() += line[at];
+        at += doubled ? 1 : 0;
+    }
+    return parts;
+}
+} // namespace tessel

@@ -1,0 +1,51 @@
+// Runs the lines that a person types, but for those of Lisp: the commands of the stack, with their arguments.
+#pragma once
+
+#include <functional>
+#include <string>
+#include <string_view>
+
+#include "host/commands/CommandStack.h"
+#include "host/text/Result.h"
+
+namespace tessel
+{
+class CallingApplication;
+class CommandLine;
+
+class CommandRunner
+{
+public:
+    // Asked with the typed name when nobody has registered it; true when it has loaded an application that
+    // may have done so.
+    using Loader = std::function<bool(const std::wstring& name)>;
+
+    // Called at the end of every line that ran, whatever came of it; false makes the line one that failed.
+    using AfterLine = std::function<bool()>;
+
+    // Says on the command line what became of a line, and tells `calls` whose command runs. Without a loader
+    // there are the commands of the stack and no more.
+    CommandRunner(const CommandStack& commands, CommandLine& commandLine, CallingApplication& calls,
+                  Loader loader = {}, AfterLine afterLine = {});
+
+    // Runs one line: a command's name and its arguments (see `splitLine`). A blank line does nothing. False
+    // when the command is unknown or failed, which has been told by then. Nothing that a handler throws comes
+    // out of here.
+    bool run(std::wstring_view line);
+
+private:
+    CommandStack::Command findOrLoad(const std::wstring& typedName) const;
+    Result<> runParts(const CommandStack::Arguments& parts) const;
+
+    const CommandStack& mCommands;
+    CommandLine& mCommandLine;
+    CallingApplication& mCalls;
+    Loader mLoader;
+    AfterLine mAfterLine;
+};
+
+// The parts of a line: split at blanks; double quotes keep blanks together and are taken away. Within them a
+// doubled quote stands for one, so that a file with a quote in its name can be named. A quote that is not
+// closed reaches to the end of the line.
+CommandStack::Arguments splitLine(std::wstring_view line);
+} // namespace tessel
