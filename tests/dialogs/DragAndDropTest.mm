@@ -87,10 +87,9 @@ TEST_F(Dropping, TellsOfAFileWithoutAnExtensionOnceItIsDropped)
 
 TEST_F(Dropping, ScrollsToNoRow)
 {
-    for (int index = 0; index < 60; ++index)
-        gLoadedAppList.AddTail(file("tool" + std::to_string(index) + ".lsp"));
+    fillWithMany(gLoadedAppList);
     open();
-    drop(loadedTable(), paths({"one.zmb"}), 60);
+    drop(loadedTable(), paths({"one.zmb"}), kMany);
     EXPECT_EQ(file("one.zmb"), rowsOf(loadedApps()).back());
     EXPECT_TRUE(NSLocationInRange(0, [loadedTable() rowsInRect:[loadedTable() visibleRect]]));
 }
@@ -175,8 +174,7 @@ TEST_F(Dropping, AppendsAgainAfterwards)
     gLoadedAppList.AddTail(loadedModule("m0.zmb"));
     open();
     drop(loadedTable(), paths({"one.zmb"}), 0);
-    selectFiles({"two.zmb"});
-    [mController onLoad:nil];
+    load({"two.zmb"});
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb"), file("m0.zmb"), file("two.zmb")));
 }
 
@@ -256,7 +254,7 @@ TEST_F(Dropping, AddsWhatWasLoadedBeforeAFailure)
     [box() performDragOperation:dragOf(paths({"one.zmb", "bad.zmb", "two.zmb"}))];
     EXPECT_THAT(Texts(gStartupList), ElementsAre(file("one.zmb")));
     EXPECT_FALSE(host().linker.isLoaded(file("two.zmb")));
-    EXPECT_EQ(Message(ModrigMessages::kOneAddedToStartupSuite, L"one.zmb"), wide([mController message]));
+    EXPECT_EQ(Message(ModrigMessages::kOneAddedToStartupSuite, L"one.zmb"), message());
 }
 
 TEST_F(Dropping, KeepsTemporaryInternetFilesOutOfTheStartupSuite)
@@ -347,7 +345,7 @@ protected:
         for (const char* name : {"m0.zmb", "m1.zmb", "m2.zmb"})
             gLoadedAppList.AddTail(loadedModule(name));
         open();
-        [mController setTabViewSelectedIndex:0];
+        [mController setTabViewSelectedIndex:kLoadedApplicationsTab];
         show();
         [mPanel displayIfNeeded];
         for (int gap = 0; gap <= kRows; ++gap)

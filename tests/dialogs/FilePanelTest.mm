@@ -96,6 +96,19 @@ protected:
         for (int number = 100; number < 100 + count; ++number)
             mFolder.write("tool" + std::to_string(number) + ".lsp", "");
     }
+    // Chooses a file far down in a list of many, and remembers what shows then.
+    void chooseFarDown(const wchar_t* name)
+    {
+        [table() scrollRowToVisible:150];
+        mFirstVisible = firstVisibleRow();
+        selectFilesIn(mPanel, {name});
+    }
+    // So many rows have come in above; nothing else has moved.
+    void expectStillThere(const std::string& name, NSInteger newRows = 0)
+    {
+        EXPECT_EQ(mFirstVisible + newRows, firstVisibleRow());
+        EXPECT_THAT(chosen(), ElementsAre(file(name)));
+    }
     // In the middle of the year 2001.
     void giveOldDate(const std::string& name)
     {
@@ -121,6 +134,7 @@ protected:
     {
         pressKey(mPanel, [NSString stringWithCharacters:&key length:1], modifiers);
     }
+    NSInteger mFirstVisible = 0;
 };
 } // namespace
 
@@ -245,15 +259,12 @@ TEST_F(FilePanelList, KeepsFolderSelectionAndPlaceWhenItsDelegateIsAskedAgain)
     writeMany(200);
     use({[this]
          {
-             [table() scrollRowToVisible:150];
-             const NSInteger first = firstVisibleRow();
-             selectFilesIn(mPanel, {L"tool249.lsp"});
+             chooseFarDown(L"tool249.lsp");
              mListener->hidden = @"tool12";
              const int told = mListener->told;
              [mPanel validateVisibleColumns];
              EXPECT_EQ(190u, shown().size());
-             EXPECT_EQ(first - 10, firstVisibleRow());
-             EXPECT_THAT(chosen(), ElementsAre(file("tool249.lsp")));
+             expectStillThere("tool249.lsp", -10);
              EXPECT_EQ(told, mListener->told) << "nothing has changed";
              mListener->hidden = @"tool24";
              [mPanel validateVisibleColumns];
@@ -266,61 +277,37 @@ TEST_F(FilePanelList, KeepsFolderSelectionAndPlaceWhenItsDelegateIsAskedAgain)
 TEST_F(FilePanelList, AsksItsDelegateAgainWhenItIsSentAwayAndBack)
 {
     writeMany(200);
-    NSInteger first = 0;
-    use({[&]
+    use({[this]
          {
-             [table() scrollRowToVisible:150];
-             first = firstVisibleRow();
-             selectFilesIn(mPanel, {L"tool250.lsp"});
+             chooseFarDown(L"tool250.lsp");
              mListener->hidden = @"tool299";
              [mPanel setDirectory:@"/"];
              [mPanel setDirectory:in("")];
          },
-         [&] { return shown().size() == 199; },
-         [&]
-         {
-             EXPECT_EQ(first, firstVisibleRow());
-             EXPECT_THAT(chosen(), ElementsAre(file("tool250.lsp")));
-         }});
+         [this] { return shown().size() == 199; }, [this] { expectStillThere("tool250.lsp"); }});
 }
 
 TEST_F(FilePanelList, ShowsWhatComesIntoTheFolderAndKeepsItsPlace)
 {
     writeMany(200);
-    NSInteger first = 0;
-    use({[&]
+    use({[this]
          {
-             [table() scrollRowToVisible:150];
-             first = firstVisibleRow();
-             selectFilesIn(mPanel, {L"tool250.lsp"});
+             chooseFarDown(L"tool250.lsp");
              mFolder.write("a-new-one.lsp", "");
          },
-         [&] { return shown().size() == 201; },
-         [&]
-         {
-             EXPECT_EQ(first + 1, firstVisibleRow());
-             EXPECT_THAT(chosen(), ElementsAre(file("tool250.lsp")));
-         }});
+         [this] { return shown().size() == 201; }, [this] { expectStillThere("tool250.lsp", 1); }});
 }
 
 TEST_F(FilePanelList, ShowsNewDatesOfFilesAndKeepsItsPlace)
 {
     writeMany(200);
-    NSInteger first = 0;
-    use({[&]
+    use({[this]
          {
-             [table() scrollRowToVisible:150];
-             first = firstVisibleRow();
-             selectFilesIn(mPanel, {L"tool250.lsp"});
+             chooseFarDown(L"tool250.lsp");
              EXPECT_NE(L"2001", dateIn(150).substr(0, 4));
              giveOldDate("tool250.lsp");
          },
-         [&] { return dateIn(150).starts_with(L"2001-"); },
-         [&]
-         {
-             EXPECT_EQ(first, firstVisibleRow());
-             EXPECT_THAT(chosen(), ElementsAre(file("tool250.lsp")));
-         }});
+         [this] { return dateIn(150).starts_with(L"2001-"); }, [this] { expectStillThere("tool250.lsp"); }});
 }
 
 TEST_F(FilePanelList, PutsAFileWhereItsNewDateBelongs)

@@ -11,12 +11,6 @@ namespace
 class FileTypes : public OpenDialogTest
 {
 protected:
-    NSArrayController* types() { return [mController valueForKey:@"fileTypes"]; }
-    void choose(NSUInteger place)
-    {
-        [types() setSelectionIndex:place];
-        [mController onFileTypesChanged:types()];
-    }
     std::optional<std::wstring> stored() const
     {
         return host().registry.value(host().moduleKey(), L"FileFilter");
@@ -62,17 +56,17 @@ TEST_F(FileTypes, AreNotStoredByOpening)
 TEST_F(FileTypes, AreStoredByTheirDescriptionWhenSomebodyChoosesOne)
 {
     open();
-    choose(3);
+    chooseFileType(kLispFileType);
     EXPECT_EQ(wide([TsOCModrigUtil modrigLoadString:@"IDS_MODRIG_LSP_APPS"]), stored());
     EXPECT_EQ(stored(), ModrigUtils::GetRegFileFilterListIndex().Text());
-    choose(0);
+    chooseFileType(kAllFileTypes);
     EXPECT_EQ(wide([TsOCModrigUtil modrigLoadString:@"IDS_MODRIG_TESSEL_APPS"]), stored());
 }
 
 TEST_F(FileTypes, AreNotStoredWhenTheProgramChangesThem)
 {
     open();
-    [types() setSelectionIndex:3];
+    [fileTypes() setSelectionIndex:kLispFileType];
     [mController onFileTypesChanged:nil];
     EXPECT_FALSE(stored());
 }
@@ -82,7 +76,7 @@ TEST_F(FileTypes, OpenAtTheFirstWhateverIsStored)
     host().registry.setValue(host().moduleKey(), L"FileFilter",
                              wide([TsOCModrigUtil modrigLoadString:@"IDS_MODRIG_LSP_APPS"]));
     open();
-    EXPECT_EQ(0u, [types() selectionIndex]);
+    EXPECT_EQ(kAllFileTypes, [fileTypes() selectionIndex]);
 }
 
 TEST_F(FileTypes, ThatCannotBeStoredAreToldAndUsed)
@@ -90,7 +84,7 @@ TEST_F(FileTypes, ThatCannotBeStoredAreToldAndUsed)
     open();
     host().registry.failWhen([](const RecordingRegistry::Call& call)
                              { return call.valueName == L"FileFilter" ? ERROR_WRITE_FAULT : ERROR_SUCCESS; });
-    choose(3);
+    chooseFileType(kLispFileType);
     EXPECT_EQ(std::vector<std::wstring>{Message(ModrigMessages::kFilterNotStored, L"%s")}, boxes());
-    EXPECT_EQ(3u, [types() selectionIndex]);
+    EXPECT_EQ(kLispFileType, [fileTypes() selectionIndex]);
 }

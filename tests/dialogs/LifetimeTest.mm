@@ -256,7 +256,8 @@ TEST_F(Lifetime, OfADialogEndsWithItsRun)
 {
     gLoadedAppList.AddTail(loadedModule("one.zmb"));
     gHistoryList.AddTail(file("one.zmb"));
-    const ModalSteps steps({[] { [[TsOCModrigUtil getModrigController] setTabViewSelectedIndex:1]; },
+    const ModalSteps steps({[]
+                            { [[TsOCModrigUtil getModrigController] setTabViewSelectedIndex:kHistoryTab]; },
                             [] { [runningPanel() cancel:nil]; }});
     EXPECT_EQ(L"", run([[CountedDialog alloc] init]));
     EXPECT_EQ(1, gDialogsGone);
@@ -345,8 +346,7 @@ TEST_F(Lifetime, OfTheRowsEndsWithTheDialog)
     gHistoryList.AddTail(file("one.zmb"));
     open();
     [mController setSaveHistory:YES];
-    selectFiles({"two.zmb"});
-    [mController onLoad:nil];
+    load({"two.zmb"});
     NSArray* rows = [[NSArray alloc] initWithArray:[historyList() arrangedObjects]];
     close();
     [pool drain];

@@ -37,12 +37,6 @@ protected:
         while (std::chrono::steady_clock::now() < end)
             ;
     }
-    void load(std::initializer_list<std::string> names)
-    {
-        selectFiles(names);
-        [mController onLoad:nil];
-    }
-    std::wstring message() { return wide([mController message]); }
 
     static std::string cursorOnTheScreen()
     {

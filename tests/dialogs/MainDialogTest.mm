@@ -26,17 +26,11 @@ protected:
     {
         return host().registry.value(settingsKey(), name);
     }
-    std::wstring message() { return wide([mController message]); }
     static NSString* shownIn(NSTableView* table, NSUInteger column, NSInteger row)
     {
         return [[table dataSource] tableView:table
                    objectValueForTableColumn:[[table tableColumns] objectAtIndex:column]
                                          row:row];
-    }
-    void fillHistory(std::initializer_list<std::string> names)
-    {
-        for (const std::string& name : names)
-            gHistoryList.AddTail(CStdStr(file(name)));
     }
 };
 } // namespace
@@ -56,7 +50,7 @@ TEST_F(MainDialog, ShowsLoadedApplicationsAndThoseOfTheStartupSuiteThatAreLoaded
 
 TEST_F(MainDialog, ShowsTheWholeHistory)
 {
-    fillHistory({"one.zmb", "two.lsp"});
+    fill(gHistoryList, {"one.zmb", "two.lsp"});
     open();
     EXPECT_THAT(rowsOf(historyList()), ElementsAre(file("one.zmb"), file("two.lsp")));
     EXPECT_EQ(2, [historyTable() numberOfRows]);
@@ -65,7 +59,7 @@ TEST_F(MainDialog, ShowsTheWholeHistory)
 TEST_F(MainDialog, OpensWithNothingSelected)
 {
     gLoadedAppList.AddTail(loadedModule("one.zmb"));
-    fillHistory({"one.zmb"});
+    fill(gHistoryList, {"one.zmb"});
     open();
     EXPECT_THAT(selectionOf(loadedApps()), IsEmpty());
     EXPECT_THAT(selectionOf(historyList()), IsEmpty());
@@ -117,8 +111,7 @@ TEST_F(MainDialog, TakesMessagesIntoItsMessageLineOnlyWhileItIsOpen)
 TEST_F(MainDialog, LoadsTheSelectedFilesAndShowsThem)
 {
     open();
-    selectFiles({"one.zmb", "two.zmb"});
-    [mController onLoad:nil];
+    load({"one.zmb", "two.zmb"});
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb"), file("two.zmb")));
     EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"2")));
     EXPECT_EQ(Message(ModrigMessages::kManyLoaded, L"2"), message());
@@ -129,19 +122,17 @@ TEST_F(MainDialog, LeavesTheHistoryAloneUnlessItIsToBeSaved)
 {
     open();
     [mController setSaveHistory:NO];
-    selectFiles({"one.zmb", "two.zmb"});
-    [mController onLoad:nil];
+    load({"one.zmb", "two.zmb"});
     EXPECT_TRUE(gHistoryList.IsEmpty());
     EXPECT_THAT(rowsOf(historyList()), IsEmpty());
 }
 
 TEST_F(MainDialog, AddsLoadedFilesToTheHistoryListAndItsTable)
 {
-    fillHistory({"one.zmb"});
+    fill(gHistoryList, {"one.zmb"});
     open();
     [mController setSaveHistory:YES];
-    selectFiles({"one.zmb", "two.zmb"});
-    [mController onLoad:nil];
+    load({"one.zmb", "two.zmb"});
     EXPECT_THAT(Texts(gHistoryList), ElementsAre(file("one.zmb"), file("two.zmb")));
     EXPECT_THAT(rowsOf(historyList()), ElementsAre(file("one.zmb"), file("two.zmb")));
 }
@@ -150,8 +141,7 @@ TEST_F(MainDialog, StopsAtTheSecondOfThreeFilesWithoutASummary)
 {
     open();
     host().linker.refuseToLoad(file("two.zmb"));
-    selectFiles({"one.zmb", "two.zmb", "three.zmb"});
-    [mController onLoad:nil];
+    load({"one.zmb", "two.zmb", "three.zmb"});
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb")));
     EXPECT_FALSE(host().linker.isLoaded(file("three.zmb")));
     EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kLoadFailed, file("two.zmb"))));
@@ -165,8 +155,7 @@ TEST_F(MainDialog, ShowsApplicationsThatCannotBeLoadedAndSaysSoWhenOneIsChosen)
         const std::wstring chosen = file(name);
         open();
         EXPECT_TRUE([mController panel:mPanel shouldShowFilename:path(name)]) << name;
-        selectFiles({name});
-        [mController onLoad:nil];
+        load({name});
         EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, chosen),
                                          Message(ModrigMessages::kLoadFailed, chosen)));
         close();
@@ -178,8 +167,7 @@ TEST_F(MainDialog, SaysThatAFileIsLoadedAlreadyAndAddsNoRow)
 {
     gLoadedAppList.AddTail(loadedModule("one.zmb"));
     open();
-    selectFiles({"one.zmb"});
-    [mController onLoad:nil];
+    load({"one.zmb"});
     EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kAlreadyLoaded, L"one.zmb")));
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb")));
 }
@@ -188,8 +176,7 @@ TEST_F(MainDialog, GivesALispFileThatIsLoadedAgainNoSecondRow)
 {
     gLoadedAppList.AddTail(file("tool.lsp"));
     open();
-    selectFiles({"tool.lsp"});
-    [mController onLoad:nil];
+    load({"tool.lsp"});
     EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"tool.lsp")));
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("tool.lsp")));
 }
@@ -207,8 +194,7 @@ TEST_F(MainDialog, RemembersTheFolderOfThePanelWhenItLoads)
     host().registry.setValue(settingsKey(), L"InitialPath", mFolder.path().wstring());
     open();
     host().registry.removeValue(settingsKey(), L"InitialPath");
-    selectFiles({"one.zmb"});
-    [mController onLoad:nil];
+    load({"one.zmb"});
     EXPECT_EQ(mFolder.path().wstring(), setting(L"InitialPath"));
 }
 
@@ -246,8 +232,7 @@ TEST_F(MainDialog, LoadsEveryFileThoughLoadingChangesWhatIsChosen)
 {
     open();
     [mController setSaveHistory:YES];
-    selectFiles({"one.zmb", "two.zmb", "three.zmb"});
-    [mController onLoad:nil];
+    load({"one.zmb", "two.zmb", "three.zmb"});
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb"), file("two.zmb"), file("three.zmb")));
     EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"3")));
 }
@@ -255,14 +240,13 @@ TEST_F(MainDialog, LoadsEveryFileThoughLoadingChangesWhatIsChosen)
 TEST_F(MainDialog, LoadsLispFilesAlone)
 {
     open();
-    selectFiles({"one.lsp"});
-    [mController onLoad:nil];
+    load({"one.lsp"});
     EXPECT_EQ(L"(load \"" + file("one.lsp") + L"\")", host().lisp.queued[0]);
 }
 
 TEST_F(MainDialog, LoadsAllOfALispFileThatJoinsTheStartupSuite)
 {
-    fillHistory({"one.lsp"});
+    fill(gHistoryList, {"one.lsp"});
     open();
     select(historyTable(), {0});
     [mController onLoadFromHistory:nil];
@@ -275,7 +259,7 @@ TEST_F(MainDialog, LoadsAllOfALispFileThatJoinsTheStartupSuite)
 
 TEST_F(MainDialog, DoesNotRememberTheFolderWhenItLoadsFromTheHistory)
 {
-    fillHistory({"one.zmb"});
+    fill(gHistoryList, {"one.zmb"});
     open();
     select(historyTable(), {0});
     [mController onLoadFromHistory:nil];
@@ -289,15 +273,14 @@ TEST_F(MainDialog, RemembersTheFolderAfterABatchThatEndedEarly)
     open();
     host().registry.removeValue(settingsKey(), L"InitialPath");
     host().linker.refuseToLoad(file("bad.zmb"));
-    selectFiles({"bad.zmb", "one.zmb"});
-    [mController onLoad:nil];
+    load({"bad.zmb", "one.zmb"});
     EXPECT_FALSE(host().linker.isLoaded(file("one.zmb")));
     EXPECT_EQ(mFolder.path().wstring(), setting(L"InitialPath"));
 }
 
 TEST_F(MainDialog, LoadsSelectedHistoryRowsWithTheLoadButton)
 {
-    fillHistory({"one.zmb", "two.zmb", "three.zmb"});
+    fill(gHistoryList, {"one.zmb", "two.zmb", "three.zmb"});
     open();
     selectFiles({"other.zmb"});
     select(historyTable(), {0, 2});
@@ -308,7 +291,7 @@ TEST_F(MainDialog, LoadsSelectedHistoryRowsWithTheLoadButton)
 
 TEST_F(MainDialog, LoadsNothingFromTheHistoryWithoutASelection)
 {
-    fillHistory({"one.zmb"});
+    fill(gHistoryList, {"one.zmb"});
     open();
     [mController onLoadFromHistory:nil];
     EXPECT_THAT(rowsOf(loadedApps()), IsEmpty());
@@ -317,7 +300,7 @@ TEST_F(MainDialog, LoadsNothingFromTheHistoryWithoutASelection)
 
 TEST_F(MainDialog, LoadsHistoryRowsByTheirOwnButtonAndByDoubleClick)
 {
-    fillHistory({"one.zmb", "two.zmb"});
+    fill(gHistoryList, {"one.zmb", "two.zmb"});
     open();
     select(historyTable(), {1});
     [mController onLoadFromHistory:nil];
@@ -330,7 +313,7 @@ TEST_F(MainDialog, LoadsHistoryRowsByTheirOwnButtonAndByDoubleClick)
 
 TEST_F(MainDialog, TakesADoubleClickFromTheHistoryTableOnly)
 {
-    fillHistory({"one.zmb"});
+    fill(gHistoryList, {"one.zmb"});
     open();
     select(historyTable(), {0});
     [mController onDoubleClickHistoryTableView:loadedTable()];
@@ -339,7 +322,7 @@ TEST_F(MainDialog, TakesADoubleClickFromTheHistoryTableOnly)
 
 TEST_F(MainDialog, AddsHistoryRowsToTheStartupSuiteAsIfTheyWereDropped)
 {
-    fillHistory({"one.zmb", "two.zmb", "three.zmb"});
+    fill(gHistoryList, {"one.zmb", "two.zmb", "three.zmb"});
     open();
     select(historyTable(), {0, 2});
     [mController onAddToStartupSuiteFromHistory:nil];
@@ -350,7 +333,7 @@ TEST_F(MainDialog, AddsHistoryRowsToTheStartupSuiteAsIfTheyWereDropped)
 
 TEST_F(MainDialog, NamesTheOnlyRowRemovedFromTheHistory)
 {
-    fillHistory({"one.zmb", "two.zmb"});
+    fill(gHistoryList, {"one.zmb", "two.zmb"});
     open();
     select(historyTable(), {0});
     [mController onRemove:nil];
@@ -362,7 +345,7 @@ TEST_F(MainDialog, NamesTheOnlyRowRemovedFromTheHistory)
 
 TEST_F(MainDialog, CountsThreeRowsRemovedFromTheHistory)
 {
-    fillHistory({"one.zmb", "two.zmb", "three.zmb", "four.zmb"});
+    fill(gHistoryList, {"one.zmb", "two.zmb", "three.zmb", "four.zmb"});
     open();
     select(historyTable(), {0, 1, 3});
     [mController onRemove:nil];
@@ -372,7 +355,7 @@ TEST_F(MainDialog, CountsThreeRowsRemovedFromTheHistory)
 
 TEST_F(MainDialog, RemovesNothingWithoutASelection)
 {
-    fillHistory({"one.zmb"});
+    fill(gHistoryList, {"one.zmb"});
     open();
     [mController onRemove:nil];
     [mController onUnload:nil];
@@ -458,7 +441,7 @@ TEST_F(MainDialog, KeepsRowsThatCannotBeUnloadedFromBeingSelected)
 {
     gLoadedAppList.AddTail(file("tool.lsp"));
     gLoadedAppList.AddTail(loadedModule("one.zmb"));
-    fillHistory({"tool.lsp"});
+    fill(gHistoryList, {"tool.lsp"});
     open();
     EXPECT_FALSE([mController tableView:loadedTable() shouldSelectRow:0]);
     EXPECT_TRUE([mController tableView:loadedTable() shouldSelectRow:1]);
@@ -471,7 +454,7 @@ TEST_F(MainDialog, KeepsRowsThatCannotBeUnloadedFromBeingSelected)
 TEST_F(MainDialog, EnablesButtonsWithTheSelection)
 {
     gLoadedAppList.AddTail(loadedModule("one.zmb"));
-    fillHistory({"one.zmb"});
+    fill(gHistoryList, {"one.zmb"});
     open();
     select(loadedTable(), {0});
     EXPECT_TRUE([mController canUnloadApp]);
@@ -491,7 +474,7 @@ TEST_F(MainDialog, IgnoresTheSelectionOfAnyOtherTable)
 
 TEST_F(MainDialog, EmptiesTheSelectedFilesWithTheHistorySelection)
 {
-    fillHistory({"one.zmb"});
+    fill(gHistoryList, {"one.zmb"});
     open();
     select(historyTable(), {0});
     EXPECT_EQ(1u, [[mController selectedFiles] count]);
@@ -503,7 +486,7 @@ TEST_F(MainDialog, RemembersCheckBoxAndTab)
 {
     open();
     EXPECT_FALSE([mController saveHistory]);
-    EXPECT_EQ(kLoadedTab, [mController tabViewSelectedIndex]);
+    EXPECT_EQ(kLoadedApplicationsTab, [mController tabViewSelectedIndex]);
     [mController setSaveHistory:YES];
     [mController setTabViewSelectedIndex:kHistoryTab];
     close();
@@ -516,52 +499,44 @@ TEST_F(MainDialog, RemembersCheckBoxAndTab)
 
 TEST_F(MainDialog, ScrollsTheShownTableToTheNewRow)
 {
-    for (int index = 0; index < 60; ++index)
-        gLoadedAppList.AddTail(file("tool" + std::to_string(index) + ".lsp"));
+    fillWithMany(gLoadedAppList);
     open();
-    selectFiles({"last.zmb"});
-    [mController onLoad:nil];
-    EXPECT_TRUE(NSContainsRect([loadedTable() visibleRect], [loadedTable() rectOfRow:60]));
+    load({"last.zmb"});
+    EXPECT_TRUE(NSContainsRect([loadedTable() visibleRect], [loadedTable() rectOfRow:kMany]));
 }
 
 TEST_F(MainDialog, ScrollsTheHistoryWhenThatShows)
 {
-    for (int index = 0; index < 60; ++index)
-        gHistoryList.AddTail(file("tool" + std::to_string(index) + ".lsp"));
+    fillWithMany(gHistoryList);
     open();
     [mController setTabViewSelectedIndex:kHistoryTab];
     [mController setSaveHistory:YES];
-    selectFiles({"last.zmb"});
-    [mController onLoad:nil];
-    EXPECT_TRUE(NSContainsRect([historyTable() visibleRect], [historyTable() rectOfRow:60]));
+    load({"last.zmb"});
+    EXPECT_TRUE(NSContainsRect([historyTable() visibleRect], [historyTable() rectOfRow:kMany]));
 }
 
 TEST_F(MainDialog, ScrollsNowhereWhenAnotherTabShows)
 {
-    for (int index = 0; index < 60; ++index)
-        for (CStringList* list : {&gLoadedAppList, &gHistoryList})
-            list->AddTail(file("tool" + std::to_string(index) + ".lsp"));
+    for (CStringList* list : {&gLoadedAppList, &gHistoryList})
+        fillWithMany(*list);
     open();
     // No view is bound any more that would object to a tab that is not there.
     [mController setSaveHistory:YES];
     [mController setValue:[NSNumber numberWithInt:2] forKey:@"tabViewSelectedIndex"];
-    selectFiles({"last.zmb"});
-    [mController onLoad:nil];
-    EXPECT_EQ(61u, rowsOf(loadedApps()).size());
+    load({"last.zmb"});
+    EXPECT_EQ(kMany + 1u, rowsOf(loadedApps()).size());
     for (NSTableView* table : {loadedTable(), historyTable()})
         EXPECT_TRUE(NSLocationInRange(0, [table rowsInRect:[table visibleRect]]));
-    [mController setTabViewSelectedIndex:kLoadedTab];
+    [mController setTabViewSelectedIndex:kLoadedApplicationsTab];
 }
 
 TEST_F(MainDialog, ScrollsNowhereAfterAFailure)
 {
-    for (int index = 0; index < 60; ++index)
-        gLoadedAppList.AddTail(file("tool" + std::to_string(index) + ".lsp"));
+    fillWithMany(gLoadedAppList);
     open();
     host().linker.refuseToLoad(file("bad.zmb"));
-    selectFiles({"one.zmb", "bad.zmb"});
-    [mController onLoad:nil];
-    EXPECT_EQ(61u, rowsOf(loadedApps()).size());
+    load({"one.zmb", "bad.zmb"});
+    EXPECT_EQ(kMany + 1u, rowsOf(loadedApps()).size());
     EXPECT_TRUE(NSLocationInRange(0, [loadedTable() rowsInRect:[loadedTable() visibleRect]]));
 }
 
@@ -569,8 +544,7 @@ TEST_F(MainDialog, EndsABatchSilentlyWhereLispIsOff)
 {
     host().variables.set(L"LISPENABLED", RecordingValue::Short(0));
     open();
-    selectFiles({"one.zmb", "tool.lsp", "two.zmb"});
-    [mController onLoad:nil];
+    load({"one.zmb", "tool.lsp", "two.zmb"});
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb")));
     EXPECT_FALSE(host().linker.isLoaded(file("two.zmb")));
     EXPECT_THAT(boxes(), IsEmpty());
@@ -580,7 +554,7 @@ TEST_F(MainDialog, EndsABatchSilentlyWhereLispIsOff)
 
 TEST_F(MainDialog, AddsNothingToTheStartupSuiteWithoutASelection)
 {
-    fillHistory({"one.zmb"});
+    fill(gHistoryList, {"one.zmb"});
     open();
     [mController onAddToStartupSuiteFromHistory:nil];
     EXPECT_TRUE(gStartupList.IsEmpty());

@@ -40,11 +40,10 @@ protected:
         for (const std::string& name : names)
             gLoadedAppList.AddTail(name.ends_with(".zmb") ? loadedModule(name) : file(name));
         open();
-        [mController setTabViewSelectedIndex:kLoadedTab];
+        [mController setTabViewSelectedIndex:kLoadedApplicationsTab];
         show();
     }
     NSButton* buttonOf(SEL action) { return buttonIn([mController view], action); }
-    std::wstring message() { return wide([mController message]); }
     static NSPoint headerOf(NSTableView* table)
     {
         return events::middleOf([[table headerView] headerRectOfColumn:0]);
@@ -81,12 +80,10 @@ TEST_F(Manners, LoadARowThatIsDoubleClicked)
 TEST_F(Manners, TakeTheLastSuccessAwayWhenTheNextLoadFails)
 {
     open();
-    selectFiles({"one.zmb"});
-    [mController onLoad:nil];
+    load({"one.zmb"});
     ASSERT_EQ(Message(ModrigMessages::kOneLoaded, L"one.zmb"), message());
     host().linker.refuseToLoad(file("bad.zmb"));
-    selectFiles({"bad.zmb"});
-    [mController onLoad:nil];
+    load({"bad.zmb"});
     EXPECT_EQ(L"", message());
 }
 
@@ -480,8 +477,7 @@ TEST_F(Manners, TellWhyNothingCanBeUnloadedInTheTipOfTheButton)
     ASSERT_FALSE([unload isEnabled]);
     const auto tip = [&] { return wide([[unload target] tipOfButton:unload]); };
     EXPECT_EQ(L"None of these applications can be unloaded.\nLisp applications cannot be unloaded.", tip());
-    selectFiles({"one.zmb"});
-    [mController onLoad:nil];
+    load({"one.zmb"});
     ASSERT_TRUE([unload isEnabled]);
     EXPECT_EQ(L"Unload the selected applications", tip());
 }

@@ -116,5 +116,5 @@ TEST_F(Names, MayHoldALineBreakWhichIsShownInTheLine)
     [mController onLoadFromHistory:nil];
     EXPECT_TRUE(host().linker.isLoaded(file("new\nline.zmb")));
     ModrigUtils::SetDialogMessage(CStdStr(L"new\nline.zmb was loaded."));
-    EXPECT_EQ(L"new\\nline.zmb was loaded.", wide([mController message]));
+    EXPECT_EQ(L"new\\nline.zmb was loaded.", message());
 }

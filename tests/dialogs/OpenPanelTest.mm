@@ -6,7 +6,6 @@
 #include "modrig/messages/MessageIds.h"
 #include "modrig/module/DialogBridge.h"
 
-#import "modrig/dialogs/ModrigFilePath.h"
 #import "modrig/dialogs/NSSavePanel+ModrigRuntime.h"
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
@@ -15,8 +14,6 @@ using testing::IsEmpty;
 
 namespace
 {
-constexpr NSUInteger kLispFilter = 3;
-constexpr NSUInteger kBundleFilter = 1;
 const std::wstring kPanelSettings = L"Software\\Tessel\\R21\\Profiles\\Default\\DialogSettings\\Modrig";
 
 class OpenPanel : public OpenDialogTest
@@ -27,44 +24,19 @@ protected:
         host().registry.setValue(kPanelSettings, L"InitialPath", folder.wstring());
         open();
     }
-    // Runs the dialog in a folder; the steps are followed by the one that closes it.
+    // Runs the dialog in a folder; after the steps it is cancelled.
     void runIn(const std::filesystem::path& folder, std::vector<ModalStep> steps)
     {
         host().registry.setValue(kPanelSettings, L"InitialPath", folder.wstring());
-        steps.insert(steps.begin(), ModalStep(
-                                        [this]
-                                        {
-                                            mController = [[TsOCModrigUtil getModrigController] retain];
-                                            mPanel = runningPanel();
-                                        }));
-        steps.push_back(ModalStep([this] { [mPanel cancel:nil]; }));
-        {
-            const ModalSteps running(steps);
-            ModrigUtils::RunModrigDialog();
-        }
-        [mController release];
-        mController = nil;
-    }
-    void choose(NSUInteger filter)
-    {
-        [[mController valueForKey:@"fileTypes"] setSelectionIndex:filter];
-        [mController onFileTypesChanged:nil];
+        runDialog(std::move(steps));
     }
     bool shows(const std::filesystem::path& path)
     {
         return [mController panel:mPanel shouldShowFilename:text(path.wstring())];
     }
     std::vector<std::wstring> shownFiles() { return filesShownIn(mPanel); }
-    std::wstring selectedFile() { return wide([[[mController selectedFiles] objectAtIndex:0] filePathName]); }
     std::wstring shownName() { return wide([nameField(mPanel) stringValue]); }
     void typeName(NSString* name) { typeNameInto(mPanel, name); }
-    std::vector<std::wstring> selectedFiles()
-    {
-        std::vector<std::wstring> files;
-        for (NSUInteger index = 0; index < [[mController selectedFiles] count]; ++index)
-            files.push_back(wide([[[mController selectedFiles] objectAtIndex:index] filePathName]));
-        return files;
-    }
     void click(std::initializer_list<const wchar_t*> names) { selectFilesIn(mPanel, names); }
     // Selects the folder and presses Return.
     void enter(const wchar_t* folder)
@@ -129,16 +101,15 @@ TEST_F(OpenPanel, FiltersAgainInsideAPackageThatTheFilterHides)
 {
     mFolder.write("tool.bundle/inner.lsp", "");
     openIn(mFolder / "tool.bundle");
-    choose(kLispFilter);
+    chooseFileType(kLispFileType);
     EXPECT_TRUE(shows(mFolder / "tool.bundle/inner.lsp"));
 }
 
 TEST_F(OpenPanel, StartsWithTheFirstOfSixFilters)
 {
     open();
-    NSArrayController* types = [mController valueForKey:@"fileTypes"];
-    EXPECT_EQ(6u, [[types arrangedObjects] count]);
-    EXPECT_EQ(0u, [types selectionIndex]);
+    EXPECT_EQ(6u, [[fileTypes() arrangedObjects] count]);
+    EXPECT_EQ(kAllFileTypes, [fileTypes() selectionIndex]);
 }
 
 TEST_F(OpenPanel, ShowsFilesOfTheFilterAndFolders)
@@ -149,13 +120,13 @@ TEST_F(OpenPanel, ShowsFilesOfTheFilterAndFolders)
     mFolder.write("Other.app/inside.txt", "");
     mFolder.write("tool.bundle/tool", "");
     open();
-    choose(kLispFilter);
+    chooseFileType(kLispFileType);
     EXPECT_TRUE(shows(mFolder / "a.LSP"));
     EXPECT_FALSE(shows(mFolder / "a.txt"));
     EXPECT_TRUE(shows(mFolder / "folder"));
     EXPECT_FALSE(shows(mFolder / "Other.app"));
     EXPECT_FALSE(shows(mFolder / "tool.bundle"));
-    choose(kBundleFilter);
+    chooseFileType(kBundleFileType);
     EXPECT_TRUE(shows(mFolder / "tool.bundle"));
     EXPECT_FALSE(shows(mFolder / "a.LSP"));
 }
@@ -164,7 +135,7 @@ TEST_F(OpenPanel, ShowsEveryPackageWhereItTreatsThemAsFolders)
 {
     mFolder.write("Other.app/inside.txt", "");
     open();
-    choose(kLispFilter);
+    chooseFileType(kLispFileType);
     EXPECT_FALSE(shows(mFolder / "Other.app"));
     [mPanel setTreatsFilePackagesAsDirectories:YES];
     EXPECT_TRUE(shows(mFolder / "Other.app"));
@@ -173,7 +144,7 @@ TEST_F(OpenPanel, ShowsEveryPackageWhereItTreatsThemAsFolders)
 TEST_F(OpenPanel, ShowsTheHostItself)
 {
     open();
-    choose(kLispFilter);
+    chooseFileType(kLispFileType);
     EXPECT_TRUE(shows(wide([[NSBundle mainBundle] bundlePath])));
 }
 
@@ -191,7 +162,7 @@ TEST_F(OpenPanel, JudgesALinkByWhatItLeadsTo)
 TEST_F(OpenPanel, HidesEverythingWithoutAFilter)
 {
     open();
-    [[mController valueForKey:@"fileTypes"] setContent:[NSMutableArray array]];
+    [fileTypes() setContent:[NSMutableArray array]];
     EXPECT_FALSE(shows(mFolder.path()));
     EXPECT_FALSE(shows(file("tool.lsp")));
 }
@@ -203,9 +174,9 @@ TEST_F(OpenPanel, FiltersTheListingAgainInTheSameFolder)
     runIn(mFolder.path(), {[this]
                            {
                                EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp", L"two.zmb"));
-                               choose(kLispFilter);
+                               chooseFileType(kLispFileType);
                                EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp"));
-                               choose(0);
+                               chooseFileType(kAllFileTypes);
                                EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp", L"two.zmb"));
                            }});
 }
@@ -215,11 +186,7 @@ TEST_F(OpenPanel, KeepsTheSelectedFilesAsTheyStandInThePanel)
     for (const char* name : {"one.lsp", "two.zmb"})
         file(name);
     runIn(mFolder.path(), {[this] { click({L"two.zmb"}); },
-                           [this]
-                           {
-                               ASSERT_EQ(1u, [[mController selectedFiles] count]);
-                               EXPECT_EQ(file("two.zmb"), selectedFile());
-                           }});
+                           [this] { EXPECT_THAT(selectedFiles(), ElementsAre(file("two.zmb"))); }});
 }
 
 TEST_F(OpenPanel, TakesAFolderThatIsWalkedThroughForNoSelection)
@@ -229,22 +196,18 @@ TEST_F(OpenPanel, TakesAFolderThatIsWalkedThroughForNoSelection)
                            {
                                selectFiles({"old.lsp"});
                                enter(L"folder");
-                               EXPECT_EQ(0u, [[mController selectedFiles] count]);
+                               EXPECT_THAT(selectedFiles(), IsEmpty());
                                EXPECT_EQ(L"", shownName());
                            },
                            [this] { return isIn(mFolder / "folder"); },
                            [this]
                            {
-                               EXPECT_EQ(0u, [[mController selectedFiles] count]);
+                               EXPECT_THAT(selectedFiles(), IsEmpty());
                                EXPECT_THAT(boxes(), IsEmpty());
                                EXPECT_THAT(shownFiles(), ElementsAre(L"one.lsp"));
                                click({L"one.lsp"});
                            },
-                           [this]
-                           {
-                               ASSERT_EQ(1u, [[mController selectedFiles] count]);
-                               EXPECT_EQ(file("folder/one.lsp"), selectedFile());
-                           }});
+                           [this] { EXPECT_THAT(selectedFiles(), ElementsAre(file("folder/one.lsp"))); }});
 }
 
 TEST_F(OpenPanel, RemembersTheFolderThatTheUserWentTo)
@@ -296,7 +259,7 @@ TEST_F(OpenPanel, ForgetsTheSelectedFileWhenTheListingIsFilteredAgain)
                            {
                                EXPECT_THAT(selectedFiles(), ElementsAre(file("two.zmb")));
                                EXPECT_EQ(L"two.zmb", shownName());
-                               choose(kLispFilter);
+                               chooseFileType(kLispFileType);
                                EXPECT_THAT(selectedFiles(), IsEmpty());
                                EXPECT_EQ(L"", shownName());
                                [mController onLoad:nil];
@@ -378,18 +341,18 @@ TEST_F(OpenPanel, ShowsTheSameFolderForEveryTypeAlsoInAPackageThatOneHides)
 {
     mFolder.write("tool.bundle/inner.lsp", "");
     const std::wstring package = (mFolder / "tool.bundle").wstring();
-    runIn(package, {[this] { choose(kLispFilter); },
+    runIn(package, {[this] { chooseFileType(kLispFileType); },
                     [&]
                     {
                         EXPECT_EQ(package, wide([mPanel directory]));
                         EXPECT_THAT(shownFiles(), ElementsAre(L"inner.lsp"));
-                        choose(kBundleFilter);
+                        chooseFileType(kBundleFileType);
                     },
                     [&]
                     {
                         EXPECT_EQ(package, wide([mPanel directory]));
                         EXPECT_THAT(shownFiles(), IsEmpty());
-                        choose(kLispFilter);
+                        chooseFileType(kLispFileType);
                     },
                     [&] { EXPECT_THAT(shownFiles(), ElementsAre(L"inner.lsp")); }});
 }
@@ -418,7 +381,7 @@ TEST_F(OpenPanel, KeepsWhatIsChosenInTheHistoryWhenATypeHidesItsOwnFile)
                            [this]
                            {
                                select(historyTable(), {0});
-                               choose(kLispFilter);
+                               chooseFileType(kLispFileType);
                                EXPECT_EQ(L"", shownName());
                                EXPECT_THAT(selectedFiles(), ElementsAre(file("old.zmb")));
                                [mController onLoad:nil];

@@ -4,43 +4,6 @@
 #include <algorithm>
 
 #include "modrig/messages/MessageIds.h"
-#include "modrig/module/DialogBridge.h"
-
-#import "modrig/dialogs/ModrigFilePath.h"
-#import "modrig/dialogs/TsOCModrigUtil.h"
-
-// What a panel answers about its selection.
-@interface ChoosingPanel : NSObject
-{
-    NSArray* mPaths;
-}
-- (id)initWithPaths:(NSArray*)paths;
-@end
-
-@implementation ChoosingPanel
-
-- (id)initWithPaths:(NSArray*)paths
-{
-    if ((self = [super init]))
-        mPaths = [paths copy];
-    return self;
-}
-
-- (void)dealloc
-{
-    [mPaths release];
-    [super dealloc];
-}
-
-- (NSArray*)URLs
-{
-    NSMutableArray* urls = [NSMutableArray array];
-    for (NSUInteger index = 0; index < [mPaths count]; ++index)
-        [urls addObject:[NSURL fileURLWithPath:[mPaths objectAtIndex:index]]];
-    return urls;
-}
-
-@end
 
 using testing::ElementsAre;
 using testing::IsEmpty;
@@ -50,11 +13,6 @@ namespace
 class Selection : public OpenDialogTest
 {
 protected:
-    void load(std::initializer_list<std::string> names)
-    {
-        selectFiles(names);
-        [mController onLoad:nil];
-    }
     void drop(std::initializer_list<std::string> names, NSInteger row)
     {
         [mController loadedAppsTableViewDropFiles:paths(names) atRow:row];
@@ -65,23 +23,7 @@ protected:
         return std::ranges::find(rows, file(name)) - rows.begin();
     }
     // A panel that has the files selected.
-    id panelWith(std::initializer_list<std::string> names)
-    {
-        return [[[ChoosingPanel alloc] initWithPaths:paths(names)] autorelease];
-    }
-    void chooseLisp()
-    {
-        NSArrayController* types = [mController valueForKey:@"fileTypes"];
-        [types setSelectionIndex:3];
-        [mController onFileTypesChanged:types];
-    }
-    std::vector<std::wstring> selectedFiles()
-    {
-        std::vector<std::wstring> files;
-        for (NSUInteger index = 0; index < [[mController selectedFiles] count]; ++index)
-            files.push_back(wide([[[mController selectedFiles] objectAtIndex:index] filePathName]));
-        return files;
-    }
+    id panelWith(std::initializer_list<std::string> names) { return panelWithSelected(paths(names)); }
 };
 } // namespace
 
@@ -132,29 +74,20 @@ TEST_F(Selection, IsNotMadeByAClickOnARowThatCannotBeUnloaded)
 {
     gLoadedAppList.AddTail(file("tool.lsp"));
     loadedModule("one.zmb");
-    const ModalSteps steps({[this]
-                            {
-                                mController = [TsOCModrigUtil getModrigController];
-                                mPanel = runningPanel();
-                                clickRow(loadedTable(), rowOf("tool.lsp"));
-                            },
-                            [] {},
-                            [this]
-                            {
-                                EXPECT_THAT(selectionOf(loadedApps()), IsEmpty());
-                                EXPECT_EQ(0, [loadedTable() numberOfSelectedRows]);
-                                EXPECT_FALSE([mController canUnloadApp]);
-                                clickRow(loadedTable(), rowOf("one.zmb"));
-                            },
-                            [] {},
-                            [this]
-                            {
-                                EXPECT_THAT(selectionOf(loadedApps()), ElementsAre(file("one.zmb")));
-                                EXPECT_TRUE([mController canUnloadApp]);
-                                [mPanel cancel:nil];
-                            }});
-    ModrigUtils::RunModrigDialog();
-    mController = nil;
+    runDialog({[this] { clickRow(loadedTable(), rowOf("tool.lsp")); }, [] {},
+               [this]
+               {
+                   EXPECT_THAT(selectionOf(loadedApps()), IsEmpty());
+                   EXPECT_EQ(0, [loadedTable() numberOfSelectedRows]);
+                   EXPECT_FALSE([mController canUnloadApp]);
+                   clickRow(loadedTable(), rowOf("one.zmb"));
+               },
+               [] {},
+               [this]
+               {
+                   EXPECT_THAT(selectionOf(loadedApps()), ElementsAre(file("one.zmb")));
+                   EXPECT_TRUE([mController canUnloadApp]);
+               }});
 }
 
 TEST_F(Selection, OfTheNewHistoryRowIsWhatLoadLoadsNext)
@@ -173,25 +106,19 @@ TEST_F(Selection, OfTheNewHistoryRowIsWhatLoadLoadsNext)
 
 TEST_F(Selection, OfTheNewHistoryRowIsTheSameAfterAClickOnIt)
 {
-    const ModalSteps steps({[this]
-                            {
-                                mController = [TsOCModrigUtil getModrigController];
-                                mPanel = runningPanel();
-                                [mController setSaveHistory:YES];
-                                [mController setTabViewSelectedIndex:1];
-                                load({"a.lsp", "b.lsp"});
-                            },
-                            [this] { clickRow(historyTable(), 1); }, [] {},
-                            [this]
-                            {
-                                EXPECT_THAT(selectedFiles(), ElementsAre(file("b.lsp")));
-                                [mController onLoad:nil];
-                                EXPECT_EQ(Message(ModrigMessages::kOneLoaded, L"b.lsp"),
-                                          wide([mController message]));
-                                [mPanel cancel:nil];
-                            }});
-    ModrigUtils::RunModrigDialog();
-    mController = nil;
+    runDialog({[this]
+               {
+                   [mController setSaveHistory:YES];
+                   [mController setTabViewSelectedIndex:kHistoryTab];
+                   load({"a.lsp", "b.lsp"});
+               },
+               [this] { clickRow(historyTable(), 1); }, [] {},
+               [this]
+               {
+                   EXPECT_THAT(selectedFiles(), ElementsAre(file("b.lsp")));
+                   [mController onLoad:nil];
+                   EXPECT_EQ(Message(ModrigMessages::kOneLoaded, L"b.lsp"), message());
+               }});
 }
 
 TEST_F(Selection, InThePanelCountsAgainAfterFilesHaveJoinedTheHistory)
@@ -199,7 +126,7 @@ TEST_F(Selection, InThePanelCountsAgainAfterFilesHaveJoinedTheHistory)
     open();
     [mController setSaveHistory:YES];
     load({"a.lsp", "b.lsp"});
-    [mController panelSelectionDidChange:panelWith({"a.lsp"})];
+    [mController panelSelectionDidChange:panelWithSelected(paths({"a.lsp"}))];
     EXPECT_THAT(selectedFiles(), ElementsAre(file("a.lsp")));
 }
 
@@ -208,7 +135,7 @@ TEST_F(Selection, OfTheHistoryRowThatADropMadeReplacesThatOfThePanel)
     open();
     [mController setSaveHistory:YES];
     load({"a.lsp"});
-    [mController panelSelectionDidChange:panelWith({"a.lsp"})];
+    [mController panelSelectionDidChange:panelWithSelected(paths({"a.lsp"}))];
     drop({"dropped.lsp"}, 0);
     EXPECT_THAT(selectedFiles(), ElementsAre(file("dropped.lsp")));
 }
@@ -225,12 +152,12 @@ TEST_F(Selection, IsTheLastOneMadeInThePanelOrInTheHistory)
 {
     gHistoryList.AddTail(file("old.lsp"));
     open();
-    [mController panelSelectionDidChange:panelWith({"a.lsp"})];
+    [mController panelSelectionDidChange:panelWithSelected(paths({"a.lsp"}))];
     select(historyTable(), {0});
     EXPECT_THAT(selectedFiles(), ElementsAre(file("old.lsp")));
-    [mController panelSelectionDidChange:panelWith({"a.lsp"})];
+    [mController panelSelectionDidChange:panelWithSelected(paths({"a.lsp"}))];
     EXPECT_THAT(selectedFiles(), ElementsAre(file("a.lsp")));
-    [mController panelSelectionDidChange:panelWith({})];
+    [mController panelSelectionDidChange:panelWithSelected(paths({}))];
     EXPECT_THAT(selectedFiles(), IsEmpty());
 }
 
@@ -239,7 +166,7 @@ TEST_F(Selection, OfTheHistoryOutlivesAnotherFileType)
     gHistoryList.AddTail(file("old.zmb"));
     open();
     select(historyTable(), {0});
-    chooseLisp();
+    chooseFileType(kLispFileType);
     EXPECT_THAT(selectedFiles(), ElementsAre(file("old.zmb")));
     [mController onLoad:nil];
     EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"old.zmb")));
@@ -250,7 +177,7 @@ TEST_F(Selection, OfTheHistoryIsLoadedWhenThePanelLeavesNothingChosen)
     gHistoryList.AddTail(file("old.zmb"));
     open();
     select(historyTable(), {0});
-    [mController panelSelectionDidChange:panelWith({})];
+    [mController panelSelectionDidChange:panelWithSelected(paths({}))];
     [mController onLoad:nil];
     EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"old.zmb")));
 }
@@ -259,7 +186,7 @@ TEST_F(Selection, OfNothingIsAnsweredInTheMessageLine)
 {
     open();
     [mController onLoad:nil];
-    EXPECT_EQ(L"Select a file in the list above or in the History first.", wide([mController message]));
+    EXPECT_EQ(L"Select a file in the list above or in the History first.", message());
     EXPECT_THAT(lines(), IsEmpty());
 }
 

@@ -231,14 +231,13 @@ TEST_F(StartupSuiteDialog, PassesOverAFileThatHasARowBeforeItAsksWhereItCameFrom
 
 TEST_F(StartupSuiteDialog, ScrollsNowhereWhenNothingWasAdded)
 {
-    for (int index = 0; index < 60; ++index)
-        gStartupList.AddTail(file("tool" + std::to_string(index) + ".lsp"));
+    fillWithMany(gStartupList);
     open();
     openSuite();
     host().internet.urlsOfLocalFiles[file("net.zmb")] = L"http://example.org/net.zmb";
     [mSuite addFiles:paths({"net.zmb"})];
     EXPECT_TRUE(NSLocationInRange(0, [table() rowsInRect:[table() visibleRect]]));
-    EXPECT_FALSE(NSLocationInRange(59, [table() rowsInRect:[table() visibleRect]]));
+    EXPECT_FALSE(NSLocationInRange(kMany - 1, [table() rowsInRect:[table() visibleRect]]));
 }
 
 TEST_F(StartupSuiteDialog, RefusesFiftyOneFiles)
@@ -267,12 +266,11 @@ TEST_F(StartupSuiteDialog, AddsNothingWhenNoMainDialogIsOpen)
 
 TEST_F(StartupSuiteDialog, ScrollsToTheNewRow)
 {
-    for (int index = 0; index < 60; ++index)
-        gStartupList.AddTail(file("tool" + std::to_string(index) + ".lsp"));
+    fillWithMany(gStartupList);
     open();
     openSuite();
     [mSuite addFiles:paths({"last.zmb"})];
-    EXPECT_TRUE(NSContainsRect([table() visibleRect], [table() rectOfRow:60]));
+    EXPECT_TRUE(NSContainsRect([table() visibleRect], [table() rectOfRow:kMany]));
 }
 
 TEST_F(StartupSuiteDialog, OpensItsHelpPage)

@@ -56,7 +56,7 @@ TEST_F(TabOrder, OfTheMainDialogIsThatOfReading)
     gLoadedAppList.AddTail(loadedModule("one.zmb"));
     open();
     show();
-    [mController setTabViewSelectedIndex:kLoadedTab];
+    [mController setTabViewSelectedIndex:kLoadedApplicationsTab];
     select(loadedTable(), {0});
     EXPECT_THAT(stopsFrom(firstStop()),
                 ElementsAre(L"Up", L"Home", lastFolder(), L"menu ", L"table of Kind", L"field",

@@ -15,9 +15,18 @@
 
 #import "modrig/dialogs/ModrigController.h"
 
-// The tabs of the main dialog.
-inline constexpr int kLoadedTab = 0;
-inline constexpr int kHistoryTab = 1;
+#include "modrig/dialogs/model/ShownTab.h"
+
+using ModrigUtils::kHistoryTab;
+using ModrigUtils::kLoadedApplicationsTab;
+
+// Places in the list of file types.
+inline constexpr NSUInteger kAllFileTypes = 0;
+inline constexpr NSUInteger kBundleFileType = 1;
+inline constexpr NSUInteger kLispFileType = 3;
+
+std::wstring wide(NSString* text);
+NSString* text(const std::wstring& wide);
 
 class DialogTest : public ModuleTest
 {
@@ -33,11 +42,18 @@ protected:
     // A module that the host has loaded.
     std::wstring loadedModule(const std::string& name);
 
+    // Puts files of the test's folder into a list: those, or more than a table shows at once.
+    void fill(CStringList& list, std::initializer_list<std::string> names);
+    void fillWithMany(CStringList& list);
+    static constexpr int kMany = 60;
+
     TemporaryFolder mFolder;
 
 private:
     NSAutoreleasePool* mPool = nil;
 };
+
+class ModalStep;
 
 // The main dialog in its panel, set up as for a run, without the run.
 class OpenDialogTest : public DialogTest
@@ -54,6 +70,8 @@ protected:
     void show();
     // Opens and shows it with the files in its History, which is in front.
     void openHistory(std::initializer_list<std::string> names);
+    // Runs the dialog; after the steps it is cancelled.
+    void runDialog(std::vector<ModalStep> steps);
 
     ModrigController* mController = nil;
     NSOpenPanel* mPanel = nil;
@@ -62,20 +80,26 @@ protected:
     NSArrayController* historyList() { return [mController valueForKey:@"historyList"]; }
     NSTableView* loadedTable() { return [mController valueForKey:@"loadedAppsTableView"]; }
     NSTableView* historyTable() { return [mController valueForKey:@"historyListTableView"]; }
+    NSArrayController* fileTypes() { return [mController valueForKey:@"fileTypes"]; }
+    // The paths of what Load will load.
+    std::vector<std::wstring> selectedFiles();
+    // What the message line says.
+    std::wstring message() { return wide([mController message]); }
 
     // What the user does.
     void select(NSTableView* table, std::initializer_list<NSUInteger> rows);
     // As if the panel had reported the files as selected.
     void selectFiles(std::initializer_list<std::string> names);
+    // The same, and then Load.
+    void load(std::initializer_list<std::string> names);
+    // In the list of file types, at this place.
+    void chooseFileType(NSUInteger place);
 };
 
 // The paths of the rows of a table.
 std::vector<std::wstring> rowsOf(NSArrayController* rows);
 // The selected ones.
 std::vector<std::wstring> selectionOf(NSArrayController* rows);
-
-std::wstring wide(NSString* text);
-NSString* text(const std::wstring& wide);
 
 // One thing that a user does while a window runs modally. A step that answers false is not ready: what it
 // waits for is still to come, and it is asked again.
@@ -132,6 +156,9 @@ void clickRow(NSTableView* table, NSInteger row, NSUInteger modifiers = 0, NSInt
 
 // A key, as the window that has the keyboard gets it.
 void pressKey(NSWindow* window, NSString* characters, NSUInteger modifiers = 0);
+
+// A panel that answers these as what is selected in it.
+id panelWithSelected(NSArray* paths);
 
 // A drag of files, as a drop target sees it.
 id<NSDraggingInfo> dragOf(NSArray* paths);

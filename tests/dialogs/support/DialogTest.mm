@@ -10,6 +10,7 @@
 #include <iostream>
 
 #include "host/text/Unicode.h"
+#include "modrig/module/DialogBridge.h"
 #include "tests/dialogs/support/Events.h"
 
 #import "modrig/dialogs/ModrigFilePath.h"
@@ -105,6 +106,18 @@ std::wstring DialogTest::loadedModule(const std::string& name)
     return path;
 }
 
+void DialogTest::fill(CStringList& list, std::initializer_list<std::string> names)
+{
+    for (const std::string& name : names)
+        list.AddTail(CStdStr(file(name)));
+}
+
+void DialogTest::fillWithMany(CStringList& list)
+{
+    for (int index = 0; index < kMany; ++index)
+        fill(list, {"tool" + std::to_string(index) + ".lsp"});
+}
+
 void OpenDialogTest::open()
 {
     openWith([[ModrigController alloc] init]);
@@ -140,17 +153,39 @@ void OpenDialogTest::show()
 
 void OpenDialogTest::openHistory(std::initializer_list<std::string> names)
 {
-    for (const std::string& name : names)
-        gHistoryList.AddTail(CStdStr(file(name)));
+    fill(gHistoryList, names);
     open();
     [mController setTabViewSelectedIndex:kHistoryTab];
     show();
+}
+
+void OpenDialogTest::runDialog(std::vector<ModalStep> steps)
+{
+    steps.insert(steps.begin(), ModalStep(
+                                    [this]
+                                    {
+                                        mController = [[TsOCModrigUtil getModrigController] retain];
+                                        mPanel = runningPanel();
+                                    }));
+    steps.push_back(ModalStep([this] { [mPanel cancel:nil]; }));
+    {
+        const ModalSteps running(std::move(steps));
+        ModrigUtils::RunModrigDialog();
+    }
+    [mController release];
+    mController = nil;
+    mPanel = nil;
 }
 
 void OpenDialogTest::TearDown()
 {
     close();
     DialogTest::TearDown();
+}
+
+std::vector<std::wstring> OpenDialogTest::selectedFiles()
+{
+    return pathsOf([mController selectedFiles]);
 }
 
 void OpenDialogTest::select(NSTableView* table, std::initializer_list<NSUInteger> rows)
@@ -167,6 +202,18 @@ void OpenDialogTest::selectFiles(std::initializer_list<std::string> names)
     for (const std::string& name : names)
         [files addObject:[[[ModrigFilePath alloc] initWithFilePathName:path(name)] autorelease]];
     [[mController selectedFiles] setArray:files];
+}
+
+void OpenDialogTest::load(std::initializer_list<std::string> names)
+{
+    selectFiles(names);
+    [mController onLoad:nil];
+}
+
+void OpenDialogTest::chooseFileType(NSUInteger place)
+{
+    [fileTypes() setSelectionIndex:place];
+    [mController onFileTypesChanged:fileTypes()];
 }
 
 @interface StepRunner : NSObject
@@ -331,17 +378,15 @@ void pressKey(NSWindow* window, NSString* characters, NSUInteger modifiers)
     events::postKey(window, characters, static_cast<unsigned>(modifiers));
 }
 
-// Stands for the pasteboard and the drag itself; answers what the drop targets ask.
-@interface FileDrag : NSObject
+// What stands for something of the toolkit's that has files.
+@interface HoldsFiles : NSObject
 {
     NSArray* mPaths;
-    NSPoint mPlace;
 }
 - (id)initWithPaths:(NSArray*)paths;
-- (void)setPlace:(NSPoint)place;
 @end
 
-@implementation FileDrag
+@implementation HoldsFiles
 
 - (id)initWithPaths:(NSArray*)paths
 {
@@ -355,6 +400,34 @@ void pressKey(NSWindow* window, NSString* characters, NSUInteger modifiers)
     [mPaths release];
     [super dealloc];
 }
+
+@end
+
+// What a panel answers about its selection.
+@interface ChoosingPanel : HoldsFiles
+@end
+
+@implementation ChoosingPanel
+
+- (NSArray*)URLs
+{
+    NSMutableArray* urls = [NSMutableArray array];
+    for (NSString* path : tsuiEach<NSString*>(mPaths))
+        [urls addObject:[NSURL fileURLWithPath:path]];
+    return urls;
+}
+
+@end
+
+// Stands for the pasteboard and the drag itself; answers what the drop targets ask.
+@interface FileDrag : HoldsFiles
+{
+    NSPoint mPlace;
+}
+- (void)setPlace:(NSPoint)place;
+@end
+
+@implementation FileDrag
 
 - (void)setPlace:(NSPoint)place
 {
@@ -392,6 +465,11 @@ void pressKey(NSWindow* window, NSString* characters, NSUInteger modifiers)
 }
 
 @end
+
+id panelWithSelected(NSArray* paths)
+{
+    return [[[ChoosingPanel alloc] initWithPaths:paths] autorelease];
+}
 
 id<NSDraggingInfo> dragOver(NSView* view, NSPoint place, NSArray* paths)
 {
