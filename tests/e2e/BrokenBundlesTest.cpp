@@ -66,6 +66,18 @@ protected:
         }
     }
 
+    // Each of them was refused, and the good module before them and the one after them were loaded.
+    void expectOneRefusalEach(const HostResult& result) const
+    {
+        EXPECT_EQ(result.exitStatus, 0) << result.output;
+        for (const Broken& broken : kBroken)
+            EXPECT_THAT(result.output, HasSubstr(refusal(pathOf(broken), broken)));
+        EXPECT_THAT(result.output, HasSubstr("Good.zmb: message 1\n"));
+        EXPECT_THAT(result.output, HasSubstr("Good.omp: message 1\n"));
+        expectNoOtherLines(result.output, {"Tessel R21", "Command: ", "Good.",
+                                           "Message: 6 applications could not be loaded:", "  /"});
+    }
+
     HostSession session;
 };
 } // namespace
@@ -106,15 +118,9 @@ TEST_F(BrokenBundles, InTheStartupSuiteCostOneEntryEach)
     suite.push_back(fixtureModule("Good.omp"));
     storeSuite(session, suite);
     const auto result = session.run({"VERSION"});
-    EXPECT_EQ(result.exitStatus, 0) << result.output;
-    for (const Broken& broken : kBroken)
-        EXPECT_THAT(result.output, HasSubstr(refusal(pathOf(broken), broken)));
-    EXPECT_THAT(result.output, HasSubstr("Good.zmb: message 1\n"));
-    EXPECT_THAT(result.output, HasSubstr("Good.omp: message 1\n"));
+    expectOneRefusalEach(result);
     EXPECT_THAT(result.output, EndsWith("Tessel R21, reference host for Modrig\n"
                                         "Good.omp: message 2\nGood.zmb: message 2\n"));
-    expectNoOtherLines(result.output, {"Tessel R21", "Command: ", "Good.",
-                                       "Message: 6 applications could not be loaded:", "  /"});
 }
 
 TEST_F(BrokenBundles, InTheRecordsCostOneApplicationEach)
@@ -134,11 +140,5 @@ TEST_F(BrokenBundles, InTheRecordsCostOneApplicationEach)
     arguments.emplace_back("--safe");
     ASSERT_EQ(session.start(arguments).exitStatus, 0);
     const auto result = session.run({"VERSION"});
-    EXPECT_EQ(result.exitStatus, 0) << result.output;
-    for (const Broken& broken : kBroken)
-        EXPECT_THAT(result.output, HasSubstr(refusal(pathOf(broken), broken)));
-    EXPECT_THAT(result.output, HasSubstr("Good.zmb: message 1\n"));
-    EXPECT_THAT(result.output, HasSubstr("Good.omp: message 1\n"));
-    expectNoOtherLines(result.output, {"Tessel R21", "Command: ", "Good.",
-                                       "Message: 6 applications could not be loaded:", "  /"});
+    expectOneRefusalEach(result);
 }

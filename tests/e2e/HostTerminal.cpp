@@ -90,3 +90,33 @@ int HostTerminal::waitForEnd()
     mProcess = 0;
     return WIFEXITED(status) ? WEXITSTATUS(status) : -WTERMSIG(status);
 }
+
+int HostTerminal::quit()
+{
+    type("QUIT\r");
+    return waitForEnd();
+}
+
+namespace
+{
+// Types the keys, and Ctrl-C when the text has appeared.
+testing::AssertionResult controlCAfter(HostTerminal& terminal, const std::string& keys,
+                                       std::string_view appears)
+{
+    terminal.type(keys);
+    if (!terminal.shows(appears))
+        return testing::AssertionFailure() << terminal.screen();
+    terminal.type(kControlC);
+    return terminal.awaitPrompt();
+}
+} // namespace
+
+testing::AssertionResult controlCStopsLisp(HostTerminal& terminal)
+{
+    return controlCAfter(terminal, kRunaway + "\r", "begun");
+}
+
+testing::AssertionResult controlCClearsTheLine(HostTerminal& terminal)
+{
+    return controlCAfter(terminal, "rubbish", "rubbish");
+}

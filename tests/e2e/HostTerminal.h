@@ -35,6 +35,8 @@ public:
 
     // Waits for the end; the exit status as in HostResult. A host that does not end is killed.
     int waitForEnd();
+    // The same after QUIT.
+    int quit();
 
     // Everything that appeared, terminal sequences included.
     const std::string& screen() const { return mOutput; }
@@ -55,3 +57,7 @@ inline constexpr std::string_view kControlD = "\x04";
 
 // Lisp that never ends. It tells by "begun" that it runs, which stands nowhere in the line that is typed.
 inline const std::string kRunaway = "(progn (princ \"be\") (princ \"gun\") (loop))";
+
+// At a prompt: Ctrl-C stops Lisp that runs away, or clears a line that was begun. A prompt follows.
+testing::AssertionResult controlCStopsLisp(HostTerminal& terminal);
+testing::AssertionResult controlCClearsTheLine(HostTerminal& terminal);

@@ -107,6 +107,5 @@ TEST(SignalsOnce, AreLeftAloneWhereTheyAreToBeIgnored)
     kill(terminal.process(), SIGHUP);
     terminal.type("(+ 30 12)\r");
     EXPECT_TRUE(terminal.shows("\n42")) << terminal.screen();
-    terminal.type("QUIT\r");
-    EXPECT_EQ(terminal.waitForEnd(), 0);
+    EXPECT_EQ(terminal.quit(), 0);
 }

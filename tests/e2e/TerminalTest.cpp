@@ -50,14 +50,10 @@ TEST(Terminal, StopsRunawayLispWithControlCAndGoesOn)
     const HostSession session;
     HostTerminal terminal(session);
     ASSERT_TRUE(terminal.awaitPrompt());
-    terminal.type(kRunaway + "\r");
-    ASSERT_TRUE(terminal.shows("begun")) << terminal.screen();
-    terminal.type(kControlC);
-    ASSERT_TRUE(terminal.awaitPrompt());
+    ASSERT_TRUE(controlCStopsLisp(terminal));
     terminal.type("(* 6 7)\r");
     EXPECT_TRUE(terminal.shows("\n42")) << terminal.screen();
-    terminal.type("QUIT\r");
-    EXPECT_EQ(terminal.waitForEnd(), 0);
+    EXPECT_EQ(terminal.quit(), 0);
 }
 
 TEST(Terminal, StopsLispThatRunsAwayWhileTheHostStarts)
@@ -73,8 +69,7 @@ TEST(Terminal, StopsLispThatRunsAwayWhileTheHostStarts)
     ASSERT_TRUE(terminal.shows("begun")) << terminal.screen();
     terminal.type(kControlC);
     ASSERT_TRUE(terminal.awaitPrompt());
-    terminal.type("QUIT\r");
-    EXPECT_EQ(terminal.waitForEnd(), 0);
+    EXPECT_EQ(terminal.quit(), 0);
 }
 
 TEST(Terminal, GivesAFreshPromptForControlC)
@@ -86,14 +81,10 @@ TEST(Terminal, GivesAFreshPromptForControlC)
     ASSERT_TRUE(terminal.shows("... ")) << terminal.screen();
     terminal.type(kControlC);
     ASSERT_TRUE(terminal.awaitPrompt());
-    terminal.type("rubbish");
-    ASSERT_TRUE(terminal.shows("rubbish")) << terminal.screen();
-    terminal.type(kControlC);
-    ASSERT_TRUE(terminal.awaitPrompt());
+    ASSERT_TRUE(controlCClearsTheLine(terminal));
     terminal.type("VERSION\r");
     EXPECT_TRUE(terminal.shows("Tessel R21")) << terminal.screen();
-    terminal.type("QUIT\r");
-    EXPECT_EQ(terminal.waitForEnd(), 0);
+    EXPECT_EQ(terminal.quit(), 0);
 }
 
 TEST(Terminal, RemembersWhatWasTypedInEarlierSessions)

@@ -15,6 +15,11 @@ protected:
         copySample("primes.zmb");
         open();
         click(places::kAddToHistory);
+        loadFirstTwoTogether();
+    }
+
+    void loadFirstTwoTogether() const
+    {
         click(places::file(0));
         mScreen.clickHolding("shift", mDialog, places::file(1));
         shoot("selected");
@@ -111,9 +116,7 @@ TEST_F(DialogBrowser, SaysThatAFileIsLoadedAlready)
 {
     copySample("gears.omp");
     open();
-    click(places::file(0));
-    click(places::kLoad);
-    EXPECT_TRUE(prints(wasLoaded("gears.omp")));
+    loadFile(0, "gears.omp");
     click(places::kLoad);
     EXPECT_TRUE(prints("gears.omp is already loaded.\n"));
     shoot("already-loaded");
@@ -126,7 +129,7 @@ TEST_F(DialogBrowser, SaysThatAFileIsLoadedAlready)
 TEST_F(DialogBrowser, StopsAtTheFileThatCannotBeLoaded)
 {
     writeLisp("a.lsp");
-    mSession.folder().write("files/b.zmb", "no module");
+    writeBroken("b.zmb");
     writeLisp("c.lsp");
     open();
     click(places::file(0));
@@ -155,12 +158,7 @@ TEST_F(DialogBrowser, LoadsFilesWhoseNamesAreNoTextAndFindsThemAgain)
     click(places::kAddToHistory);
     mScreen.doubleClick(mDialog, places::file(0)); // into the folder
     shoot("folder");
-    click(places::file(0));
-    mScreen.clickHolding("shift", mDialog, places::file(1));
-    shoot("selected");
-    click(places::kLoad);
-    EXPECT_TRUE(prints("2 applications were loaded.\n"));
-    shoot("loaded");
+    loadFirstTwoTogether();
     click(places::kHistoryTab);
     click(places::tableRow(0));
     click(places::kAddToStartupSuite);
@@ -190,9 +188,7 @@ TEST_F(DialogBrowser, OpensWithTheColumnsAndTheHiddenFilesThatItWasLeftWith)
     open();
     shoot("again");
     EXPECT_EQ(look({places::kEndOfNames.x - 80, places::file(0).y}), kinds);
-    click(places::file(0));
-    click(places::kLoad);
-    EXPECT_TRUE(prints(wasLoaded(".hidden.lsp")));
+    loadFile(0, ".hidden.lsp");
     closeAndEnd();
     const std::string width = runQuietly(
         {R"(REGISTRY GET Software\Tessel\R21\Profiles\Default\DialogSettings\FilePanel kindWidth)"});
@@ -206,14 +202,10 @@ TEST_F(DialogBrowser, ShowsTheFilesOfTheChosenTypeOnly)
     open();
     mScreen.choose(mDialog, places::kFileTypes, {places::kFileTypes.x, places::kFileTypes.y + 3 * 26});
     shoot("lisp-only");
-    click(places::file(0)); // where gears.omp has been
-    click(places::kLoad);
-    EXPECT_TRUE(prints(wasLoaded("z.lsp")));
+    loadFile(0, "z.lsp"); // where gears.omp has been
     mScreen.choose(mDialog, places::kFileTypes, {places::kFileTypes.x, places::kFileTypes.y - 3 * 26});
     shoot("all-types");
-    click(places::file(0));
-    click(places::kLoad);
-    EXPECT_TRUE(prints(wasLoaded("gears.omp")));
+    loadFile(0, "gears.omp");
     EXPECT_THAT(closeAndEnd(), HasSubstr("z.lsp runs"));
 }
 

@@ -32,9 +32,7 @@ TEST_F(DialogClosing, LeavesAModuleThatCanBeUnloadedAndLoadedAgain)
     const std::string first = writeLisp("a.lsp");
     setSetting("SaveHistory", "1");
     open();
-    click(places::file(0));
-    click(places::kLoad);
-    EXPECT_TRUE(prints(wasLoaded("a.lsp")));
+    loadFile(0, "a.lsp");
     press("Escape");
     EXPECT_TRUE(mScreen.waitUntilGone(kDialog));
     mHost->type("UNLOAD Modrig.bundle");
@@ -66,9 +64,7 @@ TEST_F(DialogClosing, RemembersTheTabAndTheCheckBox)
     open();
     mScreen.doubleClick(mDialog, places::tableRow(0)); // only the tab of the History has this row
     EXPECT_TRUE(prints(wasLoaded("a.lsp")));
-    click(places::file(1));
-    click(places::kLoad);
-    EXPECT_TRUE(prints(wasLoaded("b.lsp")));
+    loadFile(1, "b.lsp");
     shoot("loaded");
     closeAndEnd();
     EXPECT_EQ(stored("History"), "NumHistory = 2\n1History = " + first + "\n2History = " + second + "\n");
@@ -93,15 +89,11 @@ TEST_F(DialogClosing, RemembersTheFolderOfTheFilesThatWereLoaded)
     open();
     mScreen.doubleClick(mDialog, places::file(0)); // the folder
     shoot("walked");
-    click(places::file(0));
-    click(places::kLoad);
-    EXPECT_TRUE(prints(wasLoaded("inner.lsp")));
+    loadFile(0, "inner.lsp");
     closeAndEnd();
     EXPECT_EQ(storedSetting("InitialPath"), (files() / "deeper").string() + "\n");
     open();
     shoot("again");
-    click(places::file(0));
-    click(places::kLoad);
-    EXPECT_TRUE(prints(wasLoaded("inner.lsp")));
+    loadFile(0, "inner.lsp");
     closeAndEnd();
 }

@@ -61,6 +61,11 @@ std::vector<std::string> DialogTest::writeManyLisp(int count) const
     return paths;
 }
 
+std::string DialogTest::writeBroken(const std::string& name) const
+{
+    return mSession.folder().write("files/" + name, "no module").string();
+}
+
 std::string DialogTest::runQuietly(const std::vector<std::string>& commands) const
 {
     std::vector<std::string> arguments = {"--safe"};
@@ -115,12 +120,18 @@ void DialogTest::open()
     openAgain();
 }
 
+void DialogTest::openWithHistory(const std::vector<std::string>& paths)
+{
+    storeHistory(paths);
+    setSetting("LastTab", "1");
+    open();
+}
+
 void DialogTest::openAgain()
 {
     mHost->type("MODRIG");
-    mDialog = mScreen.waitForWindow(kDialog);
+    mDialog = mScreen.waitForActive(kDialog);
     ASSERT_FALSE(mDialog.empty()) << mHost->output();
-    ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
     shoot("opened");
 }
 
@@ -151,6 +162,38 @@ bool DialogTest::changes(Place place, const std::string& before) const
     return comesTrue([&] { return look(place) != before; });
 }
 
+void DialogTest::loadFile(int row, const std::string& name) const
+{
+    click(places::file(row));
+    click(places::kLoad);
+    EXPECT_TRUE(prints(wasLoaded(name)));
+}
+
+void DialogTest::loadBroken(int row) const
+{
+    click(places::file(row));
+    click(places::kLoad);
+    ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty());
+}
+
+std::string DialogTest::openMessageBox()
+{
+    writeBroken();
+    open();
+    loadBroken(0);
+    const std::string box = mScreen.waitForActive(kMessageBox);
+    EXPECT_FALSE(box.empty());
+    return box;
+}
+
+void DialogTest::openSuite()
+{
+    click(places::kContents);
+    mSuite = mScreen.waitForActive(kSuiteDialog);
+    ASSERT_FALSE(mSuite.empty());
+    shoot("suite");
+}
+
 void DialogTest::typeName(const std::string& name) const
 {
     click(places::kName);
@@ -176,9 +219,7 @@ bool DialogTest::prints(const std::string& text) const
 
 void DialogTest::dismissMessageBox() const
 {
-    const std::string box = mScreen.waitForWindow(kMessageBox);
-    ASSERT_FALSE(box.empty()) << "no message box";
-    ASSERT_TRUE(mScreen.waitUntilActive(box));
+    ASSERT_FALSE(mScreen.waitForActive(kMessageBox).empty()) << "no message box";
     shoot("message-box");
     mScreen.key("Return");
     EXPECT_TRUE(mScreen.waitUntilGone(kMessageBox));

@@ -34,6 +34,8 @@ protected:
     std::string writeLisp(const std::string& name) const;
     std::string copySample(const std::string& name) const;
     std::vector<std::string> writeManyLisp(int count) const;
+    // A file that looks like a module and is none.
+    std::string writeBroken(const std::string& name = "broken.zmb") const;
 
     // Runs commands in a host that loads nothing, before or after the one with the dialog.
     std::string runQuietly(const std::vector<std::string>& commands) const;
@@ -48,6 +50,8 @@ protected:
 
     // Starts the host, and types MODRIG into it.
     void open();
+    // The same with these files in the History, which is in front.
+    void openWithHistory(const std::vector<std::string>& paths);
     // Types MODRIG into the running host once more.
     void openAgain();
     // Closes the dialog by Escape; answers what the host printed up to its end, with APPS asked last.
@@ -59,6 +63,14 @@ protected:
     std::string look(Place place) const { return mScreen.look(mDialog, place); }
     // Waits until the place does not look as before.
     bool changes(Place place, const std::string& before) const;
+    // Selects the file in a row of the list and presses Load; it has to be this one, and to be loaded.
+    void loadFile(int row, const std::string& name) const;
+    // Presses Load for a file in a row of the list that a message box is about.
+    void loadBroken(int row) const;
+    // Opens the dialog with a message box over it, about a file that is no module; answers the box.
+    std::string openMessageBox();
+    // Opens the Startup Suite over the dialog, with the mouse.
+    void openSuite();
     // Types a name into the name field, which is empty so far.
     void typeName(const std::string& name) const;
     // Takes a picture, <test>-<step>.png, when the environment asks for one of every step.
@@ -82,6 +94,7 @@ protected:
     HostSession mSession;
     std::unique_ptr<Program> mHost;
     std::string mDialog;
+    std::string mSuite;
 };
 
 // What loading a file of `writeLisp` says on the way.

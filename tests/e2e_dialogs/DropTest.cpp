@@ -137,9 +137,7 @@ TEST_F(DialogDrop, OfItsOwnListIsGivenUpByEscape)
         shoot("given-up");
         mScreen.letGo();
     }
-    click(places::file(1));
-    click(places::kLoad);
-    EXPECT_TRUE(prints(wasLoaded("b.lsp")));
+    loadFile(1, "b.lsp");
     mScreen.drag(mDialog, places::file(1), mDialog, places::kStartupSuiteBox);
     EXPECT_TRUE(prints("b.lsp was added to the Startup Suite.\n"));
     EXPECT_THAT(closeAndEnd(), Not(HasSubstr("a.lsp")));
@@ -250,12 +248,10 @@ TEST_F(DialogDrop, IsNotTakenByTheMiddleOfARowWhichIsNotMarked)
 
 TEST_F(DialogDrop, IsNotTakenByADialogBehindAMessageBox)
 {
-    mSession.folder().write("files/aaa.zmb", "no module");
+    writeBroken("aaa.zmb");
     const auto paths = writeManyLisp(1);
     open();
-    click(places::file(0));
-    click(places::kLoad);
-    ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty());
+    loadBroken(0);
     dragFiles(paths, {kTable.x, kTable.y + 80}, [this] { shoot("refused"); });
     dragFiles(paths, {places::kStartupSuiteBox.x, places::kStartupSuiteBox.y + 20}, [] {});
     dismissMessageBox();

@@ -7,9 +7,7 @@ class DialogEdges : public DialogTest
 
 TEST_F(DialogEdges, LoadsSelectedHistoryRowsWithTheLoadButtonOfThePanel)
 {
-    storeHistory({writeLisp("a.lsp"), writeLisp("b.lsp")});
-    setSetting("LastTab", "1");
-    open();
+    openWithHistory({writeLisp("a.lsp"), writeLisp("b.lsp")});
     click(places::tableRow(1));
     click(places::kLoad);
     EXPECT_TRUE(prints(wasLoaded("b.lsp")));
@@ -20,9 +18,7 @@ TEST_F(DialogEdges, LoadsSelectedHistoryRowsWithTheLoadButtonOfThePanel)
 TEST_F(DialogEdges, TakesHistoryRowsIntoTheStartupSuite)
 {
     const std::string path = writeLisp("a.lsp");
-    storeHistory({path});
-    setSetting("LastTab", "1");
-    open();
+    openWithHistory({path});
     click(places::tableRow(0));
     click(places::kAddToStartupSuite);
     EXPECT_TRUE(prints("a.lsp was added to the Startup Suite.\n"));
@@ -33,13 +29,8 @@ TEST_F(DialogEdges, TakesHistoryRowsIntoTheStartupSuite)
 
 TEST_F(DialogEdges, AMessageBoxThatIsClosedByItsFrameIsAnswered)
 {
-    mSession.folder().write("files/broken.zmb", "no module");
-    open();
-    click(places::file(0));
-    click(places::kLoad);
-    const std::string box = mScreen.waitForWindow(kMessageBox);
+    const std::string box = openMessageBox();
     ASSERT_FALSE(box.empty());
-    ASSERT_TRUE(mScreen.waitUntilActive(box));
     mScreen.clickCloseButton(box, std::stoi(mScreen.sizeOf(box)));
     EXPECT_TRUE(mScreen.waitUntilGone(kMessageBox));
     ASSERT_TRUE(mScreen.waitUntilActive(mDialog));

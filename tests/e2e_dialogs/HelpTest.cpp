@@ -43,11 +43,8 @@ TEST_F(DialogHelp, OfTheMainDialogIsItsPage)
 TEST_F(DialogHelp, OfTheStartupSuiteIsItsPage)
 {
     open();
-    click(places::kContents);
-    const std::string suite = mScreen.waitForWindow(kSuiteDialog);
-    ASSERT_FALSE(suite.empty());
-    ASSERT_TRUE(mScreen.waitUntilActive(suite));
-    mScreen.click(suite, places::kSuiteHelp);
+    openSuite();
+    mScreen.click(mSuite, places::kSuiteHelp);
     EXPECT_EQ(openedPage(), "startup_suite_dialog.html");
     shoot("helped");
     mScreen.key("Escape");

@@ -13,9 +13,7 @@ protected:
         std::vector<std::string> paths;
         for (const auto& name : names)
             paths.push_back(writeLisp(name));
-        storeHistory(paths);
-        setSetting("LastTab", "1");
-        open();
+        openWithHistory(paths);
     }
 
     std::string path(const std::string& name) const { return (files() / name).string(); }

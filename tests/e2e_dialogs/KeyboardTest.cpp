@@ -37,12 +37,7 @@ protected:
         press("space");
     }
 
-    void openWithHistory()
-    {
-        storeHistory({writeLisp("a.lsp"), writeLisp("b.lsp")});
-        setSetting("LastTab", "1");
-        open();
-    }
+    void openWithTwoInHistory() { openWithHistory({writeLisp("a.lsp"), writeLisp("b.lsp")}); }
 
     void selectFirstRow() const
     {
@@ -50,13 +45,12 @@ protected:
         press("Down");
     }
 
-    void openSuite()
+    void openSuiteByKeys()
     {
         open();
         pressAt(kTabsToContents, "contents");
-        const std::string suite = mScreen.waitForWindow(kSuiteDialog);
+        const std::string suite = mScreen.waitForActive(kSuiteDialog);
         ASSERT_FALSE(suite.empty());
-        ASSERT_TRUE(mScreen.waitUntilActive(suite));
         shoot("suite");
     }
 
@@ -157,7 +151,7 @@ TEST_F(DialogKeyboard, GoesFromTabToTabWithTheArrows)
 TEST_F(DialogKeyboard, PressesControlsByTheirLetters)
 {
     writeLisp("a.lsp");
-    mSession.folder().write("files/broken.zmb", "no module");
+    writeBroken();
     open();
     press("alt+a"); // Add to History
     press("alt+n"); // Name
@@ -167,8 +161,8 @@ TEST_F(DialogKeyboard, PressesControlsByTheirLetters)
     press("alt+s"); // History
     shoot("history");
     press("alt+t"); // Contents
-    const std::string suite = mScreen.waitForWindow(kSuiteDialog);
-    ASSERT_TRUE(mScreen.waitUntilActive(suite));
+    const std::string suite = mScreen.waitForActive(kSuiteDialog);
+    ASSERT_FALSE(suite.empty());
     shoot("suite");
     press("alt+c"); // Close
     waitForTheMainDialog();
@@ -176,7 +170,7 @@ TEST_F(DialogKeyboard, PressesControlsByTheirLetters)
     press("ctrl+a");
     mScreen.text((files() / "broken.zmb").string());
     press("alt+l");
-    ASSERT_TRUE(mScreen.waitUntilActive(mScreen.waitForWindow(kMessageBox)));
+    ASSERT_FALSE(mScreen.waitForActive(kMessageBox).empty());
     shoot("box");
     press("alt+o"); // OK
     EXPECT_TRUE(mScreen.waitUntilGone(kMessageBox));
@@ -226,7 +220,7 @@ TEST_F(DialogKeyboard, Unloads)
 
 TEST_F(DialogKeyboard, LoadsFromTheHistory)
 {
-    openWithHistory();
+    openWithTwoInHistory();
     selectFirstRow();
     pressAt(kTabsToFirstButton, "load");
     EXPECT_TRUE(prints(wasLoaded("a.lsp")));
@@ -236,7 +230,7 @@ TEST_F(DialogKeyboard, LoadsFromTheHistory)
 
 TEST_F(DialogKeyboard, AddsToTheStartupSuiteFromTheHistory)
 {
-    openWithHistory();
+    openWithTwoInHistory();
     selectFirstRow();
     pressAt(kTabsToAddToStartupSuite, "add-to-startup-suite");
     EXPECT_TRUE(prints("a.lsp was added to the Startup Suite.\n"));
@@ -246,7 +240,7 @@ TEST_F(DialogKeyboard, AddsToTheStartupSuiteFromTheHistory)
 
 TEST_F(DialogKeyboard, RemovesFromTheHistory)
 {
-    openWithHistory();
+    openWithTwoInHistory();
     selectFirstRow();
     pressAt(kTabsToRemove, "remove");
     EXPECT_TRUE(prints("a.lsp was removed from the History list.\n"));
@@ -277,7 +271,7 @@ TEST_F(DialogKeyboard, Closes)
 TEST_F(DialogKeyboard, OpensTheStartupSuiteAndItsHelpAndClosesIt)
 {
     mSession.set("PATH", "");
-    openSuite();
+    openSuiteByKeys();
     pressAt(kTabsToSuiteHelp, "suite-help");
     EXPECT_TRUE(prints("startup_suite_dialog.html"));
     pressAt(kTabsToSuiteClose - kTabsToSuiteHelp, "suite-close");
@@ -289,11 +283,10 @@ TEST_F(DialogKeyboard, OpensTheStartupSuiteAndItsHelpAndClosesIt)
 TEST_F(DialogKeyboard, AddsToTheStartupSuiteWithInsert)
 {
     const std::string file = writeLisp("a.lsp");
-    openSuite();
+    openSuiteByKeys();
     press("Insert");
-    const std::string panel = mScreen.waitForWindow(kAddPanel);
+    const std::string panel = mScreen.waitForActive(kAddPanel);
     ASSERT_FALSE(panel.empty());
-    ASSERT_TRUE(mScreen.waitUntilActive(panel));
     mScreen.text(file);
     shoot("typed");
     press("Return");
@@ -309,7 +302,7 @@ TEST_F(DialogKeyboard, AddsToTheStartupSuiteWithInsert)
 TEST_F(DialogKeyboard, RemovesFromTheStartupSuiteWithDelete)
 {
     storeSuite({writeLisp("a.lsp"), writeLisp("b.lsp")});
-    openSuite();
+    openSuiteByKeys();
     press("Down");
     shoot("selected");
     press("Delete");

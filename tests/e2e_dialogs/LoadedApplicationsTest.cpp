@@ -6,20 +6,13 @@ using testing::Not;
 
 class DialogLoadedApplications : public DialogTest
 {
-protected:
-    void loadFirstFile(const std::string& name)
-    {
-        click(places::file(0));
-        click(places::kLoad);
-        ASSERT_TRUE(prints(wasLoaded(name)));
-    }
 };
 
 TEST_F(DialogLoadedApplications, UnloadsTheSelectedRow)
 {
     copySample("gears.omp");
     open();
-    loadFirstFile("gears.omp");
+    loadFile(0, "gears.omp");
     click(places::tableRow(0));
     click(places::kUnload);
     EXPECT_TRUE(prints("gears.omp was unloaded.\n"));
@@ -32,7 +25,7 @@ TEST_F(DialogLoadedApplications, DoesNotSelectALoadedFileThatCannotBeUnloaded)
     writeLisp("z.lsp");
     open();
     const std::string buttonBefore = look(places::kUnload);
-    loadFirstFile("z.lsp");
+    loadFile(0, "z.lsp");
     const std::string boxBefore = look(places::kAddToHistory);
     click(places::kAddToHistory); // shows that the load has been dealt with
     ASSERT_TRUE(changes(places::kAddToHistory, boxBefore));

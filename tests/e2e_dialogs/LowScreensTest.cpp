@@ -65,22 +65,22 @@ TEST_P(LowScreens, HoldAllOfTheDialogWhereEverythingCanBeClicked)
 
 TEST_P(LowScreens, HoldAllOfTheStartupSuiteAndOfItsPanelAndOfAMessageBox)
 {
-    mSession.folder().write("files/broken.zmb", "no module");
+    writeBroken();
     open();
     click(places::file(0));
     click(low(places::kLoad));
-    const std::string box = mScreen.waitForWindow(kMessageBox);
-    ASSERT_TRUE(mScreen.waitUntilActive(box));
+    const std::string box = mScreen.waitForActive(kMessageBox);
+    ASSERT_FALSE(box.empty());
     expectIsOnScreen(box);
     dismissMessageBox();
     ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
     click(low(places::kContents));
-    const std::string suite = mScreen.waitForWindow(kSuiteDialog);
-    ASSERT_TRUE(mScreen.waitUntilActive(suite));
+    const std::string suite = mScreen.waitForActive(kSuiteDialog);
+    ASSERT_FALSE(suite.empty());
     expectIsOnScreen(suite);
     mScreen.click(suite, places::kAdd);
-    const std::string panel = mScreen.waitForWindow(kAddPanel);
-    ASSERT_TRUE(mScreen.waitUntilActive(panel));
+    const std::string panel = mScreen.waitForActive(kAddPanel);
+    ASSERT_FALSE(panel.empty());
     expectIsOnScreen(panel);
     shoot("panel");
     mScreen.key("Escape");

@@ -17,26 +17,6 @@ constexpr int kFrame = 20; // by which the middles of two windows may differ
 class ModalWindows : public DialogTest
 {
 protected:
-    void openSuite()
-    {
-        open();
-        click(places::kContents);
-        mSuite = mScreen.waitForWindow(kSuiteDialog);
-        ASSERT_FALSE(mSuite.empty());
-        ASSERT_TRUE(mScreen.waitUntilActive(mSuite));
-    }
-
-    std::string openMessageBox()
-    {
-        mSession.folder().write("files/broken.zmb", "no module");
-        open();
-        click(places::file(0));
-        click(places::kLoad);
-        const std::string box = mScreen.waitForWindow(kMessageBox);
-        EXPECT_TRUE(mScreen.waitUntilActive(box));
-        return box;
-    }
-
     void expectBelongsTo(const std::string& owner, const std::string& window) const
     {
         std::ostringstream id;
@@ -78,8 +58,6 @@ protected:
         mScreen.minimize(window);
         EXPECT_TRUE(comesTrue([&] { return mScreen.window(title) == window; }));
     }
-
-    std::string mSuite;
 };
 } // namespace
 
@@ -100,8 +78,8 @@ TEST_F(ModalWindows, AMessageBoxIsAnsweredByEscapeAndByItsButton)
     EXPECT_TRUE(mScreen.waitUntilGone(kMessageBox));
     ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
     click(places::kLoad);
-    const std::string box = mScreen.waitForWindow(kMessageBox);
-    ASSERT_TRUE(mScreen.waitUntilActive(box));
+    const std::string box = mScreen.waitForActive(kMessageBox);
+    ASSERT_FALSE(box.empty());
     const std::string size = mScreen.sizeOf(box);
     const int width = std::stoi(size);
     const int height = std::stoi(size.substr(size.find('x') + 1));
@@ -112,14 +90,14 @@ TEST_F(ModalWindows, AMessageBoxIsAnsweredByEscapeAndByItsButton)
 
 TEST_F(ModalWindows, TheButtonThatOpenedAMessageBoxIsDrawnReleased)
 {
-    mSession.folder().write("files/broken.zmb", "no module");
+    writeBroken();
     open();
     click(places::file(0));
     const Place besideItsText{places::kLoad.x + 20, places::kLoad.y};
     const std::string before = look(besideItsText);
     click(places::kLoad);
-    const std::string box = mScreen.waitForWindow(kMessageBox);
-    ASSERT_TRUE(mScreen.waitUntilActive(box));
+    const std::string box = mScreen.waitForActive(kMessageBox);
+    ASSERT_FALSE(box.empty());
     shoot("released");
     EXPECT_EQ(look(besideItsText), before);
     dismissMessageBox();
@@ -128,6 +106,7 @@ TEST_F(ModalWindows, TheButtonThatOpenedAMessageBoxIsDrawnReleased)
 
 TEST_F(ModalWindows, TheStartupSuiteBelongsToTheDialogAndStaysOverIt)
 {
+    open();
     openSuite();
     expectBelongsTo(mDialog, mSuite);
     expectWantsNoMinimizeButton(mSuite);
@@ -139,10 +118,11 @@ TEST_F(ModalWindows, TheStartupSuiteBelongsToTheDialogAndStaysOverIt)
 
 TEST_F(ModalWindows, TheAddPanelBelongsToTheStartupSuiteAndStaysOverBoth)
 {
+    open();
     openSuite();
     mScreen.click(mSuite, places::kAdd);
-    const std::string panel = mScreen.waitForWindow(kAddPanel);
-    ASSERT_TRUE(mScreen.waitUntilActive(panel));
+    const std::string panel = mScreen.waitForActive(kAddPanel);
+    ASSERT_FALSE(panel.empty());
     expectBelongsTo(mSuite, panel);
     expectWantsNoMinimizeButton(panel);
     expectStaysOver(mSuite, kEmptyPlaceOfSuite, panel);

@@ -19,6 +19,11 @@ protected:
     void openBoth()
     {
         open();
+        openTheSecond();
+    }
+
+    void openTheSecond()
+    {
         mFirst = std::move(mHost);
         const std::string first = mDialog;
         mHost = std::make_unique<Program>(mSession.commandLine({}), mSession.environment(),
@@ -113,13 +118,7 @@ TEST_F(TwoHostsOnOneDisplay, CopyFromTheFirstToTheSecond)
     typeName((files() / "a.lsp").string());
     press("ctrl+a");
     press("ctrl+c");
-    mFirst = std::move(mHost);
-    const std::string first = mDialog;
-    mHost = std::make_unique<Program>(mSession.commandLine({}), mSession.environment(),
-                                      mSession.folder() / "second.txt");
-    mHost->type("MODRIG");
-    mDialog = mScreen.waitForAnotherWindow(kDialog, first);
-    ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
+    openTheSecond();
     click(places::kName);
     press("ctrl+v");
     shoot("pasted");

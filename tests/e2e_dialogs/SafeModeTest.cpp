@@ -17,14 +17,10 @@ TEST_F(DialogSafeMode, OpensAtOnceAndTakesAnEntryOutOfTheSuite)
     const std::string third = writeLisp("third.lsp");
     storeSuite({first, second, third});
     open(); // no message box comes before it
-    click(places::kContents);
-    const std::string suite = mScreen.waitForWindow(kSuiteDialog);
-    ASSERT_FALSE(suite.empty());
-    ASSERT_TRUE(mScreen.waitUntilActive(suite));
-    shoot("suite");
-    mScreen.click(suite, places::kFirstSuiteRow);
-    mScreen.click(suite, places::kRemove);
-    mScreen.click(suite, places::kCloseSuite);
+    openSuite();
+    mScreen.click(mSuite, places::kFirstSuiteRow);
+    mScreen.click(mSuite, places::kRemove);
+    mScreen.click(mSuite, places::kCloseSuite);
     EXPECT_TRUE(mScreen.waitUntilGone(kSuiteDialog));
     const std::string output = closeAndEnd();
     EXPECT_THAT(output,

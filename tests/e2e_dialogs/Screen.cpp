@@ -108,6 +108,12 @@ bool Screen::waitUntilActive(const std::string& window) const
     return comesTrue([&] { return run("xdotool getactivewindow") == window + "\n"; });
 }
 
+std::string Screen::waitForActive(const std::string& title) const
+{
+    const std::string found = waitForWindow(title);
+    return !found.empty() && waitUntilActive(found) ? found : std::string();
+}
+
 bool Screen::waitUntilGone(const std::string& title) const
 {
     return comesTrue([&] { return window(title).empty(); });

@@ -32,6 +32,8 @@ public:
     // Until the window manager has given the keyboard to the window.
     bool waitUntilActive(const std::string& window) const;
     bool waitUntilGone(const std::string& title) const;
+    // The visible window with this title when it has the keyboard; empty when that does not come to be.
+    std::string waitForActive(const std::string& title) const;
 
     // Presses and releases the mouse button, slowly enough for the toolkit.
     void click(const std::string& window, Place place) const;

@@ -16,9 +16,7 @@ protected:
         const std::string path = writeLisp("a.lsp");
         setSetting("SaveHistory", "1");
         open();
-        click(places::file(0));
-        click(places::kLoad);
-        EXPECT_TRUE(prints(wasLoaded("a.lsp")));
+        loadFile(0, "a.lsp");
         return path;
     }
 
@@ -64,22 +62,17 @@ TEST_F(DialogSignals, BlameModrigWhenItsDialogFaults)
 TEST_F(DialogSignals, EndAHostWithWindowsOverItsDialog)
 {
     const std::string path = loadOne();
-    click(places::kContents);
-    const std::string suite = mScreen.waitForWindow(kSuiteDialog);
-    ASSERT_FALSE(suite.empty());
-    ASSERT_TRUE(mScreen.waitUntilActive(suite));
-    mScreen.click(suite, places::kAdd);
+    openSuite();
+    mScreen.click(mSuite, places::kAdd);
     ASSERT_FALSE(mScreen.waitForWindow(kAddPanel).empty());
     expectGoodEnd(SIGTERM, path);
 }
 
 TEST_F(DialogSignals, EndAHostWithAMessageBoxOverItsDialog)
 {
-    mSession.folder().write("files/broken.zmb", "no module");
+    writeBroken();
     const std::string path = loadOne();
-    click(places::file(1));
-    click(places::kLoad);
-    ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty());
+    loadBroken(1);
     expectGoodEnd(SIGTERM, path);
 }
 
@@ -117,19 +110,12 @@ TEST_F(DialogSignals, StopLispAndClearTheLineAfterADialogToo)
     HostTerminal terminal(mSession);
     ASSERT_TRUE(terminal.awaitPrompt());
     terminal.type("MODRIG\r");
-    mDialog = mScreen.waitForWindow(kDialog);
+    mDialog = mScreen.waitForActive(kDialog);
     ASSERT_FALSE(mDialog.empty()) << terminal.screen();
-    ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
     mScreen.key("Escape");
     ASSERT_TRUE(terminal.awaitPrompt());
-    terminal.type(kRunaway + "\r");
-    ASSERT_TRUE(terminal.shows("begun")) << terminal.screen();
-    terminal.type(kControlC);
-    ASSERT_TRUE(terminal.awaitPrompt());
-    terminal.type("rubbish");
-    ASSERT_TRUE(terminal.shows("rubbish")) << terminal.screen();
-    terminal.type(kControlC);
-    ASSERT_TRUE(terminal.awaitPrompt());
+    ASSERT_TRUE(controlCStopsLisp(terminal));
+    ASSERT_TRUE(controlCClearsTheLine(terminal));
     terminal.type("(+ 30 12)\r");
     EXPECT_TRUE(terminal.shows("\n42")) << terminal.screen();
     kill(terminal.process(), SIGTERM);
@@ -158,7 +144,7 @@ TEST_F(DialogSignals, KeepWhatWasTypedWithTheDialogOpen)
 // At a terminal a message box is a window, and may be the first one.
 TEST_F(DialogSignals, EndAHostAfterAMessageBoxOfItsStart)
 {
-    storeSuite({mSession.folder().write("broken.zmb", "no module").string()});
+    storeSuite({writeBroken()});
     HostTerminal terminal(mSession);
     ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty()) << terminal.screen();
     mScreen.key("Return");
@@ -172,8 +158,7 @@ TEST_F(DialogSignals, EndAHostAfterAMessageBoxOfItsStart)
 
 TEST_F(DialogSignals, EndAHostThatShowsAMessageBoxOfItsStart)
 {
-    storeSuite({mSession.folder().write("broken.zmb", "no module").string(),
-                mSession.folder().write("second.zmb", "no module").string()});
+    storeSuite({writeBroken(), writeBroken("second.zmb")});
     HostTerminal terminal(mSession);
     ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty()) << terminal.screen();
     kill(terminal.process(), SIGTERM);

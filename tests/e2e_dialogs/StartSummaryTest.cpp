@@ -18,9 +18,8 @@ protected:
     // The only box of the start, in front; answered by Return.
     void answerTheBox(HostTerminal& terminal, const std::string& picture)
     {
-        const std::string box = mScreen.waitForWindow(kMessageBox);
+        const std::string box = mScreen.waitForActive(kMessageBox);
         ASSERT_FALSE(box.empty()) << terminal.screen();
-        ASSERT_TRUE(mScreen.waitUntilActive(box));
         mScreen.shoot(picture);
         EXPECT_THAT(terminal.screen(), Not(HasSubstr("Command: "))) << "the box comes before the prompt";
         mScreen.key("Return");
@@ -28,11 +27,7 @@ protected:
         EXPECT_EQ(mScreen.window(kMessageBox), "");
     }
 
-    static void quit(HostTerminal& terminal)
-    {
-        terminal.type("QUIT\r");
-        EXPECT_EQ(terminal.waitForEnd(), 0) << terminal.screen();
-    }
+    static void quit(HostTerminal& terminal) { EXPECT_EQ(terminal.quit(), 0) << terminal.screen(); }
 };
 } // namespace
 

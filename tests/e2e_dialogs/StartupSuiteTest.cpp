@@ -7,16 +7,6 @@ using testing::Not;
 class DialogStartupSuite : public DialogTest
 {
 protected:
-    void openSuite()
-    {
-        open();
-        click(places::kContents);
-        mSuite = mScreen.waitForWindow(kSuiteDialog);
-        ASSERT_FALSE(mSuite.empty());
-        ASSERT_TRUE(mScreen.waitUntilActive(mSuite));
-        shoot("suite");
-    }
-
     void closeSuite()
     {
         mScreen.click(mSuite, places::kCloseSuite);
@@ -32,18 +22,16 @@ protected:
         closeAndEnd();
         EXPECT_EQ(storedSetting("LastTab"), "1\n");
     }
-
-    std::string mSuite;
 };
 
 TEST_F(DialogStartupSuite, TakesAFileThatTheNextStartLoads)
 {
     const std::string file = writeLisp("suite.lsp");
+    open();
     openSuite();
     mScreen.click(mSuite, places::kAdd);
-    const std::string panel = mScreen.waitForWindow(kAddPanel);
+    const std::string panel = mScreen.waitForActive(kAddPanel);
     ASSERT_FALSE(panel.empty());
-    ASSERT_TRUE(mScreen.waitUntilActive(panel));
     mScreen.text(files().string());
     mScreen.key("Return"); // goes to the folder
     mScreen.click(panel, places::file(0));
@@ -63,6 +51,7 @@ TEST_F(DialogStartupSuite, LosesAFileThatTheNextStartDoesNotLoad)
     const std::string first = writeLisp("first.lsp");
     const std::string second = writeLisp("second.lsp");
     storeSuite({first, second});
+    open();
     openSuite();
     mScreen.click(mSuite, places::kFirstSuiteRow);
     shoot("selected");
@@ -81,6 +70,7 @@ TEST_F(DialogStartupSuite, KeepsAFileOutAtStartsByTheMenuOfItsRow)
     const std::string first = writeLisp("first.lsp");
     const std::string second = writeLisp("second.lsp");
     storeSuite({first, second});
+    open();
     openSuite();
     mScreen.chooseFromMenuAt(mSuite, places::kFirstSuiteRow, places::kKeepOutInSuiteMenu);
     shoot("chosen");
@@ -95,6 +85,7 @@ TEST_F(DialogStartupSuite, KeepsAFileOutAtStartsByTheMenuOfItsRow)
 
 TEST_F(DialogStartupSuite, IsClosedByEscapeWithTheMainDialogLeftOpen)
 {
+    open();
     openSuite();
     mScreen.key("Escape");
     expectTheMainDialogAlone();
@@ -102,6 +93,7 @@ TEST_F(DialogStartupSuite, IsClosedByEscapeWithTheMainDialogLeftOpen)
 
 TEST_F(DialogStartupSuite, IsClosedByItsWindowsCloseButtonWithTheMainDialogLeftOpen)
 {
+    open();
     openSuite();
     mScreen.clickCloseButton(mSuite, places::kSuiteWidth);
     expectTheMainDialogAlone();

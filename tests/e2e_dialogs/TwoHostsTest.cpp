@@ -25,9 +25,8 @@ public:
     void open()
     {
         mHost->type("MODRIG");
-        mDialog = mScreen.waitForWindow(kDialog);
+        mDialog = mScreen.waitForActive(kDialog);
         ASSERT_FALSE(mDialog.empty()) << mHost->output();
-        ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
     }
     void click(Place place) const { mScreen.click(mDialog, place); }
     void pressEscape() const { mScreen.key("Escape"); }
@@ -75,9 +74,7 @@ TEST_F(TwoHosts, AnOpenDialogStoresAtOnceAndKeepsNoLock)
     writeLisp("a.lsp");
     open();
     setSetting("InitialPath", "/elsewhere");
-    click(places::file(0));
-    click(places::kLoad);
-    EXPECT_TRUE(prints(wasLoaded("a.lsp")));
+    loadFile(0, "a.lsp");
     EXPECT_TRUE(comesTrue([&] { return storedSetting("InitialPath") == files().string() + "\n"; }));
     EXPECT_THAT(runQuietly({"REGISTRY SET Software\\Trial name data", "REGISTRY GET Software\\Trial name"}),
                 HasSubstr("\ndata\n"));
@@ -87,11 +84,9 @@ TEST_F(TwoHosts, AnOpenDialogStoresAtOnceAndKeepsNoLock)
 TEST_F(TwoHosts, AMessageBoxKeepsNoLock)
 {
     writeLisp("a.lsp");
-    mSession.folder().write("files/broken.zmb", "no module");
+    writeBroken();
     open();
-    click(places::file(1));
-    click(places::kLoad);
-    ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty());
+    loadBroken(1);
     EXPECT_THAT(runQuietly({"REGISTRY SET Software\\Trial name data", "REGISTRY GET Software\\Trial name"}),
                 HasSubstr("\ndata\n"));
     dismissMessageBox();
@@ -104,9 +99,7 @@ TEST_F(TwoHosts, TheLastToCloseWins)
     const std::string second = writeLisp("b.lsp");
     setSetting("SaveHistory", "1");
     open();
-    click(places::file(0));
-    click(places::kLoad);
-    EXPECT_TRUE(prints(wasLoaded("a.lsp")));
+    loadFile(0, "a.lsp");
     OtherHost other(mSession);
     other.open();
     other.click(places::file(1));
@@ -127,9 +120,7 @@ TEST_F(TwoHosts, ListsThatCannotBeStoredFailAsAWholeAndAreTold)
     storeHistory({"/before.lsp"});
     setSetting("SaveHistory", "1");
     open();
-    click(places::file(0));
-    click(places::kLoad);
-    EXPECT_TRUE(prints(wasLoaded("a.lsp")));
+    loadFile(0, "a.lsp");
     {
         const std::string file = (mSession.profile() / "registry.db").string();
         const std::string lock = "import sqlite3, time\n"
@@ -168,9 +159,7 @@ TEST_F(TwoHosts, NeverLeaveAListHalfDeletedWhenTheyCloseTogether)
     OtherHost other(mSession);
     open();
     other.open();
-    click(places::file(0)); // the lists that they store are of different lengths from now on
-    click(places::kLoad);
-    EXPECT_TRUE(prints(wasLoaded("a.lsp")));
+    loadFile(0, "a.lsp"); // the lists that they store are of different lengths from now on
     for (int round = 1; round <= kRounds; ++round)
     {
         std::thread closing([&] { other.pressEscape(); });
