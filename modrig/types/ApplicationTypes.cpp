@@ -10,6 +10,20 @@
 #include "modrig/base/CaseFolding.h"
 #include "modrig/base/SplitPath.h"
 
+namespace
+{
+// A package does under any extension.
+bool NeedsRemovingTsLisp(const wchar_t* ext, int type)
+{
+    const auto& kinds = ModrigUtils::kApplicationKinds;
+    return type == kPackagedLisp || std::any_of(std::begin(kinds), std::end(kinds),
+                                                [&](const ModrigUtils::ApplicationKind& kind) {
+                                                    return kind.needsRemovingTsLisp && kind.type == type &&
+                                                           EqualIgnoringCase(ext, kind.extension);
+                                                });
+}
+} // namespace
+
 CExtInfo::CExtInfo(const wchar_t* ext, int type)
     : mbEnabled(testValidExt(ext, type)), mExtension{}, mType(type)
 {
@@ -18,10 +32,7 @@ CExtInfo::CExtInfo(const wchar_t* ext, int type)
 
 bool CExtInfo::testValidExt(const wchar_t* ext, int type)
 {
-    const bool compiledLisp = type == kLispFile && EqualIgnoringCase(ext, L"qbc");
-    if (type == kPackagedLisp || compiledLisp)
-        return RemovingTsLISP();
-    return true;
+    return !NeedsRemovingTsLisp(ext, type) || RemovingTsLISP();
 }
 
 namespace ModrigUtils

@@ -25,6 +25,7 @@ struct ApplicationKind
     const wchar_t* extension; // lower case, without the dot
     int type;                 // how its files are loaded
     bool isLisp;              // loaded again each time that it is asked for, and not while Lisp is off
+    bool needsRemovingTsLisp; // only hosts that answer the query `RemovingTsLISP` with true can use it
     int filterPlace;          // its filter's place among the filters of kinds, from 1
     unsigned filterText;      // the id of its filter, a description and patterns
     // The key of its filter in the file panels: its description, and followed by "_EXT" its extensions. Null
@@ -34,13 +35,13 @@ struct ApplicationKind
 
 // All that is said of a kind, in one row. The order is the search order everywhere.
 inline constexpr ApplicationKind kApplicationKinds[] = {
-    {L"bundle", kCompiledModule, false, 1, ModrigMessages::kBundleFilter, "IDS_MODRIG_QMB_APPS"},
-    {L"zmb", kCompiledModule, false, 2, ModrigMessages::kCoreModuleFilter, "IDS_MODRIG_ZMB_APPS"},
-    {L"lsp", kLispFile, true, 3, ModrigMessages::kLispSourceFilter, "IDS_MODRIG_LSP_APPS"},
-    {L"mcp", kMacroProject, false, 7, ModrigMessages::kMacroProjectFilter, nullptr},
-    {L"omp", kCompiledModule, false, 4, ModrigMessages::kObjectModuleFilter, "IDS_MODRIG_OMP_APPS"},
-    {L"rpk", kPackagedLisp, true, 6, ModrigMessages::kPackagedLispFilter, nullptr},
-    {L"qbc", kLispFile, true, 5, ModrigMessages::kCompiledLispFilter, "IDS_MODRIG_QBC_APPS"},
+    {L"bundle", kCompiledModule, false, false, 1, ModrigMessages::kBundleFilter, "IDS_MODRIG_QMB_APPS"},
+    {L"zmb", kCompiledModule, false, false, 2, ModrigMessages::kCoreModuleFilter, "IDS_MODRIG_ZMB_APPS"},
+    {L"lsp", kLispFile, true, false, 3, ModrigMessages::kLispSourceFilter, "IDS_MODRIG_LSP_APPS"},
+    {L"mcp", kMacroProject, false, false, 7, ModrigMessages::kMacroProjectFilter, nullptr},
+    {L"omp", kCompiledModule, false, false, 4, ModrigMessages::kObjectModuleFilter, "IDS_MODRIG_OMP_APPS"},
+    {L"rpk", kPackagedLisp, true, true, 6, ModrigMessages::kPackagedLispFilter, nullptr},
+    {L"qbc", kLispFile, true, true, 5, ModrigMessages::kCompiledLispFilter, "IDS_MODRIG_QBC_APPS"},
 };
 } // namespace ModrigUtils
 
@@ -49,8 +50,8 @@ struct CExtInfo
 {
     CExtInfo(const wchar_t* ext, int type);
 
-    // Whether the running host can use files of the kind. Packaged and compiled Lisp need a host that answers
-    // the query `RemovingTsLISP`; everything else is always usable.
+    // Whether the running host can use files of the kind. It is asked about packaged Lisp, and where the row
+    // of the kind says so; everything else is always usable.
     [[nodiscard]] static bool testValidExt(const wchar_t* ext, int type);
 
     static constexpr std::size_t kExtensionSize = 7;

@@ -115,6 +115,19 @@ TEST_F(ApplicationTypes, AskTheHostForPackagedAndCompiledLispOnly)
     EXPECT_EQ(0u, TimesAskedBy(L"bundle", 0));
 }
 
+TEST_F(ApplicationTypes, AskTheHostWhereTheirRowsSaySo)
+{
+    std::vector<std::wstring> asking;
+    for (const ApplicationKind& kind : kApplicationKinds)
+    {
+        EXPECT_EQ(kind.needsRemovingTsLisp ? 1u : 0u, TimesAskedBy(kind.extension, kind.type))
+            << kind.extension;
+        if (kind.needsRemovingTsLisp)
+            asking.emplace_back(kind.extension);
+    }
+    EXPECT_THAT(asking, testing::ElementsAre(L"rpk", L"qbc"));
+}
+
 TEST_F(ApplicationTypes, AreUsableAsTheHostAnswers)
 {
     for (const bool removing : {true, false})
