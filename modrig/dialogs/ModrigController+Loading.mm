@@ -12,6 +12,7 @@
 #include "modrig/dialogs/Paths.h"
 #include "modrig/dialogs/Settings.h"
 #include "modrig/dialogs/model/ChosenFiles.h"
+#include "modrig/dialogs/model/LoadSteps.h"
 #include "modrig/dialogs/model/RowInsertion.h"
 #include "modrig/dialogs/model/ShownTab.h"
 #include "modrig/loader/LoadBatch.h"
@@ -59,20 +60,25 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
     }
 }
 
-- (IBAction)onLoad:(id)sender
+- (void)rememberFolder
 {
-    if ([mSelectedFiles count] == 0)
-    {
-        if (tsuiTellOfMissingFile(mOpenPanel))
-            return;
-        [self chooseWhatIsStillSelected];
-    }
-    if ([self openTesselFolder])
-        return;
-    [self loadApps:mSelectedFiles successedApps:nil addToStartupSuit:NO];
     [[self uiPersistentStore] putControlString:kSettingsGroup
                                        control:kInitialPathSetting
                                          value:[mOpenPanel directory]];
+}
+
+- (IBAction)onLoad:(id)sender
+{
+    NSOpenPanel* panel = mOpenPanel;
+    ModrigUtils::LoadSteps steps;
+    steps.hasChosenFiles = [=] { return [[self selectedFiles] count] > 0; };
+    steps.tellsOfMissingFile = [=] { return static_cast<bool>(tsuiTellOfMissingFile(panel)); };
+    steps.chooseWhatIsStillSelected = [=] { [self chooseWhatIsStillSelected]; };
+    steps.goesIntoHostFolder = [=] { return static_cast<bool>([self openTesselFolder]); };
+    steps.loadChosenFiles = [=]
+    { [self loadApps:[self selectedFiles] successedApps:nil addToStartupSuit:NO]; };
+    steps.rememberFolder = [=] { [self rememberFolder]; };
+    ModrigUtils::PressLoad(steps);
 }
 
 - (IBAction)onStartupSuits:(id)sender

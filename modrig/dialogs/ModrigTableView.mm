@@ -7,6 +7,7 @@
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
 #include "modrig/dialogs/Paths.h"
+#include "modrig/dialogs/model/KeepingOut.h"
 #include "modrig/dialogs/model/RowSelection.h"
 #include "modrig/dialogs/model/RowSteps.h"
 #include "modrig/dialogs/model/ShownText.h"
@@ -119,11 +120,18 @@ NSString* ModrigUtils::HelpKey()
             [selected containsIndex:0] != NO, [selected containsIndex:last] != NO};
 }
 
+- (NSArray*)filesInRows:(NSIndexSet*)rows
+{
+    NSMutableArray* files = [NSMutableArray array];
+    for (const std::size_t row : ModrigUtils::IndexesFromSet(rows))
+        if (ModrigFilePath* file = [self fileInRow:static_cast<NSInteger>(row)])
+            [files addObject:file];
+    return files;
+}
+
 - (void)copyPathsOf:(NSIndexSet*)rows
 {
-    NSMutableArray* paths = [NSMutableArray array];
-    for (NSUInteger row = [rows firstIndex]; row != NSNotFound; row = [rows indexGreaterThanIndex:row])
-        [paths addObject:[[self fileInRow:static_cast<NSInteger>(row)] filePathName]];
+    NSArray* paths = [[self filesInRows:rows] valueForKey:@"filePathName"];
     copyToPasteboard([paths componentsJoinedByString:@"\n"]);
 }
 
@@ -135,28 +143,9 @@ NSString* ModrigUtils::HelpKey()
     [self selectRowIndexes:ModrigUtils::SetFromIndexes(rows) byExtendingSelection:NO];
 }
 
-// One that is kept out makes the menu offer to let all of them in.
-- (TableAction)keepingOutOf:(NSIndexSet*)rows
+- (std::vector<CStdStr>)pathsInRows:(NSIndexSet*)rows
 {
-    if (!ModrigUtils::HostKeepsApplicationsOut())
-        return TableAction::kNone;
-    for (NSUInteger row = [rows firstIndex]; row != NSNotFound; row = [rows indexGreaterThanIndex:row])
-        if (!ModrigUtils::WhyKeptOut([[self fileInRow:static_cast<NSInteger>(row)] path]).IsEmpty())
-            return TableAction::kLetIn;
-    return TableAction::kKeepOut;
-}
-
-- (void)keep:(NSIndexSet*)rows out:(BOOL)out
-{
-    for (NSUInteger row = [rows firstIndex]; row != NSNotFound; row = [rows indexGreaterThanIndex:row])
-    {
-        const CStdStr path = [[self fileInRow:static_cast<NSInteger>(row)] path];
-        if (out)
-            ModrigUtils::KeepOut(path);
-        else if (!ModrigUtils::WhyKeptOut(path).IsEmpty())
-            ModrigUtils::LetIn(path);
-    }
-    [self setNeedsDisplay:YES]; // they look it
+    return ModrigUtils::PathsFromRows([self filesInRows:rows]);
 }
 
 - (void)perform:(TableAction)action on:(NSIndexSet*)rows
@@ -170,8 +159,11 @@ NSString* ModrigUtils::HelpKey()
     case TableAction::kCopyPath:
         return [self copyPathsOf:rows];
     case TableAction::kKeepOut:
+        ModrigUtils::KeepAllOut([self pathsInRows:rows]);
+        return [self setNeedsDisplay:YES]; // they look it
     case TableAction::kLetIn:
-        return [self keep:rows out:action == TableAction::kKeepOut];
+        ModrigUtils::LetAllIn([self pathsInRows:rows]);
+        return [self setNeedsDisplay:YES];
     case TableAction::kShowInFolder:
         return ModrigPlatform::ShowInFolder(
             [[self fileInRow:static_cast<NSInteger>([rows firstIndex])] filePathName]);
@@ -296,8 +288,8 @@ NSString* ModrigUtils::HelpKey()
     const NSPoint place = [self convertPoint:[event locationInWindow] fromView:nil];
     NSIndexSet* rows = [self rowsPointedAt:[self rowAtPoint:place]];
     NSMenu* menu = [[[NSMenu alloc] initWithTitle:@""] autorelease];
-    const auto actions =
-        ModrigUtils::MenuOf([(id)[self delegate] kindOfTable:self], [self keepingOutOf:rows]);
+    const auto actions = ModrigUtils::MenuOf([(id)[self delegate] kindOfTable:self],
+                                             ModrigUtils::KeepingOutActionFor([self pathsInRows:rows]));
     for (const TableAction action : actions)
         [menu addItem:[self menuItemFor:action rows:rows]];
     return menu;
