@@ -97,6 +97,17 @@ Result<> run(sqlite3* database, const char* sql)
     return status == SQLITE_OK ? Result<>() : storeFailure(database, status);
 }
 
+// What the column's reader makes of the first row that the statement answers.
+template <class Value>
+Result<Value> first(sqlite3* database, const char* sql, Value (Statement::*column)(int) const)
+{
+    Statement statement;
+    int status = statement.prepare(database, sql);
+    if (status == SQLITE_OK)
+        status = statement.step();
+    return status == SQLITE_ROW ? Result<Value>((statement.*column)(0)) : storeFailure(database, status);
+}
+
 template <class Statements>
 Result<> runAll(sqlite3* database, const Statements& statements)
 {
@@ -255,23 +266,11 @@ Failure storeFailure(sqlite3* database, int status)
 
 Result<std::int64_t> firstNumber(sqlite3* database, const char* sql)
 {
-    Statement statement;
-    int status = statement.prepare(database, sql);
-    if (status == SQLITE_OK)
-        status = statement.step();
-    if (status != SQLITE_ROW)
-        return storeFailure(database, status);
-    return statement.number(0);
+    return first(database, sql, &Statement::number);
 }
 
 Result<std::wstring> firstText(sqlite3* database, const char* sql)
 {
-    Statement statement;
-    int status = statement.prepare(database, sql);
-    if (status == SQLITE_OK)
-        status = statement.step();
-    if (status != SQLITE_ROW)
-        return storeFailure(database, status);
-    return statement.text(0);
+    return first(database, sql, &Statement::text);
 }
 } // namespace tessel
