@@ -11,9 +11,9 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
-#include "host/files/PartFile.h"
 #include "host/platform/Descriptor.h"
 #include "host/platform/OrdinaryFile.h"
+#include "host/platform/PartFile.h"
 #include "host/platform/PrivateFolder.h"
 #include "host/text/Credentials.h"
 #include "host/text/Unicode.h"
@@ -143,9 +143,7 @@ void shorten(const std::filesystem::path& path)
     std::string kept = std::string(kFormat) + "\n";
     for (std::size_t index = lines.size() - kMostHistoryLines; index < lines.size(); ++index)
         kept.append(lines[index]).append("\n");
-    PartFile file(path.parent_path());
-    if (file.made() && file.write(kept))
-        static_cast<void>(file.moveTo(path)); // the long one does as well
+    static_cast<void>(replaceFile(path, kept)); // the long one does as well
 }
 } // namespace
 

@@ -6,9 +6,9 @@
 #include <memory>
 
 #include "host/commands/Interruption.h"
-#include "host/files/PartFile.h"
 #include "host/files/RemoteAddress.h"
 #include "host/files/Sha256.h"
+#include "host/platform/PartFile.h"
 #include "host/text/Unicode.h"
 
 namespace tessel

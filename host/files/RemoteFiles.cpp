@@ -9,10 +9,10 @@
 #include <system_error>
 
 #include "host/files/Download.h"
-#include "host/files/PartFile.h"
 #include "host/files/RemoteAddress.h"
 #include "host/files/Sha256.h"
 #include "host/platform/OrdinaryFile.h"
+#include "host/platform/PartFile.h"
 #include "host/platform/PrivateFolder.h"
 #include "host/text/Running.h"
 #include "host/text/Unicode.h"
@@ -39,15 +39,6 @@ std::string originIn(const std::filesystem::path& folder)
 {
     const auto origin = readOrdinaryFile(folder / kOriginFile, kLongestOrigin);
     return origin ? *origin : std::string();
-}
-
-Result<> writeOrigin(const std::filesystem::path& folder, const std::string& url)
-{
-    PartFile origin(folder);
-    if (!origin.made())
-        return origin.made();
-    return origin.write(url) ? origin.moveTo(folder / kOriginFile)
-                             : Failure{toWide(std::generic_category().message(errno))};
 }
 
 std::filesystem::path resolved(const std::filesystem::path& path)
@@ -104,7 +95,7 @@ Result<> store(PartFile& part, const std::filesystem::path& copy, const std::str
     const bool isKnown = originIn(folder) == url && checkNobodyElseWrites(folder / kOriginFile);
     if (const auto moved = part.moveTo(copy); !moved)
         return about("local copy", copy, L" cannot be made: " + moved.sentence());
-    const auto noted = isKnown ? Result<>() : writeOrigin(folder, url);
+    const auto noted = isKnown ? Result<>() : replaceFile(folder / kOriginFile, url);
     if (noted)
         return noted;
     std::error_code gone;

@@ -10,10 +10,10 @@
 
 #include <CLI/CLI.hpp>
 
-#include "host/files/PartFile.h"
 #include "host/lisp/CompiledLisp.h"
 #include "host/lisp/LispFile.h"
 #include "host/lisp/LispMachine.h"
+#include "host/platform/PartFile.h"
 #include "host/text/TerminalText.h"
 #include "host/text/Unicode.h"
 

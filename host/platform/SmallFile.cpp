@@ -1,12 +1,12 @@
 #include "host/platform/SmallFile.h"
 
 #include <cerrno>
-#include <cstdio>
 
 #include <fcntl.h>
 #include <unistd.h>
 
 #include "host/platform/OrdinaryFile.h"
+#include "host/platform/PartFile.h"
 #include "host/platform/PrivateFolder.h"
 #include "host/text/Unicode.h"
 
@@ -97,14 +97,7 @@ std::vector<std::string_view> linesOf(std::string_view text)
 
 Result<> replaceSmallFile(const std::filesystem::path& file, std::string_view content)
 {
-    const std::filesystem::path next = file.string() + ".new";
-    unlink(next.c_str()); // of a session that came to its end in the middle of this
-    const Descriptor descriptor(open(next.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, kOwnersOnly));
-    if (descriptor && descriptor.write(content) && fsync(descriptor.number()) == 0 &&
-        std::rename(next.c_str(), file.c_str()) == 0)
-        return {};
-    const std::wstring why = toWide(std::generic_category().message(errno));
-    unlink(next.c_str());
-    return failed(file, L" cannot be written: ", why);
+    const auto replaced = replaceFile(file, content);
+    return replaced ? replaced : failed(file, L" cannot be written: ", replaced.sentence());
 }
 } // namespace tessel

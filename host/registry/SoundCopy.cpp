@@ -6,11 +6,10 @@
 #include <cstring>
 #include <memory>
 
-#include <fcntl.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
-#include "host/platform/Descriptor.h"
+#include "host/platform/PartFile.h"
 #include "host/registry/Journals.h"
 #include "host/registry/Schema.h"
 #include "host/registry/Soundness.h"
@@ -38,43 +37,6 @@ Failure systemFailure()
 std::filesystem::path beside(const std::filesystem::path& file, const char* ending)
 {
     return file.string() + ending;
-}
-
-// A new file beside the other, wholly on the disk. Answers its path.
-Result<std::string> writeBeside(const std::filesystem::path& file, std::string_view bytes)
-{
-    std::string name = beside(file, ".XXXXXX").string();
-    Descriptor made(mkostemp(name.data(), O_CLOEXEC));
-    if (!made)
-        return systemFailure();
-    if (made.write(bytes) && fsync(made.number()) == 0 && made.close())
-        return name;
-    const Failure failure = systemFailure();
-    unlink(name.c_str());
-    return failure;
-}
-
-// That a name leads to a file is on the disk only when its folder is. Not every file system can be asked.
-void storeFolderOf(const std::filesystem::path& file)
-{
-    const Descriptor folder(open(file.parent_path().c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
-    if (folder)
-        static_cast<void>(fsync(folder.number()));
-}
-
-Result<> replace(const std::filesystem::path& file, std::string_view bytes)
-{
-    const auto made = writeBeside(file, bytes);
-    if (!made)
-        return made.failure();
-    if (rename(made->c_str(), file.c_str()) != 0)
-    {
-        const Failure failure = systemFailure();
-        unlink(made->c_str());
-        return failure;
-    }
-    storeFolderOf(file);
-    return {};
 }
 
 Result<> useCopy(sqlite3* database)
@@ -164,7 +126,7 @@ Result<> makeSoundCopy(sqlite3* database, const std::filesystem::path& file)
     if (!image)
         return storeFailure(database, sqlite3_errcode(database));
     const auto* bytes = reinterpret_cast<const char*>(image.get());
-    return replace(soundCopyOf(file), {bytes, static_cast<std::size_t>(size)});
+    return replaceFile(soundCopyOf(file), {bytes, static_cast<std::size_t>(size)});
 }
 
 Result<std::filesystem::path> putSoundCopyBack(const std::filesystem::path& file)
@@ -180,7 +142,7 @@ Result<std::filesystem::path> putSoundCopyBack(const std::filesystem::path& file
     const auto named = nameToo(file, kept);
     Result<> done = named ? setJournalsAside(file, kept) : named.failure();
     if (done)
-        done = replace(file, *bytes);
+        done = replaceFile(file, *bytes);
     if (!done)
         return notRestored(file, done.sentence());
     return *named ? kept : std::filesystem::path();
@@ -188,13 +150,9 @@ Result<std::filesystem::path> putSoundCopyBack(const std::filesystem::path& file
 
 Result<> makeFileOnce(const std::filesystem::path& file, std::string_view bytes)
 {
-    const auto made = writeBeside(file, bytes);
-    if (!made)
-        return made.failure();
-    const bool placed = link(made->c_str(), file.c_str()) == 0 || errno == EEXIST;
-    const Failure failure = systemFailure();
-    unlink(made->c_str());
-    storeFolderOf(file);
-    return placed ? Result<>() : failure;
+    PartFile part(file.parent_path());
+    if (!part.made())
+        return part.made();
+    return part.write(bytes) ? part.moveToOnce(file) : systemFailure();
 }
 } // namespace tessel

@@ -30,7 +30,8 @@
 
 namespace
 {
-constexpr std::string_view kFiles = "/registry.db";
+constexpr std::string_view kFile = "/registry.db";
+constexpr std::string_view kPartOfIt = "/.part-"; // what takes its place
 constexpr long kNfs = 0x6969;
 constexpr std::size_t kLongestPath = 4096;
 
@@ -78,7 +79,8 @@ Function* next(const char* name)
 
 bool isMeant(const char* path)
 {
-    return path && std::string_view(path).find(kFiles) != std::string_view::npos;
+    const std::string_view file = path ? path : "";
+    return file.find(kFile) != file.npos || file.find(kPartOfIt) != file.npos;
 }
 
 bool isMeant(int file)

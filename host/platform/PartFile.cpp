@@ -1,6 +1,7 @@
-#include "host/files/PartFile.h"
+#include "host/platform/PartFile.h"
 
 #include <cerrno>
+#include <cstdio>
 #include <cstdlib>
 #include <cstring>
 #include <system_error>
@@ -28,6 +29,15 @@ bool hasName(int file)
 {
     struct stat status = {};
     return fstat(file, &status) == 0 && status.st_nlink > 0;
+}
+
+// That a name leads to a file is on the disk only when its folder is. Not every file system can be asked.
+void storeFolderOf(const std::filesystem::path& file)
+{
+    const std::filesystem::path path = file.has_parent_path() ? file.parent_path() : ".";
+    const Descriptor folder(open(path.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC));
+    if (folder)
+        static_cast<void>(fsync(folder.number()));
 }
 
 void removeIfNobodyWrites(const std::filesystem::path& part)
@@ -78,10 +88,24 @@ bool PartFile::letOthersRead()
 
 Result<> PartFile::moveTo(const std::filesystem::path& place)
 {
-    // On the disk before it has its name: a power cut leaves all of it or none.
-    if (fsync(mFile.number()) != 0 || rename(mPath.c_str(), place.c_str()) != 0)
+    auto named = name(place, std::rename);
+    if (named)
+        mPath.clear();
+    return named;
+}
+
+Result<> PartFile::moveToOnce(const std::filesystem::path& place)
+{
+    return name(place, [](const char* part, const char* name)
+                { return link(part, name) == 0 || errno == EEXIST ? 0 : -1; });
+}
+
+// On the disk before it has its name: a power cut leaves all of it or none.
+Result<> PartFile::name(const std::filesystem::path& place, int (*naming)(const char*, const char*))
+{
+    if (fsync(mFile.number()) != 0 || naming(mPath.c_str(), place.c_str()) != 0)
         return lastError();
-    mPath.clear();
+    storeFolderOf(place);
     return {};
 }
 
@@ -92,5 +116,14 @@ void PartFile::clearLeftOvers(const std::filesystem::path& folder)
          entry.increment(unreachable))
         if (entry->path().filename().string().starts_with(kPrefix))
             removeIfNobodyWrites(entry->path());
+}
+
+Result<> replaceFile(const std::filesystem::path& place, std::string_view bytes)
+{
+    PartFile::clearLeftOvers(place.parent_path());
+    PartFile part(place.parent_path());
+    if (!part.made())
+        return part.made();
+    return part.write(bytes) ? part.moveTo(place) : lastError();
 }
 } // namespace tessel

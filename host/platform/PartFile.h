@@ -29,17 +29,26 @@ public:
     // As is usual for new files of the person's; without it nobody else can read it.
     bool letOthersRead();
 
-    // Puts it in place of what stands there. Fails with the system's words.
+    // Puts it in place of what stands there: from then on all of it is on the disk, by that name. Fails with
+    // the system's words.
     Result<> moveTo(const std::filesystem::path& place);
+
+    // The same where nothing stands; what does stand there stays, and all is well.
+    Result<> moveToOnce(const std::filesystem::path& place);
 
     // Removes what killed processes have left in the folder.
     static void clearLeftOvers(const std::filesystem::path& folder);
 
 private:
     void make(const std::filesystem::path& folder);
+    Result<> name(const std::filesystem::path& place, int (*naming)(const char* part, const char* place));
 
     Result<> mMade;
     std::string mPath; // empty when there is nothing to remove
     Descriptor mFile{-1};
 };
+
+// The file at that place holds these bytes, or what it held before, whatever happens meanwhile; the person
+// alone can read it. Clears left-overs away. Fails with the system's words.
+Result<> replaceFile(const std::filesystem::path& place, std::string_view bytes);
 } // namespace tessel
