@@ -82,9 +82,7 @@ Result<> Host::makeParts()
                                                  {
                                                      return finishLine();
                                                  }});
-    mCommandLine.tell(mParts->registry->canStore());
-    if (const std::wstring& notice = mParts->registry->notice(); !notice.empty())
-        mCommandLine.say(notice);
+    tellOfRegistry();
     if (const Outcome& started = mParts->startedLisp; !started)
         return started.failure();
     mInterruptible = &mParts->lisp();
@@ -96,6 +94,18 @@ Result<> Host::makeParts()
 
 Result<> Host::prepareProfileFolder()
 {
+// The other parts have read it by now, and what they did not find is mostly why nothing can be stored.
+void Host::tellOfRegistry()
+{
+    Registry& registry = *mParts->registry;
+    const auto read = registry.endOfCommand();
+    mCommandLine.tell(registry.canStore());
+    if (read.sentence() != registry.canStore().sentence())
+        mCommandLine.tell(read);
+    if (!registry.notice().empty())
+        mCommandLine.say(registry.notice());
+}
+
     if (mOptions.profileFolder.empty())
         return Failure{
             L"Tessel does not know where to keep its profile: HOME is not set, and no folder was given."};

@@ -77,6 +77,7 @@ public:
 
 private:
     Result<> makeParts();
+    void tellOfRegistry();
     Result<> prepareProfileFolder();
     void judgeEarlierSessions();
     void tellWhoElseWritesTheProfile();

@@ -183,7 +183,9 @@ Result<std::wstring> Registry::readValue(Key key, std::wstring_view name)
     if (status == SQLITE_DONE)
         status = step(read.bind(key).bindUtf8(std::move(fold)));
     if (status != SQLITE_ROW)
-        return status == SQLITE_DONE ? noSuchValue() : Failure{mCommand.sentence(), ERROR_READ_FAULT};
+        return status == SQLITE_DONE
+                   ? noSuchValue()
+                   : Failure{(mCommand ? mCanStore : mCommand).sentence(), ERROR_READ_FAULT};
     mReadAhead.noteFound(key, read.number(0));
     std::wstring data = read.text(kThird);
     read.reset();
@@ -364,14 +366,14 @@ int Registry::step(Statement& statement)
         return status;
     }
     statement.reset();
-    static_cast<void>(failRead(L"a row of it is not what was stored there", SQLITE_CORRUPT));
+    failRead(L"a row of it is not what was stored there", SQLITE_CORRUPT);
     return SQLITE_CORRUPT;
 }
 
 void Registry::failStep(int status)
 {
     mCannotLock = isLockRefused(status);
-    static_cast<void>(failRead(toWide(sqlite3_errstr(status)), status));
+    failRead(toWide(sqlite3_errstr(status)), status);
 }
 
 // Of rows that come in the order of their first column, which only an index that is damaged does not keep: it
@@ -387,23 +389,27 @@ bool Registry::isNext(Statement& statement, std::int64_t& last)
         return true;
     }
     statement.reset();
-    static_cast<void>(failRead(L"an index of it is out of order", SQLITE_CORRUPT));
+    failRead(L"an index of it is out of order", SQLITE_CORRUPT);
     return false;
 }
 
-// Nothing is written any more: who asked knows less than is stored, and will know no more.
-Failure Registry::failRead(const std::wstring& words, int status)
+// Nothing is written any more: who asked knows less than is stored, and will know no more. Damage is told
+// once, by what finds it first.
+void Registry::failRead(const std::wstring& words, int status)
 {
     const std::wstring file = toWide(mFile.string());
     const bool damaged = (status & 0xFF) == SQLITE_CORRUPT || (status & 0xFF) == SQLITE_NOTADB;
+    const bool isKnown = damaged && mDamaged;
     mDamaged = mDamaged || damaged;
     mLookedAt = false;
     const std::wstring help = damaged ? helpAgainstDamage(mFile) : L"Start Tessel again.";
-    Failure failure =
-        giveUp({L"The registry " + file + L" could not be read: " + words +
-                    L". Nothing more is stored in this session, so that nothing is lost. " + help,
-                ERROR_READ_FAULT});
-    return failure;
+    Failure failure{L"The registry " + file + L" could not be read: " + words +
+                        L". Nothing more is stored in this session, so that nothing is lost. " + help,
+                    ERROR_READ_FAULT};
+    if (isKnown)
+        undoCommand();
+    else
+        static_cast<void>(giveUp(std::move(failure)));
 }
 
 // For the rest of the session. The command that it happens in tells it, unless it has failed before.

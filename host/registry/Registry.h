@@ -90,7 +90,8 @@ public:
     Result<> write(std::wstring_view path, std::wstring_view name, std::wstring_view data);
 
     // Stores what the command wrote. When that or something before it failed, everything that the command
-    // wrote is undone, and the sentence says so.
+    // wrote is undone, and the sentence says so. Damage that `canStore` or an earlier command has told is not
+    // told again.
     Result<> endOfCommand();
 
     // Stores what the command wrote so far, and reads as it stands from now on. A failure stays the
@@ -170,7 +171,7 @@ private:
     void failStep(int status);
     bool isNext(Statement& statement, std::int64_t& last);
     Failure fail(int status, const wchar_t* done);
-    Failure failRead(const std::wstring& words, int status);
+    void failRead(const std::wstring& words, int status);
     Failure giveUp(Failure failure);
     void undoCommand();
     void closeHandlesOfLostKeys();

@@ -5,7 +5,8 @@
 
 #include <sys/stat.h>
 
-#include "tests/e2e/HostProcess.h"
+#include "tests/e2e/Applications.h"
+#include "tests/support/Content.h"
 
 using testing::AllOf;
 using testing::ContainsRegex;
@@ -111,6 +112,34 @@ TEST(RegistryFile, ThatIsNoFileGivesWayToTheCopy)
                           HasSubstr("kept as " + file.string() + ".damaged"), HasSubstr("\ngröße 100%s\n")));
         EXPECT_TRUE(std::filesystem::exists(file.string() + ".damaged"));
     }
+}
+
+// Once by the look at its opening; that what is read of it then is wrong too is no news.
+TEST(RegistryFile, WithADamagedRowIsToldOnceAtAStart)
+{
+    const HostSession session;
+    storeSuite(session, {fixtureModule("Good.zmb"), fixtureModule("Good.omp")});
+    const auto file = session.profile() / "registry.db";
+    std::string content = contentOf(file);
+    ASSERT_NE(content.find("Good.zmb"), content.npos);
+    for (auto at = content.find("Good.zmb"); at != content.npos; at = content.find("Good.zmb"))
+        content[at] = 'F';
+    session.folder().write("profile/registry.db", content);
+    const std::string said = session.run({"VERSION"}).output;
+    const std::string start = "The registry " + file.string() + " ";
+    EXPECT_THAT(said, HasSubstr(start + "is damaged: the value \"1Startup\""));
+    EXPECT_EQ(said.find(start), said.rfind(start)) << said;
+    EXPECT_TRUE(contentOf(file) == content);
+}
+
+TEST(RegistryFile, LosesWhatAKilledSessionHasLeftOfItsCopy)
+{
+    const HostSession session;
+    const auto part = session.folder().write("profile/.part-AbCdEf", "half a copy");
+    ASSERT_EQ(session.run({kSet}).exitStatus, 0);
+    EXPECT_FALSE(std::filesystem::exists(part));
+    const auto copy = session.profile() / "registry.db.sound";
+    EXPECT_EQ(static_cast<unsigned>(std::filesystem::status(copy).permissions()), 0600u);
 }
 
 TEST(RegistryFile, ThatIsMissingIsRestoredWithoutMentionOfWhatStoodThere)
