@@ -23,12 +23,6 @@ constexpr std::size_t kFields = 14;
 constexpr std::int64_t kNanoseconds = 1'000'000'000;
 
 // The program inside a bundle is the same application as the bundle.
-bool isWithin(std::string_view path, std::string_view folder)
-{
-    return !folder.empty() &&
-           (path == folder || (path.starts_with(folder) && path.substr(folder.size()).starts_with('/')));
-}
-
 auto findIn(auto& applications, const std::string& path)
 {
     const std::string real = realPath(path).native();
@@ -260,7 +254,8 @@ void KeptOut::giveTrials(Applications& applications, std::vector<std::wstring>& 
 
 bool KeptOut::wasTold(const KeptOutApplication& application) const
 {
-    return std::ranges::find(mTold, application.path) != mTold.end();
+    return std::ranges::any_of(mTold,
+                               [&](const std::string& path) { return isWithin(path, application.realPath); });
 }
 
 std::wstring KeptOut::judge(const RunningMarker::Leftover& leftover, Applications& applications)

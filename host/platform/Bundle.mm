@@ -11,6 +11,7 @@
 #include "host/platform/BundleDescription.h"
 #include "host/platform/FileNames.h"
 #include "host/platform/ObjectiveCGuard.h"
+#include "host/platform/RealPath.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -71,6 +72,10 @@ Result<std::string> askForProgram(const std::string& folder)
     const std::string program = [path fileSystemRepresentation];
     if (!std::filesystem::exists(program, failed))
         return Failure{L"its program \"" + toWide(program) + L"\" is missing"};
+    const std::filesystem::path real = realPath(program);
+    if (!isWithin(real.native(), realPath(folder).native()))
+        return Failure{L"its program \"" + toWide(program) + L"\" leads out of the bundle, to \"" +
+                       toWide(real.native()) + L"\""};
     return program;
 }
 } // namespace

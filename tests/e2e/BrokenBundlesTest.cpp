@@ -142,3 +142,73 @@ TEST_F(BrokenBundles, InTheRecordsCostOneApplicationEach)
     const auto result = session.run({"VERSION"});
     expectOneRefusalEach(result);
 }
+
+namespace
+{
+// A bundle whose program is a link.
+class BundlesWithLinks : public testing::Test
+{
+protected:
+    BundlesWithLinks()
+    {
+        fs::copy(fixtureModule("Good.bundle"), bundle, fs::copy_options::recursive);
+        fs::create_directories(inner.parent_path());
+        fs::rename(program, inner);
+    }
+
+    std::string loading(const fs::path& path) const { return session.run({"LOAD " + path.string()}).output; }
+
+    std::string refusal(const fs::path& leadsTo) const
+    {
+        return "\"" + bundle.string() + "\" is not loaded: its program \"" + program.string() +
+               "\" leads out of the bundle, to \"" + leadsTo.string() + "\".\n";
+    }
+
+    HostSession session;
+    fs::path bundle = session.folder() / "linked.bundle";
+    fs::path program = bundle / "Good";
+    fs::path inner = bundle / "Versions" / "A" / "Good";
+    fs::path outside = session.folder() / "outside";
+};
+} // namespace
+
+TEST_F(BundlesWithLinks, AreLoadedWhereTheirProgramLiesWithin)
+{
+    fs::create_directory_symlink("A", bundle / "Versions" / "Current");
+    fs::create_symlink("Versions/Current/Good", program);
+    EXPECT_THAT(loading(bundle), HasSubstr(bundle.string() + " is loaded.\n"));
+}
+
+TEST_F(BundlesWithLinks, MayBeReachedByALinkThemselves)
+{
+    fs::rename(inner, program);
+    const fs::path link = session.folder() / "by link.bundle";
+    fs::create_directory_symlink(bundle, link);
+    const auto result = session.run({"LOAD \"" + link.string() + "\""});
+    EXPECT_THAT(result.output, HasSubstr(link.string() + " is loaded.\n"));
+}
+
+TEST_F(BundlesWithLinks, AreRefusedWhereTheirProgramLiesElsewhere)
+{
+    fs::rename(inner, outside);
+    fs::create_symlink(outside, program);
+    EXPECT_THAT(loading(bundle), HasSubstr(refusal(outside)));
+    // A neighbour whose name goes on where the bundle's ends is elsewhere too.
+    const fs::path neighbour = bundle.string() + ".old";
+    fs::create_directory(neighbour);
+    fs::rename(outside, neighbour / "Good");
+    fs::remove(program);
+    fs::create_symlink("../linked.bundle.old/Good", program);
+    EXPECT_THAT(loading(bundle), HasSubstr(refusal(neighbour / "Good")));
+}
+
+TEST_F(BundlesWithLinks, AreRefusedWhereAFolderOnTheWayLeadsElsewhere)
+{
+    session.folder().write("linked.bundle/Resources/Info-gnustep.plist",
+                           "{ NSExecutable = \"inner/Good\"; }");
+    fs::create_directory(outside);
+    fs::rename(inner, outside / "Good");
+    fs::create_directory_symlink(outside, bundle / "inner");
+    program = bundle / "inner" / "Good";
+    EXPECT_THAT(loading(bundle), HasSubstr(refusal(outside / "Good")));
+}
