@@ -225,7 +225,7 @@ std::vector<std::wstring> KeptOut::begin(const std::vector<RunningMarker::Leftov
                 if (!isGuilty(leftover))
                     continue;
                 sentences.push_back(judge(leftover, applications));
-                mTold.push_back(leftover.work.path);
+                mTold.push_back(realPath(leftover.work.path).native());
             }
             if (givesTrials)
                 giveTrials(applications, sentences);
@@ -271,10 +271,13 @@ std::wstring KeptOut::judge(const RunningMarker::Leftover& leftover, Application
     const std::wstring sentence =
         L"The application \"" + toWide(guilty.path) + L"\" " + whatHappened(guilty) + L". ";
     const auto facts = factsOf(guilty.path);
+    const auto known = findIn(applications, guilty.path);
+    // A person's wish stands as it was said.
+    if (known != applications.end() && known->stage == Stage::kByPerson)
+        return sentence + L"It stays kept out at starts, until you let it in (ENABLE).";
     if (facts && facts->statusTime / kNanoseconds > guilty.since)
         return sentence + L"Its file is another one by now, and is tried.";
     guilty.facts = facts.value_or(FileFacts());
-    const auto known = findIn(applications, guilty.path);
     // One that has not been tried since still gets its trial.
     if (known == applications.end() || known->stage == Stage::kThisTime)
     {
@@ -284,7 +287,7 @@ std::wstring KeptOut::judge(const RunningMarker::Leftover& leftover, Application
         return sentence + L"It is not loaded by itself at this start, and tried once more at the next.";
     }
     guilty.hash = known->hash;
-    guilty.stage = known->stage == Stage::kByPerson ? Stage::kByPerson : Stage::kForGood;
+    guilty.stage = Stage::kForGood;
     *known = guilty;
     return sentence + L"It is not loaded by itself any more, until you load it by hand or let it in "
                       L"(ENABLE), or its file changes.";

@@ -92,7 +92,7 @@ private:
 
     std::filesystem::path mFile;
     Applications mApplications;
-    std::vector<std::string> mTold;  // the paths of those judged at this start
+    std::vector<std::string> mTold;  // those judged at this start, links followed
     std::vector<std::string> mTried; // of those whose trial this session is
     bool mStored = true;
 };

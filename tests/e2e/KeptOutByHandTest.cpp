@@ -1,5 +1,8 @@
 // A person keeps an application out at starts, and lets it in again.
+#include <chrono>
+#include <csignal>
 #include <fstream>
+#include <thread>
 
 #include <gmock/gmock.h>
 
@@ -257,10 +260,91 @@ TEST_F(KeptOutByHand, LeavesOnlyTheOthersAsFailures)
 
 TEST_F(KeptOutByHand, FailsWithAWordWhereNothingCanBeStored)
 {
-    session.run({});
-    const auto file = session.profile() / "applications" / "kept-out.new";
-    std::filesystem::create_directories(file / "in the way");
+    session.startBy("ulimit -f 0; exec \"$0\" \"$@\"");
     const auto result = session.run({"DISABLE " + good});
     EXPECT_EQ(result.exitStatus, 1);
-    EXPECT_THAT(result.output, HasSubstr("kept-out cannot be written: "));
+    EXPECT_THAT(result.output, HasSubstr("kept-out cannot be written: File too large.\n"));
+}
+
+TEST_F(KeptOutByHand, LeavesNothingOfAKilledSessionBeside)
+{
+    const auto part = session.folder().write("profile/applications/.part-AbCdEf", "half of it");
+    session.run({"DISABLE " + good});
+    EXPECT_FALSE(std::filesystem::exists(part));
+    const auto file = session.profile() / "applications" / "kept-out";
+    EXPECT_EQ(static_cast<unsigned>(std::filesystem::status(file).permissions()), 0600u);
+}
+
+namespace
+{
+class KeptOutByHandThatEndsTheHost : public KeptOutByHand
+{
+protected:
+    void SetUp() override
+    {
+        storeSuite(session, {bad, good});
+        ASSERT_EQ(session.start({"--safe", "-c", "DISABLE " + bad}).exitStatus, 0);
+    }
+
+    void expectItIsOnlyKeptOut(const std::string& named) const
+    {
+        const auto result = session.run({"APPS"});
+        EXPECT_EQ(result.exitStatus, 0) << result.output;
+        const std::string start = result.output.substr(0, result.output.find("Command: "));
+        EXPECT_THAT(start, HasSubstr("The application \"" + named + "\" ended Tessel "));
+        EXPECT_THAT(start, HasSubstr(" (asked for by hand): it was given up (SIGABRT). It stays kept out at "
+                                     "starts, until you let it in (ENABLE).\n"));
+        EXPECT_EQ(start.find("abort"), start.rfind("abort")) << "said once: " << start;
+        EXPECT_THAT(result.output.substr(start.size()), ContainsRegex("  abort\\.zmb .* " + since + "\n"));
+    }
+
+    std::string bad = deadly(session, "abort");
+    std::string since = kReason;
+};
+} // namespace
+
+TEST_F(KeptOutByHandThatEndsTheHost, StaysAsThePersonWishedWhateverElseIsDone)
+{
+    EXPECT_EQ(session.run({"LOAD " + bad}).exitStatus, -SIGABRT);
+    expectItIsOnlyKeptOut(bad);
+    std::filesystem::last_write_time(bad, std::filesystem::last_write_time(bad) + std::chrono::seconds(1));
+    for (int start = 0; start < 3; ++start)
+    {
+        const auto result = session.run({"VERSION"});
+        EXPECT_EQ(result.exitStatus, 0) << result.output;
+        EXPECT_THAT(result.output, ContainsRegex("\"" + bad + "\" is not loaded: it is " + since));
+        EXPECT_THAT(result.output, Not(HasSubstr("tried")));
+    }
+    EXPECT_EQ(session.run({"ENABLE abort.zmb"}).exitStatus, 0);
+    EXPECT_EQ(session.run({"VERSION"}).exitStatus, -SIGABRT);
+}
+
+// Nothing is tried of what a person keeps out.
+TEST_F(KeptOutByHandThatEndsTheHost, IsNotTriedWhenItsFileWasReplacedMeanwhile)
+{
+    EXPECT_EQ(session.run({"LOAD " + bad}).exitStatus, -SIGABRT);
+    std::this_thread::sleep_for(std::chrono::milliseconds(1100)); // ends are known to the second
+    std::filesystem::permissions(bad, std::filesystem::perms::owner_all);
+    expectItIsOnlyKeptOut(bad);
+}
+
+TEST_F(KeptOutByHandThatEndsTheHost, IsKnownByALinkToIt)
+{
+    const auto link = session.folder() / "link.zmb";
+    std::filesystem::create_symlink(bad, link);
+    session.run({"ENABLE " + bad, "DISABLE " + link.string()});
+    EXPECT_EQ(session.run({"LOAD " + bad}).exitStatus, -SIGABRT);
+    expectItIsOnlyKeptOut(bad);
+}
+
+TEST_F(KeptOutByHandThatEndsTheHost, IsKeptOutSinceThePersonSaidSo)
+{
+    const auto file = session.profile() / "applications" / "kept-out";
+    std::string content = contentOf(file);
+    const auto at = content.find("\t4\t") + 3;
+    content.replace(at, content.find('\t', at) - at, "86400");
+    std::ofstream(file) << content;
+    EXPECT_EQ(session.run({"LOAD " + bad}).exitStatus, -SIGABRT);
+    since = "kept out at starts by DISABLE since 1970-01-02 [0-9:]+";
+    expectItIsOnlyKeptOut(bad);
 }
