@@ -5,25 +5,12 @@
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
-#include "host/platform/Bundle.h"
 
 namespace tessel
 {
 namespace
 {
 using Texts = std::vector<std::wstring>;
-
-// A bundle is a folder; no other folder is an application.
-Result<> checkIsApplication(const std::wstring& path)
-{
-    std::error_code failed;
-    const auto status = std::filesystem::status(toPath(path), failed);
-    if (!std::filesystem::exists(status))
-        return Failure{L"There is no application \"" + path + L"\" that could be kept out."};
-    if (std::filesystem::is_directory(status) && !isBundlePath(toUtf8(path)))
-        return Failure{L"\"" + path + L"\" is a folder and no application."};
-    return {};
-}
 
 bool isCalled(const std::wstring& path, const std::wstring& name)
 {
@@ -49,8 +36,8 @@ Texts applicationsCalled(const Parts& parts, const std::wstring& name)
     for (const auto& record : parts.records->all())
         known.push_back(record.module);
     known.push_back(toText(parts.layout.plugIns / toPath(name)));
-    std::erase_if(known,
-                  [&](const auto& path) { return !isCalled(path, name) || !checkIsApplication(path); });
+    std::erase_if(known, [&](const auto& path)
+                  { return !isCalled(path, name) || !KeptOut::checkIsApplication(toUtf8(path)); });
     return known;
 }
 
@@ -84,7 +71,7 @@ Result<std::wstring> pathToKeepOut(const Parts& parts, const std::wstring& typed
 {
     Texts candidates = applicationsCalled(parts, typed);
     const std::wstring here = fullPath(parts, typed);
-    const auto checked = checkIsApplication(here);
+    const auto checked = KeptOut::checkIsApplication(toUtf8(here));
     if (checked)
         candidates.push_back(here);
     else if (candidates.empty())

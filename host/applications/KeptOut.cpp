@@ -6,6 +6,7 @@
 #include <ctime>
 #include <string_view>
 
+#include "host/platform/Bundle.h"
 #include "host/platform/RealPath.h"
 #include "host/platform/SmallFile.h"
 #include "host/text/DayAndTime.h"
@@ -270,11 +271,11 @@ std::wstring KeptOut::judge(const RunningMarker::Leftover& leftover, Application
     guilty.detail = leftover.work.detail;
     const std::wstring sentence =
         L"The application \"" + toWide(guilty.path) + L"\" " + whatHappened(guilty) + L". ";
-    const auto facts = factsOf(guilty.path);
     const auto known = findIn(applications, guilty.path);
     // A person's wish stands as it was said.
     if (known != applications.end() && known->stage == Stage::kByPerson)
         return sentence + L"It stays kept out at starts, until you let it in (ENABLE).";
+    const auto facts = factsOf(guilty.path);
     if (facts && facts->statusTime / kNanoseconds > guilty.since)
         return sentence + L"Its file is another one by now, and is tried.";
     guilty.facts = facts.value_or(FileFacts());
@@ -301,10 +302,23 @@ const KeptOutApplication* KeptOut::find(const std::string& path) const
     return found == mApplications.end() ? nullptr : &*found;
 }
 
+Result<> KeptOut::checkIsApplication(const std::string& path)
+{
+    std::error_code failed;
+    const auto status = std::filesystem::status(path, failed);
+    if (!std::filesystem::exists(status))
+        return Failure{L"There is no application \"" + toWide(path) + L"\" that could be kept out."};
+    if (std::filesystem::is_directory(status) && !isBundlePath(path))
+        return Failure{L"\"" + toWide(path) + L"\" is a folder and no application."};
+    return {};
+}
+
 Result<> KeptOut::keepOut(const std::string& path)
 {
     if (path.empty())
         return Failure{L"An application without a path cannot be kept out."};
+    if (auto checked = checkIsApplication(path); !checked)
+        return checked;
     return change(
         [&](Applications& applications)
         {

@@ -72,7 +72,11 @@ public:
     const KeptOutApplication* find(const std::string& path) const;
     const std::vector<KeptOutApplication>& all() const { return mApplications; }
 
-    // A person keeps it out, or lets it in whatever kept it out. The second fails when nothing does.
+    // Whether there is an application at that full path: a file, or a bundle, which is a folder.
+    static Result<> checkIsApplication(const std::string& path);
+
+    // A person keeps it out, or lets it in whatever kept it out. The first fails where there is no
+    // application, the second when nothing keeps it out.
     Result<> keepOut(const std::string& path);
     Result<> letIn(const std::string& path);
 

@@ -22,7 +22,7 @@ public:
 
     // Keeps the application at the full path out at starts, from the next one on, without opening its file,
     // or lets it in again, whatever has kept it out. False, with a line on the command line, when that cannot
-    // be stored or when it was not kept out.
+    // be stored, when there is no application at the path, or when it was not kept out.
     virtual bool keepOut(const wchar_t* path) = 0;
     virtual bool letIn(const wchar_t* path) = 0;
 

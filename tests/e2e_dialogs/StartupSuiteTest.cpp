@@ -83,6 +83,20 @@ TEST_F(DialogStartupSuite, KeepsAFileOutAtStartsByTheMenuOfItsRow)
     EXPECT_THAT(output, HasSubstr("kept out at starts by DISABLE since "));
 }
 
+TEST_F(DialogStartupSuite, KeepsNothingOutThatIsNotThere)
+{
+    const std::string first = writeLisp("first.lsp");
+    storeSuite({first});
+    openSuite();
+    std::filesystem::remove(first);
+    mScreen.chooseFromMenuAt(mSuite, places::kFirstSuiteRow, places::kKeepOutInSuiteMenu);
+    shoot("chosen");
+    EXPECT_TRUE(prints("There is no application \"" + first + "\" that could be kept out.\n"));
+    closeSuite();
+    closeAndEnd();
+    EXPECT_THAT(mSession.run({"APPS"}).output, Not(HasSubstr("kept out at starts")));
+}
+
 TEST_F(DialogStartupSuite, IsClosedByEscapeWithTheMainDialogLeftOpen)
 {
     open();
