@@ -1,6 +1,5 @@
 #include "host/platform/LastWords.h"
 
-#include <algorithm>
 #include <cerrno>
 #include <cstdio>
 #include <cstdlib>
@@ -11,6 +10,7 @@
 
 #include "host/platform/RunningMarker.h"
 #include "host/text/Running.h"
+#include "host/text/Unicode.h"
 
 namespace tessel
 {
@@ -24,23 +24,14 @@ alignas(16) std::array<char, std::size_t{64} << 10> theStack;
 // A signal handler can be given nothing. Written before the handlers are in place.
 std::array<struct sigaction, NSIG> theFormer;
 
-unsigned char byteAt(std::string_view text, std::size_t at)
+// What a file is called must not steer the terminal. Of what lies beyond ASCII some take the characters from
+// U+0080 to U+009F for an escape and a letter, and others each byte of these for a character; a name need not
+// be text.
+bool isOrder(char32_t code)
 {
-    return static_cast<unsigned char>(text[at]);
-}
-
-// From U+0080 to U+009F, of which some terminals take one for an escape and a letter.
-bool isHighControl(std::string_view text, std::size_t at)
-{
-    return at + 1 < text.size() && byteAt(text, at) == 0xC2 && byteAt(text, at + 1) >= 0x80 &&
-           byteAt(text, at + 1) <= 0x9F;
-}
-
-// What a file is called must not steer the terminal.
-bool isOrder(std::string_view text, std::size_t at)
-{
-    return byteAt(text, at) < ' ' || byteAt(text, at) == 0x7F || isHighControl(text, at) ||
-           (at > 0 && isHighControl(text, at - 1));
+    constexpr char32_t kDelete = 0x7F;
+    constexpr char32_t kLastControl = 0x9F;
+    return code < U' ' || (code >= kDelete && code <= kLastControl);
 }
 
 // A line in pieces, made without memory of the system.
@@ -49,9 +40,15 @@ class Line
 public:
     void add(std::string_view text)
     {
-        const std::size_t count = std::min(text.size(), mBytes.size() - 1 - mLength);
-        for (std::size_t at = 0; at < count; ++at)
-            mBytes[mLength++] = isOrder(text, at) ? '?' : text[at];
+        text = text.substr(0, mBytes.size() - 1 - mLength);
+        for (std::size_t at = 0; at < text.size();)
+        {
+            const std::size_t start = at;
+            const auto code = takeUtf8(text, at);
+            const bool isShown = code && !isOrder(*code);
+            for (const char byte : text.substr(start, at - start))
+                mBytes[mLength++] = isShown ? byte : '?';
+        }
     }
     void print()
     {

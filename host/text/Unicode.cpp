@@ -44,21 +44,6 @@ wchar_t foldOne(wchar_t character)
     return static_cast<wchar_t>(u_foldCase(static_cast<UChar32>(character), U_FOLD_CASE_DEFAULT));
 }
 
-// The character at the position, which moves past what was read; past one byte only when it is not UTF-8.
-wchar_t takeCharacter(std::string_view utf8, std::size_t& position)
-{
-    const auto first = static_cast<unsigned char>(utf8[position]);
-    std::size_t next = position;
-    UChar32 code = 0;
-#pragma GCC diagnostic push
-#pragma GCC diagnostic ignored "-Wconversion" // the macro keeps a difference of bytes in a byte
-    U8_NEXT(utf8, next, utf8.size(), code);
-#pragma GCC diagnostic pop
-    const bool isText = code >= 0 && !isByte(static_cast<char32_t>(code));
-    position = isText ? next : position + 1;
-    return static_cast<wchar_t>(isText ? static_cast<char32_t>(code) : kByte | first);
-}
-
 void append(std::string& utf8, char32_t code)
 {
     if (isByte(code))
@@ -100,12 +85,28 @@ Encoded encoded(std::wstring_view text)
 }
 } // namespace
 
+std::optional<char32_t> takeUtf8(std::string_view utf8, std::size_t& position) noexcept
+{
+    std::size_t next = position;
+    UChar32 code = 0;
+#pragma GCC diagnostic push
+#pragma GCC diagnostic ignored "-Wconversion" // the macro keeps a difference of bytes in a byte
+    U8_NEXT(utf8, next, utf8.size(), code);
+#pragma GCC diagnostic pop
+    const bool isText = code >= 0 && !isByte(static_cast<char32_t>(code));
+    position = isText ? next : position + 1;
+    return isText ? std::optional(static_cast<char32_t>(code)) : std::nullopt;
+}
+
 std::wstring toWide(std::string_view utf8)
 {
     const auto rest = endOfAscii(utf8);
     std::wstring text(utf8.begin(), rest);
     for (std::size_t position = text.size(); position < utf8.size();)
-        text += takeCharacter(utf8, position);
+    {
+        const auto first = static_cast<unsigned char>(utf8[position]);
+        text += static_cast<wchar_t>(takeUtf8(utf8, position).value_or(kByte | first));
+    }
     return text;
 }
 

@@ -6,6 +6,8 @@
 // would do as well, were they not refused by the platform's strings.
 #pragma once
 
+#include <cstddef>
+#include <optional>
 #include <string>
 #include <string_view>
 
@@ -16,6 +18,10 @@ std::wstring toWide(std::u16string_view utf16);
 // What is no character at all becomes U+FFFD.
 std::string toUtf8(std::wstring_view text);
 std::u16string toUtf16(std::wstring_view text);
+
+// The character that begins at the position, which moves past it; nothing, and past one byte, where the bytes
+// are no text. Safe in a signal handler.
+std::optional<char32_t> takeUtf8(std::string_view utf8, std::size_t& position) noexcept;
 
 // The text for a person's eyes: bytes that are no text are written as escapes, \xFF.
 std::wstring withReadableBytes(std::wstring_view text);

@@ -107,6 +107,21 @@ TEST(LastWordsOf, AnApplicationCalledByOrdersToTheTerminalAreReadable)
                 HasSubstr("The application \"" + folder + "/segv-??31m??[1m????\xC2\xA0\xC3\x9B.zmb\" has "));
 }
 
+// The name of a file need not be text. Alone, such a byte is an order to a terminal of one byte a character.
+TEST(LastWordsOf, AnApplicationCalledByBytesThatAreNoTextAreReadable)
+{
+    const HostSession session;
+    const std::string folder = session.folder().path().string();
+    const auto last = deadly(session, "segv");
+    const std::string path = folder + "/segv-\x9B"
+                                      "31m\xC3\xE2\x82\xFF\xE2\x82\xAC\xF0\x9F\x98\x80\xE2\x80.zmb";
+    std::filesystem::copy_file(last, path);
+    const auto result = session.start({"-c", "LOAD \"" + path + "\""});
+    EXPECT_EQ(result.exitStatus, -SIGSEGV);
+    EXPECT_THAT(result.output, HasSubstr("The application \"" + folder +
+                                         "/segv-?31m????\xE2\x82\xAC\xF0\x9F\x98\x80??.zmb\" has "));
+}
+
 TEST(LastWordsOf, AChildThatEndsAreNone)
 {
     const HostSession session;
