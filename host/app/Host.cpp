@@ -50,12 +50,14 @@ bool Host::start()
 
 void Host::judgeEarlierSessions()
 {
-    const bool givesTrials = !mOptions.safe;
+    // A search compares starts: nothing else is to change from one to the next.
+    const bool givesTrials = !mOptions.safe && !mParts->bisecting.isGoingOn();
     for (const auto& sentence : mParts->keptOut.begin(mParts->marker->leftovers(), givesTrials))
         mCommandLine.say(sentence);
     if (mParts->keptOut.isStored())
         mParts->marker->forgetLeftovers();
-    for (const auto& line : mParts->bisecting.sentencesAtStart())
+    for (const auto& line : mParts->bisecting.sentencesAtStart([this](const std::string& suspect)
+                                                               { return mParts->admission.whyOut(suspect); }))
         mCommandLine.say(line);
 }
 
@@ -92,8 +94,6 @@ Result<> Host::makeParts()
     return {};
 }
 
-Result<> Host::prepareProfileFolder()
-{
 // The other parts have read it by now, and what they did not find is mostly why nothing can be stored.
 void Host::tellOfRegistry()
 {
@@ -106,6 +106,8 @@ void Host::tellOfRegistry()
         mCommandLine.say(registry.notice());
 }
 
+Result<> Host::prepareProfileFolder()
+{
     if (mOptions.profileFolder.empty())
         return Failure{
             L"Tessel does not know where to keep its profile: HOME is not set, and no folder was given."};

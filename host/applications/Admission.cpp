@@ -1,9 +1,11 @@
 #include "host/applications/Admission.h"
 
 #include <algorithm>
+#include <utility>
 
 #include "host/applications/Bisecting.h"
 #include "host/applications/KeptOut.h"
+#include "host/platform/RealPath.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -68,6 +70,26 @@ std::wstring Admission::whyKeptOut(const std::wstring& path) const
     if (known && known->isOut())
         return reasonOf(*known);
     return mBisecting.keepsOut(toUtf8(path)) ? L"kept out at this start by BISECT" : L"";
+}
+
+std::wstring Admission::whyOut(const std::string& path) const
+{
+    const std::wstring reason = whyKeptOut(toWide(path));
+    return reason.empty() ? reason : L"is " + reason;
+}
+
+std::function<std::wstring(const std::string&)> Admission::whyNotLetIn() const
+{
+    std::set<std::string> letIn;
+    for (const std::string& path : mAskedFor)
+        letIn.insert(realPath(path).native());
+    return [this, letIn = std::move(letIn)](const std::string& path) -> std::wstring
+    {
+        if (letIn.contains(path))
+            return {};
+        const std::wstring reason = whyOut(path);
+        return reason.empty() ? L"was kept out of this start or not asked for" : reason;
+    };
 }
 
 void Admission::noteLoaded(const std::wstring& path) const

@@ -38,6 +38,11 @@ public:
     Result<> check(const std::wstring& path);
     // Why the application is kept out at starts, as a part of a sentence; empty for one that is not.
     std::wstring whyKeptOut(const std::wstring& path) const;
+    // The same as the end of a sentence about it: "is kept out ...".
+    std::wstring whyOut(const std::string& path) const;
+    // Once the start is over: tells of a path without links why the application there was not let in by it.
+    // Empty when it was.
+    std::function<std::wstring(const std::string&)> whyNotLetIn() const;
     // Whether this session has not loaded it by itself, or would not have.
     bool keptOutAtStart(const std::wstring& path) const { return mSafe || !whyKeptOut(path).empty(); }
     // What was let in is loaded.

@@ -88,7 +88,7 @@ bool Bisecting::keepsOut(const std::string& path) const
            !mApplied->bisection().isLoaded(static_cast<std::size_t>(found - mApplied->suspects.begin()));
 }
 
-std::vector<std::wstring> Bisecting::sentencesAtStart() const
+std::vector<std::wstring> Bisecting::sentencesAtStart(const WhyNotTried& whyNotTried) const
 {
     if (!mReadAtStart)
         return {mReadAtStart.sentence()};
@@ -101,9 +101,21 @@ std::vector<std::wstring> Bisecting::sentencesAtStart() const
     lines.insert(lines.begin(), L"BISECT keeps " + std::to_wstring(lines.size()) + L" of " +
                                     counted(mApplied->suspects.size(), L" suspect", L" suspects") +
                                     L" out at this start:");
-    lines.push_back(L"Type BISECT GOOD when the trouble is gone, BISECT BAD when it is there; " +
-                    startsLeft(mApplied->bisection()) + L".");
+    const auto tried = checkTried(whyNotTried);
+    lines.push_back(tried ? L"Type BISECT GOOD when the trouble is gone, BISECT BAD when it is there; " +
+                                startsLeft(mApplied->bisection()) + L"."
+                          : tried.sentence());
     return lines;
+}
+
+Result<> Bisecting::checkTried(const WhyNotTried& whyNotTried) const
+{
+    for (const std::string& suspect : mApplied->suspects)
+        if (const std::wstring why = keepsOut(suspect) ? L"" : whyNotTried(suspect); !why.empty())
+            return Failure{L"This session cannot be judged: \"" + toWide(suspect) +
+                           L"\", which was to be loaded, " + why +
+                           L". ENABLE lets in what is kept out, BISECT STOP ends the search."};
+    return {};
 }
 
 Result<std::wstring> Bisecting::begin(const std::vector<std::string>& suspects)
@@ -132,7 +144,7 @@ Result<Bisecting::Search> Bisecting::current() const
     return **std::move(search);
 }
 
-Result<std::wstring> Bisecting::answer(bool wasGood)
+Result<std::wstring> Bisecting::answer(bool wasGood, const WhyNotTried& whyNotTried)
 {
     auto search = current();
     if (!search)
@@ -141,6 +153,8 @@ Result<std::wstring> Bisecting::answer(bool wasGood)
         return Failure{
             L"This session cannot be judged: it was not started with the suspects that are to be tried. "
             L"Start Tessel again, without --safe."};
+    if (auto tried = checkTried(whyNotTried); !tried)
+        return tried.failure();
     search->answers.push_back(wasGood);
     const Bisection bisection = search->bisection();
     const bool isOpen = bisection.verdict() == Bisection::Verdict::kOpen;

@@ -3,6 +3,7 @@
 #pragma once
 
 #include <filesystem>
+#include <functional>
 #include <optional>
 #include <string>
 #include <vector>
@@ -21,14 +22,20 @@ public:
     // so can be judged.
     Bisecting(std::filesystem::path folder, bool applies);
 
+    // Whether this session is one of the search.
+    bool isGoingOn() const { return mApplied.has_value(); }
     // Whether this session keeps the application at that full path out.
     bool keepsOut(const std::string& path) const;
+    // Why a suspect that was to be loaded was not, the end of a sentence; empty when it was. Its session says
+    // nothing about it, and cannot be judged.
+    using WhyNotTried = std::function<std::wstring(const std::string& suspect)>;
+
     // What a person is to be told at the start, line by line.
-    std::vector<std::wstring> sentencesAtStart() const;
+    std::vector<std::wstring> sentencesAtStart(const WhyNotTried& whyNotTried) const;
 
     // Each answers what a person is to be told.
     Result<std::wstring> begin(const std::vector<std::string>& suspects);
-    Result<std::wstring> answer(bool wasGood);
+    Result<std::wstring> answer(bool wasGood, const WhyNotTried& whyNotTried);
     Result<std::wstring> stop();
     Result<std::wstring> tell() const;
 
@@ -46,6 +53,7 @@ private:
     Result<> store(const Search& search) const;
     Result<> forget() const;
     Result<Search> current() const;
+    Result<> checkTried(const WhyNotTried& whyNotTried) const;
 
     std::filesystem::path mFile;
     std::optional<Search> mApplied; // what this session was started with

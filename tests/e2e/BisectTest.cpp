@@ -2,8 +2,10 @@
 #include <gmock/gmock.h>
 
 #include <algorithm>
+#include <csignal>
 
 #include "tests/e2e/Applications.h"
+#include "tests/e2e/HostTerminal.h"
 
 using testing::AllOf;
 using testing::ContainsRegex;
@@ -192,4 +194,147 @@ TEST_F(Bisect, TellsThatItsFileIsDamaged)
     EXPECT_THAT(result.output,
                 AllOf(HasSubstr("The file " + file.string() + " is damaged; "), HasSubstr("a runs"),
                       HasSubstr("b runs"), HasSubstr("No search is going on")));
+}
+
+namespace
+{
+// A search and an application that ends the host, in one start.
+class BisectAndCrash : public Bisect
+{
+protected:
+    // Lisp that ends the host while the flag is there.
+    std::string writeDeadly() const
+    {
+        return write("deadly",
+                     "(when (probe-file \"" + flag.string() + "\") (ext:system \"kill -SEGV $PPID\"))");
+    }
+    void raiseFlag() const { session.folder().write("flag", ""); }
+    void lowerFlag() const { std::filesystem::remove(flag); }
+
+    void expectNotJudged(const std::string& suspect, const std::string& why)
+    {
+        const auto result = session.run({"BISECT GOOD"});
+        EXPECT_EQ(result.exitStatus, 1);
+        EXPECT_THAT(result.output, HasSubstr("This session cannot be judged: \"" + suspect +
+                                             "\", which was to be loaded, " + why));
+        EXPECT_THAT(result.output, Not(HasSubstr("Type BISECT GOOD")));
+        EXPECT_THAT(session.run({"BISECT"}).output, HasSubstr("2 applications are still suspected; "))
+            << "nothing was answered";
+    }
+
+    std::filesystem::path flag = session.folder() / "flag";
+};
+
+constexpr char kTriedOnceMore[] = "\" is tried once more: ";
+} // namespace
+
+TEST_F(BisectAndCrash, LetsATrialWaitUntilTheSearchIsOver)
+{
+    const std::string bad = writeDeadly();
+    raiseFlag();
+    storeSuite(session, {write("a"), write("b"), bad});
+    EXPECT_EQ(session.run({}).exitStatus, -SIGSEGV);
+    EXPECT_THAT(session.run({"BISECT START"}).output, HasSubstr("BISECT searches among 2 applications; "));
+    for (const char* command : {"VERSION", "BISECT STOP"})
+    {
+        const auto result = session.run({command});
+        EXPECT_EQ(result.exitStatus, 0) << result.output;
+        EXPECT_THAT(result.output, AllOf(HasSubstr("BISECT keeps 1 of 2 suspects out"),
+                                         HasSubstr("Cannot load \"" + bad + "\": it is kept out: it ended "),
+                                         Not(HasSubstr(kTriedOnceMore))));
+    }
+    const auto trial = session.run({"VERSION"});
+    EXPECT_EQ(trial.exitStatus, -SIGSEGV);
+    EXPECT_THAT(trial.output, HasSubstr(bad + kTriedOnceMore));
+}
+
+// It was on trial in a session that was killed, and is one of the suspects since.
+TEST_F(BisectAndCrash, DoesNotEndTheTrialOfASuspectThatItKeepsOut)
+{
+    const std::string bad = writeDeadly();
+    raiseFlag();
+    storeSuite(session, {write("a"), bad});
+    EXPECT_EQ(session.run({}).exitStatus, -SIGSEGV);
+    EXPECT_EQ(session.run({}).exitStatus, 0);
+    lowerFlag();
+    {
+        HostTerminal terminal(session);
+        ASSERT_TRUE(terminal.shows(kTriedOnceMore)) << terminal.screen();
+        terminal.type("BISECT START\r");
+        ASSERT_TRUE(terminal.shows("BISECT searches among 2 applications; ")) << terminal.screen();
+        kill(terminal.process(), SIGKILL);
+        EXPECT_EQ(terminal.waitForEnd(), -SIGKILL);
+    }
+    EXPECT_THAT(session.run({"BISECT STOP"}).output, Not(HasSubstr("deadly runs")));
+    raiseFlag();
+    EXPECT_EQ(session.run({}).exitStatus, -SIGSEGV);
+    EXPECT_THAT(session.run({"VERSION"}).output, HasSubstr("It is not loaded by itself any more, until "));
+}
+
+TEST_F(BisectAndCrash, EndsTheTrialOfWhatItLoads)
+{
+    const std::string bad = writeDeadly();
+    raiseFlag();
+    storeSuite(session, {bad, write("a")});
+    EXPECT_EQ(session.run({}).exitStatus, -SIGSEGV);
+    EXPECT_EQ(session.run({}).exitStatus, 0);
+    lowerFlag();
+    {
+        HostTerminal terminal(session);
+        ASSERT_TRUE(terminal.shows(kTriedOnceMore)) << terminal.screen();
+        terminal.type("BISECT START\r");
+        ASSERT_TRUE(terminal.shows("BISECT searches among 2 applications; ")) << terminal.screen();
+        kill(terminal.process(), SIGKILL);
+        EXPECT_EQ(terminal.waitForEnd(), -SIGKILL);
+    }
+    EXPECT_THAT(session.run({"BISECT STOP"}).output, HasSubstr("deadly runs"));
+    raiseFlag();
+    EXPECT_EQ(session.run({}).exitStatus, -SIGSEGV);
+    EXPECT_THAT(session.run({"VERSION"}).output, HasSubstr("tried once more at the next.\n"))
+        << "it was loaded with success in between";
+}
+
+TEST_F(BisectAndCrash, JudgesNoSessionThatKeepsOutWhatWasToBeTried)
+{
+    const std::string bad = writeDeadly();
+    begin({bad, write("a")});
+    raiseFlag();
+    EXPECT_EQ(session.run({"VERSION"}).exitStatus, -SIGSEGV);
+    expectNotJudged(bad, "is kept out: it ended Tessel ");
+    lowerFlag();
+    EXPECT_EQ(session.run({"ENABLE " + bad}).exitStatus, 0);
+    EXPECT_THAT(session.run({"BISECT GOOD"}).output,
+                AllOf(HasSubstr("deadly runs"), HasSubstr("1 application is still suspected; ")));
+}
+
+TEST_F(BisectAndCrash, JudgesNoSessionInWhichThePersonKeepsOutWhatWasToBeTried)
+{
+    const std::string a = write("a");
+    begin({a, write("b")});
+    session.run({"DISABLE " + a});
+    expectNotJudged(a, "is kept out at starts by DISABLE since ");
+}
+
+// What loads the suspects is kept out itself.
+TEST_F(BisectAndCrash, JudgesNoSessionInWhichNobodyAskedForWhatWasToBeTried)
+{
+    const std::string a = write("a");
+    begin({a, write("b")});
+    session.run({"DISABLE Modrig.bundle"});
+    const auto result = session.run({"BISECT BAD"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output,
+                HasSubstr("This session cannot be judged: \"" + a +
+                          "\", which was to be loaded, was kept out of this start or not asked for. "));
+}
+
+TEST_F(BisectAndCrash, JudgesASessionAfterACrashOfWhatIsNoSuspect)
+{
+    begin({write("a"), write("b")});
+    const std::string bad = deadly(session, "abort");
+    EXPECT_EQ(session.run({"LOAD " + bad}).exitStatus, -SIGABRT);
+    const auto result = session.run({"BISECT GOOD"});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, AllOf(HasSubstr("The application \"" + bad + "\" ended Tessel "),
+                                     HasSubstr("1 application is still suspected; ")));
 }
