@@ -5,13 +5,13 @@
 
 namespace ModrigUtils
 {
-// What a dialog can do towards loading, and what it knows; all of it is there.
+// What a dialog knows and can do about loading. None of the functions may be missing.
 struct LoadSteps
 {
     // Whether any files are chosen, now.
     std::function<bool()> hasChosenFiles;
-    // Tells of a file that the person has typed the name of and that is not there; false when there is no such
-    // name.
+    // Tells of a file that the person has typed the name of and that is not there; false when there is no
+    // such name.
     std::function<bool()> tellsOfMissingFile;
     // Chooses the files that still show as selected, or says that there are none.
     std::function<void()> chooseWhatIsStillSelected;

@@ -21,12 +21,30 @@ struct NotingDialog
     std::vector<std::string> pressLoad()
     {
         LoadSteps steps;
-        steps.hasChosenFiles = [this] { return hasChosenFiles; };
-        steps.tellsOfMissingFile = [this] { return hasNameOfNoFile && note("told"); };
-        steps.chooseWhatIsStillSelected = [this] { note("chosen"); };
-        steps.goesIntoHostFolder = [this] { return hasHostFolderOnly && note("gone into folder"); };
-        steps.loadChosenFiles = [this] { note("loaded"); };
-        steps.rememberFolder = [this] { note("remembered"); };
+        steps.hasChosenFiles = [this]
+        {
+            return hasChosenFiles;
+        };
+        steps.tellsOfMissingFile = [this]
+        {
+            return hasNameOfNoFile && note("told");
+        };
+        steps.chooseWhatIsStillSelected = [this]
+        {
+            note("chosen");
+        };
+        steps.goesIntoHostFolder = [this]
+        {
+            return hasHostFolderOnly && note("gone into folder");
+        };
+        steps.loadChosenFiles = [this]
+        {
+            note("loaded");
+        };
+        steps.rememberFolder = [this]
+        {
+            note("remembered");
+        };
         PressLoad(steps);
         return done;
     }
