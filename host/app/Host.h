@@ -56,8 +56,8 @@ public:
     // the registry is stored, and the queued Lisp is evaluated; a store that fails makes the line fail.
     bool run(const std::wstring& input) override;
 
-    // Runs a file of lines as if typed. Scripts may run scripts, as deep as a sensible one reaches. Fails
-    // without a sentence when a line of it did: each has been told.
+    // Runs a file of lines as if typed. Scripts may run scripts, to a sensible depth. Fails without a
+    // sentence when a line of it did: each has been told.
     Result<> runScript(const std::filesystem::path& script);
 
     // Unloads every application, stores the registry, and takes the parts down.

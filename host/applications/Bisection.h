@@ -2,9 +2,9 @@
 // says after each whether the trouble was there.
 //
 // At each start half of those that are still suspected are loaded, and none of the other suspects: trouble is
-// then the loaded half's. The last start tells the one that is left from no application at all (nothing is
-// loaded) or from several together (it is loaded alone). That makes log2(n) starts, rounded up, and one more.
-// Trouble without any cause but each of two makes is found with one of them.
+// then the loaded half's. The last start makes sure of the one that is left: without any application the
+// trouble must be gone, or with this one alone it must be there. That makes log2(n) starts, rounded up, and
+// one more. Where each of two applications makes trouble by itself, one of them is found.
 #pragma once
 
 #include <cstddef>

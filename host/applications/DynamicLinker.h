@@ -2,8 +2,8 @@
 //
 // Which application it is, is decided by the file, not by how its path is spelled: a link to a loaded file is
 // loaded too. What a bundle maps is its program, so a bundle and the program inside it are the same
-// application. A file that was replaced since it was loaded, as every build does, is told by where its path
-// and the loaded one lead.
+// application. A file that was replaced after it was loaded, as every build does, is recognised by where its
+// path and the loaded one lead.
 //
 // An application that has answered message 2 is unloaded even if the system keeps its library mapped: it has
 // given everything back, so it is listed no more and its commands are gone. That its code stays in memory is
@@ -39,7 +39,7 @@ public:
     };
 
     // Says on the command line why something failed, tells `calls` whose entry point runs, takes the commands
-    // of what goes out of `commands`, gives the message box its detail, and notes how loading came off. Loads
+    // of what goes out of `commands`, gives the message box its detail, and notes how loading went. Loads
     // what `admission` does not refuse.
     DynamicLinker(CommandLine& commandLine, CallingApplication& calls, CommandStack& commands,
                   MessageBox& messageBox, LoadOutcomes& outcomes, Admission& admission);

@@ -4,8 +4,8 @@
 // What ended the host is kept out at the next start, and tried once more at the one after that: a power cut
 // must not cost an application for good. If it ends the host again, it stays out until a person loads it with
 // success or lets it in, or until its file is another one. An application on trial is forgotten here when the
-// session that tries it ends in good order, whether it was loaded or not: of what nothing loads by itself no
-// more can be learnt.
+// session that tries it ends in good order, whether it was loaded or not: nothing more can be learnt of an
+// application that nothing loads by itself.
 //
 // All of it stands in a text file of the profile, which several sessions may change.
 #pragma once
@@ -54,7 +54,7 @@ class KeptOut
 public:
     static constexpr char kFileName[] = "kept-out"; // in its folder
 
-    // Keeps nothing out, and nothing in mind.
+    // Keeps nothing out and stores nothing.
     KeptOut() = default;
     // Of the folder, which is there; a file that is damaged is left as it is, and nothing is kept out.
     explicit KeptOut(std::filesystem::path folder);

@@ -1,4 +1,4 @@
-// How loading came off in this session, file by file: for APPS, and for the summary of the start.
+// How loading went in this session, file by file: for APPS, and for the summary of the start.
 #pragma once
 
 #include <chrono>

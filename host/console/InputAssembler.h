@@ -1,4 +1,4 @@
-// Makes whole inputs of typed lines: one line for a command, as many as it takes for Lisp.
+// Makes whole inputs out of typed lines: one line for a command, as many as it takes for Lisp.
 #pragma once
 
 #include <optional>

@@ -13,9 +13,9 @@ namespace tessel
 // As many lines the arrow keys bring back.
 inline constexpr std::size_t kMostHistoryLines = 1000;
 
-// Sessions that run at the same time add to the same file, a line each time: none takes away another's, and
-// a session that is killed has kept what was typed. What the file fails at is answered once; from then on
-// this session neither reads nor writes it, and keeps quiet.
+// Sessions that run at the same time add to the same file, a line each time: none loses another's, and a
+// session that is killed has kept what was typed. The first failure is answered; after it this session
+// neither reads nor writes the file, and says no more about it.
 class TypedHistory
 {
 public:

@@ -1,4 +1,4 @@
-// What the host tells applications of itself, and their road to remote files.
+// What the host tells applications of itself, and their way to remote files.
 #pragma once
 
 #include <string>

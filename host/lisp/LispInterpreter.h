@@ -30,7 +30,7 @@ public:
     {
         bool removingTsLisp = true;       // compiled and packaged Lisp can be loaded
         std::size_t heapBytes = 0;        // memory for Lisp's objects; 0: as much as is usual
-        LoadOutcomes* outcomes = nullptr; // where it is noted how loading files came off
+        LoadOutcomes* outcomes = nullptr; // where it is noted how loading files went
         Admission* admission = nullptr;   // of files, if it is to be asked; it marks them, too
     };
 

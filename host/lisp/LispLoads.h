@@ -1,5 +1,5 @@
-// How loading files of Lisp comes off, seen from outside: which file an expression loads, and what becomes of
-// it. Files load others, and may catch the errors of those.
+// How loading Lisp files goes, seen from outside: which file an expression loads, and what becomes of it.
+// Files load others, and may catch the errors of those.
 #pragma once
 
 #include <string>
@@ -12,7 +12,7 @@ namespace tessel
 class LispLoads
 {
 public:
-    // What it finds out it notes there, if anywhere.
+    // Notes there what it finds out; null: nowhere.
     explicit LispLoads(LoadOutcomes* outcomes) : mOutcomes(outcomes) {}
 
     // An expression begins, and ends with this result. Answers the code that was noted of the file that it

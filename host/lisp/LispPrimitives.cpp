@@ -25,7 +25,7 @@ struct Connection
     std::thread::id thread;
     LispOutput output;
     Result<LispFile> file = LispFile();
-    Result<> hostCode; // how the host's own code came off
+    Result<> hostCode; // how the host's own code ended
 };
 
 Connection& connection()

@@ -1,4 +1,5 @@
-// What applications and the platform leave to be released later goes at the end of a scope. These nest.
+// What applications and the platform leave to be released later is released at the end of a scope. These
+// nest.
 #pragma once
 
 namespace tessel

@@ -1,4 +1,4 @@
-// By what an application's file is known again: whether it is still the one that it was.
+// Facts by which an application's file is recognised: whether it is still the same one.
 //
 // For a bundle these are facts about everything in it. Nothing is opened but for the hash.
 #pragma once
@@ -12,7 +12,7 @@ namespace tessel
 struct FileFacts
 {
     std::uint64_t size = 0;
-    std::int64_t contentTime = 0; // nanoseconds of the calendar, as the next
+    std::int64_t contentTime = 0; // nanoseconds of the calendar; so is the next
     std::int64_t statusTime = 0;
     std::uint64_t inode = 0;
 

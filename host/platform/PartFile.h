@@ -11,11 +11,11 @@
 namespace tessel
 {
 // Nobody else can have made the file, and only the person can read it. A part that has not taken its place is
-// removed at the end; what a killed process leaves is told from what a running one writes by its lock.
+// removed at the end; a lock tells what a running process writes from what a killed one has left.
 class PartFile
 {
 public:
-    // In that folder, which is on the same file system as the place to be.
+    // In that folder, which is on the same file system as the place where the file will stand.
     explicit PartFile(const std::filesystem::path& folder);
     ~PartFile();
     PartFile(const PartFile&) = delete;
@@ -26,7 +26,7 @@ public:
 
     bool write(std::string_view bytes);
 
-    // As is usual for new files of the person's; without it nobody else can read it.
+    // Gives others the right to read it, as is usual for the person's new files.
     bool letOthersRead();
 
     // Puts it in place of what stands there: from then on all of it is on the disk, by that name. Fails with

@@ -15,7 +15,7 @@ class LongWork
 public:
     using Say = std::function<void(const std::wstring& sentence)>;
 
-    // What says how far it has come, about so often; nobody at first.
+    // Says from time to time how far the work has come; until this is called, nobody does.
     void tellBy(Say say) { mSay = std::move(say); }
 
     // One value more.

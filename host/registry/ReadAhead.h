@@ -1,6 +1,6 @@
 // A list is read value by value, in the order in which it was stored: the row that is asked for next lies
-// beside the one that was read last, and is had by a step instead of a search from the root of an index. Used
-// by the Registry alone.
+// beside the one that was read last, and is reached by a step instead of a search from the root of an index.
+// Used by the Registry alone.
 #pragma once
 
 #include <cstdint>

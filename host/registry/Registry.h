@@ -103,7 +103,7 @@ public:
     Result<> keepCopy();
 
     // Puts the copy in the place of a registry that is damaged, and reads it from now on. Answers a sentence
-    // about it. Nothing can be stored before the next session: what applications have read is of before.
+    // about it. Nothing can be stored before the next session: what applications have read is older.
     Result<std::wstring> restoreCopy();
 
     // Says by this how far a command has come that reads or writes very many values.

@@ -18,8 +18,9 @@ inline constexpr int kVersionWithoutChecksums = 1;
 // Answers the store's status.
 int addChecksum(sqlite3* database);
 
-// Whether the tables are those of this version and nothing stands beside them: what a stranger has put there,
-// a trigger say, could run with the next write. Why not is the end of a sentence; the codes are the store's.
+// Whether the tables are those of this version and nothing stands beside them: what somebody else has put
+// there, such as a trigger, could run with the next write. Why not is the end of a sentence; the codes are
+// the store's.
 Result<> checkTables(sqlite3* database, int version);
 
 // Makes the tables in a file that is empty, unless another process has by now; or gives the rows of an older

@@ -21,7 +21,7 @@ std::wstring helpAgainstDamage(const std::filesystem::path& file);
 // When the copy was made, in local time: "2026-11-22 09:41".
 std::wstring timeOfCopy(const std::filesystem::path& file);
 
-// Makes the copy from what is stored in the open registry now. The one of before stays until the new one is
+// Makes the copy from what is stored in the open registry now. The earlier copy stays until the new one is
 // wholly on the disk. The failure is the end of a sentence.
 Result<> makeSoundCopy(sqlite3* database, const std::filesystem::path& file);
 

@@ -74,7 +74,7 @@ public:
         }
     }
 
-    // As `Load` and `Format`, for who goes on with an empty text where the id is missing.
+    // As `Load` and `Format`, for callers that go on with an empty text where the id is missing.
     [[nodiscard]] static CStdStr OfId(unsigned id)
     {
         CStdStr text;

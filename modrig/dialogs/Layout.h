@@ -6,7 +6,7 @@
 
 namespace ModrigUtils
 {
-// The window opens where it was closed, as far as the screen allows; where it likes the first time.
+// The window opens where it was closed, as far as the screen allows; the first time where the system puts it.
 void RestoreFrame(NSWindow* window, TsUIPersistentStore* settings, NSString* name);
 void StoreFrame(NSWindow* window, TsUIPersistentStore* settings, NSString* name);
 

@@ -33,7 +33,7 @@
 // What Load will load: `ModrigFilePath`s, from the panel's selection or the History's.
 @property (nonatomic, retain) NSMutableArray* selectedFiles;
 @property (nonatomic, assign) BOOL saveHistory;
-// 0 loaded applications, 1 History.
+// `kLoadedApplicationsTab` or `kHistoryTab` (model/ShownTab.h).
 @property (nonatomic, assign) NSInteger tabViewSelectedIndex;
 @property (nonatomic, assign) BOOL canUnloadApp;
 @property (nonatomic, assign) BOOL canRemoveHistory;
@@ -92,9 +92,8 @@
 - (IBAction)onStartupSuits:(id)sender;
 - (IBAction)onHelp:(id)sender;
 
-// Every road into loading goes through here. Loads the `ModrigFilePath`s in order, up to the first that
-// fails, with rows for those newly loaded. `successedApps` (or nil) receives those that are loaded now, newly
-// or since before.
+// All loading goes through here. Loads the `ModrigFilePath`s in order, up to the first that fails, with rows
+// for those newly loaded. `successedApps` (or nil) receives those that are loaded now, newly or since before.
 - (void)loadApps:(NSArray*)files
        successedApps:(NSMutableArray*)successedApps
     addToStartupSuit:(BOOL)addToStartupSuit;

@@ -22,7 +22,7 @@
 - (void)onAdd;
 - (void)onRemove;
 
-// Loads the files (path strings), up to 50 of them, that the Suite has not got, and takes them into it.
+// Loads the files (path strings), up to 50 of them, that are not in the Suite, and takes them into it.
 - (void)addFiles:(NSArray*)paths;
 
 - (void)tableViewSelectionDidChange:(NSNotification*)notification;

@@ -1,5 +1,5 @@
 // A table of the dialogs as a person expects one: keys, a menu on its rows, going to a row by its first
-// letters. What can be done with the rows is its owner's: its delegate.
+// letters. Its owner, the delegate, knows what can be done with the rows.
 #pragma once
 
 #import <AppKit/AppKit.h>

@@ -6,6 +6,6 @@
 namespace ModrigUtils
 {
 // Moves the entry of the path to the other side of its neighbour's: before it, if it came after it, and the
-// other way round. Answers false, with nothing changed, when the Suite has not got both.
+// other way round. Answers false, with nothing changed, when they are not both in the Suite.
 [[nodiscard]] bool MoveInStartupSuite(const CStdStr& path, const CStdStr& neighbour);
 } // namespace ModrigUtils

@@ -31,7 +31,7 @@ inline constexpr signed char kUnload = 0;
 // refused with kCannotLoadFile.
 [[nodiscard]] bool LoadApplication(CStdStr path, signed char load, signed char loadAll);
 
-// The two roads of `LoadApplication`.
+// The two ways in which `LoadApplication` loads and unloads.
 [[nodiscard]] bool LoadQMBFile(CStdStr path, signed char load);
 [[nodiscard]] bool LoadLispFile(CStdStr path, signed char load, signed char loadAll);
 } // namespace ModrigUtils

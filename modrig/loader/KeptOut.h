@@ -1,4 +1,4 @@
-// The applications that the host does not load by itself, in a host that tells.
+// The applications that the host does not load by itself, in a host that can tell.
 #pragma once
 
 #include "modrig/base/CStdStr.h"

@@ -1,4 +1,4 @@
-// Loading several files in one go: the one road by which every dialog action loads.
+// Loading several files in one go: the one way in which every dialog action loads.
 #pragma once
 
 #include <functional>
@@ -26,7 +26,7 @@ struct LoadBatch
     std::function<void(std::size_t index)> added;
 
     // Asked between two files, with how many are done; may be empty. True ends the batch there, and nothing
-    // is said about it: who has stopped it knows.
+    // is said about it: whoever stopped it knows.
     std::function<bool(std::size_t done)> isStopped;
 };
 

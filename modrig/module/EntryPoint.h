@@ -4,8 +4,8 @@
 #include <tessel/tsrx.h>
 
 // Called by the host. Message 1 loads: TSRX_RET_ERROR, with nothing done, when the resource module is missing
-// or the module is loaded already. Message 2 releases the resource module; the lists live on and the command
-// stays, for the host ends both. Every other message is ignored.
+// or the module is loaded already. Message 2 releases the resource module; the lists and the command stay,
+// because the host ends both. Every other message is ignored.
 extern "C" TESSEL_EXPORT int tsrxEntryPoint(unsigned message, void* application);
 
 // Start-up: Startup Suite, History, command, demand-load record.

@@ -7,12 +7,12 @@
 #include "tsdefs.h"
 
 // A descriptor that can be read from as soon as the session is to end: the person has left it, or the system
-// asks the program to end. -1 outside of a session. A loop waits for it, too, does not begin anything new
-// when it speaks, and returns soon. It is the host's: nobody reads from it or closes it.
+// asks the program to end. -1 outside of a session. A loop waits for it, too, begins nothing new once it can
+// be read from, and returns soon. It is the host's: nobody reads from it or closes it.
 TESSEL_API int tsrxEndRequest();
 
 // Called before each wait for the person. What was written to the registry since the last call, or since the
-// command began, is stored now, so that no other session has to wait for somebody who has gone to lunch.
+// command began, is stored now, so that no other session has to wait for somebody who has gone away.
 //
 // `actionIsOver`: when something could not be stored, one sentence says so, and what is written from now on
 // is tried again. Otherwise the wait is a question in the midst of an action, and a failure lasts: what is

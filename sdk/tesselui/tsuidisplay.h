@@ -12,6 +12,7 @@ TESSEL_API bool tsuiHasDisplay();
 // said so.
 TESSEL_API bool tsuiPrepareWindows();
 
-// Brings the screen up to date and keeps it so until now. Called when a command has closed its windows: the
-// host goes back to waiting for the terminal, and a window would otherwise stay on the screen.
+// Called when a command has closed its windows: deals with the events that have come until now, and draws
+// what is still to be drawn. The host goes back to waiting for the terminal, and a window would otherwise
+// stay on the screen.
 TESSEL_API void tsuiFinishWindows();

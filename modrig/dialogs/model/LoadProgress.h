@@ -12,8 +12,8 @@ public:
 
     explicit LoadProgress(Time start);
 
-    // Whether it is time to look for the key that stops the load. Every look costs more than many a file, so
-    // there are not many of them; short loads see none.
+    // Whether it is time to look for the key that stops the load. A look costs more than loading most files
+    // does, so there are not many of them; short loads see none.
     [[nodiscard]] bool IsTimeToLook(Time now);
 
     // Whether it is time to say how far the load has come: after a second, and then a few times a second.

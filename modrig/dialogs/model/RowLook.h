@@ -30,8 +30,8 @@ struct RowFacts
 // All but usable rows are shown in grey.
 [[nodiscard]] RowState StateOf(TableKind kind, const RowFacts& facts);
 
-// The key of the text that says why a row is grey; null for one that is not, and where the host has the
-// words.
+// The key of the text that says why a row is grey; null for one that is not, and for one that is kept out:
+// the host says why.
 [[nodiscard]] const char* ReasonKey(RowState state);
 
 // The text itself when it fits, or as much of its beginning as fits with an ellipsis after it. `fits` answers

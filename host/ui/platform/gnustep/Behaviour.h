@@ -1,5 +1,5 @@
-// How the toolkit behaves here where left alone it would behave otherwise. Each is called once: the first
-// before the application object is made, the others after it, before the first window.
+// Where the toolkit is made to behave otherwise than it does by itself. Each is called once: the first before
+// the application object is made, the others after it, before the first window.
 #pragma once
 
 namespace tessel::windowing

@@ -5,8 +5,9 @@
 
 namespace tessel::windowing
 {
-// Made for this user only, in the folder for temporary files, and removed when its owner goes. What sessions
-// left there that were killed is removed too: the system lets go of their lock, by which the living are told.
+// Made for this user only, in the folder for temporary files, and removed when its owner goes. What killed
+// sessions left there is removed too: a session that runs holds a lock, and the system releases that of one
+// that is gone.
 class SessionFolder
 {
 public:

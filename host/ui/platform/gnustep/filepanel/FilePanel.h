@@ -1,8 +1,8 @@
 // The host's own file panel: a table of the files of one folder, the way to that folder, and a field for
 // names.
 //
-// It has the interface of the toolkit's panel and none of its inside. What it decides without a window is in
-// the plain files beside it; this class puts them together. Main thread only.
+// It has the interface of the toolkit's panel and nothing of its inside. What it decides without a window is
+// in the plain files beside it; this class puts them together. Main thread only.
 #pragma once
 
 #import <AppKit/AppKit.h>
