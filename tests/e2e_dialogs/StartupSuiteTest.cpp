@@ -87,6 +87,7 @@ TEST_F(DialogStartupSuite, KeepsNothingOutThatIsNotThere)
 {
     const std::string first = writeLisp("first.lsp");
     storeSuite({first});
+    open();
     openSuite();
     std::filesystem::remove(first);
     mScreen.chooseFromMenuAt(mSuite, places::kFirstSuiteRow, places::kKeepOutInSuiteMenu);
