@@ -18,15 +18,21 @@ protected:
         record.setLoadReason(reasons);
         EXPECT_EQ(record.writeToRegistry(false, true), TSRX_APPINFO_OK);
     }
+
+    static void expectIs(const TesselAppInfo& record, const wchar_t* name, const wchar_t* module,
+                         const wchar_t* description, unsigned reasons)
+    {
+        EXPECT_STREQ(record.appName(), name);
+        EXPECT_STREQ(record.moduleName(), module);
+        EXPECT_STREQ(record.description(), description);
+        EXPECT_EQ(record.loadReason(), reasons);
+    }
 };
 
 TEST_F(ApplicationRecordContract, IsEmptyAtFirst)
 {
     const TesselAppInfo record;
-    EXPECT_STREQ(record.appName(), L"");
-    EXPECT_STREQ(record.moduleName(), L"");
-    EXPECT_STREQ(record.description(), L"");
-    EXPECT_EQ(record.loadReason(), 0u);
+    expectIs(record, L"", L"", L"", 0);
 }
 
 TEST_F(ApplicationRecordContract, CopiesItsTexts)
@@ -46,10 +52,7 @@ TEST_F(ApplicationRecordContract, ChangesNothingWhenThereIsNoSuchRecord)
     record.setDescription(L"description");
     record.setLoadReason(TSRX_LOAD_ON_COMMAND);
     EXPECT_EQ(record.readFromRegistry(), TSRX_APPINFO_NOT_FOUND);
-    EXPECT_STREQ(record.appName(), L"ContractNone");
-    EXPECT_STREQ(record.moduleName(), L"/a/tool.bundle");
-    EXPECT_STREQ(record.description(), L"description");
-    EXPECT_EQ(record.loadReason(), TSRX_LOAD_ON_COMMAND);
+    expectIs(record, L"ContractNone", L"/a/tool.bundle", L"description", TSRX_LOAD_ON_COMMAND);
 }
 
 TEST_F(ApplicationRecordContract, ReadsWhatWasWritten)
@@ -58,10 +61,7 @@ TEST_F(ApplicationRecordContract, ReadsWhatWasWritten)
     TesselAppInfo record;
     record.setAppName(L"ContractTool");
     EXPECT_EQ(record.readFromRegistry(), TSRX_APPINFO_OK);
-    EXPECT_STREQ(record.appName(), L"ContractTool");
-    EXPECT_STREQ(record.moduleName(), L"/a/\u00FC tool.bundle");
-    EXPECT_STREQ(record.description(), L"Tool Command Module");
-    EXPECT_EQ(record.loadReason(), kBothReasons);
+    expectIs(record, L"ContractTool", L"/a/\u00FC tool.bundle", L"Tool Command Module", kBothReasons);
 }
 
 TEST_F(ApplicationRecordContract, FindsARecordInAnyLetterCaseAndKeepsItsOwnName)

@@ -198,6 +198,8 @@ TEST_F(Bisect, TellsThatItsFileIsDamaged)
 
 namespace
 {
+constexpr char kTriedOnceMore[] = "\" is tried once more: ";
+
 // A search and an application that ends the host, in one start.
 class BisectAndCrash : public Bisect
 {
@@ -210,6 +212,22 @@ protected:
     }
     void raiseFlag() const { session.folder().write("flag", ""); }
     void lowerFlag() const { std::filesystem::remove(flag); }
+
+    // Brings the deadly one among these two to its trial, in a session that begins a search and is killed.
+    void killASearchOnTrial(const Paths& suite)
+    {
+        raiseFlag();
+        storeSuite(session, suite);
+        EXPECT_EQ(session.run({}).exitStatus, -SIGSEGV);
+        EXPECT_EQ(session.run({}).exitStatus, 0);
+        lowerFlag();
+        HostTerminal terminal(session);
+        ASSERT_TRUE(terminal.shows(kTriedOnceMore)) << terminal.screen();
+        terminal.type("BISECT START\r");
+        ASSERT_TRUE(terminal.shows("BISECT searches among 2 applications; ")) << terminal.screen();
+        kill(terminal.process(), SIGKILL);
+        EXPECT_EQ(terminal.waitForEnd(), -SIGKILL);
+    }
 
     void expectNotJudged(const std::string& suspect, const std::string& why)
     {
@@ -224,8 +242,6 @@ protected:
 
     std::filesystem::path flag = session.folder() / "flag";
 };
-
-constexpr char kTriedOnceMore[] = "\" is tried once more: ";
 } // namespace
 
 TEST_F(BisectAndCrash, LetsATrialWaitUntilTheSearchIsOver)
@@ -251,20 +267,7 @@ TEST_F(BisectAndCrash, LetsATrialWaitUntilTheSearchIsOver)
 // It was on trial in a session that was killed, and is one of the suspects since.
 TEST_F(BisectAndCrash, DoesNotEndTheTrialOfASuspectThatItKeepsOut)
 {
-    const std::string bad = writeDeadly();
-    raiseFlag();
-    storeSuite(session, {write("a"), bad});
-    EXPECT_EQ(session.run({}).exitStatus, -SIGSEGV);
-    EXPECT_EQ(session.run({}).exitStatus, 0);
-    lowerFlag();
-    {
-        HostTerminal terminal(session);
-        ASSERT_TRUE(terminal.shows(kTriedOnceMore)) << terminal.screen();
-        terminal.type("BISECT START\r");
-        ASSERT_TRUE(terminal.shows("BISECT searches among 2 applications; ")) << terminal.screen();
-        kill(terminal.process(), SIGKILL);
-        EXPECT_EQ(terminal.waitForEnd(), -SIGKILL);
-    }
+    killASearchOnTrial({write("a"), writeDeadly()});
     EXPECT_THAT(session.run({"BISECT STOP"}).output, Not(HasSubstr("deadly runs")));
     raiseFlag();
     EXPECT_EQ(session.run({}).exitStatus, -SIGSEGV);
@@ -273,20 +276,7 @@ TEST_F(BisectAndCrash, DoesNotEndTheTrialOfASuspectThatItKeepsOut)
 
 TEST_F(BisectAndCrash, EndsTheTrialOfWhatItLoads)
 {
-    const std::string bad = writeDeadly();
-    raiseFlag();
-    storeSuite(session, {bad, write("a")});
-    EXPECT_EQ(session.run({}).exitStatus, -SIGSEGV);
-    EXPECT_EQ(session.run({}).exitStatus, 0);
-    lowerFlag();
-    {
-        HostTerminal terminal(session);
-        ASSERT_TRUE(terminal.shows(kTriedOnceMore)) << terminal.screen();
-        terminal.type("BISECT START\r");
-        ASSERT_TRUE(terminal.shows("BISECT searches among 2 applications; ")) << terminal.screen();
-        kill(terminal.process(), SIGKILL);
-        EXPECT_EQ(terminal.waitForEnd(), -SIGKILL);
-    }
+    killASearchOnTrial({writeDeadly(), write("a")});
     EXPECT_THAT(session.run({"BISECT STOP"}).output, HasSubstr("deadly runs"));
     raiseFlag();
     EXPECT_EQ(session.run({}).exitStatus, -SIGSEGV);
