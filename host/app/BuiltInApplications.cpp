@@ -18,6 +18,7 @@ namespace
 constexpr std::size_t kNameColumn = 24;
 constexpr std::size_t kFolderColumn = 48;
 constexpr std::size_t kAnyLength = std::numeric_limits<std::size_t>::max();
+constexpr bool kResolveNow = true;
 constexpr std::array kLispExtensions = {L".lsp", L".qbc"};
 
 bool isLispFile(const std::wstring& path)
@@ -76,9 +77,8 @@ Result<> load(Parts& parts, const CommandStack::Arguments& arguments)
     const std::wstring& path = *file;
     if (isLispFile(path))
         return loadLisp(parts, path);
-    if (!parts.linker->loadModule(path.c_str(), true, true))
-        return Failure{}; // the linker has said why
-    return succeed(parts, path + L" is loaded.");
+    auto loaded = parts.linker->load(path, kResolveNow);
+    return loaded ? succeed(parts, path + L" is loaded.") : loaded;
 }
 
 Result<> unload(Parts& parts, const CommandStack::Arguments& arguments)
@@ -91,8 +91,11 @@ Result<> unload(Parts& parts, const CommandStack::Arguments& arguments)
     // The name alone is enough for what is loaded.
     const std::wstring loaded = parts.linker->pathOfModule(arguments.front());
     const std::wstring module = loaded.empty() ? path : loaded;
-    if (!parts.linker->unloadModule(module.c_str(), true))
-        return Failure{}; // the linker has said why
+    const auto unloaded = parts.linker->unload(module);
+    if (!unloaded)
+        return unloaded.failure();
+    if (!unloaded->empty())
+        sayLine(parts, *unloaded);
     return succeed(parts, module + L" is unloaded.");
 }
 

@@ -83,7 +83,7 @@ struct Parts
     Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands,
                                 *messageBox,  loadOutcomes,        admission};
     Owned<ApplicationRecords> records{*registry, *commands, *callingApplication, kProductRegistryRoot};
-    DemandLoading demandLoading{layout.plugIns, *records, *linker, admission};
+    DemandLoading demandLoading{layout.plugIns, *records, *linker, admission, *commandLine};
     Owned<Document> document;
     Owned<FileSearch> files{layout.resources, *variables};
     Owned<RemoteFiles> remote{foundations.profileFolder / "remote-files", foundations.downloads,

@@ -11,13 +11,13 @@
 #include "host/applications/ApplicationRecords.h"
 #include "host/applications/DynamicLinker.h"
 #include "host/platform/RealPath.h"
+#include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
 {
 namespace
 {
-constexpr bool kSayWhyNot = true;
 constexpr bool kResolveNow = true;
 constexpr wchar_t kGlobalNameMark = L'_';
 constexpr std::array<std::wstring_view, 3> kApplicationExtensions = {L".bundle", L".zmb", L".omp"};
@@ -42,14 +42,15 @@ bool lists(const ApplicationRecord& record, std::wstring_view typedName)
 } // namespace
 
 DemandLoading::DemandLoading(std::filesystem::path plugInsFolder, const ApplicationRecords& records,
-                             DynamicLinker& linker, const Admission& admission)
-    : mPlugInsFolder(std::move(plugInsFolder)), mRecords(records), mLinker(linker), mAdmission(admission)
+                             DynamicLinker& linker, const Admission& admission, CommandLine& commandLine)
+    : mPlugInsFolder(std::move(plugInsFolder)), mRecords(records), mLinker(linker), mAdmission(admission),
+      mCommandLine(commandLine)
 {
 }
 
 bool DemandLoading::load(const std::wstring& path) const
 {
-    return mLinker.loadModule(path.c_str(), kSayWhyNot, kResolveNow);
+    return mCommandLine.tell(mLinker.load(path, kResolveNow));
 }
 
 void DemandLoading::loadAtStart() const

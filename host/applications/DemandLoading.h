@@ -12,17 +12,19 @@ namespace tessel
 {
 class Admission;
 class ApplicationRecords;
+class CommandLine;
 class DynamicLinker;
 struct ApplicationRecord;
 
 class DemandLoading
 {
 public:
+    // What cannot be loaded is explained on the command line.
     DemandLoading(std::filesystem::path plugInsFolder, const ApplicationRecords& records,
-                  DynamicLinker& linker, const Admission& admission);
+                  DynamicLinker& linker, const Admission& admission, CommandLine& commandLine);
 
     // Loads what is due at the start: by the records, in their order, then from the PlugIns folder, by name.
-    // What cannot be loaded is explained on the command line, and the start goes on.
+    // What cannot be loaded does not keep the start from going on.
     void loadAtStart() const;
 
     // Loads the application that has such a command, by its local or its global name, in any case of letters,
@@ -46,5 +48,6 @@ private:
     const ApplicationRecords& mRecords;
     DynamicLinker& mLinker;
     const Admission& mAdmission;
+    CommandLine& mCommandLine;
 };
 } // namespace tessel

@@ -60,6 +60,21 @@ Result<> checkLoadable(const RegularFile& program)
                          { return program.read(offset, buffer, size); });
 }
 
+std::wstring sentence(const std::wstring& path, const wchar_t* whatHappened, const std::wstring& why)
+{
+    return L"The application \"" + path + L"\" " + whatHappened + why + L".";
+}
+
+// What a person is told of an attempt.
+Result<> whole(const std::wstring& path, const Result<>& attempted)
+{
+    if (attempted)
+        return attempted;
+    if (attempted.code() == Admission::kToldAtStart)
+        return Failure{{}, attempted.code()};
+    return Failure{sentence(path, L"is not loaded: ", attempted.sentence()), attempted.code()};
+}
+
 // The program at a path, or a file that is not open.
 RegularFile programOf(const Result<ModuleFile>& file)
 {
@@ -82,27 +97,41 @@ bool DynamicLinker::registerApplication(void* application)
     return module != nullptr;
 }
 
+Result<> DynamicLinker::load(const std::wstring& path, bool resolveNow)
+{
+    const std::wstring fullPath = fullPathOf(path.c_str());
+    return whole(fullPath, attempt(fullPath, resolveNow));
+}
+
+// The application that has asked may show a box of its own about the failure, which it knows of by a bool:
+// the reason cannot come with it, so the box is told beforehand.
 bool DynamicLinker::loadModule(const wchar_t* path, bool sayWhyNot, bool resolveNow)
 {
     const std::wstring fullPath = fullPathOf(path);
-    const bool wasKnown = mModules.withPath(fullPath) != nullptr;
-    const auto begun = LoadOutcomes::Clock::now();
-    const auto loaded = load(fullPath, resolveNow);
-    // By a link to what is there already nothing is loaded.
-    if (!loaded || (!wasKnown && mModules.withPath(fullPath)))
-        mOutcomes.note(fullPath, loaded, begun);
+    const auto loaded = attempt(fullPath, resolveNow);
     if (loaded)
         return true;
     if (Admission::isKeptOut(loaded.code()))
         mMessageBox.passOver(fullPath);
     else
         mMessageBox.explain(fullPath, loaded.sentence() + L".");
-    if (sayWhyNot && loaded.code() != Admission::kToldAtStart)
-        say(fullPath, L"is not loaded: ", loaded.sentence());
+    if (sayWhyNot)
+        mCommandLine.tell(whole(fullPath, loaded));
     return false;
 }
 
-Result<> DynamicLinker::load(const std::wstring& path, bool resolveNow)
+Result<> DynamicLinker::attempt(const std::wstring& path, bool resolveNow)
+{
+    const bool wasKnown = mModules.withPath(path) != nullptr;
+    const auto begun = LoadOutcomes::Clock::now();
+    auto loaded = loadAdmitted(path, resolveNow);
+    // By a link to what is there already nothing is loaded.
+    if (!loaded || (!wasKnown && mModules.withPath(path)))
+        mOutcomes.note(path, loaded, begun);
+    return loaded;
+}
+
+Result<> DynamicLinker::loadAdmitted(const std::wstring& path, bool resolveNow)
 {
     if (mEnding)
         return Failure{L"the host is ending"};
@@ -197,27 +226,28 @@ Result<> DynamicLinker::send(Module& module, unsigned message) const
     return {};
 }
 
-bool DynamicLinker::unloadModule(const wchar_t* path, bool sayWhyNot)
+Result<std::wstring> DynamicLinker::unload(const std::wstring& path)
 {
-    const std::wstring fullPath = fullPathOf(path);
-    Module* module = find(path);
-    const auto unloaded = unload(module);
-    if (!unloaded && sayWhyNot)
-        say(fullPath, L"is not unloaded: ", unloaded.sentence());
-    if (!unloaded)
-        return false;
-    if (!takeOut(*module) && sayWhyNot)
-        say(fullPath, L"is out of service; ", L"its code stays in memory until the session ends");
-    return true;
+    const std::wstring fullPath = fullPathOf(path.c_str());
+    Module* module = find(fullPath.c_str());
+    if (const auto gone = sendOff(module); !gone)
+        return Failure{sentence(fullPath, L"is not unloaded: ", gone.sentence())};
+    if (takeOut(*module))
+        return std::wstring();
+    return sentence(fullPath, L"is out of service; ", L"its code stays in memory until the session ends");
 }
 
-void DynamicLinker::say(const std::wstring& path, const wchar_t* whatFailed, const std::wstring& whyNot) const
+bool DynamicLinker::unloadModule(const wchar_t* path, bool sayWhyNot)
 {
-    mCommandLine.say(L"The application \"" + path + L"\" " + whatFailed + whyNot + L".");
+    const auto unloaded = unload(path ? path : L"");
+    const std::wstring& told = unloaded ? *unloaded : unloaded.sentence();
+    if (sayWhyNot && !told.empty())
+        mCommandLine.say(told);
+    return static_cast<bool>(unloaded);
 }
 
 // Message 2, to one that may go.
-Result<> DynamicLinker::unload(Module* module)
+Result<> DynamicLinker::sendOff(Module* module)
 {
     auto free = checkFreeToGo(module);
     return free ? send(*module, TSRX_MSG_UNLOAD) : free;
@@ -300,7 +330,7 @@ void DynamicLinker::unloadAll()
     {
         Module& last = *mModules.inService().back();
         if (const auto ended = send(last, TSRX_MSG_UNLOAD); !ended)
-            say(last.path, L"did not end as it should: ", ended.sentence());
+            mCommandLine.say(sentence(last.path, L"did not end as it should: ", ended.sentence()));
         mCommands.removeCommandsOf(last.path);
         mModules.remove(last);
     }

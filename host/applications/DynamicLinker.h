@@ -18,6 +18,7 @@
 #include <tessel/tsrxlinker.h>
 
 #include "host/applications/LoadedModules.h"
+#include "host/text/Result.h"
 
 namespace tessel
 {
@@ -38,15 +39,22 @@ public:
         bool locked = false;
     };
 
-    // Says on the command line why something failed, tells `calls` whose entry point runs, takes the commands
-    // of what goes out of `commands`, gives the message box its detail, and notes how loading went. Loads
-    // what `admission` does not refuse.
+    // Tells `calls` whose entry point runs, takes the commands of what goes out of `commands`, and notes how
+    // loading came off. Loads what `admission` does not refuse. Command line and message box are for
+    // applications, which learn no more than that something failed: a person gets to read why.
     DynamicLinker(CommandLine& commandLine, CallingApplication& calls, CommandStack& commands,
                   MessageBox& messageBox, LoadOutcomes& outcomes, Admission& admission);
 
+    // Loads the file at the path. The failure is a whole sentence, or empty where the start has told it, with
+    // the code of `Admission` if that has refused the file.
+    Result<> load(const std::wstring& path, bool resolveNow);
+    // Unloads the application at the path. An application of which a call has not returned yet stays, too:
+    // its code is needed. The failure is a whole sentence; a success may have something to tell as well, or
+    // an empty text.
+    Result<std::wstring> unload(const std::wstring& path);
+
     bool registerApplication(void* application) override;
     bool loadModule(const wchar_t* path, bool sayWhyNot, bool resolveNow) override;
-    // An application of which a call has not returned yet stays, too: its code is needed.
     bool unloadModule(const wchar_t* path, bool sayWhyNot) override;
     bool isModuleLocked(const wchar_t* path) const override;
     bool setApplicationLocked(void* application, bool locked) override;
@@ -66,17 +74,17 @@ public:
 
 private:
     // What these say of a failure is the end of a sentence.
-    Result<> load(const std::wstring& path, bool resolveNow);
+    Result<> attempt(const std::wstring& path, bool resolveNow);
+    Result<> loadAdmitted(const std::wstring& path, bool resolveNow);
     Result<> loadNew(const std::wstring& path, bool resolveNow);
     Result<std::unique_ptr<Module>> open(const ModuleFile& file, const RegularFile& program,
                                          bool resolveNow) const;
     Result<> answerForKnown(const Module& module) const;
     Result<> start(Module& module);
-    Result<> unload(Module* module);
+    Result<> sendOff(Module* module);
     Result<> checkFreeToGo(const Module* module) const;
     Result<> send(Module& module, unsigned message) const;
 
-    void say(const std::wstring& path, const wchar_t* whatFailed, const std::wstring& whyNot) const;
     bool takeOut(Module& module);
     Module* find(const wchar_t* path) const;
     Module* known(const std::wstring& realPath, const RegularFile& program) const;

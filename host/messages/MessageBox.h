@@ -30,6 +30,9 @@ public:
     // Boxes are shown by the presenter, and as text where it cannot or where there is none.
     explicit MessageBox(CommandLine& commandLine, Presenter presenter = {});
 
+    // An application learns from a bool that a file was not loaded, and shows a box of its own text. Nothing
+    // in the SDK takes the reason from the one to the other, so it waits here for the box.
+    //
     // Why something went wrong with the file: the detail of the next box, if that names the file.
     void explain(const std::wstring& path, const std::wstring& why);
     // What happened to the file was meant to: the next box, if it names the file, is not shown at all, and

@@ -26,7 +26,7 @@ protected:
     tessel::Registry mRegistry{mFolder / "registry.db"};
     tessel::Owned<tessel::ApplicationRecords> mRecords{mRegistry, mCommands, mCalls,
                                                        L"Software\\Tessel\\R21"};
-    tessel::DemandLoading mDemand{mFolder / "PlugIns", *mRecords, mLinker, mAdmission};
+    tessel::DemandLoading mDemand{mFolder / "PlugIns", *mRecords, mLinker, mAdmission, mCommandLine};
 };
 
 TEST_F(Demand, LoadsAtTheStartWhatItsRecordsAskFor)
