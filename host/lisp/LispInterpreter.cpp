@@ -2,8 +2,6 @@
 
 #include <utility>
 
-#include <tessel/tsdefs.h>
-
 #include "host/applications/Admission.h"
 #include "host/applications/Document.h"
 #include "host/commands/EndRequest.h"
@@ -110,28 +108,24 @@ void LispInterpreter::queue(std::wstring expression)
     mQueue.push_back({std::move(expression), mMarker.reason()});
 }
 
-bool LispInterpreter::runQueue()
+void LispInterpreter::runQueue()
 {
     if (mRunningQueue)
-        return true;
+        return;
     mRunningQueue = true;
-    bool allRan = true;
     while (!mQueue.empty() && !mEndRequest.isMade())
     {
         const Queued next = std::move(mQueue.front());
         mQueue.pop_front();
         const RunningMarker::ReasonScope reason(mMarker, next.reason);
-        allRan = mCommandLine.tell(evaluate(next.expression)) && allRan;
+        mCommandLine.tell(evaluate(next.expression));
     }
     mRunningQueue = false;
-    return allRan;
 }
 
-int LispInterpreter::invoke(const TsResultBuffer* call, TsResultBuffer** result)
+Result<TsResultBuffer*> LispInterpreter::invoke(const TsResultBuffer* call)
 {
-    const auto values = mMachine->call(call);
-    *result = values ? *values : nullptr;
-    return mCommandLine.tell(values) ? TS_NORMAL : TS_ERROR;
+    return mMachine->call(call);
 }
 
 void LispInterpreter::interrupt() noexcept

@@ -56,14 +56,15 @@ public:
 
     // Evaluates what is queued, in order, and what is queued meanwhile after that. An error is said in one
     // line, and does not keep the next expression from running. Called within itself it does nothing, and
-    // when the session is to end nothing more. False when an expression failed.
-    bool runQueue();
+    // when the session is to end nothing more.
+    void runQueue();
 
-    // As `tsedInvoke`. A list comes back with its values in their order, lists within it flattened, and nil
-    // within it as TS_NIL. Integers are TS_SHORT if they fit, then TS_LONG; other numbers are TS_REAL, T is
-    // TS_TRUE, symbols are strings of their name, and what is none of these is the string that Lisp would
-    // print.
-    int invoke(const TsResultBuffer* call, TsResultBuffer** result);
+    // Calls the function named by the first value with the rest. A list comes back with its values in their
+    // order, lists within it flattened, and nil within it as TS_NIL. Integers are TS_SHORT if they fit, then
+    // TS_LONG; other numbers are TS_REAL, T is TS_TRUE, symbols are strings of their name, and what is none
+    // of these is the string that Lisp would print. The values are the caller's to free, null for nil. What
+    // is said of a failure is one line of error text.
+    Result<TsResultBuffer*> invoke(const TsResultBuffer* call);
 
     // Stops the evaluation that runs; without one, nothing. Safe in a signal handler and on any thread.
     void interrupt() noexcept;

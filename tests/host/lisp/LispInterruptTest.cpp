@@ -79,7 +79,7 @@ TEST_F(LispInterrupt, StopsOneExpressionOfTheQueueOnly)
 {
     session.lisp().queue(L"(progn (princ \"begun\") (loop))");
     session.lisp().queue(L"(setq sum (+ 1 2))");
-    EXPECT_FALSE(session.lisp().runQueue());
+    session.lisp().runQueue();
     EXPECT_EQ(session.output(), "begun\nLisp was interrupted.\n");
     EXPECT_FALSE(session.lisp().running());
     EXPECT_EQ(session.value("sum"), "3");
