@@ -59,6 +59,20 @@ TEST_F(ChosenAppearance, FollowsTheDesktop)
     EXPECT_EQ(Appearance::kLight, chosenAppearance("auto"));
 }
 
+TEST_F(ChosenAppearance, IsAskedForInOneCallThatWaitsForASecondAtMost)
+{
+    const auto asked = mFolder / "asked";
+    const auto program = mFolder.write("gdbus", "#!/bin/sh\necho \"$*\" >'" + asked.string() + "'\n");
+    std::filesystem::permissions(program, std::filesystem::perms::owner_all);
+    EXPECT_EQ(Appearance::kLight, chosenAppearance("auto"));
+    std::ifstream file(asked);
+    std::string words;
+    std::getline(file, words);
+    EXPECT_EQ(words, "call --session --timeout 1 --dest org.freedesktop.portal.Desktop --object-path "
+                     "/org/freedesktop/portal/desktop --method org.freedesktop.portal.Settings.Read "
+                     "org.freedesktop.appearance color-scheme");
+}
+
 TEST_F(ChosenAppearance, IsLightWhenNoPortalAnswers)
 {
     answer("");

@@ -1,20 +1,14 @@
 #include "host/ui/platform/gnustep/Appearance.h"
 
-#include <array>
-#include <cstdio>
 #include <cstdlib>
 #include <filesystem>
+
+#include "host/platform/Programs.h"
 
 namespace tessel::windowing
 {
 namespace
 {
-// The portal may have to be started for the question, and a broken one never answers.
-constexpr char kAskPortal[] = "gdbus call --session --timeout 1 --dest org.freedesktop.portal.Desktop "
-                              "--object-path /org/freedesktop/portal/desktop "
-                              "--method org.freedesktop.portal.Settings.Read "
-                              "org.freedesktop.appearance color-scheme 2>/dev/null </dev/null";
-
 std::string environment(const char* name)
 {
     const char* value = std::getenv(name);
@@ -29,15 +23,15 @@ bool hasSessionBus()
            std::filesystem::exists(environment("XDG_RUNTIME_DIR") + "/bus", ignored);
 }
 
+// The portal may have to be started for the question, and a broken one never answers.
 std::string portalAnswer()
 {
-    FILE* answer = hasSessionBus() ? popen(kAskPortal, "r") : nullptr;
-    if (!answer)
+    if (!hasSessionBus())
         return "";
-    std::array<char, 256> line{};
-    const std::string text = fgets(line.data(), line.size(), answer) ? line.data() : "";
-    pclose(answer); // that it failed shows in its answer
-    return text;
+    return outputOfProgram(
+        {"gdbus", "call", "--session", "--timeout", "1", "--dest", "org.freedesktop.portal.Desktop",
+         "--object-path", "/org/freedesktop/portal/desktop", "--method",
+         "org.freedesktop.portal.Settings.Read", "org.freedesktop.appearance", "color-scheme"});
 }
 } // namespace
 
