@@ -158,7 +158,7 @@ protected:
         const ModalSteps steps(actions);
         [NSApp runModalForWindow:window];
         [window orderOut:nil];
-        return host().services.waits;
+        return host().session.waits;
     }
 };
 } // namespace
@@ -166,7 +166,7 @@ protected:
 TEST_F(Waiting, OfAModalWindowEndsTheActionBefore)
 {
     std::vector<bool> before;
-    const auto waits = waitsOf({[&] { before = host().services.waits; }, stop});
+    const auto waits = waitsOf({[&] { before = host().session.waits; }, stop});
     EXPECT_THAT(before, testing::Each(true));
     EXPECT_GE(before.size(), 1u) << "before the first action";
     EXPECT_GT(waits.size(), before.size()) << "after it";
@@ -178,12 +178,12 @@ TEST_F(Waiting, OfAMessageBoxIsWithinAnAction)
     std::vector<bool> inBox;
     const auto waits = waitsOf({[&]
                                 {
-                                    host().services.waits.clear();
+                                    host().session.waits.clear();
                                     tsuiShowMessageBox(L"A question.", L"", 0, nullptr);
                                 },
                                 [&]
                                 {
-                                    inBox = host().services.waits;
+                                    inBox = host().session.waits;
                                     stop();
                                 },
                                 [] {}, stop});
@@ -214,9 +214,9 @@ TEST_F(MessageBoxes, SayWhyInSmallerTypeThatCanBeSelected)
 
 TEST_F(Waiting, OutsideOfModalWindowsTellsTheHostNothing)
 {
-    host().services.waits.clear();
+    host().session.waits.clear();
     tsuiFinishWindows();
-    EXPECT_THAT(host().services.waits, testing::IsEmpty());
+    EXPECT_THAT(host().session.waits, testing::IsEmpty());
 }
 
 TEST_F(FinishedWindows, DoNotEndTheCommandWhoseEventsTheToolkitFailsOver)

@@ -37,6 +37,7 @@
 #include "tests/support/recording/RecordingRegistry.h"
 #include "tests/support/recording/RecordingResources.h"
 #include "tests/support/recording/RecordingServices.h"
+#include "tests/support/recording/RecordingSession.h"
 #include "tests/support/recording/RecordingVariables.h"
 
 class RecordingHost
@@ -56,6 +57,7 @@ public:
     Journal journal; // every call, in order
 
     RecordingServices services;                       // tsrxSysRegistry
+    RecordingSession session;                         // tsrxEndRequest, tsrxBeforeWaiting
     RecordingLinker linker;                           // "DynamicLinker"
     RecordingLoadedModules loadedModules;             // tsedQmbLoaded, tsedGetModuleFileName, tsedGetAppName
     RecordingCommands commands;                       // "TESSEL_REGISTERED_COMMANDS"

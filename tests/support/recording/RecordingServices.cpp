@@ -19,13 +19,3 @@ TsRxSysRegistry* tsrxSysRegistry()
 {
     return &recordingHost().services;
 }
-
-int tsrxEndRequest()
-{
-    return recordingHost().services.endRequest;
-}
-
-void tsrxBeforeWaiting(bool actionIsOver)
-{
-    recordingHost().services.waits.push_back(actionIsOver);
-}

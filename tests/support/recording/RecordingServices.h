@@ -6,7 +6,6 @@
 #include <vector>
 
 #include <tessel/tsrx.h>
-#include <tessel/tssession.h>
 
 class RecordingServices : public TsRxSysRegistry
 {
@@ -14,9 +13,6 @@ public:
     // The service is missing, or is another object (null: missing). Objects stay the caller's.
     void miss(const std::wstring& name) { set(name, nullptr); }
     void set(const std::wstring& name, TsRxObject* object) { mObjects[name] = object; }
-
-    int endRequest = -1;     // tsrxEndRequest; the descriptor stays the caller's
-    std::vector<bool> waits; // the calls of tsrxBeforeWaiting, and whether an action was over
 
     // The names asked for, in order.
     mutable std::vector<std::wstring> asked;
