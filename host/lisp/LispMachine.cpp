@@ -111,11 +111,15 @@ bool canMakeSymbols()
     return made;
 }
 
-// Every exhaustion gives Lisp some memory more, which it keeps only while the rest is in use.
+// Every exhaustion gives Lisp some memory more, which it keeps only while the rest is in use. What the failed
+// evaluation has left counts as that until it is collected; by itself the collector, which has just found
+// next to nothing, would refuse memory for long before it looks again.
 void takeBackReserve(std::size_t heapBytes)
 {
-    if (cl_core.max_heap_size > heapBytes &&
-        GC_get_heap_size() - GC_get_free_bytes() + kHeapReserve < heapBytes)
+    if (cl_core.max_heap_size <= heapBytes)
+        return;
+    GC_gcollect();
+    if (GC_get_heap_size() - GC_get_free_bytes() + kHeapReserve < heapBytes)
         si_set_limit(ecl_make_symbol("HEAP-SIZE", "EXT"), ecl_make_fixnum(static_cast<cl_fixnum>(heapBytes)));
 }
 } // namespace

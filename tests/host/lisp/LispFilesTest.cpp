@@ -108,6 +108,20 @@ TEST_F(LispFiles, NameTheLineWhereMemoryIsExhausted)
     EXPECT_EQ(session.value("(length (make-array 100000))"), "100000");
 }
 
+// What one session of the process has given up is there for the next.
+TEST(LispFilesInManySessions, LeaveMemoryToTheNextThatTheyExhausted)
+{
+    const TemporaryFolder folder;
+    const auto path = folder.write("much.lsp", "(let (all) (loop (push (make-array 10000) all)))\n").string();
+    for (int round = 0; round < 10; ++round)
+    {
+        LispSession session;
+        EXPECT_EQ(session.error("(load " + quoted(path) + ")"),
+                  path + ":1: the memory for Lisp is exhausted.");
+        EXPECT_EQ(session.value("(length (make-array 100000))"), "100000") << round;
+    }
+}
+
 TEST_F(LispFiles, NameTheInnermostFileAndLine)
 {
     const auto inner = write("inner.lsp", "\n\n(unknown)");
