@@ -48,31 +48,33 @@ void CStringList::Append(CStdStr text, const SplitPath& split, std::size_t pathH
     const bool knownByName = IsKnownByFileNameAlone(split);
     mKnownByName = mKnownByName || knownByName;
     const auto entry = mEntries.insert(mEntries.end(), Entry{std::move(text), mNextPlace++});
-    mIndex.emplace(knownByName ? split.FileNameHash() : pathHash, entry);
+    mIndex.Add(knownByName ? split.FileNameHash() : pathHash, entry);
 }
 
 void CStringList::RemoveAll()
 {
     mKnownByName = false;
-    mIndex.clear();
+    mIndex.Clear();
     mEntries.clear();
 }
 
 bool CStringList::RemoveFirstNoCase(const CStdStr& text)
 {
     // Texts that are equal without regard to case are split alike, so that all of them stand under one hash.
-    auto [candidate, last] = mIndex.equal_range(MatchingHash(SplitPath(text)));
-    auto first = mIndex.end();
-    for (; candidate != last; ++candidate)
-    {
-        const bool earlier = first == mIndex.end() || candidate->second->place < first->second->place;
-        if (earlier && candidate->second->text.EqualsNoCase(text))
-            first = candidate;
-    }
-    if (first == mIndex.end())
+    const std::size_t hash = MatchingHash(SplitPath(text));
+    auto first = mEntries.end();
+    mIndex.AnyUnder(hash,
+                    [&](Entries::iterator candidate)
+                    {
+                        const bool earlier = first == mEntries.end() || candidate->place < first->place;
+                        if (earlier && candidate->text.EqualsNoCase(text))
+                            first = candidate;
+                        return false; // all of them are looked at
+                    });
+    if (first == mEntries.end())
         return false;
-    mEntries.erase(first->second);
-    mIndex.erase(first);
+    mIndex.Remove(hash, first);
+    mEntries.erase(first);
     return true;
 }
 
@@ -91,9 +93,6 @@ bool CStringList::Holds(const SplitPath& target, std::size_t pathHash) const
 
 bool CStringList::HoldsUnder(std::size_t hash, const SplitPath& target) const
 {
-    auto [candidate, last] = mIndex.equal_range(hash);
-    for (; candidate != last; ++candidate)
-        if (MatchesEntry(SplitPath(candidate->second->text), target))
-            return true;
-    return false;
+    return mIndex.AnyUnder(hash, [&](Entries::iterator candidate)
+                           { return MatchesEntry(SplitPath(candidate->text), target); });
 }

@@ -7,9 +7,9 @@
 #include <cstdint>
 #include <iterator>
 #include <list>
-#include <unordered_map>
 
 #include "modrig/base/CStdStr.h"
+#include "modrig/base/HashIndex.h"
 
 class SplitPath;
 
@@ -79,16 +79,13 @@ public:
     [[nodiscard]] bool HoldsApplication(const CStdStr& path) const;
 
 private:
-    // By the hash of what an entry is matched by.
-    using Index = std::unordered_multimap<std::size_t, Entries::iterator>;
-
     void Append(CStdStr text, const SplitPath& split, std::size_t pathHash);
     bool Holds(const SplitPath& target, std::size_t pathHash) const;
     bool HoldsUnder(std::size_t hash, const SplitPath& target) const;
 
     Entries mEntries;
-    Index mIndex;
-    bool mKnownByName = false; // there was an entry that is known by its file name alone
+    HashIndex<Entries::iterator> mIndex; // by the hash of what an entry is matched by
+    bool mKnownByName = false;           // there was an entry that is known by its file name alone
     std::uint64_t mNextPlace = 0;
 };
 
