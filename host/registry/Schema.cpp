@@ -6,6 +6,7 @@
 #include <cstring>
 #include <random>
 #include <string_view>
+#include <utility>
 
 #include "host/registry/Statement.h"
 #include "host/text/Unicode.h"
@@ -65,18 +66,47 @@ constexpr std::array kMakeRoom = {"DROP INDEX value_order", "DROP INDEX key_orde
                                   "ALTER TABLE value RENAME TO old_value",
                                   "ALTER TABLE key RENAME TO old_key"};
 
+// The checksum of bytes that come in pieces. Short pieces are gathered: most of the time would go into the
+// beginnings and ends of the summing.
+class Checksum
+{
+public:
+    void add(const void* bytes, std::size_t count)
+    {
+        if (count > mGathered.size() - mCount)
+            sumUp();
+        if (count > mGathered.size())
+        {
+            mSum = crc32_z(mSum, static_cast<const Bytef*>(bytes), count);
+            return;
+        }
+        std::memcpy(mGathered.data() + mCount, bytes, count);
+        mCount += count;
+    }
+    sqlite3_int64 finish()
+    {
+        sumUp();
+        return static_cast<sqlite3_int64>(mSum);
+    }
+
+private:
+    void sumUp() { mSum = crc32_z(mSum, mGathered.data(), std::exchange(mCount, 0)); }
+
+    std::array<Bytef, 512> mGathered;
+    std::size_t mCount = 0;
+    uLong mSum = crc32_z(0, nullptr, 0);
+};
+
 void rowSum(sqlite3_context* context, int count, sqlite3_value** values)
 {
-    uLong sum = crc32(0, nullptr, 0);
+    Checksum sum;
     for (int i = 0; i < count; ++i)
     {
         sqlite3_value* const value = values[i];
         if (sqlite3_value_type(value) == SQLITE_INTEGER)
         {
             const std::int64_t number = sqlite3_value_int64(value);
-            Bytef bytes[sizeof number];
-            std::memcpy(bytes, &number, sizeof number);
-            sum = crc32(sum, bytes, sizeof bytes);
+            sum.add(&number, sizeof number);
             continue;
         }
         if (sqlite3_value_type(value) == SQLITE_NULL)
@@ -84,11 +114,11 @@ void rowSum(sqlite3_context* context, int count, sqlite3_value** values)
         // As bytes, for which the store makes no copy that ends with a zero. The end belongs to it all the
         // same: what moves from one text to the next is not the same.
         constexpr Bytef kEnd = 0;
-        const auto* bytes = static_cast<const Bytef*>(sqlite3_value_blob(value));
-        sum = bytes ? crc32(sum, bytes, static_cast<uInt>(sqlite3_value_bytes(value))) : sum;
-        sum = crc32(sum, &kEnd, 1);
+        if (const void* bytes = sqlite3_value_blob(value))
+            sum.add(bytes, static_cast<std::size_t>(sqlite3_value_bytes(value)));
+        sum.add(&kEnd, sizeof kEnd);
     }
-    sqlite3_result_int64(context, static_cast<sqlite3_int64>(sum));
+    sqlite3_result_int64(context, sum.finish());
 }
 
 Result<> run(sqlite3* database, const char* sql)

@@ -20,7 +20,8 @@ struct Registry::Statements
     Statement begin, mark, beginReading, commit, rollback;
 
     // `mark` writes the number of the file, by which its journals are known. A row that is found comes with
-    // whether it is what was stored under what was asked for: an index may lead to another one.
+    // whether it is what was stored under what was asked for: an index may lead to another one. What follows
+    // a row is asked of the table alone, which is quicker than an index, and may be another key's.
     int prepare(sqlite3* database, std::int64_t fileNumber)
     {
         const std::string marking = "PRAGMA application_id=" + std::to_string(fileNumber);
@@ -34,8 +35,8 @@ struct Registry::Statements
                       "ORDER BY id"},
             {readValue,
              "SELECT seq, sum IS row_sum(?1, name, ?2, data), data FROM value WHERE key=?1 AND fold=?2"},
-            {followingValues, "SELECT seq, sum IS row_sum(?1, name, fold, data), fold, data FROM value"
-                              " WHERE key=?1 AND seq>?2 ORDER BY seq"},
+            {followingValues, "SELECT seq, key=?1 AND sum IS row_sum(?1, name, fold, data), fold, data"
+                              " FROM value WHERE seq>?2 ORDER BY seq"},
             {writeValue, "INSERT INTO value(key, name, fold, data, sum)"
                          " VALUES(?1, ?2, ?3, ?4, row_sum(?1, ?2, ?3, ?4)) ON CONFLICT(key, fold)"
                          " DO UPDATE SET data=?4, sum=row_sum(?1, value.name, ?3, ?4)"},
