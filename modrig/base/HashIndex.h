@@ -1,7 +1,7 @@
 // Values by their hashes, of which several may be equal.
 //
-// All of it lies in two blocks of memory: a hundred thousand entries, each in a block of its own, would cost a
-// start more than reading them from the disk.
+// All of it lies in two blocks of memory: a hundred thousand entries, each in a block of its own, would cost
+// a start more than reading them from the disk.
 #pragma once
 
 #include <cstddef>

@@ -6,6 +6,7 @@
 //                                      that is the error, in place of the usual one
 //     MODRIG_FAULT_COUNTS=file         tells at the end how many calls of each kind there were
 //     MODRIG_FAULT_NETWORK=1           every folder lies on another machine
+//     MODRIG_FAULT_DELAY=500           every read at a place takes so many microseconds more
 //
 // What a failing call would have done is not done; of a write, half of it is, and a file that is to be closed
 // is closed.
@@ -136,6 +137,13 @@ bool fails(Kind& kind, Which which)
     return fails(kind);
 }
 
+void delay(int file)
+{
+    static const char* const time = std::getenv("MODRIG_FAULT_DELAY");
+    if (time && isMeant(file))
+        usleep(static_cast<useconds_t>(std::atoi(time)));
+}
+
 bool failsToOpen(const char* path, int flags)
 {
     if (fails(kOpen, path))
@@ -183,6 +191,7 @@ INTERPOSED ssize_t read(int file, void* bytes, size_t count)
 #define READING(function)                                                                                    \
     INTERPOSED ssize_t function(int file, void* bytes, size_t count, off_t offset)                           \
     {                                                                                                        \
+        delay(file);                                                                                         \
         return fails(kPread, file) ? -1 : next<decltype(pread)>(#function)(file, bytes, count, offset);      \
     }
 READING(pread)
