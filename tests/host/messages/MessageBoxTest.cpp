@@ -5,6 +5,19 @@
 #include "host/messages/MessageBox.h"
 #include "tests/host/support/HostParts.h"
 
+namespace
+{
+// A presenter that keeps the detail of each box, whose first button is pressed.
+tessel::MessageBox::Presenter noting(std::vector<std::wstring>& details)
+{
+    return [&details](const tessel::MessageBox::Box& shown)
+    {
+        details.push_back(shown.detail);
+        return IDOK;
+    };
+}
+} // namespace
+
 TEST(MessageBox, IsTextWithTheFirstButtonChosenWithoutADisplay)
 {
     CapturedOutput output;
@@ -27,12 +40,12 @@ TEST(MessageBox, IsShownByThePresenterWhenThereIsOne)
                                seenStyle = shown.style;
                                return 7;
                            });
-    EXPECT_EQ(box.show(L"text", 48, nullptr), 7);
+    EXPECT_EQ(box.show(L"text", MB_ICONEXCLAMATION, nullptr), 7);
     EXPECT_EQ(seen, L"text");
-    EXPECT_EQ(seenStyle, 48u);
+    EXPECT_EQ(seenStyle, MB_ICONEXCLAMATION);
     EXPECT_EQ(output.text(), "");
     tessel::MessageBox without(output.commandLine(), {});
-    EXPECT_EQ(without.show(L"text", 48, nullptr), IDOK);
+    EXPECT_EQ(without.show(L"text", MB_ICONEXCLAMATION, nullptr), IDOK);
     EXPECT_EQ(output.text(), "Message: text\n");
 }
 
@@ -48,17 +61,12 @@ TEST(MessageBox, SaysInItsDetailWhatIsKnownOfTheFileThatItNames)
 {
     CapturedOutput output;
     std::vector<std::wstring> details;
-    tessel::MessageBox box(output.commandLine(),
-                           [&](const tessel::MessageBox::Box& shown)
-                           {
-                               details.push_back(shown.detail);
-                               return IDOK;
-                           });
+    tessel::MessageBox box(output.commandLine(), noting(details));
     box.explain(L"/a/tool.zmb", L"it has no entry point.");
-    box.show(L"/a/tool.zmb was not loaded.", 48, nullptr);
-    box.show(L"/a/tool.zmb was not loaded.", 48, nullptr);
+    box.show(L"/a/tool.zmb was not loaded.", MB_ICONEXCLAMATION, nullptr);
+    box.show(L"/a/tool.zmb was not loaded.", MB_ICONEXCLAMATION, nullptr);
     box.explain(L"/a/tool.zmb", L"it has no entry point.");
-    box.show(L"/a/other.zmb was not loaded.", 48, nullptr);
+    box.show(L"/a/other.zmb was not loaded.", MB_ICONEXCLAMATION, nullptr);
     EXPECT_EQ(details, (std::vector<std::wstring>{L"It has no entry point.", L"", L""}));
 }
 
@@ -66,16 +74,11 @@ TEST(MessageBox, BeginsItsDetailWithACapitalUnlessThatIsAName)
 {
     CapturedOutput output;
     std::vector<std::wstring> details;
-    tessel::MessageBox box(output.commandLine(),
-                           [&](const tessel::MessageBox::Box& shown)
-                           {
-                               details.push_back(shown.detail);
-                               return IDOK;
-                           });
+    tessel::MessageBox box(output.commandLine(), noting(details));
     for (const wchar_t* why : {L"cut", L"it is", L"libc.so: gone", L"/a/b: gone", L"xy7 is", L"It is", L""})
     {
         box.explain(L"/a/tool.zmb", why);
-        box.show(L"/a/tool.zmb was not loaded.", 48, nullptr);
+        box.show(L"/a/tool.zmb was not loaded.", MB_ICONEXCLAMATION, nullptr);
     }
     EXPECT_EQ(details, (std::vector<std::wstring>{L"Cut", L"It is", L"libc.so: gone", L"/a/b: gone",
                                                   L"xy7 is", L"It is", L""}));
@@ -86,7 +89,7 @@ TEST(MessageBox, LeavesTheDetailToTheCommandLineWithoutADisplay)
     CapturedOutput output;
     tessel::MessageBox box(output.commandLine());
     box.explain(L"/a/tool.zmb", L"it has no entry point.");
-    box.show(L"/a/tool.zmb was not loaded.", 48, nullptr);
+    box.show(L"/a/tool.zmb was not loaded.", MB_ICONEXCLAMATION, nullptr);
     EXPECT_EQ(output.text(), "Message: /a/tool.zmb was not loaded.\n");
 }
 
@@ -97,14 +100,14 @@ TEST(MessageBox, IsKeptWhileBoxesAreCollected)
     tessel::MessageBox box(output.commandLine(), [&](const tessel::MessageBox::Box&) { return ++shown; });
     box.collect();
     box.explain(L"/a/tool.zmb", L"it is gone.");
-    EXPECT_EQ(box.show(L"/a/tool.zmb was not loaded.", 48, nullptr), IDOK);
+    EXPECT_EQ(box.show(L"/a/tool.zmb was not loaded.", MB_ICONEXCLAMATION, nullptr), IDOK);
     EXPECT_EQ(box.show(L"another", MB_OK, nullptr), IDOK);
     EXPECT_EQ(shown, 0);
     const auto kept = box.takeCollected();
     ASSERT_EQ(kept.size(), 2U);
     EXPECT_EQ(kept[0].text, L"/a/tool.zmb was not loaded.");
     EXPECT_EQ(kept[0].detail, L"It is gone.");
-    EXPECT_EQ(kept[0].style, 48U);
+    EXPECT_EQ(kept[0].style, MB_ICONEXCLAMATION);
     EXPECT_EQ(kept[1].text, L"another");
     EXPECT_TRUE(box.takeCollected().empty());
     EXPECT_EQ(box.show(L"later", MB_OK, nullptr), 1);
