@@ -18,7 +18,6 @@ namespace
 constexpr std::size_t kNameColumn = 24;
 constexpr std::size_t kFolderColumn = 48;
 constexpr std::size_t kAnyLength = std::numeric_limits<std::size_t>::max();
-constexpr bool kResolveNow = true;
 constexpr std::array kLispExtensions = {L".lsp", L".qbc"};
 
 bool isLispFile(const std::wstring& path)

@@ -18,7 +18,6 @@ namespace tessel
 {
 namespace
 {
-constexpr bool kResolveNow = true;
 constexpr wchar_t kGlobalNameMark = L'_';
 constexpr std::array<std::wstring_view, 3> kApplicationExtensions = {L".bundle", L".zmb", L".omp"};
 

@@ -29,6 +29,9 @@ class CommandStack;
 class LoadOutcomes;
 class MessageBox;
 
+// Loading fails when a function that the module needs is missing, not the call of it later.
+inline constexpr bool kResolveNow = true;
+
 class DynamicLinker : public TsRxDynamicLinker
 {
 public:

@@ -25,7 +25,7 @@ namespace tessel
 namespace
 {
 constexpr std::string_view kFormat = "_HiStOrY_V2_";
-constexpr std::uintmax_t kLargestFile = std::uintmax_t{16} << 20;
+constexpr std::uintmax_t kLargestHistory = std::uintmax_t{16} << 20;
 // Shortened not at each start, but when half of it is of no use.
 constexpr std::size_t kMostStoredLines = 2 * kMostHistoryLines;
 
@@ -77,7 +77,7 @@ std::string decoded(std::string_view line)
     return result;
 }
 
-std::vector<std::string_view> linesOf(std::string_view content)
+std::vector<std::string_view> typedLines(std::string_view content)
 {
     std::vector<std::string_view> lines;
     if (content.substr(0, content.find('\n')) == kFormat) // once: such a line may have been typed, too
@@ -134,10 +134,10 @@ std::string beginning(int file)
 void shorten(const std::filesystem::path& path)
 {
     const Descriptor lock = openAlone(path);
-    const auto content = readOrdinaryFile(path, kLargestFile);
+    const auto content = readOrdinaryFile(path, kLargestHistory);
     if (!lock || !content)
         return;
-    const auto lines = linesOf(*content);
+    const auto lines = typedLines(*content);
     if (lines.size() <= kMostStoredLines) // another session was faster
         return;
     std::string kept = std::string(kFormat) + "\n";
@@ -156,13 +156,13 @@ Failure TypedHistory::giveUp(const std::wstring& whatFailed, const std::wstring&
 
 Result<std::vector<std::wstring>> TypedHistory::read()
 {
-    const auto content = readOrdinaryFile(mFile, kLargestFile);
+    const auto content = readOrdinaryFile(mFile, kLargestHistory);
     if (!content && content.code() != kNothingThere)
         return giveUp(L"is not used", content.sentence());
     std::vector<std::wstring> lines;
     if (!content)
         return lines;
-    auto stored = linesOf(*content);
+    auto stored = typedLines(*content);
     if (stored.size() > kMostStoredLines)
         shorten(mFile);
     if (stored.size() > kMostHistoryLines)

@@ -10,7 +10,7 @@ namespace tessel
 namespace
 {
 // The line ends show a transfer that has changed them; the first byte keeps tools from taking it for text.
-constexpr std::string_view kMagic = "\x89QBC\r\n\x1A\n";
+constexpr std::string_view kSignature = "\x89QBC\r\n\x1A\n";
 constexpr std::uint32_t kFormatVersion = 1;
 // Byte code is that of one version of ECL.
 constexpr std::uint32_t kLispVersion = ECL_VERSION_NUMBER;
@@ -56,14 +56,14 @@ std::string packCompiledLisp(std::string_view byteCode)
     appendNumber(numbers, kLispVersion);
     appendNumber(numbers, static_cast<std::uint32_t>(byteCode.size()));
     appendNumber(numbers, checksumOf(numbers, byteCode));
-    return std::string(kMagic) + numbers + std::string(byteCode);
+    return std::string(kSignature) + numbers + std::string(byteCode);
 }
 
 Result<std::string_view> unpackCompiledLisp(std::string_view bytes)
 {
-    if (!bytes.starts_with(kMagic))
+    if (!bytes.starts_with(kSignature))
         return Failure{L"is not compiled Lisp"};
-    bytes.remove_prefix(kMagic.size());
+    bytes.remove_prefix(kSignature.size());
     if (bytes.size() < kNumbersSize)
         return Failure{L"is cut short"};
     const auto numbers = bytes.substr(0, kNumbersSize);

@@ -24,13 +24,14 @@ namespace
 namespace fs = std::filesystem;
 
 constexpr int kNotCompiled = 1;
-constexpr int kWrongArguments = 2;
+constexpr int kUnusable = 2;
 
-constexpr char kAfterword[] = "Tessel loads the compiled file as it loads the source: (load \"FILE.qbc\"). "
-                              "It is for the version of Lisp\n"
-                              "that this host has. Status 0: compiled; 1: the file has an error or cannot be "
-                              "read or written; 2: wrong\n"
-                              "arguments.";
+constexpr char kCompilerAfterword[] =
+    "Tessel loads the compiled file as it loads the source: (load \"FILE.qbc\"). "
+    "It is for the version of Lisp\n"
+    "that this host has. Status 0: compiled; 1: the file has an error or cannot be "
+    "read or written; 2: wrong\n"
+    "arguments.";
 
 std::wstring quoted(const fs::path& path)
 {
@@ -103,7 +104,7 @@ Result<> compileGuarded(const fs::path& input, const fs::path& output)
 int runCompilerProgram(int count, const char* const* arguments)
 {
     CLI::App app("Compiles a Lisp file for Tessel to byte code.", "tesselc");
-    app.footer(kAfterword);
+    app.footer(kCompilerAfterword);
     std::string input;
     std::string output;
     app.add_option("FILE", input, "The Lisp file (.lsp)")->required();
@@ -117,7 +118,7 @@ int runCompilerProgram(int count, const char* const* arguments)
         std::ostringstream text;
         const bool failed = app.exit(outcome, text, text) != 0;
         (failed ? std::cerr : std::cout) << toUtf8(forTerminal(toWide(text.str())));
-        return failed ? kWrongArguments : 0;
+        return failed ? kUnusable : 0;
     }
     const auto compiled =
         compileGuarded(input, output.empty() ? fs::path(input).replace_extension(".qbc") : fs::path(output));

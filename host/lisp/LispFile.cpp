@@ -23,7 +23,7 @@ namespace fs = std::filesystem;
 constexpr std::wstring_view kCompiledExtension = L".qbc";
 constexpr std::wstring_view kExtensions[] = {L"", L".lsp", kCompiledExtension};
 // Lisp keeps four bytes for a character, and more for what it makes of it.
-constexpr std::uintmax_t kLargestFile = std::uintmax_t{32} << 20;
+constexpr std::uintmax_t kLargestLispFile = std::uintmax_t{32} << 20;
 constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
 
 Failure refused(const std::wstring& name, const std::wstring& reason, int code = Failure::kUnspecified)
@@ -123,7 +123,7 @@ Result<LispFile> read(const FoundFile& found)
     // A pipe or a device might never end.
     if (!fs::is_regular_file(found.status))
         return refused(found.name, L"it is not an ordinary file.");
-    if (fs::file_size(found.path, error) > kLargestFile && !error)
+    if (fs::file_size(found.path, error) > kLargestLispFile && !error)
         return refused(found.name, L"it is larger than 32 MB.");
     errno = 0;
     std::ifstream stream(found.path, std::ios::binary);

@@ -16,7 +16,7 @@ namespace tessel
 {
 namespace
 {
-Failure lastError()
+Failure whyUnreadable()
 {
     const bool isMissing = errno == ENOENT || errno == ENOTDIR;
     return {toWide(std::strerror(errno)), isMissing ? kNothingThere : Failure::kUnspecified};
@@ -46,7 +46,7 @@ Result<Descriptor> openOrdinaryFile(const std::filesystem::path& path, struct st
     // Opening a pipe that nobody writes to would wait for a writer.
     Descriptor file(open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOCTTY));
     if (!file || fstat(file.number(), &status) != 0)
-        return lastError();
+        return whyUnreadable();
     if (auto ordinary = checkOrdinary(status); !ordinary)
         return ordinary.failure();
     return file;
@@ -71,7 +71,7 @@ Result<std::string> readOrdinaryFile(const std::filesystem::path& path, std::uin
             return tooLarge(mostBytes);
     }
     if (count < 0)
-        return lastError();
+        return whyUnreadable();
     return content;
 }
 } // namespace tessel

@@ -49,7 +49,7 @@ Result<> checkKind(const std::filesystem::path& file)
     return ordinary ? ordinary : Failure{ordinary.sentence(), SQLITE_NOTADB};
 }
 
-bool isThere(const std::filesystem::path& file)
+bool fileExists(const std::filesystem::path& file)
 {
     std::error_code missing;
     return std::filesystem::exists(file, missing);
@@ -133,12 +133,12 @@ void Registry::refuse(const Result<>& reason)
 // once is not made again, for then its copy would be the next to go.
 Result<> Registry::makeMissingFile()
 {
-    const bool hasCopy = isThere(soundCopyOf(mFile));
+    const bool hasCopy = fileExists(soundCopyOf(mFile));
     if (holdsSomething(mFile))
         return {};
     if (hasCopy)
         return Failure{L"it is empty or missing, but the copy of what it held is there", SQLITE_CORRUPT};
-    if (isThere(mFile))
+    if (fileExists(mFile))
         return {};
     auto bytes = emptyRegistry();
     if (!bytes)
@@ -361,7 +361,7 @@ void Registry::renewCopy(bool changed)
     const auto copy = soundCopyOf(mFile);
     mHasStored =
         changed ||
-        (mLeftOpen && (!isThere(copy) || isNewer(mFile, copy) || isNewer(mFile.string() + "-wal", copy)));
+        (mLeftOpen && (!fileExists(copy) || isNewer(mFile, copy) || isNewer(mFile.string() + "-wal", copy)));
     static_cast<void>(keepCopy()); // the session's end makes it, and tells
 }
 

@@ -13,7 +13,7 @@ namespace tessel
 namespace
 {
 constexpr wchar_t kSeparator = L'/';
-constexpr std::uint64_t kLargestFile = std::uint64_t{64} << 20;
+constexpr std::uint64_t kLargestModule = std::uint64_t{64} << 20;
 // Handles rise from here; smaller values could be taken for the ids of texts.
 constexpr std::uintptr_t kHandlesBegin = 0x10000;
 
@@ -100,7 +100,7 @@ Result<HMODULE> ResourceModules::openFile(const RegularFile& file)
         ++known->second.references;
         return known->first;
     }
-    if (file.size() > kLargestFile)
+    if (file.size() > kLargestModule)
         return Failure{L"the file is too large for a resource module"};
     if (!file.opened())
         return file.opened().failure();

@@ -7,7 +7,7 @@ using testing::IsEmpty;
 
 namespace
 {
-constexpr const wchar_t* kKey = L"Software\\Contract";
+constexpr const wchar_t* kContractKey = L"Software\\Contract";
 constexpr DWORD kDataBytes = 4096;
 constexpr std::size_t kDataCharacters = kDataBytes / sizeof(wchar_t);
 constexpr DWORD kNameCharacters = 1024;
@@ -15,7 +15,7 @@ constexpr DWORD kNameCharacters = 1024;
 class RegistryContract : public ContractTest
 {
 protected:
-    RegistryContract() { key = create(kKey); }
+    RegistryContract() { key = create(kContractKey); }
     ~RegistryContract() override { RegCloseKey(key); }
 
     static HKEY create(const wchar_t* path, HKEY root = HKEY_CURRENT_USER)
@@ -92,7 +92,7 @@ TEST_F(RegistryContract, MakesTheMissingParentsOfAKey)
 TEST_F(RegistryContract, OpensWhatItIsAskedToMakeTwice)
 {
     set(L"Name", L"data");
-    const HKEY again = create(kKey);
+    const HKEY again = create(kContractKey);
     EXPECT_EQ(read(again, L"Name"), L"data");
     RegCloseKey(again);
 }
@@ -269,7 +269,7 @@ TEST_F(RegistryContract, DeletesAValueOnce)
 
 TEST_F(RegistryContract, RefusesAKeyThatIsClosed)
 {
-    const HKEY closed = create(kKey);
+    const HKEY closed = create(kContractKey);
     EXPECT_EQ(RegCloseKey(closed), ERROR_SUCCESS);
     EXPECT_EQ(RegCloseKey(closed), ERROR_INVALID_HANDLE);
     EXPECT_EQ(tsudRegSetString(closed, L"Name", L"data"), ERROR_INVALID_HANDLE);
@@ -280,7 +280,7 @@ TEST_F(RegistryContract, RefusesAKeyThatIsClosed)
 
 TEST_F(RegistryContract, SeesThroughOneHandleWhatAnotherWrote)
 {
-    const HKEY other = create(kKey);
+    const HKEY other = create(kContractKey);
     set(L"Name", L"data");
     EXPECT_EQ(read(other, L"Name"), L"data");
     EXPECT_EQ(RegDeleteValueW(other, L"Name"), ERROR_SUCCESS);

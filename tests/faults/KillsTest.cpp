@@ -8,6 +8,7 @@
 
 #include "tests/e2e/HostProcess.h"
 #include "tests/e2e/HostTerminal.h"
+#include "tests/support/BusyFor.h"
 
 namespace
 {
@@ -18,14 +19,6 @@ constexpr int kStoredBefore = 2;
 int kills()
 {
     return std::getenv("MODRIG_DEEP") ? kDeepKills : kKills;
-}
-
-// Lets a moment pass that is as long as the number says, working.
-void pass(unsigned steps)
-{
-    volatile unsigned counter = 0;
-    for (unsigned i = 0; i < steps; ++i)
-        counter = counter + 1;
 }
 
 // The last of the numbers that follow the words.
@@ -53,7 +46,7 @@ TEST(KilledWhileRewriting, LeavesBothListsWhole)
             const std::string awaited = "Stored " + std::to_string(stored + kStoredBefore) + ".";
             ASSERT_TRUE(terminal.shows(awaited)) << "kill " << kill << terminal.screen();
             ASSERT_EQ(numberAfter("The lists are of writing ", terminal.screen()), stored) << "kill " << kill;
-            pass(static_cast<unsigned>(random() % 20'000'000));
+            busyFor(static_cast<unsigned>(random() % 20'000'000));
             ASSERT_EQ(::kill(terminal.process(), SIGKILL), 0);
             EXPECT_EQ(terminal.waitForEnd(), -SIGKILL);
             acknowledged = numberAfter("Stored ", terminal.screen());

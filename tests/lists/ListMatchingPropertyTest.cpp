@@ -14,7 +14,7 @@
 
 namespace
 {
-using Paths = std::vector<std::wstring>;
+using PathList = std::vector<std::wstring>;
 
 wchar_t Fold(wchar_t character)
 {
@@ -46,7 +46,7 @@ Parts PartsOf(const std::wstring& path)
 }
 
 // From the head, entry by entry.
-bool WalkFinds(const std::wstring& path, const Paths& list)
+bool WalkFinds(const std::wstring& path, const PathList& list)
 {
     const Parts target = PartsOf(path);
     for (const std::wstring& text : list)
@@ -65,7 +65,7 @@ bool WalkFinds(const std::wstring& path, const Paths& list)
     return false;
 }
 
-void WalkRemoves(const std::wstring& path, Paths& list)
+void WalkRemoves(const std::wstring& path, PathList& list)
 {
     const auto first = std::find_if(list.begin(), list.end(),
                                     [&path](const std::wstring& entry) { return SameText(entry, path); });
@@ -73,7 +73,7 @@ void WalkRemoves(const std::wstring& path, Paths& list)
         list.erase(first);
 }
 
-// Paths of few parts, so that a list holds the same application often, in many spellings.
+// PathList of few parts, so that a list holds the same application often, in many spellings.
 class RandomPaths
 {
 public:
@@ -83,34 +83,34 @@ public:
     unsigned Below(unsigned end) { return static_cast<unsigned>(mRandom() % end); }
 
 private:
-    const std::wstring& Any(const Paths& choices) { return choices[mRandom() % choices.size()]; }
+    const std::wstring& Any(const PathList& choices) { return choices[mRandom() % choices.size()]; }
 
-    static const Paths kDrives;
-    static const Paths kFolders;
-    static const Paths kNames;
-    static const Paths kExtensions;
+    static const PathList kDrives;
+    static const PathList kFolders;
+    static const PathList kNames;
+    static const PathList kExtensions;
 
     std::mt19937 mRandom;
 };
 
 // The Kelvin sign is a letter K that is not ASCII and folds to one that is.
-const Paths RandomPaths::kDrives = {L"", L"", L"", L"C:", L"c:", L"K:", L"k:", L"\u212A:", L"CC:"};
-const Paths RandomPaths::kFolders = {L"",
-                                     L"/",
-                                     L"\\",
-                                     L"/apps/",
-                                     L"/APPS/",
-                                     L"\\apps\\",
-                                     L"/apps\\",
-                                     L"/äpfel.d/",
-                                     L"/ÄPFEL.D/",
-                                     L"\\\\server\\σας\\",
-                                     L"\\\\SERVER\\ΣΑΣ\\",
-                                     L"/" + std::wstring(1100, L'f') + L"/"};
-const Paths RandomPaths::kNames = {L"",      L"tool",   L"TOOL",   L"Tööl",
-                                   L"tÖÖL",  L"straße", L"STRAẞE", L"to.ol",
-                                   L"TO.OL", L"tool ",  L"100%s",  std::wstring(300, L'n')};
-const Paths RandomPaths::kExtensions = {
+const PathList RandomPaths::kDrives = {L"", L"", L"", L"C:", L"c:", L"K:", L"k:", L"\u212A:", L"CC:"};
+const PathList RandomPaths::kFolders = {L"",
+                                        L"/",
+                                        L"\\",
+                                        L"/apps/",
+                                        L"/APPS/",
+                                        L"\\apps\\",
+                                        L"/apps\\",
+                                        L"/äpfel.d/",
+                                        L"/ÄPFEL.D/",
+                                        L"\\\\server\\σας\\",
+                                        L"\\\\SERVER\\ΣΑΣ\\",
+                                        L"/" + std::wstring(1100, L'f') + L"/"};
+const PathList RandomPaths::kNames = {L"",      L"tool",   L"TOOL",   L"Tööl",
+                                      L"tÖÖL",  L"straße", L"STRAẞE", L"to.ol",
+                                      L"TO.OL", L"tool ",  L"100%s",  std::wstring(300, L'n')};
+const PathList RandomPaths::kExtensions = {
     L"",     L".",    L".omp", L".OMP",   L".Omp", L".bundle", L".BUNDLE",
     L".lsp", L".LSP", L"omp",  L"bundle", L".om",  L".oMp ",   L"." + std::wstring(300, L'x')};
 
@@ -119,7 +119,7 @@ CStdStr Text(const std::wstring& text)
     return CStdStr(text);
 }
 
-void ExpectSameEntries(const Paths& expected, const CStringList& list)
+void ExpectSameEntries(const PathList& expected, const CStringList& list)
 {
     ASSERT_EQ(expected.size(), list.GetCount());
     auto entry = list.begin();
@@ -135,7 +135,7 @@ class ListMatching : public testing::TestWithParam<unsigned>
 TEST_P(ListMatching, AnswersLikeAPlainWalkWhateverIsAppendedAndRemoved)
 {
     RandomPaths random(GetParam());
-    Paths expected;
+    PathList expected;
     CStringList list;
     int found = 0;
     int missed = 0;
@@ -172,7 +172,7 @@ TEST_P(ListMatching, AnswersLikeAPlainWalkWhateverIsAppendedAndRemoved)
 TEST_P(ListMatching, FindsAndRemovesEveryEntryOfALargeList)
 {
     RandomPaths random(GetParam() + 1000);
-    Paths expected;
+    PathList expected;
     CStringList list;
     for (int i = 0; i < 400; ++i)
     {

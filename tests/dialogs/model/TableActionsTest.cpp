@@ -8,7 +8,7 @@ using testing::IsEmpty;
 
 namespace
 {
-constexpr TableKind kLoaded = TableKind::kLoadedApplications;
+constexpr TableKind kTableOfLoaded = TableKind::kLoadedApplications;
 constexpr TableKind kHistory = TableKind::kHistory;
 constexpr TableKind kSuite = TableKind::kStartupSuite;
 
@@ -28,7 +28,7 @@ TEST(TableKeys, RemoveFromTheListsButUnloadNothing)
     {
         EXPECT_EQ(TableAction::kRemove, ActionForKey(kHistory, {key}));
         EXPECT_EQ(TableAction::kRemove, ActionForKey(kSuite, {key}));
-        EXPECT_EQ(TableAction::kNone, ActionForKey(kLoaded, {key}));
+        EXPECT_EQ(TableAction::kNone, ActionForKey(kTableOfLoaded, {key}));
     }
 }
 
@@ -40,7 +40,7 @@ TEST(TableKeys, AddToTheStartupSuiteOnly)
 
 TEST(TableKeys, SelectAndCopyWithTheCommandKeyInEveryTable)
 {
-    for (const TableKind kind : {kLoaded, kHistory, kSuite})
+    for (const TableKind kind : {kTableOfLoaded, kHistory, kSuite})
     {
         EXPECT_EQ(TableAction::kSelectAll, ActionForKey(kind, {L'a', true}));
         EXPECT_EQ(TableAction::kCopyPath, ActionForKey(kind, {L'c', true}));
@@ -59,8 +59,8 @@ TEST(TableKeys, MoveRowsOfTheStartupSuiteWithAlt)
 
 TEST(TableMenu, HasWhatTheButtonsDoAndThePathOfTheRow)
 {
-    EXPECT_THAT(MenuOf(kLoaded), ElementsAre(TableAction::kUnload, TableAction::kNone, TableAction::kCopyPath,
-                                             TableAction::kShowInFolder));
+    EXPECT_THAT(MenuOf(kTableOfLoaded), ElementsAre(TableAction::kUnload, TableAction::kNone,
+                                                    TableAction::kCopyPath, TableAction::kShowInFolder));
     EXPECT_THAT(MenuOf(kHistory),
                 ElementsAre(TableAction::kLoad, TableAction::kAddToStartupSuite, TableAction::kRemove,
                             TableAction::kNone, TableAction::kCopyPath, TableAction::kShowInFolder));
@@ -73,7 +73,7 @@ TEST(TableMenu, KeepsOutOrLetsInWhereTheHostDoes)
 {
     for (const TableAction action : {TableAction::kKeepOut, TableAction::kLetIn})
     {
-        EXPECT_THAT(MenuOf(kLoaded, action),
+        EXPECT_THAT(MenuOf(kTableOfLoaded, action),
                     ElementsAre(TableAction::kUnload, TableAction::kNone, action, TableAction::kNone,
                                 TableAction::kCopyPath, TableAction::kShowInFolder));
         EXPECT_TRUE(IsPossible(action, {.rows = 3, .pointedAt = 1}));

@@ -10,7 +10,7 @@ using testing::IsEmpty;
 
 namespace
 {
-constexpr std::size_t kRoom = 1024;
+constexpr std::size_t kRoomForPath = 1024;
 
 class HostInformation : public testing::Test
 {
@@ -47,18 +47,18 @@ TEST_F(HostInformation, TakeHttpAndHttpsForAddresses)
 TEST_F(HostInformation, FetchThenTakeFromTheCacheUnlessToldOtherwise)
 {
     const std::wstring url = server.url(L"/tool.lsp");
-    wchar_t path[kRoom] = {};
-    EXPECT_EQ(information.fetchRemoteFile(url.c_str(), path, kRoom, false), TS_FETCHED);
+    wchar_t path[kRoomForPath] = {};
+    EXPECT_EQ(information.fetchRemoteFile(url.c_str(), path, kRoomForPath, false), TS_FETCHED);
     EXPECT_EQ(host.content(std::wstring(path)), "1");
-    EXPECT_EQ(information.fetchRemoteFile(url.c_str(), path, kRoom, false), TS_FROM_CACHE);
-    EXPECT_EQ(information.fetchRemoteFile(url.c_str(), path, kRoom, true), TS_FETCHED);
+    EXPECT_EQ(information.fetchRemoteFile(url.c_str(), path, kRoomForPath, false), TS_FROM_CACHE);
+    EXPECT_EQ(information.fetchRemoteFile(url.c_str(), path, kRoomForPath, true), TS_FETCHED);
     EXPECT_EQ(server.requests().size(), 2u);
 }
 
 TEST_F(HostInformation, LeaveNothingBehindWhenThePathDoesNotFit)
 {
     const std::wstring url = server.url(L"/tool.lsp");
-    wchar_t path[kRoom] = L"untouched";
+    wchar_t path[kRoomForPath] = L"untouched";
     EXPECT_EQ(information.fetchRemoteFile(url.c_str(), path, 20, false), TS_FETCH_FAILED);
     EXPECT_STREQ(path, L"untouched");
     EXPECT_THAT(host.stored(), IsEmpty());
@@ -67,10 +67,10 @@ TEST_F(HostInformation, LeaveNothingBehindWhenThePathDoesNotFit)
 
 TEST_F(HostInformation, RefuseWhatIsNoAddressWithASentence)
 {
-    wchar_t path[kRoom] = L"untouched";
-    EXPECT_EQ(information.fetchRemoteFile(L"file:///etc/passwd", path, kRoom, false), TS_FETCH_FAILED);
+    wchar_t path[kRoomForPath] = L"untouched";
+    EXPECT_EQ(information.fetchRemoteFile(L"file:///etc/passwd", path, kRoomForPath, false), TS_FETCH_FAILED);
     EXPECT_EQ(host.output().text(), "\"file:///etc/passwd\" is no http or https address.\n");
-    EXPECT_EQ(information.fetchRemoteFile(nullptr, path, kRoom, false), TS_FETCH_FAILED);
+    EXPECT_EQ(information.fetchRemoteFile(nullptr, path, kRoomForPath, false), TS_FETCH_FAILED);
     EXPECT_STREQ(path, L"untouched");
     EXPECT_THAT(host.stored(), IsEmpty());
 }
@@ -79,8 +79,8 @@ TEST_F(HostInformation, SayThatThereIsNoRoomForThePathAtAll)
 {
     const std::string sentence =
         "http://x could not be fetched: there is no room for the path of its local copy.\n";
-    wchar_t path[kRoom] = L"untouched";
-    EXPECT_EQ(information.fetchRemoteFile(L"http://x", nullptr, kRoom, false), TS_FETCH_FAILED);
+    wchar_t path[kRoomForPath] = L"untouched";
+    EXPECT_EQ(information.fetchRemoteFile(L"http://x", nullptr, kRoomForPath, false), TS_FETCH_FAILED);
     EXPECT_EQ(host.output().text(), sentence);
     EXPECT_EQ(information.fetchRemoteFile(L"http://x", path, 0, false), TS_FETCH_FAILED);
     EXPECT_EQ(host.output().text(), sentence + sentence);

@@ -7,6 +7,7 @@
 
 #include "host/registry/Registry.h"
 #include "tests/host/registry/StoredList.h"
+#include "tests/support/BusyFor.h"
 #include "tests/support/ChildProcess.h"
 #include "tests/support/Database.h"
 #include "tests/support/TemporaryFolder.h"
@@ -15,7 +16,7 @@ using tessel::Registry;
 
 namespace
 {
-constexpr int kKills = 50;
+constexpr int kStoreKills = 50;
 constexpr int kEntries = 40;
 constexpr int kAcknowledgedBefore = 3;
 
@@ -33,14 +34,6 @@ void rewriteForEver(const std::filesystem::path& file, int generation, int outpu
             _exit(1);
     }
 }
-
-// Lets a moment pass that is as long as the number says, working.
-void pass(unsigned steps)
-{
-    volatile unsigned counter = 0;
-    for (unsigned i = 0; i < steps; ++i)
-        counter = counter + 1;
-}
 } // namespace
 
 TEST(KilledProcess, LeavesAListThatIsWhole)
@@ -49,14 +42,14 @@ TEST(KilledProcess, LeavesAListThatIsWhole)
     const auto file = folder / "registry.db";
     std::mt19937 random(std::random_device{}());
     int stored = 0;
-    for (int kill = 0; kill < kKills; ++kill)
+    for (int kill = 0; kill < kStoreKills; ++kill)
     {
         ChildProcess child([&](int output) { rewriteForEver(file, stored + 1, output); });
         int acknowledged = 0;
         for (int i = 0; i < kAcknowledgedBefore; ++i)
             acknowledged = std::stoi("0" + child.readLine());
         ASSERT_GT(acknowledged, stored);
-        pass(static_cast<unsigned>(random() % 20'000'000));
+        busyFor(static_cast<unsigned>(random() % 20'000'000));
         child.kill();
         ASSERT_EQ(runSql(file, "PRAGMA integrity_check"), "ok") << "kill " << kill;
         Registry registry(file);

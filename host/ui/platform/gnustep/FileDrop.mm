@@ -14,6 +14,7 @@
 #include "host/ui/platform/gnustep/Behaviour.h"
 #include "host/ui/platform/gnustep/DisplayProbe.h"
 #include "host/ui/platform/gnustep/DropSelection.h"
+#include "host/ui/platform/gnustep/WindowDevice.h"
 
 // The dragging pasteboard of a drag from another program, as far as a drop target asks it.
 @interface TsDroppedFiles : NSObject
@@ -117,12 +118,6 @@ PostDragEvent toolkitPostDragEvent;
 
 // While what was dropped is dealt with, its source has heard that all is done.
 bool gSourceIsDismissed = false;
-
-unsigned long deviceOf(NSWindow* window)
-{
-    return reinterpret_cast<unsigned long>(
-        [GSServerForWindow(window) windowDevice:static_cast<int>([window windowNumber])]);
-}
 
 // A window behind the one that waits for an answer takes nothing.
 bool isOutOfReach(unsigned long window)

@@ -11,6 +11,7 @@
 
 #include "host/platform/gnustep/StandIn.h"
 #include "host/ui/platform/gnustep/Behaviour.h"
+#include "host/ui/platform/gnustep/WindowDevice.h"
 #include "host/ui/platform/gnustep/WindowHints.h"
 
 namespace tessel::windowing
@@ -35,13 +36,6 @@ NSWindow* ownerOf(NSWindow* window)
 {
     const auto found = gOwners.find(window);
     return found == gOwners.end() ? nil : found->second;
-}
-
-unsigned long deviceOf(NSWindow* window)
-{
-    return window ? reinterpret_cast<unsigned long>(
-                        [GSServerForWindow(window) windowDevice:static_cast<int>([window windowNumber])])
-                  : 0;
 }
 
 // A button that opens a window has not been let go, for the toolkit, before that window closes.
