@@ -1,4 +1,6 @@
 // The Startup Suite dialog over the main one.
+#include <cstdio>
+
 #include "tests/e2e_dialogs/DialogTest.h"
 
 using testing::HasSubstr;
@@ -81,6 +83,25 @@ TEST_F(DialogStartupSuite, KeepsAFileOutAtStartsByTheMenuOfItsRow)
     EXPECT_THAT(output, HasSubstr("second.lsp runs"));
     EXPECT_THAT(output, Not(HasSubstr("first.lsp runs")));
     EXPECT_THAT(output, HasSubstr("kept out at starts by DISABLE since "));
+}
+
+TEST_F(DialogStartupSuite, ShowsTipsInAsManyLinesAsTheyNeed)
+{
+    const std::string first = writeLisp(std::string(200, 'x') + ".lsp");
+    storeSuite({first});
+    runQuietly({"DISABLE " + first});
+    openSuite();
+    mScreen.moveOn(mSuite, places::kFirstSuiteRow);
+    std::string tip;
+    EXPECT_TRUE(comesTrue([&] { return !(tip = mScreen.window("Window")).empty(); }));
+    shoot("tip");
+    int width = 0;
+    int height = 0;
+    ASSERT_EQ(2, std::sscanf(mScreen.sizeOf(tip).c_str(), "%dx%d", &width, &height));
+    EXPECT_LT(width, 700);
+    EXPECT_GT(height, 60) << "four lines";
+    closeSuite();
+    closeAndEnd();
 }
 
 TEST_F(DialogStartupSuite, KeepsNothingOutThatIsNotThere)
