@@ -88,7 +88,6 @@ Result<> Host::makeParts()
     if (const Outcome& started = mParts->startedLisp; !started)
         return started.failure();
     mInterruptible = &mParts->lisp();
-    mParts->registry->tellProgressBy([this](const std::wstring& sentence) { mCommandLine.say(sentence); });
     mInterruptibleRegistry = &*mParts->registry;
     addCommands();
     return {};

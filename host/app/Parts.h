@@ -67,7 +67,11 @@ struct Parts
     const Layout layout = runningLayout();
     Published<CommandLine> commandLine{foundations.commandLine};
     Published<EndRequest> endRequest{foundations.endRequest};
-    Owned<Registry> registry{foundations.profileFolder / kRegistryFile};
+    Owned<Registry> registry{foundations.profileFolder / kRegistryFile, Registry::kBusyTimeout,
+                             [this](const std::wstring& sentence)
+                             {
+                                 foundations.commandLine.say(sentence);
+                             }};
     Profiles profiles{*registry, kProductRegistryRoot};
     Owned<SystemVariables> variables{&*registry, kProductRegistryRoot};
     Owned<RunningMarker> marker{foundations.profileFolder / kApplicationsFolder};

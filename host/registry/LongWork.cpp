@@ -6,7 +6,6 @@ namespace
 {
 constexpr unsigned kLookAtClock = 1024;         // values between two looks
 constexpr unsigned kWorthInterrupting = 10'000; // values, some hundredths of a second
-constexpr std::chrono::seconds kPatience{2};
 } // namespace
 
 void LongWork::count()
@@ -22,11 +21,11 @@ void LongWork::tell()
     if (now - mLast > kPatience)
         mTold = now;
     mLast = now;
-    if (now - mTold < kPatience || !mSay)
+    if (now - mTold < kPatience)
         return;
     mTold = now;
-    mSay(L"The registry has read or written " + std::to_wstring(mValues) +
-         L" values so far. Ctrl-C stops it.");
+    say(L"The registry has read or written " + std::to_wstring(mValues) +
+        L" values so far. Ctrl-C stops it.");
 }
 
 void LongWork::end()

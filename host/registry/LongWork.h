@@ -18,6 +18,15 @@ public:
     // Says from time to time how far the work has come; until this is called, nobody does.
     void tellBy(Say say) { mSay = std::move(say); }
 
+    void say(const std::wstring& sentence) const
+    {
+        if (mSay)
+            mSay(sentence);
+    }
+
+    // How long a person waits without a word.
+    static constexpr std::chrono::seconds kPatience{2};
+
     // One value more.
     void count();
 

@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <utility>
 
+#include "host/registry/LongStatements.h"
 #include "host/registry/Schema.h"
 #include "host/registry/SoundCopy.h"
 #include "host/registry/Soundness.h"
@@ -49,9 +50,10 @@ Failure noMoreValues()
 }
 } // namespace
 
-Registry::Registry(std::filesystem::path file, std::chrono::milliseconds busyTimeout)
+Registry::Registry(std::filesystem::path file, std::chrono::milliseconds busyTimeout, LongWork::Say say)
     : mFile(std::move(file)), mBusyTimeout(busyTimeout), mNextHandle(kFirstHandle)
 {
+    mWork.tellBy(std::move(say));
     open();
 }
 
@@ -316,6 +318,7 @@ Result<> Registry::checkBeforeRemoval()
 {
     if (mLookedAt)
         return {};
+    const LongStatements looking = whileIt(L"looks through");
     const auto sound = checkSoundness(mDatabase, kSchemaVersion);
     mLookedAt = static_cast<bool>(sound);
     return sound ? sound : giveUp(damage(sound.sentence()));

@@ -39,6 +39,7 @@ struct sqlite3;
 
 namespace tessel
 {
+class LongStatements;
 class Statement;
 
 class Registry
@@ -57,8 +58,10 @@ public:
 
     // Opens the file or makes it. A file that cannot be used is left as it is: reads then find nothing and
     // writes fail. A file that is damaged or may not be written is only read.
-    // A write waits that long for another process that is writing, and then fails.
-    explicit Registry(std::filesystem::path file, std::chrono::milliseconds busyTimeout = kBusyTimeout);
+    // A write waits that long for another process that is writing, and then fails. What goes through very
+    // much, the opening too, says by `say` how far it has come.
+    explicit Registry(std::filesystem::path file, std::chrono::milliseconds busyTimeout = kBusyTimeout,
+                      LongWork::Say say = {});
     ~Registry();
     Registry(const Registry&) = delete;
     Registry& operator=(const Registry&) = delete;
@@ -106,9 +109,6 @@ public:
     // about it. Nothing can be stored before the next session: what applications have read is older.
     Result<std::wstring> restoreCopy();
 
-    // Says by this how far a command has come that reads or writes very many values.
-    void tellProgressBy(LongWork::Say say) { mWork.tellBy(std::move(say)); }
-
     // Makes such a command fail, as a store that cannot be read does. Safe in a signal handler.
     void interrupt() noexcept { mWork.interrupt(); }
 
@@ -148,6 +148,8 @@ private:
     Result<> bringUpToDate(int version);
     Result<> prepareStatements();
     Result<> chooseJournal();
+    // What a person is told meanwhile; `deed` as in "looks through the registry".
+    LongStatements whileIt(const std::wstring& deed) const;
     void lookAtAll(int version);
     void renewCopy(bool changed);
     Failure damage(const std::wstring& reason);

@@ -9,6 +9,7 @@
 #include "host/platform/NetworkFolder.h"
 #include "host/platform/OrdinaryFile.h"
 #include "host/registry/Journals.h"
+#include "host/registry/LongStatements.h"
 #include "host/registry/Schema.h"
 #include "host/registry/SoundCopy.h"
 #include "host/registry/Soundness.h"
@@ -288,6 +289,12 @@ Result<> Registry::prepare()
     return journal;
 }
 
+LongStatements Registry::whileIt(const std::wstring& deed) const
+{
+    return {mDatabase, mWork,
+            L"Tessel " + deed + L" the registry " + toWide(mFile.string()) + L", which takes its time."};
+}
+
 // Damage is told at once. What is sound among it is read, each row on its own account.
 void Registry::lookAtAll(int version)
 {
@@ -295,6 +302,7 @@ void Registry::lookAtAll(int version)
     const bool old = version < kSchemaVersion;
     if (!old && !mLeftOpen && random() % startsBetweenLooks(mDatabase) != 0)
         return;
+    const LongStatements looking = whileIt(L"looks through");
     const auto sound = checkSoundness(mDatabase, version);
     mLookedAt = static_cast<bool>(sound);
     if (!sound)
@@ -318,6 +326,7 @@ Result<> Registry::bringUpToDate(int version)
         return mReadOnly ? Failure{L"it is empty and may not be written"} : makeTables(mDatabase);
     if (!mReadOnly && mCanStore)
     {
+        const LongStatements changing = whileIt(L"brings up to date");
         const auto changed = addChecksums(mDatabase);
         if (changed)
             return changed;

@@ -31,6 +31,22 @@ constexpr const char* kHugeHistory =
     "COMMIT;";
 } // namespace
 
+TEST(HugeHistory, IsToldAboutWhileItsRegistryIsLookedThrough)
+{
+    HostSession session;
+    const auto file = session.profile() / "registry.db";
+    std::filesystem::create_directories(session.profile());
+    ASSERT_EQ(runSql(file, kHugeHistory), "");
+    session.set("LD_PRELOAD", FAULTY_CALLS);
+    session.set("MODRIG_FAULT_DELAY", "100");
+    const auto result = session.start({"--safe", "-c", "VERSION"});
+    EXPECT_EQ(result.exitStatus, 0);
+    EXPECT_NE(result.output.find("Tessel looks through the registry " + file.string() +
+                                 ", which takes its time.\n"),
+              std::string::npos)
+        << result.output;
+}
+
 TEST(HugeHistory, IsToldAboutWhileItIsReadAndKeptWhenThePersonStopsThat)
 {
     HostSession session;
