@@ -97,10 +97,9 @@ Result<> Host::makeParts()
 void Host::tellOfRegistry()
 {
     Registry& registry = *mParts->registry;
-    const auto read = registry.endOfCommand();
-    mCommandLine.tell(registry.canStore());
-    if (read.sentence() != registry.canStore().sentence())
-        mCommandLine.tell(read);
+    if (!mCommandLine.tell(registry.canStore()))
+        if (const auto read = registry.endOfCommand(); read.sentence() != registry.canStore().sentence())
+            mCommandLine.tell(read);
     if (!registry.notice().empty())
         mCommandLine.say(registry.notice());
 }

@@ -10,10 +10,10 @@ constexpr int kStepsBetweenLooks = 10'000; // of the store's own machine: less t
 constexpr int kGoOn = 0;
 } // namespace
 
-LongStatements::LongStatements(sqlite3* database, const LongWork& work, std::wstring sentence)
-    : mDatabase(database), mWork(work), mSentence(std::move(sentence)),
-      mEnd(std::chrono::steady_clock::now() + LongWork::kPatience)
+LongStatements::LongStatements(sqlite3* database, LongWork& work, std::wstring sentence)
+    : mDatabase(database), mWork(work), mSentence(std::move(sentence))
 {
+    mWork.begin();
     sqlite3_progress_handler(mDatabase, kStepsBetweenLooks, look, this);
 }
 
@@ -25,10 +25,8 @@ LongStatements::~LongStatements()
 int LongStatements::look(void* object)
 {
     auto& self = *static_cast<LongStatements*>(object);
-    if (self.mSaid || std::chrono::steady_clock::now() < self.mEnd)
-        return kGoOn;
-    self.mSaid = true;
-    self.mWork.say(self.mSentence);
+    if (self.mWork.isLong() && !std::exchange(self.mSaid, true))
+        self.mWork.say(self.mSentence);
     return kGoOn;
 }
 } // namespace tessel

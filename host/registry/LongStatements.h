@@ -4,7 +4,6 @@
 
 #include <sqlite3.h>
 
-#include <chrono>
 #include <string>
 
 #include "host/registry/LongWork.h"
@@ -15,7 +14,7 @@ namespace tessel
 class LongStatements
 {
 public:
-    LongStatements(sqlite3* database, const LongWork& work, std::wstring sentence);
+    LongStatements(sqlite3* database, LongWork& work, std::wstring sentence);
     ~LongStatements();
     LongStatements(const LongStatements&) = delete;
     LongStatements& operator=(const LongStatements&) = delete;
@@ -24,9 +23,8 @@ private:
     static int look(void* object);
 
     sqlite3* mDatabase;
-    const LongWork& mWork;
+    LongWork& mWork;
     const std::wstring mSentence;
-    const std::chrono::steady_clock::time_point mEnd; // of patience
     bool mSaid = false;
 };
 } // namespace tessel

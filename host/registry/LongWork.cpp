@@ -5,6 +5,7 @@ namespace tessel
 namespace
 {
 constexpr unsigned kLookAtClock = 1024;         // values between two looks
+constexpr std::chrono::seconds kPatience{2};    // without a word
 constexpr unsigned kWorthInterrupting = 10'000; // values, some hundredths of a second
 } // namespace
 
@@ -15,15 +16,28 @@ void LongWork::count()
 }
 
 // Values that come now and then, while something else is done, are no work to wait for.
-void LongWork::tell()
+void LongWork::begin()
 {
     const auto now = Clock::now();
     if (now - mLast > kPatience)
         mTold = now;
     mLast = now;
-    if (now - mTold < kPatience)
+}
+
+bool LongWork::isLong()
+{
+    mLast = Clock::now();
+    if (mLast - mTold < kPatience)
+        return false;
+    mTold = mLast;
+    return true;
+}
+
+void LongWork::tell()
+{
+    begin();
+    if (!isLong())
         return;
-    mTold = now;
     say(L"The registry has read or written " + std::to_wstring(mValues) +
         L" values so far. Ctrl-C stops it.");
 }

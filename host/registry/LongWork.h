@@ -24,8 +24,10 @@ public:
             mSay(sentence);
     }
 
-    // How long a person waits without a word.
-    static constexpr std::chrono::seconds kPatience{2};
+    // Work begins, or goes on: what comes shortly after other work is part of it.
+    void begin();
+    // Work goes on. Whether a person has waited for a word since it began, or for another one.
+    bool isLong();
 
     // One value more.
     void count();

@@ -149,7 +149,7 @@ private:
     Result<> prepareStatements();
     Result<> chooseJournal();
     // What a person is told meanwhile; `deed` as in "looks through the registry".
-    LongStatements whileIt(const std::wstring& deed) const;
+    LongStatements whileIt(const std::wstring& deed);
     void lookAtAll(int version);
     void renewCopy(bool changed);
     Failure damage(const std::wstring& reason);

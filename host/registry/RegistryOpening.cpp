@@ -289,7 +289,7 @@ Result<> Registry::prepare()
     return journal;
 }
 
-LongStatements Registry::whileIt(const std::wstring& deed) const
+LongStatements Registry::whileIt(const std::wstring& deed)
 {
     return {mDatabase, mWork,
             L"Tessel " + deed + L" the registry " + toWide(mFile.string()) + L", which takes its time."};

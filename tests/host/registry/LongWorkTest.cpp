@@ -1,5 +1,6 @@
 #include "host/registry/LongWork.h"
 
+#include <chrono>
 #include <thread>
 
 #include <gtest/gtest.h>
@@ -48,4 +49,25 @@ TEST(LongWork, IsNotStoppedByTheKeyThatWasMeantForTheWorkBefore)
     over = true;
     leaning.join();
     EXPECT_EQ(wronglyStopped, 0);
+}
+
+// Of whatever kind it is: what begins shortly after other work goes on with it.
+TEST(LongWork, IsToldOnceAPersonHasWaitedTwoSeconds)
+{
+    const auto wait = []
+    {
+        std::this_thread::sleep_for(std::chrono::milliseconds(1100));
+    };
+    LongWork work;
+    work.begin();
+    wait();
+    EXPECT_FALSE(work.isLong());
+    work.begin();
+    wait();
+    EXPECT_TRUE(work.isLong());
+    EXPECT_FALSE(work.isLong()) << "it has just been told";
+    work.end();
+    work.begin();
+    wait();
+    EXPECT_FALSE(work.isLong()) << "another command begins again";
 }
