@@ -353,8 +353,7 @@ Result<> Registry::prepareStatements()
 Result<> Registry::chooseJournal()
 {
     const bool network = isOnNetwork(mFile.parent_path().string());
-    const auto kind =
-        firstText(mDatabase, network ? "PRAGMA journal_mode=DELETE" : "PRAGMA journal_mode=WAL");
+    const auto kind = firstText(mDatabase, network ? kUseJournal : kUseLog);
     if (network && (!kind || *kind != L"delete"))
         return Failure{
             L"it lies in a folder of the network, and another session has it open as if it did not"};
