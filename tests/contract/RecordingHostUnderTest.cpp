@@ -29,7 +29,7 @@ RecordingLinker::EntryPoint entryPoint(ContractModule behaviour)
     }
 }
 
-class RecordingHostUnderTest : public HostUnderTest
+class RecordingHostUnderTest final : public HostUnderTest
 {
 public:
     RecordingHostUnderTest()

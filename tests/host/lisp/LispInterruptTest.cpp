@@ -116,6 +116,7 @@ TEST(LispInterruptFromAnywhere, MayComeFromASignalHandler)
     session.onOutput([](std::string_view) { std::raise(SIGINT); });
     EXPECT_EQ(session.error("(princ \"begun\") (loop)"), "Lisp was interrupted.");
     std::signal(SIGINT, previous);
+    current = nullptr;
 }
 
 TEST(LispInterruptFromAnywhere, MayComeFromAnotherThread)
