@@ -5,7 +5,7 @@ using testing::AllOf;
 using testing::HasSubstr;
 using testing::Not;
 
-class DialogBrowser : public DialogTest
+class DialogPanelLoad : public DialogTest
 {
 protected:
     // With Add to History switched on.
@@ -29,7 +29,7 @@ protected:
     }
 };
 
-TEST_F(DialogBrowser, LoadsTwoFilesThatAreSelectedTogether)
+TEST_F(DialogPanelLoad, LoadsTwoFilesThatAreSelectedTogether)
 {
     loadGearsAndPrimesTogether();
     const std::string output = closeAndEnd();
@@ -40,7 +40,7 @@ TEST_F(DialogBrowser, LoadsTwoFilesThatAreSelectedTogether)
 }
 
 // Each row does what only its own file can have done.
-TEST_F(DialogBrowser, ShowsTwoLoadedFilesInBothTables)
+TEST_F(DialogPanelLoad, ShowsTwoLoadedFilesInBothTables)
 {
     loadGearsAndPrimesTogether();
     click(places::tableRow(0));
@@ -61,7 +61,7 @@ TEST_F(DialogBrowser, ShowsTwoLoadedFilesInBothTables)
     closeAndEnd();
 }
 
-TEST_F(DialogBrowser, ReturnLoadsTheFileWhoseNameIsTyped)
+TEST_F(DialogPanelLoad, ReturnLoadsTheFileWhoseNameIsTyped)
 {
     writeLisp("typed.lsp");
     open();
@@ -75,7 +75,7 @@ TEST_F(DialogBrowser, ReturnLoadsTheFileWhoseNameIsTyped)
     EXPECT_THAT(output, HasSubstr(listedIn("typed.lsp", files())));
 }
 
-TEST_F(DialogBrowser, LoadsTheFileWhoseNameIsTyped)
+TEST_F(DialogPanelLoad, LoadsTheFileWhoseNameIsTyped)
 {
     writeLisp("typed.lsp");
     open();
@@ -87,7 +87,7 @@ TEST_F(DialogBrowser, LoadsTheFileWhoseNameIsTyped)
     EXPECT_THAT(closeAndEnd(), HasSubstr("typed.lsp runs"));
 }
 
-TEST_F(DialogBrowser, ReturnLoadsTheFileThatIsSelected)
+TEST_F(DialogPanelLoad, ReturnLoadsTheFileThatIsSelected)
 {
     writeLisp("chosen.lsp");
     open();
@@ -98,7 +98,7 @@ TEST_F(DialogBrowser, ReturnLoadsTheFileThatIsSelected)
     EXPECT_THAT(closeAndEnd(), HasSubstr("chosen.lsp runs"));
 }
 
-TEST_F(DialogBrowser, LoadsAFileByADoubleClick)
+TEST_F(DialogPanelLoad, LoadsAFileByADoubleClick)
 {
     writeLisp("a.lsp");
     writeLisp("b.lsp");
@@ -112,7 +112,7 @@ TEST_F(DialogBrowser, LoadsAFileByADoubleClick)
     EXPECT_THAT(output, Not(HasSubstr("a.lsp")));
 }
 
-TEST_F(DialogBrowser, SaysThatAFileIsLoadedAlready)
+TEST_F(DialogPanelLoad, SaysThatAFileIsLoadedAlready)
 {
     copySample("gears.omp");
     open();
@@ -126,7 +126,7 @@ TEST_F(DialogBrowser, SaysThatAFileIsLoadedAlready)
     EXPECT_EQ(output.find(listed), output.rfind(listed)) << "one entry: " << output;
 }
 
-TEST_F(DialogBrowser, StopsAtTheFileThatCannotBeLoaded)
+TEST_F(DialogPanelLoad, StopsAtTheFileThatCannotBeLoaded)
 {
     writeLisp("a.lsp");
     writeBroken("b.zmb");
@@ -149,7 +149,7 @@ TEST_F(DialogBrowser, StopsAtTheFileThatCannotBeLoaded)
 }
 
 // Names that another system wrote in another encoding.
-TEST_F(DialogBrowser, LoadsFilesWhoseNamesAreNoTextAndFindsThemAgain)
+TEST_F(DialogPanelLoad, LoadsFilesWhoseNamesAreNoTextAndFindsThemAgain)
 {
     mSession.folder().write("files/r\xE9pertoire/odd\xFF.lsp", "(write-line \"odd Lisp runs\")\n");
     std::filesystem::copy(std::filesystem::path(SAMPLES_FOLDER) / "gears.omp",
@@ -176,7 +176,7 @@ TEST_F(DialogBrowser, LoadsFilesWhoseNamesAreNoTextAndFindsThemAgain)
     EXPECT_THAT(closeAndEnd(), AllOf(HasSubstr("odd Lisp runs"), HasSubstr("  gears\\xFE.omp ")));
 }
 
-TEST_F(DialogBrowser, OpensWithTheColumnsAndTheHiddenFilesThatItWasLeftWith)
+TEST_F(DialogPanelLoad, OpensWithTheColumnsAndTheHiddenFilesThatItWasLeftWith)
 {
     writeLisp(".hidden.lsp");
     open();
@@ -195,7 +195,7 @@ TEST_F(DialogBrowser, OpensWithTheColumnsAndTheHiddenFilesThatItWasLeftWith)
     EXPECT_THAT(width, HasSubstr("\n2")) << "some hundred points more than before: " << width;
 }
 
-TEST_F(DialogBrowser, ShowsTheFilesOfTheChosenTypeOnly)
+TEST_F(DialogPanelLoad, ShowsTheFilesOfTheChosenTypeOnly)
 {
     copySample("gears.omp");
     writeLisp("z.lsp");
@@ -209,7 +209,7 @@ TEST_F(DialogBrowser, ShowsTheFilesOfTheChosenTypeOnly)
     EXPECT_THAT(closeAndEnd(), HasSubstr("z.lsp runs"));
 }
 
-TEST_F(DialogBrowser, LoadsNothingThatTheChosenTypeHides)
+TEST_F(DialogPanelLoad, LoadsNothingThatTheChosenTypeHides)
 {
     copySample("gears.omp");
     writeLisp("z.lsp");
