@@ -148,7 +148,7 @@ TEST_F(LispLoader, TakesThePromptFromTheTexts)
     EXPECT_TRUE(LoadLispFile(L"/a/tool.lsp", 1, 0));
     ASSERT_FALSE(queued().empty());
     EXPECT_EQ(L"(prompt \"100%s> \")", queued().back());
-    host().resources.removeText(kResourceModuleName, 15);
+    host().resources.removeText(kResourceModuleName, ModrigMessages::kLispPrompt);
     EXPECT_TRUE(LoadLispFile(L"/a/tool.lsp", 1, 0));
     EXPECT_EQ(L"(prompt \" \")", queued().back());
 }

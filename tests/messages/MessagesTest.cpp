@@ -82,7 +82,7 @@ TEST_F(Messages, NameNothingForAPathThatIsTooLongToBeTakenApart)
 
 TEST_F(Messages, AreAnEmptyLineAndAnEmptyBoxWhenTheirTextIsMissing)
 {
-    host().resources.removeText(kResourceModuleName, 12);
+    host().resources.removeText(kResourceModuleName, ModrigMessages::kOneUnloaded);
     ModrigCmdlineMessage(ModrigMessages::kOneUnloaded, CStdStr(L"/a/tool.lsp"));
     ModrigCmdlineMessage(ModrigMessages::kOneUnloaded, CStdStr());
     ModrigCmdlineMessage(ModrigMessages::kOneUnloaded, 5u);
