@@ -19,7 +19,7 @@ bool isCalled(const std::wstring& path, const std::wstring& name)
 
 bool isSameFile(const std::wstring& path, const std::wstring& other)
 {
-    std::error_code failed; // what is not there is no other file than itself
+    std::error_code failed; // a file that is not there is the same as no other
     return path == other || std::filesystem::equivalent(toPath(path), toPath(other), failed);
 }
 

@@ -1,7 +1,8 @@
 // The parts of the running host, listed once: in the order in which they are made, each given those before it
 // that it needs. They are taken down in the reverse order.
 //
-// The owned ones are also what the SDK's free functions find (see `running` in host/text/Running.h).
+// The owned and the published ones are also what the SDK's free functions find (see `running` in
+// host/text/Running.h).
 #pragma once
 
 #include <filesystem>

@@ -134,7 +134,7 @@ std::wstring whatHappened(const KeptOutApplication& application)
            toWide(wordsFor(application.reason)) + L"): " + toWide(wordsForEnding(application.ending));
 }
 
-// Gone is not changed: there is nothing else to be tried.
+// A file that is gone counts as unchanged: there is no new version of it to try.
 bool isUnchanged(KeptOutApplication& application)
 {
     const auto facts = factsOf(application.path);
@@ -148,7 +148,8 @@ bool isUnchanged(KeptOutApplication& application)
     return true;
 }
 
-// Whoever leaves or switches off while a window waits for them has nothing to complain of.
+// An application is not to blame when the session was ended from outside while it waited for the person: they
+// left Tessel or switched the computer off.
 bool isGuilty(const RunningMarker::Leftover& leftover)
 {
     const bool fromOutside = leftover.ending == RunningMarker::kVanished ||

@@ -26,8 +26,9 @@ std::wstring linkersWords(const std::string& program)
     return toWide(withReadableSymbols(words.starts_with(start) ? words.substr(start.size()) : words));
 }
 
-// The headers promise that these never throw, and the compiler believes them; but the code that they call
-// may. What it cannot see through it calls with care.
+// The system's headers declare that these never throw, so the compiler leaves out what an exception needs to
+// pass a call of them. But they run the library's own code, which may throw. Called through a volatile
+// pointer, they are any functions to the compiler.
 void* (*volatile const openLibrary)(const char* path, int mode) = dlopen;
 int (*volatile const closeLibrary)(void* library) = dlclose;
 

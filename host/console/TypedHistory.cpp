@@ -143,7 +143,7 @@ void shorten(const std::filesystem::path& path)
     std::string kept = std::string(kFormat) + "\n";
     for (std::size_t index = lines.size() - kMostHistoryLines; index < lines.size(); ++index)
         kept.append(lines[index]).append("\n");
-    static_cast<void>(replaceFile(path, kept)); // the long one does as well
+    static_cast<void>(replaceFile(path, kept)); // when it fails the long file stays, and serves
 }
 } // namespace
 

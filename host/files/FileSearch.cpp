@@ -23,7 +23,8 @@ bool isThere(const std::filesystem::path& path)
     return std::filesystem::exists(path, unreachable);
 }
 
-// Nothing below a current folder that was removed: what is still found there by ".." has no path.
+// None while the current folder is one that was removed: there is no path to it, nor to what ".." finds from
+// it.
 std::optional<std::filesystem::path> absolutePath(const std::filesystem::path& path)
 {
     std::error_code gone;

@@ -109,7 +109,8 @@ public:
     // about it. Nothing can be stored before the next session: what applications have read is older.
     Result<std::wstring> restoreCopy();
 
-    // Makes such a command fail, as a store that cannot be read does. Safe in a signal handler.
+    // Stops reading or writing that takes long: what the command in which it happens reads from then on
+    // fails, as from a store that cannot be read. Safe in a signal handler.
     void interrupt() noexcept { mWork.interrupt(); }
 
     // Handles for the registry calls. A handle that is not open is recognised, never followed.

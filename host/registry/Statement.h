@@ -1,4 +1,4 @@
-// One prepared statement of the store, run and reset. Used by Registry.cpp alone.
+// One prepared statement of the store, run and reset. For the files of this room alone.
 #pragma once
 
 #include <sqlite3.h>

@@ -2,7 +2,7 @@
 
 @implementation ModrigArrayController (Membership)
 
-// Rows that came by another way, all of them at once, are found by their number.
+// Rows that were set all at once were not noted: their count differs then from that of the known ones.
 - (NSMutableSet*)knownRows
 {
     NSArray* rows = [self arrangedObjects];

@@ -151,7 +151,8 @@ bool hasSelection(NSArrayController* rows)
     NSIndexSet* staying = ModrigUtils::SetFromIndexes(
         ModrigUtils::SelectableOf(ModrigUtils::IndexesFromSet([loadedApps selectionIndexes]), mayBeSelected));
     [loadedApps setSelectionIndexes:staying];
-    // The binding is silent while it is at work itself.
+    // While the binding hands the selection of the table over to the rows, it does not pass a change of
+    // theirs back: the table is told here.
     [loadedAppsTableView selectRowIndexes:staying byExtendingSelection:NO];
     self.canUnloadApp = hasSelection(loadedApps);
 }

@@ -1,4 +1,5 @@
-// The Load/Unload Applications dialog: a file panel of the system, with this controller's view in it.
+// The Load/Unload Applications dialog: the host's file panel (tesselui/tsuifilepanel.h), with this
+// controller's view in it.
 //
 // The module's lists are the truth; the array controllers show them, and every action changes both. There is
 // one dialog at a time (see `TsOCModrigUtil`). Main thread only.

@@ -43,7 +43,7 @@
     [super dealloc];
 }
 
-// An empty text, and none: a field that is bound to nothing says so.
+// An empty text and not nil: a field that is bound to nil shows words of the toolkit's.
 - (void)clearMessage
 {
     self.message = @"";

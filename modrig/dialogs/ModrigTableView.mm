@@ -160,7 +160,7 @@ NSString* ModrigUtils::HelpKey()
         return [self copyPathsOf:rows];
     case TableAction::kKeepOut:
         ModrigUtils::KeepAllOut([self pathsInRows:rows]);
-        return [self setNeedsDisplay:YES]; // they look it
+        return [self setNeedsDisplay:YES]; // what is kept out is grey
     case TableAction::kLetIn:
         ModrigUtils::LetAllIn([self pathsInRows:rows]);
         return [self setNeedsDisplay:YES];

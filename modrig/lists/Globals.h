@@ -1,7 +1,8 @@
-// What the module owns for its whole lifetime. Main thread only.
+// The lists and what else the module's parts share. Main thread only.
 //
-// All of it is defined in Globals.cpp, in the order of construction: the application types table, then the
-// three lists. Everything exists before the host first calls the entry point.
+// They are defined in Globals.cpp together with the application types table (ApplicationTypes.h), because
+// they have to be constructed in order: the table, then the three lists. All exist before the host first
+// calls the entry point. What needs no order stands where it is used.
 #pragma once
 
 #include "modrig/base/CStringList.h"

@@ -50,7 +50,7 @@ int gTextsGone = 0;
     return [self retain];
 }
 
-// It leads nowhere, and what it is made of it is itself.
+// The parts of the path are this same object: a row keeps it three times, and no other text in its place.
 - (NSString*)stringByResolvingSymlinksInPath
 {
     return self;

@@ -136,7 +136,7 @@ void OpenDialogTest::close()
 {
     if (!mController)
         return;
-    [mPanel orderOut:nil]; // the panel is shared, and a test may have shown it
+    [mPanel orderOut:nil]; // a test may have shown it
     [mController cleanOpenPanel:mPanel];
     [mController release];
     mController = nil;

@@ -42,14 +42,15 @@ BOOL tabsResign(id tabs, SEL selector)
 using SetUpEditor = NSText* (*)(id, SEL, NSText*);
 SetUpEditor toolkitSetUpEditor;
 
-// A field stays as it was drawn when its editor comes.
+// The toolkit does not draw a field again when the window's editor comes to it, so that its focus would not
+// show.
 NSText* setUpEditor(id cell, SEL selector, NSText* editor)
 {
     [[cell controlView] setNeedsDisplay:YES];
     return toolkitSetUpEditor(cell, selector, editor);
 }
 
-// And when it goes.
+// Nor does it when the editor goes, and the focus would stay.
 void fieldEnds(id field, SEL selector, NSNotification* end)
 {
     toolkitFieldEnds(field, selector, end);
