@@ -20,15 +20,10 @@
 
 namespace
 {
-// Answers NO when the table has a row for that file already.
-BOOL insertRow(ModrigFilePath* row, NSArrayController* table, int insertRow)
+void insertRow(ModrigFilePath* row, NSArrayController* table, int insertRow)
 {
-    auto* rows = (ModrigArrayController*)table;
-    if ([rows holds:row])
-        return NO;
-    const NSUInteger count = [[rows arrangedObjects] count];
-    [rows insertObject:row atArrangedObjectIndex:ModrigUtils::RowForInsertion(insertRow, count)];
-    return YES;
+    const NSUInteger count = [[table arrangedObjects] count];
+    [table insertObject:row atArrangedObjectIndex:ModrigUtils::RowForInsertion(insertRow, count)];
 }
 
 void scrollToLastRow(NSTableView* table, NSArrayController* rows)
@@ -95,17 +90,30 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
     ModrigUtils::OnCommandHelp(ModrigUtils::kMainDialogHelp);
 }
 
+- (ModrigArrayController*)rowsOfKind:(ModrigUtils::TableKind)kind
+{
+    return (ModrigArrayController*)(kind == ModrigUtils::TableKind::kHistory ? historyList : loadedApps);
+}
+
+- (void)addRow:(ModrigFilePath*)row toTable:(ModrigUtils::TableKind)kind
+{
+    insertRow(row, [self rowsOfKind:kind], mInsertRow);
+    if (kind == ModrigUtils::TableKind::kHistory)
+        [self chooseFromHistory]; // new rows come selected, and not every toolkit tells of that
+    else
+        [self keepToUnloadableRows]; // a row in the place of the selected one is no change of the selection
+}
+
 - (void)addRowsFor:(NSString*)path
 {
     // Thousands of files may be loaded in one go.
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
     ModrigFilePath* row = [[[ModrigFilePath alloc] initWithFilePathName:path] autorelease];
-    // A row that comes in the place of the selected one does not count as a change of the selection.
-    if (insertRow(row, loadedApps, mInsertRow))
-        [self keepToUnloadableRows];
-    // New rows come selected, and not every toolkit tells of that.
-    if (mbSaveHistory && insertRow(row, historyList, mInsertRow))
-        [self chooseFromHistory];
+    const auto tables = ModrigUtils::TablesToJoin(mbSaveHistory,
+                                                  [=](ModrigUtils::TableKind kind) -> bool
+                                                  { return [[self rowsOfKind:kind] holds:row]; });
+    for (const ModrigUtils::TableKind kind : tables)
+        [self addRow:row toTable:kind];
     [pool drain];
 }
 

@@ -147,7 +147,7 @@
 
 - (BOOL)isTesselFolder:(NSString*)path
 {
-    return path && [path caseInsensitiveCompare:[[NSBundle mainBundle] bundlePath]] == NSOrderedSame;
+    return ModrigUtils::AreSamePath(path, [[NSBundle mainBundle] bundlePath]);
 }
 
 @end

@@ -4,6 +4,7 @@
 
 #include <string>
 
+#include "modrig/dialogs/Paths.h"
 #include "modrig/dialogs/model/PathHash.h"
 #include "modrig/loader/LoadedApplications.h"
 
@@ -62,12 +63,8 @@
 
 - (BOOL)isEqual:(id)other
 {
-    if (![other isKindOfClass:[self class]])
-        return NO;
-    NSString* path = [other filePathName];
-    if (!mFilePathName || !path)
-        return mFilePathName == path;
-    return [mFilePathName caseInsensitiveCompare:path] == NSOrderedSame;
+    return
+        [other isKindOfClass:[self class]] && ModrigUtils::AreSamePath(mFilePathName, [other filePathName]);
 }
 
 - (NSUInteger)hash

@@ -10,7 +10,6 @@
 #include "modrig/dialogs/model/KeepingOut.h"
 #include "modrig/dialogs/model/RowSelection.h"
 #include "modrig/dialogs/model/RowSteps.h"
-#include "modrig/dialogs/model/ShownText.h"
 #include "modrig/dialogs/model/TypedLetters.h"
 #include "modrig/dialogs/platform/Desktop.h"
 #include "modrig/dialogs/platform/Platform.h"
@@ -52,6 +51,11 @@ ModrigUtils::RowTest mayBeSelectedIn(NSTableView* table)
 {
     return [=](std::size_t row) -> bool
     { return [(id)[table delegate] tableView:table shouldSelectRow:static_cast<NSInteger>(row)]; };
+}
+
+CStdStr textOfKey(const char* key)
+{
+    return ModrigUtils::PathFromString([TsOCModrigUtil modrigLoadString:[NSString stringWithUTF8String:key]]);
 }
 
 void copyToPasteboard(NSString* text)
@@ -341,15 +345,10 @@ NSString* ModrigUtils::HelpKey()
     ModrigFilePath* file = [self fileInRow:row];
     if (!file)
         return nil;
-    NSString* path = ModrigUtils::StringFromPath(ModrigUtils::ShownText([file path]));
-    const CStdStr whyKeptOut = ModrigUtils::WhyKeptOut([file path]);
-    if (!whyKeptOut.IsEmpty())
-        return [NSString stringWithFormat:@"%@\n%@", path, ModrigUtils::StringFromPath(whyKeptOut)];
-    const char* reason = ModrigUtils::ReasonKey([self stateOfFile:file]);
-    if (!reason)
-        return path;
-    NSString* why = [TsOCModrigUtil modrigLoadString:[NSString stringWithUTF8String:reason]];
-    return [NSString stringWithFormat:@"%@\n%@", path, why];
+    const CStdStr path = [file path];
+    const CStdStr tip =
+        ModrigUtils::TipOfRow(path, ModrigUtils::WhyKeptOut(path), [self stateOfFile:file], textOfKey);
+    return ModrigUtils::StringFromPath(tip);
 }
 
 @end

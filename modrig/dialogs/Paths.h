@@ -28,6 +28,10 @@ NSIndexSet* SetFromIndexes(const std::vector<std::size_t>& indexes);
 // What a column shows of a row; nil for a row that is not there.
 id ValueInRow(NSArrayController* rows, NSTableColumn* column, NSInteger row);
 
+// Whether the dialogs take both for the same file: by the toolkit's rule, for which accents, too, may be
+// written in two ways, and case does not matter. No path is the same as none.
+bool AreSamePath(NSString* path, NSString* other);
+
 CStdStr PathFromString(NSString* text);
 NSString* StringFromPath(const CStdStr& path);
 // Of a list, or of any other row of paths.

@@ -67,6 +67,13 @@ id ValueInRow(NSArrayController* rows, NSTableColumn* column, NSInteger row)
     return StringFromPath(ShownText(PathFromString(value)));
 }
 
+bool AreSamePath(NSString* path, NSString* other)
+{
+    if (!path || !other)
+        return path == other;
+    return [path caseInsensitiveCompare:other] == NSOrderedSame;
+}
+
 CStdStr PathFromString(NSString* text)
 {
     return CStdStr(NSStringToWstring(text));

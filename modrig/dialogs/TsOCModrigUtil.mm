@@ -8,6 +8,8 @@
 #import "modrig/dialogs/ModrigController.h"
 #import "modrig/dialogs/ModrigFilePath.h"
 
+#include "modrig/dialogs/Paths.h"
+#include "modrig/dialogs/model/RowInsertion.h"
 #include "modrig/types/FileFilters.h"
 #include "modrig/types/FileValidation.h"
 
@@ -18,6 +20,19 @@ ModrigController* gModrigController = nil;
 CStdStr wide(NSString* text)
 {
     return CStdStr(NSStringToWstring(text));
+}
+
+NSArray* rowsOf(NSArray* paths)
+{
+    NSMutableArray* rows = [NSMutableArray arrayWithCapacity:[paths count]];
+    for (NSString* path : tsuiEach<NSString*>(paths))
+    {
+        ModrigFilePath* row =
+            [[ModrigFilePath alloc] initWithResolvedPath:[path stringByResolvingSymlinksInPath]];
+        [rows addObject:row];
+        [row release];
+    }
+    return rows;
 }
 } // namespace
 
@@ -42,20 +57,15 @@ CStdStr wide(NSString* text)
 
 + (void)addPathNames:(NSArray*)paths toArrayController:(NSArrayController*)controller
 {
-    NSMutableSet* known = [NSMutableSet setWithArray:[controller arrangedObjects]];
-    NSMutableArray* rows = [NSMutableArray array];
-    for (NSString* path : tsuiEach<NSString*>(paths))
-    {
-        ModrigFilePath* row =
-            [[ModrigFilePath alloc] initWithResolvedPath:[path stringByResolvingSymlinksInPath]];
-        const NSUInteger before = [known count];
-        [known addObject:row];
-        if ([known count] > before)
-            [rows addObject:row];
-        [row release];
-    }
-    if ([rows count])
-        [controller addObjects:rows];
+    NSArray* candidates = rowsOf(paths);
+    NSMutableSet* rows = [NSMutableSet setWithArray:[controller arrangedObjects]];
+    ModrigUtils::KnownRows known;
+    known.holds = [=](std::size_t index) -> bool
+    { return [rows containsObject:[candidates objectAtIndex:index]]; };
+    known.add = [=](std::size_t index) { [rows addObject:[candidates objectAtIndex:index]]; };
+    const auto added = ModrigUtils::NewRows([candidates count], known);
+    if (!added.empty())
+        [controller addObjects:[candidates objectsAtIndexes:ModrigUtils::SetFromIndexes(added)]];
 }
 
 + (void)fill:(NSArrayController*)controller withPathNames:(NSArray*)paths

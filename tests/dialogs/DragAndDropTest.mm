@@ -10,6 +10,7 @@
 
 using testing::ElementsAre;
 using testing::IsEmpty;
+using testing::UnorderedElementsAre;
 
 namespace
 {
@@ -167,6 +168,17 @@ TEST_F(Dropping, InsertsIntoAShorterHistoryAtItsEnd)
     EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("m0.zmb"), file("m1.zmb"), file("two.zmb"),
                                                   file("one.zmb"), file("m2.zmb")));
     EXPECT_THAT(rowsOf(historyList()), ElementsAre(file("old.zmb"), file("one.zmb"), file("two.zmb")));
+}
+
+// The list goes by applications, the table by files.
+TEST_F(Dropping, ShowsInTheHistoryAnObjectModuleThatItsListKnowsFromElsewhere)
+{
+    gHistoryList.AddTail(CStdStr(L"/elsewhere/one.omp"));
+    open();
+    [mController setSaveHistory:YES];
+    drop(loadedTable(), paths({"one.omp"}), 0);
+    EXPECT_THAT(Texts(gHistoryList), ElementsAre(L"/elsewhere/one.omp"));
+    EXPECT_THAT(rowsOf(historyList()), UnorderedElementsAre(file("one.omp"), L"/elsewhere/one.omp"));
 }
 
 TEST_F(Dropping, AppendsAgainAfterwards)

@@ -8,4 +8,27 @@ std::size_t RowForInsertion(int insertRow, std::size_t rows)
 {
     return insertRow < 0 ? rows : std::min(static_cast<std::size_t>(insertRow), rows);
 }
+
+std::vector<TableKind> TablesToJoin(bool savesHistory, const std::function<bool(TableKind)>& holds)
+{
+    std::vector<TableKind> tables;
+    if (!holds(TableKind::kLoadedApplications))
+        tables.push_back(TableKind::kLoadedApplications);
+    if (savesHistory && !holds(TableKind::kHistory))
+        tables.push_back(TableKind::kHistory);
+    return tables;
+}
+
+std::vector<std::size_t> NewRows(std::size_t candidates, const KnownRows& known)
+{
+    std::vector<std::size_t> rows;
+    for (std::size_t candidate = 0; candidate < candidates; ++candidate)
+    {
+        if (known.holds(candidate))
+            continue;
+        known.add(candidate);
+        rows.push_back(candidate);
+    }
+    return rows;
+}
 } // namespace ModrigUtils

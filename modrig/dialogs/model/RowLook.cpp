@@ -2,6 +2,8 @@
 
 #include <string>
 
+#include "modrig/dialogs/model/ShownText.h"
+
 namespace ModrigUtils
 {
 namespace
@@ -50,6 +52,16 @@ const char* ReasonKey(RowState state)
     default:
         return nullptr;
     }
+}
+
+CStdStr TipOfRow(const CStdStr& path, const CStdStr& whyKeptOut, RowState state,
+                 const std::function<CStdStr(const char*)>& textOf)
+{
+    const CStdStr shown = ShownText(path);
+    if (!whyKeptOut.IsEmpty())
+        return shown + CStdStr(L"\n") + whyKeptOut;
+    const char* reason = ReasonKey(state);
+    return reason ? shown + CStdStr(L"\n") + textOf(reason) : shown;
 }
 
 CStdStr Shortened(const CStdStr& text, const std::function<bool(const CStdStr&)>& fits)

@@ -34,6 +34,12 @@ struct RowFacts
 // the host says why.
 [[nodiscard]] const char* ReasonKey(RowState state);
 
+// The tip of a row: the path of its file as it is shown, and in a line after it why the row is grey, if it
+// is. `whyKeptOut`: the host's reason for not loading the file by itself, empty when it does; it comes before
+// any other reason. `textOf` answers the text of a key.
+[[nodiscard]] CStdStr TipOfRow(const CStdStr& path, const CStdStr& whyKeptOut, RowState state,
+                               const std::function<CStdStr(const char* key)>& textOf);
+
 // The text itself when it fits, or as much of its beginning as fits with an ellipsis after it. `fits` answers
 // whether a text does; a shorter one does when a longer one does.
 [[nodiscard]] CStdStr Shortened(const CStdStr& text, const std::function<bool(const CStdStr&)>& fits);

@@ -1,8 +1,41 @@
 #include "modrig/dialogs/model/RowInsertion.h"
 
-#include <gtest/gtest.h>
+#include <gmock/gmock.h>
+
+#include <set>
+#include <string>
 
 using namespace ModrigUtils;
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+namespace
+{
+constexpr TableKind kLoadedTable = TableKind::kLoadedApplications;
+constexpr TableKind kHistoryTable = TableKind::kHistory;
+
+std::vector<TableKind> JoinedWhereHeld(bool savesHistory, const std::set<TableKind>& holding)
+{
+    return TablesToJoin(savesHistory, [&](TableKind kind) { return holding.contains(kind); });
+}
+
+// A table that holds some files, to be joined by others.
+struct JoinedTable
+{
+    std::set<std::string> rows;
+    std::vector<std::string> candidates;
+
+    std::vector<std::size_t> Join()
+    {
+        return NewRows(candidates.size(),
+                       {[this](std::size_t index) { return rows.contains(candidates.at(index)); },
+                        [this](std::size_t index)
+                        {
+                            rows.insert(candidates.at(index));
+                        }});
+    }
+};
+} // namespace
 
 TEST(RowForInsertion, IsTheEndWhenNothingWasDropped)
 {
@@ -18,4 +51,41 @@ TEST(RowForInsertion, IsWhereFilesWereDropped)
 TEST(RowForInsertion, IsTheEndOfATableWithFewerRows)
 {
     EXPECT_EQ(2u, RowForInsertion(5, 2));
+}
+
+TEST(TablesToJoin, AreBothForANewFileThatIsSavedInTheHistory)
+{
+    EXPECT_THAT(JoinedWhereHeld(true, {}), ElementsAre(kLoadedTable, kHistoryTable));
+}
+
+TEST(TablesToJoin, AreTheLoadedApplicationsAloneWhileNoHistoryIsSaved)
+{
+    EXPECT_THAT(JoinedWhereHeld(false, {}), ElementsAre(kLoadedTable));
+    EXPECT_THAT(JoinedWhereHeld(false, {kLoadedTable}), IsEmpty());
+}
+
+TEST(TablesToJoin, LeaveOutWhatHasARowForTheFile)
+{
+    EXPECT_THAT(JoinedWhereHeld(true, {kLoadedTable}), ElementsAre(kHistoryTable));
+    EXPECT_THAT(JoinedWhereHeld(true, {kHistoryTable}), ElementsAre(kLoadedTable));
+    EXPECT_THAT(JoinedWhereHeld(true, {kLoadedTable, kHistoryTable}), IsEmpty());
+}
+
+TEST(NewRows, AreThoseThatTheTableDoesNotHold)
+{
+    JoinedTable table = {{"b"}, {"a", "b", "c"}};
+    EXPECT_THAT(table.Join(), ElementsAre(0, 2));
+    EXPECT_THAT(table.rows, ElementsAre("a", "b", "c"));
+}
+
+TEST(NewRows, AreTheFirstOfSeveralThatAreEqual)
+{
+    JoinedTable table = {{}, {"a", "b", "a", "b", "c"}};
+    EXPECT_THAT(table.Join(), ElementsAre(0, 1, 4));
+}
+
+TEST(NewRows, AreNoneWhereNothingComes)
+{
+    JoinedTable table = {{"a"}, {}};
+    EXPECT_THAT(table.Join(), IsEmpty());
 }

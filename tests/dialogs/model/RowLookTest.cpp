@@ -2,7 +2,23 @@
 
 #include <gtest/gtest.h>
 
+#include <string>
+
 using namespace ModrigUtils;
+
+namespace
+{
+CStdStr TextOf(const char* key)
+{
+    const std::string name = key;
+    return CStdStr(L"text of " + std::wstring(name.begin(), name.end()));
+}
+
+CStdStr TipOf(const CStdStr& whyKeptOut, RowState state)
+{
+    return TipOfRow(CStdStr(L"/a/tool.lsp"), whyKeptOut, state, TextOf);
+}
+} // namespace
 
 TEST(RowLook, IsGreyForAMissingFileInTheLists)
 {
@@ -51,6 +67,30 @@ TEST(RowLook, HasAReasonOfItsOwnForEveryGreyRow)
     EXPECT_STREQ("IDS_MODRIG_ROW_FAILED", ReasonKey(RowState::kFailed));
     EXPECT_STREQ("IDS_MODRIG_ROW_LOCKED", ReasonKey(RowState::kLocked));
     EXPECT_STREQ("IDS_MODRIG_ROW_NEVER_UNLOADED", ReasonKey(RowState::kNeverUnloaded));
+}
+
+TEST(RowTip, IsThePathOfAUsableFile)
+{
+    EXPECT_EQ(CStdStr(L"/a/tool.lsp"), TipOf(CStdStr(), RowState::kUsable));
+}
+
+TEST(RowTip, SaysUnderThePathWhyTheRowIsGrey)
+{
+    EXPECT_EQ(CStdStr(L"/a/tool.lsp\ntext of IDS_MODRIG_ROW_MISSING"), TipOf(CStdStr(), RowState::kMissing));
+    EXPECT_EQ(CStdStr(L"/a/tool.lsp\ntext of IDS_MODRIG_ROW_LOCKED"), TipOf(CStdStr(), RowState::kLocked));
+}
+
+// As it is in the table of loaded applications, where such a file is not grey for that.
+TEST(RowTip, SaysFirstOfAllThatTheHostKeepsTheFileOut)
+{
+    for (const RowState state : {RowState::kKeptOut, RowState::kUsable, RowState::kLocked})
+        EXPECT_EQ(CStdStr(L"/a/tool.lsp\nkept out by you"), TipOf(CStdStr(L"kept out by you"), state));
+}
+
+TEST(RowTip, ShowsThePathInOneLine)
+{
+    EXPECT_EQ(CStdStr(L"/a/two\\nlines.lsp"),
+              TipOfRow(CStdStr(L"/a/two\nlines.lsp"), CStdStr(), RowState::kUsable, TextOf));
 }
 
 TEST(ShortenedText, IsTheWholeOneWhenItFits)
