@@ -7,7 +7,7 @@
 #include <string>
 #include <vector>
 
-#include "host/platform/RunningMarker.h"
+#include "host/commands/RunningMarker.h"
 #include "host/text/Result.h"
 
 namespace tessel

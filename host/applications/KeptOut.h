@@ -17,8 +17,8 @@
 #include <string>
 #include <vector>
 
+#include "host/commands/RunningMarker.h"
 #include "host/platform/FileFacts.h"
-#include "host/platform/RunningMarker.h"
 #include "host/text/Result.h"
 
 namespace tessel

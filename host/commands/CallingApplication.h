@@ -5,7 +5,7 @@
 #include <string>
 #include <string_view>
 
-#include "host/platform/RunningMarker.h"
+#include "host/commands/RunningMarker.h"
 
 namespace tessel
 {

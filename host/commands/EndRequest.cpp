@@ -5,10 +5,6 @@
 #include <fcntl.h>
 #include <unistd.h>
 
-#include <tessel/tssession.h>
-
-#include "host/text/Running.h"
-
 namespace tessel
 {
 static_assert(std::atomic<bool>::is_always_lock_free, "a signal handler must not wait");
@@ -37,9 +33,3 @@ void EndRequest::make() noexcept
     errno = before;
 }
 } // namespace tessel
-
-int tsrxEndRequest()
-{
-    const auto* request = tessel::running<tessel::EndRequest>();
-    return request ? request->descriptor() : -1;
-}

@@ -3,7 +3,7 @@
 #include <atomic>
 #include <ctime>
 
-#include "host/platform/LastWords.h"
+#include "host/commands/LastWords.h"
 
 namespace tessel
 {

@@ -6,8 +6,8 @@
 #include <fcntl.h>
 #include <unistd.h>
 
+#include "host/commands/RunningMarker.h"
 #include "host/console/EndQuestion.h"
-#include "host/platform/RunningMarker.h"
 #include "host/text/Running.h"
 
 namespace tessel

@@ -7,7 +7,7 @@
 #include <string>
 #include <string_view>
 
-#include "host/platform/RunningMarker.h"
+#include "host/commands/RunningMarker.h"
 #include "host/text/Result.h"
 #include "host/text/Running.h"
 

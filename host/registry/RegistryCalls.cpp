@@ -1,13 +1,10 @@
 // The Windows-style registry calls, on the running host's registry.
-#include <tessel/tssession.h>
 #include <wincompat/winreg.h>
 
 #include <cstring>
 #include <cwchar>
 
-#include "host/platform/RunningMarker.h"
 #include "host/registry/Registry.h"
-#include "host/text/CommandLine.h"
 #include "host/text/Running.h"
 
 using tessel::Registry;
@@ -33,12 +30,6 @@ Target targetOf(HKEY handle)
 const wchar_t* orEmpty(const wchar_t* text)
 {
     return text ? text : L"";
-}
-
-void tellOf(const tessel::Result<>& stored)
-{
-    if (auto* commandLine = tessel::running<tessel::CommandLine>())
-        commandLine->tell(stored);
 }
 
 LONG copyData(const std::wstring& data, void* buffer, DWORD* size)
@@ -137,17 +128,4 @@ LONG tsudRegSetString(HKEY key, const wchar_t* name, const wchar_t* data)
     const Target target = targetOf(key);
     return target ? target.registry->writeValue(target.key, orEmpty(name), orEmpty(data)).code()
                   : ERROR_INVALID_HANDLE;
-}
-
-void tsrxBeforeWaiting(bool actionIsOver)
-{
-    if (auto* marker = tessel::running<tessel::RunningMarker>())
-        marker->noteWaiting();
-    Registry* registry = tessel::running<Registry>();
-    if (!registry)
-        return;
-    if (actionIsOver)
-        tellOf(registry->endOfCommand());
-    else
-        registry->storeSoFar();
 }

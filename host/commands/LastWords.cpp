@@ -1,4 +1,4 @@
-#include "host/platform/LastWords.h"
+#include "host/commands/LastWords.h"
 
 #include <cerrno>
 #include <cstdio>
@@ -8,7 +8,7 @@
 
 #include <unistd.h>
 
-#include "host/platform/RunningMarker.h"
+#include "host/commands/RunningMarker.h"
 #include "host/text/Running.h"
 #include "host/text/Unicode.h"
 

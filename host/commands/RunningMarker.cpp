@@ -1,4 +1,4 @@
-#include "host/platform/RunningMarker.h"
+#include "host/commands/RunningMarker.h"
 
 #include <algorithm>
 #include <array>
