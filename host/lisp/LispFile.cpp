@@ -117,7 +117,7 @@ bool isCompiled(const std::wstring& name)
                              kCompiledExtension);
 }
 
-Result<LispFile> read(const FoundFile& found)
+Result<LispFile> readFound(const FoundFile& found)
 {
     std::error_code error;
     // A pipe or a device might never end.
@@ -143,6 +143,6 @@ Result<LispFile> readLispFile(const std::wstring& path, bool compiledFiles, cons
         return refused(found->name, L"this host does not load compiled Lisp.");
     if (auto begun = begins ? begins(found->name, fullPath(found->path)) : Result<>(); !begun)
         return begun.failure();
-    return read(*found);
+    return readFound(*found);
 }
 } // namespace tessel
