@@ -88,7 +88,11 @@ struct Parts
     Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands,
                                 *messageBox,  loadOutcomes,        admission};
     Owned<ApplicationRecords> records{*registry, *commands, *callingApplication, kProductRegistryRoot};
-    DemandLoading demandLoading{layout.plugIns, *records, *linker, admission, *commandLine};
+    DemandLoading demandLoading{layout.plugIns, *records, *linker, admission,
+                                [this](const std::wstring& path)
+                                {
+                                    return commandLine->tell(linker->load(path, kResolveNow));
+                                }};
     Owned<Document> document;
     Owned<FileSearch> files{layout.resources, *variables};
     Owned<RemoteFiles> remote{foundations.profileFolder / "remote-files", foundations.downloads,

@@ -11,7 +11,6 @@
 #include "host/applications/ApplicationRecords.h"
 #include "host/applications/DynamicLinker.h"
 #include "host/platform/RealPath.h"
-#include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -41,15 +40,10 @@ bool lists(const ApplicationRecord& record, std::wstring_view typedName)
 } // namespace
 
 DemandLoading::DemandLoading(std::filesystem::path plugInsFolder, const ApplicationRecords& records,
-                             DynamicLinker& linker, const Admission& admission, CommandLine& commandLine)
+                             const DynamicLinker& linker, const Admission& admission, Loader load)
     : mPlugInsFolder(std::move(plugInsFolder)), mRecords(records), mLinker(linker), mAdmission(admission),
-      mCommandLine(commandLine)
+      mLoad(std::move(load))
 {
-}
-
-bool DemandLoading::load(const std::wstring& path) const
-{
-    return mCommandLine.tell(mLinker.load(path, kResolveNow));
 }
 
 void DemandLoading::loadAtStart() const
@@ -58,9 +52,9 @@ void DemandLoading::loadAtStart() const
     const auto plugIns = unrecordedPlugIns();
     for (const auto& record : mRecords.all())
         if ((record.loadReasons & TSRX_LOAD_AT_HOST_START) != 0)
-            load(record.module);
+            mLoad(record.module);
     for (const auto& plugIn : plugIns)
-        load(toWide(plugIn.native()));
+        mLoad(toWide(plugIn.native()));
 }
 
 bool DemandLoading::loadNamesake(std::wstring_view command) const
@@ -73,7 +67,7 @@ bool DemandLoading::loadNamesake(std::wstring_view command) const
                                    const std::wstring path = toWide(plugIn.native());
                                    return equalIgnoringCase(toWide(plugIn.stem().native()), command) &&
                                           mAdmission.keptOutAtStart(path) &&
-                                          !mLinker.isModuleLoaded(path.c_str()) && load(path);
+                                          !mLinker.isModuleLoaded(path.c_str()) && mLoad(path);
                                });
 }
 
@@ -111,7 +105,7 @@ bool DemandLoading::loadForCommand(std::wstring_view name) const
     const RunningMarker::ReasonScope onCommand(mAdmission.marker(), RunningMarker::Reason::kOnCommand);
     const auto records = mRecords.all();
     return std::ranges::any_of(records, [&](const ApplicationRecord& record)
-                               { return isDue(record, name) && load(record.module); }) ||
+                               { return isDue(record, name) && mLoad(record.module); }) ||
            loadNamesake(name);
 }
 } // namespace tessel

@@ -4,6 +4,7 @@
 #pragma once
 
 #include <filesystem>
+#include <functional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -12,16 +13,18 @@ namespace tessel
 {
 class Admission;
 class ApplicationRecords;
-class CommandLine;
 class DynamicLinker;
 struct ApplicationRecord;
 
 class DemandLoading
 {
 public:
-    // What cannot be loaded is explained on the command line.
+    // Loads the application at the path, if it can be loaded, and tells why not if it cannot. True when it
+    // is loaded.
+    using Loader = std::function<bool(const std::wstring& path)>;
+
     DemandLoading(std::filesystem::path plugInsFolder, const ApplicationRecords& records,
-                  DynamicLinker& linker, const Admission& admission, CommandLine& commandLine);
+                  const DynamicLinker& linker, const Admission& admission, Loader load);
 
     // Loads what is due at the start: by the records, in their order, then from the PlugIns folder, by name.
     // What cannot be loaded does not keep the start from going on.
@@ -30,7 +33,7 @@ public:
     // Loads the application that has such a command, by its local or its global name, in any case of letters,
     // and that wants to be loaded for it. A "_" in front means the global name alone. False when nothing was
     // loaded: nobody has such a command, its application is loaded already, or it cannot be loaded, which the
-    // command line has then been told.
+    // loader has then told.
     //
     // What stands in the PlugIns folder, is called like the command and was kept out at the start is loaded
     // for it as well: the dialog that could mend things must be there, whatever the records say.
@@ -41,13 +44,12 @@ private:
     std::vector<std::filesystem::path> unrecordedPlugIns() const;
     bool loadNamesake(std::wstring_view command) const;
 
-    bool load(const std::wstring& path) const;
     bool isDue(const ApplicationRecord& record, std::wstring_view command) const;
 
     std::filesystem::path mPlugInsFolder;
     const ApplicationRecords& mRecords;
-    DynamicLinker& mLinker;
+    const DynamicLinker& mLinker;
     const Admission& mAdmission;
-    CommandLine& mCommandLine;
+    Loader mLoad;
 };
 } // namespace tessel

@@ -26,7 +26,11 @@ protected:
     tessel::Registry mRegistry{mFolder / "registry.db"};
     tessel::Owned<tessel::ApplicationRecords> mRecords{mRegistry, mCommands, mCalls,
                                                        L"Software\\Tessel\\R21"};
-    tessel::DemandLoading mDemand{mFolder / "PlugIns", *mRecords, mLinker, mAdmission, mCommandLine};
+    tessel::DemandLoading mDemand{mFolder / "PlugIns", *mRecords, mLinker, mAdmission,
+                                  [this](const std::wstring& path)
+                                  {
+                                      return mCommandLine.tell(mLinker.load(path, tessel::kResolveNow));
+                                  }};
 };
 
 TEST_F(Demand, LoadsAtTheStartWhatItsRecordsAskFor)
