@@ -17,6 +17,10 @@ struct StartSummary
     bool fits = true;   // the box holds all of it, too
 };
 
+// A box has no place for the file that it is about but its text: there the file stands between “ and ”, in
+// every language. Of a translation with quotes of another kind no file is noted here; boxes about one that
+// was not loaded are recognised all the same.
+//
 // Whoever loads files says first what is wrong with one, and then that it was not loaded. Files that two
 // boxes quote, and of which neither the linker nor Lisp has heard, are noted as not loaded for the reason in
 // the first.

@@ -26,11 +26,6 @@ constexpr std::wstring_view kExtensions[] = {L"", L".lsp", kCompiledExtension};
 constexpr std::uintmax_t kLargestLispFile = std::uintmax_t{32} << 20;
 constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
 
-Failure refused(const std::wstring& name, const std::wstring& reason, int code = Failure::kUnspecified)
-{
-    return {L"Cannot load \"" + name + L"\": " + reason, code};
-}
-
 std::wstring systemText(std::error_code error)
 {
     return toWide(error.message()) + L".";
@@ -38,7 +33,7 @@ std::wstring systemText(std::error_code error)
 
 Failure missing(const std::wstring& name, std::error_code error)
 {
-    return refused(name, systemText(error), LispFile::kMissing);
+    return refusedLispFile(name, systemText(error), LispFile::kMissing);
 }
 
 struct FoundFile
@@ -75,7 +70,7 @@ Result<FoundFile> find(const std::wstring& given)
         }
     // The first error says more than those of the other names.
     if (fs::is_directory(fs::path(toUtf8(given)), error))
-        return refused(given, L"it is a folder.");
+        return refusedLispFile(given, L"it is a folder.");
     return missing(given, first);
 }
 
@@ -106,7 +101,7 @@ Result<LispFile> decodeCompiled(const std::wstring& name, std::string_view bytes
 {
     const auto unpacked = unpackCompiledLisp(bytes);
     if (!unpacked)
-        return refused(name, L"it " + unpacked.sentence() + L".");
+        return refusedLispFile(name, L"it " + unpacked.sentence() + L".");
     return LispFile{LispFile::Kind::kCompiled, name, toWide(*unpacked)};
 }
 
@@ -122,17 +117,32 @@ Result<LispFile> readFound(const FoundFile& found)
     std::error_code error;
     // A pipe or a device might never end.
     if (!fs::is_regular_file(found.status))
-        return refused(found.name, L"it is not an ordinary file.");
+        return refusedLispFile(found.name, L"it is not an ordinary file.");
     if (fs::file_size(found.path, error) > kLargestLispFile && !error)
-        return refused(found.name, L"it is larger than 32 MB.");
+        return refusedLispFile(found.name, L"it is larger than 32 MB.");
     errno = 0;
     std::ifstream stream(found.path, std::ios::binary);
     const std::string bytes{std::istreambuf_iterator<char>(stream), {}};
     if (!stream.is_open() || stream.bad())
-        return refused(found.name, systemText({errno, std::generic_category()}));
+        return refusedLispFile(found.name, systemText({errno, std::generic_category()}));
     return isCompiled(found.name) ? decodeCompiled(found.name, bytes) : decodeSource(found.name, bytes);
 }
 } // namespace
+
+std::wstring beginningOfRefusal(const std::wstring& path)
+{
+    return L"Cannot load \"" + path;
+}
+
+std::wstring refusalBeforeReason(const std::wstring& name)
+{
+    return beginningOfRefusal(name) + L"\": ";
+}
+
+Failure refusedLispFile(const std::wstring& name, const std::wstring& reason, int code)
+{
+    return {refusalBeforeReason(name) + reason, code};
+}
 
 Result<LispFile> readLispFile(const std::wstring& path, bool compiledFiles, const LispFileBegins& begins)
 {
@@ -140,7 +150,7 @@ Result<LispFile> readLispFile(const std::wstring& path, bool compiledFiles, cons
     if (!found)
         return found.failure();
     if (!compiledFiles && isCompiled(found->name))
-        return refused(found->name, L"this host does not load compiled Lisp.");
+        return refusedLispFile(found->name, L"this host does not load compiled Lisp.");
     if (auto begun = begins ? begins(found->name, fullPath(found->path)) : Result<>(); !begun)
         return begun.failure();
     return readFound(*found);

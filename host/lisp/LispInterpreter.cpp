@@ -5,6 +5,7 @@
 #include "host/applications/Admission.h"
 #include "host/applications/Document.h"
 #include "host/commands/EndRequest.h"
+#include "host/lisp/LispFile.h"
 #include "host/lisp/LispLoads.h"
 #include "host/lisp/LispMachine.h"
 #include "host/text/CommandLine.h"
@@ -26,7 +27,7 @@ void admitFilesBy(Admission& admission, LispLoads& loads, LispSurroundings& surr
             return {};
         }
         loads.refused(admitted);
-        return Failure{L"Cannot load \"" + name + L"\": " + admitted.sentence() + L"."};
+        return refusedLispFile(name, admitted.sentence() + L".");
     };
     surroundings.filesOpen = [&admission]
     {

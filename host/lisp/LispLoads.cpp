@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "host/lisp/LispFile.h"
 #include "host/lisp/LispMachine.h"
 
 namespace tessel
@@ -12,7 +13,7 @@ namespace
 // "Cannot load "a.lsp": it is a folder."
 std::wstring reasonIn(const std::wstring& words, const std::wstring& path)
 {
-    const std::wstring refusal = L"Cannot load \"" + path + L"\": ";
+    const std::wstring refusal = refusalBeforeReason(path);
     if (words.starts_with(refusal))
         return words.substr(refusal.size(), words.find_last_not_of(L'.') + 1 - refusal.size());
     const std::wstring place = path + L":";
@@ -43,7 +44,7 @@ bool LispLoads::isOfFile(const std::wstring& words) const
 {
     return std::ranges::any_of(
         mFiles, [&](const File& file)
-        { return words.starts_with(file.path) || words.starts_with(L"Cannot load \"" + file.path); });
+        { return words.starts_with(file.path) || words.starts_with(beginningOfRefusal(file.path)); });
 }
 
 void LispLoads::refused(const Outcome& admitted)
