@@ -182,7 +182,9 @@ Result<> TypedHistory::add(const std::wstring& line)
         return giveUp(L"cannot be written", toWide(std::strerror(errno)));
     if (!isOrdinary(file.number()))
         return giveUp(L"is not used", L"it is not an ordinary file");
-    const bool written = file.write(beginning(file.number()) + encoded(kept) + "\n") && file.close();
-    return written ? Result<>() : giveUp(L"cannot be written", toWide(std::strerror(errno)));
+    auto written = file.write(beginning(file.number()) + encoded(kept) + "\n");
+    if (written)
+        written = file.close();
+    return written ? written : giveUp(L"cannot be written", written.sentence());
 }
 } // namespace tessel

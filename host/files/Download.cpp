@@ -48,7 +48,7 @@ std::size_t receive(char* bytes, std::size_t size, std::size_t count, void* cont
     if (sink.isFull())
         return 0;
     sink.sha256.add({bytes, size * count});
-    sink.written = sink.file.write({bytes, size * count});
+    sink.written = static_cast<bool>(sink.file.write({bytes, size * count}));
     return sink.written ? size * count : 0;
 }
 

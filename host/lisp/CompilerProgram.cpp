@@ -1,6 +1,5 @@
 #include "host/lisp/CompilerProgram.h"
 
-#include <cerrno>
 #include <cstdio>
 #include <filesystem>
 #include <iostream>
@@ -65,10 +64,12 @@ Result<> writeWhole(const fs::path& output, const std::string& bytes)
     PartFile part(folder);
     if (!part.made())
         return notWritten(output, part.made().sentence());
-    if (!part.write(bytes) || !part.letOthersRead())
-        return notWritten(output, toWide(std::generic_category().message(errno)));
-    const auto moved = part.moveTo(output);
-    return moved ? moved : notWritten(output, moved.sentence());
+    Result<> done = part.write(bytes);
+    if (done)
+        done = part.letOthersRead();
+    if (done)
+        done = part.moveTo(output);
+    return done ? done : notWritten(output, done.sentence());
 }
 
 Result<> compileFile(const fs::path& input, const fs::path& output)

@@ -3,7 +3,6 @@
 #include <cerrno>
 #include <cstdio>
 #include <cstdlib>
-#include <cstring>
 #include <system_error>
 
 #include <fcntl.h>
@@ -11,7 +10,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
-#include "host/text/Unicode.h"
+#include "host/platform/SystemFailure.h"
 
 namespace tessel
 {
@@ -19,11 +18,6 @@ namespace
 {
 constexpr std::string_view kPrefix = ".part-";
 constexpr mode_t kForAll = 0666;
-
-Failure lastError()
-{
-    return {toWide(std::strerror(errno))};
-}
 
 bool hasName(int file)
 {
@@ -70,20 +64,20 @@ void PartFile::make(const std::filesystem::path& folder)
         flock(mFile.number(), LOCK_EX); // a file system without locks keeps left-overs, that is all
         return;
     }
-    mMade = lastError();
+    mMade = systemFailure(errno);
     mPath.clear();
 }
 
-bool PartFile::write(std::string_view bytes)
+Result<> PartFile::write(std::string_view bytes)
 {
     return mFile.write(bytes);
 }
 
-bool PartFile::letOthersRead()
+Result<> PartFile::letOthersRead()
 {
     const mode_t taken = umask(0);
     umask(taken);
-    return fchmod(mFile.number(), kForAll & ~taken) == 0;
+    return fchmod(mFile.number(), kForAll & ~taken) == 0 ? Result<>() : systemFailure(errno);
 }
 
 Result<> PartFile::moveTo(const std::filesystem::path& place)
@@ -104,7 +98,7 @@ Result<> PartFile::moveToOnce(const std::filesystem::path& place)
 Result<> PartFile::name(const std::filesystem::path& place, int (*naming)(const char*, const char*))
 {
     if (fsync(mFile.number()) != 0 || naming(mPath.c_str(), place.c_str()) != 0)
-        return lastError();
+        return systemFailure(errno);
     storeFolderOf(place);
     return {};
 }
@@ -124,6 +118,7 @@ Result<> replaceFile(const std::filesystem::path& place, std::string_view bytes)
     PartFile part(place.parent_path());
     if (!part.made())
         return part.made();
-    return part.write(bytes) ? part.moveTo(place) : lastError();
+    const auto written = part.write(bytes);
+    return written ? part.moveTo(place) : written;
 }
 } // namespace tessel

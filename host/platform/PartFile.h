@@ -24,10 +24,10 @@ public:
     // Why it could not be made; the system's words.
     const Result<>& made() const { return mMade; }
 
-    bool write(std::string_view bytes);
-
+    // Both fail with the system's words.
+    Result<> write(std::string_view bytes);
     // Gives others the right to read it, as is usual for the person's new files.
-    bool letOthersRead();
+    Result<> letOthersRead();
 
     // Puts it in place of what stands there: from then on all of it is on the disk, by that name. Fails with
     // the system's words.

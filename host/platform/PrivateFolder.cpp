@@ -6,7 +6,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
-#include "host/text/Unicode.h"
+#include "host/platform/SystemFailure.h"
 
 namespace tessel
 {
@@ -14,11 +14,6 @@ namespace
 {
 constexpr mode_t kForThePersonAlone = 0700;
 constexpr uid_t kAdministrator = 0; // could write anything anyway
-
-Failure systemFailure(int error)
-{
-    return {toWide(std::generic_category().message(error))};
-}
 
 bool isFolder(const std::filesystem::path& path)
 {

@@ -11,6 +11,7 @@
 #include <unistd.h>
 
 #include "host/platform/Descriptor.h"
+#include "host/platform/Pipe.h"
 
 extern char** environ;
 
@@ -67,23 +68,6 @@ std::vector<pid_t>& startedPrograms()
     return programs;
 }
 
-struct Pipe
-{
-    Descriptor output{-1};
-    Descriptor input{-1};
-};
-
-// Without ends when the system has none left. The program that is started gets no more than its own output.
-Pipe openPipe()
-{
-    std::array<int, 2> ends{};
-    if (pipe(ends.data()) != 0)
-        return {};
-    for (const int end : ends)
-        fcntl(end, F_SETFD, FD_CLOEXEC);
-    return {Descriptor(ends[0]), Descriptor(ends[1])};
-}
-
 std::string readToEnd(const Descriptor& output)
 {
     std::string text;
@@ -114,16 +98,16 @@ bool startProgram(ProgramWords words)
 
 std::string outputOfProgram(ProgramWords words)
 {
-    Pipe pipe = openPipe();
-    if (!pipe.input)
+    auto pipe = openPipe();
+    if (!pipe)
         return "";
     ProgramStart start;
-    start.writeTo(pipe.input.number());
+    start.writeTo(pipe->input.number());
     const auto process = start.start(std::move(words));
     if (!process)
         return "";
-    pipe.input.close();
-    const std::string text = readToEnd(pipe.output);
+    pipe->input = Descriptor(-1); // otherwise the output would not end
+    const std::string text = readToEnd(pipe->output);
     waitForEnd(*process);
     return text;
 }

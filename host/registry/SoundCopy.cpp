@@ -10,6 +10,7 @@
 #include <unistd.h>
 
 #include "host/platform/PartFile.h"
+#include "host/platform/SystemFailure.h"
 #include "host/registry/Journals.h"
 #include "host/registry/Schema.h"
 #include "host/registry/Soundness.h"
@@ -28,11 +29,6 @@ struct CloseDatabase
 };
 
 using Image = std::unique_ptr<unsigned char, void (*)(void*)>;
-
-Failure systemFailure()
-{
-    return {toWide(std::strerror(errno)), errno};
-}
 
 std::filesystem::path beside(const std::filesystem::path& file, const char* ending)
 {
@@ -79,7 +75,7 @@ Result<bool> nameToo(const std::filesystem::path& file, const std::filesystem::p
     static_cast<void>(std::remove(second.c_str())); // if it stays, the next fails
     const int status = isFolder ? rename(file.c_str(), second.c_str()) : link(file.c_str(), second.c_str());
     if (status != 0 && errno != ENOENT)
-        return systemFailure();
+        return systemFailure(errno);
     return status == 0;
 }
 
@@ -88,7 +84,7 @@ Result<> setJournalsAside(const std::filesystem::path& file, const std::filesyst
 {
     for (const char* ending : kJournals)
         if (rename(beside(file, ending).c_str(), beside(kept, ending).c_str()) != 0 && errno != ENOENT)
-            return systemFailure();
+            return systemFailure(errno);
     unlink(beside(file, "-shm").c_str());
     return {};
 }
@@ -153,6 +149,7 @@ Result<> makeFileOnce(const std::filesystem::path& file, std::string_view bytes)
     PartFile part(file.parent_path());
     if (!part.made())
         return part.made();
-    return part.write(bytes) ? part.moveToOnce(file) : systemFailure();
+    const auto written = part.write(bytes);
+    return written ? part.moveToOnce(file) : written;
 }
 } // namespace tessel
