@@ -89,6 +89,7 @@ Result<> Host::makeParts()
         return started.failure();
     mInterruptible = &mParts->lisp();
     mInterruptibleRegistry = &*mParts->registry;
+    mMarker = &*mParts->marker;
     addCommands();
     return {};
 }
@@ -205,6 +206,7 @@ void Host::end()
     mCommandLine.tell(mParts->registry->keepCopy());
     mInterruptible = nullptr;
     mInterruptibleRegistry = nullptr;
+    mMarker = nullptr;
     mParts.reset();
 }
 
@@ -216,6 +218,12 @@ bool Host::interrupt() noexcept
     if (Registry* registry = mInterruptibleRegistry)
         registry->interrupt();
     return mInterruption.press(lisp ? lisp->evaluations() : 0);
+}
+
+void Host::noteEndByKey() noexcept
+{
+    if (RunningMarker* marker = mMarker)
+        marker->noteEnding(RunningMarker::kEndedByKey);
 }
 
 // The registry goes on: what an end in good order stores may be much.

@@ -31,6 +31,7 @@ namespace tessel
 {
 class LispInterpreter;
 class Registry;
+class RunningMarker;
 struct Parts;
 
 struct HostOptions
@@ -65,6 +66,7 @@ public:
 
     bool isEnding() const override { return mEndRequest.isMade(); }
     bool interrupt() noexcept override;
+    void noteEndByKey() noexcept override;
     void requestEnd() noexcept override;
 
     // Can be read from when the session is to end (see EndRequest).
@@ -89,8 +91,9 @@ private:
     HostOptions mOptions;
     CommandLine mCommandLine;
     std::unique_ptr<Parts> mParts;
-    std::atomic<LispInterpreter*> mInterruptible = nullptr; // read by a signal handler, as the next
+    std::atomic<LispInterpreter*> mInterruptible = nullptr; // read by a signal handler, as the next two
     std::atomic<Registry*> mInterruptibleRegistry = nullptr;
+    std::atomic<RunningMarker*> mMarker = nullptr;
     EndRequest mEndRequest;
     Interruption mInterruption{mEndRequest};
     int mScriptDepth = 0;

@@ -6,9 +6,7 @@
 #include <fcntl.h>
 #include <unistd.h>
 
-#include "host/commands/RunningMarker.h"
 #include "host/console/EndQuestion.h"
-#include "host/text/Running.h"
 
 namespace tessel
 {
@@ -23,8 +21,7 @@ constexpr int kEndedByKey = 128 + SIGINT; // as shells have it
 // What runs would have to come back for a better end.
 [[noreturn]] void endAtOnce()
 {
-    if (RunningMarker* marker = running<RunningMarker>())
-        marker->noteEnding(RunningMarker::kEndedByKey);
+    theKeysRunner->noteEndByKey();
     _exit(kEndedByKey);
 }
 

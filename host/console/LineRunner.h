@@ -20,10 +20,12 @@ public:
     // Whether the session is to end.
     virtual bool isEnding() const = 0;
 
-    // Both are called from a signal handler. The first stops what is running, if that can be stopped: true
+    // These are called from a signal handler. The first stops what is running, if that can be stopped: true
     // when it was called in vain so often that a person is to be asked whether to end the program. The second
-    // ends the session as soon as what is running has come back.
+    // is told when they want that: the program ends at once. The third ends the session as soon as what is
+    // running has come back.
     virtual bool interrupt() noexcept = 0;
+    virtual void noteEndByKey() noexcept = 0;
     virtual void requestEnd() noexcept = 0;
 };
 } // namespace tessel

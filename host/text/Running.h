@@ -1,11 +1,12 @@
 // The parts of the running host, as the SDK's free functions find them. The parts themselves are given what
 // they need when they are made; only a function that an application calls from outside has nothing else to go
-// by.
+// by. Nor has the handler of a signal by which an application ends the process.
 //
 //     Owned<Document> document;                        // a part, made and published
 //     if (auto* current = running<Document>()) ...     // in a free function; null outside of a session
 //
-// Everything here is for the thread that makes the host.
+// Everything here is for the thread that makes the host; a handler only asks, for a part that has been made
+// by then.
 #pragma once
 
 #include <utility>

@@ -31,6 +31,7 @@ public:
     }
     bool isEnding() const override { return mEnding; }
     bool interrupt() noexcept override { return false; }
+    void noteEndByKey() noexcept override {}
     void requestEnd() noexcept override {}
 
     std::vector<std::wstring> inputs;

@@ -17,6 +17,7 @@ public:
     bool run(const std::wstring&) override { return true; }
     bool isEnding() const override { return mEnding; }
     bool interrupt() noexcept override { return false; }
+    void noteEndByKey() noexcept override {}
     void requestEnd() noexcept override { mEnding = true; }
 
 private:

@@ -22,6 +22,7 @@ public:
         ++mInterrupts;
         return false;
     }
+    void noteEndByKey() noexcept override {}
     void requestEnd() noexcept override { ++mEnds; }
     int interrupts() const { return mInterrupts; }
     int ends() const { return mEnds; }
