@@ -52,9 +52,10 @@ void Host::judgeEarlierSessions()
 {
     // A search compares starts: nothing else is to change from one to the next.
     const bool givesTrials = !mOptions.safe && !mParts->bisecting.isGoingOn();
-    for (const auto& sentence : mParts->keptOut.begin(mParts->marker->leftovers(), givesTrials))
+    const auto begun = mParts->keptOut.begin(mParts->marker->leftovers(), givesTrials);
+    for (const auto& sentence : begun.sentences)
         mCommandLine.say(sentence);
-    if (mParts->keptOut.isStored())
+    if (mCommandLine.tell(begun.stored))
         mParts->marker->forgetLeftovers();
     for (const auto& line : mParts->bisecting.sentencesAtStart([this](const std::string& suspect)
                                                                { return mParts->admission.whyOut(suspect); }))
@@ -101,8 +102,8 @@ void Host::tellOfRegistry()
     if (!mCommandLine.tell(registry.canStore()))
         if (const auto read = registry.endOfCommand(); read.sentence() != registry.canStore().sentence())
             mCommandLine.tell(read);
-    if (!registry.notice().empty())
-        mCommandLine.say(registry.notice());
+    if (registry.notice())
+        mCommandLine.say(*registry.notice());
 }
 
 Result<> Host::prepareProfileFolder()

@@ -214,11 +214,10 @@ Result<> KeptOut::change(const std::function<void(Applications&)>& work)
     return before == after ? Result<>() : replaceSmallFile(mFile, after);
 }
 
-std::vector<std::wstring> KeptOut::begin(const std::vector<RunningMarker::Leftover>& leftovers,
-                                         bool givesTrials)
+KeptOut::Start KeptOut::begin(const std::vector<RunningMarker::Leftover>& leftovers, bool givesTrials)
 {
-    std::vector<std::wstring> sentences;
-    const auto stored = change(
+    Start start;
+    start.stored = change(
         [&](Applications& applications)
         {
             forgetChanged(applications);
@@ -226,16 +225,13 @@ std::vector<std::wstring> KeptOut::begin(const std::vector<RunningMarker::Leftov
             {
                 if (!isGuilty(leftover))
                     continue;
-                sentences.push_back(judge(leftover, applications));
+                start.sentences.push_back(judge(leftover, applications));
                 mTold.push_back(realPath(leftover.work.path).native());
             }
             if (givesTrials)
-                giveTrials(applications, sentences);
+                giveTrials(applications, start.sentences);
         });
-    mStored = static_cast<bool>(stored);
-    if (!stored)
-        sentences.push_back(stored.sentence());
-    return sentences;
+    return start;
 }
 
 void KeptOut::giveTrials(Applications& applications, std::vector<std::wstring>& sentences)

@@ -60,13 +60,15 @@ public:
     explicit KeptOut(std::filesystem::path folder);
 
     // A start, with what earlier sessions have left: judges them, and gives those a trial whose time has
-    // come, unless nothing will be loaded by itself anyway. Answers what a person is to be told. What was
-    // judged now waits for the next start.
-    std::vector<std::wstring> begin(const std::vector<RunningMarker::Leftover>& leftovers, bool givesTrials);
+    // come, unless nothing will be loaded by itself anyway. What was judged now waits for the next start.
+    struct Start
+    {
+        std::vector<std::wstring> sentences; // that a person is to be told
+        Result<> stored;                     // all that was learnt
+    };
+    Start begin(const std::vector<RunningMarker::Leftover>& leftovers, bool givesTrials);
     // Whether it was judged at this start, and a person was told.
     bool wasTold(const KeptOutApplication& application) const;
-    // Whether all that was learnt is stored.
-    bool isStored() const { return mStored; }
 
     // What is known of the application at that full path, links followed; null for most.
     const KeptOutApplication* find(const std::string& path) const;
@@ -98,7 +100,6 @@ private:
     Applications mApplications;
     std::vector<std::string> mTold;  // those judged at this start, links followed
     std::vector<std::string> mTried; // of those whose trial this session is
-    bool mStored = true;
 };
 
 // Why it is kept out: a part of a sentence, with the day.

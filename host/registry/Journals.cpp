@@ -131,10 +131,10 @@ bool isForeign(const std::filesystem::path& file)
 }
 } // namespace
 
-Result<std::wstring> setForeignLogAside(const std::filesystem::path& file)
+Result<std::optional<std::wstring>> setForeignLogAside(const std::filesystem::path& file)
 {
     if (!isForeign(file))
-        return std::wstring();
+        return std::optional<std::wstring>();
     const auto log = logOf(file);
     const std::filesystem::path aside = log.string() + ".foreign";
     const std::wstring belongsElsewhere =
@@ -143,8 +143,8 @@ Result<std::wstring> setForeignLogAside(const std::filesystem::path& file)
     if (rename(log.c_str(), aside.c_str()) != 0)
         return Failure{belongsElsewhere + L", and cannot be set aside: " + toWide(std::strerror(errno))};
     static_cast<void>(remove((file.string() + "-shm").c_str())); // it tells what is in the log
-    return L"The registry " + toWide(file.string()) + L" is read without its log: " + belongsElsewhere +
-           L". It was set aside as " + toWide(aside.string()) + L".";
+    return std::optional(L"The registry " + toWide(file.string()) + L" is read without its log: " +
+                         belongsElsewhere + L". It was set aside as " + toWide(aside.string()) + L".");
 }
 
 std::string asFixedFile(const std::filesystem::path& file)

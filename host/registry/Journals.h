@@ -2,6 +2,7 @@
 #pragma once
 
 #include <filesystem>
+#include <optional>
 #include <string>
 
 #include "host/text/Result.h"
@@ -15,7 +16,7 @@ namespace tessel
 // cannot be set aside: then the file must not be opened with it.
 //
 // Every registry has a number of its own, and every transaction writes the page that holds it, with a count.
-Result<std::wstring> setForeignLogAside(const std::filesystem::path& file);
+Result<std::optional<std::wstring>> setForeignLogAside(const std::filesystem::path& file);
 
 // The file as one that nobody changes, as a URI: the store then reads it without the journal's files beside
 // it, which a folder that may not be written cannot take.

@@ -69,8 +69,8 @@ public:
     // Whether anything can be stored; one sentence about why not.
     const Result<>& canStore() const { return mCanStore; }
 
-    // What a person should know although the registry can be used: a sentence, or an empty text.
-    const std::wstring& notice() const { return mNotice; }
+    // What a person should know although the registry can be used: a sentence, mostly none.
+    const std::optional<std::wstring>& notice() const { return mNotice; }
 
     // Paths are relative to `from`; the parts are separated by one backslash, empty parts are passed over.
     Key find(std::wstring_view path, Key from = kRoot);
@@ -182,7 +182,7 @@ private:
     std::filesystem::path mFile;
     std::chrono::milliseconds mBusyTimeout;
     Result<> mCanStore;
-    std::wstring mNotice;
+    std::optional<std::wstring> mNotice;
     sqlite3* mDatabase = nullptr;
     bool mReadOnly = false;
     bool mLeftOpen = false;  // a session has left its journal

@@ -90,7 +90,7 @@ Content readAll(Registry& registry)
 bool isTold(Registry& registry)
 {
     const std::wstring canStore = registry.canStore().sentence();
-    const std::wstring notice = registry.notice();
+    const std::wstring notice = registry.notice().value_or(L"");
     const std::wstring ended = registry.endOfCommand().sentence();
     for (const std::wstring& sentence : {canStore, notice, ended})
         note(sentence.substr(0, sentence.find(L'/')) + sentence.substr(sentence.rfind(L':') + 1));

@@ -108,7 +108,7 @@ TEST_F(TakenOver, FromAnOlderTesselThatWasKilled)
     sqlite3_close(database);
     Registry registry(file());
     EXPECT_EQ(said(registry), "");
-    EXPECT_EQ(registry.notice(), L"");
+    EXPECT_EQ(registry.notice(), std::nullopt);
     expectOldContent(registry);
     EXPECT_TRUE(registry.write(L"New", L"name", L"1"));
 }
@@ -206,7 +206,7 @@ TEST_F(TakenOver, WithTheLogOfASessionThatWasKilled)
         copyAsKilled(file(), killed);
     }
     Registry registry(killed);
-    EXPECT_EQ(registry.notice(), L"");
+    EXPECT_EQ(registry.notice(), std::nullopt);
     EXPECT_EQ(generationOf(registry), 2);
 }
 
@@ -221,10 +221,10 @@ TEST_F(TakenOver, WithEachOfTheLogsOfALongSession)
         ASSERT_TRUE(registry.endOfCommand());
         copyAsKilled(file(), killed);
         Registry next(killed);
-        EXPECT_EQ(next.notice(), L"");
+        EXPECT_EQ(next.notice(), std::nullopt);
         EXPECT_EQ(generationOf(next), generation);
         Registry meanwhile(file());
-        EXPECT_EQ(meanwhile.notice(), L"");
+        EXPECT_EQ(meanwhile.notice(), std::nullopt);
         EXPECT_TRUE(meanwhile.write(L"Other", L"name", L"1"));
         EXPECT_TRUE(meanwhile.endOfCommand());
     }
@@ -248,7 +248,7 @@ TEST_F(TakenOver, WithoutTheLogOfAnotherRegistry)
     {
         Registry registry(file());
         EXPECT_EQ(said(registry), "");
-        const std::string notice = tessel::toUtf8(registry.notice());
+        const std::string notice = tessel::toUtf8(registry.notice().value_or(L""));
         EXPECT_THAT(notice, AllOf(HasSubstr("The registry " + file().string() + " is read without its log"),
                                   HasSubstr("does not belong to it"),
                                   HasSubstr("set aside as " + file().string() + "-wal.foreign")));
@@ -257,7 +257,7 @@ TEST_F(TakenOver, WithoutTheLogOfAnotherRegistry)
     EXPECT_TRUE(contentOf(file()) == before);
     EXPECT_TRUE(contentOf(file().string() + "-wal.foreign") == log);
     Registry again(file());
-    EXPECT_EQ(again.notice(), L"");
+    EXPECT_EQ(again.notice(), std::nullopt);
 }
 
 TEST_F(TakenOver, WithoutTheLogOfALaterStateOfTheSameRegistry)
@@ -280,6 +280,6 @@ TEST_F(TakenOver, WithoutTheLogOfALaterStateOfTheSameRegistry)
         fs::copy_file(file().string() + "-wal", backup.string() + "-wal");
     }
     Registry registry(backup);
-    EXPECT_THAT(tessel::toUtf8(registry.notice()), HasSubstr("another state of it"));
+    EXPECT_THAT(tessel::toUtf8(registry.notice().value_or(L"")), HasSubstr("another state of it"));
     EXPECT_EQ(generationOf(registry), 1);
 }
