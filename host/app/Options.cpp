@@ -4,14 +4,13 @@
 
 #include <CLI/CLI.hpp>
 
+#include "host/text/Unicode.h"
 #include "host/text/Version.h"
 
 namespace tessel
 {
 namespace
 {
-constexpr int kWrongArguments = 2;
-
 constexpr char kAfterword[] =
     "With --script or -c, Tessel runs the script, then the commands, and ends: with status 0, or with 1 if "
     "a\n"
@@ -38,7 +37,7 @@ void declare(CLI::App& app, Options& options)
 }
 } // namespace
 
-ParsedOptions parseOptions(int count, const char* const* arguments)
+Result<ParsedOptions> parseOptions(int count, const char* const* arguments)
 {
     Options options;
     CLI::App app("Tessel R21, the reference host for Modrig.", "Tessel");
@@ -46,13 +45,15 @@ ParsedOptions parseOptions(int count, const char* const* arguments)
     try
     {
         app.parse(count, arguments);
-        return {options, {}, 0};
+        return ParsedOptions{options, {}};
     }
     catch (const CLI::ParseError& outcome)
     {
         std::ostringstream text;
         const bool failed = app.exit(outcome, text, text) != 0;
-        return {std::nullopt, text.str(), failed ? kWrongArguments : 0};
+        if (failed)
+            return Failure{toWide(text.str()), kWrongArguments};
+        return ParsedOptions{std::nullopt, text.str()};
     }
 }
 } // namespace tessel

@@ -6,6 +6,8 @@
 #include <string>
 #include <vector>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 struct Options
@@ -19,13 +21,16 @@ struct Options
     bool isBatch() const { return !script.empty() || !commands.empty(); }
 };
 
-// The outcome of reading the arguments: options, or a text to print and the status to end with.
+// What the arguments ask for: a session with these options, or else a text to print.
 struct ParsedOptions
 {
     std::optional<Options> options;
     std::string text;
-    int exitStatus = 0;
 };
 
-ParsedOptions parseOptions(int count, const char* const* arguments);
+// The code of a failure, and the status to end with.
+inline constexpr int kWrongArguments = 2;
+
+// Fails with whole lines that say what is wrong and repeat what was typed.
+Result<ParsedOptions> parseOptions(int count, const char* const* arguments);
 } // namespace tessel

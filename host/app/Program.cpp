@@ -125,16 +125,17 @@ int runProgram(int count, const char* const* arguments)
     takeStandardDescriptors();
     const auto parsed = parseOptions(count, arguments);
     StandardOutput output;
-    int status = parsed.exitStatus;
-    if (parsed.options)
-        status = runHost(*parsed.options, output);
-    else if (status == kAllWell)
-        output.write(parsed.text);
-    else // it repeats arguments that anybody may have made up
-        std::fputs(toUtf8(forTerminal(toWide(parsed.text))).c_str(), stderr);
-    if (output.isWhole())
+    if (!parsed) // it repeats arguments that anybody may have made up
+        std::fputs(toUtf8(forTerminal(parsed.sentence())).c_str(), stderr);
+    int status = parsed.code();
+    if (parsed && parsed->options)
+        status = runHost(*parsed->options, output);
+    else if (parsed)
+        output.write(parsed->text);
+    if (output.written())
         return status;
-    std::fprintf(stderr, "Tessel: some of the output could not be written: %s.\n", output.whyNot());
+    std::fprintf(stderr, "Tessel: some of the output could not be written: %s.\n",
+                 toUtf8(output.written().sentence()).c_str());
     return status == kAllWell ? kSomethingFailed : status;
 }
 } // namespace tessel

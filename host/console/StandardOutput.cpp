@@ -2,10 +2,12 @@
 
 #include <cerrno>
 #include <cstdio>
-#include <cstring>
+#include <utility>
 
 #include <poll.h>
 #include <unistd.h>
+
+#include "host/platform/SystemFailure.h"
 
 namespace tessel
 {
@@ -18,30 +20,24 @@ bool canGoOn(int error)
     return error == EINTR || (error == EAGAIN && (poll(&output, 1, -1) > 0 || errno == EINTR));
 }
 
-// 0, or the number of the error.
-int writeAll(std::string_view text)
+Result<> writeAll(std::string_view text)
 {
     while (!text.empty())
     {
         const ssize_t count = ::write(STDOUT_FILENO, text.data(), text.size());
         if (count < 0 && !canGoOn(errno))
-            return errno;
+            return systemFailure(errno);
         text.remove_prefix(count > 0 ? static_cast<std::size_t>(count) : 0);
     }
-    return 0;
+    return {};
 }
 } // namespace
 
 void StandardOutput::write(std::string_view text)
 {
     std::fflush(stdout); // what an application has printed by itself comes before it
-    const int error = writeAll(text);
-    if (mError == 0)
-        mError = error;
-}
-
-const char* StandardOutput::whyNot() const
-{
-    return std::strerror(mError);
+    auto written = writeAll(text);
+    if (mWritten)
+        mWritten = std::move(written);
 }
 } // namespace tessel

@@ -3,6 +3,8 @@
 
 #include <string_view>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 class StandardOutput
@@ -12,12 +14,10 @@ public:
     // tried again: a full disk may have room again.
     void write(std::string_view text);
 
-    bool isWhole() const { return mError == 0; }
-
-    // What the system says about the first failure.
-    const char* whyNot() const;
+    // Whether all of it has arrived; what the system says about the first failure.
+    const Result<>& written() const { return mWritten; }
 
 private:
-    int mError = 0;
+    Result<> mWritten;
 };
 } // namespace tessel
