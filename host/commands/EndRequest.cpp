@@ -1,8 +1,8 @@
 #include "host/commands/EndRequest.h"
 
 #include <cerrno>
+#include <utility>
 
-#include <fcntl.h>
 #include <unistd.h>
 
 namespace tessel
@@ -11,16 +11,8 @@ static_assert(std::atomic<bool>::is_always_lock_free, "a signal handler must not
 
 EndRequest::EndRequest()
 {
-    if (pipe(mPipe.data()) != 0)
-        mPipe = {-1, -1};
-    for (const int end : mPipe)
-        fcntl(end, F_SETFD, FD_CLOEXEC);
-}
-
-EndRequest::~EndRequest()
-{
-    for (const int end : mPipe)
-        close(end);
+    if (auto opened = openPipe())
+        mPipe = *std::move(opened);
 }
 
 void EndRequest::make() noexcept
@@ -29,7 +21,7 @@ void EndRequest::make() noexcept
         return;
     const int before = errno;
     // One byte in an empty pipe: this cannot fail, and nobody takes it out.
-    [[maybe_unused]] const auto written = write(mPipe[1], "", 1);
+    [[maybe_unused]] const auto written = write(mPipe.input.number(), "", 1);
     errno = before;
 }
 } // namespace tessel

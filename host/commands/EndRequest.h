@@ -1,8 +1,9 @@
 // The wish that the session ends, from whoever has it: a command, or a signal from outside.
 #pragma once
 
-#include <array>
 #include <atomic>
+
+#include "host/platform/Pipe.h"
 
 namespace tessel
 {
@@ -10,7 +11,6 @@ class EndRequest
 {
 public:
     EndRequest();
-    ~EndRequest();
     EndRequest(const EndRequest&) = delete;
     EndRequest& operator=(const EndRequest&) = delete;
 
@@ -20,10 +20,10 @@ public:
 
     // Can be read from, and stays so, when the wish has been made: whoever waits for input waits for it, too.
     // -1 when the system has none to give.
-    int descriptor() const { return mPipe[0]; }
+    int descriptor() const { return mPipe.output.number(); }
 
 private:
     std::atomic<bool> mMade = false;
-    std::array<int, 2> mPipe = {-1, -1};
+    Pipe mPipe;
 };
 } // namespace tessel

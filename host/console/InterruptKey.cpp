@@ -1,7 +1,7 @@
 #include "host/console/InterruptKey.h"
 
-#include <array>
 #include <cerrno>
+#include <utility>
 
 #include <fcntl.h>
 #include <unistd.h>
@@ -34,23 +34,16 @@ void onKey(int)
     [[maybe_unused]] const auto written = write(theWriteEnd, "", 1);
     errno = before;
 }
-
-void makeIndependent(int descriptor)
-{
-    fcntl(descriptor, F_SETFD, FD_CLOEXEC);
-    fcntl(descriptor, F_SETFL, O_NONBLOCK);
-}
 } // namespace
 
 InterruptKey::InterruptKey(LineRunner& runner)
 {
     theKeysRunner = &runner;
-    std::array<int, 2> ends{-1, -1};
-    if (pipe(ends.data()) == 0)
-        for (const int end : ends)
-            makeIndependent(end);
-    mReadEnd = ends[0];
-    theWriteEnd = ends[1];
+    if (auto opened = openPipe())
+        mPipe = *std::move(opened);
+    for (const Descriptor* end : {&mPipe.output, &mPipe.input})
+        fcntl(end->number(), F_SETFL, O_NONBLOCK);
+    theWriteEnd = mPipe.input.number();
     struct sigaction action
     {
     };
@@ -62,8 +55,6 @@ InterruptKey::InterruptKey(LineRunner& runner)
 InterruptKey::~InterruptKey()
 {
     sigaction(SIGINT, &mPrevious, nullptr);
-    close(theWriteEnd);
-    close(mReadEnd);
     theWriteEnd = -1;
 }
 } // namespace tessel

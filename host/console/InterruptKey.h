@@ -5,6 +5,7 @@
 #include <csignal>
 
 #include "host/console/LineRunner.h"
+#include "host/platform/Pipe.h"
 
 namespace tessel
 {
@@ -19,12 +20,12 @@ public:
 
     // A descriptor that can be read from when the key was pressed: whoever waits for input waits for it, too.
     // A signal alone can arrive just before the waiting begins, and be lost.
-    int wakeUp() const { return mReadEnd; }
+    int wakeUp() const { return mPipe.output.number(); }
 
 private:
     struct sigaction mPrevious
     {
     };
-    int mReadEnd = -1;
+    Pipe mPipe;
 };
 } // namespace tessel

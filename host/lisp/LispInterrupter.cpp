@@ -8,6 +8,8 @@
 #include <fcntl.h>
 #include <unistd.h>
 
+#include "host/text/Unicode.h"
+
 namespace tessel
 {
 namespace
@@ -29,25 +31,30 @@ void leaveSignalsToOthers()
 }
 } // namespace
 
-LispInterrupter::LispInterrupter(Ways ways) : mWays(std::move(ways))
+Result<std::unique_ptr<LispInterrupter>> LispInterrupter::start(Ways ways)
+try
 {
-    int ends[2];
-    if (pipe(ends) != 0)
-        throw std::system_error(errno, std::generic_category(), "no pipe for interrupting Lisp");
-    mReadEnd = ends[0];
-    mWriteEnd = ends[1];
-    for (const int end : ends)
-        fcntl(end, F_SETFD, FD_CLOEXEC);
+    auto notes = openPipe();
+    if (!notes)
+        return Failure{L"no pipe for interrupting Lisp: " + notes.sentence()};
+    return std::unique_ptr<LispInterrupter>(new LispInterrupter(std::move(ways), *std::move(notes)));
+}
+catch (const std::system_error& error) // the library's way to say that there is no thread
+{
+    return Failure{toWide(error.what())};
+}
+
+LispInterrupter::LispInterrupter(Ways ways, Pipe notes) : mWays(std::move(ways)), mNotes(std::move(notes))
+{
     // A signal handler must not wait, not even when somebody leans on Ctrl-C.
-    fcntl(mWriteEnd, F_SETFL, O_NONBLOCK);
+    fcntl(mNotes.input.number(), F_SETFL, O_NONBLOCK);
     mWatcher = std::thread(&LispInterrupter::watch, this);
 }
 
 LispInterrupter::~LispInterrupter()
 {
-    close(mWriteEnd);
+    mNotes.input = Descriptor(-1);
     mWatcher.join();
-    close(mReadEnd);
 }
 
 void LispInterrupter::begin()
@@ -73,7 +80,7 @@ void LispInterrupter::interrupt() noexcept
         return;
     const int error = errno;
     // A full pipe holds requests enough.
-    [[maybe_unused]] const auto written = write(mWriteEnd, &run, sizeof run);
+    [[maybe_unused]] const auto written = write(mNotes.input.number(), &run, sizeof run);
     errno = error;
 }
 
@@ -92,7 +99,7 @@ std::optional<LispInterrupter::Run> LispInterrupter::receive() const
     Run run = 0;
     ssize_t count = 0;
     do
-        count = read(mReadEnd, &run, sizeof run);
+        count = read(mNotes.output.number(), &run, sizeof run);
     while (count < 0 && errno == EINTR);
     return count == sizeof run ? std::optional(run) : std::nullopt;
 }

@@ -8,9 +8,13 @@
 #include <atomic>
 #include <chrono>
 #include <functional>
+#include <memory>
 #include <mutex>
 #include <optional>
 #include <thread>
+
+#include "host/platform/Pipe.h"
+#include "host/text/Result.h"
 
 namespace tessel
 {
@@ -26,8 +30,8 @@ public:
         std::function<void()> end; // after the last
     };
 
-    // Throws std::system_error when the system has no pipe or thread to give.
-    explicit LispInterrupter(Ways ways);
+    // Fails when the system has no pipe or thread to give. Why is the end of a sentence.
+    static Result<std::unique_ptr<LispInterrupter>> start(Ways ways);
     ~LispInterrupter();
     LispInterrupter(const LispInterrupter&) = delete;
     LispInterrupter& operator=(const LispInterrupter&) = delete;
@@ -55,14 +59,14 @@ private:
     using Run = unsigned;
     static bool isRun(Run run) { return run % 2 != 0; }
 
+    LispInterrupter(Ways ways, Pipe notes);
     void watch();
     bool isOnItsWay(Run run) const;
     void send(Run run);
     std::optional<Run> receive() const;
 
     Ways mWays;
-    int mReadEnd = -1;
-    int mWriteEnd = -1;
+    Pipe mNotes;
     int mDepth = 0;
     std::atomic<Run> mRun = 0;
     std::atomic<Run> mRequested = 0;

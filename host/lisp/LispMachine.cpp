@@ -1,6 +1,5 @@
 #include "host/lisp/LispMachine.h"
 
-#include <system_error>
 #include <utility>
 
 #include <ecl/ecl.h>
@@ -124,15 +123,16 @@ void takeBackReserve(std::size_t heapBytes)
 }
 } // namespace
 
-struct LispMachine::Parts
+struct LispMachine::Session
 {
-    explicit Parts(LispSurroundings given) : surroundings(std::move(given)), interrupter(lispInterrupter())
+    Session(LispSurroundings given, LispInterrupter& givenInterrupter)
+        : surroundings(std::move(given)), interrupter(givenInterrupter)
     {
         connectLispPrimitives(&surroundings, &interrupter);
     }
-    ~Parts() { connectLispPrimitives(nullptr, nullptr); }
-    Parts(const Parts&) = delete;
-    Parts& operator=(const Parts&) = delete;
+    ~Session() { connectLispPrimitives(nullptr, nullptr); }
+    Session(const Session&) = delete;
+    Session& operator=(const Session&) = delete;
 
     // The prelude answers (:DONE . value) or (:FAILED . text).
     Result<cl_object> run(const LispCall& call)
@@ -181,23 +181,21 @@ struct LispMachine::Parts
     LispInterrupter& interrupter;
 };
 
-LispMachine::LispMachine(std::unique_ptr<Parts> parts) : mParts(std::move(parts))
+LispMachine::LispMachine(std::unique_ptr<Session> session) : mSession(std::move(session))
 {
 }
 
 Result<std::unique_ptr<LispMachine>> LispMachine::start(LispSurroundings surroundings)
-try
 {
     if (const Outcome& started = startLisp(); !started)
         return started.failure();
-    auto parts = std::make_unique<Parts>(std::move(surroundings));
-    if (!beginSession(parts->surroundings))
+    const auto interrupter = lispInterrupter();
+    if (!interrupter)
+        return Failure{L"Lisp did not start: " + interrupter.sentence() + L"."};
+    auto session = std::make_unique<Session>(std::move(surroundings), **interrupter);
+    if (!beginSession(session->surroundings))
         return Failure{L"Lisp cannot begin a new session."};
-    return std::unique_ptr<LispMachine>(new LispMachine(std::move(parts)));
-}
-catch (const std::system_error& error) // no pipe or thread for interrupting Lisp
-{
-    return Failure{L"Lisp did not start: " + toWide(error.what()) + L"."};
+    return std::unique_ptr<LispMachine>(new LispMachine(std::move(session)));
 }
 
 LispMachine::~LispMachine() = default;
@@ -207,12 +205,12 @@ Result<std::wstring> LispMachine::evaluate(std::wstring_view forms)
     if (findTooDeepForm(forms))
         return Failure{L"The expression is nested more than " + std::to_wstring(kDeepestNesting) +
                        L" levels deep."};
-    return mParts->runForText({.function = lispFunctions().evaluate, .text = forms});
+    return mSession->runForText({.function = lispFunctions().evaluate, .text = forms});
 }
 
 Result<std::wstring> LispMachine::compile(const std::wstring& name, std::wstring_view text)
 {
-    return mParts->runForText({.function = lispFunctions().compileText, .text = text, .name = name});
+    return mSession->runForText({.function = lispFunctions().compileText, .text = text, .name = name});
 }
 
 Result<TsResultBuffer*> LispMachine::call(const TsResultBuffer* call)
@@ -220,22 +218,22 @@ Result<TsResultBuffer*> LispMachine::call(const TsResultBuffer* call)
     if (!call || call->type != TS_STRING || !call->value.string)
         return Failure{L"A Lisp function is called by its name, as the first value of the list."};
     const auto value =
-        mParts->run({.function = lispFunctions().invoke, .text = call->value.string, .values = call});
+        mSession->run({.function = lispFunctions().invoke, .text = call->value.string, .values = call});
     return value ? Result<TsResultBuffer*>(resultFromLisp(*value)) : value.failure();
 }
 
 void LispMachine::interrupt() noexcept
 {
-    mParts->interrupter.interrupt();
+    mSession->interrupter.interrupt();
 }
 
 bool LispMachine::running() const noexcept
 {
-    return mParts->interrupter.running();
+    return mSession->interrupter.running();
 }
 
 unsigned LispMachine::evaluations() const noexcept
 {
-    return mParts->interrupter.evaluations();
+    return mSession->interrupter.evaluations();
 }
 } // namespace tessel

@@ -71,9 +71,9 @@ public:
     unsigned evaluations() const noexcept;
 
 private:
-    struct Parts;
-    explicit LispMachine(std::unique_ptr<Parts> parts);
+    struct Session;
+    explicit LispMachine(std::unique_ptr<Session> session);
 
-    std::unique_ptr<Parts> mParts;
+    std::unique_ptr<Session> mSession;
 };
 } // namespace tessel

@@ -1,6 +1,7 @@
 #include "host/lisp/LispStart.h"
 
 #include <algorithm>
+#include <memory>
 #include <string_view>
 
 #include <sys/resource.h>
@@ -135,9 +136,15 @@ const LispFunctions& lispFunctions()
     return *startLisp();
 }
 
-LispInterrupter& lispInterrupter()
+Result<LispInterrupter*> lispInterrupter()
 {
-    static LispInterrupter interrupter(waysToInterrupt());
-    return interrupter;
+    static std::unique_ptr<LispInterrupter> interrupter;
+    if (interrupter)
+        return interrupter.get();
+    auto started = LispInterrupter::start(waysToInterrupt());
+    if (!started)
+        return started.failure();
+    interrupter = *std::move(started);
+    return interrupter.get();
 }
 } // namespace tessel

@@ -32,5 +32,6 @@ const Result<LispFunctions>& startLisp();
 const LispFunctions& lispFunctions();
 
 // One for the process: a thread that joins Lisp takes memory that Lisp does not give back.
-LispInterrupter& lispInterrupter();
+// Fails when the system has none to give, and can be asked again.
+Result<LispInterrupter*> lispInterrupter();
 } // namespace tessel

@@ -62,7 +62,9 @@ private:
 
 TEST_F(InterruptedThread, IsSentOneInterruptAndTakesItOnce)
 {
-    LispInterrupter interrupter(ways());
+    const auto started = LispInterrupter::start(ways());
+    ASSERT_TRUE(started);
+    LispInterrupter& interrupter = **started;
     interrupter.begin();
     std::thread([&] { interrupter.interrupt(); }).join();
     waitForInterrupt();
@@ -78,7 +80,9 @@ TEST_F(InterruptedThread, IsSentOneInterruptAndTakesItOnce)
 TEST_F(InterruptedThread, IsLeftAloneWhileNothingRuns)
 {
     {
-        LispInterrupter interrupter(ways());
+        const auto started = LispInterrupter::start(ways());
+        ASSERT_TRUE(started);
+        LispInterrupter& interrupter = **started;
         interrupter.begin();
         interrupter.end();
         interrupter.interrupt();
@@ -96,7 +100,9 @@ TEST_F(InterruptedThread, IsNotSentAnotherInterruptWhileItTakesTheFirst)
     for (int round = 0; round < 300; ++round)
     {
         mSent = 0;
-        LispInterrupter interrupter(ways());
+        const auto started = LispInterrupter::start(ways());
+        ASSERT_TRUE(started);
+        LispInterrupter& interrupter = **started;
         const Leaning leaning(interrupter);
         interrupter.begin();
         waitForInterrupt();
@@ -114,7 +120,9 @@ TEST_F(InterruptedThread, IsNotSentAnotherInterruptWhileItTakesTheFirst)
 // Nested evaluations are one to whoever interrupts.
 TEST_F(InterruptedThread, TakesWhatIsMeantForWhatRunsAndNothingOnceThatIsOver)
 {
-    LispInterrupter interrupter(ways());
+    const auto started = LispInterrupter::start(ways());
+    ASSERT_TRUE(started);
+    LispInterrupter& interrupter = **started;
     const Leaning one(interrupter);
     const Leaning other(interrupter);
     for (int round = 0; round < 50; ++round)
