@@ -35,7 +35,7 @@ Texts applicationsCalled(const Parts& parts, const std::wstring& name)
         known.push_back(outcome.path);
     for (const auto& record : parts.records->all())
         known.push_back(record.module);
-    known.push_back(toText(parts.layout.plugIns / toPath(name)));
+    known.push_back(toText(parts.folders.plugIns / toPath(name)));
     std::erase_if(known, [&](const auto& path)
                   { return !isCalled(path, name) || !KeptOut::checkIsApplication(toUtf8(path)); });
     return known;

@@ -8,7 +8,7 @@
 #include <filesystem>
 #include <memory>
 
-#include "host/app/Layout.h"
+#include "host/app/ProductFolders.h"
 #include "host/app/WindowBox.h"
 #include "host/applications/Admission.h"
 #include "host/applications/ApplicationRecords.h"
@@ -65,7 +65,7 @@ struct Parts
     Parts& operator=(const Parts&) = delete;
 
     const Foundations foundations;
-    const Layout layout = runningLayout();
+    const ProductFolders folders = runningProductFolders();
     Published<CommandLine> commandLine{foundations.commandLine};
     Published<EndRequest> endRequest{foundations.endRequest};
     Owned<Registry> registry{foundations.profileFolder / kRegistryFile, Registry::kBusyTimeout,
@@ -82,23 +82,23 @@ struct Parts
     Owned<KeptOutService> keptOutService{keptOut, admission, *commandLine};
     Owned<CallingApplication> callingApplication{*marker};
     Owned<CommandStack> commands{*callingApplication};
-    Owned<ResourceModules> resources{toWide(layout.resources.string()), *callingApplication};
-    Owned<MessageBox> messageBox{*commandLine, quietWhenSafe(windowBoxes(layout.binaries), admission)};
+    Owned<ResourceModules> resources{toWide(folders.resources.string()), *callingApplication};
+    Owned<MessageBox> messageBox{*commandLine, quietWhenSafe(windowBoxes(folders.binaries), admission)};
     LoadOutcomes loadOutcomes;
     Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands,
                                 *messageBox,  loadOutcomes,        admission};
     Owned<ApplicationRecords> records{*registry, *commands, *callingApplication, kProductRegistryRoot};
-    DemandLoading demandLoading{layout.plugIns, *records, *linker, admission,
+    DemandLoading demandLoading{folders.plugIns, *records, *linker, admission,
                                 [this](const std::wstring& path)
                                 {
                                     return commandLine->tell(linker->load(path, kResolveNow));
                                 }};
     Owned<Document> document;
-    Owned<FileSearch> files{layout.resources, *variables};
+    Owned<FileSearch> files{folders.resources, *variables};
     Owned<RemoteFiles> remote{foundations.profileFolder / "remote-files", foundations.downloads,
                               foundations.interruption};
     Owned<HostInformation> information{toWide(foundations.profileFolder.string()), *remote, *commandLine};
-    Owned<Help> help{layout.resources / "help", openInBrowser};
+    Owned<Help> help{folders.resources / "help", openInBrowser};
     // Publishes itself. The variable is read here, before any application is loaded, and holds for the
     // session.
     Result<std::unique_ptr<LispInterpreter>> startedLisp =

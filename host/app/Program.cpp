@@ -12,8 +12,8 @@
 #include <unistd.h>
 
 #include "host/app/Host.h"
-#include "host/app/Layout.h"
 #include "host/app/Options.h"
+#include "host/app/ProductFolders.h"
 #include "host/commands/LastWords.h"
 #include "host/console/Console.h"
 #include "host/console/EndSignals.h"

@@ -93,7 +93,7 @@ bool DynamicLinker::registerApplication(void* application)
 {
     Module* module = mModules.withHandle(application);
     if (module)
-        mModules.putInService(*module);
+        mModules.countAsLoaded(*module);
     return module != nullptr;
 }
 
@@ -195,7 +195,7 @@ Result<std::unique_ptr<Module>> DynamicLinker::open(const ModuleFile& file, cons
 
 Result<> DynamicLinker::answerForKnown(const Module& module) const
 {
-    if (module.inService)
+    if (module.isLoaded)
         return {};
     return Failure{L"its load message is still running, and it has not registered itself"};
 }
@@ -205,7 +205,7 @@ Result<> DynamicLinker::start(Module& module)
     auto started = module.entryPoint ? send(module, TSRX_MSG_LOAD)
                                      : Failure{L"it has no entry point \"tsrxEntryPoint\""};
     if (started)
-        mModules.putInService(module);
+        mModules.countAsLoaded(module);
     else
         // Why it was not loaded is what a person needs to know; whether it is still mapped matters to nobody.
         static_cast<void>(takeOut(module));
@@ -255,7 +255,7 @@ Result<> DynamicLinker::sendOff(Module* module)
 
 Result<> DynamicLinker::checkFreeToGo(const Module* module) const
 {
-    if (!module || !module->inService)
+    if (!module || !module->isLoaded)
         return Failure{L"it is not loaded"};
     if (module->locked)
         return Failure{L"it is locked"};
@@ -292,7 +292,7 @@ Module* DynamicLinker::known(const std::wstring& realPath, const RegularFile& pr
 bool DynamicLinker::isModuleLocked(const wchar_t* path) const
 {
     const Module* module = find(path);
-    return module && module->inService && module->locked;
+    return module && module->isLoaded && module->locked;
 }
 
 bool DynamicLinker::setApplicationLocked(void* application, bool locked)
@@ -306,13 +306,13 @@ bool DynamicLinker::setApplicationLocked(void* application, bool locked)
 bool DynamicLinker::isModuleLoaded(const wchar_t* path) const
 {
     const Module* module = find(path);
-    return module && module->inService;
+    return module && module->isLoaded;
 }
 
 std::vector<DynamicLinker::LoadedModule> DynamicLinker::loadedModules() const
 {
     std::vector<LoadedModule> result;
-    for (const Module* module : mModules.inService())
+    for (const Module* module : mModules.loaded())
         result.push_back({module->path, module->name, module->locked});
     return result;
 }
@@ -326,9 +326,9 @@ std::wstring DynamicLinker::pathOfModule(const std::wstring& name) const
 void DynamicLinker::unloadAll()
 {
     mEnding = true;
-    while (!mModules.inService().empty())
+    while (!mModules.loaded().empty())
     {
-        Module& last = *mModules.inService().back();
+        Module& last = *mModules.loaded().back();
         if (const auto ended = send(last, TSRX_MSG_UNLOAD); !ended)
             mCommandLine.say(sentence(last.path, L"did not end as it should: ", ended.sentence()));
         mCommands.removeCommandsOf(last.path);

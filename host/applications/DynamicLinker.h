@@ -62,10 +62,10 @@ public:
     bool isModuleLocked(const wchar_t* path) const override;
     bool setApplicationLocked(void* application, bool locked) override;
 
-    // Whether the application at the path is in service.
+    // Whether the application at the path counts as loaded.
     bool isModuleLoaded(const wchar_t* path) const;
 
-    // What is in service, in the order in which it was loaded.
+    // What counts as loaded, in the order in which it came to.
     std::vector<LoadedModule> loadedModules() const;
 
     // The full path of the first loaded application of that name, in any case; empty when there is none.

@@ -25,24 +25,24 @@ Module& LoadedModules::add(std::unique_ptr<Module> module)
     return added;
 }
 
-void LoadedModules::putInService(Module& module)
+void LoadedModules::countAsLoaded(Module& module)
 {
-    if (module.inService)
+    if (module.isLoaded)
         return;
-    module.inService = true;
-    mInService.push_back(&module);
+    module.isLoaded = true;
+    mLoaded.push_back(&module);
     mByName[foldCase(module.name)].push_back(&module);
 }
 
 void LoadedModules::remove(Module& module)
 {
-    if (module.inService)
+    if (module.isLoaded)
     {
         const auto named = mByName.find(foldCase(module.name));
         std::erase(named->second, &module);
         if (named->second.empty())
             mByName.erase(named);
-        std::erase(mInService, &module);
+        std::erase(mLoaded, &module);
     }
     mByPath.erase(module.path);
     mByPath.erase(module.realPath);

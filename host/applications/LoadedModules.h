@@ -1,4 +1,5 @@
-// The compiled applications that the host knows: those in service, and those whose load message still runs.
+// The compiled applications that the host knows: those that count as loaded, and those whose load message
+// still runs.
 #pragma once
 
 #include <cstddef>
@@ -24,17 +25,17 @@ struct Module
     FileIdentity identity;
     std::unique_ptr<ModuleLibrary> library;
     TsRxEntryPoint entryPoint = nullptr;
-    bool inService = false;
+    bool isLoaded = false;
     bool locked = false;
 };
 
 class LoadedModules
 {
 public:
-    // Takes the application in, not in service yet.
+    // Takes the application in, not loaded yet.
     Module& add(std::unique_ptr<Module> module);
     // It counts as loaded from now on. A second call does nothing.
-    void putInService(Module& module);
+    void countAsLoaded(Module& module);
     // Forgets it; the reference ends here.
     void remove(Module& module);
 
@@ -42,17 +43,17 @@ public:
     Module* withPath(const std::wstring& path) const;
     Module* withIdentity(const FileIdentity& identity) const;
     Module* withHandle(const void* handle) const;
-    // The first loaded of those in service that share a name, in any case of letters.
+    // The first of those loaded that share a name, in any case of letters.
     const Module* named(const std::wstring& name) const;
 
-    // In the order in which they came into service.
-    const std::vector<Module*>& inService() const { return mInService; }
+    // In the order in which they came to count as loaded.
+    const std::vector<Module*>& loaded() const { return mLoaded; }
 
 private:
     std::unordered_map<const void*, std::unique_ptr<Module>> mByHandle;
     std::unordered_map<std::wstring, Module*> mByPath;
     std::map<FileIdentity, Module*> mByIdentity;
-    std::unordered_map<std::wstring, std::vector<Module*>> mByName; // folded; in order of service
-    std::vector<Module*> mInService;
+    std::unordered_map<std::wstring, std::vector<Module*>> mByName; // folded; in the order of loading
+    std::vector<Module*> mLoaded;
 };
 } // namespace tessel

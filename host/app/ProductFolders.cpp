@@ -1,4 +1,4 @@
-#include "host/app/Layout.h"
+#include "host/app/ProductFolders.h"
 
 #include <cstdlib>
 
@@ -14,13 +14,13 @@ constexpr char kProductFolder[] = "Tessel";
 constexpr char kProgramsOfBundle[] = "MacOS"; // Tessel.app/Contents/MacOS
 } // namespace
 
-Layout layoutOf(const std::filesystem::path& binaries)
+ProductFolders productFoldersOf(const std::filesystem::path& binaries)
 {
     const auto contents = binaries.filename() == kProgramsOfBundle ? binaries.parent_path() : binaries;
     return {binaries, contents / "Resources", contents / "PlugIns"};
 }
 
-Layout runningLayout()
+ProductFolders runningProductFolders()
 {
     Dl_info library{};
     static const char insideOfLibrary = 0;
@@ -28,7 +28,7 @@ Layout runningLayout()
     std::filesystem::path file;
     if (dladdr(&insideOfLibrary, &library) != 0)
         file = std::filesystem::canonical(library.dli_fname, error);
-    return layoutOf(file.parent_path());
+    return productFoldersOf(file.parent_path());
 }
 
 std::filesystem::path personalFolder()

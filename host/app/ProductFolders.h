@@ -6,18 +6,18 @@
 
 namespace tessel
 {
-struct Layout
+struct ProductFolders
 {
     std::filesystem::path binaries;
     std::filesystem::path resources;
     std::filesystem::path plugIns;
 };
 
-// The layout of the app whose programs are in that folder: `Contents/MacOS` or the app's own folder.
-Layout layoutOf(const std::filesystem::path& binaries);
+// The folders of the app whose programs are in that folder: `Contents/MacOS` or the app's own folder.
+ProductFolders productFoldersOf(const std::filesystem::path& binaries);
 
-// The layout of the running host.
-Layout runningLayout();
+// The folders of the running host.
+ProductFolders runningProductFolders();
 
 // Where a person's own profile is kept: $XDG_DATA_HOME/Tessel or ~/.local/share/Tessel, or in
 // Application Support. Empty when the environment names no home.
