@@ -29,6 +29,7 @@
 #include "host/files/HostInformation.h"
 #include "host/files/RemoteFiles.h"
 #include "host/lisp/LispInterpreter.h"
+#include "host/messages/Browser.h"
 #include "host/messages/Help.h"
 #include "host/messages/MessageBox.h"
 #include "host/registry/Profiles.h"

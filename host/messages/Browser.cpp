@@ -1,4 +1,4 @@
-#include "host/messages/Help.h"
+#include "host/messages/Browser.h"
 
 #include <algorithm>
 #include <string>

@@ -27,7 +27,4 @@ private:
     std::filesystem::path mBook;
     Browser mBrowser;
 };
-
-// The browser of the person at the display, if there are both.
-bool openInBrowser(const std::filesystem::path& page);
 } // namespace tessel

@@ -3,7 +3,7 @@
 
 #include <objc/runtime.h>
 
-namespace tessel::windowing
+namespace tessel
 {
 // Replaces the method and answers the toolkit's own, or null where there is no such method.
 //
@@ -32,4 +32,4 @@ Function overrideIn(const char* className, SEL selector, Function replacement)
     class_addMethod(target, selector, reinterpret_cast<IMP>(untyped), method_getTypeEncoding(inherited));
     return reinterpret_cast<Function>(toolkits);
 }
-} // namespace tessel::windowing
+} // namespace tessel

@@ -9,7 +9,7 @@
 #include <sys/stat.h>
 #include <sys/wait.h>
 
-#include "host/messages/Help.h"
+#include "host/messages/Browser.h"
 #include "host/messages/platform/Desktop.h"
 #include "tests/support/TemporaryFolder.h"
 
