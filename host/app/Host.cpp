@@ -4,6 +4,7 @@
 #include <utility>
 
 #include "host/app/BuiltIn.h"
+#include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
 #include "host/applications/StartSummary.h"
 #include "host/console/Console.h"
@@ -16,11 +17,6 @@ namespace tessel
 namespace
 {
 constexpr int kDeepestScript = 16;
-
-std::wstring wideText(const std::filesystem::path& path)
-{
-    return toWide(path.string());
-}
 } // namespace
 
 Host::Host(HostOptions options) : mOptions(std::move(options)), mCommandLine(mOptions.output)
@@ -113,7 +109,7 @@ Result<> Host::prepareProfileFolder()
             L"Tessel does not know where to keep its profile: HOME is not set, and no folder was given."};
     const auto failed = [this](const std::wstring& reason)
     {
-        return Failure{L"The profile folder " + wideText(mOptions.profileFolder) + L" cannot be made: " +
+        return Failure{L"The profile folder " + toText(mOptions.profileFolder) + L" cannot be made: " +
                        reason + L"."};
     };
     if (const auto made = makePrivateFolder(mOptions.profileFolder); !made)
@@ -143,7 +139,7 @@ bool Host::tellWhoElseWrites(const std::wstring& kind, const std::filesystem::pa
     const auto checked = checkNobodyElseWrites(path);
     if (checked || !std::filesystem::exists(path, unreachable))
         return true;
-    mCommandLine.say(L"The " + kind + L" " + wideText(path) + L" is not safe: " + checked.sentence() +
+    mCommandLine.say(L"The " + kind + L" " + toText(path) + L" is not safe: " + checked.sentence() +
                      L"; others could change what Tessel loads.");
     return false;
 }
@@ -184,7 +180,7 @@ bool Host::finishLine()
 Result<> Host::runScript(const std::filesystem::path& script)
 {
     if (mScriptDepth == kDeepestScript)
-        return Failure{L"The script " + wideText(script) +
+        return Failure{L"The script " + toText(script) +
                        L" is not run: it seems to be a script that runs itself."};
     ++mScriptDepth;
     auto done = Console(mCommandLine, *this).runScript(script);

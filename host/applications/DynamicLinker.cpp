@@ -12,6 +12,7 @@
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
 #include "host/messages/MessageBox.h"
+#include "host/platform/RealPath.h"
 #include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
 
@@ -39,12 +40,10 @@ std::wstring fullPathOf(const wchar_t* path)
     return failed ? full : toWide(folder.native()) + kSeparator + full;
 }
 
-// Where the path leads through all links; itself where nothing stands.
+// Where the path leads through all links.
 std::wstring realPathOf(const std::wstring& path)
 {
-    std::error_code failed;
-    const auto real = std::filesystem::canonical(toUtf8(path), failed);
-    return failed ? path : toWide(real.native());
+    return toWide(realPath(toUtf8(path)).native());
 }
 
 std::wstring nameIn(const std::wstring& path)
@@ -149,8 +148,8 @@ Result<> DynamicLinker::loadNew(const std::wstring& path, bool resolveNow)
 {
     const auto file = moduleFileAt(toUtf8(path));
     const RegularFile program = programOf(file);
-    const std::wstring realPath = realPathOf(path);
-    if (const Module* loaded = known(realPath, program))
+    const std::wstring real = realPathOf(path);
+    if (const Module* loaded = known(real, program))
         return answerForKnown(*loaded);
     if (!file)
         return file.failure();
@@ -167,7 +166,7 @@ Result<> DynamicLinker::loadNew(const std::wstring& path, bool resolveNow)
         return opened.failure();
     std::unique_ptr<Module> module = *std::move(opened);
     module->path = path;
-    module->realPath = realPath;
+    module->realPath = real;
     module->name = nameIn(path);
     module->identity = program.identity();
     return start(mModules.add(std::move(module)));

@@ -2,7 +2,6 @@
 
 #include <cerrno>
 #include <cstdint>
-#include <cstring>
 #include <optional>
 #include <string_view>
 
@@ -15,6 +14,7 @@
 #include "host/platform/OrdinaryFile.h"
 #include "host/platform/PartFile.h"
 #include "host/platform/PrivateFolder.h"
+#include "host/platform/SystemFailure.h"
 #include "host/text/Credentials.h"
 #include "host/text/Unicode.h"
 
@@ -100,10 +100,10 @@ bool isSameFile(int descriptor, const std::filesystem::path& path)
            open.st_ino == named.st_ino;
 }
 
-bool isOrdinary(int descriptor)
+Result<> checkOpened(const Descriptor& file)
 {
     struct stat status = {};
-    return fstat(descriptor, &status) == 0 && S_ISREG(status.st_mode);
+    return fstat(file.number(), &status) == 0 ? checkOrdinary(status) : systemFailure(errno);
 }
 
 // The file, for this session alone until it is closed. Another session may put a shorter one in its place
@@ -114,7 +114,7 @@ Descriptor openAlone(const std::filesystem::path& path)
     {
         Descriptor file(
             open(path.c_str(), O_RDWR | O_APPEND | O_CREAT | O_CLOEXEC | O_NONBLOCK | O_NOCTTY, kOwnersOnly));
-        if (!file || !isOrdinary(file.number()) || flock(file.number(), LOCK_EX) != 0 ||
+        if (!file || !checkOpened(file) || flock(file.number(), LOCK_EX) != 0 ||
             isSameFile(file.number(), path))
             return file;
     }
@@ -179,9 +179,9 @@ Result<> TypedHistory::add(const std::wstring& line)
         return {};
     Descriptor file = openAlone(mFile);
     if (!file)
-        return giveUp(L"cannot be written", toWide(std::strerror(errno)));
-    if (!isOrdinary(file.number()))
-        return giveUp(L"is not used", L"it is not an ordinary file");
+        return giveUp(L"cannot be written", systemFailure(errno).sentence);
+    if (const auto ordinary = checkOpened(file); !ordinary)
+        return giveUp(L"is not used", ordinary.sentence());
     auto written = file.write(beginning(file.number()) + encoded(kept) + "\n");
     if (written)
         written = file.close();

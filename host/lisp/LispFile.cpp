@@ -1,10 +1,7 @@
 #include "host/lisp/LispFile.h"
 
 #include <algorithm>
-#include <cerrno>
 #include <filesystem>
-#include <fstream>
-#include <iterator>
 #include <optional>
 #include <string_view>
 #include <system_error>
@@ -12,6 +9,7 @@
 
 #include "host/lisp/CompiledLisp.h"
 #include "host/lisp/LispSource.h"
+#include "host/platform/OrdinaryFile.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -40,7 +38,6 @@ struct FoundFile
 {
     std::wstring name;
     fs::path path;
-    fs::file_status status;
 };
 
 // An application may hand over a path as it is written on other systems.
@@ -64,7 +61,7 @@ Result<FoundFile> find(const std::wstring& given)
             const fs::path path = toUtf8(name);
             const auto status = fs::status(path, error);
             if (fs::exists(status) && !(fs::is_directory(status) && extension.empty()))
-                return FoundFile{given + std::wstring(extension), path, status};
+                return FoundFile{given + std::wstring(extension), path};
             if (!first)
                 first = error;
         }
@@ -114,18 +111,12 @@ bool isCompiled(const std::wstring& name)
 
 Result<LispFile> readFound(const FoundFile& found)
 {
-    std::error_code error;
-    // A pipe or a device might never end.
-    if (!fs::is_regular_file(found.status))
-        return refusedLispFile(found.name, L"it is not an ordinary file.");
-    if (fs::file_size(found.path, error) > kLargestLispFile && !error)
+    const auto bytes = readOrdinaryFile(found.path, kLargestLispFile);
+    if (bytes.code() == kTooLarge)
         return refusedLispFile(found.name, L"it is larger than 32 MB.");
-    errno = 0;
-    std::ifstream stream(found.path, std::ios::binary);
-    const std::string bytes{std::istreambuf_iterator<char>(stream), {}};
-    if (!stream.is_open() || stream.bad())
-        return refusedLispFile(found.name, systemText({errno, std::generic_category()}));
-    return isCompiled(found.name) ? decodeCompiled(found.name, bytes) : decodeSource(found.name, bytes);
+    if (!bytes)
+        return refusedLispFile(found.name, bytes.sentence() + L".");
+    return isCompiled(found.name) ? decodeCompiled(found.name, *bytes) : decodeSource(found.name, *bytes);
 }
 } // namespace
 

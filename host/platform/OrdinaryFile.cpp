@@ -24,7 +24,7 @@ Failure whyUnreadable()
 
 Failure tooLarge(std::uintmax_t mostBytes)
 {
-    return {L"it is larger than " + std::to_wstring(mostBytes) + L" bytes"};
+    return {L"it is larger than " + std::to_wstring(mostBytes) + L" bytes", kTooLarge};
 }
 } // namespace
 
