@@ -47,8 +47,7 @@ void nameEveryFile()
     if (toolkitBytesOf)
         return;
     constexpr char kManager[] = "NSFileManager";
-    toolkitBytesOf = windowing::standInFor(kManager, @selector(fileSystemRepresentationWithPath:), bytesOf);
-    toolkitStringOf =
-        windowing::standInFor(kManager, @selector(stringWithFileSystemRepresentation:length:), stringOf);
+    toolkitBytesOf = standInFor(kManager, @selector(fileSystemRepresentationWithPath:), bytesOf);
+    toolkitStringOf = standInFor(kManager, @selector(stringWithFileSystemRepresentation:length:), stringOf);
 }
 } // namespace tessel
