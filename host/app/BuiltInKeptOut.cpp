@@ -122,9 +122,9 @@ Result<std::wstring> runBisect(Parts& parts, const std::wstring& word)
     if (equalIgnoringCase(word, L"START"))
         return parts.bisecting.begin(parts.admission.suspects());
     if (equalIgnoringCase(word, L"GOOD"))
-        return parts.bisecting.answer(true, parts.admission.whyNotLetIn());
+        return parts.bisecting.answer(true, parts.admission.whyNotAsPlanned());
     if (equalIgnoringCase(word, L"BAD"))
-        return parts.bisecting.answer(false, parts.admission.whyNotLetIn());
+        return parts.bisecting.answer(false, parts.admission.whyNotAsPlanned());
     if (equalIgnoringCase(word, L"STOP"))
         return parts.bisecting.stop();
     return word.empty() ? parts.bisecting.tell() : wrongUsage(parts, L"BISECT");

@@ -53,8 +53,11 @@ void Host::judgeEarlierSessions()
         mCommandLine.say(sentence);
     if (mCommandLine.tell(begun.stored))
         mParts->marker->forgetLeftovers();
-    for (const auto& line : mParts->bisecting.sentencesAtStart([this](const std::string& suspect)
-                                                               { return mParts->admission.whyOut(suspect); }))
+    const auto whyNotTried = [this](const std::string& suspect)
+    {
+        return mParts->bisecting.keepsOut(suspect) ? std::wstring() : mParts->admission.whyOut(suspect);
+    };
+    for (const auto& line : mParts->bisecting.sentencesAtStart(whyNotTried))
         mCommandLine.say(line);
 }
 
@@ -82,6 +85,7 @@ Result<> Host::makeParts()
                                                      return finishLine();
                                                  }});
     tellOfRegistry();
+    mCommandLine.tell(mParts->marker->outlivesProcess());
     if (const Outcome& started = mParts->startedLisp; !started)
         return started.failure();
     mInterruptible = &mParts->lisp();
@@ -228,7 +232,13 @@ void Host::requestEnd() noexcept
 {
     mEndRequest.make();
     if (LispInterpreter* lisp = mInterruptible)
-        lisp->interrupt();
+        lisp->interruptUntilItEnds();
+}
+
+bool Host::runsLisp() const noexcept
+{
+    const LispInterpreter* lisp = mInterruptible;
+    return lisp && lisp->running();
 }
 
 std::vector<std::wstring> Host::commandNames() const

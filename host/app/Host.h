@@ -68,6 +68,7 @@ public:
     bool interrupt() noexcept override;
     void noteEndByKey() noexcept override;
     void requestEnd() noexcept override;
+    bool runsLisp() const noexcept override;
 
     // Can be read from when the session is to end (see EndRequest).
     int endRequest() const { return mEndRequest.descriptor(); }

@@ -78,13 +78,15 @@ std::wstring Admission::whyOut(const std::string& path) const
     return reason.empty() ? reason : L"is " + reason;
 }
 
-std::function<std::wstring(const std::string&)> Admission::whyNotLetIn() const
+std::function<std::wstring(const std::string&)> Admission::whyNotAsPlanned() const
 {
     std::set<std::string> letIn;
     for (const std::string& path : mAskedFor)
         letIn.insert(realPath(path).native());
     return [this, letIn = std::move(letIn)](const std::string& path) -> std::wstring
     {
+        if (mBisecting.keepsOut(path))
+            return mLoadedAllTheSame.contains(path) ? L"was loaded all the same" : L"";
         if (letIn.contains(path))
             return {};
         const std::wstring reason = whyOut(path);
@@ -92,8 +94,10 @@ std::function<std::wstring(const std::string&)> Admission::whyNotLetIn() const
     };
 }
 
-void Admission::noteLoaded(const std::wstring& path) const
+void Admission::noteLoaded(const std::wstring& path)
 {
+    if (mBisecting.keepsOut(toUtf8(path)))
+        mLoadedAllTheSame.insert(realPath(toUtf8(path)).native());
     mKeptOut.noteLoaded(toUtf8(path), mMarker.reason() == Reason::kByHand);
 }
 } // namespace tessel

@@ -40,13 +40,13 @@ public:
     std::wstring whyKeptOut(const std::wstring& path) const;
     // The same as the end of a sentence about it: "is kept out ...".
     std::wstring whyOut(const std::string& path) const;
-    // Once the start is over: tells of a path without links why the application there was not let in by it.
-    // Empty when it was.
-    std::function<std::wstring(const std::string&)> whyNotLetIn() const;
+    // Once the start is over: tells of a path without links why the application there was not let in by it,
+    // or that it was loaded though BISECT keeps it out. Empty when neither is so.
+    std::function<std::wstring(const std::string&)> whyNotAsPlanned() const;
     // Whether this session has not loaded it by itself, or would not have.
     bool keptOutAtStart(const std::wstring& path) const { return mSafe || !whyKeptOut(path).empty(); }
     // What was let in is loaded.
-    void noteLoaded(const std::wstring& path) const;
+    void noteLoaded(const std::wstring& path);
     // The application at work has others loaded with it, now or later.
     void noteCarrier();
 
@@ -61,5 +61,6 @@ private:
     bool mSafe;
     std::vector<std::string> mAskedFor;
     std::set<std::string, std::less<>> mCarriers;
+    std::set<std::string> mLoadedAllTheSame; // of what BISECT keeps out
 };
 } // namespace tessel

@@ -111,10 +111,11 @@ std::vector<std::wstring> Bisecting::sentencesAtStart(const WhyNotTried& whyNotT
 Result<> Bisecting::checkTried(const WhyNotTried& whyNotTried) const
 {
     for (const std::string& suspect : mApplied->suspects)
-        if (const std::wstring why = keepsOut(suspect) ? L"" : whyNotTried(suspect); !why.empty())
-            return Failure{L"This session cannot be judged: \"" + toWide(suspect) +
-                           L"\", which was to be loaded, " + why +
-                           L". ENABLE lets in what is kept out, BISECT STOP ends the search."};
+        if (const std::wstring why = whyNotTried(suspect); !why.empty())
+            return Failure{L"This session cannot be judged: \"" + toWide(suspect) + L"\", which was to " +
+                           (keepsOut(suspect) ? L"stay out, " + why + L". Start Tessel again"
+                                              : L"be loaded, " + why + L". ENABLE lets in what is kept out") +
+                           L"; BISECT STOP ends the search."};
     return {};
 }
 

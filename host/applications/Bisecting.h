@@ -26,8 +26,8 @@ public:
     bool isGoingOn() const { return mApplied.has_value(); }
     // Whether this session keeps the application at that full path out.
     bool keepsOut(const std::string& path) const;
-    // Why a suspect that was to be loaded was not, the end of a sentence; empty when it was. Its session says
-    // nothing about it, and cannot be judged.
+    // Why a suspect that was to be loaded was not, or that one was loaded which was to stay out, the end of a
+    // sentence; empty when all went as planned. A session in which it did not cannot be judged.
     using WhyNotTried = std::function<std::wstring(const std::string& suspect)>;
 
     // What a person is to be told at the start, line by line.

@@ -211,7 +211,10 @@ Result<> KeptOut::change(const std::function<void(Applications&)>& work)
     work(*applications);
     mApplications = *std::move(applications);
     const auto after = serialized(mApplications);
-    return before == after ? Result<>() : replaceSmallFile(mFile, after);
+    if (before == after)
+        return {};
+    return locked.held() ? replaceSmallFile(mFile, after)
+                         : Failure{L"What is kept out cannot be stored: " + locked.held().sentence() + L"."};
 }
 
 KeptOut::Start KeptOut::begin(const std::vector<RunningMarker::Leftover>& leftovers, bool givesTrials)

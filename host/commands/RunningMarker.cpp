@@ -2,7 +2,9 @@
 
 #include <algorithm>
 #include <array>
+#include <cerrno>
 #include <csignal>
+#include <cstring>
 #include <ctime>
 #include <memory>
 #include <utility>
@@ -13,6 +15,7 @@
 
 #include "host/platform/PrivateFolder.h"
 #include "host/platform/SmallFile.h"
+#include "host/text/Unicode.h"
 
 namespace tessel
 {
@@ -73,18 +76,33 @@ struct RunningMarker::Page
     }
 };
 
-RunningMarker::RunningMarker(std::filesystem::path folder)
+RunningMarker::RunningMarker(const std::filesystem::path& folder)
+{
+    auto kept = keepIn(folder);
+    if (!kept)
+        mOutlivesProcess = Failure{L"What ends Tessel cannot be remembered: " + kept.sentence() + L"."};
+    if (!mPage)
+        map(MAP_ANONYMOUS, -1);
+}
+
+Result<> RunningMarker::keepIn(const std::filesystem::path& folder)
 {
     std::error_code failed;
-    std::filesystem::create_directories(folder, failed);
+    if (std::filesystem::create_directories(folder, failed); failed)
+        return Failure{L"the folder " + toWide(folder.string()) + L" cannot be made: " +
+                       toWide(failed.message())};
     // Held while we look for what others have left and make our own file: one that has no lock yet would be
     // taken for one of the dead.
     const FileLock locked(folder / kLockName);
     if (!locked.held())
-        return;
+        return locked.held();
     collect(folder);
     make(folder);
-    map();
+    const int file = mFile.descriptor;
+    if (file < 0 || !lockNow(file) || !fillWithZeros(file, sizeof(Page)) || !map(0, file))
+        return Failure{L"the file " + toWide(mFile.path.string()) + L" cannot be written: " +
+                       toWide(std::strerror(errno))};
+    return {};
 }
 
 RunningMarker::~RunningMarker()
@@ -150,17 +168,15 @@ void RunningMarker::make(const std::filesystem::path& folder)
     }
 }
 
-void RunningMarker::map()
+bool RunningMarker::map(int flags, int file)
 {
-    const int file = mFile.descriptor;
-    if (file < 0 || !lockNow(file) || !fillWithZeros(file, sizeof(Page)))
-        return;
-    void* mapped = mmap(nullptr, sizeof(Page), PROT_READ | PROT_WRITE, MAP_SHARED, file, 0);
+    void* mapped = mmap(nullptr, sizeof(Page), PROT_READ | PROT_WRITE, MAP_SHARED | flags, file, 0);
     if (mapped == MAP_FAILED)
-        return;
+        return false;
     mPage = static_cast<Page*>(mapped);
     mPage->process = getpid();
     mPage->magic = kMagic;
+    return true;
 }
 
 std::size_t RunningMarker::depth() const

@@ -14,6 +14,8 @@
 #include <string_view>
 #include <vector>
 
+#include "host/text/Result.h"
+
 namespace tessel
 {
 class RunningMarker
@@ -60,12 +62,16 @@ public:
 
     // Marks nothing.
     RunningMarker() = default;
-    // Makes the folder if need be. What cannot be made costs no more than the marks.
-    explicit RunningMarker(std::filesystem::path folder);
+    // Makes the folder if need be. Where no file can be kept there, the marks last as long as the process: it
+    // can still say what ended it, but the next start does not know.
+    explicit RunningMarker(const std::filesystem::path& folder);
     // The session has ended in good order.
     ~RunningMarker();
     RunningMarker(const RunningMarker&) = delete;
     RunningMarker& operator=(const RunningMarker&) = delete;
+
+    // Why the marks do not outlive the process, a whole sentence.
+    const Result<>& outlivesProcess() const { return mOutlivesProcess; }
 
     // Of sessions that ended while an application was at work. They are there again at the next start, until
     // they are forgotten.
@@ -141,8 +147,10 @@ private:
 
     void collect(const std::filesystem::path& folder);
     void make(const std::filesystem::path& folder);
-    void map();
+    Result<> keepIn(const std::filesystem::path& folder);
+    bool map(int flags, int file);
 
+    Result<> mOutlivesProcess;
     Page* mPage = nullptr;
     OpenFile mFile;
     std::vector<OpenFile> mOld; // held, so that no other session reads them as well

@@ -19,7 +19,7 @@ static_assert(std::atomic<int>::is_always_lock_free && std::atomic<time_t>::is_a
               "a signal handler must not wait");
 
 // Both may come together, and a terminal that closes may send its own twice: that means no more hurry. Who
-// asks again some time later means it, where the code of an application does not come back.
+// asks again some time later means it, where the code of an application, or Lisp, does not come back.
 bool isAskedAgain()
 {
     timespec now = {};
@@ -41,7 +41,7 @@ void onSignal(int signal)
 {
     int none = 0;
     theSignal.compare_exchange_strong(none, signal);
-    if (isAskedAgain() && sayLastWords(signal))
+    if (isAskedAgain() && (sayLastWords(signal) || theRunner->runsLisp()))
         endAtOnce(signal);
     theRunner->requestEnd();
 }

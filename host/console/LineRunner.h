@@ -27,5 +27,7 @@ public:
     virtual bool interrupt() noexcept = 0;
     virtual void noteEndByKey() noexcept = 0;
     virtual void requestEnd() noexcept = 0;
+    // Whether Lisp is running. Safe in a signal handler, too.
+    virtual bool runsLisp() const noexcept = 0;
 };
 } // namespace tessel

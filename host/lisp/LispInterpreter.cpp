@@ -134,6 +134,11 @@ void LispInterpreter::interrupt() noexcept
     mMachine->interrupt();
 }
 
+void LispInterpreter::interruptUntilItEnds() noexcept
+{
+    mMachine->interruptUntilItEnds();
+}
+
 bool LispInterpreter::running() const noexcept
 {
     return mMachine->running();

@@ -68,6 +68,8 @@ public:
 
     // Stops the evaluation that runs; without one, nothing. Safe in a signal handler and on any thread.
     void interrupt() noexcept;
+    // The same, and its clean-up as well when that does not end within some seconds.
+    void interruptUntilItEnds() noexcept;
     bool running() const noexcept;
 
     // Changes whenever an evaluation begins or ends. Safe in a signal handler.

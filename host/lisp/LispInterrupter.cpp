@@ -6,6 +6,7 @@
 #include <utility>
 
 #include <fcntl.h>
+#include <poll.h>
 #include <unistd.h>
 
 #include "host/text/Unicode.h"
@@ -84,6 +85,12 @@ void LispInterrupter::interrupt() noexcept
     errno = error;
 }
 
+void LispInterrupter::interruptUntilItEnds() noexcept
+{
+    mInsists = true;
+    interrupt();
+}
+
 bool LispInterrupter::takeRequest() noexcept
 {
     mTaken = std::chrono::steady_clock::now(); // before: without a request and without this the watcher would
@@ -109,8 +116,19 @@ void LispInterrupter::watch()
     leaveSignalsToOthers();
     mWays.begin();
     while (const auto run = receive())
+    {
         send(*run);
+        while (mInsists && *run == mRun.load() && !isNoteThereWithin(mWays.timeToCleanUp))
+            send(*run);
+    }
     mWays.end();
+}
+
+// Or the end of the notes.
+bool LispInterrupter::isNoteThereWithin(std::chrono::milliseconds time) const
+{
+    pollfd notes = {mNotes.output.number(), POLLIN, 0};
+    return poll(&notes, 1, static_cast<int>(time.count())) > 0;
 }
 
 bool LispInterrupter::isOnItsWay(Run run) const

@@ -28,6 +28,8 @@ public:
         // Interrupts the thread of Lisp, which is to ask `takeRequest` then.
         std::function<void()> send;
         std::function<void()> end; // after the last
+        // For what Lisp still does when it was interrupted for good.
+        std::chrono::milliseconds timeToCleanUp = std::chrono::seconds(2);
     };
 
     // Fails when the system has no pipe or thread to give. Why is the end of a sentence.
@@ -47,6 +49,9 @@ public:
 
     // Safe in a signal handler. Without an evaluation that runs it does nothing.
     void interrupt() noexcept;
+    // The same for good: whatever runs of it then, its clean-up too, is interrupted again and again, until it
+    // has ended.
+    void interruptUntilItEnds() noexcept;
 
     // Whether an interrupt was meant for the evaluation that runs; once true for each.
     bool takeRequest() noexcept;
@@ -64,12 +69,14 @@ private:
     bool isOnItsWay(Run run) const;
     void send(Run run);
     std::optional<Run> receive() const;
+    bool isNoteThereWithin(std::chrono::milliseconds time) const;
 
     Ways mWays;
     Pipe mNotes;
     int mDepth = 0;
     std::atomic<Run> mRun = 0;
     std::atomic<Run> mRequested = 0;
+    std::atomic<bool> mInsists = false;
     std::atomic<std::chrono::steady_clock::time_point> mTaken;
     Run mTakenRun = 0; // used by the thread of Lisp only
     Run mSent = 0;     // used by the watcher only

@@ -227,6 +227,11 @@ void LispMachine::interrupt() noexcept
     mSession->interrupter.interrupt();
 }
 
+void LispMachine::interruptUntilItEnds() noexcept
+{
+    mSession->interrupter.interruptUntilItEnds();
+}
+
 bool LispMachine::running() const noexcept
 {
     return mSession->interrupter.running();

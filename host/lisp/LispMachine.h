@@ -65,6 +65,7 @@ public:
 
     // From any thread or signal handler.
     void interrupt() noexcept;
+    void interruptUntilItEnds() noexcept;
     bool running() const noexcept;
 
     // Changes whenever an evaluation begins or ends. Safe in a signal handler.

@@ -1,6 +1,8 @@
 #include "host/platform/SmallFile.h"
 
 #include <cerrno>
+#include <cstring>
+#include <thread>
 
 #include <fcntl.h>
 #include <unistd.h>
@@ -21,29 +23,54 @@ Failure failed(const std::filesystem::path& file, const wchar_t* what, const std
     return {L"The file " + toWide(file.string()) + what + why + L"."};
 }
 
-// Locks of this kind belong to the process: a child that an application has left behind does not hold them.
-bool lock(int descriptor, int command)
+std::wstring lastError()
 {
-    struct flock whole = {};
-    whole.l_type = F_WRLCK;
-    whole.l_whence = SEEK_SET;
-    int status = 0;
-    do
-        status = fcntl(descriptor, command, &whole);
-    while (status != 0 && errno == EINTR);
-    return status == 0;
+    return toWide(std::strerror(errno));
+}
+
+bool isHeldByAnother()
+{
+    return errno == EAGAIN || errno == EACCES;
+}
+
+// The system would wait as long as the other program holds it; a lock that a server has forgotten is held for
+// ever.
+bool lockWithin(std::chrono::milliseconds patience, int descriptor)
+{
+    constexpr auto kBetweenTries = std::chrono::milliseconds(10);
+    const auto end = std::chrono::steady_clock::now() + patience;
+    while (!lockNow(descriptor))
+    {
+        if (!isHeldByAnother() || std::chrono::steady_clock::now() >= end)
+            return false;
+        std::this_thread::sleep_for(kBetweenTries);
+    }
+    return true;
 }
 } // namespace
 
-FileLock::FileLock(const std::filesystem::path& file)
-    : mFile(open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, kOwnersOnly)),
-      mHeld(mFile && lock(mFile.number(), F_SETLKW))
+FileLock::FileLock(const std::filesystem::path& file, std::chrono::milliseconds patience)
+    : mFile(open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, kOwnersOnly))
 {
+    if (!mFile)
+        mHeld = Failure{L"the file " + toWide(file.string()) + L" cannot be opened: " + lastError()};
+    else if (!lockWithin(patience, mFile.number()))
+        mHeld = Failure{L"the file " + toWide(file.string()) + L" cannot be locked: " +
+                        (isHeldByAnother() ? L"another program holds it" : lastError())};
 }
 
+// Locks of this kind belong to the process: a child that an application has left behind does not hold them.
 bool lockNow(int descriptor)
 {
-    return lock(descriptor, F_SETLK);
+    int status = 0;
+    do
+    {
+        struct flock whole = {};
+        whole.l_type = F_WRLCK;
+        whole.l_whence = SEEK_SET;
+        status = fcntl(descriptor, F_SETLK, &whole);
+    } while (status != 0 && errno == EINTR);
+    return status == 0;
 }
 
 Result<std::optional<std::string>> readSmallFile(const std::filesystem::path& file)

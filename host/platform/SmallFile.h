@@ -1,6 +1,7 @@
 // Small files in which the host keeps what must not be lost when a process ends: read whole, replaced whole.
 #pragma once
 
+#include <chrono>
 #include <filesystem>
 #include <optional>
 #include <string>
@@ -12,18 +13,21 @@
 
 namespace tessel
 {
-// Held by one process at a time, for as long as the object lives; others wait. The lock is the process's: one
-// object for a file at a time.
+// Held by one process at a time, for as long as the object lives; others wait, but not for ever. The lock is
+// the process's: one object for a file at a time.
 class FileLock
 {
 public:
+    static constexpr auto kPatience = std::chrono::seconds(5);
+
     // Makes the file if need be.
-    explicit FileLock(const std::filesystem::path& file);
-    bool held() const { return mHeld; }
+    explicit FileLock(const std::filesystem::path& file, std::chrono::milliseconds patience = kPatience);
+    // Why it is not is the end of a sentence.
+    const Result<>& held() const { return mHeld; }
 
 private:
     Descriptor mFile;
-    bool mHeld;
+    Result<> mHeld;
 };
 
 // Locks an open file as a whole for this process: at once or not at all.

@@ -167,6 +167,23 @@ TEST_F(Bisect, JudgesOnlySessionsThatWereStartedForIt)
     EXPECT_THAT(result.output, HasSubstr("This session cannot be judged: "));
 }
 
+TEST_F(Bisect, JudgesNoSessionInWhichThePersonLoadedWhatItKeepsOut)
+{
+    const Paths suite = {write("a"), write("b")};
+    begin(suite);
+    for (const std::string& path : suite)
+        EXPECT_EQ(session.run({"LOAD " + path}).exitStatus, 0);
+    const std::string kept =
+        session.run({"VERSION"}).output.find("a runs") == std::string::npos ? suite[0] : suite[1];
+    const auto result = session.run({"LOAD " + kept, "BISECT GOOD"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output,
+                HasSubstr("This session cannot be judged: \"" + kept +
+                          "\", which was to stay out, was loaded all the same. Start Tessel again; "
+                          "BISECT STOP ends the search."));
+    EXPECT_EQ(session.run({"BISECT GOOD"}).exitStatus, 0);
+}
+
 TEST_F(Bisect, EndsWhenItIsStopped)
 {
     begin({write("a"), write("b")});

@@ -122,6 +122,21 @@ TEST(LastWordsOf, AnApplicationCalledByBytesThatAreNoTextAreReadable)
                                          "/segv-?31m????\xE2\x82\xAC\xF0\x9F\x98\x80??.zmb\" has "));
 }
 
+// Nothing can be kept in the profile: the next start does not know, but this session still says it.
+TEST(LastWordsOf, AnApplicationAreSaidWhereTheyCannotBeKept)
+{
+    const HostSession session;
+    session.folder().write("profile/applications", "in the way");
+    const std::string path = deadly(session, "exit");
+    const auto result = session.run({"LOAD " + path, "VERSION"});
+    EXPECT_EQ(result.exitStatus, 1) << result.output;
+    EXPECT_THAT(result.output, HasSubstr("What ends Tessel cannot be remembered: the folder " +
+                                         (session.folder().path() / "profile/applications").string()));
+    EXPECT_THAT(result.output, testing::EndsWith("The application \"" + path +
+                                                 "\" has ended Tessel while its "
+                                                 "entry point ran: it called \"exit\".\n"));
+}
+
 TEST(LastWordsOf, AChildThatEndsAreNone)
 {
     const HostSession session;

@@ -62,6 +62,16 @@ TEST_P(Signals, EndAHostWhoseLispRunsAway)
     EXPECT_EQ(terminal.waitForEnd(), 128 + GetParam());
 }
 
+TEST_P(Signals, EndAHostWhoseLispCleansUpForEver)
+{
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.awaitPrompt());
+    terminal.type("(unwind-protect (progn (princ \"be\") (princ \"gun\") (loop)) (loop))\r");
+    ASSERT_TRUE(terminal.shows("begun")) << terminal.screen();
+    kill(terminal.process(), GetParam());
+    EXPECT_EQ(terminal.waitForEnd(), 128 + GetParam());
+}
+
 // The first file is stopped; the one after it would run away as well.
 TEST_P(Signals, EndAHostWhoseSuiteRunsAway)
 {

@@ -227,11 +227,20 @@ TEST_F(Marker, PassesOverFilesThatAreNone)
     EXPECT_TRUE(leftovers().empty());
 }
 
-TEST_F(Marker, MarksNothingWhereItsFolderCannotBeMade)
+TEST_F(Marker, MarksForAsLongAsTheProcessLastsWhereItsFolderCannotBeMade)
 {
     const auto file = mFolder.write("file", "");
     RunningMarker marker(file / "folder");
+    EXPECT_EQ(marker.outlivesProcess().sentence(), L"What ends Tessel cannot be remembered: the folder " +
+                                                       (file / "folder").wstring() +
+                                                       L" cannot be made: Not a directory.");
     const RunningMarker::Scope scope(marker, Deed::kLoading, "/a");
     RunningMarker::AtWork work{};
-    EXPECT_FALSE(marker.innermost(work));
+    ASSERT_TRUE(marker.innermost(work));
+    EXPECT_EQ(work.path, "/a");
+}
+
+TEST_F(Marker, OutlivesTheProcess)
+{
+    EXPECT_TRUE(RunningMarker(mFolder.path()).outlivesProcess());
 }

@@ -33,6 +33,7 @@ public:
     bool interrupt() noexcept override { return false; }
     void noteEndByKey() noexcept override {}
     void requestEnd() noexcept override {}
+    bool runsLisp() const noexcept override { return false; }
 
     std::vector<std::wstring> inputs;
 

@@ -19,6 +19,9 @@ public:
     bool interrupt() noexcept override { return false; }
     void noteEndByKey() noexcept override {}
     void requestEnd() noexcept override { mEnding = true; }
+    bool runsLisp() const noexcept override { return mRunsLisp; }
+
+    bool mRunsLisp = false;
 
 private:
     volatile bool mEnding = false;
@@ -38,7 +41,29 @@ private:
     raise(SIGHUP);
     _exit(kWentOn);
 }
+
+// Some seconds after the first: somebody has waited for the end in vain.
+[[noreturn]] void askAgain(bool runsLisp)
+{
+    EndingRunner runner;
+    runner.mRunsLisp = runsLisp;
+    const EndSignals signals(runner);
+    raise(SIGTERM);
+    sleep(3);
+    raise(SIGTERM);
+    _exit(kWentOn);
+}
 } // namespace
+
+TEST(EndSignals, ThatComeAgainEndAHostAtOnceWhoseLispDoesNotComeBack)
+{
+    EXPECT_EXIT(askAgain(true), testing::KilledBySignal(SIGTERM), "");
+}
+
+TEST(EndSignals, ThatComeAgainLetAHostStoreWhatItStores)
+{
+    EXPECT_EXIT(askAgain(false), testing::ExitedWithCode(kWentOn), "");
+}
 
 TEST(EndSignals, ThatComeWhileTheHostEndsOnOneOfThemLetItEndInGoodOrder)
 {

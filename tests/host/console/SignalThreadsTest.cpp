@@ -24,6 +24,7 @@ public:
     }
     void noteEndByKey() noexcept override {}
     void requestEnd() noexcept override { ++mEnds; }
+    bool runsLisp() const noexcept override { return false; }
     int interrupts() const { return mInterrupts; }
     int ends() const { return mEnds; }
 

@@ -77,6 +77,28 @@ TEST_F(InterruptedThread, IsSentOneInterruptAndTakesItOnce)
     EXPECT_EQ(mSent, 1);
 }
 
+TEST_F(InterruptedThread, IsSentOneAfterAnotherUntilItEndsWhenItIsToEnd)
+{
+    auto insisting = ways();
+    insisting.timeToCleanUp = std::chrono::milliseconds(250);
+    const auto started = LispInterrupter::start(insisting);
+    ASSERT_TRUE(started);
+    LispInterrupter& interrupter = **started;
+    interrupter.begin();
+    interrupter.interruptUntilItEnds();
+    for (int sent = 0; sent < 3; ++sent)
+    {
+        mSent.wait(sent);
+        EXPECT_TRUE(interrupter.takeRequest());
+    }
+    interrupter.end();
+    const int sent = mSent;
+    interrupter.begin(); // something else, which nobody has asked to end
+    std::this_thread::sleep_for(2 * insisting.timeToCleanUp);
+    interrupter.end();
+    EXPECT_EQ(mSent, sent);
+}
+
 TEST_F(InterruptedThread, IsLeftAloneWhileNothingRuns)
 {
     {
