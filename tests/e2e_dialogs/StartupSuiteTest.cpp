@@ -90,6 +90,7 @@ TEST_F(DialogStartupSuite, ShowsTipsInAsManyLinesAsTheyNeed)
     const std::string first = writeLisp(std::string(200, 'x') + ".lsp");
     storeSuite({first});
     runQuietly({"DISABLE " + first});
+    open();
     openSuite();
     mScreen.moveOn(mSuite, places::kFirstSuiteRow);
     std::string tip;
