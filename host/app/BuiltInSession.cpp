@@ -21,6 +21,7 @@ void sayCommand(Parts& parts, const CommandStack::Description& command)
 
 Result<> listCommands(Parts& parts)
 {
+    sayLine(parts, toWide(versionLine()));
     std::wstring group;
     for (const auto& command : parts.commands->descriptions())
     {
@@ -65,7 +66,7 @@ Result<> changeFolder(Parts& parts, const CommandStack::Arguments& arguments)
 
 Result<> tellVersion(Parts& parts, const CommandStack::Arguments&)
 {
-    return succeed(parts, toWide(kVersionLine));
+    return succeed(parts, toWide(versionLine()));
 }
 } // namespace
 

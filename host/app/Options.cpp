@@ -22,7 +22,7 @@ void declare(CLI::App& app, Options& options)
 {
     app.footer(kAfterword);
     app.set_help_flag("--help", "Show this text and end");
-    app.set_version_flag("--version", kVersionLine, "Show the version and end");
+    app.set_version_flag("--version", versionLine(), "Show the version and end");
     app.add_option("--profile-dir", options.profileFolder,
                    "Keep everything in this folder instead of your own")
         ->type_name("DIR");

@@ -62,7 +62,7 @@ void takeStandardDescriptors()
 
 void greet(CommandLine& commandLine)
 {
-    commandLine.say(toWide(kVersionLine) + L". Type HELP for the list of commands, QUIT to leave.");
+    commandLine.say(toWide(kProgramLine) + L". Type HELP for the list of commands, QUIT to leave.");
 }
 
 int runBatch(Host& host, const Options& options)

@@ -15,6 +15,7 @@
 #include "host/platform/PartFile.h"
 #include "host/text/TerminalText.h"
 #include "host/text/Unicode.h"
+#include "host/text/Version.h"
 
 namespace tessel
 {
@@ -106,6 +107,8 @@ int runCompilerProgram(int count, const char* const* arguments)
 {
     CLI::App app("Compiles a Lisp file for Tessel to byte code.", "tesselc");
     app.footer(kCompilerAfterword);
+    app.set_version_flag("--version", versionLine("tesselc, the Lisp compiler of Tessel R21"),
+                         "Show the version and end");
     std::string input;
     std::string output;
     app.add_option("FILE", input, "The Lisp file (.lsp)")->required();

@@ -119,7 +119,7 @@ TEST_F(BrokenBundles, InTheStartupSuiteCostOneEntryEach)
     storeSuite(session, suite);
     const auto result = session.run({"VERSION"});
     expectOneRefusalEach(result);
-    EXPECT_THAT(result.output, EndsWith("Tessel R21, reference host for Modrig\n"
+    EXPECT_THAT(result.output, EndsWith("Tessel R21, reference host for Modrig, version " MODRIG_VERSION "\n"
                                         "Good.omp: message 2\nGood.zmb: message 2\n"));
 }
 

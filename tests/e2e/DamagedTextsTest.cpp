@@ -110,7 +110,8 @@ TEST_F(DamagedTexts, ThatAreCutShortNeverEndTheHost)
             EXPECT_THAT(result.output, HasSubstr(".\n" + notLoaded + notStarted()));
         else
             EXPECT_TRUE(result.output.starts_with("Command: APPS\n" + listed(bundle))) << result.output;
-        EXPECT_TRUE(result.output.ends_with("Command: VERSION\nTessel R21, reference host for Modrig\n"))
+        EXPECT_TRUE(result.output.ends_with(
+            "Command: VERSION\nTessel R21, reference host for Modrig, version " MODRIG_VERSION "\n"))
             << length << result.output;
     }
 }
@@ -128,7 +129,8 @@ TEST_F(DamagedTexts, WithRandomBytesChangedNeverEndTheHost)
         std::ofstream(texts, std::ios::binary) << changed;
         const auto result = run({"VERSION"});
         EXPECT_EQ(result.exitStatus, 0) << "round " << round << ": " << result.output;
-        EXPECT_TRUE(result.output.ends_with("Command: VERSION\nTessel R21, reference host for Modrig\n"))
+        EXPECT_TRUE(result.output.ends_with(
+            "Command: VERSION\nTessel R21, reference host for Modrig, version " MODRIG_VERSION "\n"))
             << "round " << round << ": " << result.output;
         EXPECT_THAT(result.output,
                     AnyOf(HasSubstr("/nowhere/missing.zmb"), HasSubstr("The resource module \"")));

@@ -18,6 +18,9 @@
 
 inline constexpr std::chrono::seconds kHostTimeLimit{60};
 
+// What the host answers when it is asked for its version.
+inline constexpr char kVersionLine[] = "Tessel R21, reference host for Modrig, version " MODRIG_VERSION "\n";
+
 struct HostResult
 {
     std::string output; // what the host printed, errors included, without times

@@ -143,9 +143,12 @@ TEST(LastWordsOf, AChildThatEndsAreNone)
     const std::string path = deadly(session, "child");
     const auto result = session.run({"LOAD " + path, "VERSION"});
     EXPECT_EQ(result.exitStatus, 0);
-    EXPECT_EQ(result.output, kBanner + ("Command: LOAD " + path) + "\nchild.zmb: message 1\n" + path +
-                                 " is loaded.\nCommand: VERSION\nTessel R21, reference host for Modrig\n" +
-                                 "child.zmb: message 2\n");
+    EXPECT_EQ(
+        result.output,
+        kBanner + ("Command: LOAD " + path) + "\nchild.zmb: message 1\n" + path +
+            " is loaded.\nCommand: VERSION\nTessel R21, reference host for Modrig, version " MODRIG_VERSION
+            "\n" +
+            "child.zmb: message 2\n");
 }
 
 TEST(LastWordsOf, TheHostItselfAreNone)

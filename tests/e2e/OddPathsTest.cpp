@@ -127,9 +127,10 @@ TEST_F(OddPaths, OfFourThousandCharactersThatAreMissingAreTold)
         const std::string module = longPath("missing.zmb", length);
         const auto result = session.run({"LOAD " + module, "VERSION"});
         const std::string reason = length > 4095 ? "File name too long" : "No such file or directory";
-        EXPECT_EQ(result.output, kBanner + ("Command: LOAD " + module + "\n") +
-                                     linkerRefuses(module, reason) +
-                                     "Command: VERSION\nTessel R21, reference host for Modrig\n");
+        EXPECT_EQ(result.output,
+                  kBanner + ("Command: LOAD " + module + "\n") + linkerRefuses(module, reason) +
+                      "Command: VERSION\nTessel R21, reference host for Modrig, version " MODRIG_VERSION
+                      "\n");
     }
 }
 
@@ -148,15 +149,17 @@ TEST_F(OddPaths, OfFourThousandCharactersEndTheStartupSuite)
     const std::string module = makeModule(longPath("Good.omp", 4000));
     storeSuite(session, {lispFixture("good.lsp"), module, fixtureModule("Good.zmb")});
     const auto result = session.run({"VERSION"});
-    EXPECT_EQ(result.output, kBanner + kLoadedLisp + kLispReady +
-                                 "Command: VERSION\nTessel R21, reference host for Modrig\n");
+    EXPECT_EQ(result.output,
+              kBanner + kLoadedLisp + kLispReady +
+                  "Command: VERSION\nTessel R21, reference host for Modrig, version " MODRIG_VERSION "\n");
 }
 
 TEST_F(OddPaths, WithTheLongestFileNameAreLoadedFromTheStartupSuite)
 {
     const std::string name = std::string(kLongestFileName - 4, 'n') + ".zmb";
     storeSuite(session, {makeModule(session.folder() / name)});
-    EXPECT_EQ(session.run({"VERSION"}).output, kBanner + (name + ": message 1\nCommand: VERSION\n") +
-                                                   "Tessel R21, reference host for Modrig\n" + name +
-                                                   ": message 2\n");
+    EXPECT_EQ(session.run({"VERSION"}).output,
+              kBanner + (name + ": message 1\nCommand: VERSION\n") +
+                  "Tessel R21, reference host for Modrig, version " MODRIG_VERSION "\n" + name +
+                  ": message 2\n");
 }

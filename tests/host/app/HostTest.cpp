@@ -37,7 +37,7 @@ TEST_F(HostInProcess, RunsLinesFromItsStartToItsEnd)
     ASSERT_TRUE(host.start()) << output;
     EXPECT_EQ(output, "");
     EXPECT_TRUE(host.run(L"VERSION"));
-    EXPECT_EQ(output, "Tessel R21, reference host for Modrig\n");
+    EXPECT_EQ(output, "Tessel R21, reference host for Modrig, version " MODRIG_VERSION "\n");
     EXPECT_FALSE(host.isEnding());
     EXPECT_TRUE(host.run(L"quit"));
     EXPECT_TRUE(host.isEnding());
@@ -65,7 +65,7 @@ TEST_F(HostInProcess, EvaluatesQueuedLispWhenTheLineIsDone)
     qxr_queueexpr(L"(princ \"queued\")");
     EXPECT_EQ(output, "");
     EXPECT_TRUE(host.run(L"VERSION"));
-    EXPECT_EQ(output, "Tessel R21, reference host for Modrig\nqueued");
+    EXPECT_EQ(output, "Tessel R21, reference host for Modrig, version " MODRIG_VERSION "\nqueued");
 }
 
 TEST_F(HostInProcess, StoresWhatALineWrote)
