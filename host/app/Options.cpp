@@ -12,11 +12,12 @@ namespace tessel
 namespace
 {
 constexpr char kAfterword[] =
-    "With --script or -c, Tessel runs the script, then the commands, and ends: with status 0, or with 1 if "
-    "a\n"
-    "command was unknown or failed or a Lisp expression had an error. Otherwise it reads commands from the\n"
-    "terminal, or line by line from a pipe, which is treated like a script. Wrong arguments end with status "
-    "2.";
+    "Tessel loads the files first. With --script or -c it runs the script, then the commands, and ends: "
+    "with\n"
+    "status 0, or with 1 if a file could not be loaded, a command was unknown or failed or a Lisp "
+    "expression\n"
+    "had an error. Otherwise it reads commands from the terminal, or line by line from a pipe, which is\n"
+    "treated like a script. Wrong arguments end with status 2.";
 
 void declare(CLI::App& app, Options& options)
 {
@@ -26,13 +27,19 @@ void declare(CLI::App& app, Options& options)
     app.add_option("--profile-dir", options.profileFolder,
                    "Keep everything in this folder instead of your own")
         ->type_name("DIR");
-    app.add_option("--script", options.script, "Run the commands in a file")->type_name("FILE");
+    auto* script =
+        app.add_option("--script", options.script, "Run the commands in a file")->type_name("SCRIPT");
     // One argument each, so that a command may begin with a dash and a file name may follow.
-    app.add_option("-c,--command", options.commands, "Run a command or a Lisp expression (may be repeated)")
-        ->type_name("COMMAND")
-        ->expected(1)
-        ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll)
-        ->allow_extra_args(false);
+    auto* command = app.add_option("-c,--command", options.commands,
+                                   "Run a command or a Lisp expression (may be repeated)")
+                        ->type_name("COMMAND")
+                        ->expected(1)
+                        ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll)
+                        ->allow_extra_args(false);
+    app.add_option("FILE", options.files, "Load applications, as LOAD does")->type_name("");
+    app.add_flag("--modrig", options.modrig, "Open Modrig's dialog, and end with it")
+        ->excludes(script)
+        ->excludes(command);
     app.add_flag("--safe", options.safe, "Start without loading any application by itself");
 }
 } // namespace

@@ -15,10 +15,12 @@ struct Options
     std::filesystem::path profileFolder; // empty: the person's own
     std::filesystem::path script;        // empty: none
     std::vector<std::string> commands;   // -c, in their order; UTF-8
+    std::vector<std::string> files;      // to be loaded first, as LOAD does, in their order
     bool safe = false;                   // start without loading any application by itself
+    bool modrig = false;                 // show Modrig's dialog, and nothing else
 
-    // Whether the host ends after the script and the commands instead of asking for more.
-    bool isBatch() const { return !script.empty() || !commands.empty(); }
+    // Whether the host ends after the script and the commands, or the dialog, instead of asking for more.
+    bool isBatch() const { return !script.empty() || !commands.empty() || modrig; }
 };
 
 // What the arguments ask for: a session with these options, or else a text to print.

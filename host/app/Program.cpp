@@ -14,6 +14,7 @@
 #include "host/app/Host.h"
 #include "host/app/Options.h"
 #include "host/app/ProductFolders.h"
+#include "host/commands/CommandRunner.h"
 #include "host/commands/LastWords.h"
 #include "host/console/Console.h"
 #include "host/console/EndSignals.h"
@@ -22,6 +23,7 @@
 #include "host/console/PipedInput.h"
 #include "host/console/StandardOutput.h"
 #include "host/console/TypedHistory.h"
+#include "host/messages/platform/Desktop.h"
 #include "host/text/TerminalText.h"
 #include "host/text/Unicode.h"
 #include "host/text/Version.h"
@@ -35,6 +37,7 @@ constexpr int kSomethingFailed = 1;
 constexpr int kEndedBySignal = 128; // and the signal's number, as shells have it
 
 constexpr char kHistoryFile[] = "history";
+constexpr wchar_t kDialogCommand[] = L"_MODRIG"; // by the name that is the same in every language
 
 // Lines are UTF-8 whatever the locale is called; only the character type is the host's to set.
 void useUtf8()
@@ -65,8 +68,25 @@ void greet(CommandLine& commandLine)
     commandLine.say(toWide(kProgramLine) + L". Type HELP for the list of commands, QUIT to leave.");
 }
 
+// Each that fails has been told, and keeps the others from nothing.
+bool loadFiles(Host& host, const std::vector<std::string>& files)
+{
+    bool allWell = true;
+    for (const auto& file : files)
+        allWell = (host.isEnding() || host.run(L"LOAD " + asPart(toWide(file)))) && allWell;
+    return allWell;
+}
+
+// Without a display the command says so, which is no failure of a command, but all that was asked for here.
+int showDialog(Host& host)
+{
+    return host.run(kDialogCommand) && hasDisplay() ? kAllWell : kSomethingFailed;
+}
+
 int runBatch(Host& host, const Options& options)
 {
+    if (options.modrig)
+        return showDialog(host);
     Console console(host.commandLine(), host);
     bool allWell = options.script.empty() || host.commandLine().tell(host.runScript(options.script));
     for (const auto& command : options.commands)
@@ -85,16 +105,21 @@ int converse(Host& host, const std::filesystem::path& profileFolder, InputSource
     return kAllWell;
 }
 
-int runSession(Host& host, const Options& options, const InterruptKey& interruptKey)
+int runPipe(Host& host, InputSource source)
 {
-    if (options.isBatch())
-        return runBatch(host, options);
-    const InputSource source(interruptKey.wakeUp(), host.endRequest());
-    if (isatty(STDIN_FILENO))
-        return converse(host, options.profileFolder, source);
     PipedInput bytes(source);
     std::istream lines(&bytes);
     return Console(host.commandLine(), host).runLines(lines) ? kAllWell : kSomethingFailed;
+}
+
+int runSession(Host& host, const Options& options, const InterruptKey& interruptKey)
+{
+    const bool filesLoaded = loadFiles(host, options.files);
+    const InputSource source(interruptKey.wakeUp(), host.endRequest());
+    if (!options.isBatch() && isatty(STDIN_FILENO)) // the person has read which files were not loaded
+        return converse(host, options.profileFolder, source);
+    const int status = options.isBatch() ? runBatch(host, options) : runPipe(host, source);
+    return filesLoaded ? status : kSomethingFailed;
 }
 
 int runHost(Options options, StandardOutput& output)
@@ -109,7 +134,8 @@ int runHost(Options options, StandardOutput& output)
                }});
     const InterruptKey interruptKey(host); // applications that load at start may run away too
     const EndSignals endSignals(host);
-    greet(host.commandLine());
+    if (!options.modrig)
+        greet(host.commandLine());
     if (!host.start())
         return kSomethingFailed;
     const int status = runSession(host, options, interruptKey);

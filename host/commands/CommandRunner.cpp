@@ -100,4 +100,12 @@ CommandStack::Arguments splitLine(std::wstring_view line)
     }
     return parts;
 }
+
+std::wstring asPart(std::wstring_view text)
+{
+    std::wstring part = L"\"";
+    for (const wchar_t character : text)
+        part += character == L'"' ? std::wstring(L"\"\"") : std::wstring(1, character);
+    return part + L"\"";
+}
 } // namespace tessel

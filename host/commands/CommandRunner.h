@@ -48,4 +48,7 @@ private:
 // doubled quote stands for one, so that a file with a quote in its name can be named. A quote that is not
 // closed reaches to the end of the line.
 CommandStack::Arguments splitLine(std::wstring_view line);
+
+// The text so quoted that in a line it is one part, whatever stands in it.
+std::wstring asPart(std::wstring_view text);
 } // namespace tessel

@@ -19,22 +19,13 @@ void require(bool condition)
         std::abort();
 }
 
-// The argument so that it stays one, whatever is in it.
-std::wstring quoted(const std::wstring& argument)
-{
-    std::wstring result = L"\"";
-    for (const wchar_t character : argument)
-        result += character == L'"' ? std::wstring(L"\"\"") : std::wstring(1, character);
-    return result + L"\" ";
-}
-
 // A line that is made of a line's parts has the same parts.
 void checkParts(const std::wstring& line)
 {
     const auto parts = tessel::splitLine(line);
     std::wstring again;
     for (const std::wstring& part : parts)
-        again += quoted(part);
+        again += tessel::asPart(part) + L" ";
     require(tessel::splitLine(again) == parts);
 }
 

@@ -41,12 +41,28 @@ TEST(Options, TakeAProfileFolderAndAScript)
     EXPECT_TRUE(parsed->options->isBatch());
 }
 
+TEST(Options, TakeFilesToLoadInTheirOrderWhereverTheyStand)
+{
+    const auto parsed = parse({"a b.lsp", "-c", "APPS", "primes.zmb", "--", "--odd.lsp"});
+    ASSERT_TRUE(parsed && parsed->options);
+    EXPECT_THAT(parsed->options->files, ElementsAre("a b.lsp", "primes.zmb", "--odd.lsp"));
+    EXPECT_THAT(parsed->options->commands, ElementsAre("APPS"));
+    EXPECT_FALSE(parse({"a.lsp"})->options->isBatch()) << "files alone leave the person at the prompt";
+}
+
+TEST(Options, TakeTheDialogAlone)
+{
+    EXPECT_TRUE(parse({"--modrig"})->options->modrig);
+    EXPECT_FALSE(parse({})->options->modrig);
+}
+
 TEST(Options, ShowHelpAndVersionWithStatusZero)
 {
     const auto help = parse({"--help"});
     ASSERT_TRUE(help);
     EXPECT_FALSE(help->options);
-    for (const char* option : {"--profile-dir", "--script", "-c", "--safe", "--version", "status 2"})
+    for (const char* option :
+         {"--profile-dir", "--script", "-c", "--safe", "--modrig", "FILE", "--version", "status 2"})
         EXPECT_THAT(help->text, HasSubstr(option));
     const auto version = parse({"--version"});
     ASSERT_TRUE(version);
@@ -56,7 +72,8 @@ TEST(Options, ShowHelpAndVersionWithStatusZero)
 TEST(Options, RefuseWhatTheyDoNotKnow)
 {
     for (const std::vector<const char*>& arguments :
-         {std::vector{"--unknown"}, std::vector{"word"}, std::vector{"-c"}, std::vector{"--script"}})
+         {std::vector{"--unknown"}, std::vector{"--modrig", "-c", "APPS"},
+          std::vector{"--modrig", "--script", "a.script"}, std::vector{"-c"}, std::vector{"--script"}})
     {
         const auto parsed = parse(arguments);
         EXPECT_FALSE(parsed) << arguments.front();

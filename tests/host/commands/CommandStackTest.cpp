@@ -7,6 +7,7 @@
 #include "host/commands/CommandStack.h"
 #include "tests/host/support/HostParts.h"
 
+using tessel::asPart;
 using tessel::CallingApplication;
 using tessel::running;
 using tessel::splitLine;
@@ -254,6 +255,12 @@ TEST(SplitLine, KeepsQuotedBlanksTogether)
     EXPECT_THAT(splitLine(LR"(SET key "" tail)"), ElementsAre(L"SET", L"key", L"", L"tail"));
     EXPECT_THAT(splitLine(LR"(a" "b)"), ElementsAre(L"a b"));
     EXPECT_THAT(splitLine(LR"(LOAD "no end)"), ElementsAre(L"LOAD", L"no end"));
+}
+
+TEST(SplitLine, FindsATextThatWasMadeAPartAsItWas)
+{
+    for (const std::wstring text : {L"a.lsp", L"", L"a b\t\n.lsp", L"\"", L"in \"quotes\".lsp", L"\"\""})
+        EXPECT_THAT(splitLine(L"LOAD " + asPart(text) + L" x"), ElementsAre(L"LOAD", text, L"x"));
 }
 
 TEST(SplitLine, TakesADoubledQuoteWithinQuotesForAQuote)
