@@ -38,7 +38,10 @@ bool Host::start()
     const RunningMarker::ReasonScope atStart(*mParts->marker, RunningMarker::Reason::kAtStart);
     mParts->messageBox->collect();
     if (!mOptions.safe)
+    {
+        mParts->sayRecordsTakenAlong();
         mParts->demandLoading.loadAtStart();
+    }
     finishLine();
     tellOfStart();
     return true;

@@ -109,8 +109,17 @@ struct Parts
                                *commandLine, *document, *endRequest);
     CommandRunner commandRunner{*commands, *commandLine, *callingApplication,
                                 [this](const std::wstring& name)
-                                { return demandLoading.loadForCommand(name); },
+                                {
+                                    sayRecordsTakenAlong();
+                                    return demandLoading.loadForCommand(name);
+                                },
                                 foundations.afterLine};
+
+    void sayRecordsTakenAlong()
+    {
+        for (const auto& sentence : demandLoading.takeRecordsAlong())
+            commandLine->say(sentence);
+    }
 
     // Only of parts whose Lisp has started.
     LispInterpreter& lisp() const { return **startedLisp; }

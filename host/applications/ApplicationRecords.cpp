@@ -17,6 +17,7 @@ namespace
 constexpr const wchar_t* kModule = L"Module";
 constexpr const wchar_t* kDescription = L"Description";
 constexpr const wchar_t* kLoadReasons = L"LoadReasons";
+constexpr const wchar_t* kToldGone = L"ToldGone";
 
 // A name with a separator would file the record below another one, where nobody looks for it.
 bool isRecordName(const std::wstring& name)
@@ -80,6 +81,7 @@ std::optional<ApplicationRecord> ApplicationRecords::read(const std::wstring& na
     record.module = *module;
     record.description = mRegistry.read(key, kDescription).value_or(L"");
     record.loadReasons = *reasons;
+    record.toldGone = mRegistry.read(key, kToldGone).value_or(L"");
     return record;
 }
 
@@ -101,6 +103,11 @@ Result<> ApplicationRecords::write(const ApplicationRecord& record)
     if (written)
         written = mRegistry.write(key, kLoadReasons, std::to_wstring(record.loadReasons));
     return written;
+}
+
+Result<> ApplicationRecords::writeToldGone(const ApplicationRecord& record)
+{
+    return mRegistry.write(keyOf(record.name), kToldGone, record.toldGone);
 }
 
 Result<> ApplicationRecords::writeCommandsOfCaller(const std::wstring& name)

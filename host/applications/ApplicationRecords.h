@@ -20,6 +20,7 @@ struct ApplicationRecord
     std::wstring module; // full path
     std::wstring description;
     unsigned loadReasons = 0;
+    std::wstring toldGone; // the module when the person was told that it is not there
     std::vector<std::pair<std::wstring, std::wstring>> commands; // global and local names
 };
 
@@ -37,6 +38,9 @@ public:
 
     // Stores the record in place of an earlier one of its name, all but its commands.
     Result<> write(const ApplicationRecord& record);
+
+    // Stores what the record says of a module that is not there.
+    Result<> writeToldGone(const ApplicationRecord& record);
 
     // Stores the commands of the application that is being called, in place of those of an earlier version.
     Result<> writeCommandsOfCaller(const std::wstring& name);

@@ -27,6 +27,13 @@ bool isApplication(const std::filesystem::path& path)
                                [&](std::wstring_view known) { return equalIgnoringCase(extension, known); });
 }
 
+// Not there, and not merely out of reach.
+bool isGone(const std::wstring& module)
+{
+    std::error_code unreachable;
+    return !std::filesystem::exists(toUtf8(module), unreachable) && !unreachable;
+}
+
 bool lists(const ApplicationRecord& record, std::wstring_view typedName)
 {
     const bool isGlobal = typedName.starts_with(kGlobalNameMark);
@@ -39,7 +46,7 @@ bool lists(const ApplicationRecord& record, std::wstring_view typedName)
 }
 } // namespace
 
-DemandLoading::DemandLoading(std::filesystem::path plugInsFolder, const ApplicationRecords& records,
+DemandLoading::DemandLoading(std::filesystem::path plugInsFolder, ApplicationRecords& records,
                              const DynamicLinker& linker, const Admission& admission, Loader load)
     : mPlugInsFolder(std::move(plugInsFolder)), mRecords(records), mLinker(linker), mAdmission(admission),
       mLoad(std::move(load))
@@ -51,10 +58,40 @@ void DemandLoading::loadAtStart() const
     // Asked before anything is loaded: what is loaded may write a record of its own.
     const auto plugIns = unrecordedPlugIns();
     for (const auto& record : mRecords.all())
-        if ((record.loadReasons & TSRX_LOAD_AT_HOST_START) != 0)
+        if ((record.loadReasons & TSRX_LOAD_AT_HOST_START) != 0 && isWorthTrying(record))
             mLoad(record.module);
     for (const auto& plugIn : plugIns)
         mLoad(toWide(plugIn.native()));
+}
+
+std::vector<std::wstring> DemandLoading::takeRecordsAlong() const
+{
+    std::vector<std::wstring> sentences;
+    const auto plugIns = unrecordedPlugIns();
+    for (ApplicationRecord& record : mRecords.all())
+    {
+        const auto name = std::filesystem::path(toUtf8(record.module)).filename();
+        const auto namesake = std::ranges::find(plugIns, name, &std::filesystem::path::filename);
+        if (namesake == plugIns.end() || !isGone(record.module))
+            continue;
+        const std::wstring before = std::exchange(record.module, toWide(namesake->native()));
+        if (const auto written = mRecords.write(record); !written)
+            sentences.push_back(written.sentence());
+        else
+            sentences.push_back(L"The application \"" + record.name + L"\" is " + record.module + L" now; " +
+                                before + L" is not there any more.");
+    }
+    return sentences;
+}
+
+// What cannot be stored costs no more than being told once more.
+bool DemandLoading::isWorthTrying(ApplicationRecord record) const
+{
+    const std::wstring gone = isGone(record.module) ? record.module : L"";
+    const std::wstring told = std::exchange(record.toldGone, gone);
+    if (gone != told)
+        static_cast<void>(mRecords.writeToldGone(record));
+    return gone.empty() || gone != told;
 }
 
 bool DemandLoading::loadNamesake(std::wstring_view command) const

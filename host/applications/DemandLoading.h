@@ -23,11 +23,17 @@ public:
     // is loaded.
     using Loader = std::function<bool(const std::wstring& path)>;
 
-    DemandLoading(std::filesystem::path plugInsFolder, const ApplicationRecords& records,
+    DemandLoading(std::filesystem::path plugInsFolder, ApplicationRecords& records,
                   const DynamicLinker& linker, const Admission& admission, Loader load);
+
+    // To be called before the next two. A record whose file is gone becomes that of a plug-in of the same
+    // name which has none: the host was moved as a whole. Answers what the person is to be told.
+    std::vector<std::wstring> takeRecordsAlong() const;
 
     // Loads what is due at the start: by the records, in their order, then from the PlugIns folder, by name.
     // What cannot be loaded does not keep the start from going on.
+    //
+    // Of a record whose file is gone it is told once, and not at every start.
     void loadAtStart() const;
 
     // Loads the application that has such a command, by its local or its global name, in any case of letters,
@@ -43,11 +49,12 @@ private:
     std::vector<std::filesystem::path> plugIns() const;
     std::vector<std::filesystem::path> unrecordedPlugIns() const;
     bool loadNamesake(std::wstring_view command) const;
+    bool isWorthTrying(ApplicationRecord record) const;
 
     bool isDue(const ApplicationRecord& record, std::wstring_view command) const;
 
     std::filesystem::path mPlugInsFolder;
-    const ApplicationRecords& mRecords;
+    ApplicationRecords& mRecords;
     const DynamicLinker& mLinker;
     const Admission& mAdmission;
     Loader mLoad;

@@ -14,8 +14,8 @@ TEST(FilesAsArguments, AreLoadedInTheirOrderBeforeTheCommands)
     const auto lisp = session.folder().write("in \"quotes\" a b.lsp", "(write-line \"it runs\")\n").string();
     const auto result = session.start({lisp, sample("primes.zmb"), "-c", "VERSION"});
     EXPECT_EQ(result.exitStatus, 0) << result.output;
-    EXPECT_EQ(result.output, kBanner + ("it runs\n" + lisp + " is loaded.\n" + kPrimes) + sample("primes.zmb") +
-                                 " is loaded.\nCommand: VERSION\n" + kVersionLine);
+    EXPECT_EQ(result.output, kBanner + ("it runs\n" + lisp + " is loaded.\n" + kPrimes) +
+                                 sample("primes.zmb") + " is loaded.\nCommand: VERSION\n" + kVersionLine);
 }
 
 TEST(FilesAsArguments, ThatCannotBeLoadedKeepTheOthersFromNothingAndTheStatusTells)
@@ -23,8 +23,9 @@ TEST(FilesAsArguments, ThatCannotBeLoadedKeepTheOthersFromNothingAndTheStatusTel
     const HostSession session;
     const auto result = session.start({"/nowhere/gone.zmb", sample("primes.zmb"), "-c", "VERSION"});
     EXPECT_EQ(result.exitStatus, 1);
-    EXPECT_EQ(result.output, kBanner + linkerRefuses("/nowhere/gone.zmb", "No such file or directory") + kPrimes +
-                                 sample("primes.zmb") + " is loaded.\nCommand: VERSION\n" + kVersionLine);
+    EXPECT_EQ(result.output, kBanner + linkerRefuses("/nowhere/gone.zmb", "No such file or directory") +
+                                 kPrimes + sample("primes.zmb") + " is loaded.\nCommand: VERSION\n" +
+                                 kVersionLine);
 }
 
 TEST(FilesAsArguments, AreFoundFromTheCurrentFolder)
@@ -34,7 +35,8 @@ TEST(FilesAsArguments, AreFoundFromTheCurrentFolder)
     session.startBy("cd '" + (session.folder() / "files").string() + "' && exec \"$0\" \"$@\"");
     const auto result = session.start({"here.lsp"});
     EXPECT_EQ(result.exitStatus, 0) << result.output;
-    EXPECT_THAT(result.output, HasSubstr("\nhere\n" + (session.folder() / "files/here.lsp").string() + " is loaded.\n"));
+    EXPECT_THAT(result.output,
+                HasSubstr("\nhere\n" + (session.folder() / "files/here.lsp").string() + " is loaded.\n"));
 }
 
 TEST(FilesAsArguments, LeaveThePersonAtThePrompt)

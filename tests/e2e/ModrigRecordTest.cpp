@@ -120,15 +120,28 @@ TEST_F(ModrigRecord, KeepsReasonsThatAreNotModrigsToManage)
     EXPECT_EQ(record(), recordWith("68"));
 }
 
-TEST_F(ModrigRecord, OfAModrigThatIsGoneIsTold)
+TEST_F(ModrigRecord, FollowsAHostThatWasMoved)
 {
     storeSuite(session, {sample("primes.zmb")});
     run({"APPS"});
     setInRecord("Module", "/nowhere/Modrig.bundle");
-    const std::string refusal = linkerRefuses("/nowhere/Modrig.bundle", "No such file or directory");
+    EXPECT_EQ(run({"APPS"}), "The application \"TesselModrig\" is " + modrigBundle() +
+                                 " now; /nowhere/Modrig.bundle is not there any more.\n" + kPrimes +
+                                 modrigLoaded() + listed(sample("primes.zmb")));
+    EXPECT_EQ(record(), recordWith("6"));
+    EXPECT_EQ(run({"APPS"}), kPrimes + modrigLoaded() + listed(sample("primes.zmb"))) << "told once";
+}
+
+TEST_F(ModrigRecord, OfAnApplicationThatIsGoneIsToldAtOneStart)
+{
+    storeSuite(session, {sample("primes.zmb")});
+    run({"APPS"});
+    setInRecord("Module", "/nowhere/Other.bundle");
+    const std::string refusal = linkerRefuses("/nowhere/Other.bundle", "No such file or directory");
     EXPECT_EQ(run({"APPS"}), refusal + kPrimes +
-                                 startSummary({{"/nowhere/Modrig.bundle", "No such file or directory."}}) +
+                                 startSummary({{"/nowhere/Other.bundle", "No such file or directory."}}) +
                                  modrigLoaded() + listed(sample("primes.zmb")) +
-                                 listedAsNotLoaded({{"/nowhere/Modrig.bundle", "No such file or directory"}}))
+                                 listedAsNotLoaded({{"/nowhere/Other.bundle", "No such file or directory"}}))
         << "the one in the PlugIns folder has no record and is loaded";
+    EXPECT_EQ(run({"APPS"}), kPrimes + modrigLoaded() + listed(sample("primes.zmb")));
 }

@@ -23,6 +23,12 @@ protected:
         ASSERT_EQ(info.writeToRegistry(false, true), TSRX_APPINFO_OK);
     }
 
+    void takeRecordsAlong()
+    {
+        for (const auto& sentence : mDemand.takeRecordsAlong())
+            mCommandLine.say(sentence);
+    }
+
     tessel::Registry mRegistry{mFolder / "registry.db"};
     tessel::Owned<tessel::ApplicationRecords> mRecords{mRegistry, mCommands, mCalls,
                                                        L"Software\\Tessel\\R21"};
@@ -49,6 +55,74 @@ TEST_F(Demand, GoesOnAfterARecordWhoseFileIsMissing)
     mDemand.loadAtStart();
     EXPECT_EQ(output(),
               notLoaded(mFolder / "gone.zmb", "No such file or directory") + "Good.zmb: message 1\n");
+}
+
+TEST_F(Demand, TellsOnceThatTheFileOfARecordIsGone)
+{
+    const auto path = fixture("Good.zmb");
+    record(L"Comes and goes", path, 2);
+    const std::string gone = notLoaded(path, "No such file or directory");
+    std::filesystem::rename(path, mFolder / "away.zmb");
+    mDemand.loadAtStart();
+    EXPECT_EQ(output(), gone);
+    mDemand.loadAtStart();
+    EXPECT_EQ(output(), "") << "told at the start before";
+    std::filesystem::rename(mFolder / "away.zmb", path);
+    mDemand.loadAtStart();
+    EXPECT_EQ(output(), "Good.zmb: message 1\n");
+    unload(path);
+    std::filesystem::remove(path);
+    output();
+    mDemand.loadAtStart();
+    EXPECT_EQ(output(), gone) << "it was there in between";
+}
+
+TEST_F(Demand, TakesARecordAlongToThePlugInsOfAHostThatWasMoved)
+{
+    const auto plugIn = fixture("Good.zmb", "PlugIns/Good.zmb");
+    record(L"Good", mFolder / "before/PlugIns/Good.zmb", 6);
+    takeRecordsAlong();
+    mDemand.loadAtStart();
+    EXPECT_EQ(output(), "The application \"Good\" is " + plugIn.native() + " now; " +
+                            (mFolder / "before/PlugIns/Good.zmb").native() +
+                            " is not there any more.\nGood.zmb: message 1\n");
+    const auto now = mRecords->read(L"Good");
+    ASSERT_TRUE(now);
+    EXPECT_EQ(now->module, toWide(plugIn.native()));
+    EXPECT_EQ(now->loadReasons, 6u);
+    unload(plugIn);
+    output();
+    takeRecordsAlong();
+    mDemand.loadAtStart();
+    EXPECT_EQ(output(), "Good.zmb: message 1\n") << "told once";
+}
+
+TEST_F(Demand, TakesARecordAlongWhenItsCommandIsTyped)
+{
+    const auto before = fixture("Command.zmb");
+    load(before);
+    record(L"Commands", before, 4);
+    unload(before);
+    std::filesystem::create_directories(mFolder / "PlugIns");
+    const auto plugIn = mFolder / "PlugIns/Command.zmb";
+    std::filesystem::rename(before, plugIn);
+    output();
+    takeRecordsAlong();
+    EXPECT_TRUE(mDemand.loadForCommand(L"PFAD"));
+    EXPECT_EQ(output(), "The application \"Commands\" is " + plugIn.native() + " now; " + before.native() +
+                            " is not there any more.\nCommand.zmb: message 1\n");
+}
+
+TEST_F(Demand, LeavesARecordWhoseFileIsThereToThatFile)
+{
+    const auto elsewhere = fixture("Good.zmb");
+    record(L"Good", elsewhere, 2);
+    std::filesystem::create_directories(mFolder / "PlugIns");
+    mFolder.write("PlugIns/Good.zmb", "no module");
+    mDemand.loadAtStart();
+    EXPECT_EQ(mRecords->read(L"Good")->module, toWide(elsewhere.native()));
+    EXPECT_EQ(output(), "Good.zmb: message 1\n" +
+                            notLoaded(mFolder / "PlugIns/Good.zmb", "it is not a shared library"));
 }
 
 TEST_F(Demand, LoadsPlugInsWithoutARecordInTheOrderOfTheirNames)
