@@ -1,0 +1,17 @@
+# write_styled_drawing(DRAWING STYLE OUTPUT): the drawing with those rules of the style sheet in it that it uses, for
+# programs that know nothing of the style sheet.
+function(write_styled_drawing drawing style output)
+  set_property(DIRECTORY APPEND PROPERTY CMAKE_CONFIGURE_DEPENDS "${drawing}" "${style}")
+  file(READ "${drawing}" text)
+  file(READ "${style}" rules)
+  string(REGEX MATCHALL "class=\"[a-z-]+\"" uses "${text}")
+  list(REMOVE_DUPLICATES uses)
+  set(used "")
+  foreach(use IN LISTS uses)
+    string(REGEX REPLACE "class=\"(.*)\"" "\\1" name "${use}")
+    string(REGEX MATCH "[.]${name} {[^}]*}" rule "${rules}")
+    string(APPEND used "    ${rule}\n")
+  endforeach()
+  string(REGEX REPLACE "(<svg [^>]*>\n)" "\\1  <style>\n${used}  </style>\n" text "${text}")
+  file(CONFIGURE OUTPUT "${output}" CONTENT "${text}" @ONLY)
+endfunction()

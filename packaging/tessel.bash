@@ -1,0 +1,24 @@
+# Completion of bash for tessel.
+_tessel() {
+  local word=${COMP_WORDS[COMP_CWORD]} before=${COMP_WORDS[COMP_CWORD - 1]}
+  case $before in
+    --profile-dir)
+      mapfile -t COMPREPLY < <(compgen -d -- "$word")
+      return
+      ;;
+    --script)
+      mapfile -t COMPREPLY < <(compgen -f -- "$word")
+      return
+      ;;
+    -c | --command) return ;;
+  esac
+  if [[ $word == -* ]]; then
+    mapfile -t COMPREPLY < <(compgen -W '--profile-dir --script -c --command --modrig --safe --help --version' -- "$word")
+  else
+    mapfile -t COMPREPLY < <(
+      compgen -f -X '!*.@(zmb|omp|lsp|qbc|rpk|mcp)' -- "$word"
+      compgen -d -- "$word" # also a bundle is a folder
+    )
+  fi
+}
+complete -o filenames -F _tessel tessel
