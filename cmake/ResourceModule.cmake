@@ -1,6 +1,6 @@
 # Texts by id: resource scripts become a portable executable without code that the host reads strings from.
-find_program(RESOURCE_COMPILER NAMES llvm-rc llvm-rc-14 REQUIRED)
-find_program(RESOURCE_LINKER NAMES lld-link lld-link-14 REQUIRED)
+find_program(RESOURCE_COMPILER NAMES llvm-rc REQUIRED)
+find_program(RESOURCE_LINKER NAMES lld-link REQUIRED)
 
 # add_resource_module(OUTPUT.dll SCRIPT.rc|OBJECT.obj...)
 # The scripts are UTF-8 and are not preprocessed, so that no C compiler is needed. The same scripts always give the
