@@ -20,7 +20,8 @@ using testing::Not;
 namespace
 {
 constexpr char kGoOn[] = "VERSION";
-constexpr char kStillThere[] = "Command: VERSION\nTessel R21, reference host for Modrig\n";
+constexpr char kStillThere[] =
+    "Command: VERSION\nTessel R21, reference host for Modrig, version " MODRIG_VERSION "\n";
 constexpr char kGoodLisp[] = "good.lsp: loaded\n";
 
 // What is said about a broken file between a good file of its kind and another one.
