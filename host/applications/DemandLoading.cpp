@@ -64,24 +64,37 @@ void DemandLoading::loadAtStart() const
         mLoad(toWide(plugIn.native()));
 }
 
+bool DemandLoading::standsInAnotherHost(const std::wstring& module) const
+{
+    const auto folder = std::filesystem::path(toUtf8(module)).parent_path();
+    return folder.filename() == mPlugInsFolder.filename() && realPath(folder) != realPath(mPlugInsFolder);
+}
+
 std::vector<std::wstring> DemandLoading::takeRecordsAlong() const
 {
     std::vector<std::wstring> sentences;
     const auto plugIns = unrecordedPlugIns();
-    for (ApplicationRecord& record : mRecords.all())
+    for (const ApplicationRecord& record : mRecords.all())
     {
         const auto name = std::filesystem::path(toUtf8(record.module)).filename();
         const auto namesake = std::ranges::find(plugIns, name, &std::filesystem::path::filename);
-        if (namesake == plugIns.end() || !isGone(record.module))
-            continue;
-        const std::wstring before = std::exchange(record.module, toWide(namesake->native()));
-        if (const auto written = mRecords.write(record); !written)
-            sentences.push_back(written.sentence());
-        else
-            sentences.push_back(L"The application \"" + record.name + L"\" is " + record.module + L" now; " +
-                                before + L" is not there any more.");
+        if (namesake != plugIns.end() && (isGone(record.module) || standsInAnotherHost(record.module)))
+            sentences.push_back(takeAlong(record, toWide(namesake->native())));
     }
+    std::erase(sentences, std::wstring());
     return sentences;
+}
+
+// What is to be told; nothing when all is as before.
+std::wstring DemandLoading::takeAlong(ApplicationRecord record, const std::wstring& plugIn) const
+{
+    const bool gone = isGone(record.module);
+    const std::wstring before = std::exchange(record.module, plugIn);
+    if (const auto written = mRecords.write(record); !written)
+        return written.sentence();
+    return gone ? L"The application \"" + record.name + L"\" is " + plugIn + L" now; " + before +
+                      L" is not there any more."
+                : std::wstring();
 }
 
 // What cannot be stored costs no more than being told once more.

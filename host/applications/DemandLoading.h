@@ -49,6 +49,8 @@ private:
     std::vector<std::filesystem::path> plugIns() const;
     std::vector<std::filesystem::path> unrecordedPlugIns() const;
     bool loadNamesake(std::wstring_view command) const;
+    bool standsInAnotherHost(const std::wstring& module) const;
+    std::wstring takeAlong(ApplicationRecord record, const std::wstring& plugIn) const;
     bool isWorthTrying(ApplicationRecord record) const;
 
     bool isDue(const ApplicationRecord& record, std::wstring_view command) const;

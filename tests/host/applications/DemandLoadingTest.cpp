@@ -113,12 +113,24 @@ TEST_F(Demand, TakesARecordAlongWhenItsCommandIsTyped)
                             " is not there any more.\nCommand.zmb: message 1\n");
 }
 
+TEST_F(Demand, TakesOverTheRecordOfAPlugInOfAnotherCopyOfTheHostWithoutAWord)
+{
+    const auto own = fixture("Good.zmb", "PlugIns/Good.zmb");
+    record(L"Good", fixture("Good.zmb", "other/PlugIns/Good.zmb"), 2);
+    takeRecordsAlong();
+    mDemand.loadAtStart();
+    EXPECT_EQ(output(), "Good.zmb: message 1\n") << "one of the two";
+    EXPECT_EQ(mRecords->read(L"Good")->module, toWide(own.native()));
+    EXPECT_TRUE(mLinker.isModuleLoaded(own.wstring().c_str()));
+}
+
 TEST_F(Demand, LeavesARecordWhoseFileIsThereToThatFile)
 {
     const auto elsewhere = fixture("Good.zmb");
     record(L"Good", elsewhere, 2);
     std::filesystem::create_directories(mFolder / "PlugIns");
     mFolder.write("PlugIns/Good.zmb", "no module");
+    takeRecordsAlong();
     mDemand.loadAtStart();
     EXPECT_EQ(mRecords->read(L"Good")->module, toWide(elsewhere.native()));
     EXPECT_EQ(output(), "Good.zmb: message 1\n" +
