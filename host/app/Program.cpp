@@ -14,6 +14,7 @@
 #include "host/app/Host.h"
 #include "host/app/Options.h"
 #include "host/app/ProductFolders.h"
+#include "host/app/WindowBox.h"
 #include "host/commands/CommandRunner.h"
 #include "host/commands/LastWords.h"
 #include "host/console/Console.h"
@@ -23,7 +24,6 @@
 #include "host/console/PipedInput.h"
 #include "host/console/StandardOutput.h"
 #include "host/console/TypedHistory.h"
-#include "host/messages/platform/Desktop.h"
 #include "host/text/TerminalText.h"
 #include "host/text/Unicode.h"
 #include "host/text/Version.h"
@@ -80,7 +80,8 @@ bool loadFiles(Host& host, const std::vector<std::string>& files)
 // Without a display the command says so, which is no failure of a command, but all that was asked for here.
 int showDialog(Host& host)
 {
-    return host.run(kDialogCommand) && hasDisplay() ? kAllWell : kSomethingFailed;
+    return host.run(kDialogCommand) && canShowWindows(runningProductFolders().binaries) ? kAllWell
+                                                                                        : kSomethingFailed;
 }
 
 int runBatch(Host& host, const Options& options)

@@ -8,3 +8,6 @@
 // open).
 extern "C" TESSEL_API int tsuiShowMessageBox(const wchar_t* text, const wchar_t* detail, unsigned style,
                                              void* parent);
+
+// `tsuiHasDisplay`, by a name that the host's library finds without linking to this one.
+extern "C" TESSEL_API bool tsuiCanShowWindows();

@@ -45,3 +45,8 @@ int tsuiShowMessageBox(const wchar_t* text, const wchar_t* detail, unsigned styl
     [pool drain];
     return answer;
 }
+
+bool tsuiCanShowWindows()
+{
+    return tsuiHasDisplay();
+}

@@ -51,8 +51,12 @@ TEST(FilesAsArguments, LeaveThePersonAtThePrompt)
 
 TEST(DialogAlone, EndsWithStatusOneWhereNoWindowCanBeOpened)
 {
-    const HostSession session;
-    const auto result = session.start({"--modrig"});
-    EXPECT_EQ(result.exitStatus, 1);
-    EXPECT_EQ(result.output, "Tessel cannot open a window: there is no display.\n");
+    HostSession session;
+    for (const char* display : {"", ":9999"})
+    {
+        session.set("DISPLAY", display);
+        const auto result = session.start({"--modrig"});
+        EXPECT_EQ(result.exitStatus, 1) << display;
+        EXPECT_EQ(result.output, "Tessel cannot open a window: there is no display.\n") << display;
+    }
 }
