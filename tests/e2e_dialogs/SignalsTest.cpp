@@ -149,9 +149,7 @@ TEST_F(DialogSignals, EndAHostAfterAMessageBoxOfItsStart)
     ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty()) << terminal.screen();
     mScreen.key("Return");
     ASSERT_TRUE(terminal.awaitPrompt());
-    terminal.type("(loop)\r");
-    terminal.type(kControlC);
-    ASSERT_TRUE(terminal.awaitPrompt());
+    ASSERT_TRUE(controlCStopsLisp(terminal));
     kill(terminal.process(), SIGTERM);
     EXPECT_EQ(terminal.waitForEnd(), 128 + SIGTERM);
 }
