@@ -19,10 +19,11 @@ namespace
 constexpr std::string_view kPrefix = ".part-";
 constexpr mode_t kForAll = 0666;
 
+// Where the system cannot say, it has: to make another file would not help.
 bool hasName(int file)
 {
     struct stat status = {};
-    return fstat(file, &status) == 0 && status.st_nlink > 0;
+    return fstat(file, &status) != 0 || status.st_nlink > 0;
 }
 
 // That a name leads to a file is on the disk only when its folder is. Not every file system can be asked.
