@@ -146,7 +146,7 @@ TEST_F(DialogSignals, EndAHostAfterAMessageBoxOfItsStart)
 {
     storeSuite({writeBroken()});
     HostTerminal terminal(mSession);
-    ASSERT_FALSE(mScreen.waitForWindow(kMessageBox).empty()) << terminal.screen();
+    ASSERT_FALSE(mScreen.waitForActive(kMessageBox).empty()) << terminal.screen();
     mScreen.key("Return");
     ASSERT_TRUE(terminal.awaitPrompt());
     ASSERT_TRUE(controlCStopsLisp(terminal));
