@@ -4,7 +4,6 @@
 #include <array>
 #include <cerrno>
 #include <csignal>
-#include <cstring>
 #include <ctime>
 #include <memory>
 #include <utility>
@@ -15,6 +14,7 @@
 
 #include "host/platform/PrivateFolder.h"
 #include "host/platform/SmallFile.h"
+#include "host/platform/SystemFailure.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -101,7 +101,7 @@ Result<> RunningMarker::keepIn(const std::filesystem::path& folder)
     const int file = mFile.descriptor;
     if (file < 0 || !lockNow(file) || !fillWithZeros(file, sizeof(Page)) || !map(0, file))
         return Failure{L"the file " + toWide(mFile.path.string()) + L" cannot be written: " +
-                       toWide(std::strerror(errno))};
+                       systemFailure(errno).sentence};
     return {};
 }
 

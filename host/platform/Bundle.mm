@@ -12,6 +12,7 @@
 #include "host/platform/FileNames.h"
 #include "host/platform/ObjectiveCGuard.h"
 #include "host/platform/RealPath.h"
+#include "host/platform/SystemFailure.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -92,7 +93,7 @@ Result<std::string> programOfBundle(const std::string& folder)
     const AutoreleasePool pool;
     std::error_code failed;
     if (!std::filesystem::exists(folder, failed))
-        return Failure{toWide(std::generic_category().message(failed ? failed.value() : ENOENT))};
+        return systemFailure(failed ? failed.value() : ENOENT);
     if (auto checked = checkDescription(folder); !checked)
         return checked.failure();
     Result<std::string> program = Failure{};

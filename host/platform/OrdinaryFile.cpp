@@ -2,7 +2,6 @@
 
 #include <array>
 #include <cerrno>
-#include <cstring>
 #include <system_error>
 
 #include <fcntl.h>
@@ -10,7 +9,7 @@
 #include <unistd.h>
 
 #include "host/platform/Descriptor.h"
-#include "host/text/Unicode.h"
+#include "host/platform/SystemFailure.h"
 
 namespace tessel
 {
@@ -19,7 +18,7 @@ namespace
 Failure whyUnreadable()
 {
     const bool isMissing = errno == ENOENT || errno == ENOTDIR;
-    return {toWide(std::strerror(errno)), isMissing ? kNothingThere : Failure::kUnspecified};
+    return {systemFailure(errno).sentence, isMissing ? kNothingThere : Failure::kUnspecified};
 }
 
 Failure tooLarge(std::uintmax_t mostBytes)

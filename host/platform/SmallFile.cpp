@@ -1,7 +1,6 @@
 #include "host/platform/SmallFile.h"
 
 #include <cerrno>
-#include <cstring>
 #include <thread>
 
 #include <fcntl.h>
@@ -10,6 +9,7 @@
 #include "host/platform/OrdinaryFile.h"
 #include "host/platform/PartFile.h"
 #include "host/platform/PrivateFolder.h"
+#include "host/platform/SystemFailure.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -21,11 +21,6 @@ constexpr std::uintmax_t kLargest = std::uintmax_t{4} << 20;
 Failure failed(const std::filesystem::path& file, const wchar_t* what, const std::wstring& why)
 {
     return {L"The file " + toWide(file.string()) + what + why + L"."};
-}
-
-std::wstring lastError()
-{
-    return toWide(std::strerror(errno));
 }
 
 bool isHeldByAnother()
@@ -53,10 +48,11 @@ FileLock::FileLock(const std::filesystem::path& file, std::chrono::milliseconds 
     : mFile(open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, kOwnersOnly))
 {
     if (!mFile)
-        mHeld = Failure{L"the file " + toWide(file.string()) + L" cannot be opened: " + lastError()};
+        mHeld = Failure{L"the file " + toWide(file.string()) + L" cannot be opened: " +
+                        systemFailure(errno).sentence};
     else if (!lockWithin(patience, mFile.number()))
         mHeld = Failure{L"the file " + toWide(file.string()) + L" cannot be locked: " +
-                        (isHeldByAnother() ? L"another program holds it" : lastError())};
+                        (isHeldByAnother() ? L"another program holds it" : systemFailure(errno).sentence)};
 }
 
 // Locks of this kind belong to the process: a child that an application has left behind does not hold them.

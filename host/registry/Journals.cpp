@@ -12,6 +12,7 @@
 #include <string_view>
 #include <vector>
 
+#include "host/platform/SystemFailure.h"
 #include "host/text/Hexadecimal.h"
 #include "host/text/Unicode.h"
 
@@ -141,7 +142,7 @@ Result<std::optional<std::wstring>> setForeignLogAside(const std::filesystem::pa
         L"the write-ahead log " + toWide(log.string()) +
         L" does not belong to it, but to another registry or to another state of it";
     if (rename(log.c_str(), aside.c_str()) != 0)
-        return Failure{belongsElsewhere + L", and cannot be set aside: " + toWide(std::strerror(errno))};
+        return Failure{belongsElsewhere + L", and cannot be set aside: " + systemFailure(errno).sentence};
     static_cast<void>(remove((file.string() + "-shm").c_str())); // it tells what is in the log
     return std::optional(L"The registry " + toWide(file.string()) + L" is read without its log: " +
                          belongsElsewhere + L". It was set aside as " + toWide(aside.string()) + L".");
