@@ -72,13 +72,18 @@ bool DemandLoading::standsInAnotherHost(const std::wstring& module) const
 
 std::vector<std::wstring> DemandLoading::takeRecordsAlong() const
 {
+    auto left = mRecords.all();
+    std::erase_if(left, [this](const ApplicationRecord& record)
+                  { return !isGone(record.module) && !standsInAnotherHost(record.module); });
     std::vector<std::wstring> sentences;
+    if (left.empty()) // as at most starts: nobody needs to look through the folder
+        return sentences;
     const auto plugIns = unrecordedPlugIns();
-    for (const ApplicationRecord& record : mRecords.all())
+    for (const ApplicationRecord& record : left)
     {
         const auto name = std::filesystem::path(toUtf8(record.module)).filename();
         const auto namesake = std::ranges::find(plugIns, name, &std::filesystem::path::filename);
-        if (namesake != plugIns.end() && (isGone(record.module) || standsInAnotherHost(record.module)))
+        if (namesake != plugIns.end())
             sentences.push_back(takeAlong(record, toWide(namesake->native())));
     }
     std::erase(sentences, std::wstring());
