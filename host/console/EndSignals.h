@@ -10,7 +10,7 @@ namespace tessel
 {
 // From its making to its end these signals end the runner's session in good order; after one has, they are
 // ignored for the rest of the process. One that comes some seconds after the first ends the process at once
-// if an application is at work, which is then named. One object at a time.
+// if an application is at work, which is then named, or Lisp that does not come back. One object at a time.
 class EndSignals
 {
 public:
