@@ -56,11 +56,8 @@ void Host::judgeEarlierSessions()
         mCommandLine.say(sentence);
     if (mCommandLine.tell(begun.stored))
         mParts->marker->forgetLeftovers();
-    const auto whyNotTried = [this](const std::string& suspect)
-    {
-        return mParts->bisecting.keepsOut(suspect) ? std::wstring() : mParts->admission.whyOut(suspect);
-    };
-    for (const auto& line : mParts->bisecting.sentencesAtStart(whyNotTried))
+    for (const auto& line : mParts->bisecting.sentencesAtStart([this](const std::string& suspect)
+                                                               { return mParts->admission.whyOut(suspect); }))
         mCommandLine.say(line);
 }
 

@@ -74,8 +74,8 @@ std::wstring Admission::whyKeptOut(const std::wstring& path) const
 
 std::wstring Admission::whyOut(const std::string& path) const
 {
-    const std::wstring reason = whyKeptOut(toWide(path));
-    return reason.empty() ? reason : L"is " + reason;
+    const KeptOutApplication* known = mBisecting.keepsOut(path) ? nullptr : mKeptOut.find(path);
+    return known && known->isOut() ? L"is " + reasonOf(*known) : L"";
 }
 
 std::function<std::wstring(const std::string&)> Admission::whyNotAsPlanned() const

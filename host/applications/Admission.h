@@ -38,7 +38,8 @@ public:
     Result<> check(const std::wstring& path);
     // Why the application is kept out at starts, as a part of a sentence; empty for one that is not.
     std::wstring whyKeptOut(const std::wstring& path) const;
-    // The same as the end of a sentence about it: "is kept out ...".
+    // Why what BISECT lets in is kept out all the same, the end of a sentence: "is kept out ...". Empty for
+    // what BISECT itself keeps out.
     std::wstring whyOut(const std::string& path) const;
     // Once the start is over: tells of a path without links why the application there was not let in by it,
     // or that it was loaded though BISECT keeps it out. Empty when neither is so.

@@ -88,7 +88,7 @@ bool Bisecting::keepsOut(const std::string& path) const
            !mApplied->bisection().isLoaded(static_cast<std::size_t>(found - mApplied->suspects.begin()));
 }
 
-std::vector<std::wstring> Bisecting::sentencesAtStart(const WhyNotTried& whyNotTried) const
+std::vector<std::wstring> Bisecting::sentencesAtStart(const WhyNotAsPlanned& whyNotAsPlanned) const
 {
     if (!mReadAtStart)
         return {mReadAtStart.sentence()};
@@ -101,17 +101,17 @@ std::vector<std::wstring> Bisecting::sentencesAtStart(const WhyNotTried& whyNotT
     lines.insert(lines.begin(), L"BISECT keeps " + std::to_wstring(lines.size()) + L" of " +
                                     counted(mApplied->suspects.size(), L" suspect", L" suspects") +
                                     L" out at this start:");
-    const auto tried = checkTried(whyNotTried);
-    lines.push_back(tried ? L"Type BISECT GOOD when the trouble is gone, BISECT BAD when it is there; " +
-                                startsLeft(mApplied->bisection()) + L"."
-                          : tried.sentence());
+    const auto fair = checkWentAsPlanned(whyNotAsPlanned);
+    lines.push_back(fair ? L"Type BISECT GOOD when the trouble is gone, BISECT BAD when it is there; " +
+                               startsLeft(mApplied->bisection()) + L"."
+                         : fair.sentence());
     return lines;
 }
 
-Result<> Bisecting::checkTried(const WhyNotTried& whyNotTried) const
+Result<> Bisecting::checkWentAsPlanned(const WhyNotAsPlanned& whyNotAsPlanned) const
 {
     for (const std::string& suspect : mApplied->suspects)
-        if (const std::wstring why = whyNotTried(suspect); !why.empty())
+        if (const std::wstring why = whyNotAsPlanned(suspect); !why.empty())
             return Failure{L"This session cannot be judged: \"" + toWide(suspect) + L"\", which was to " +
                            (keepsOut(suspect) ? L"stay out, " + why + L". Start Tessel again"
                                               : L"be loaded, " + why + L". ENABLE lets in what is kept out") +
@@ -145,7 +145,7 @@ Result<Bisecting::Search> Bisecting::current() const
     return **std::move(search);
 }
 
-Result<std::wstring> Bisecting::answer(bool wasGood, const WhyNotTried& whyNotTried)
+Result<std::wstring> Bisecting::answer(bool wasGood, const WhyNotAsPlanned& whyNotAsPlanned)
 {
     auto search = current();
     if (!search)
@@ -154,8 +154,8 @@ Result<std::wstring> Bisecting::answer(bool wasGood, const WhyNotTried& whyNotTr
         return Failure{
             L"This session cannot be judged: it was not started with the suspects that are to be tried. "
             L"Start Tessel again, without --safe."};
-    if (auto tried = checkTried(whyNotTried); !tried)
-        return tried.failure();
+    if (auto fair = checkWentAsPlanned(whyNotAsPlanned); !fair)
+        return fair.failure();
     search->answers.push_back(wasGood);
     const Bisection bisection = search->bisection();
     const bool isOpen = bisection.verdict() == Bisection::Verdict::kOpen;

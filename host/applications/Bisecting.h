@@ -28,14 +28,14 @@ public:
     bool keepsOut(const std::string& path) const;
     // Why a suspect that was to be loaded was not, or that one was loaded which was to stay out, the end of a
     // sentence; empty when all went as planned. A session in which it did not cannot be judged.
-    using WhyNotTried = std::function<std::wstring(const std::string& suspect)>;
+    using WhyNotAsPlanned = std::function<std::wstring(const std::string& suspect)>;
 
     // What a person is to be told at the start, line by line.
-    std::vector<std::wstring> sentencesAtStart(const WhyNotTried& whyNotTried) const;
+    std::vector<std::wstring> sentencesAtStart(const WhyNotAsPlanned& whyNotAsPlanned) const;
 
     // Each answers what a person is to be told.
     Result<std::wstring> begin(const std::vector<std::string>& suspects);
-    Result<std::wstring> answer(bool wasGood, const WhyNotTried& whyNotTried);
+    Result<std::wstring> answer(bool wasGood, const WhyNotAsPlanned& whyNotAsPlanned);
     Result<std::wstring> stop();
     Result<std::wstring> tell() const;
 
@@ -53,7 +53,7 @@ private:
     Result<> store(const Search& search) const;
     Result<> forget() const;
     Result<Search> current() const;
-    Result<> checkTried(const WhyNotTried& whyNotTried) const;
+    Result<> checkWentAsPlanned(const WhyNotAsPlanned& whyNotAsPlanned) const;
 
     std::filesystem::path mFile;
     std::optional<Search> mApplied; // what this session was started with
