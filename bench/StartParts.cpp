@@ -1,4 +1,4 @@
-// What the host cannot start without, one part after the other and nothing else: the registry, Lisp, and the
+// What the host cannot start without, one part after the other and nothing else: the registry, and the
 // Modrig bundle mapped by the platform. Linked with the host's objects, since its library hides its parts.
 // With a number after the folders it also reads so many values of the History, one after the other, by the
 // store's own calls; with "fill" after that it stores them, and does nothing else.
@@ -9,10 +9,7 @@
 #include <string>
 
 #include "bench/BareStore.h"
-#include "host/applications/Document.h"
 #include "host/applications/ModuleLibrary.h"
-#include "host/commands/EndRequest.h"
-#include "host/lisp/LispInterpreter.h"
 #include "host/registry/Profiles.h"
 #include "host/registry/Registry.h"
 #include "host/text/CommandLine.h"
@@ -59,11 +56,8 @@ int main(int argc, char** argv)
         return std::strcmp(argv[4], "fill") == 0 && fill(*registry, count) ? 0 : 1;
     if (count > 0 && !bench::readBare(registryFile, static_cast<std::size_t>(count)))
         return 1;
-    tessel::Document document;
-    const tessel::EndRequest endRequest;
-    const auto lisp = tessel::LispInterpreter::start({}, commandLine, document, endRequest);
     const auto file = tessel::moduleFileAt(argv[2]);
-    if (!lisp || !file)
+    if (!file)
         return 1;
     const auto bundle = tessel::ModuleLibrary::open(*file, true);
     return bundle && (*bundle)->entryPoint() ? 0 : 1;

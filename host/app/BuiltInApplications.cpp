@@ -42,7 +42,7 @@ std::wstring quoted(const std::wstring& text)
 
 Result<> loadLisp(Parts& parts, const std::wstring& path)
 {
-    const auto value = parts.lisp().evaluate(L"(load " + quoted(path) + L")");
+    const auto value = parts.lisp->evaluate(L"(load " + quoted(path) + L")");
     return value ? succeed(parts, path + L" is loaded.") : value.failure();
 }
 

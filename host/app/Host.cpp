@@ -86,9 +86,7 @@ Result<> Host::makeParts()
                                                  }});
     tellOfRegistry();
     mCommandLine.tell(mParts->marker->outlivesProcess());
-    if (const Outcome& started = mParts->startedLisp; !started)
-        return started.failure();
-    mInterruptible = &mParts->lisp();
+    mInterruptible = &*mParts->lisp;
     mInterruptibleRegistry = &*mParts->registry;
     mMarker = &*mParts->marker;
     addCommands();
@@ -167,7 +165,7 @@ bool Host::run(const std::wstring& input)
     const Interruption::Work work(mInterruption);
     if (!isLisp(input))
         return mParts->commandRunner.run(input);
-    const auto value = mParts->lisp().evaluate(input);
+    const auto value = mParts->lisp->evaluate(input);
     if (mCommandLine.tell(value) && !value->empty())
         mCommandLine.say(*value);
     return finishLine() && value;
@@ -177,7 +175,7 @@ bool Host::finishLine()
 {
     // What the line wrote is stored before the queue runs: queued Lisp may take its time, or never end.
     const bool stored = mCommandLine.tell(mParts->registry->endOfCommand());
-    mParts->lisp().runQueue();
+    mParts->lisp->runQueue();
     return mCommandLine.tell(mParts->registry->endOfCommand()) && stored;
 }
 

@@ -100,13 +100,12 @@ struct Parts
                               foundations.interruption};
     Owned<HostInformation> information{toWide(foundations.profileFolder.string()), *remote, *commandLine};
     Owned<Help> help{folders.resources / "help", openInBrowser};
-    // Publishes itself. The variable is read here, before any application is loaded, and holds for the
-    // session.
-    Result<std::unique_ptr<LispInterpreter>> startedLisp =
-        LispInterpreter::start({.removingTsLisp = variables->number(kRemovingTsLisp) != 0,
-                                .outcomes = &loadOutcomes,
-                                .admission = &admission},
-                               *commandLine, *document, *endRequest);
+    // The variable is read here, before any application is loaded, and holds for the session.
+    Owned<LispInterpreter> lisp{
+        LispInterpreter::Options{.removingTsLisp = variables->number(kRemovingTsLisp) != 0,
+                                 .outcomes = &loadOutcomes,
+                                 .admission = &admission},
+        *commandLine, *document, *endRequest};
     CommandRunner commandRunner{*commands, *commandLine, *callingApplication,
                                 [this](const std::wstring& name)
                                 {
@@ -120,8 +119,5 @@ struct Parts
         for (const auto& sentence : demandLoading.takeRecordsAlong())
             commandLine->say(sentence);
     }
-
-    // Only of parts whose Lisp has started.
-    LispInterpreter& lisp() const { return **startedLisp; }
 };
 } // namespace tessel

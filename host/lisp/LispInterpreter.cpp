@@ -38,63 +38,63 @@ void admitFilesBy(Admission& admission, LispLoads& loads, LispSurroundings& surr
         admission.marker().endTo(depth);
     };
 }
-
-LispSurroundings surroundings(const LispInterpreter::Options& options, CommandLine& commandLine,
-                              Document& document, LispLoads& loads)
-{
-    const auto fileLoaded = [&document, &loads, admission = options.admission](const std::wstring& path)
-    {
-        document.add(path);
-        loads.loaded(path);
-        RunningMarker::AtWork file{};
-        if (admission && admission->marker().innermost(file))
-            admission->noteLoaded(toWide(file.path));
-    };
-    const auto fileAsked = [&loads](const std::wstring& path)
-    {
-        loads.asked(path);
-    };
-    LispSurroundings surroundings = {.removingTsLisp = options.removingTsLisp,
-                                     .heapBytes = options.heapBytes != 0 ? options.heapBytes : kLispHeapBytes,
-                                     .write = [&commandLine](std::wstring_view text)
-                                     { commandLine.print(text); },
-                                     .column = [&commandLine] { return commandLine.openLine().size(); },
-                                     .fileLoaded = fileLoaded,
-                                     .fileAsked = fileAsked};
-    if (options.admission)
-        admitFilesBy(*options.admission, loads, surroundings);
-    return surroundings;
-}
 } // namespace
 
-LispInterpreter::LispInterpreter(std::unique_ptr<LispMachine> machine, std::unique_ptr<LispLoads> loads,
-                                 const Options& options, CommandLine& commandLine,
+LispInterpreter::LispInterpreter(const Options& options, CommandLine& commandLine, Document& document,
                                  const EndRequest& endRequest)
-    : mLoads(std::move(loads)), mMachine(std::move(machine)), mRemovingTsLisp(options.removingTsLisp),
-      mCommandLine(commandLine), mEndRequest(endRequest), mAdmission(options.admission),
-      mMarker(options.admission ? options.admission->marker() : mNoMarker)
+    : mOptions(options), mCommandLine(commandLine), mDocument(document), mEndRequest(endRequest),
+      mMarker(options.admission ? options.admission->marker() : mNoMarker),
+      mLoads(std::make_unique<LispLoads>(options.outcomes))
 {
-}
-
-Result<std::unique_ptr<LispInterpreter>> LispInterpreter::start(const Options& options,
-                                                                CommandLine& commandLine, Document& document,
-                                                                const EndRequest& endRequest)
-{
-    auto loads = std::make_unique<LispLoads>(options.outcomes);
-    auto machine = LispMachine::start(surroundings(options, commandLine, document, *loads));
-    if (!machine)
-        return machine.failure();
-    return std::unique_ptr<LispInterpreter>(
-        new LispInterpreter(*std::move(machine), std::move(loads), options, commandLine, endRequest));
 }
 
 LispInterpreter::~LispInterpreter() = default;
+
+LispSurroundings LispInterpreter::surroundings()
+{
+    const auto fileLoaded = [this](const std::wstring& path)
+    {
+        mDocument.add(path);
+        mLoads->loaded(path);
+        RunningMarker::AtWork file{};
+        if (mOptions.admission && mMarker.innermost(file))
+            mOptions.admission->noteLoaded(toWide(file.path));
+    };
+    LispSurroundings surroundings = {.removingTsLisp = mOptions.removingTsLisp,
+                                     .heapBytes =
+                                         mOptions.heapBytes != 0 ? mOptions.heapBytes : kLispHeapBytes,
+                                     .write = [this](std::wstring_view text) { mCommandLine.print(text); },
+                                     .column = [this] { return mCommandLine.openLine().size(); },
+                                     .fileLoaded = fileLoaded,
+                                     .fileAsked =
+                                         [this](const std::wstring& path)
+                                     {
+                                         mLoads->asked(path);
+                                     }};
+    if (mOptions.admission)
+        admitFilesBy(*mOptions.admission, *mLoads, surroundings);
+    return surroundings;
+}
+
+Result<LispMachine*> LispInterpreter::machine()
+{
+    if (!mMachine)
+    {
+        auto started = LispMachine::start(surroundings());
+        if (!started)
+            return started.failure();
+        mMachine = *std::move(started);
+        mStarted = mMachine.get();
+    }
+    return mMachine.get();
+}
 
 Result<std::wstring> LispInterpreter::evaluate(std::wstring_view expressions)
 {
     const std::size_t depth = mMarker.depth();
     mLoads->begin();
-    auto value = mMachine->evaluate(expressions);
+    const auto machine = this->machine();
+    auto value = machine ? (*machine)->evaluate(expressions) : machine.failure();
     const int code = mLoads->end(value);
     mMarker.endTo(depth); // Lisp may have been left by a jump
     if (code == Admission::kToldAtStart)
@@ -104,8 +104,8 @@ Result<std::wstring> LispInterpreter::evaluate(std::wstring_view expressions)
 
 void LispInterpreter::queue(std::wstring expression)
 {
-    if (mAdmission)
-        mAdmission->noteCarrier();
+    if (mOptions.admission)
+        mOptions.admission->noteCarrier();
     mQueue.push_back({std::move(expression), mMarker.reason()});
 }
 
@@ -126,26 +126,31 @@ void LispInterpreter::runQueue()
 
 Result<TsResultBuffer*> LispInterpreter::invoke(const TsResultBuffer* call)
 {
-    return mMachine->call(call);
+    const auto machine = this->machine();
+    return machine ? (*machine)->call(call) : machine.failure();
 }
 
 void LispInterpreter::interrupt() noexcept
 {
-    mMachine->interrupt();
+    if (LispMachine* started = mStarted)
+        started->interrupt();
 }
 
 void LispInterpreter::interruptUntilItEnds() noexcept
 {
-    mMachine->interruptUntilItEnds();
+    if (LispMachine* started = mStarted)
+        started->interruptUntilItEnds();
 }
 
 bool LispInterpreter::running() const noexcept
 {
-    return mMachine->running();
+    const LispMachine* started = mStarted;
+    return started && started->running();
 }
 
 unsigned LispInterpreter::evaluations() const noexcept
 {
-    return mMachine->evaluations();
+    const LispMachine* started = mStarted;
+    return started ? started->evaluations() : 0;
 }
 } // namespace tessel

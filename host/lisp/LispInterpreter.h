@@ -1,6 +1,7 @@
 // The host's Lisp, as its users and applications know it: typed expressions, the queue, called functions.
 #pragma once
 
+#include <atomic>
 #include <cstddef>
 #include <deque>
 #include <memory>
@@ -9,7 +10,6 @@
 
 #include "host/commands/RunningMarker.h"
 #include "host/text/Result.h"
-#include "host/text/Running.h"
 
 struct TsResultBuffer;
 
@@ -22,6 +22,7 @@ class EndRequest;
 class LispLoads;
 class LispMachine;
 class LoadOutcomes;
+struct LispSurroundings;
 
 class LispInterpreter
 {
@@ -34,22 +35,24 @@ public:
         Admission* admission = nullptr;   // of files, if it is to be asked; it marks them, too
     };
 
-    // Starts Lisp, on the thread on which everything but `interrupt` is to be called. A later interpreter in
-    // the same process finds none of an earlier one's definitions. One at a time, and so the running one.
+    // Lisp itself starts with the first expression: most sessions have none. From then on everything but
+    // `interrupt` is to be called on that thread. A later interpreter in the same process finds none of an
+    // earlier one's definitions. One at a time.
     //
     // What Lisp prints and what is said of errors goes to the command line, what it has loaded into the
     // document. When the end is requested the queue stops.
-    static Result<std::unique_ptr<LispInterpreter>> start(const Options& options, CommandLine& commandLine,
-                                                          Document& document, const EndRequest& endRequest);
+    LispInterpreter(const Options& options, CommandLine& commandLine, Document& document,
+                    const EndRequest& endRequest);
     ~LispInterpreter();
     LispInterpreter(const LispInterpreter&) = delete;
     LispInterpreter& operator=(const LispInterpreter&) = delete;
 
     // What a typed line does: every form is evaluated, the printed value is that of the last, empty when
-    // there is none to show. What is said of a failure is one line of error text.
+    // there is none to show. What is said of a failure is one line of error text; that Lisp does not start
+    // is one, too, and the next expression tries it again.
     Result<std::wstring> evaluate(std::wstring_view expressions);
 
-    bool removingTsLisp() const { return mRemovingTsLisp; }
+    bool removingTsLisp() const { return mOptions.removingTsLisp; }
 
     // Expressions for later, when the host is idle. Their values are not printed.
     void queue(std::wstring expression);
@@ -76,8 +79,8 @@ public:
     unsigned evaluations() const noexcept;
 
 private:
-    LispInterpreter(std::unique_ptr<LispMachine> machine, std::unique_ptr<LispLoads> loads,
-                    const Options& options, CommandLine& commandLine, const EndRequest& endRequest);
+    Result<LispMachine*> machine();
+    LispSurroundings surroundings();
 
     struct Queued
     {
@@ -85,16 +88,16 @@ private:
         RunningMarker::Reason reason; // for what it loads
     };
 
-    std::unique_ptr<LispLoads> mLoads;
-    std::unique_ptr<LispMachine> mMachine;
-    bool mRemovingTsLisp;
+    Options mOptions;
     CommandLine& mCommandLine;
+    Document& mDocument;
     const EndRequest& mEndRequest;
-    Admission* mAdmission;
     RunningMarker mNoMarker;
     RunningMarker& mMarker;
+    std::unique_ptr<LispLoads> mLoads;
+    std::unique_ptr<LispMachine> mMachine;       // once it was needed
+    std::atomic<LispMachine*> mStarted{nullptr}; // the same, for signal handlers
     std::deque<Queued> mQueue;
     bool mRunningQueue = false;
-    Published<LispInterpreter> mPublished{*this};
 };
 } // namespace tessel

@@ -24,14 +24,9 @@ struct Session
     }};
     tessel::Document document;
     tessel::EndRequest endRequest;
-    std::unique_ptr<tessel::LispInterpreter> lisp = start();
+    tessel::LispInterpreter lisp{{}, commandLine, document, endRequest};
 
-    std::unique_ptr<tessel::LispInterpreter> start()
-    {
-        auto started = tessel::LispInterpreter::start({}, commandLine, document, endRequest);
-        require(started && (*started)->evaluate(kReader));
-        return *std::move(started);
-    }
+    Session() { require(static_cast<bool>(lisp.evaluate(kReader))); }
 };
 
 std::wstring quoted(const std::wstring& text)
@@ -56,11 +51,11 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
 {
     static Session session;
     const std::wstring text = tessel::toWide(std::string(data, data + size));
-    const auto read = session.lisp->evaluate(L"(read-all " + quoted(text) + L")");
+    const auto read = session.lisp.evaluate(L"(read-all " + quoted(text) + L")");
     note(kindOf(read ? *read : read.sentence()));
     if (!read)
         require(!read.sentence().empty() && read.sentence().find(L'\n') == std::wstring::npos);
-    const auto sum = session.lisp->evaluate(L"(+ 40 2)");
+    const auto sum = session.lisp.evaluate(L"(+ 40 2)");
     require(sum && *sum == L"42");
     return 0;
 }

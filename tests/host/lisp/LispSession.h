@@ -24,8 +24,8 @@ class LispSession
 public:
     explicit LispSession(bool removingTsLisp = true)
         : mLisp(
-              *tessel::LispInterpreter::start({.removingTsLisp = removingTsLisp, .heapBytes = kTestHeapBytes},
-                                              *mCommandLine, *mDocument, mEndRequest))
+              tessel::LispInterpreter::Options{.removingTsLisp = removingTsLisp, .heapBytes = kTestHeapBytes},
+              *mCommandLine, *mDocument, mEndRequest)
     {
     }
     LispSession(const LispSession&) = delete;
@@ -81,5 +81,5 @@ private:
                                                     }};
     tessel::Owned<tessel::Document> mDocument;
     tessel::EndRequest mEndRequest;
-    std::unique_ptr<tessel::LispInterpreter> mLisp;
+    tessel::Owned<tessel::LispInterpreter> mLisp;
 };
