@@ -1,5 +1,6 @@
 #include "modrig/dialogs/model/Drop.h"
 
+#include "tests/dialogs/model/TableNames.h"
 #include "tests/support/ModuleTest.h"
 
 using namespace ModrigUtils;
@@ -24,9 +25,6 @@ protected:
     // The indexes of the files whose paths were asked for.
     std::vector<std::size_t> mAsked;
 };
-
-constexpr TableKind kLoadedTable = TableKind::kLoadedApplications;
-constexpr TableKind kHistoryTable = TableKind::kHistory;
 } // namespace
 
 TEST_F(Drop, IsTakenForOneApplicationAmongOthers)

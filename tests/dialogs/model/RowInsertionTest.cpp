@@ -5,15 +5,14 @@
 #include <set>
 #include <string>
 
+#include "tests/dialogs/model/TableNames.h"
+
 using namespace ModrigUtils;
 using testing::ElementsAre;
 using testing::IsEmpty;
 
 namespace
 {
-constexpr TableKind kLoadedTable = TableKind::kLoadedApplications;
-constexpr TableKind kHistoryTable = TableKind::kHistory;
-
 std::vector<TableKind> JoinedWhereHeld(bool savesHistory, const std::set<TableKind>& holding)
 {
     return TablesToJoin(savesHistory, [&](TableKind kind) { return holding.contains(kind); });
