@@ -80,7 +80,7 @@ Result<> compileFile(const fs::path& input, const fs::path& output)
         return Failure{quoted(input) + L" would be overwritten by its own byte code."};
     const auto file = readLispFile(toWide(input.string()), true);
     if (!file)
-        return file.failure();
+        return Failure{cannotLoad(toWide(input.string()), file.sentence())};
     if (file->kind == LispFile::Kind::kCompiled)
         return Failure{quoted(input) + L" is compiled already."};
     const auto lisp = LispMachine::start(terminal());

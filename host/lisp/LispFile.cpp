@@ -24,14 +24,9 @@ constexpr std::wstring_view kExtensions[] = {L"", L".lsp", kCompiledExtension};
 constexpr std::uintmax_t kLargestLispFile = std::uintmax_t{32} << 20;
 constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
 
-std::wstring systemText(std::error_code error)
+Failure missing(std::error_code error)
 {
-    return toWide(error.message()) + L".";
-}
-
-Failure missing(const std::wstring& name, std::error_code error)
-{
-    return refusedLispFile(name, systemText(error), LispFile::kMissing);
+    return {toWide(error.message()), LispFile::kMissing};
 }
 
 struct FoundFile
@@ -51,7 +46,7 @@ std::wstring withSlashes(std::wstring path)
 Result<FoundFile> find(const std::wstring& given)
 {
     if (given.find(L'\0') != std::wstring::npos)
-        return missing(given, std::make_error_code(std::errc::invalid_argument));
+        return missing(std::make_error_code(std::errc::invalid_argument));
     std::error_code first;
     std::error_code error;
     for (const auto& spelling : {given, withSlashes(given)})
@@ -67,8 +62,8 @@ Result<FoundFile> find(const std::wstring& given)
         }
     // The first error says more than those of the other names.
     if (fs::is_directory(fs::path(toUtf8(given)), error))
-        return refusedLispFile(given, L"it is a folder.");
-    return missing(given, first);
+        return Failure{L"it is a folder"};
+    return missing(first);
 }
 
 // As it stands when the current folder is gone.
@@ -87,9 +82,8 @@ Result<LispFile> decodeSource(const std::wstring& name, std::string_view bytes)
     if (const auto form = findTooDeepForm(text))
     {
         const auto line = 1 + countLineBreaks(std::wstring_view(text).substr(0, *form));
-        return Failure{name + L":" + std::to_wstring(line) +
-                       L": The form that begins here is nested more than " +
-                       std::to_wstring(kDeepestNesting) + L" levels deep."};
+        return Failure{L"the form that begins in line " + std::to_wstring(line) + L" is nested more than " +
+                       std::to_wstring(kDeepestNesting) + L" levels deep"};
     }
     return LispFile{LispFile::Kind::kSource, name, std::move(text)};
 }
@@ -98,7 +92,7 @@ Result<LispFile> decodeCompiled(const std::wstring& name, std::string_view bytes
 {
     const auto unpacked = unpackCompiledLisp(bytes);
     if (!unpacked)
-        return refusedLispFile(name, L"it " + unpacked.sentence() + L".");
+        return Failure{L"it " + unpacked.sentence()};
     return LispFile{LispFile::Kind::kCompiled, name, toWide(*unpacked)};
 }
 
@@ -113,26 +107,16 @@ Result<LispFile> readFound(const FoundFile& found)
 {
     const auto bytes = readOrdinaryFile(found.path, kLargestLispFile);
     if (bytes.code() == kTooLarge)
-        return refusedLispFile(found.name, L"it is larger than 32 MB.");
+        return Failure{L"it is larger than 32 MB"};
     if (!bytes)
-        return refusedLispFile(found.name, bytes.sentence() + L".");
+        return bytes.failure();
     return isCompiled(found.name) ? decodeCompiled(found.name, *bytes) : decodeSource(found.name, *bytes);
 }
 } // namespace
 
-std::wstring beginningOfRefusal(const std::wstring& path)
+std::wstring cannotLoad(const std::wstring& path, const std::wstring& reason)
 {
-    return L"Cannot load \"" + path;
-}
-
-std::wstring refusalBeforeReason(const std::wstring& name)
-{
-    return beginningOfRefusal(name) + L"\": ";
-}
-
-Failure refusedLispFile(const std::wstring& name, const std::wstring& reason, int code)
-{
-    return {refusalBeforeReason(name) + reason, code};
+    return L"Cannot load \"" + path + L"\": " + reason + L".";
 }
 
 Result<LispFile> readLispFile(const std::wstring& path, bool compiledFiles, const LispFileBegins& begins)
@@ -141,8 +125,8 @@ Result<LispFile> readLispFile(const std::wstring& path, bool compiledFiles, cons
     if (!found)
         return found.failure();
     if (!compiledFiles && isCompiled(found->name))
-        return refusedLispFile(found->name, L"this host does not load compiled Lisp.");
-    if (auto begun = begins ? begins(found->name, fullPath(found->path)) : Result<>(); !begun)
+        return Failure{L"this host does not load compiled Lisp"};
+    if (auto begun = begins ? begins(fullPath(found->path)) : Result<>(); !begun)
         return begun.failure();
     return readFound(*found);
 }

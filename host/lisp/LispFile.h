@@ -23,18 +23,15 @@ struct LispFile
     std::wstring text; // what Lisp is to read
 };
 
-// Lisp has nothing but text for an error, so that what became of a file has to be told from its sentence: who
-// makes one that says why a file is not loaded makes it here, and who looks for one compares it with these.
-std::wstring beginningOfRefusal(const std::wstring& path); // the name is the path, perhaps with an extension
-std::wstring refusalBeforeReason(const std::wstring& name);
-Failure refusedLispFile(const std::wstring& name, const std::wstring& reason,
-                        int code = Failure::kUnspecified);
+// The whole sentence about a file that is not loaded, of the reason that follows here.
+std::wstring cannotLoad(const std::wstring& path, const std::wstring& reason);
 
 // The path may have separators of either kind, and may lack its extension. Text is taken as UTF-8; what is
 // not is replaced. What Lisp would not survive is refused: text that is nested too deep, compiled Lisp that
 // is not whole. Without `compiledFiles`, so is compiled Lisp altogether.
-// `begins` is told the full path before the file is opened, and may refuse it.
-using LispFileBegins = std::function<Result<>(const std::wstring& name, const std::filesystem::path& file)>;
+// `begins` is told the full path before the file is opened, and may refuse it. Why there is no file is the
+// end of a sentence.
+using LispFileBegins = std::function<Result<>(const std::filesystem::path& file)>;
 Result<LispFile> readLispFile(const std::wstring& path, bool compiledFiles,
                               const LispFileBegins& begins = {});
 } // namespace tessel

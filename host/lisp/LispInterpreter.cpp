@@ -5,7 +5,6 @@
 #include "host/applications/Admission.h"
 #include "host/applications/Document.h"
 #include "host/commands/EndRequest.h"
-#include "host/lisp/LispFile.h"
 #include "host/lisp/LispLoads.h"
 #include "host/lisp/LispMachine.h"
 #include "host/text/CommandLine.h"
@@ -15,19 +14,14 @@ namespace tessel
 {
 namespace
 {
-void admitFilesBy(Admission& admission, LispLoads& loads, LispSurroundings& surroundings)
+void admitFilesBy(Admission& admission, LispSurroundings& surroundings)
 {
-    surroundings.fileBegins = [&admission, &loads](const std::wstring& name,
-                                                   const std::filesystem::path& file) -> Result<>
+    surroundings.fileBegins = [&admission](const std::filesystem::path& file)
     {
-        const auto admitted = admission.check(toWide(file.native()));
+        auto admitted = admission.check(toWide(file.native()));
         if (admitted)
-        {
             admission.marker().begin(RunningMarker::Deed::kLispFile, file.native());
-            return {};
-        }
-        loads.refused(admitted);
-        return refusedLispFile(name, admitted.sentence() + L".");
+        return admitted;
     };
     surroundings.filesOpen = [&admission]
     {
@@ -52,7 +46,31 @@ LispInterpreter::~LispInterpreter() = default;
 
 LispSurroundings LispInterpreter::surroundings()
 {
-    const auto fileLoaded = [this](const std::wstring& path)
+    LispSurroundings surroundings;
+    surroundings.removingTsLisp = mOptions.removingTsLisp;
+    if (mOptions.heapBytes != 0)
+        surroundings.heapBytes = mOptions.heapBytes;
+    surroundings.write = [this](std::wstring_view text)
+    {
+        mCommandLine.print(text);
+    };
+    surroundings.column = [this]
+    {
+        return mCommandLine.openLine().size();
+    };
+    surroundings.fileAsked = [this](const std::wstring& path)
+    {
+        mLoads->asked(path);
+    };
+    surroundings.fileRefused = [this](const Failure& reason)
+    {
+        mLoads->refused(reason);
+    };
+    surroundings.fileFailed = [this](const std::wstring& path, const std::wstring& words)
+    {
+        mLoads->failed(path, words);
+    };
+    surroundings.fileLoaded = [this](const std::wstring& path)
     {
         mDocument.add(path);
         mLoads->loaded(path);
@@ -60,19 +78,8 @@ LispSurroundings LispInterpreter::surroundings()
         if (mOptions.admission && mMarker.innermost(file))
             mOptions.admission->noteLoaded(toWide(file.path));
     };
-    LispSurroundings surroundings = {.removingTsLisp = mOptions.removingTsLisp,
-                                     .heapBytes =
-                                         mOptions.heapBytes != 0 ? mOptions.heapBytes : kLispHeapBytes,
-                                     .write = [this](std::wstring_view text) { mCommandLine.print(text); },
-                                     .column = [this] { return mCommandLine.openLine().size(); },
-                                     .fileLoaded = fileLoaded,
-                                     .fileAsked =
-                                         [this](const std::wstring& path)
-                                     {
-                                         mLoads->asked(path);
-                                     }};
     if (mOptions.admission)
-        admitFilesBy(*mOptions.admission, *mLoads, surroundings);
+        admitFilesBy(*mOptions.admission, surroundings);
     return surroundings;
 }
 

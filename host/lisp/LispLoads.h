@@ -2,6 +2,7 @@
 // Files load others, and may catch the errors of those.
 #pragma once
 
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -15,29 +16,33 @@ public:
     // Notes there what it finds out; null: nowhere.
     explicit LispLoads(LoadOutcomes* outcomes) : mOutcomes(outcomes) {}
 
-    // An expression begins, and ends with this result. Answers the code that was noted of the file that it
-    // failed to load, the one of its refusal if it was refused; 0 when none was noted.
-    void begin() { mFiles.clear(); }
+    // An expression begins, and ends with this result. Answers the code of its refusal if the file that it
+    // failed to load was refused, else `Failure::kUnspecified`; 0 when no file failed.
+    void begin();
     int end(const Outcome& value);
 
     // In between: a file is to be loaded, and is loaded. The path as it was given.
-    void asked(const std::wstring& path) { mFiles.push_back({path, LoadOutcomes::Clock::now()}); }
+    void asked(const std::wstring& path) { mFiles.push_back({path, LoadOutcomes::Clock::now(), {}}); }
     void loaded(const std::wstring& path);
-    // What was asked for last is refused.
-    void refused(const Outcome& admitted);
+    // What was asked for last is refused; the end of a sentence.
+    void refused(const Failure& reason);
+    // What fails now is the expression's file of that path. The words are missing if it was refused.
+    void failed(const std::wstring& path, const std::wstring& words);
 
 private:
     struct File
     {
         std::wstring path;
         LoadOutcomes::Clock::time_point begun;
-        int failureCode = Failure::kUnspecified;
+        Result<> loaded; // unless it was refused
     };
+    using Files = std::vector<File>;
 
-    bool isOfFile(const std::wstring& words) const;
-    void note(const File& file, const Result<>& loaded) const;
+    Files::iterator lastOf(const std::wstring& path);
+    void note(const File& file) const;
 
     LoadOutcomes* mOutcomes;
-    std::vector<File> mFiles; // that have begun and are not loaded, each within the one before it
+    Files mFiles;                // that have begun and are not loaded, each within the one before it
+    std::optional<File> mFailed; // of them, once the expression fails
 };
 } // namespace tessel

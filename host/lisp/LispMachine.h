@@ -26,15 +26,20 @@ struct LispSurroundings
 {
     bool removingTsLisp = true; // compiled files are loaded, and functions for packaged applications offered
     std::size_t heapBytes = kLispHeapBytes;
-    std::function<void(std::wstring_view)> write;             // what Lisp prints, in pieces
-    std::function<std::size_t()> column;                      // characters on the line that is not ended yet
-    std::function<void(const std::wstring& path)> fileLoaded; // without an error; the path as it was given
-    std::function<void(const std::wstring& path)> fileAsked = {}; // before it is looked for; the same path
+    std::function<void(std::wstring_view)> write; // what Lisp prints, in pieces
+    std::function<std::size_t()> column;          // characters on the line that is not ended yet
+    // About the file of a path as it was given: before it is looked for; when it is refused, with the end of
+    // a sentence; when it is loaded without an error; and, before a failure comes back, that this file, which
+    // no other file loads, is what failed. Where the words about a file are missing it was refused.
+    std::function<void(const std::wstring& path)> fileAsked = {};
+    std::function<void(const Failure& reason)> fileRefused = {};
+    std::function<void(const std::wstring& path)> fileLoaded = {};
+    std::function<void(const std::wstring& path, const std::wstring& words)> fileFailed = {};
 
     // About files within files, of which the innermost runs. `fileBegins` may refuse the one with that full
-    // path before it is opened; the sentence calls it by its name. `filesOpen` answers how many have begun,
-    // and `filesEnd` ends all above that number.
-    std::function<Result<>(const std::wstring& name, const std::filesystem::path& file)> fileBegins = {};
+    // path before it is opened. `filesOpen` answers how many have begun, and `filesEnd` ends all above that
+    // number.
+    std::function<Result<>(const std::filesystem::path& file)> fileBegins = {};
     std::function<std::size_t()> filesOpen = {};
     std::function<void(std::size_t)> filesEnd = {};
 };

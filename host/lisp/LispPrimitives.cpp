@@ -121,25 +121,32 @@ cl_object kindOf(const Result<LispFile>& file)
     return ecl_make_keyword(file->kind == LispFile::Kind::kCompiled ? "COMPILED" : "SOURCE");
 }
 
-// A list: the kind, the name for messages, the text; of a file that is not there or not good a sentence
-// instead of the text, and no name.
+Result<LispFile> readFor(const LispSurroundings& surroundings, const std::wstring& path)
+{
+    if (surroundings.fileAsked)
+        surroundings.fileAsked(path);
+    auto file = readLispFile(path, surroundings.removingTsLisp, surroundings.fileBegins);
+    if (!file && surroundings.fileRefused)
+        surroundings.fileRefused(file.failure());
+    return file;
+}
+
+// A list: the kind, and then the name for messages and the text, or for what is not there or not good one
+// sentence.
 cl_object readFile(cl_object path)
 {
     callHost(
         [=]
         {
-            const auto* surroundings = connection().surroundings;
-            if (surroundings && surroundings->fileAsked)
-                surroundings->fileAsked(fromLisp(path));
-            connection().file = readLispFile(fromLisp(path), surroundings && surroundings->removingTsLisp,
-                                             surroundings ? surroundings->fileBegins : LispFileBegins());
+            if (const auto* surroundings = connection().surroundings)
+                connection().file = readFor(*surroundings, fromLisp(path));
         });
     const Result<LispFile>& file = connection().file;
-    cl_object text = toLisp(file ? file->text : file.sentence());
-    cl_object name = file ? toLisp(file->name) : ECL_NIL;
     cl_object kind = kindOf(file);
+    cl_object answered = file ? cl_list(3, kind, toLisp(file->name), toLisp(file->text))
+                              : cl_list(2, kind, toLisp(cannotLoad(fromLisp(path), file.sentence())));
     callHost([] { connection().file = LispFile(); });
-    return answer(cl_list(3, kind, name, text));
+    return answer(answered);
 }
 
 cl_object filesOpen()
@@ -174,6 +181,19 @@ cl_object recordLoaded(cl_object path)
             connection().output.flush();
             if (connection().surroundings && connection().surroundings->fileLoaded)
                 connection().surroundings->fileLoaded(fromLisp(path));
+        });
+    return answer(ECL_NIL);
+}
+
+// The words are NIL for a file that was refused.
+cl_object fileFailed(cl_object path, cl_object words)
+{
+    callHost(
+        [=]
+        {
+            const auto* surroundings = connection().surroundings;
+            if (surroundings && surroundings->fileFailed)
+                surroundings->fileFailed(fromLisp(path), words == ECL_NIL ? std::wstring() : fromLisp(words));
         });
     return answer(ECL_NIL);
 }
@@ -216,6 +236,7 @@ void defineLispPrimitives()
     define("%FILES-OPEN", filesOpen);
     define("%END-FILES", endFiles);
     define("%RECORD-LOADED", recordLoaded);
+    define("%FILE-FAILED", fileFailed);
     define("%RESTORE-STACK-LIMITS", restoreStackLimits);
     define("%INTERRUPT-WANTED", interruptWanted);
 }

@@ -8,7 +8,9 @@
 (defvar *nothing* (make-symbol "") "The value that is not printed.")
 
 (defvar *place* nil "The file and the line of the top-level form that is running, or nil.")
-(defvar *placed-error* nil "The error that was signalled last within a file, and the place where it was.")
+(defvar *outermost-file* nil "The path of the file that is being loaded and that no other file loads, or nil.")
+(defvar *loading-depth* 0 "How many files are running, each loaded by the one before it.")
+(defvar *placed-error* nil "The error that was signalled last within a file, and then what CURRENT-PLACE was.")
 
 (defmacro with-plain-printing (&body body)
   `(let ((*print-length* 100) (*print-level* 20) (*print-circle* t) (*print-pretty* nil) (*print-readably* nil)
@@ -44,6 +46,10 @@
          (shortened (prin1-to-string (subseq value 0 +longest-text+))))
         (t (with-plain-printing (shortened (prin1-to-string value))))))
 
+(defun current-place ()
+  "A list: the place, the outermost file, and whether the place is in that."
+  (list *place* *outermost-file* (= *loading-depth* 1)))
+
 (defun placed (place text)
   (if place
       (format nil "~A:~D: ~A" (car place) (cdr place) text)
@@ -75,10 +81,17 @@
         (format nil "an error of the type ~S." (type-of condition))
         line)))
 
+(defun failed (text &optional (at (current-place)))
+  (destructuring-bind (place file in-that-file) at
+    (when file
+      (%file-failed file (cond ((null place) nil)
+                               (in-that-file (format nil "line ~D: ~A" (cdr place) text))
+                               (t (placed place text)))))
+    (cons :failed (placed place text))))
+
 (defun failure (condition)
-  (let ((place (if (eq condition (car *placed-error*)) (cdr *placed-error*) *place*)))
-    (setf *placed-error* nil)
-    (cons :failed (placed place (report condition)))))
+  (let ((noted (shiftf *placed-error* nil)))
+    (failed (report condition) (if (eq condition (car noted)) (cdr noted) (current-place)))))
 
 (defun abandon (condition hook)
   "In place of the debugger."
@@ -88,7 +101,7 @@
 (defun interrupted ()
   "Runs in the midst of whatever Lisp is doing. The request may have come too late, for an evaluation that is over."
   (when (%interrupt-wanted)
-    (throw '%abandoned (cons :failed (placed *place* "Lisp was interrupted.")))))
+    (throw '%abandoned (failed "Lisp was interrupted."))))
 
 (defun call-guarded (function)
   (catch '%abandoned
@@ -99,7 +112,7 @@
             (*standard-output* *output*) (*error-output* *output*) (*trace-output* *output*)
             (*standard-input* (no-input)) (*debug-io* *dialogue*) (*query-io* *dialogue*) (*terminal-io* *dialogue*)
             (*debugger-hook* #'abandon) (ext:*invoke-debugger-hook* #'abandon)
-            (*place* nil) (*placed-error* nil))
+            (*place* nil) (*outermost-file* nil) (*loading-depth* 0) (*placed-error* nil))
         (handler-case (cons :done (funcall function))
           (serious-condition (condition) (failure condition)))))))
 

@@ -4,12 +4,12 @@
 
 (defconstant +deepest-loading+ 100 "Files within files; a file that loads itself ends here.")
 
-(defvar *loading-depth* 0)
-
-(defun note-place (condition)
-  "Where the error happened, before the stack is unwound. The innermost file has seen it first."
-  (unless (eq condition (car *placed-error*))
-    (setf *placed-error* (cons condition *place*))))
+(defmacro noting-places (&body body)
+  "Notes where an error happens, before the stack is unwound. The innermost file sees it first."
+  `(handler-bind ((serious-condition (lambda (condition)
+                                       (unless (eq condition (car *placed-error*))
+                                         (setf *placed-error* (cons condition (current-place)))))))
+     ,@body))
 
 (defmacro do-source-forms ((form text) &body body)
   "Reads the forms one after the other, so that each is read as those before it demand, and keeps *PLACE*."
@@ -51,17 +51,12 @@
       (setf (cdr *place*) (car record))
       (funcall (cdr record)))))
 
-(defmacro with-place ((name) &body body)
-  `(let ((*place* (cons ,name 1)))
-     (handler-bind ((serious-condition #'note-place))
-       ,@body)))
-
 (defun run-file (path kind name text)
   (let ((*loading-depth* (1+ *loading-depth*))
         (*package* *package*) (*readtable* *readtable*)
         (*load-pathname* (ignore-errors (pathname name)))
         (*load-truename* (ignore-errors (truename name))))
-    (with-place (name)
+    (let ((*place* (cons name 1)))
       (when (> *loading-depth* +deepest-loading+)
         (error "Files load one another more than ~D deep." +deepest-loading+))
       (ecase kind
@@ -70,18 +65,19 @@
     (%record-loaded path)
     t))
 
+(defun load-found (path if-does-not-exist)
+  (destructuring-bind (kind name &optional text) (%read-file path)
+    (cond (text (run-file path kind name text))
+          ((and (eq kind :missing) (null if-does-not-exist)) nil)
+          (t (error "~A" name)))))
+
 (defun load-file (path if-does-not-exist)
-  ;; TEXT is a sentence when there is nothing to load.
-  (let ((open (%files-open)))
-    (unwind-protect
-         (destructuring-bind (kind name text) (%read-file path)
-           (cond ((member kind '(:source :compiled)) (run-file path kind name text))
-                 ((and (eq kind :missing) (null if-does-not-exist)) nil)
-                 (t (error "~A" text))))
+  (let ((open (%files-open)) (*outermost-file* (or *outermost-file* path)))
+    (unwind-protect (noting-places (load-found path if-does-not-exist))
       (%end-files open))))
 
 (defun compile-text (name text)
   (call-guarded
    (lambda ()
-     (with-place (name)
-       (compile-source text)))))
+     (let ((*place* (cons name 1)))
+       (noting-places (compile-source text))))))

@@ -149,7 +149,8 @@ TEST_F(LispFiles, ThatAreNestedTooDeepAreRefusedBeforeTheyAreRead)
     const std::string depth(6000, '(');
     const auto path = write("deep.lsp", "1\n'" + depth + std::string(6000, ')'));
     EXPECT_EQ(session.error(load(path)),
-              path + ":2: The form that begins here is nested more than 5000 levels deep.");
+              "Cannot load \"" + path +
+                  "\": the form that begins in line 2 is nested more than 5000 levels deep.");
 }
 
 TEST_F(LispFiles, CannotBeMissing)
