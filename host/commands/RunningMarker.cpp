@@ -39,7 +39,15 @@ bool readWhole(int descriptor, void* buffer, std::size_t size)
 bool fillWithZeros(int descriptor, std::size_t size)
 {
     const std::vector<char> zeros(size);
-    return pwrite(descriptor, zeros.data(), size, 0) == static_cast<ssize_t>(size);
+    for (std::size_t written = 0; written < size;)
+    {
+        const ssize_t count =
+            pwrite(descriptor, &zeros[written], size - written, static_cast<off_t>(written));
+        if (count <= 0)
+            return false;
+        written += static_cast<std::size_t>(count);
+    }
+    return true;
 }
 } // namespace
 

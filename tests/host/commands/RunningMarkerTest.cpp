@@ -5,9 +5,11 @@
 
 #include <gtest/gtest.h>
 
+#include <sys/resource.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include "host/text/Unicode.h"
 #include "tests/support/ChildProcess.h"
 #include "tests/support/TemporaryFolder.h"
 
@@ -238,6 +240,20 @@ TEST_F(Marker, MarksForAsLongAsTheProcessLastsWhereItsFolderCannotBeMade)
     RunningMarker::AtWork work{};
     ASSERT_TRUE(marker.innermost(work));
     EXPECT_EQ(work.path, "/a");
+}
+
+// The limit stands for a disk that becomes full in the midst of it.
+TEST_F(Marker, NamesTheReasonWhereOnlyAPartOfItCanBeWritten)
+{
+    const std::string said = askChild(
+        [this]
+        {
+            std::signal(SIGXFSZ, SIG_IGN);
+            const rlimit limit = {4096, RLIM_INFINITY};
+            setrlimit(RLIMIT_FSIZE, &limit);
+            return tessel::toUtf8(RunningMarker(mFolder.path()).outlivesProcess().sentence());
+        });
+    EXPECT_NE(said.find(" cannot be written: File too large."), std::string::npos) << said;
 }
 
 TEST_F(Marker, OutlivesTheProcess)
