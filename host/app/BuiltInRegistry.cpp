@@ -26,14 +26,25 @@ Failure failureAt(const std::wstring& path, const std::wstring& reason)
     return {L"The registry key \"" + path + L"\" " + reason + L"."};
 }
 
-// The store's own words are told at the end of the command, which undoes all of it. Why nothing can be stored
-// at all is a sentence of its own.
-Failure writeFailure(const Registry& registry, const std::wstring& path, const Result<>& written)
+// With what the store has to say: of what failed in this command, which is over, or why nothing can be read
+// or stored at all.
+Failure storeFailureAt(Registry& registry, const std::wstring& path, const std::wstring& what)
 {
-    const Result<>& canStore = registry.canStore();
-    if (canStore)
-        return failureAt(path, L"cannot be written: error " + std::to_wstring(written.code()));
-    return {failureAt(path, L"cannot be written").sentence + L" " + canStore.sentence()};
+    const auto told = registry.endOfCommand();
+    const std::wstring reason = told ? registry.canStore().sentence() : told.sentence();
+    return {failureAt(path, what).sentence + (reason.empty() ? L"" : L" " + reason)};
+}
+
+Failure notWritten(Registry& registry, const std::wstring& path)
+{
+    return storeFailureAt(registry, path, L"cannot be written");
+}
+
+// What was not found may only not have been readable.
+Failure notFound(Registry& registry, const std::wstring& path, const std::wstring& what)
+{
+    return registry.mayHaveMissed() ? storeFailureAt(registry, path, L"cannot be read")
+                                    : failureAt(path, what);
 }
 
 Result<> list(Parts& parts, const std::wstring& path)
@@ -41,11 +52,13 @@ Result<> list(Parts& parts, const std::wstring& path)
     Registry& registry = *parts.registry;
     const auto key = registry.find(path);
     if (key == Registry::kNoKey)
-        return failureAt(path, L"does not exist");
+        return notFound(registry, path, L"does not exist");
     for (const auto& name : registry.subKeys(key))
         sayLine(parts, L"[" + name + L"]");
     for (const auto& value : registry.values(key))
         sayLine(parts, (value.name.empty() ? L"(unnamed)" : value.name) + L" = " + value.data);
+    if (registry.readFailed())
+        return storeFailureAt(registry, path, L"cannot be read to its end");
     return {};
 }
 
@@ -53,7 +66,7 @@ Result<> get(Parts& parts, const std::wstring& path, const std::wstring& name)
 {
     const auto data = parts.registry->read(path, name);
     if (!data)
-        return failureAt(path, L"has no value \"" + name + L"\"");
+        return notFound(*parts.registry, path, L"has no value \"" + name + L"\"");
     sayLine(parts, *data);
     return {};
 }
@@ -66,7 +79,7 @@ Result<> set(Parts& parts, const std::wstring& path, const Arguments& arguments)
     Result<> done = key ? Result<>() : key.failure();
     if (key && arguments.size() > 2)
         done = registry.writeValue(*key, at(arguments, 2), at(arguments, 3));
-    return done ? done : writeFailure(registry, path, done);
+    return done ? done : notWritten(registry, path);
 }
 
 // A key alone goes with everything below it; with a name, only the value.
@@ -75,12 +88,12 @@ Result<> remove(Parts& parts, const std::wstring& path, const Arguments& argumen
     Registry& registry = *parts.registry;
     const auto key = registry.find(path);
     if (key == Registry::kNoKey)
-        return failureAt(path, L"does not exist");
+        return notFound(registry, path, L"does not exist");
     const Result<> done =
         arguments.size() > 2 ? registry.removeValue(key, at(arguments, 2)) : registry.removeKey(key);
     if (done.code() == ERROR_FILE_NOT_FOUND)
-        return failureAt(path, L"has no value \"" + at(arguments, 2) + L"\"");
-    return done ? done : writeFailure(registry, path, done);
+        return notFound(registry, path, L"has no value \"" + at(arguments, 2) + L"\"");
+    return done ? done : notWritten(registry, path);
 }
 
 // What is damaged gives way to the copy of what it held.
@@ -88,6 +101,13 @@ Result<> restore(Parts& parts)
 {
     const auto restored = parts.registry->restoreCopy();
     return restored ? succeed(parts, *restored) : restored.failure();
+}
+
+// What is damaged and has no sound copy gives way to an empty one.
+Result<> reset(Parts& parts)
+{
+    const auto begun = parts.registry->beginEmpty();
+    return begun ? succeed(parts, *begun) : begun.failure();
 }
 
 Result<> registryCommand(Parts& parts, const Arguments& arguments)
@@ -104,15 +124,19 @@ Result<> registryCommand(Parts& parts, const Arguments& arguments)
         return remove(parts, path, arguments);
     if (equalIgnoringCase(action, L"RESTORE") && arguments.size() == 1)
         return restore(parts);
+    if (equalIgnoringCase(action, L"RESET") && arguments.size() == 1)
+        return reset(parts);
     return wrongUsage(parts, kCommand);
 }
 } // namespace
 
 void addRegistryCommands(Parts& parts)
 {
-    addBuiltIn(parts,
-               {L"Settings", kCommand, L"LIST|GET|SET|DELETE key [name] [data] | RESTORE",
-                L"Works on the registry, below HKEY_CURRENT_USER; puts back the copy of a damaged one"},
-               registryCommand);
+    addBuiltIn(
+        parts,
+        {L"Settings", kCommand, L"LIST|GET|SET|DELETE key [name] [data] | RESTORE | RESET",
+         L"Works on the registry, below HKEY_CURRENT_USER; of a damaged one, puts back the copy or begins "
+         L"with nothing"},
+        registryCommand);
 }
 } // namespace tessel

@@ -70,9 +70,10 @@ struct Parts
     Published<CommandLine> commandLine{foundations.commandLine};
     Published<EndRequest> endRequest{foundations.endRequest};
     Owned<Registry> registry{foundations.profileFolder / kRegistryFile, Registry::kBusyTimeout,
-                             [this](const std::wstring& sentence)
+                             [this](const std::wstring& sentence) { foundations.commandLine.say(sentence); },
+                             [wish = Interruption::Wish(foundations.interruption)]
                              {
-                                 foundations.commandLine.say(sentence);
+                                 return wish.isThere();
                              }};
     Profiles profiles{*registry, kProductRegistryRoot};
     Owned<SystemVariables> variables{&*registry, kProductRegistryRoot};

@@ -12,6 +12,8 @@
 #include <string_view>
 #include <vector>
 
+#include <sys/stat.h>
+
 #include "host/platform/SystemFailure.h"
 #include "host/text/Hexadecimal.h"
 #include "host/text/Unicode.h"
@@ -115,9 +117,12 @@ bool belongs(const Identity& before, const LogIdentity& log, const Identity& aft
            log.first.count <= after.count + 1 && before.count <= log.last.count;
 }
 
-std::filesystem::path logOf(const std::filesystem::path& file)
+// A journal that is kept for the next transaction begins with zeros.
+bool isInUse(const std::filesystem::path& journal)
 {
-    return file.string() + "-wal";
+    std::ifstream stream(journal, std::ios::binary);
+    const int first = stream.get();
+    return first > 0;
 }
 
 bool isForeign(const std::filesystem::path& file)
@@ -131,6 +136,22 @@ bool isForeign(const std::filesystem::path& file)
     return before && log && after && !belongs(*before, *log, *after);
 }
 } // namespace
+
+std::filesystem::path logOf(const std::filesystem::path& file)
+{
+    return file.string() + "-wal";
+}
+
+std::optional<std::array<std::int64_t, 4>> restingState(const std::filesystem::path& file)
+{
+    struct stat status = {};
+    if (isInUse(logOf(file)) || isInUse(file.string() + "-journal") || stat(file.c_str(), &status) != 0)
+        return std::nullopt;
+    const auto identity = identityOf(file);
+    if (!identity)
+        return std::nullopt;
+    return std::array<std::int64_t, 4>{identity->number, identity->count, status.st_size, status.st_mtime};
+}
 
 Result<std::optional<std::wstring>> setForeignLogAside(const std::filesystem::path& file)
 {

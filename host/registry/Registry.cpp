@@ -10,6 +10,7 @@
 #include "host/registry/SoundCopy.h"
 #include "host/registry/Soundness.h"
 #include "host/registry/Statements.h"
+#include "host/registry/StoreFailure.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -50,11 +51,21 @@ Failure noMoreValues()
 }
 } // namespace
 
-Registry::Registry(std::filesystem::path file, std::chrono::milliseconds busyTimeout, LongWork::Say say)
-    : mFile(std::move(file)), mBusyTimeout(busyTimeout), mNextHandle(kFirstHandle)
+Registry::Registry(std::filesystem::path file, std::chrono::milliseconds busyTimeout, LongWork::Say say,
+                   LockWait::IsUnwanted isUnwanted)
+    : mFile(std::move(file)), mWait(busyTimeout,
+                                    [this](bool canBeStopped)
+                                    {
+                                        mWork.say(L"Tessel waits for the registry " + toWide(mFile.string()) +
+                                                  L", which another program holds." +
+                                                  (canBeStopped ? L" Ctrl-C goes on without it." : L""));
+                                    }),
+      mNextHandle(kFirstHandle)
 {
     mWork.tellBy(std::move(say));
+    mWait.letStop(std::move(isUnwanted));
     open();
+    mWait.letStop({}); // what a session stores at its end is waited for
 }
 
 Registry::~Registry()
@@ -321,7 +332,7 @@ Result<> Registry::checkBeforeRemoval()
     const LongStatements looking = whileIt(L"looks through");
     const auto sound = checkSoundness(mDatabase, kSchemaVersion);
     mLookedAt = static_cast<bool>(sound);
-    return sound ? sound : giveUp(damage(sound.sentence()));
+    return sound ? sound : giveUp(whatIsWrong(sound.failure()));
 }
 
 // Where this fails, the reading that follows says so.
@@ -376,7 +387,8 @@ int Registry::step(Statement& statement)
 void Registry::failStep(int status)
 {
     mCannotLock = isLockRefused(status);
-    failRead(toWide(sqlite3_errstr(status)), status);
+    const Failure failure = storeFailure(mDatabase, status);
+    failRead(failure.sentence, failure.code);
 }
 
 // Of rows that come in the order of their first column, which only an index that is damaged does not keep: it
@@ -398,21 +410,26 @@ bool Registry::isNext(Statement& statement, std::int64_t& last)
 
 // Nothing is written any more: who asked knows less than is stored, and will know no more. Damage is told
 // once, by what finds it first.
-void Registry::failRead(const std::wstring& words, int status)
+void Registry::failRead(const std::wstring& words, int code)
 {
-    const std::wstring file = toWide(mFile.string());
-    const bool damaged = (status & 0xFF) == SQLITE_CORRUPT || (status & 0xFF) == SQLITE_NOTADB;
-    const bool isKnown = damaged && mDamaged;
-    mDamaged = mDamaged || damaged;
     mLookedAt = false;
-    const std::wstring help = damaged ? helpAgainstDamage(mFile) : L"Start Tessel again.";
-    Failure failure{L"The registry " + file + L" could not be read: " + words +
-                        L". Nothing more is stored in this session, so that nothing is lost. " + help,
-                    ERROR_READ_FAULT};
-    if (isKnown)
+    mReadFailed = true;
+    if (!isDamage(code))
+        static_cast<void>(giveUp(unreadable(words, whatHelpsAtStart(code))));
+    else if (std::exchange(mDamaged, true))
         undoCommand();
     else
-        static_cast<void>(giveUp(std::move(failure)));
+    {
+        mCanStore = unreadable(words, helpAgainstDamage(mFile)); // whatever else there is to say of it
+        static_cast<void>(giveUp(mCanStore.failure()));
+    }
+}
+
+Failure Registry::unreadable(const std::wstring& words, const std::wstring& help) const
+{
+    return {L"The registry " + toWide(mFile.string()) + L" could not be read: " + words +
+                L". Nothing more is stored in this session, so that nothing is lost. " + help,
+            ERROR_READ_FAULT};
 }
 
 // For the rest of the session. The command that it happens in tells it, unless it has failed before.
@@ -435,12 +452,12 @@ Failure Registry::fail(int status, const wchar_t* done)
         rollBack();
         return mCommand.failure();
     }
-    // Flushing leaves no words behind.
-    const bool hasWords = sqlite3_errcode(mDatabase) != SQLITE_OK;
-    const char* words = hasWords ? sqlite3_errmsg(mDatabase) : sqlite3_errstr(status);
+    const Failure reason = storeFailure(mDatabase, status);
+    const std::wstring help = whatHelpsInSession(reason.code);
     mCommand = Failure{L"The registry " + toWide(mFile.string()) + L" could not be " + done + L": " +
-                           toWide(words) + L". What was stored before is unchanged.",
-                       statusOf(status)};
+                           reason.sentence + L". What was stored before is unchanged." +
+                           (help.empty() ? L"" : L" " + help),
+                       statusOf(reason.code)};
     undoCommand();
     return mCommand.failure();
 }
@@ -505,7 +522,14 @@ void Registry::storeSoFar()
     if (!mDatabase)
         return;
     commit();
+    endOfWork();
+}
+
+void Registry::endOfWork()
+{
     mWork.end();
+    mWait.begin();
+    mReadFailed = false;
 }
 
 Result<> Registry::endOfCommand()
@@ -513,7 +537,7 @@ Result<> Registry::endOfCommand()
     if (!mDatabase)
         return {};
     commit();
-    mWork.end();
+    endOfWork();
     mOpenedForWriting.clear();
     return std::exchange(mCommand, {});
 }

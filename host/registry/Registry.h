@@ -31,6 +31,7 @@
 #include <utility>
 #include <vector>
 
+#include "host/registry/LockWait.h"
 #include "host/registry/LongWork.h"
 #include "host/registry/ReadAhead.h"
 #include "host/text/Result.h"
@@ -58,10 +59,10 @@ public:
 
     // Opens the file or makes it. A file that cannot be used is left as it is: reads then find nothing and
     // writes fail. A file that is damaged or may not be written is only read.
-    // A write waits that long for another process that is writing, and then fails. What goes through very
-    // much, the opening too, says by `say` how far it has come.
+    // The opening waits that long for another process that holds the file, unless `isUnwanted` answers yes;
+    // so does each command, which then fails. What takes long, the opening too, is told by `say`.
     explicit Registry(std::filesystem::path file, std::chrono::milliseconds busyTimeout = kBusyTimeout,
-                      LongWork::Say say = {});
+                      LongWork::Say say = {}, LockWait::IsUnwanted isUnwanted = {});
     ~Registry();
     Registry(const Registry&) = delete;
     Registry& operator=(const Registry&) = delete;
@@ -88,6 +89,10 @@ public:
     Result<std::wstring> valueName(Key key, DWORD index);
     std::vector<Value> values(Key key);
 
+    // What the running command did not find may be there all the same: something could not be read.
+    bool mayHaveMissed() const { return !mDatabase || mDamaged || mReadFailed; }
+    bool readFailed() const { return mReadFailed; }
+
     // The same by path, for the host's own settings.
     std::optional<std::wstring> read(std::wstring_view path, std::wstring_view name);
     Result<> write(std::wstring_view path, std::wstring_view name, std::wstring_view data);
@@ -108,6 +113,10 @@ public:
     // Puts the copy in the place of a registry that is damaged, and reads it from now on. Answers a sentence
     // about it. Nothing can be stored before the next session: what applications have read is older.
     Result<std::wstring> restoreCopy();
+
+    // Puts an empty registry in the place of one that is damaged and has no sound copy. The rest is as with
+    // `restoreCopy`.
+    Result<std::wstring> beginEmpty();
 
     // Stops reading or writing that takes long: what the command in which it happens reads from then on
     // fails, as from a store that cannot be read. Safe in a signal handler.
@@ -143,8 +152,12 @@ private:
     Result<> connect(const std::string& name, int flags);
     void leaveSharedLog();
     Result<> openWithoutJournal(const Failure& reason);
+    Result<> openFixed(const Failure& reason);
+    Result<> readPastLock(const Failure& reason);
     Result<> readIntoMemory();
+    void storeNothing(const Failure& reason);
     Result<int> checkOrigin();
+    Result<int> checkUnknown(int version);
     Result<> prepare();
     Result<> bringUpToDate(int version);
     Result<> prepareStatements();
@@ -153,7 +166,10 @@ private:
     LongStatements whileIt(const std::wstring& deed);
     void lookAtAll(int version);
     void renewCopy(bool changed);
-    Failure damage(const std::wstring& reason);
+    Failure whatIsWrong(const Failure& found);
+    Failure unreadable(const std::wstring& words, const std::wstring& help) const;
+    Result<> checkIsDamaged() const;
+    Result<std::wstring> replaceWith(Result<std::filesystem::path> (*replace)(const std::filesystem::path&));
     bool isFollowed(std::wstring_view path, Key from) const;
     void noteFollowed(std::wstring_view path, Key from, Key key);
     Key findChild(Key parent, std::wstring_view name);
@@ -172,15 +188,17 @@ private:
     int readAhead(Key key, std::string_view fold);
     int step(Statement& statement);
     void failStep(int status);
+    void endOfWork();
     bool isNext(Statement& statement, std::int64_t& last);
     Failure fail(int status, const wchar_t* done);
-    void failRead(const std::wstring& words, int status);
+    void failRead(const std::wstring& words, int code);
     Failure giveUp(Failure failure);
     void undoCommand();
     void closeHandlesOfLostKeys();
 
-    std::filesystem::path mFile;
-    std::chrono::milliseconds mBusyTimeout;
+    const std::filesystem::path mFile;
+    LongWork mWork;
+    LockWait mWait;
     Result<> mCanStore;
     std::optional<std::wstring> mNotice;
     sqlite3* mDatabase = nullptr;
@@ -189,12 +207,12 @@ private:
     bool mLookedAt = false;  // the file is known to be sound
     bool mHasStored = false; // since the copy was made
     bool mDamaged = false;
+    bool mReadFailed = false; // in the running command
     bool mCannotLock = false; // for as long as the session lasts: the file system refuses
     std::unique_ptr<Statements> mStatements;
     Cursor mCursor;
     ReadAhead mReadAhead;
-    Followed mFollowed; // the last one: a list is read and written by one path
-    LongWork mWork;
+    Followed mFollowed;                        // the last one: a list is read and written by one path
     Result<> mCommand;                         // the running one, or what failed in it first
     bool mWriting = false;                     // the running transaction is one that writes
     unsigned mWrites = 0;                      // in it

@@ -1,10 +1,11 @@
 // Opening the registry's file: whose it is, whether it is sound, and whether it may be written.
 #include <sys/stat.h>
+#include <unistd.h>
 
+#include <cerrno>
 #include <chrono>
 #include <cstring>
 #include <random>
-#include <thread>
 
 #include "host/platform/NetworkFolder.h"
 #include "host/platform/OrdinaryFile.h"
@@ -14,6 +15,7 @@
 #include "host/registry/SoundCopy.h"
 #include "host/registry/Soundness.h"
 #include "host/registry/Statements.h"
+#include "host/registry/StoreFailure.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -34,33 +36,56 @@ bool isMarkedReadOnly(const std::filesystem::path& file)
     return stat(file.c_str(), &status) == 0 && (status.st_mode & (S_IWUSR | S_IWGRP | S_IWOTH)) == 0;
 }
 
+bool isFilled(const std::filesystem::path& file)
+{
+    struct stat status = {};
+    return stat(file.c_str(), &status) == 0 && S_ISREG(status.st_mode) && status.st_size > 0;
+}
+
 bool holdsSomething(const std::filesystem::path& file)
 {
     struct stat status = {};
     return stat(file.c_str(), &status) == 0 && (!S_ISREG(status.st_mode) || status.st_size > 0);
 }
 
-// Opening what is no file at all would fail in words that do not say so, or wait.
+// Opening what is no file at all would fail in words that do not say so, or wait. What cannot be asked for is
+// not taken for missing.
 Result<> checkKind(const std::filesystem::path& file)
 {
     struct stat status = {};
     if (stat(file.c_str(), &status) != 0)
-        return {};
+        return errno == ENOENT || errno == ENOTDIR ? Result<>() : fileFailure(errno);
     const auto ordinary = checkOrdinary(status);
     return ordinary ? ordinary : Failure{ordinary.sentence(), SQLITE_NOTADB};
+}
+
+// The store takes a folder for a journal that it may not write.
+Result<> checkPlacesOfJournals(const std::filesystem::path& file)
+{
+    for (const char* ending : {"-wal", "-shm", "-journal"})
+    {
+        const std::filesystem::path journal = file.string() + ending;
+        if (const auto ordinary = checkKind(journal); ordinary.code() == SQLITE_NOTADB)
+            return Failure{L"what stands at " + toWide(journal.string()) + L" is in its way: " +
+                               ordinary.sentence(),
+                           kInTheWay};
+    }
+    return {};
+}
+
+// Of a journal that it cannot make the store says that there is none.
+Failure whyRefused(const std::filesystem::path& file, const Failure& failure)
+{
+    const bool isUnclear = (failure.code & 0xFF) == SQLITE_CANTOPEN;
+    if (isUnclear && access(file.parent_path().c_str(), W_OK) != 0)
+        return {L"its folder may not be written", SQLITE_PERM};
+    return failure;
 }
 
 bool fileExists(const std::filesystem::path& file)
 {
     std::error_code missing;
     return std::filesystem::exists(file, missing);
-}
-
-bool isNewer(const std::filesystem::path& file, const std::filesystem::path& other)
-{
-    std::error_code missing;
-    const auto time = std::filesystem::last_write_time(file, missing);
-    return !missing && time > std::filesystem::last_write_time(other, missing) && !missing;
 }
 
 // The file may come from anybody: nothing in it runs, and no statement can be made to harm its tables.
@@ -76,20 +101,6 @@ int makeSafe(sqlite3* database)
         if (status == SQLITE_OK)
             status = set(option, 0);
     return status == SQLITE_OK ? addChecksum(database) : status;
-}
-
-bool isDamage(int status)
-{
-    const int kind = status & 0xFF;
-    return kind == SQLITE_CORRUPT || kind == SQLITE_NOTADB;
-}
-
-// What may be so because nothing can be written where the file is.
-bool isRefusal(int status)
-{
-    const int kind = status & 0xFF;
-    return kind == SQLITE_CANTOPEN || kind == SQLITE_READONLY || kind == SQLITE_IOERR ||
-           kind == SQLITE_FULL || kind == SQLITE_PERM;
 }
 } // namespace
 
@@ -122,12 +133,22 @@ void Registry::close()
 
 void Registry::refuse(const Result<>& reason)
 {
+    close();
     mDamaged = isDamage(reason.code());
     mCanStore = Failure{L"The registry " + toWide(mFile.string()) + L" cannot be used: " + reason.sentence() +
-                            L". It was left as it is, and nothing will be stored." +
-                            (mDamaged ? L" " + helpAgainstDamage(mFile) : std::wstring()),
+                            (fileExists(mFile) ? L". It was left as it is, and nothing will be stored. "
+                                               : L". Nothing will be stored. ") +
+                            (mDamaged ? helpAgainstDamage(mFile) : whatHelpsAtStart(reason.code())),
                         ERROR_ACCESS_DENIED};
-    close();
+}
+
+// What is there is read.
+void Registry::storeNothing(const Failure& reason)
+{
+    mCanStore =
+        Failure{L"Nothing can be stored in the registry " + toWide(mFile.string()) + L": " + reason.sentence +
+                    L". What is stored there is used. " + whatHelpsAtStart(reason.code),
+                ERROR_ACCESS_DENIED};
 }
 
 // A new file appears with all that it needs: of many first starts none sees half of it. One that was there
@@ -147,7 +168,7 @@ Result<> Registry::makeMissingFile()
     if (!isOnNetwork(mFile.parent_path().string()))
         bytes->replace(kJournalKind, kJournalKindBytes, kJournalKindBytes, '\2');
     const auto made = makeFileOnce(mFile, *bytes);
-    return made ? made : Failure{L"it cannot be made: " + made.sentence()};
+    return made ? made : Failure{L"it cannot be made: " + made.sentence(), SQLITE_CANTOPEN};
 }
 
 Result<> Registry::connect(const std::string& name, int flags)
@@ -155,7 +176,7 @@ Result<> Registry::connect(const std::string& name, int flags)
     close();
     int status = sqlite3_open_v2(name.c_str(), &mDatabase, flags | SQLITE_OPEN_NOMUTEX, nullptr);
     if (status == SQLITE_OK)
-        status = sqlite3_busy_timeout(mDatabase, static_cast<int>(mBusyTimeout.count()));
+        status = mWait.attach(mDatabase);
     if (status == SQLITE_OK)
         status = makeSafe(mDatabase);
     return status == SQLITE_OK ? Result<>() : storeFailure(mDatabase, status);
@@ -163,9 +184,11 @@ Result<> Registry::connect(const std::string& name, int flags)
 
 Result<> Registry::openFile()
 {
+    if (const auto clear = checkPlacesOfJournals(mFile); !clear)
+        return openWithoutJournal(clear.failure());
     const auto foreign = setForeignLogAside(mFile);
     if (!foreign)
-        return foreign.failure();
+        return openFixed(foreign.failure());
     mNotice = *foreign;
     const int flags = mReadOnly ? SQLITE_OPEN_READONLY : SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE;
     auto opened = connect(mFile.string(), flags);
@@ -175,7 +198,10 @@ Result<> Registry::openFile()
     if (!mReadOnly && isOnNetwork(mFile.parent_path().string()) && checkOrigin())
         leaveSharedLog(); // of a file that is ours to change
     const auto asked = firstNumber(mDatabase, kAskVersion);
-    return asked || !isRefusal(asked.code()) ? Result<>() : openWithoutJournal(asked.failure());
+    if (asked.code() == SQLITE_BUSY)
+        return readPastLock(asked.failure());
+    return asked || !isRefusal(asked.code()) ? Result<>()
+                                             : openWithoutJournal(whyRefused(mFile, asked.failure()));
 }
 
 // A profile that was moved to the network has its file's journal changed by the first session there. Of
@@ -185,33 +211,53 @@ void Registry::leaveSharedLog()
 {
     constexpr std::chrono::milliseconds kPause{20};
     std::random_device random;
-    const auto end = std::chrono::steady_clock::now() + mBusyTimeout;
-    while (firstText(mDatabase, kUseJournal).code() == SQLITE_BUSY && std::chrono::steady_clock::now() < end)
+    while (firstText(mDatabase, kUseJournal).code() == SQLITE_BUSY)
     {
         close();
-        std::this_thread::sleep_for(kPause * (1 + random() % 5));
-        if (!connect(mFile.string(), SQLITE_OPEN_READWRITE))
+        const bool isPatient = mWait.pause(kPause * (1 + random() % 5));
+        if (!connect(mFile.string(), SQLITE_OPEN_READWRITE) || !isPatient)
             return;
-        sqlite3_busy_timeout(mDatabase, 0);
+        LockWait::detach(mDatabase);
     }
-    sqlite3_busy_timeout(mDatabase, static_cast<int>(mBusyTimeout.count()));
+    mWait.attach(mDatabase);
 }
 
 // Where the journal's files cannot be made, what is stored can be read all the same.
 Result<> Registry::openWithoutJournal(const Failure& reason)
 {
+    if (!isFilled(logOf(mFile)))
+        return openFixed(reason);
     if (!mReadOnly)
-        mCanStore = Failure{L"Nothing can be stored in the registry " + toWide(mFile.string()) + L": " +
-                                reason.sentence + L". What is stored there is used.",
-                            ERROR_ACCESS_DENIED};
-    if (!holdsSomething(mFile.string() + "-wal"))
-        return connect(asFixedFile(mFile), SQLITE_OPEN_READONLY | SQLITE_OPEN_URI);
+        storeNothing(reason);
     // Alone with the file, the store keeps in memory what tells the log's pages.
     auto alone = connect(mFile.string(), mReadOnly ? SQLITE_OPEN_READONLY : SQLITE_OPEN_READWRITE);
     if (alone &&
         sqlite3_exec(mDatabase, "PRAGMA locking_mode=EXCLUSIVE", nullptr, nullptr, nullptr) == SQLITE_OK)
         alone = readIntoMemory();
     return alone ? alone : Result<>(reason);
+}
+
+Result<> Registry::openFixed(const Failure& reason)
+{
+    if (!mReadOnly)
+        storeNothing(reason);
+    return connect(asFixedFile(mFile), SQLITE_OPEN_READONLY | SQLITE_OPEN_URI);
+}
+
+// Who only holds the file leaves it as it is: then it can be read although the lock forbids it. What is read
+// while somebody writes would be half of this and half of that.
+Result<> Registry::readPastLock(const Failure& reason)
+{
+    const auto before = restingState(mFile);
+    if (!before)
+        return reason;
+    storeNothing(reason);
+    auto read = connect(asFixedFile(mFile), SQLITE_OPEN_READONLY | SQLITE_OPEN_URI);
+    if (read)
+        read = readIntoMemory();
+    const auto version = read ? checkOrigin() : Result<int>(read.failure());
+    const bool isWhole = version && checkSoundness(mDatabase, *version);
+    return isWhole && restingState(mFile) == before ? Result<>() : Result<>(reason);
 }
 
 // Handles too: the keys of another file have other numbers.
@@ -252,17 +298,31 @@ Result<int> Registry::checkOrigin()
     if (!asked)
         return asked.failure();
     const int version = static_cast<int>(*asked);
+    if (version != kSchemaVersion && version != kVersionWithoutChecksums)
+        return checkUnknown(version);
+    const auto known = checkTables(mDatabase, version);
+    return known ? Result<int>(version) : known.failure();
+}
+
+// A registry whose version is damaged still has the tables of one. A copy that stands beside a file of
+// somebody else shows that a registry was there.
+Result<int> Registry::checkUnknown(int version)
+{
+    const bool isOurs =
+        checkTables(mDatabase, kSchemaVersion) || checkTables(mDatabase, kVersionWithoutChecksums);
+    const bool hasCopy = fileExists(soundCopyOf(mFile));
     if (version > kSchemaVersion)
-        return Failure{L"it was written by a newer Tessel"};
-    if (version >= kVersionWithoutChecksums)
-    {
-        const auto known = checkTables(mDatabase, version);
-        return known ? Result<int>(version) : known.failure();
-    }
+        return isOurs && hasCopy
+                   ? Failure{L"it was written by a newer Tessel, or its version is damaged", SQLITE_CORRUPT}
+                   : Failure{L"it was written by a newer Tessel", kOfANewerTessel};
+    if (isOurs)
+        return Failure{L"its version is damaged", SQLITE_CORRUPT};
     const auto tables = firstNumber(mDatabase, "SELECT count(*) FROM sqlite_master");
     if (!tables)
         return tables.failure();
-    return *tables == 0 ? Result<int>(version) : Failure{L"it belongs to another program"};
+    if (version == 0 && *tables == 0)
+        return version;
+    return Failure{L"it belongs to another program", hasCopy ? SQLITE_NOTADB : kOfAnotherProgram};
 }
 
 // What is somebody else's is recognised before anything is written: the journal's kind is part of the file.
@@ -306,15 +366,7 @@ void Registry::lookAtAll(int version)
     const auto sound = checkSoundness(mDatabase, version);
     mLookedAt = static_cast<bool>(sound);
     if (!sound)
-        mCanStore = damage(sound.sentence());
-}
-
-Failure Registry::damage(const std::wstring& reason)
-{
-    mDamaged = true;
-    return {L"The registry " + toWide(mFile.string()) + L" is damaged: " + reason +
-                L". It was left as it is, and nothing will be stored. " + helpAgainstDamage(mFile),
-            ERROR_ACCESS_DENIED};
+        mCanStore = whatIsWrong(sound.failure());
 }
 
 // An older file that cannot be changed is read as if it had been.
@@ -330,10 +382,7 @@ Result<> Registry::bringUpToDate(int version)
         const auto changed = addChecksums(mDatabase);
         if (changed)
             return changed;
-        mCanStore = Failure{L"Nothing can be stored in the registry " + toWide(mFile.string()) +
-                                L", which an older Tessel has written: " + changed.sentence() +
-                                L". What is stored there is used.",
-                            ERROR_ACCESS_DENIED};
+        storeNothing(changed.failure());
     }
     const auto read = readIntoMemory();
     return read ? addChecksums(mDatabase) : read;
@@ -357,51 +406,11 @@ Result<> Registry::chooseJournal()
     if (network && (!kind || *kind != L"delete"))
         return Failure{
             L"it lies in a folder of the network, and another session has it open as if it did not"};
-    // Another process is about to change the journal's kind; until then the old one keeps the promises too.
-    return kind || kind.code() == SQLITE_BUSY ? Result<>() : kind.failure();
-}
-
-// A session that ended in good order has made its copy; one that did not has left the file newer than that.
-void Registry::renewCopy(bool changed)
-{
-    if (!mLookedAt || !mCanStore || mReadOnly)
-        return;
-    const auto copy = soundCopyOf(mFile);
-    mHasStored =
-        changed ||
-        (mLeftOpen && (!fileExists(copy) || isNewer(mFile, copy) || isNewer(mFile.string() + "-wal", copy)));
-    static_cast<void>(keepCopy()); // the session's end makes it, and tells
-}
-
-Result<> Registry::keepCopy()
-{
-    if (!mDatabase || !mCanStore || !mLookedAt || !mHasStored)
-        return {};
-    const auto made = makeSoundCopy(mDatabase, mFile);
-    mHasStored = !made;
-    return made ? made
-                : Failure{L"The copy of the registry " + toWide(mFile.string()) + L" could not be made: " +
-                          made.sentence() + L"."};
-}
-
-Result<std::wstring> Registry::restoreCopy()
-{
-    if (!mDamaged)
-        return Failure{L"The registry " + toWide(mFile.string()) +
-                       L" is not known to be damaged; it was left as it is."};
-    const std::wstring time = timeOfCopy(mFile);
-    forgetAll();
-    close();
-    const auto kept = putSoundCopyBack(mFile);
-    mCanStore = {};
-    open();
-    if (!kept)
-        return kept.failure();
-    mCanStore = Failure{L"Nothing is stored in the registry " + toWide(mFile.string()) +
-                            L" before Tessel is started again, since it was restored.",
-                        ERROR_ACCESS_DENIED};
-    return L"The registry " + toWide(mFile.string()) + L" was restored from the copy of " + time +
-           (kept->empty() ? L"" : L"; what stood there is kept as " + toWide(kept->string())) +
-           L". Start Tessel again: this session stores nothing more.";
+    if (kind || !isRefusal(kind.code()))
+        // Another process is about to change the journal's kind; until then the old one keeps the promises
+        // too.
+        return kind || kind.code() == SQLITE_BUSY ? Result<>() : kind.failure();
+    storeNothing(kind.failure());
+    return {};
 }
 } // namespace tessel

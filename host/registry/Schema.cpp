@@ -9,6 +9,7 @@
 #include <utility>
 
 #include "host/registry/Statement.h"
+#include "host/registry/StoreFailure.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -287,11 +288,6 @@ Result<std::string> emptyRegistry()
     }
     sqlite3_close(database);
     return bytes;
-}
-
-Failure storeFailure(sqlite3* database, int status)
-{
-    return {toWide(sqlite3_errmsg(database)), status};
 }
 
 Result<std::int64_t> firstNumber(sqlite3* database, const char* sql)

@@ -31,9 +31,6 @@ Result<> addChecksums(sqlite3* database);
 // The bytes of a new registry.
 Result<std::string> emptyRegistry();
 
-// Why the store does not do what it was asked, in its own words: the end of a sentence.
-Failure storeFailure(sqlite3* database, int status);
-
 // The first number or text that a statement answers; the codes are the store's.
 Result<std::int64_t> firstNumber(sqlite3* database, const char* sql);
 Result<std::wstring> firstText(sqlite3* database, const char* sql);

@@ -9,11 +9,13 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include "host/platform/OrdinaryFile.h"
 #include "host/platform/PartFile.h"
 #include "host/platform/SystemFailure.h"
 #include "host/registry/Journals.h"
 #include "host/registry/Schema.h"
 #include "host/registry/Soundness.h"
+#include "host/registry/StoreFailure.h"
 #include "host/text/DayAndTime.h"
 #include "host/text/Unicode.h"
 
@@ -49,30 +51,59 @@ Result<> useCopy(sqlite3* database)
     return sound ? checkSoundness(database, kSchemaVersion) : sound;
 }
 
-// The copy's bytes, if it is sound.
-Result<std::string> readCopy(const std::filesystem::path& copy)
+using Database = std::unique_ptr<sqlite3, CloseDatabase>;
+
+// The copy, if it is sound, opened for reading.
+Result<Database> openCopy(const std::filesystem::path& copy)
 {
+    struct stat status = {};
+    if (stat(copy.c_str(), &status) != 0)
+        return fileFailure(errno);
+    if (const auto ordinary = checkOrdinary(status); !ordinary)
+        return ordinary.failure();
     sqlite3* opened = nullptr;
     constexpr int kFlags = SQLITE_OPEN_READONLY | SQLITE_OPEN_URI;
-    const int status = sqlite3_open_v2(asFixedFile(copy).c_str(), &opened, kFlags, nullptr);
-    const std::unique_ptr<sqlite3, CloseDatabase> database(opened);
-    const auto sound = status == SQLITE_OK ? useCopy(opened) : Result<>(storeFailure(opened, status));
-    if (!sound)
-        return sound.failure();
+    const int answer = sqlite3_open_v2(asFixedFile(copy).c_str(), &opened, kFlags, nullptr);
+    Database database(opened);
+    const auto sound = answer == SQLITE_OK ? useCopy(opened) : Result<>(storeFailure(opened, answer));
+    return sound ? Result<Database>(std::move(database)) : sound.failure();
+}
+
+Result<std::string> readCopy(const std::filesystem::path& copy)
+{
+    const auto database = openCopy(copy);
+    if (!database)
+        return database.failure();
     sqlite3_int64 size = 0;
-    const Image image(sqlite3_serialize(opened, "main", &size, 0), sqlite3_free);
+    const Image image(sqlite3_serialize(database->get(), "main", &size, 0), sqlite3_free);
     if (!image)
-        return storeFailure(opened, SQLITE_NOMEM);
+        return storeFailure(database->get(), SQLITE_NOMEM);
     return std::string(image.get(), image.get() + size);
 }
 
-// What stands at the path gets a second name, in place of what had it before. A folder, which can have only
-// one name, loses its first. Whether anything stood there.
+bool isTaken(const std::filesystem::path& path)
+{
+    std::error_code unreachable;
+    return exists(symlink_status(path, unreachable));
+}
+
+// "registry.db.damaged", or "registry.db.damaged-2" and so on, which nobody has yet, nor its journals' names.
+std::filesystem::path nameToKeep(const std::filesystem::path& file)
+{
+    const auto first = beside(file, ".damaged");
+    auto name = first;
+    for (int number = 2; isTaken(name) || isTaken(beside(name, "-wal")) || isTaken(beside(name, "-journal"));
+         ++number)
+        name = beside(first, ("-" + std::to_string(number)).c_str());
+    return name;
+}
+
+// What stands at the path gets a second name. A folder, which can have only one name, loses its first.
+// Whether anything stood there.
 Result<bool> nameToo(const std::filesystem::path& file, const std::filesystem::path& second)
 {
     std::error_code unreachable;
     const bool isFolder = is_directory(symlink_status(file, unreachable));
-    static_cast<void>(std::remove(second.c_str())); // if it stays, the next fails
     const int status = isFolder ? rename(file.c_str(), second.c_str()) : link(file.c_str(), second.c_str());
     if (status != 0 && errno != ENOENT)
         return systemFailure(errno);
@@ -87,6 +118,26 @@ Result<> setJournalsAside(const std::filesystem::path& file, const std::filesyst
             return systemFailure(errno);
     unlink(beside(file, "-shm").c_str());
     return {};
+}
+
+// Keeps what stands at the path, with its journals, under that name too. Whether anything stood there.
+Result<bool> keep(const std::filesystem::path& file, const std::filesystem::path& kept)
+{
+    auto named = nameToo(file, kept);
+    const Result<> done = named ? setJournalsAside(file, kept) : named.failure();
+    return done ? named : done.failure();
+}
+
+// Under a name that is free, and no longer under its own: which, or none when nothing stood there.
+Result<std::filesystem::path> moveAside(const std::filesystem::path& file)
+{
+    const auto kept = nameToKeep(file);
+    const auto stood = keep(file, kept);
+    if (!stood)
+        return stood.failure();
+    if (unlink(file.c_str()) != 0 && errno != ENOENT)
+        return systemFailure(errno);
+    return *stood ? kept : std::filesystem::path();
 }
 
 Failure notRestored(const std::filesystem::path& file, const std::wstring& reason)
@@ -111,8 +162,20 @@ std::wstring timeOfCopy(const std::filesystem::path& file)
 std::wstring helpAgainstDamage(const std::filesystem::path& file)
 {
     const std::wstring time = timeOfCopy(file);
-    return time.empty() ? L"There is no copy of an earlier state."
-                        : L"REGISTRY RESTORE puts back the copy of " + time + L".";
+    const auto sound = checkSoundCopy(file);
+    if (sound)
+        return L"REGISTRY RESTORE puts back the copy of " + time + L".";
+    if (time.empty())
+        return L"There is no copy of an earlier state. REGISTRY RESET sets it aside and begins with an empty "
+               L"one.";
+    return L"Its copy " + toWide(soundCopyOf(file).string()) + L" is of no use: " + sound.sentence() +
+           L". REGISTRY RESET sets both aside and begins with an empty one.";
+}
+
+Result<> checkSoundCopy(const std::filesystem::path& file)
+{
+    const auto copy = openCopy(soundCopyOf(file));
+    return copy ? Result<>() : copy.failure();
 }
 
 Result<> makeSoundCopy(sqlite3* database, const std::filesystem::path& file)
@@ -134,14 +197,22 @@ Result<std::filesystem::path> putSoundCopyBack(const std::filesystem::path& file
     if (!bytes)
         return notRestored(file,
                            L"its copy " + toWide(copy.string()) + L" cannot be used: " + bytes.sentence());
-    const auto kept = beside(file, ".damaged");
-    const auto named = nameToo(file, kept);
-    Result<> done = named ? setJournalsAside(file, kept) : named.failure();
-    if (done)
-        done = replaceFile(file, *bytes);
+    const auto kept = nameToKeep(file);
+    const auto stood = keep(file, kept);
+    const Result<> done = stood ? replaceFile(file, *bytes) : stood.failure();
     if (!done)
         return notRestored(file, done.sentence());
-    return *named ? kept : std::filesystem::path();
+    return *stood ? kept : std::filesystem::path();
+}
+
+Result<std::filesystem::path> setAside(const std::filesystem::path& file)
+{
+    auto moved = moveAside(soundCopyOf(file));
+    if (moved)
+        moved = moveAside(file);
+    return moved ? moved
+                 : Failure{L"The registry " + toWide(file.string()) + L" could not be set aside: " +
+                           moved.sentence() + L"."};
 }
 
 Result<> makeFileOnce(const std::filesystem::path& file, std::string_view bytes)

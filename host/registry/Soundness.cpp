@@ -2,6 +2,7 @@
 
 #include "host/registry/Schema.h"
 #include "host/registry/Statement.h"
+#include "host/registry/StoreFailure.h"
 
 namespace tessel
 {

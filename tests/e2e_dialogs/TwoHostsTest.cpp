@@ -136,7 +136,8 @@ TEST_F(TwoHosts, ListsThatCannotBeStoredFailAsAWholeAndAreTold)
         press("Escape");
         EXPECT_TRUE(
             prints("The registry " + file +
-                   " could not be written: database is locked. What was stored before is unchanged.\n"))
+                   " could not be written: another program holds it. What was stored before is unchanged. "
+                   "Close that program, or let it finish, and try again.\n"))
             << mHost->output();
         EXPECT_THAT(mHost->output(), HasSubstr("Message: A list of applications could not be stored"));
     }

@@ -165,7 +165,9 @@ TEST_F(DamagedRegistry, IsToldByWhatIsDamagedAndWhatHelps)
                                 "stored. REGISTRY RESTORE puts back the copy of 2"),
                       EndsWith(".")));
     fs::remove(copy());
-    EXPECT_THAT(sentenceOf(Registry(file()).canStore()), EndsWith("There is no copy of an earlier state."));
+    EXPECT_THAT(sentenceOf(Registry(file()).canStore()),
+                EndsWith("There is no copy of an earlier state. REGISTRY RESET sets it aside and begins "
+                         "with an empty one."));
 }
 
 TEST_F(DamagedRegistry, WithAChangedKeyIsTold)

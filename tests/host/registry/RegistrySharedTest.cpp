@@ -264,7 +264,7 @@ TEST(SharedRegistry, ForgetsAFailureWhenTheActionIsOverAndNotBefore)
     EXPECT_EQ(host.output().text(), "");
     EXPECT_FALSE(host.registry().write(L"A", L"name", L"mine")) << "a part of what failed";
     tsrxBeforeWaiting(true);
-    EXPECT_NE(host.output().text().find("could not be written: database is locked"), std::string::npos);
+    EXPECT_NE(host.output().text().find("could not be written: another program holds it"), std::string::npos);
     EXPECT_TRUE(host.registry().write(L"A", L"name", L"mine"));
     tsrxBeforeWaiting(true);
     EXPECT_EQ(other.read(L"A", L"name"), L"mine");
@@ -279,8 +279,8 @@ TEST(SharedRegistry, RefusesAWriteWhileAnotherCommandTakesTooLong)
     EXPECT_FALSE(host.output().commandLine().tell(host.registry().endOfCommand()));
     EXPECT_EQ(host.output().text(),
               "The registry " + host.file().string() +
-                  " could not be written: database is locked. What was stored before is "
-                  "unchanged.\n");
+                  " could not be written: another program holds it. What was stored before is unchanged. "
+                  "Close that program, or let it finish, and try again.\n");
     EXPECT_TRUE(other.endOfCommand());
     EXPECT_TRUE(host.registry().write(L"A", L"name", L"mine"));
     EXPECT_TRUE(host.registry().endOfCommand());

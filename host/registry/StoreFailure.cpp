@@ -1,0 +1,163 @@
+#include "host/registry/StoreFailure.h"
+
+#include <cerrno>
+#include <cstring>
+
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr int kKind = 0xFF; // of a status: the rest says more
+
+int kindOf(int status)
+{
+    return status & kKind;
+}
+
+int lastErrorOf(sqlite3_file* file)
+{
+    int error = 0;
+    if (file && file->pMethods)
+        file->pMethods->xFileControl(file, SQLITE_FCNTL_LAST_ERRNO, &error);
+    return error;
+}
+
+// The store keeps the error with its own words or, where it wrote behind them, with the file that it wrote.
+int systemErrorOf(sqlite3* database, int status)
+{
+    const bool isOfTheWords = kindOf(sqlite3_errcode(database)) == kindOf(status);
+    if (const int error = sqlite3_system_errno(database); isOfTheWords && error != 0)
+        return error;
+    for (const int pointer : {SQLITE_FCNTL_JOURNAL_POINTER, SQLITE_FCNTL_FILE_POINTER})
+    {
+        sqlite3_file* file = nullptr;
+        sqlite3_file_control(database, "main", pointer, &file);
+        if (const int error = lastErrorOf(file); error != 0)
+            return error;
+    }
+    return 0;
+}
+
+int codeOf(int systemError)
+{
+    switch (systemError)
+    {
+    case ENOSPC:
+    case EDQUOT:
+        return SQLITE_FULL;
+    case EFBIG:
+        return SQLITE_TOOBIG;
+    case EACCES:
+    case EPERM:
+    case EROFS:
+        return SQLITE_PERM;
+    default:
+        return SQLITE_CANTOPEN;
+    }
+}
+
+std::wstring wordsOf(sqlite3* database, int status)
+{
+    const bool hasWords = kindOf(sqlite3_errcode(database)) == kindOf(status);
+    return toWide(hasWords ? sqlite3_errmsg(database) : sqlite3_errstr(status));
+}
+
+Failure systemsFailure(sqlite3* database, int status)
+{
+    const int error = systemErrorOf(database, status);
+    if (error == 0)
+        return {wordsOf(database, status), status};
+    const int code = codeOf(error);
+    return {toWide(std::strerror(error)), code == SQLITE_CANTOPEN ? status : code};
+}
+
+std::wstring whatHelpsFirst(int code)
+{
+    switch (kindOf(code))
+    {
+    case SQLITE_BUSY:
+        return L"Close that program, or let it finish";
+    case SQLITE_FULL:
+        return L"Make room on the disk";
+    case SQLITE_TOOBIG:
+        return L"Lift the limit on the size of files";
+    case SQLITE_PERM:
+    case SQLITE_READONLY:
+        return L"Give yourself the right to read and write the file and its folder";
+    case SQLITE_CANTOPEN:
+        return L"Make sure that files can be made and opened there";
+    case kOfAnotherProgram:
+        return L"Move that file elsewhere, or name another folder by --profile-dir";
+    case kOfANewerTessel:
+        return L"Use that Tessel, or name another folder by --profile-dir";
+    case kInTheWay:
+        return L"Remove that";
+    default:
+        return {};
+    }
+}
+} // namespace
+
+Failure storeFailure(sqlite3* database, int status)
+{
+    const int extended = sqlite3_extended_errcode(database);
+    switch (kindOf(status))
+    {
+    case SQLITE_BUSY:
+        return {L"another program holds it", status};
+    case SQLITE_FULL:
+        return {toWide(std::strerror(ENOSPC)), status};
+    case SQLITE_READONLY:
+        return {extended == SQLITE_READONLY_DIRECTORY ? L"its folder may not be written"
+                                                      : L"it may not be written",
+                status};
+    case SQLITE_PROTOCOL:
+        return {L"the file system refuses its locks", status};
+    case SQLITE_IOERR:
+    case SQLITE_CANTOPEN:
+        return systemsFailure(database, status);
+    default:
+        return {wordsOf(database, status), status};
+    }
+}
+
+Failure fileFailure(int systemError)
+{
+    return {toWide(std::strerror(systemError)), codeOf(systemError)};
+}
+
+bool isDamage(int code)
+{
+    return kindOf(code) == SQLITE_CORRUPT || kindOf(code) == SQLITE_NOTADB;
+}
+
+bool isRefusal(int code)
+{
+    switch (kindOf(code))
+    {
+    case SQLITE_CANTOPEN:
+    case SQLITE_READONLY:
+    case SQLITE_IOERR:
+    case SQLITE_FULL:
+    case SQLITE_TOOBIG:
+    case SQLITE_PERM:
+        return true;
+    default:
+        return false;
+    }
+}
+
+std::wstring whatHelpsAtStart(int code)
+{
+    const std::wstring first = whatHelpsFirst(code);
+    return first.empty() ? L"Start Tessel again." : first + L", and start Tessel again.";
+}
+
+std::wstring whatHelpsInSession(int code)
+{
+    const std::wstring first = whatHelpsFirst(code);
+    return first.empty() ? first : first + L", and try again.";
+}
+} // namespace tessel
