@@ -12,9 +12,7 @@
 #include <string_view>
 #include <vector>
 
-#include <sys/stat.h>
-
-#include "host/platform/SystemFailure.h"
+#include "host/registry/StoreFailure.h"
 #include "host/text/Hexadecimal.h"
 #include "host/text/Unicode.h"
 
@@ -117,14 +115,6 @@ bool belongs(const Identity& before, const LogIdentity& log, const Identity& aft
            log.first.count <= after.count + 1 && before.count <= log.last.count;
 }
 
-// A journal that is kept for the next transaction begins with zeros.
-bool isInUse(const std::filesystem::path& journal)
-{
-    std::ifstream stream(journal, std::ios::binary);
-    const int first = stream.get();
-    return first > 0;
-}
-
 bool isForeign(const std::filesystem::path& file)
 {
     std::error_code missing;
@@ -142,15 +132,16 @@ std::filesystem::path logOf(const std::filesystem::path& file)
     return file.string() + "-wal";
 }
 
-std::optional<std::array<std::int64_t, 4>> restingState(const std::filesystem::path& file)
+std::filesystem::path rollbackJournalOf(const std::filesystem::path& file)
 {
-    struct stat status = {};
-    if (isInUse(logOf(file)) || isInUse(file.string() + "-journal") || stat(file.c_str(), &status) != 0)
-        return std::nullopt;
-    const auto identity = identityOf(file);
-    if (!identity)
-        return std::nullopt;
-    return std::array<std::int64_t, 4>{identity->number, identity->count, status.st_size, status.st_mtime};
+    return file.string() + "-journal";
+}
+
+// One that is kept for the next transaction is empty or begins with a zero.
+bool isInUse(const std::filesystem::path& journal)
+{
+    std::ifstream stream(journal, std::ios::binary);
+    return stream.get() > 0;
 }
 
 Result<std::optional<std::wstring>> setForeignLogAside(const std::filesystem::path& file)
@@ -163,7 +154,10 @@ Result<std::optional<std::wstring>> setForeignLogAside(const std::filesystem::pa
         L"the write-ahead log " + toWide(log.string()) +
         L" does not belong to it, but to another registry or to another state of it";
     if (rename(log.c_str(), aside.c_str()) != 0)
-        return Failure{belongsElsewhere + L", and cannot be set aside: " + systemFailure(errno).sentence};
+    {
+        const Failure failure = fileFailure(errno);
+        return Failure{belongsElsewhere + L", and cannot be set aside: " + failure.sentence, failure.code};
+    }
     static_cast<void>(remove((file.string() + "-shm").c_str())); // it tells what is in the log
     return std::optional(L"The registry " + toWide(file.string()) + L" is read without its log: " +
                          belongsElsewhere + L". It was set aside as " + toWide(aside.string()) + L".");
@@ -188,6 +182,6 @@ bool hasJournal(const std::filesystem::path& file)
 {
     std::error_code missing;
     return std::filesystem::exists(logOf(file), missing) ||
-           std::filesystem::exists(file.string() + "-journal", missing);
+           std::filesystem::exists(rollbackJournalOf(file), missing);
 }
 } // namespace tessel

@@ -1,8 +1,6 @@
 // Whether the journal beside a registry's file is its own. Used by the Registry's own files alone.
 #pragma once
 
-#include <array>
-#include <cstdint>
 #include <filesystem>
 #include <optional>
 #include <string>
@@ -24,12 +22,12 @@ Result<std::optional<std::wstring>> setForeignLogAside(const std::filesystem::pa
 // it, which a folder that may not be written cannot take.
 std::string asFixedFile(const std::filesystem::path& file);
 
-// "registry.db-wal" of "registry.db".
+// "registry.db-wal" and "registry.db-journal" of "registry.db".
 std::filesystem::path logOf(const std::filesystem::path& file);
+std::filesystem::path rollbackJournalOf(const std::filesystem::path& file);
 
-// What a file is like, whose locks are not asked for, in numbers that differ when it was changed in between;
-// none when a journal says that somebody is writing it, or the file cannot be read.
-std::optional<std::array<std::int64_t, 4>> restingState(const std::filesystem::path& file);
+// Whether such a file holds what the registry's own file does not say.
+bool isInUse(const std::filesystem::path& journal);
 
 // Whether a session has left a journal: another one runs, or the last one did not end in good order.
 bool hasJournal(const std::filesystem::path& file);

@@ -152,6 +152,8 @@ private:
     Result<> connect(const std::string& name, int flags);
     void leaveSharedLog();
     Result<> openWithoutJournal(const Failure& reason);
+    Result<> openAlone();
+    Result<> readElsewhere(const Failure& reason);
     Result<> openFixed(const Failure& reason);
     Result<> readPastLock(const Failure& reason);
     Result<> readIntoMemory();

@@ -9,6 +9,7 @@
 
 #include "host/platform/NetworkFolder.h"
 #include "host/platform/OrdinaryFile.h"
+#include "host/registry/CopyElsewhere.h"
 #include "host/registry/Journals.h"
 #include "host/registry/LongStatements.h"
 #include "host/registry/Schema.h"
@@ -34,12 +35,6 @@ bool isMarkedReadOnly(const std::filesystem::path& file)
 {
     struct stat status = {};
     return stat(file.c_str(), &status) == 0 && (status.st_mode & (S_IWUSR | S_IWGRP | S_IWOTH)) == 0;
-}
-
-bool isFilled(const std::filesystem::path& file)
-{
-    struct stat status = {};
-    return stat(file.c_str(), &status) == 0 && S_ISREG(status.st_mode) && status.st_size > 0;
 }
 
 bool holdsSomething(const std::filesystem::path& file)
@@ -73,10 +68,11 @@ Result<> checkPlacesOfJournals(const std::filesystem::path& file)
     return {};
 }
 
-// Of a journal that it cannot make the store says that there is none.
+// Of a journal that it cannot make the store says that there is none, and of a right that is missing not to
+// what.
 Failure whyRefused(const std::filesystem::path& file, const Failure& failure)
 {
-    const bool isUnclear = (failure.code & 0xFF) == SQLITE_CANTOPEN;
+    const bool isUnclear = failure.code == SQLITE_CANTOPEN || failure.code == SQLITE_PERM;
     if (isUnclear && access(file.parent_path().c_str(), W_OK) != 0)
         return {L"its folder may not be written", SQLITE_PERM};
     return failure;
@@ -184,12 +180,12 @@ Result<> Registry::connect(const std::string& name, int flags)
 
 Result<> Registry::openFile()
 {
-    if (const auto clear = checkPlacesOfJournals(mFile); !clear)
-        return openWithoutJournal(clear.failure());
     const auto foreign = setForeignLogAside(mFile);
     if (!foreign)
         return openFixed(foreign.failure());
     mNotice = *foreign;
+    if (const auto clear = checkPlacesOfJournals(mFile); !clear)
+        return openWithoutJournal(clear.failure());
     const int flags = mReadOnly ? SQLITE_OPEN_READONLY : SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE;
     auto opened = connect(mFile.string(), flags);
     if (!opened)
@@ -225,16 +221,35 @@ void Registry::leaveSharedLog()
 // Where the journal's files cannot be made, what is stored can be read all the same.
 Result<> Registry::openWithoutJournal(const Failure& reason)
 {
-    if (!isFilled(logOf(mFile)))
+    if (!isInUse(logOf(mFile)) && !isInUse(rollbackJournalOf(mFile)))
         return openFixed(reason);
     if (!mReadOnly)
         storeNothing(reason);
-    // Alone with the file, the store keeps in memory what tells the log's pages.
-    auto alone = connect(mFile.string(), mReadOnly ? SQLITE_OPEN_READONLY : SQLITE_OPEN_READWRITE);
-    if (alone &&
-        sqlite3_exec(mDatabase, "PRAGMA locking_mode=EXCLUSIVE", nullptr, nullptr, nullptr) == SQLITE_OK)
-        alone = readIntoMemory();
-    return alone ? alone : Result<>(reason);
+    const auto alone = openAlone();
+    return alone ? alone : readElsewhere(reason);
+}
+
+// Alone with the file, the store keeps in memory what tells the log's pages.
+Result<> Registry::openAlone()
+{
+    const auto opened = connect(mFile.string(), mReadOnly ? SQLITE_OPEN_READONLY : SQLITE_OPEN_READWRITE);
+    if (!opened)
+        return opened;
+    const int status = sqlite3_exec(mDatabase, "PRAGMA locking_mode=EXCLUSIVE", nullptr, nullptr, nullptr);
+    return status == SQLITE_OK ? readIntoMemory() : Result<>(storeFailure(mDatabase, status));
+}
+
+// Whose journal cannot be brought together with it, or whose lock is not given.
+Result<> Registry::readElsewhere(const Failure& reason)
+{
+    close();
+    const CopyElsewhere copy(mFile);
+    if (!copy.made())
+        return reason;
+    auto read = connect(copy.file().string(), SQLITE_OPEN_READWRITE);
+    if (read)
+        read = readIntoMemory();
+    return read ? read : Result<>(reason);
 }
 
 Result<> Registry::openFixed(const Failure& reason)
@@ -244,20 +259,15 @@ Result<> Registry::openFixed(const Failure& reason)
     return connect(asFixedFile(mFile), SQLITE_OPEN_READONLY | SQLITE_OPEN_URI);
 }
 
-// Who only holds the file leaves it as it is: then it can be read although the lock forbids it. What is read
-// while somebody writes would be half of this and half of that.
+// What another program has not stored yet stands in its journal, or in what it holds in memory: a copy is
+// what was stored before. One that it has changed meanwhile may be half of this and half of that.
 Result<> Registry::readPastLock(const Failure& reason)
 {
-    const auto before = restingState(mFile);
-    if (!before)
-        return reason;
     storeNothing(reason);
-    auto read = connect(asFixedFile(mFile), SQLITE_OPEN_READONLY | SQLITE_OPEN_URI);
-    if (read)
-        read = readIntoMemory();
-    const auto version = read ? checkOrigin() : Result<int>(read.failure());
-    const bool isWhole = version && checkSoundness(mDatabase, *version);
-    return isWhole && restingState(mFile) == before ? Result<>() : Result<>(reason);
+    if (const auto read = readElsewhere(reason); !read)
+        return read;
+    const auto version = checkOrigin();
+    return version && checkSoundness(mDatabase, *version) ? Result<>() : Result<>(reason);
 }
 
 // Handles too: the keys of another file have other numbers.

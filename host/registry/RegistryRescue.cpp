@@ -91,7 +91,8 @@ Result<std::wstring> Registry::beginEmpty()
 }
 
 // Answers the end of the sentence about it. What applications have read is not what is there now.
-Result<std::wstring> Registry::replaceWith(Result<std::filesystem::path> (*replace)(const std::filesystem::path&))
+Result<std::wstring>
+Registry::replaceWith(Result<std::filesystem::path> (*replace)(const std::filesystem::path&))
 {
     forgetAll();
     close();

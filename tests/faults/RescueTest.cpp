@@ -62,15 +62,17 @@ TEST_F(Rescue, WithoutACopyIsAnEmptyRegistry)
     damage(file());
     const std::string damaged = contentOf(file());
     fs::remove(beside(".sound"));
-    EXPECT_THAT(said(), HasSubstr("is damaged: the value \"name\" in \"Software\\Trial\" is not what was stored "
-                                  "there. It was left as it is, and nothing will be stored. There is no copy of "
-                                  "an earlier state. REGISTRY RESET sets it aside and begins with an empty one."));
-    EXPECT_THAT(said({"REGISTRY RESET", kSet}, 1),
-                AllOf(HasSubstr("The registry " + file().string() + " is empty now; what stood there is kept as " +
-                                file().string() +
-                                ".damaged. Start Tessel again: this session stores nothing more.\n"),
-                      HasSubstr("cannot be written. Nothing is stored in the registry " + file().string() +
-                                " before Tessel is started again, since another one was put in its place.\n")));
+    EXPECT_THAT(said(),
+                HasSubstr("is damaged: the value \"name\" in \"Software\\Trial\" is not what was stored "
+                          "there. It was left as it is, and nothing will be stored. There is no copy of "
+                          "an earlier state. REGISTRY RESET sets it aside and begins with an empty one."));
+    EXPECT_THAT(
+        said({"REGISTRY RESET", kSet}, 1),
+        AllOf(HasSubstr("The registry " + file().string() + " is empty now; what stood there is kept as " +
+                        file().string() +
+                        ".damaged. Start Tessel again: this session stores nothing more.\n"),
+              HasSubstr("cannot be written. Nothing is stored in the registry " + file().string() +
+                        " before Tessel is started again, since another one was put in its place.\n")));
     EXPECT_EQ(contentOf(beside(".damaged")), damaged);
     EXPECT_THAT(said({kSet, kGet}), AllOf(HasSubstr("\nfirst\n"), Not(HasSubstr("The registry"))));
 }
@@ -80,10 +82,11 @@ TEST_F(Rescue, DoesNotPromiseACopyThatIsDamagedItself)
     damage(file());
     damage(beside(".sound"));
     const std::string copy = contentOf(beside(".sound"));
-    EXPECT_THAT(said(), AllOf(HasSubstr(" Its copy " + beside(".sound").string() +
-                                        " is of no use: the value \"name\" in \"Software\\Trial\" is not what was "
-                                        "stored there. REGISTRY RESET sets both aside and begins with an empty one."),
-                              Not(HasSubstr("RESTORE"))));
+    EXPECT_THAT(said(),
+                AllOf(HasSubstr(" Its copy " + beside(".sound").string() +
+                                " is of no use: the value \"name\" in \"Software\\Trial\" is not what was "
+                                "stored there. REGISTRY RESET sets both aside and begins with an empty one."),
+                      Not(HasSubstr("RESTORE"))));
     EXPECT_THAT(said({"REGISTRY RESET"}), HasSubstr("is empty now"));
     EXPECT_EQ(contentOf(beside(".sound.damaged")), copy);
     EXPECT_THAT(said({kSet}), Not(HasSubstr("The registry")));
@@ -105,9 +108,10 @@ TEST_F(Rescue, ResetsNothingThatIsSoundOrHasASoundCopy)
     EXPECT_THAT(said({"REGISTRY RESET"}, 1), HasSubstr("is not known to be damaged; it was left as it is."));
     damage(file());
     const std::string damaged = contentOf(file());
-    EXPECT_THAT(said({"REGISTRY RESET"}, 1),
-                ContainsRegex("registry.db was left as it is: REGISTRY RESTORE puts back the copy of 2[-0-9]* "
-                              "[0-9]*:[0-9]*\\.\n"));
+    EXPECT_THAT(
+        said({"REGISTRY RESET"}, 1),
+        ContainsRegex("registry.db was left as it is: REGISTRY RESTORE puts back the copy of 2[-0-9]* "
+                      "[0-9]*:[0-9]*\\.\n"));
     EXPECT_EQ(contentOf(file()), damaged);
 }
 
@@ -132,8 +136,9 @@ TEST_F(Rescue, IsNotStoppedByAFolderWithTheNameOfWhatIsKept)
 {
     damage(file());
     fs::create_directory(beside(".damaged"));
-    EXPECT_THAT(said({"REGISTRY RESTORE", kGet}),
-                AllOf(HasSubstr("is kept as " + beside(".damaged-2").string() + "."), HasSubstr("\nfirst\n")));
+    EXPECT_THAT(
+        said({"REGISTRY RESTORE", kGet}),
+        AllOf(HasSubstr("is kept as " + beside(".damaged-2").string() + "."), HasSubstr("\nfirst\n")));
     EXPECT_TRUE(fs::is_empty(beside(".damaged")));
 }
 
@@ -143,7 +148,8 @@ TEST_F(Rescue, KnowsARegistryWhoseVersionIsDamaged)
     {
         changeByte(file(), kVersionAt, version);
         EXPECT_THAT(said({"REGISTRY RESTORE", kGet}),
-                    AllOf(HasSubstr("its version is damaged"), HasSubstr("REGISTRY RESTORE puts back the copy of 2"),
+                    AllOf(HasSubstr("its version is damaged"),
+                          HasSubstr("REGISTRY RESTORE puts back the copy of 2"),
                           HasSubstr("was restored from the copy of 2"), HasSubstr("\nfirst\n"),
                           Not(HasSubstr("belongs to another program"))));
     }
@@ -154,13 +160,16 @@ TEST_F(Rescue, LeavesAFileOfAnotherProgramToAPerson)
     fs::remove(file());
     ASSERT_EQ(runSql(file(), "CREATE TABLE contact(name TEXT); INSERT INTO contact VALUES('Ada')"), "");
     const std::string foreign = contentOf(file());
-    EXPECT_THAT(said(), HasSubstr("cannot be used: it belongs to another program. It was left as it is, and nothing "
-                                  "will be stored. REGISTRY RESTORE puts back the copy of 2"));
+    EXPECT_THAT(said(),
+                HasSubstr("cannot be used: it belongs to another program. It was left as it is, and nothing "
+                          "will be stored. REGISTRY RESTORE puts back the copy of 2"));
     fs::remove(beside(".sound"));
-    EXPECT_THAT(said({"REGISTRY RESET"}, 1),
-                AllOf(HasSubstr("it belongs to another program. It was left as it is, and nothing will be stored. Move "
-                                "that file elsewhere, or name another folder by --profile-dir, and start Tessel again."),
-                      HasSubstr("is not known to be damaged; it was left as it is.")));
+    EXPECT_THAT(
+        said({"REGISTRY RESET"}, 1),
+        AllOf(HasSubstr(
+                  "it belongs to another program. It was left as it is, and nothing will be stored. Move "
+                  "that file elsewhere, or name another folder by --profile-dir, and start Tessel again."),
+              HasSubstr("is not known to be damaged; it was left as it is.")));
     EXPECT_EQ(contentOf(file()), foreign);
 }
 
@@ -169,13 +178,14 @@ TEST_F(Rescue, CallsAKeyDamagedWhoseRowsAre)
     const std::string thatKey = "\nThe registry key \"Software\\Trial\" cannot be read";
     const std::string isDamaged = ". The registry " + file().string() + " is damaged: ";
     damage(file());
-    const std::string value = "the value \"name\" in \"Software\\Trial\" is not what was stored there. It was";
+    const std::string value =
+        "the value \"name\" in \"Software\\Trial\" is not what was stored there. It was";
     EXPECT_THAT(said({kGet}, 1), HasSubstr(thatKey + isDamaged + value));
     EXPECT_THAT(said({kList}, 1), HasSubstr(thatKey + " to its end" + isDamaged + value));
     ASSERT_EQ(runSql(file(), "UPDATE key SET name='Trail' WHERE name='Trial'"), "");
     for (const char* command : {kList, kGet, R"(REGISTRY DELETE Software\Trial)"})
-        EXPECT_THAT(said({command}, 1),
-                    AllOf(HasSubstr(thatKey + isDamaged + "the key \"Trail\" in \"Software\" is not what was"),
-                          Not(HasSubstr("does not exist"))))
+        EXPECT_THAT(said({command}, 1), AllOf(HasSubstr(thatKey + isDamaged +
+                                                        "the key \"Trail\" in \"Software\" is not what was"),
+                                              Not(HasSubstr("does not exist"))))
             << command;
 }

@@ -3,12 +3,13 @@
 #include <gmock/gmock.h>
 
 #include <cerrno>
-#include <ostream>
+#include <csignal>
 
 #include <sys/stat.h>
 #include <unistd.h>
 
 #include "tests/e2e/Applications.h"
+#include "tests/e2e/HostTerminal.h"
 #include "tests/support/Database.h"
 
 namespace fs = std::filesystem;
@@ -21,6 +22,8 @@ namespace
 {
 constexpr char kGrantRights[] =
     " Give yourself the right to read and write the file and its folder, and start Tessel again.\n";
+
+constexpr char kSuiteIsThere[] = "Good.zmb: message 1\ngood.lsp: loaded\n";
 
 std::size_t timesIn(const std::string& words, const std::string& text)
 {
@@ -55,17 +58,45 @@ protected:
         session.set("MODRIG_FAULT", fault);
     }
 
+    // That the Suite has two entries stands in nothing but the log of a session that was killed.
+    void leaveLog()
+    {
+        storeSuite(session, {fixtureModule("Good.zmb")});
+        HostTerminal terminal(session, {"--safe"});
+        ASSERT_TRUE(terminal.awaitPrompt());
+        terminal.type(setInSuite("2Startup", lispFixture("good.lsp")) + "\r");
+        terminal.type(setInSuite("NumStartup", "2") + "\rVERSION\r");
+        ASSERT_TRUE(terminal.shows("\nTessel R21")) << terminal.screen();
+        ASSERT_EQ(kill(terminal.process(), SIGKILL), 0);
+        EXPECT_EQ(terminal.waitForEnd(), -SIGKILL);
+        fs::remove(beside("-shm"));
+    }
+
+    // As a session leaves it that is killed when it has written a part of this.
+    void leaveHalfWritten(const char* sql)
+    {
+        sqlite3* database = nullptr;
+        ASSERT_EQ(sqlite3_open(file().c_str(), &database), SQLITE_OK);
+        ASSERT_EQ(sqlite3_exec(database, sql, nullptr, nullptr, nullptr), SQLITE_OK);
+        ASSERT_EQ(sqlite3_db_cacheflush(database), SQLITE_OK);
+        fs::copy_file(file(), beside(".killed"));
+        fs::copy_file(beside("-journal"), beside(".killed-journal"));
+        sqlite3_close(database);
+        fs::rename(beside(".killed"), file());
+        fs::rename(beside(".killed-journal"), beside("-journal"));
+    }
+
     // Nothing else is said of the registry, and the Suite is there.
     void expectReadAndTold(const std::string& reason, const std::string& help)
     {
         const auto result = session.run({"VERSION"});
         EXPECT_EQ(result.exitStatus, 0);
         EXPECT_THAT(result.output,
-                    AllOf(HasSubstr("Nothing can be stored in the registry " + file().string() + ": " + reason +
-                                    ". What is stored there is used. " + help + "\n"),
-                          HasSubstr("Good.zmb: message 1\ngood.lsp: loaded\n")));
-        EXPECT_EQ(timesIn(file().string() + " ", result.output) + timesIn(file().string() + ":", result.output),
-                  1u)
+                    AllOf(HasSubstr("Nothing can be stored in the registry " + file().string() + ": " +
+                                    reason + ". What is stored there is used. " + help + "\n"),
+                          HasSubstr(kSuiteIsThere)));
+        EXPECT_EQ(
+            timesIn(file().string() + " ", result.output) + timesIn(file().string() + ":", result.output), 1u)
             << result.output;
     }
 
@@ -73,12 +104,16 @@ protected:
     {
         const auto result = session.run({"VERSION"});
         EXPECT_EQ(result.exitStatus, 0);
-        EXPECT_THAT(result.output, HasSubstr("The registry " + file().string() + " cannot be used: " + reason));
+        EXPECT_THAT(result.output,
+                    HasSubstr("The registry " + file().string() + " cannot be used: " + reason));
     }
 
     HostSession session;
 };
 
+constexpr char kFolder[] = "its folder may not be written";
+constexpr char kGrant[] =
+    "Give yourself the right to read and write the file and its folder, and start Tessel again.";
 constexpr char kMakeRoom[] = "Make room on the disk, and start Tessel again.";
 constexpr char kLiftLimit[] = "Lift the limit on the size of files, and start Tessel again.";
 } // namespace
@@ -101,14 +136,12 @@ TEST_F(UnwritableStore, WhereFilesMayNotGrowNamesThatReason)
 
 TEST_F(UnwritableStore, InAFolderThatMayNotBeWrittenNamesThatReason)
 {
-    const std::string help =
-        "Give yourself the right to read and write the file and its folder, and start Tessel again.";
     giveRights(session.profile(), 0555);
-    expectReadAndTold("its folder may not be written", help);
+    expectReadAndTold(kFolder, kGrant);
     giveRights(session.profile(), 0700);
     useOldJournal();
     giveRights(session.profile(), 0555);
-    expectReadAndTold("its folder may not be written", help);
+    expectReadAndTold(kFolder, kGrant);
 }
 
 TEST_F(UnwritableStore, WithAFolderInTheWayOfAJournalNamesIt)
@@ -120,7 +153,8 @@ TEST_F(UnwritableStore, WithAFolderInTheWayOfAJournalNamesIt)
         {
             if (!isEmpty)
                 session.folder().write("profile/registry.db" + std::string(ending) + "/in the way", "");
-            expectReadAndTold("what stands at " + beside(ending).string() + " is in its way: it is a folder, not a file",
+            expectReadAndTold("what stands at " + beside(ending).string() +
+                                  " is in its way: it is a folder, not a file",
                               "Remove that, and start Tessel again.");
         }
         fs::remove_all(beside(ending));
@@ -146,8 +180,9 @@ TEST_F(UnwritableStore, ThatCannotBeMadeIsNotCalledLeftAsItIs)
     fs::remove(file());
     fs::remove(beside(".sound"));
     giveRights(session.profile(), 0555);
-    expectRefused("it cannot be made: Permission denied. Nothing will be stored. Make sure that files can be made "
-                  "and opened there, and start Tessel again.\n");
+    expectRefused(
+        "it cannot be made: Permission denied. Nothing will be stored. Make sure that files can be made "
+        "and opened there, and start Tessel again.\n");
 }
 
 TEST_F(UnwritableStore, TellsAFailedWriteOnceInWords)
@@ -157,11 +192,12 @@ TEST_F(UnwritableStore, TellsAFailedWriteOnceInWords)
     const std::string tooBig = "REGISTRY SET Software\\Trial big " + std::string(100'000, 'x');
     const auto result = session.run({tooBig});
     EXPECT_EQ(result.exitStatus, 1);
-    EXPECT_THAT(result.output,
-                testing::EndsWith("xx\nThe registry key \"Software\\Trial\" cannot be written. The registry " +
-                                  file().string() +
-                                  " could not be written: File too large. What was stored before is unchanged. "
-                                  "Lift the limit on the size of files, and try again.\n"));
+    EXPECT_THAT(
+        result.output,
+        testing::EndsWith("xx\nThe registry key \"Software\\Trial\" cannot be written. The registry " +
+                          file().string() +
+                          " could not be written: File too large. What was stored before is unchanged. "
+                          "Lift the limit on the size of files, and try again.\n"));
 }
 
 TEST_F(UnwritableStore, TellsThatNoRoomIsLeftForAWrite)
@@ -179,20 +215,31 @@ TEST_F(UnwritableStore, TellsThatNoRoomIsLeftForAWrite)
     }
 }
 
-TEST_F(UnwritableStore, ReadsALogThatAKilledSessionHasLeftInAFolderThatMayNotBeWritten)
+TEST_F(UnwritableStore, ReadsALogThatAKilledSessionHasLeft)
 {
-    sqlite3* database = nullptr;
-    ASSERT_EQ(sqlite3_open(file().c_str(), &database), SQLITE_OK);
-    ASSERT_EQ(sqlite3_exec(database, "PRAGMA journal_mode=WAL; PRAGMA wal_autocheckpoint=0; BEGIN;"
-                                     "UPDATE value SET data=data WHERE name='NumStartup'; COMMIT",
-                           nullptr, nullptr, nullptr),
-              SQLITE_OK);
-    fs::copy_file(file(), beside(".killed"));
-    fs::copy_file(beside("-wal"), beside(".killed-wal"));
-    sqlite3_close(database);
-    fs::rename(beside(".killed"), file());
-    fs::rename(beside(".killed-wal"), beside("-wal"));
+    leaveLog();
     giveRights(session.profile(), 0555);
-    expectReadAndTold("its folder may not be written",
-                      "Give yourself the right to read and write the file and its folder, and start Tessel again.");
+    expectReadAndTold(kFolder, kGrant);
+}
+
+TEST_F(UnwritableStore, ReadsALogThatAKilledSessionHasLeftWhereTheFileMayNotBeWrittenEither)
+{
+    leaveLog();
+    const std::string log = contentOf(beside("-wal"));
+    giveRights(file(), 0400);
+    giveRights(session.profile(), 0555);
+    const auto result = session.run({"VERSION"});
+    EXPECT_THAT(result.output, AllOf(HasSubstr("registry.db may only be read: what is stored there is used"),
+                                     HasSubstr(kSuiteIsThere)));
+    EXPECT_EQ(contentOf(beside("-wal")), log);
+}
+
+// What it had not finished is undone, also where that cannot be written down.
+TEST_F(UnwritableStore, ReadsWhatWasStoredBeforeASessionWasKilledInTheMidstOfWriting)
+{
+    useOldJournal();
+    leaveHalfWritten("BEGIN; UPDATE value SET data='/half of it'");
+    ASSERT_NE(contentOf(file()).find("/half of it"), std::string::npos);
+    giveRights(session.profile(), 0555);
+    expectReadAndTold(kFolder, kGrant);
 }
