@@ -8,9 +8,11 @@
 #include <map>
 
 #include "tests/e2e/HostProcess.h"
+#include "tests/support/Content.h"
 
 using testing::AnyOf;
 using testing::HasSubstr;
+using testing::Not;
 
 namespace
 {
@@ -99,14 +101,37 @@ protected:
         putBack();
     }
 
+    HostSession mSession;
+
 private:
     static constexpr auto kAll = std::filesystem::copy_options::recursive;
-
-    HostSession mSession;
 };
 
 class FailingCalls : public Faults, public testing::TestWithParam<std::string>
 {
+};
+
+// Of the file that becomes the registry's copy.
+class FailingParts : public Faults, public testing::Test
+{
+protected:
+    std::string keptCopy() const { return contentOf(mSession.profile() / "registry.db.sound"); }
+
+    // The lists and their copy are stored, whatever happens to the file on its way.
+    void expectCopyAfter(const char* variable, const char* value, const std::string& fault)
+    {
+        const std::string before = keptCopy();
+        mSession.set(variable, value);
+        const auto result = runWith(fault);
+        mSession.set(variable, "");
+        EXPECT_FALSE(result.timedOut);
+        EXPECT_EQ(result.exitStatus, 0) << result.output;
+        EXPECT_THAT(result.output, Not(HasSubstr("egistry")));
+        EXPECT_TRUE(keptCopy() != before) << "the old copy stands there";
+        EXPECT_EQ(storedWriting(), 3);
+        for (const auto& entry : std::filesystem::directory_iterator(mSession.profile()))
+            EXPECT_THAT(entry.path().filename().string(), Not(HasSubstr(".part-")));
+    }
 };
 
 class FailingLocks : public Faults, public testing::Test
@@ -131,6 +156,16 @@ TEST_P(FailingCalls, LoseNothingAndAreTold)
 TEST_F(FailingLocks, EndTheSessionsReadingSoon)
 {
     expectNothingLost("fcntl 40 ever " + std::to_string(ENOLCK));
+}
+
+TEST_F(FailingParts, AreNotMadeForEverWhereTheSystemCannotSayWhatTheyAre)
+{
+    expectCopyAfter("MODRIG_FAULT_OF", "/.part-", "fstat 1 ever");
+}
+
+TEST_F(FailingParts, AreMadeAgainWhenSomebodyHasTakenThemForLeftOvers)
+{
+    expectCopyAfter("MODRIG_FAULT_TAKEN", "1", "");
 }
 
 INSTANTIATE_TEST_SUITE_P(OfEachKind, FailingCalls,

@@ -4,6 +4,8 @@
 //     MODRIG_FAULT="pwrite 3 once"     the third call fails; "ever": that one and all after it; a number
 //     after
 //                                      that is the error, in place of the usual one
+//     MODRIG_FAULT_OF=/.part-          only calls on files whose path holds this fail
+//     MODRIG_FAULT_TAKEN=1             the first file of a name of its own is removed before it is locked
 //     MODRIG_FAULT_COUNTS=file         tells at the end how many calls of each kind there were
 //     MODRIG_FAULT_NETWORK=1           every folder lies on another machine
 //     MODRIG_FAULT_DELAY=500           every read at a place takes so many microseconds more
@@ -22,6 +24,7 @@
 
 #include <dlfcn.h>
 #include <fcntl.h>
+#include <sys/file.h>
 #include <sys/mman.h>
 #include <sys/stat.h>
 #include <sys/vfs.h>
@@ -80,18 +83,29 @@ Function* next(const char* name)
 
 bool isMeant(const char* path)
 {
+    static const char* const only = std::getenv("MODRIG_FAULT_OF");
     const std::string_view file = path ? path : "";
+    if (only && file.find(only) == file.npos)
+        return false;
     return file.find(kFile) != file.npos || file.find(kPartOfIt) != file.npos;
 }
 
+struct PathOf
+{
+    explicit PathOf(int file)
+    {
+        char link[64];
+        std::snprintf(link, sizeof link, "/proc/self/fd/%d", file);
+        const ssize_t length = readlink(link, text, sizeof text - 1);
+        text[length < 0 ? 0 : length] = '\0';
+    }
+
+    char text[kLongestPath];
+};
+
 bool isMeant(int file)
 {
-    char link[64];
-    char path[kLongestPath];
-    std::snprintf(link, sizeof link, "/proc/self/fd/%d", file);
-    const ssize_t length = readlink(link, path, sizeof path - 1);
-    path[length < 0 ? 0 : length] = '\0';
-    return isMeant(path);
+    return isMeant(PathOf(file).text);
 }
 
 struct Fault
@@ -336,6 +350,15 @@ INTERPOSED int mkostemp(char* name, int flags)
     return fails(kMkostemp, static_cast<const char*>(name))
                ? -1
                : next<decltype(mkostemp)>("mkostemp")(name, flags);
+}
+
+INTERPOSED int flock(int file, int operation) noexcept
+{
+    static std::atomic<bool> takesOne = std::getenv("MODRIG_FAULT_TAKEN") != nullptr;
+    const PathOf path(file);
+    if (std::string_view(path.text).find(kPartOfIt) != std::string_view::npos && takesOne.exchange(false))
+        next<int(const char*)>("unlink")(path.text);
+    return next<int(int, int)>("flock")(file, operation);
 }
 
 INTERPOSED int statfs(const char* path, struct statfs* system) noexcept
