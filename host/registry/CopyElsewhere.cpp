@@ -40,8 +40,8 @@ std::error_code copyPart(const std::string& from, const std::string& to)
     if (!std::filesystem::is_regular_file(from, failed))
         return {}; // without it the rest is all there is
     if (std::filesystem::copy_file(from, to, failed))
-        std::filesystem::permissions(to, std::filesystem::perms::owner_read | std::filesystem::perms::owner_write,
-                                     failed);
+        std::filesystem::permissions(
+            to, std::filesystem::perms::owner_read | std::filesystem::perms::owner_write, failed);
     return failed;
 }
 } // namespace

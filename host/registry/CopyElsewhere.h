@@ -1,5 +1,5 @@
-// A registry's file and its journals in a folder of their own, where the store may bring them together: beside
-// the file it may not write, or not lock. Used by the Registry's own files alone.
+// A registry's file and its journals in a folder of their own, where the store may bring them together:
+// beside the file it may not write, or not lock. Used by the Registry's own files alone.
 #pragma once
 
 #include <filesystem>
@@ -18,8 +18,8 @@ public:
     CopyElsewhere(const CopyElsewhere&) = delete;
     CopyElsewhere& operator=(const CopyElsewhere&) = delete;
 
-    // Fails where a copy cannot be made, or somebody wrote meanwhile: then it would be half of this and half of
-    // that. The end of a sentence.
+    // Fails where a copy cannot be made, or somebody wrote meanwhile: then it would be half of this and half
+    // of that. The end of a sentence.
     const Result<>& made() const { return mMade; }
 
     std::filesystem::path file() const { return mFolder / "copy.db"; }
