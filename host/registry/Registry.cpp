@@ -414,21 +414,22 @@ void Registry::failRead(const std::wstring& words, int code)
 {
     mLookedAt = false;
     mReadFailed = true;
-    if (!isDamage(code))
-        static_cast<void>(giveUp(unreadable(words, whatHelpsAtStart(code))));
-    else if (std::exchange(mDamaged, true))
-        undoCommand();
-    else
+    if (isDamage(code) && std::exchange(mDamaged, true))
     {
-        mCanStore = unreadable(words, helpAgainstDamage(mFile)); // whatever else there is to say of it
-        static_cast<void>(giveUp(mCanStore.failure()));
+        undoCommand();
+        return;
     }
+    const Failure failure = unreadable({words, code});
+    if (isDamage(code))
+        mCanStore = failure; // whatever else there is to say of it
+    static_cast<void>(giveUp(failure));
 }
 
-Failure Registry::unreadable(const std::wstring& words, const std::wstring& help) const
+Failure Registry::unreadable(const Failure& found)
 {
-    return {L"The registry " + toWide(mFile.string()) + L" could not be read: " + words +
-                L". Nothing more is stored in this session, so that nothing is lost. " + help,
+    return {L"The registry " + toWide(mFile.string()) + L" could not be read: " + found.sentence +
+                L". Nothing more is stored in this session, so that nothing is lost. " +
+                whatHelps(found.code),
             ERROR_READ_FAULT};
 }
 

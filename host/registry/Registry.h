@@ -169,7 +169,8 @@ private:
     void lookAtAll(int version);
     void renewCopy(bool changed);
     Failure whatIsWrong(const Failure& found);
-    Failure unreadable(const std::wstring& words, const std::wstring& help) const;
+    Failure unreadable(const Failure& found);
+    std::wstring whatHelps(int code);
     Result<> checkIsDamaged() const;
     Result<std::wstring> replaceWith(Result<std::filesystem::path> (*replace)(const std::filesystem::path&));
     bool isFollowed(std::wstring_view path, Key from) const;
@@ -209,6 +210,7 @@ private:
     bool mLookedAt = false;  // the file is known to be sound
     bool mHasStored = false; // since the copy was made
     bool mDamaged = false;
+    bool mUnreadable = false;
     bool mReadFailed = false; // in the running command
     bool mCannotLock = false; // for as long as the session lasts: the file system refuses
     std::unique_ptr<Statements> mStatements;

@@ -37,10 +37,18 @@ bool isMarkedReadOnly(const std::filesystem::path& file)
     return stat(file.c_str(), &status) == 0 && (status.st_mode & (S_IWUSR | S_IWGRP | S_IWOTH)) == 0;
 }
 
+bool isMissing(int error)
+{
+    return error == ENOENT || error == ENOTDIR;
+}
+
+// Where the system cannot say, it does.
 bool holdsSomething(const std::filesystem::path& file)
 {
     struct stat status = {};
-    return stat(file.c_str(), &status) == 0 && (!S_ISREG(status.st_mode) || status.st_size > 0);
+    if (stat(file.c_str(), &status) != 0)
+        return !isMissing(errno);
+    return !S_ISREG(status.st_mode) || status.st_size > 0;
 }
 
 // Opening what is no file at all would fail in words that do not say so, or wait. What cannot be asked for is
@@ -49,7 +57,7 @@ Result<> checkKind(const std::filesystem::path& file)
 {
     struct stat status = {};
     if (stat(file.c_str(), &status) != 0)
-        return errno == ENOENT || errno == ENOTDIR ? Result<>() : fileFailure(errno);
+        return isMissing(errno) ? Result<>() : fileFailure(errno);
     const auto ordinary = checkOrdinary(status);
     return ordinary ? ordinary : Failure{ordinary.sentence(), SQLITE_NOTADB};
 }
@@ -134,7 +142,7 @@ void Registry::refuse(const Result<>& reason)
     mCanStore = Failure{L"The registry " + toWide(mFile.string()) + L" cannot be used: " + reason.sentence() +
                             (fileExists(mFile) ? L". It was left as it is, and nothing will be stored. "
                                                : L". Nothing will be stored. ") +
-                            (mDamaged ? helpAgainstDamage(mFile) : whatHelpsAtStart(reason.code())),
+                            whatHelps(reason.code()),
                         ERROR_ACCESS_DENIED};
 }
 
@@ -151,7 +159,7 @@ void Registry::storeNothing(const Failure& reason)
 // once is not made again, for then its copy would be the next to go.
 Result<> Registry::makeMissingFile()
 {
-    const bool hasCopy = fileExists(soundCopyOf(mFile));
+    const bool hasCopy = holdsSomething(soundCopyOf(mFile));
     if (holdsSomething(mFile))
         return {};
     if (hasCopy)
@@ -279,6 +287,7 @@ void Registry::forgetAll()
     mHandles.clear();
     mOpenedForWriting.clear();
     mDamaged = false;
+    mUnreadable = false;
     mLookedAt = false;
 }
 

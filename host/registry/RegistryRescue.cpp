@@ -28,11 +28,20 @@ bool isThere(const std::filesystem::path& file)
 Failure Registry::whatIsWrong(const Failure& found)
 {
     if (!isDamage(found.code))
-        return unreadable(found.sentence, whatHelpsAtStart(found.code));
+        return unreadable(found);
     mDamaged = true;
     return {L"The registry " + toWide(mFile.string()) + L" is damaged: " + found.sentence +
                 L". It was left as it is, and nothing will be stored. " + helpAgainstDamage(mFile),
             ERROR_ACCESS_DENIED};
+}
+
+// A disk that does not answer may do so the next time.
+std::wstring Registry::whatHelps(int code)
+{
+    mUnreadable = isUnreadable(code);
+    if (mUnreadable)
+        return whatHelpsAtStart(code) + L" If that does not help: " + helpAgainstDamage(mFile);
+    return isDamage(code) ? helpAgainstDamage(mFile) : whatHelpsAtStart(code);
 }
 
 // A session that ended in good order has made its copy; one that did not has left the file newer than that.
@@ -60,7 +69,7 @@ Result<> Registry::keepCopy()
 
 Result<> Registry::checkIsDamaged() const
 {
-    if (mDamaged)
+    if (mDamaged || mUnreadable)
         return {};
     return Failure{L"The registry " + toWide(mFile.string()) +
                    L" is not known to be damaged; it was left as it is."};

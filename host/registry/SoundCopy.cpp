@@ -23,6 +23,7 @@ namespace tessel
 {
 namespace
 {
+constexpr int kNoCopy = SQLITE_NOTFOUND;
 constexpr std::array kJournals = {"-wal", "-journal"};
 
 struct CloseDatabase
@@ -58,7 +59,7 @@ Result<Database> openCopy(const std::filesystem::path& copy)
 {
     struct stat status = {};
     if (stat(copy.c_str(), &status) != 0)
-        return fileFailure(errno);
+        return errno == ENOENT ? Failure{L"there is none", kNoCopy} : fileFailure(errno);
     if (const auto ordinary = checkOrdinary(status); !ordinary)
         return ordinary.failure();
     sqlite3* opened = nullptr;
@@ -161,11 +162,10 @@ std::wstring timeOfCopy(const std::filesystem::path& file)
 
 std::wstring helpAgainstDamage(const std::filesystem::path& file)
 {
-    const std::wstring time = timeOfCopy(file);
     const auto sound = checkSoundCopy(file);
     if (sound)
-        return L"REGISTRY RESTORE puts back the copy of " + time + L".";
-    if (time.empty())
+        return L"REGISTRY RESTORE puts back the copy of " + timeOfCopy(file) + L".";
+    if (sound.code() == kNoCopy)
         return L"There is no copy of an earlier state. REGISTRY RESET sets it aside and begins with an empty "
                L"one.";
     return L"Its copy " + toWide(soundCopyOf(file).string()) + L" is of no use: " + sound.sentence() +

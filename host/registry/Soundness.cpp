@@ -14,12 +14,22 @@ constexpr int kDeepestKey = 100; // of a path that is told
 // it.
 constexpr std::int64_t kPagesInATenthOfAStart = 500;
 
+// Above it stands which of the store's databases is meant.
+std::wstring lastLineOf(const std::wstring& text)
+{
+    return text.substr(text.find_last_of(L'\n') + 1);
+}
+
 Result<> checkPages(sqlite3* database)
 {
     const auto said = firstText(database, "PRAGMA integrity_check(1)");
     if (!said)
         return said.failure();
-    return *said == L"ok" ? Result<>() : Failure{*said, SQLITE_CORRUPT};
+    if (*said == L"ok")
+        return {};
+    // Pages that the disk does not give fail the check too.
+    const Failure reason = storeFailure(database, SQLITE_CORRUPT);
+    return isDamage(reason.code) ? Failure{lastLineOf(*said), SQLITE_CORRUPT} : reason;
 }
 
 // The names of the key and of those above it. Parents may go round in a file that is damaged.

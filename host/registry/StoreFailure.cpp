@@ -58,6 +58,14 @@ int codeOf(int systemError)
     }
 }
 
+// The store takes a disk that does not answer for a file that is damaged.
+bool couldNotBeRead(sqlite3* database)
+{
+    sqlite3_file* file = nullptr;
+    sqlite3_file_control(database, "main", SQLITE_FCNTL_FILE_POINTER, &file);
+    return lastErrorOf(file) == EIO;
+}
+
 std::wstring wordsOf(sqlite3* database, int status)
 {
     const bool hasWords = kindOf(sqlite3_errcode(database)) == kindOf(status);
@@ -69,6 +77,9 @@ Failure systemsFailure(sqlite3* database, int status)
     const int error = systemErrorOf(database, status);
     if (error == 0)
         return {wordsOf(database, status), status};
+    // Where a file can be made neither for writing nor for reading, what it says of the second is no reason.
+    if (error == ENOENT)
+        return {L"a file beside it cannot be made", status};
     const int code = codeOf(error);
     return {toWide(std::strerror(error)), code == SQLITE_CANTOPEN ? status : code};
 }
@@ -118,6 +129,10 @@ Failure storeFailure(sqlite3* database, int status)
     case SQLITE_IOERR:
     case SQLITE_CANTOPEN:
         return systemsFailure(database, status);
+    case SQLITE_CORRUPT:
+        if (couldNotBeRead(database))
+            return {toWide(std::strerror(EIO)), SQLITE_IOERR};
+        return {wordsOf(database, status), status};
     default:
         return {wordsOf(database, status), status};
     }
@@ -131,6 +146,11 @@ Failure fileFailure(int systemError)
 bool isDamage(int code)
 {
     return kindOf(code) == SQLITE_CORRUPT || kindOf(code) == SQLITE_NOTADB;
+}
+
+bool isUnreadable(int code)
+{
+    return kindOf(code) == SQLITE_IOERR;
 }
 
 bool isRefusal(int code)

@@ -20,6 +20,9 @@ Failure fileFailure(int systemError);
 
 bool isDamage(int code);
 
+// What the disk did not give back; it may do so another time.
+bool isUnreadable(int code);
+
 // What may be so because nothing can be written where the file is.
 bool isRefusal(int code);
 

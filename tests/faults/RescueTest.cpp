@@ -173,6 +173,65 @@ TEST_F(Rescue, LeavesAFileOfAnotherProgramToAPerson)
     EXPECT_EQ(contentOf(file()), foreign);
 }
 
+TEST_F(Rescue, LeavesARegistryOfANewerTesselToIt)
+{
+    fs::remove(beside(".sound"));
+    changeByte(file(), kVersionAt, '\3');
+    EXPECT_THAT(
+        said(),
+        HasSubstr("cannot be used: it was written by a newer Tessel. It was left as it is, and nothing "
+                  "will be stored. Use that Tessel, or name another folder by --profile-dir, and start "
+                  "Tessel again.\n"));
+}
+
+// Every read in turn, from the first page to the look at all of them.
+TEST_F(Rescue, DoesNotCallADiskThatDoesNotAnswerDamage)
+{
+    session.set("LD_PRELOAD", FAULTY_CALLS);
+    int told = 0;
+    for (int read = 1; read <= 12; ++read)
+    {
+        session.set("MODRIG_FAULT", "pread " + std::to_string(read) + " once");
+        const std::string output = session.run({kGet}).output;
+        EXPECT_THAT(output, AllOf(Not(HasSubstr("damaged")), Not(HasSubstr("malformed")),
+                                  Not(HasSubstr("error code"))))
+            << read;
+        told += output.find(": Input/output error. ") != output.npos &&
+                output.find("If that does not help: REGISTRY RESTORE puts back the copy of 2") != output.npos;
+    }
+    EXPECT_GT(told, 5);
+}
+
+TEST_F(Rescue, RestoresWhatADiskDoesNotGiveBack)
+{
+    session.set("LD_PRELOAD", FAULTY_CALLS);
+    session.set("MODRIG_FAULT", "pread 5 once");
+    EXPECT_THAT(session.run({"REGISTRY RESTORE", kGet}).output,
+                AllOf(HasSubstr("was restored from the copy of 2"), HasSubstr("\nfirst\n")));
+}
+
+TEST_F(Rescue, DoesNotCallMissingWhatItMayNotAskFor)
+{
+    session.set("LD_PRELOAD", FAULTY_CALLS);
+    for (int call = 1; call <= 12; ++call)
+        for (const char* duration : {" once", " ever"})
+        {
+            session.set("MODRIG_FAULT", "stat " + std::to_string(call) + duration);
+            EXPECT_THAT(session.run({kGet}).output,
+                        AllOf(Not(HasSubstr("missing")), Not(HasSubstr("There is no copy"))))
+                << call << duration;
+        }
+}
+
+TEST_F(Rescue, TellsDamageOfPagesInOneLine)
+{
+    std::string bytes = contentOf(file());
+    bytes.replace(bytes.size() - 4096, 4096, std::string(4096, '\xA5'));
+    session.folder().write("profile/registry.db", bytes);
+    EXPECT_THAT(said(), AllOf(ContainsRegex("registry.db is damaged: [^\n]*\\. It was left as it is"),
+                              Not(HasSubstr("***"))));
+}
+
 TEST_F(Rescue, CallsAKeyDamagedWhoseRowsAre)
 {
     const std::string thatKey = "\nThe registry key \"Software\\Trial\" cannot be read";

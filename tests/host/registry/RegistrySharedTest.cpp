@@ -298,3 +298,29 @@ TEST(SharedRegistry, WaitsForAnotherCommandAsLongAsItIsTold)
     EXPECT_GE(waited, kShortTimeout);
     EXPECT_LT(waited, Registry::kBusyTimeout);
 }
+
+TEST(SharedRegistry, WaitsInEachCommandAgain)
+{
+    RegistryHost host(kShortTimeout);
+    Registry other(host.file());
+    ASSERT_TRUE(other.write(L"A", L"name", L"other"));
+    for (int command = 0; command < 3; ++command)
+    {
+        const auto begin = std::chrono::steady_clock::now();
+        EXPECT_FALSE(host.registry().write(L"A", L"name", L"mine"));
+        EXPECT_GE(std::chrono::steady_clock::now() - begin, kShortTimeout) << command;
+        EXPECT_FALSE(host.registry().endOfCommand());
+    }
+}
+
+// A key that was pressed at the start is no reason to lose what is stored at the end.
+TEST(SharedRegistry, WaitsInASessionWhateverSomebodyWishedAtItsStart)
+{
+    const TemporaryFolder folder;
+    Registry registry(folder / "registry.db", kShortTimeout, {}, [] { return true; });
+    Registry other(folder / "registry.db");
+    ASSERT_TRUE(other.write(L"A", L"name", L"other"));
+    const auto begin = std::chrono::steady_clock::now();
+    EXPECT_FALSE(registry.write(L"A", L"name", L"mine"));
+    EXPECT_GE(std::chrono::steady_clock::now() - begin, kShortTimeout);
+}
