@@ -414,7 +414,8 @@ void Registry::failRead(const std::wstring& words, int code)
 {
     mLookedAt = false;
     mReadFailed = true;
-    if (isDamage(code) && std::exchange(mDamaged, true))
+    const bool isKnown = isDamage(code) ? std::exchange(mDamaged, true) : !mCommand && !mCanStore;
+    if (isKnown)
     {
         undoCommand();
         return;

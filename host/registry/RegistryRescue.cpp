@@ -38,10 +38,12 @@ Failure Registry::whatIsWrong(const Failure& found)
 // A disk that does not answer may do so the next time.
 std::wstring Registry::whatHelps(int code)
 {
-    mUnreadable = isUnreadable(code);
-    if (mUnreadable)
-        return whatHelpsAtStart(code) + L" If that does not help: " + helpAgainstDamage(mFile);
-    return isDamage(code) ? helpAgainstDamage(mFile) : whatHelpsAtStart(code);
+    if (isDamage(code))
+        return helpAgainstDamage(mFile);
+    if (!isUnreadable(code))
+        return whatHelpsAtStart(code);
+    mUnreadable = true;
+    return whatHelpsAtStart(code) + L" If that does not help: " + helpAgainstDamage(mFile);
 }
 
 // A session that ended in good order has made its copy; one that did not has left the file newer than that.
