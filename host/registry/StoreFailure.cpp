@@ -1,8 +1,8 @@
 #include "host/registry/StoreFailure.h"
 
 #include <cerrno>
-#include <cstring>
 
+#include "host/platform/SystemFailure.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -81,7 +81,7 @@ Failure systemsFailure(sqlite3* database, int status)
     if (error == ENOENT)
         return {L"a file beside it cannot be made", status};
     const int code = codeOf(error);
-    return {toWide(std::strerror(error)), code == SQLITE_CANTOPEN ? status : code};
+    return {systemFailure(error).sentence, code == SQLITE_CANTOPEN ? status : code};
 }
 
 std::wstring whatHelpsFirst(int code)
@@ -119,7 +119,7 @@ Failure storeFailure(sqlite3* database, int status)
     case SQLITE_BUSY:
         return {L"another program holds it", status};
     case SQLITE_FULL:
-        return {toWide(std::strerror(ENOSPC)), status};
+        return {systemFailure(ENOSPC).sentence, status};
     case SQLITE_READONLY:
         return {extended == SQLITE_READONLY_DIRECTORY ? L"its folder may not be written"
                                                       : L"it may not be written",
@@ -131,7 +131,7 @@ Failure storeFailure(sqlite3* database, int status)
         return systemsFailure(database, status);
     case SQLITE_CORRUPT:
         if (couldNotBeRead(database))
-            return {toWide(std::strerror(EIO)), SQLITE_IOERR};
+            return {systemFailure(EIO).sentence, SQLITE_IOERR};
         return {wordsOf(database, status), status};
     default:
         return {wordsOf(database, status), status};
@@ -140,7 +140,7 @@ Failure storeFailure(sqlite3* database, int status)
 
 Failure fileFailure(int systemError)
 {
-    return {toWide(std::strerror(systemError)), codeOf(systemError)};
+    return {systemFailure(systemError).sentence, codeOf(systemError)};
 }
 
 bool isDamage(int code)

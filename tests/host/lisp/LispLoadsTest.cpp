@@ -132,5 +132,6 @@ TEST_F(LispLoads, BlameTheFileThatFillsTheStack)
 {
     const auto path = write("a.lsp", "(defun endless (n) (+ 1 (endless n)))\n(endless 1)");
     fail(load(path));
-    EXPECT_THAT(failed(), ElementsAre(Pair(path, "line 2: stack overflow: the recursion is endless or too deep.")));
+    EXPECT_THAT(failed(),
+                ElementsAre(Pair(path, "line 2: stack overflow: the recursion is endless or too deep.")));
 }
