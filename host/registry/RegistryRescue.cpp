@@ -17,7 +17,7 @@ bool isNewer(const std::filesystem::path& file, const std::filesystem::path& oth
     return !missing && time > std::filesystem::last_write_time(other, missing) && !missing;
 }
 
-bool isThere(const std::filesystem::path& file)
+bool standsThere(const std::filesystem::path& file)
 {
     std::error_code missing;
     return std::filesystem::exists(file, missing);
@@ -54,7 +54,7 @@ void Registry::renewCopy(bool changed)
     const auto copy = soundCopyOf(mFile);
     mHasStored =
         changed ||
-        (mLeftOpen && (!isThere(copy) || isNewer(mFile, copy) || isNewer(mFile.string() + "-wal", copy)));
+        (mLeftOpen && (!standsThere(copy) || isNewer(mFile, copy) || isNewer(mFile.string() + "-wal", copy)));
     static_cast<void>(keepCopy()); // the session's end makes it, and tells
 }
 
