@@ -1,10 +1,12 @@
 // REGISTRY: looks into the registry and changes it, so that scripts can prepare and inspect what applications
 // keep there.
+#include <filesystem>
 #include <string>
 
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
+#include "host/app/RegistryTransfer.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -96,18 +98,35 @@ Result<> remove(Parts& parts, const std::wstring& path, const Arguments& argumen
     return done ? done : notWritten(registry, path);
 }
 
+Result<> tell(Parts& parts, const Result<std::wstring>& done)
+{
+    return done ? succeed(parts, *done) : done.failure();
+}
+
+bool isUtf8(const std::wstring& word)
+{
+    return equalIgnoringCase(word, L"UTF8") || equalIgnoringCase(word, L"UTF-8");
+}
+
+Result<> exportTo(Parts& parts, const std::wstring& path, const Arguments& arguments)
+{
+    const auto form = arguments.size() > 3 ? RegistryTextForm::kUtf8 : RegistryTextForm::kUtf16;
+    std::error_code currentFolderIsGone;
+    return tell(parts, exportRegistry(
+                           *parts.registry, path,
+                           std::filesystem::absolute(toPath(at(arguments, 2)), currentFolderIsGone), form));
+}
+
 // What is damaged gives way to the copy of what it held.
 Result<> restore(Parts& parts)
 {
-    const auto restored = parts.registry->restoreCopy();
-    return restored ? succeed(parts, *restored) : restored.failure();
+    return tell(parts, parts.registry->restoreCopy());
 }
 
 // What is damaged and has no sound copy gives way to an empty one.
 Result<> reset(Parts& parts)
 {
-    const auto begun = parts.registry->beginEmpty();
-    return begun ? succeed(parts, *begun) : begun.failure();
+    return tell(parts, parts.registry->beginEmpty());
 }
 
 Result<> registryCommand(Parts& parts, const Arguments& arguments)
@@ -122,6 +141,11 @@ Result<> registryCommand(Parts& parts, const Arguments& arguments)
         return set(parts, path, arguments);
     if (equalIgnoringCase(action, L"DELETE") && (arguments.size() == 2 || arguments.size() == 3))
         return remove(parts, path, arguments);
+    if (equalIgnoringCase(action, L"EXPORT") &&
+        (arguments.size() == 3 || (arguments.size() == 4 && isUtf8(at(arguments, 3)))))
+        return exportTo(parts, path, arguments);
+    if (equalIgnoringCase(action, L"IMPORT") && arguments.size() == 2)
+        return tell(parts, importRegistry(*parts.registry, toPath(fullPath(parts, path))));
     if (equalIgnoringCase(action, L"RESTORE") && arguments.size() == 1)
         return restore(parts);
     if (equalIgnoringCase(action, L"RESET") && arguments.size() == 1)
@@ -134,9 +158,11 @@ void addRegistryCommands(Parts& parts)
 {
     addBuiltIn(
         parts,
-        {L"Settings", kCommand, L"LIST|GET|SET|DELETE key [name] [data] | RESTORE | RESET",
-         L"Works on the registry, below HKEY_CURRENT_USER; of a damaged one, puts back the copy or begins "
-         L"with nothing"},
+        {L"Settings", kCommand,
+         L"LIST|GET|SET|DELETE key [name] [data] | EXPORT key file [UTF8] | IMPORT file | RESTORE | RESET",
+         L"Works on the registry, below HKEY_CURRENT_USER; writes keys to registry files and takes such "
+         L"files in; of "
+         L"a damaged registry, puts back the copy or begins with nothing"},
         registryCommand);
 }
 } // namespace tessel
