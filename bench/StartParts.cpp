@@ -10,6 +10,7 @@
 
 #include "bench/BareStore.h"
 #include "host/applications/ModuleLibrary.h"
+#include "host/registry/LayeredRegistry.h"
 #include "host/registry/Profiles.h"
 #include "host/registry/Registry.h"
 #include "host/text/CommandLine.h"
@@ -49,7 +50,8 @@ int main(int argc, char** argv)
     tessel::CommandLine commandLine([](std::string_view) {});
     const auto registryFile = std::filesystem::path(argv[1]) / "registry.db";
     tessel::Owned<tessel::Registry> registry(registryFile);
-    const tessel::Profiles profiles(*registry, tessel::kProductRegistryRoot);
+    tessel::LayeredRegistry layered(*registry);
+    const tessel::Profiles profiles(layered, tessel::kProductRegistryRoot);
     if (!registry->endOfCommand())
         return 1;
     if (argc > 4)

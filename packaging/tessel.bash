@@ -2,7 +2,7 @@
 _tessel() {
   local word=${COMP_WORDS[COMP_CWORD]} before=${COMP_WORDS[COMP_CWORD - 1]}
   case $before in
-    --profile-dir)
+    --profile-dir | --layout-dir)
       mapfile -t COMPREPLY < <(compgen -d -- "$word")
       return
       ;;
@@ -13,7 +13,7 @@ _tessel() {
     -c | --command) return ;;
   esac
   if [[ $word == -* ]]; then
-    mapfile -t COMPREPLY < <(compgen -W '--profile-dir --script -c --command --modrig --safe --help --version' -- "$word")
+    mapfile -t COMPREPLY < <(compgen -W '--profile-dir --layout-dir --script -c --command --modrig --safe --help --version' -- "$word")
   else
     mapfile -t COMPREPLY < <(
       compgen -f -X '!*.@(zmb|omp|lsp|qbc|rpk|mcp)' -- "$word"

@@ -1,6 +1,7 @@
 // REGISTRY: looks into the registry and changes it, so that scripts can prepare and inspect what applications
 // keep there.
 #include <filesystem>
+#include <optional>
 #include <string>
 
 #include "host/app/BuiltIn.h"
@@ -51,22 +52,23 @@ Failure notFound(Registry& registry, const std::wstring& path, const std::wstrin
 
 Result<> list(Parts& parts, const std::wstring& path)
 {
-    Registry& registry = *parts.registry;
+    LayeredRegistry& registry = *parts.layered;
     const auto key = registry.find(path);
     if (key == Registry::kNoKey)
-        return notFound(registry, path, L"does not exist");
+        return notFound(registry.own(), path, L"does not exist");
     for (const auto& name : registry.subKeys(key))
         sayLine(parts, L"[" + name + L"]");
     for (const auto& value : registry.values(key))
-        sayLine(parts, (value.name.empty() ? L"(unnamed)" : value.name) + L" = " + value.data);
-    if (registry.readFailed())
-        return storeFailureAt(registry, path, L"cannot be read to its end");
+        sayLine(parts, (value.name.empty() ? L"(unnamed)" : value.name) + L" = " + value.data +
+                           (value.file.empty() ? L"" : L"    (from " + toText(value.file) + L")"));
+    if (registry.own().readFailed())
+        return storeFailureAt(registry.own(), path, L"cannot be read to its end");
     return {};
 }
 
 Result<> get(Parts& parts, const std::wstring& path, const std::wstring& name)
 {
-    const auto data = parts.registry->read(path, name);
+    const auto data = parts.layered->read(path, name);
     if (!data)
         return notFound(*parts.registry, path, L"has no value \"" + name + L"\"");
     sayLine(parts, *data);
@@ -76,25 +78,36 @@ Result<> get(Parts& parts, const std::wstring& path, const std::wstring& name)
 // A key alone is made; with a name, the value is stored.
 Result<> set(Parts& parts, const std::wstring& path, const Arguments& arguments)
 {
-    Registry& registry = *parts.registry;
+    LayeredRegistry& registry = *parts.layered;
     const auto key = registry.create(path, Registry::kRoot);
     Result<> done = key ? Result<>() : key.failure();
     if (key && arguments.size() > 2)
         done = registry.writeValue(*key, at(arguments, 2), at(arguments, 3));
-    return done ? done : notWritten(registry, path);
+    return done ? done : notWritten(registry.own(), path);
+}
+
+// What is laid out for everybody is not the person's to remove.
+std::wstring whyMissing(Parts& parts, const std::wstring& path, const std::optional<std::wstring>& name)
+{
+    const bool isLaidOut =
+        name ? parts.layered->read(path, *name).has_value() : parts.layered->find(path) != Registry::kNoKey;
+    if (isLaidOut)
+        return name ? L"has the value \"" + *name + L"\" from the administrator, which stays"
+                    : L"is laid out by the administrator and stays";
+    return name ? L"has no value \"" + *name + L"\"" : L"does not exist";
 }
 
 // A key alone goes with everything below it; with a name, only the value.
 Result<> remove(Parts& parts, const std::wstring& path, const Arguments& arguments)
 {
     Registry& registry = *parts.registry;
+    const auto name = arguments.size() > 2 ? std::optional(at(arguments, 2)) : std::nullopt;
     const auto key = registry.find(path);
     if (key == Registry::kNoKey)
-        return notFound(registry, path, L"does not exist");
-    const Result<> done =
-        arguments.size() > 2 ? registry.removeValue(key, at(arguments, 2)) : registry.removeKey(key);
+        return notFound(registry, path, whyMissing(parts, path, name));
+    const Result<> done = name ? registry.removeValue(key, *name) : registry.removeKey(key);
     if (done.code() == ERROR_FILE_NOT_FOUND)
-        return notFound(registry, path, L"has no value \"" + at(arguments, 2) + L"\"");
+        return notFound(registry, path, whyMissing(parts, path, name));
     return done ? done : notWritten(registry, path);
 }
 

@@ -78,12 +78,13 @@ Result<> Host::makeParts()
     tellWhoElseWritesTheProfile();
     // The applications that are loaded next may bring Objective-C along.
     static_cast<void>(keepToolkitFilesIn(mOptions.profileFolder / kToolkitFolder));
-    mParts = std::make_unique<Parts>(Foundations{mCommandLine, mEndRequest, mInterruption,
-                                                 mOptions.profileFolder, mOptions.downloads, mOptions.safe,
-                                                 [this]
-                                                 {
-                                                     return finishLine();
-                                                 }});
+    mParts =
+        std::make_unique<Parts>(Foundations{mCommandLine, mEndRequest, mInterruption, mOptions.profileFolder,
+                                            mOptions.layoutFolders, mOptions.downloads, mOptions.safe,
+                                            [this]
+                                            {
+                                                return finishLine();
+                                            }});
     tellOfRegistry();
     mCommandLine.tell(mParts->marker->outlivesProcess());
     mInterruptible = &*mParts->lisp;
@@ -102,6 +103,8 @@ void Host::tellOfRegistry()
             mCommandLine.tell(read);
     if (registry.notice())
         mCommandLine.say(*registry.notice());
+    for (const auto& sentence : mParts->layered->sentences())
+        mCommandLine.say(sentence);
 }
 
 Result<> Host::prepareProfileFolder()

@@ -37,9 +37,11 @@ struct Parts;
 struct HostOptions
 {
     std::filesystem::path profileFolder; // made when it is missing
-    bool safe = false;                   // load no application by itself
-    CommandLine::Sink output;            // receives everything that the host says
-    RemoteFiles::Limits downloads = {};  // of the files that are fetched for applications
+    // Where values for everybody are laid out; those of later ones stand before those of earlier.
+    std::vector<std::filesystem::path> layoutFolders = {};
+    bool safe = false;                  // load no application by itself
+    CommandLine::Sink output;           // receives everything that the host says
+    RemoteFiles::Limits downloads = {}; // of the files that are fetched for applications
 };
 
 class TESSEL_PROGRAM_API Host : public LineRunner

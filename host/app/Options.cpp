@@ -27,6 +27,9 @@ void declare(CLI::App& app, Options& options)
     app.add_option("--profile-dir", options.profileFolder,
                    "Keep everything in this folder instead of your own")
         ->type_name("DIR");
+    app.add_option("--layout-dir", options.layoutFolder,
+                   "Take the values for everybody in this folder, too, to try them")
+        ->type_name("DIR");
     auto* script =
         app.add_option("--script", options.script, "Run the commands in a file")->type_name("SCRIPT");
     // One argument each, so that a command may begin with a dash and a file name may follow.

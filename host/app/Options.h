@@ -13,6 +13,7 @@ namespace tessel
 struct Options
 {
     std::filesystem::path profileFolder; // empty: the person's own
+    std::filesystem::path layoutFolder;  // of values for everybody, to try them; empty: none
     std::filesystem::path script;        // empty: none
     std::vector<std::string> commands;   // -c, in their order; UTF-8
     std::vector<std::string> files;      // to be loaded first, as LOAD does, in their order

@@ -32,6 +32,7 @@
 #include "host/messages/Browser.h"
 #include "host/messages/Help.h"
 #include "host/messages/MessageBox.h"
+#include "host/registry/LayeredRegistry.h"
 #include "host/registry/Profiles.h"
 #include "host/registry/Registry.h"
 #include "host/registry/SystemVariables.h"
@@ -54,6 +55,7 @@ struct Foundations
     EndRequest& endRequest;
     Interruption& interruption;
     const std::filesystem::path& profileFolder; // is there
+    const std::vector<std::filesystem::path>& layoutFolders;
     const RemoteFiles::Limits& downloads;
     bool safe; // load nothing by itself
     CommandRunner::AfterLine afterLine;
@@ -75,8 +77,13 @@ struct Parts
                              {
                                  return wish.isThere();
                              }};
-    Profiles profiles{*registry, kProductRegistryRoot};
-    Owned<SystemVariables> variables{&*registry, kProductRegistryRoot};
+    Owned<LayeredRegistry> layered{*registry, readRegistryLayers(foundations.layoutFolders),
+                                   [this](const std::wstring& sentence)
+                                   {
+                                       foundations.commandLine.say(sentence);
+                                   }};
+    Profiles profiles{*layered, kProductRegistryRoot};
+    Owned<SystemVariables> variables{&*layered, kProductRegistryRoot};
     Owned<RunningMarker> marker{foundations.profileFolder / kApplicationsFolder};
     KeptOut keptOut{foundations.profileFolder / kApplicationsFolder};
     Bisecting bisecting{foundations.profileFolder / kApplicationsFolder, !foundations.safe};
@@ -89,7 +96,7 @@ struct Parts
     LoadOutcomes loadOutcomes;
     Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands,
                                 *messageBox,  loadOutcomes,        admission};
-    Owned<ApplicationRecords> records{*registry, *commands, *callingApplication, kProductRegistryRoot};
+    Owned<ApplicationRecords> records{*layered, *commands, *callingApplication, kProductRegistryRoot};
     DemandLoading demandLoading{folders.plugIns, *records, *linker, admission,
                                 [this](const std::wstring& path)
                                 {

@@ -128,7 +128,7 @@ int runHost(Options options, StandardOutput& output)
     if (options.profileFolder.empty())
         options.profileFolder = personalFolder();
     const LastWords lastWords; // before Lisp takes a signal of them
-    Host host({options.profileFolder, options.safe,
+    Host host({options.profileFolder, layoutFolders(options.layoutFolder), options.safe,
                [&output](std::string_view text)
                {
                    output.write(text);

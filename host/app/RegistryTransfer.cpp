@@ -19,8 +19,8 @@ using Change = RegistryChange;
 
 Failure notExported(const std::wstring& key, const std::filesystem::path& file, const std::wstring& reason)
 {
-    return {L"The registry key \"" + key + L"\" is not exported to " + toWide(file.native()) + L": " + reason +
-            L"."};
+    return {L"The registry key \"" + key + L"\" is not exported to " + toWide(file.native()) + L": " +
+            reason + L"."};
 }
 
 Failure notImported(const std::filesystem::path& file, const std::wstring& reason)
@@ -36,7 +36,8 @@ std::wstring wordsOf(const Registry& registry, const Result<>& command)
     return words;
 }
 
-// Each key is followed by its values, and these by the keys below it: the order in which it can be made again.
+// Each key is followed by its values, and these by the keys below it: the order in which it can be made
+// again.
 std::vector<Change> changesThatMake(Registry& registry, const std::wstring& top)
 {
     std::vector<Change> changes;
@@ -62,7 +63,8 @@ Result<> checkMayReplace(const std::filesystem::path& file)
     const auto there = readOrdinaryFile(file, kMostBytes);
     if (!there)
         return there.code() == kNothingThere ? Result<>() : there.failure();
-    return readRegistryText(*there) ? Result<>() : Failure{L"another file stands there, which is no registry file"};
+    return readRegistryText(*there) ? Result<>()
+                                    : Failure{L"another file stands there, which is no registry file"};
 }
 
 std::wstring counted(const std::vector<Change>& changes)
@@ -93,11 +95,13 @@ Result<> apply(Registry& registry, const Change& change, Registry::Key& key)
 }
 } // namespace
 
-Result<std::wstring> exportRegistry(Registry& registry, const std::wstring& key, const std::filesystem::path& file,
-                                    RegistryTextForm form)
+Result<std::wstring> exportRegistry(Registry& registry, const std::wstring& key,
+                                    const std::filesystem::path& file, RegistryTextForm form)
 {
     if (registry.find(key) == Registry::kNoKey)
-        return notExported(key, file, registry.mayHaveMissed() ? wordsOf(registry, registry.endOfCommand()) : L"there is no such key");
+        return notExported(key, file,
+                           registry.mayHaveMissed() ? wordsOf(registry, registry.endOfCommand())
+                                                    : L"there is no such key");
     const auto changes = changesThatMake(registry, key);
     if (registry.readFailed())
         return notExported(key, file, wordsOf(registry, registry.endOfCommand()));

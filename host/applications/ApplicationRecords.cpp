@@ -6,7 +6,7 @@
 
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
-#include "host/registry/Registry.h"
+#include "host/registry/LayeredRegistry.h"
 #include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
@@ -35,7 +35,7 @@ std::optional<unsigned> parseReasons(const std::wstring& text)
 }
 } // namespace
 
-ApplicationRecords::ApplicationRecords(Registry& registry, const CommandStack& commands,
+ApplicationRecords::ApplicationRecords(LayeredRegistry& registry, const CommandStack& commands,
                                        const CallingApplication& calls, const std::wstring& productRoot)
     : mRegistry(registry), mCommands(commands), mCalls(calls), mKey(productRoot + L"\\Applications")
 {
@@ -90,7 +90,7 @@ void ApplicationRecords::readCommands(ApplicationRecord& record) const
     const Registry::Key key = mRegistry.find(commandsKeyOf(record.name));
     if (key == Registry::kNoKey)
         return;
-    for (const Registry::Value& value : mRegistry.values(key))
+    for (const LayeredRegistry::Value& value : mRegistry.values(key))
         record.commands.emplace_back(value.name, value.data);
 }
 

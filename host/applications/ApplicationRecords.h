@@ -12,7 +12,7 @@ namespace tessel
 {
 class CallingApplication;
 class CommandStack;
-class Registry;
+class LayeredRegistry;
 
 struct ApplicationRecord
 {
@@ -27,8 +27,8 @@ struct ApplicationRecord
 class ApplicationRecords
 {
 public:
-    ApplicationRecords(Registry& registry, const CommandStack& commands, const CallingApplication& calls,
-                       const std::wstring& productRoot);
+    ApplicationRecords(LayeredRegistry& registry, const CommandStack& commands,
+                       const CallingApplication& calls, const std::wstring& productRoot);
 
     // Every record, in the order in which they were made.
     std::vector<ApplicationRecord> all() const;
@@ -50,7 +50,7 @@ private:
     std::wstring commandsKeyOf(const std::wstring& name) const;
     void readCommands(ApplicationRecord& record) const;
 
-    Registry& mRegistry;
+    LayeredRegistry& mRegistry;
     const CommandStack& mCommands;
     const CallingApplication& mCalls;
     std::wstring mKey;

@@ -1,6 +1,6 @@
 #include "host/registry/Profiles.h"
 
-#include "host/registry/Registry.h"
+#include "host/registry/LayeredRegistry.h"
 
 namespace tessel
 {
@@ -16,14 +16,14 @@ bool isProfileName(const std::wstring& name)
 }
 } // namespace
 
-Profiles::Profiles(Registry& registry, const std::wstring& productRoot)
+Profiles::Profiles(LayeredRegistry& registry, const std::wstring& productRoot)
     : mRegistry(registry), mKey(productRoot + L"\\Profiles")
 {
     if (!mRegistry.read(mKey, kCurrentProfileValue))
         // What is wrong is told by `canStore`.
         static_cast<void>(mRegistry.write(mKey, kCurrentProfileValue, kFirstProfile));
     // The rest of the start takes its time, and other sessions may start too.
-    mRegistry.storeSoFar();
+    mRegistry.own().storeSoFar();
 }
 
 std::wstring Profiles::current() const

@@ -8,13 +8,13 @@
 
 namespace tessel
 {
-class Registry;
+class LayeredRegistry;
 
 class Profiles
 {
 public:
     // Gives a new registry its first profile, "Default", unless a current profile is set already.
-    Profiles(Registry& registry, const std::wstring& productRoot);
+    Profiles(LayeredRegistry& registry, const std::wstring& productRoot);
 
     // The current profile's name; empty when the registry cannot be read.
     std::wstring current() const;
@@ -24,7 +24,7 @@ public:
     Result<> setCurrent(const std::wstring& name);
 
 private:
-    Registry& mRegistry;
+    LayeredRegistry& mRegistry;
     std::wstring mKey;
 };
 } // namespace tessel

@@ -4,9 +4,10 @@
 #include <cstring>
 #include <cwchar>
 
-#include "host/registry/Registry.h"
+#include "host/registry/LayeredRegistry.h"
 #include "host/text/Running.h"
 
+using tessel::LayeredRegistry;
 using tessel::Registry;
 
 namespace
@@ -14,7 +15,7 @@ namespace
 // The registry and the key that a handle stands for, if both are there.
 struct Target
 {
-    Registry* registry = nullptr;
+    LayeredRegistry* registry = nullptr;
     Registry::Key key = Registry::kNoKey;
 
     explicit operator bool() const { return registry != nullptr; }
@@ -22,7 +23,7 @@ struct Target
 
 Target targetOf(HKEY handle)
 {
-    Registry* registry = tessel::running<Registry>();
+    LayeredRegistry* registry = tessel::running<LayeredRegistry>();
     const auto key = registry ? registry->keyOf(handle) : std::nullopt;
     return key ? Target{registry, *key} : Target{};
 }

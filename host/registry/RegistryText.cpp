@@ -97,8 +97,7 @@ private:
     // Counted from where it was asked last.
     std::size_t line() const
     {
-        mLine += static_cast<std::size_t>(
-            std::ranges::count(mText.substr(mCounted, mAt - mCounted), L'\n'));
+        mLine += static_cast<std::size_t>(std::ranges::count(mText.substr(mCounted, mAt - mCounted), L'\n'));
         mCounted = mAt;
         return mLine;
     }
@@ -320,7 +319,8 @@ std::wstring lineOf(const RegistryChange& change)
     const std::wstring begin = (change.name.empty() ? L"@" : inQuotes(change.name)) + L"=";
     if (change.kind == Kind::kRemoveValue)
         return begin + L"-\r\n";
-    return begin + (hasControlCharacter(change.data) ? byUnits(change.data) : inQuotes(change.data)) + L"\r\n";
+    return begin + (hasControlCharacter(change.data) ? byUnits(change.data) : inQuotes(change.data)) +
+           L"\r\n";
 }
 } // namespace
 

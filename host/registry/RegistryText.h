@@ -41,8 +41,8 @@ struct RegistryChange
     bool operator==(const RegistryChange&) const = default;
 };
 
-// From UTF-8, or from UTF-16 of either byte order, which begins with its mark. What is not understood fails as
-// a whole, with the line: a part of a clause, "in line 7 ...".
+// From UTF-8, or from UTF-16 of either byte order, which begins with its mark. What is not understood fails
+// as a whole, with the line: a part of a clause, "in line 7 ...".
 Result<std::vector<RegistryChange>> readRegistryText(std::string_view bytes);
 
 enum class RegistryTextForm

@@ -7,7 +7,7 @@
 #include <cwchar>
 #include <optional>
 
-#include "host/registry/Registry.h"
+#include "host/registry/LayeredRegistry.h"
 #include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
@@ -58,7 +58,7 @@ std::wstring rangeSentence(const SystemVariables::Variable& variable)
 }
 } // namespace
 
-SystemVariables::SystemVariables(Registry* registry, const std::wstring& productRoot)
+SystemVariables::SystemVariables(LayeredRegistry* registry, const std::wstring& productRoot)
     : mRegistry(registry), mStorageKey(productRoot + L"\\Variables"), mVariables(hostVariables())
 {
     readStored();

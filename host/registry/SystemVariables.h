@@ -11,7 +11,7 @@
 
 namespace tessel
 {
-class Registry;
+class LayeredRegistry;
 
 class SystemVariables
 {
@@ -37,7 +37,7 @@ public:
 
     // The host's own variables, stored ones as the registry has them below the product's root. A stored value
     // that does not fit is passed over. Without a registry nothing is stored.
-    SystemVariables(Registry* registry, const std::wstring& productRoot);
+    SystemVariables(LayeredRegistry* registry, const std::wstring& productRoot);
 
     const std::vector<Variable>& all() const { return mVariables; }
 
@@ -53,7 +53,7 @@ public:
 private:
     void readStored();
 
-    Registry* mRegistry;
+    LayeredRegistry* mRegistry;
     std::wstring mStorageKey;
     std::vector<Variable> mVariables;
 };

@@ -46,8 +46,9 @@ protected:
 TEST_F(RegistryTransfer, TakesATreeToAnotherProfileAsItWas)
 {
     expectWell(session.run({"REGISTRY SET Software\\My", "REGISTRY SET Software\\My second 2",
-                            "REGISTRY SET Software\\My first \"C:\\a b\"", "REGISTRY SET Software\\My\\Zz x y",
-                            "REGISTRY SET Software\\My\\Aa \"\" unnamed", "REGISTRY SET Software\\My\\Aa\\Deep z \"\""}));
+                            "REGISTRY SET Software\\My first \"C:\\a b\"",
+                            "REGISTRY SET Software\\My\\Zz x y", "REGISTRY SET Software\\My\\Aa \"\" unnamed",
+                            "REGISTRY SET Software\\My\\Aa\\Deep z \"\""}));
     for (const std::string form : {"", " UTF8"})
     {
         session.nameProfile("profile");
@@ -71,7 +72,9 @@ TEST_F(RegistryTransfer, TakesEverythingFromTheRoot)
 
 TEST_F(RegistryTransfer, ChangesAndRemovesWhatTheFileNames)
 {
-    session.folder().write(file.filename(), kBegin + "[-HKCU\\Old]\n[-HKCU\\NeverThere]\n[HKCU\\My]\n\"a\"=\"new\"\n\"b\"=-\n\"c\"=-\n");
+    session.folder().write(
+        file.filename(),
+        kBegin + "[-HKCU\\Old]\n[-HKCU\\NeverThere]\n[HKCU\\My]\n\"a\"=\"new\"\n\"b\"=-\n\"c\"=-\n");
     expectWell(session.run({"REGISTRY SET Old\\Below x y", "REGISTRY SET My A old", "REGISTRY SET My b old",
                             "REGISTRY SET My kept 1", "REGISTRY IMPORT " + quotedFile}));
     EXPECT_THAT(answer("REGISTRY LIST"), Not(HasSubstr("Old")));
@@ -81,15 +84,16 @@ TEST_F(RegistryTransfer, ChangesAndRemovesWhatTheFileNames)
 TEST_F(RegistryTransfer, ChangesNothingFromAFileThatIsDamaged)
 {
     session.folder().write(file.filename(), kBegin + "[HKCU\\My]\n\"a\"=\"new\"\n\"b\"=dword:1\n");
-    expectRefused("REGISTRY IMPORT " + quotedFile,
-                  "The file " + file.string() +
-                      " is not imported: in line 5 a value stands that is no text, and the registry holds texts alone.\n");
+    expectRefused("REGISTRY IMPORT " + quotedFile, "The file " + file.string() +
+                                                       " is not imported: in line 5 a value stands that is "
+                                                       "no text, and the registry holds texts alone.\n");
     EXPECT_THAT(session.run({"REGISTRY LIST My"}).output, HasSubstr("does not exist"));
 }
 
 TEST_F(RegistryTransfer, SaysWhyAFileIsNotRead)
 {
-    expectRefused("REGISTRY IMPORT " + quotedFile, "The file " + file.string() + " is not imported: No such file");
+    expectRefused("REGISTRY IMPORT " + quotedFile,
+                  "The file " + file.string() + " is not imported: No such file");
     fs::create_directory(file);
     expectRefused("REGISTRY IMPORT " + quotedFile, "is not imported: it is ");
     expectRefused("REGISTRY EXPORT \"\" " + quotedFile, "is not exported to " + file.string() + ": it is ");
@@ -98,10 +102,12 @@ TEST_F(RegistryTransfer, SaysWhyAFileIsNotRead)
 TEST_F(RegistryTransfer, DoesNotReplaceAFileOfAnotherKind)
 {
     session.folder().write(file.filename(), "my notes");
-    expectRefused("REGISTRY EXPORT \"\" " + quotedFile, "another file stands there, which is no registry file.\n");
+    expectRefused("REGISTRY EXPORT \"\" " + quotedFile,
+                  "another file stands there, which is no registry file.\n");
     EXPECT_EQ(contentOf(file), "my notes");
     expectRefused("REGISTRY EXPORT No\\Such " + quotedFile,
-                  "The registry key \"No\\Such\" is not exported to " + file.string() + ": there is no such key.\n");
+                  "The registry key \"No\\Such\" is not exported to " + file.string() +
+                      ": there is no such key.\n");
 }
 
 TEST_F(RegistryTransfer, StoresNothingInARegistryThatMayOnlyBeRead)
@@ -121,7 +127,8 @@ TEST_F(RegistryTransfer, TakesManyValuesAtOnce)
 {
     std::string text = kBegin + "[HKCU\\Many]\n";
     for (int number = 0; number < 20000; ++number)
-        text += "\"value" + std::to_string(number) + "\"=\"/a/path/of/an/application/tool" + std::to_string(number) + "\"\n";
+        text += "\"value" + std::to_string(number) + "\"=\"/a/path/of/an/application/tool" +
+                std::to_string(number) + "\"\n";
     session.folder().write(file.filename(), text);
     expectWell(session.run({"REGISTRY IMPORT " + quotedFile}), "1 key with 20000 values.\n");
     EXPECT_EQ(answer("REGISTRY GET Many value19999"), "/a/path/of/an/application/tool19999\n");
@@ -129,6 +136,7 @@ TEST_F(RegistryTransfer, TakesManyValuesAtOnce)
 
 TEST_F(RegistryTransfer, IsToldItsUsageWhenSomethingIsMissing)
 {
-    for (const std::string command : {"REGISTRY EXPORT My", "REGISTRY EXPORT My x.reg UTF32", "REGISTRY IMPORT"})
+    for (const std::string command :
+         {"REGISTRY EXPORT My", "REGISTRY EXPORT My x.reg UTF32", "REGISTRY IMPORT"})
         expectRefused(command, "EXPORT key file [UTF8] | IMPORT file");
 }

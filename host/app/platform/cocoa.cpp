@@ -10,4 +10,9 @@ std::filesystem::path personalDataHome()
     return home && *home ? std::filesystem::path(home) / "Library/Application Support"
                          : std::filesystem::path();
 }
+
+std::vector<std::filesystem::path> machineFolders()
+{
+    return {"/Library/Application Support/Tessel"};
+}
 } // namespace tessel

@@ -1,6 +1,9 @@
 #include "host/app/platform/DataHome.h"
 
+#include <algorithm>
 #include <cstdlib>
+#include <sstream>
+#include <string>
 
 namespace tessel
 {
@@ -12,5 +15,19 @@ std::filesystem::path personalDataHome()
         return dataHome;
     const char* home = std::getenv("HOME");
     return home && *home ? std::filesystem::path(home) / ".local/share" : std::filesystem::path();
+}
+
+// The first of the variable is the most important one. Relative paths count for nothing here, too.
+std::vector<std::filesystem::path> machineFolders()
+{
+    const char* named = std::getenv("XDG_CONFIG_DIRS");
+    std::istringstream all(named && *named ? named : "/etc/xdg");
+    std::vector<std::filesystem::path> folders;
+    for (std::string folder; std::getline(all, folder, ':');)
+        if (std::filesystem::path(folder).is_absolute())
+            folders.push_back(std::filesystem::path(folder) / "tessel");
+    std::ranges::reverse(folders);
+    folders.emplace_back("/etc/tessel");
+    return folders;
 }
 } // namespace tessel

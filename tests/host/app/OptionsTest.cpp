@@ -19,6 +19,7 @@ TEST(Options, AreAnOrdinarySessionWithoutArguments)
     const auto parsed = parse({});
     ASSERT_TRUE(parsed && parsed->options);
     EXPECT_TRUE(parsed->options->profileFolder.empty());
+    EXPECT_TRUE(parsed->options->layoutFolder.empty());
     EXPECT_FALSE(parsed->options->safe);
     EXPECT_FALSE(parsed->options->isBatch());
 }
@@ -34,9 +35,11 @@ TEST(Options, TakeCommandsInTheirOrderAndOneArgumentEach)
 
 TEST(Options, TakeAProfileFolderAndAScript)
 {
-    const auto parsed = parse({"--profile-dir", "/tmp/größe 1", "--script=tour.script"});
+    const auto parsed =
+        parse({"--profile-dir", "/tmp/größe 1", "--script=tour.script", "--layout-dir", "/tmp/all"});
     ASSERT_TRUE(parsed && parsed->options);
     EXPECT_EQ(parsed->options->profileFolder, "/tmp/größe 1");
+    EXPECT_EQ(parsed->options->layoutFolder, "/tmp/all");
     EXPECT_EQ(parsed->options->script, "tour.script");
     EXPECT_TRUE(parsed->options->isBatch());
 }

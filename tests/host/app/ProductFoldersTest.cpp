@@ -1,8 +1,11 @@
-#include <gtest/gtest.h>
+#include <gmock/gmock.h>
 
 #include <cstdlib>
+#include <string>
 
 #include "host/app/ProductFolders.h"
+#include "tests/support/EnvironmentVariable.h"
+#include "tests/support/TemporaryFolder.h"
 
 TEST(ProductFolders, FindsThePartsBesideThePrograms)
 {
@@ -28,4 +31,28 @@ TEST(ProductFolders, KeepsThePersonsOwnProfileWhereTheSystemWantsIt)
     const char* home = std::getenv("HOME");
     EXPECT_EQ(tessel::personalFolder(), std::filesystem::path(home ? home : "") / ".local/share/Tessel");
     dataHome ? setenv("XDG_DATA_HOME", before.c_str(), 1) : unsetenv("XDG_DATA_HOME");
+}
+
+TEST(ProductFolders, TakeTheMachinesOwnLayoutLastWhateverTheEnvironmentSays)
+{
+    const EnvironmentVariable folders("XDG_CONFIG_DIRS", "/first:relative:/second");
+    EXPECT_THAT(tessel::layoutFolders(""),
+                testing::ElementsAre("/second/tessel", "/first/tessel", "/etc/tessel"));
+    EXPECT_THAT(tessel::layoutFolders("/to/try"),
+                testing::ElementsAre("/second/tessel", "/first/tessel", "/to/try", "/etc/tessel"));
+    const EnvironmentVariable none("XDG_CONFIG_DIRS", "");
+    EXPECT_THAT(tessel::layoutFolders(""), testing::ElementsAre("/etc/xdg/tessel", "/etc/tessel"));
+}
+
+TEST(ProductFolders, TakeTheFurtherOnesThatALayoutNames)
+{
+    const TemporaryFolder folder;
+    EXPECT_THAT(tessel::furtherLayoutFolders(folder.path()), testing::IsEmpty());
+    const std::string begin =
+        "Windows Registry Editor Version 5.00\n[HKCU\\Software\\Tessel\\Layout]\n\"Folders\"=";
+    folder.write("a.reg", begin + "\"/net/site:relative::/net/office\"");
+    EXPECT_THAT(tessel::furtherLayoutFolders(folder.path()),
+                testing::ElementsAre("/net/site", "/net/office"));
+    folder.write("policy/a.reg", begin + "\"/net/locked\"");
+    EXPECT_THAT(tessel::furtherLayoutFolders(folder.path()), testing::ElementsAre("/net/locked"));
 }

@@ -31,7 +31,7 @@ protected:
     }
 
     // The host starts, on the registry that is open.
-    void start() { records.emplace(host.registry(), commands, calls, L"Software\\Tessel\\R21"); }
+    void start() { records.emplace(host.layered(), commands, calls, L"Software\\Tessel\\R21"); }
     void end()
     {
         records.reset();

@@ -3,7 +3,7 @@
 #include <tessel/tsappinfo.h>
 
 #include "host/applications/ApplicationRecords.h"
-#include "host/registry/Registry.h"
+#include "host/registry/LayeredRegistry.h"
 #include "tests/host/support/HostWithModules.h"
 
 using tessel::toWide;
@@ -29,7 +29,8 @@ protected:
             mCommandLine.say(sentence);
     }
 
-    tessel::Registry mRegistry{mFolder / "registry.db"};
+    tessel::Registry mOwnRegistry{mFolder / "registry.db"};
+    tessel::LayeredRegistry mRegistry{mOwnRegistry};
     tessel::Owned<tessel::ApplicationRecords> mRecords{mRegistry, mCommands, mCalls,
                                                        L"Software\\Tessel\\R21"};
     tessel::DemandLoading mDemand{mFolder / "PlugIns", *mRecords, mLinker, mAdmission,

@@ -1,16 +1,15 @@
 // Showing a page in the person's browser, a program that the session starts and forgets.
 #include <gtest/gtest.h>
 
-#include <cstdlib>
 #include <fstream>
 #include <iterator>
-#include <optional>
 
 #include <sys/stat.h>
 #include <sys/wait.h>
 
 #include "host/messages/Browser.h"
 #include "host/messages/platform/Desktop.h"
+#include "tests/support/EnvironmentVariable.h"
 #include "tests/support/TemporaryFolder.h"
 
 namespace fs = std::filesystem;
@@ -20,31 +19,6 @@ using tessel::pageOpeners;
 
 namespace
 {
-// A variable of the environment, as long as this lasts.
-class Variable
-{
-public:
-    Variable(const char* name, const std::string& value) : mName(name)
-    {
-        if (const char* before = std::getenv(name))
-            mBefore = before;
-        setenv(name, value.c_str(), 1);
-    }
-    ~Variable()
-    {
-        if (mBefore)
-            setenv(mName, mBefore->c_str(), 1);
-        else
-            unsetenv(mName);
-    }
-    Variable(const Variable&) = delete;
-    Variable& operator=(const Variable&) = delete;
-
-private:
-    const char* mName;
-    std::optional<std::string> mBefore;
-};
-
 class Browser : public testing::Test
 {
 protected:
@@ -67,8 +41,8 @@ protected:
 private:
     TemporaryFolder mFolder;
     fs::path mNote = mFolder / "note";
-    Variable mPath{"PATH", (mFolder / "programs").string()};
-    Variable mDisplay{"DISPLAY", ":0"};
+    EnvironmentVariable mPath{"PATH", (mFolder / "programs").string()};
+    EnvironmentVariable mDisplay{"DISPLAY", ":0"};
 };
 } // namespace
 
@@ -112,7 +86,7 @@ TEST_F(Browser, IsPutAwayWhenTheNextOneStarts)
 
 TEST_F(Browser, IsSoughtInNoPlaceWhenThePathIsEmpty)
 {
-    const Variable path("PATH", "");
+    const EnvironmentVariable path("PATH", "");
     EXPECT_FALSE(openInBrowser("/page.html"));
 }
 

@@ -268,10 +268,10 @@ TEST_F(RegistryStore, WalksTwoKeysAtTheSameTime)
 
 TEST_F(RegistryStore, GivesANewRegistryItsFirstProfileOnly)
 {
-    const tessel::Profiles first(registry(), L"Product");
+    const tessel::Profiles first(host.layered(), L"Product");
     EXPECT_EQ(registry().read(L"Product\\Profiles", L""), L"Default");
     EXPECT_TRUE(registry().write(L"Product\\Profiles", L"", L"Zweites Büro"));
-    const tessel::Profiles second(registry(), L"Product");
+    const tessel::Profiles second(host.layered(), L"Product");
     EXPECT_EQ(registry().read(L"Product\\Profiles", L""), L"Zweites Büro");
 }
 

@@ -49,7 +49,8 @@ const std::vector<Change> kOfEachKind = {
     {Kind::kSetValue, L"Software\\A [1]", L"", L"unnamed"},
     {Kind::kSetValue, L"Software\\A [1]", L"a \"name\" \\ = ;", L"C:\\path \"x\" ; no note"},
     {Kind::kSetValue, L"Software\\A [1]", L"empty", L""},
-    {Kind::kSetValue, L"Software\\A [1]", L"lines", L"one\r\ntwo\n\tthree\x7F and more that goes over a line"},
+    {Kind::kSetValue, L"Software\\A [1]", L"lines",
+     L"one\r\ntwo\n\tthree\x7F and more that goes over a line"},
     {Kind::kSetValue, L"Software\\A [1]", L"name\nof two lines", L"\x1F600 \x10FEFF \xFC"},
     {Kind::kRemoveValue, L"Software\\A [1]", L"gone", L""},
     {Kind::kRemoveValue, L"Software\\A [1]", L"", L""},
@@ -59,11 +60,12 @@ const std::vector<Change> kOfEachKind = {
 
 TEST(RegistryText, ReadsKeysAndValues)
 {
-    EXPECT_THAT(read("[HKEY_CURRENT_USER\\Software\\Tessel]\r\n\"name\"=\"text\"\r\n@=\"unnamed\"\r\n\r\n[hkcu]\r\n"),
-                testing::ElementsAre(Change{Kind::kMakeKey, L"Software\\Tessel", L"", L"", 3},
-                                     Change{Kind::kSetValue, L"Software\\Tessel", L"name", L"text", 4},
-                                     Change{Kind::kSetValue, L"Software\\Tessel", L"", L"unnamed", 5},
-                                     Change{Kind::kMakeKey, L"", L"", L"", 7}));
+    EXPECT_THAT(
+        read("[HKEY_CURRENT_USER\\Software\\Tessel]\r\n\"name\"=\"text\"\r\n@=\"unnamed\"\r\n\r\n[hkcu]\r\n"),
+        testing::ElementsAre(Change{Kind::kMakeKey, L"Software\\Tessel", L"", L"", 3},
+                             Change{Kind::kSetValue, L"Software\\Tessel", L"name", L"text", 4},
+                             Change{Kind::kSetValue, L"Software\\Tessel", L"", L"unnamed", 5},
+                             Change{Kind::kMakeKey, L"", L"", L"", 7}));
 }
 
 TEST(RegistryText, ReadsWhatIsToGo)
@@ -83,8 +85,9 @@ TEST(RegistryText, PassesOverNotesAndBlanks)
 
 TEST(RegistryText, ReadsTextsByTheirUnits)
 {
-    const auto changes = read("[HKCU\\A]\r\n\"x\"=hex(1):61,00, 3D,d8,\\\r\n  00,de,\\\n00,00\r\n\"y\"=hex(1):\r\n"
-                              "\"z\"=hex(1):62,00");
+    const auto changes =
+        read("[HKCU\\A]\r\n\"x\"=hex(1):61,00, 3D,d8,\\\r\n  00,de,\\\n00,00\r\n\"y\"=hex(1):\r\n"
+             "\"z\"=hex(1):62,00");
     ASSERT_EQ(changes.size(), 4U);
     EXPECT_EQ(changes[1].data, L"a\x1F600");
     EXPECT_EQ(changes[2].data, L"");
@@ -117,7 +120,10 @@ TEST(RegistryText, NamesTheLineOfWhatIsNotUnderstood)
 {
     EXPECT_EQ(whyNot(""), "in line 1 \"Windows Registry Editor Version 5.00\" is missing");
     EXPECT_EQ(whyNot("REGEDIT\n[HKCU\\A]"), whyNot(""));
-    const auto in3 = [](const std::string& text) { return whyNot(kBegin + text); };
+    const auto in3 = [](const std::string& text)
+    {
+        return whyNot(kBegin + text);
+    };
     EXPECT_EQ(in3("[HKCU\\A"), "in line 3 the \"]\" after the key is missing");
     EXPECT_EQ(in3("["), "in line 3 the \"]\" after the key is missing");
     EXPECT_EQ(in3("[HKEY_LOCAL_MACHINE\\A]"), "in line 3 a key stands that is not below HKEY_CURRENT_USER");
@@ -131,7 +137,8 @@ TEST(RegistryText, NamesTheLineOfWhatIsNotUnderstood)
     EXPECT_EQ(in3("[HKCU]\n\"x\"=\"y"), "in line 4 a text begins that never ends");
     EXPECT_EQ(in3("[HKCU]\n\"x\"=\"y\\\""), "in line 4 a text begins that never ends");
     EXPECT_EQ(in3("[HKCU]\n\"x\"=\"y\" z"), "in line 4 something stands after a value");
-    EXPECT_EQ(in3("[HKCU]\n\"x\"=\"C:\\new\""), "in line 4 a \"\\\" stands alone, and is to be written twice");
+    EXPECT_EQ(in3("[HKCU]\n\"x\"=\"C:\\new\""),
+              "in line 4 a \"\\\" stands alone, and is to be written twice");
     EXPECT_EQ(in3("[HKCU]\n\"x\"=\"\\"), "in line 4 a \"\\\" stands alone, and is to be written twice");
     EXPECT_EQ(in3("[HKCU]\n\"x\"=hex(1):61,00,62"), "in line 4 a text ends in the middle of a character");
     EXPECT_EQ(in3("[HKCU]\n\"x\"=hex(1):61,00,6"), "in line 4 something stands after a value");
@@ -162,9 +169,10 @@ TEST(RegistryText, IsWrittenInTheUsualForm)
     EXPECT_EQ(written({{Kind::kMakeKey, L"A\\B", L"", L""},
                        {Kind::kSetValue, L"A\\B", L"x\\", L"\""},
                        {Kind::kSetValue, L"A\\B", L"", L"two\nlines, longer"}}),
-              kBegin + "[HKEY_CURRENT_USER\\A\\B]\r\n\"x\\\\\"=\"\\\"\"\r\n"
-                       "@=hex(1):74,00,77,00,6f,00,0a,00,6c,00,69,00,6e,00,65,00,73,00,2c,00,20,00,6c,00,\\\r\n"
-                       "  6f,00,6e,00,67,00,65,00,72,00,00,00\r\n");
+              kBegin +
+                  "[HKEY_CURRENT_USER\\A\\B]\r\n\"x\\\\\"=\"\\\"\"\r\n"
+                  "@=hex(1):74,00,77,00,6f,00,0a,00,6c,00,69,00,6e,00,65,00,73,00,2c,00,20,00,6c,00,\\\r\n"
+                  "  6f,00,6e,00,67,00,65,00,72,00,00,00\r\n");
     EXPECT_THAT(written({}, RegistryTextForm::kUtf16), StartsWith(std::string("\xFF\xFEW\0i\0", 6)));
 }
 

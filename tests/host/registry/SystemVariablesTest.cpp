@@ -22,7 +22,7 @@ protected:
     // The host starts, with what the registry holds.
     void start()
     {
-        auto* registry = tessel::running<tessel::Registry>();
+        auto* registry = tessel::running<tessel::LayeredRegistry>();
         published.reset();
         variables = std::make_unique<SystemVariables>(registry, L"Software\\Tessel\\R21");
         published.emplace(*variables);

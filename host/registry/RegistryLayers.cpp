@@ -1,0 +1,177 @@
+#include "host/registry/RegistryLayers.h"
+
+#include <algorithm>
+#include <cstdint>
+#include <system_error>
+#include <utility>
+
+#include "host/platform/OrdinaryFile.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace fs = std::filesystem;
+
+namespace
+{
+constexpr std::uintmax_t kMostLayerBytes = std::uintmax_t{64} << 20;
+constexpr wchar_t kSeparator = L'\\';
+
+std::vector<fs::path> registryFilesIn(const fs::path& folder)
+{
+    std::vector<fs::path> files;
+    std::error_code none;
+    for (auto entry = fs::directory_iterator(folder, none); !none && entry != fs::directory_iterator();
+         entry.increment(none))
+        if (equalIgnoringCase(toWide(entry->path().extension().native()), L".reg"))
+            files.push_back(entry->path());
+    std::ranges::sort(files);
+    return files;
+}
+
+void take(const fs::path& file, RegistryTree& tree, std::vector<std::wstring>& sentences)
+{
+    const auto bytes = readOrdinaryFile(file, kMostLayerBytes);
+    const auto changes = bytes ? readRegistryText(*bytes) : bytes.failure();
+    if (changes)
+        tree.apply(*changes, file);
+    else
+        sentences.push_back(L"The values for everybody in " + toWide(file.native()) + L" do not count: " +
+                            changes.sentence() + L".");
+}
+} // namespace
+
+std::vector<std::wstring> partsOfKeyPath(std::wstring_view path)
+{
+    std::vector<std::wstring> parts;
+    while (!path.empty())
+    {
+        const std::size_t end = std::min(path.find(kSeparator), path.size());
+        if (end > 0)
+            parts.emplace_back(path.substr(0, end));
+        path.remove_prefix(std::min(end + 1, path.size()));
+    }
+    return parts;
+}
+
+const RegistryTree::Node* RegistryTree::find(std::wstring_view path) const
+{
+    const Node* node = &mRoot;
+    for (const std::wstring& part : partsOfKeyPath(path))
+    {
+        const auto found = node->keys.find(foldCase(part));
+        if (found == node->keys.end())
+            return nullptr;
+        node = found->second;
+    }
+    return node;
+}
+
+RegistryTree::Node& RegistryTree::make(std::wstring_view path)
+{
+    Node* node = &mRoot;
+    for (std::wstring& part : partsOfKeyPath(path))
+    {
+        Node*& below = node->keys[foldCase(part)];
+        if (!below)
+        {
+            below = node->below.emplace_back(std::make_unique<Node>()).get();
+            below->name = std::move(part);
+        }
+        node = below;
+    }
+    return *node;
+}
+
+void RegistryTree::removeKey(std::wstring_view path)
+{
+    auto parts = partsOfKeyPath(path);
+    if (parts.empty() || !find(path))
+        return;
+    const std::wstring fold = foldCase(parts.back());
+    parts.pop_back();
+    std::wstring above;
+    for (const std::wstring& part : parts)
+        above += part + kSeparator;
+    Node& node = make(above);
+    const Node* gone = node.keys.at(fold);
+    node.keys.erase(fold);
+    std::erase_if(node.below, [&](const auto& key) { return key.get() == gone; });
+}
+
+void RegistryTree::set(Node& node, Value value)
+{
+    const auto [place, isNew] = node.indexOfValue.emplace(foldCase(value.name), node.values.size());
+    if (isNew)
+        node.values.push_back(std::move(value));
+    else
+    {
+        value.name = node.values[place->second].name;
+        node.values[place->second] = std::move(value);
+    }
+}
+
+void RegistryTree::removeValue(Node& node, const std::wstring& name)
+{
+    const auto found = node.indexOfValue.find(foldCase(name));
+    if (found == node.indexOfValue.end())
+        return;
+    auto kept = std::exchange(node.values, {});
+    kept.erase(kept.begin() + static_cast<std::ptrdiff_t>(found->second));
+    node.indexOfValue.clear();
+    for (Value& value : kept)
+        set(node, std::move(value));
+}
+
+void RegistryTree::apply(const std::vector<RegistryChange>& changes, const fs::path& file)
+{
+    using Kind = RegistryChange::Kind;
+    for (const RegistryChange& change : changes)
+        if (change.kind == Kind::kRemoveKey)
+            removeKey(change.key);
+        else if (change.kind == Kind::kSetValue)
+            set(make(change.key), {change.name, change.data, file});
+        else if (change.kind == Kind::kRemoveValue)
+            removeValue(make(change.key), change.name);
+        else
+            make(change.key);
+}
+
+std::vector<std::wstring> RegistryTree::subKeys(std::wstring_view path) const
+{
+    std::vector<std::wstring> names;
+    if (const Node* node = find(path))
+        for (const auto& key : node->below)
+            names.push_back(key->name);
+    return names;
+}
+
+const std::vector<RegistryTree::Value>& RegistryTree::values(std::wstring_view path) const
+{
+    static const std::vector<Value> none;
+    const Node* node = find(path);
+    return node ? node->values : none;
+}
+
+const RegistryTree::Value* RegistryTree::value(std::wstring_view path, std::wstring_view name) const
+{
+    const Node* node = find(path);
+    if (!node)
+        return nullptr;
+    const auto found = node->indexOfValue.find(foldCase(name));
+    return found == node->indexOfValue.end() ? nullptr : &node->values[found->second];
+}
+
+RegistryLayers readRegistryLayers(const std::vector<fs::path>& folders)
+{
+    RegistryLayers layers;
+    for (const fs::path& folder : folders)
+    {
+        for (const fs::path& file : registryFilesIn(folder))
+            take(file, layers.defaults, layers.sentences);
+        for (const fs::path& file : registryFilesIn(folder / "policy"))
+            take(file, layers.policy, layers.sentences);
+    }
+    return layers;
+}
+} // namespace tessel

@@ -1,0 +1,91 @@
+// What an administrator lays out for everybody who starts Tessel on a machine.
+#include <gmock/gmock.h>
+
+#include "tests/e2e/Applications.h"
+
+using testing::EndsWith;
+using testing::HasSubstr;
+using testing::Not;
+
+namespace
+{
+class Layout : public testing::Test
+{
+protected:
+    Layout() { session.alwaysWith({"--layout-dir", (session.folder() / "layout").string()}); }
+
+    // A Startup Suite of one application.
+    void layOutSuite(const std::string& file, const std::string& application)
+    {
+        session.folder().write("layout/" + file,
+                               "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
+                                   std::string(kSuiteKey) + "]\n\"NumStartup\"=\"1\"\n\"1Startup\"=\"" +
+                                   application + "\"\n");
+    }
+    std::string apps() { return session.run({"APPS"}).output; }
+
+    HostSession session;
+};
+} // namespace
+
+TEST_F(Layout, OfASuiteIsLoadedByEverybody)
+{
+    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
+    EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp"))) << "and at the second start";
+    session.nameProfile("another");
+    EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
+}
+
+TEST_F(Layout, GivesWayToAPersonsOwnSuite)
+{
+    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    storeSuite(session, {sample("calendar.qbc")});
+    EXPECT_THAT(apps(), EndsWith(listed(sample("calendar.qbc"), "Lisp")));
+    EXPECT_THAT(apps(), Not(HasSubstr("hilbert.lsp")));
+}
+
+TEST_F(Layout, ThatIsPolicyStandsBeforeAPersonsOwnSuite)
+{
+    layOutSuite("policy/suite.reg", sample("hilbert.lsp"));
+    storeSuite(session, {sample("calendar.qbc")});
+    EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
+    EXPECT_THAT(apps(), Not(HasSubstr("calendar.qbc")));
+}
+
+TEST_F(Layout, ThatIsPolicyCannotBeTakenOutAndThePersonIsTold)
+{
+    layOutSuite("policy/suite.reg", sample("hilbert.lsp"));
+    const std::string key = kSuiteKey;
+    const auto file = (session.folder() / "layout/policy/suite.reg").string();
+    const auto removed = session.run({"REGISTRY DELETE " + key + " 1Startup"});
+    EXPECT_EQ(removed.exitStatus, 1);
+    EXPECT_THAT(removed.output,
+                HasSubstr("has the value \"1Startup\" from the administrator, which stays.\n"));
+    EXPECT_THAT(session.run({"REGISTRY DELETE " + key}).output,
+                HasSubstr("is laid out by the administrator and stays.\n"));
+    EXPECT_THAT(session.run({"REGISTRY SET " + key + " NumStartup 0"}).output,
+                HasSubstr("\nValues of \"" + key + "\" are laid down by the administrator, in " + file +
+                          ": what is changed in them does not count.\n"));
+    EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
+    EXPECT_THAT(session.run({"REGISTRY LIST " + key}).output,
+                EndsWith("NumStartup = 1    (from " + file + ")\n1Startup = " + sample("hilbert.lsp") +
+                         "    (from " + file + ")\n"));
+}
+
+TEST_F(Layout, ThatIsDamagedIsToldAtEveryStartAndDoesNotCount)
+{
+    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    const auto file = session.folder().write("layout/zz.reg", "damaged");
+    EXPECT_THAT(apps(),
+                HasSubstr("\nThe values for everybody in " + file.string() + " do not count: in line 1 "));
+    EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
+}
+
+TEST_F(Layout, IsNotPartOfWhatAPersonExports)
+{
+    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    const auto file = session.folder() / "mine.reg";
+    const auto exported = session.run({"REGISTRY EXPORT " + std::string(kSuiteKey) + " " + file.string()});
+    EXPECT_THAT(exported.output, HasSubstr("there is no such key.\n"));
+}
