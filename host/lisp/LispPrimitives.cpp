@@ -204,6 +204,15 @@ cl_object interruptWanted()
     return answer(interrupter && interrupter->takeRequest() ? ECL_T : ECL_NIL);
 }
 
+// By one of ECL's readers, which answers with nothing at all where the text ends before an object does.
+cl_object readBy(cl_object reader, cl_object stream, cl_object subcharacter, cl_object argument)
+{
+    cl_object object = cl_funcall(4, reader, stream, subcharacter, argument);
+    if (!object)
+        FEend_of_file(stream);
+    return answer(object);
+}
+
 // Half of the reserve is for the error, half for the error in its handler.
 std::ptrdiff_t sizeWithoutReserve(cl_index size, int reserve)
 {
@@ -237,6 +246,7 @@ void defineLispPrimitives()
     define("%END-FILES", endFiles);
     define("%RECORD-LOADED", recordLoaded);
     define("%FILE-FAILED", fileFailed);
+    define("%READ-BY", readBy);
     define("%RESTORE-STACK-LIMITS", restoreStackLimits);
     define("%INTERRUPT-WANTED", interruptWanted);
 }

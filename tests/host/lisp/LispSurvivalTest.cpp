@@ -95,11 +95,26 @@ TEST_F(LispSurvival, OfDeepLists)
 TEST_F(LispSurvival, OfTextThatIsCutShortWhereAReaderWantsAnObject)
 {
     for (const char* text :
-         {"#p", "#P ", "(a #p", "#p#p", "#1=", "#1= ; x", "#1=;", "#1=#|x|#", "#1=#|x|#;y", "#1=#p", "(#1=#"})
+         {"#p", "#P ", "(a #p", "#p#p", "#1=", "#1= ; x", "#1=;", "#1=#|x|#", "#1=#|x|#;y", "#1=#p", "(#1=#",
+          "#$", "#$ ; x", "(#$#|x|#", "#1=#+nil x", "#1=#-ecl x", "#1=(#$"})
         EXPECT_THAT(session.error("(read-from-string \"" + std::string(text) + "\")"),
                     Not(testing::IsEmpty()))
             << text;
     EXPECT_EQ(session.value("(list #p\"/tmp/x\" #1=#|y|# 5 #1#)"), "(#P\"/tmp/x\" 5 5)");
+}
+
+// Whatever character it is: what follows is skipped, and then nothing is left.
+TEST_F(LispSurvival, OfEveryReaderAtTheEndOfATextThatSkipsTheLastObject)
+{
+    for (char character = '!'; character <= '~'; ++character)
+        for (const std::string before : {"", "#", "#1", "(#", "'#1"})
+            for (const std::string after : {"", " ", "#+nil x", "#|x|#", "; x"})
+            {
+                const std::string letter = character == '"' || character == '\\' ? "\\" : "";
+                const std::string text = before + letter + character + after;
+                EXPECT_EQ(session.value("(progn (ignore-errors (read-from-string \"" + text + "\")) 7)"),
+                          "7");
+            }
 }
 
 TEST_F(LispSurvival, OfAttemptsToEndTheProcess)
