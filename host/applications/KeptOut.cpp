@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <charconv>
+#include <csignal>
 #include <ctime>
 #include <string_view>
 
@@ -154,7 +155,7 @@ bool isGuilty(const RunningMarker::Leftover& leftover)
 {
     const bool fromOutside = leftover.ending == RunningMarker::kVanished ||
                              leftover.ending == RunningMarker::kCalledExit ||
-                             leftover.ending == RunningMarker::kEndedByKey;
+                             leftover.ending == RunningMarker::kEndedByKey || leftover.ending == SIGINT;
     return !leftover.work.path.empty() && !(leftover.work.waitsForPerson && fromOutside);
 }
 

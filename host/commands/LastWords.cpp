@@ -61,12 +61,18 @@ private:
     std::size_t mLength = 0;
 };
 
+// Nothing of what waits for a person is running, as far as anybody knows.
+bool isAnothersDoing(int ending, const RunningMarker::AtWork& work)
+{
+    return work.waitsForPerson && (ending == RunningMarker::kCalledExit || ending == SIGINT);
+}
+
 // False when no application is at work.
 bool speak(int ending)
 {
     RunningMarker* marker = running<RunningMarker>();
     RunningMarker::AtWork work{};
-    if (!marker || !marker->innermost(work) || (ending == RunningMarker::kCalledExit && work.waitsForPerson))
+    if (!marker || !marker->innermost(work) || isAnothersDoing(ending, work))
         return false;
     marker->noteEnding(ending);
     static Line line;

@@ -300,6 +300,7 @@ std::string_view wordsForEnding(int ending) noexcept
                                        {SIGQUIT, "quit from outside (SIGQUIT)"},
                                        {SIGTERM, "it did not come back (SIGTERM)"},
                                        {SIGHUP, "it did not come back (SIGHUP)"},
+                                       {SIGINT, "it did not come back (SIGINT)"},
                                        {SIGXCPU, "too much time used (SIGXCPU)"}};
     for (const Words& words : kWords)
         if (words.ending == ending)

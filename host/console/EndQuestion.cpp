@@ -66,17 +66,17 @@ char readAnswer(int terminal)
 }
 } // namespace
 
-bool endIsWanted() noexcept
+EndAnswer askWhetherToEnd() noexcept
 {
     const Descriptor terminal(open("/dev/tty", O_RDWR | O_CLOEXEC | O_NOCTTY));
     if (!terminal || tcgetpgrp(terminal.number()) != getpgrp())
-        return false;
+        return EndAnswer::kNobodyToAsk;
     const LineMode lines(terminal.number());
     show(terminal.number(), kQuestion);
     const char answer = readAnswer(terminal.number());
     if (answer == 'y' || answer == 'Y')
-        return true;
+        return EndAnswer::kEnd;
     show(terminal.number(), kNo);
-    return false;
+    return EndAnswer::kWaitOn;
 }
 } // namespace tessel

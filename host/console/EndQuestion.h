@@ -3,7 +3,14 @@
 
 namespace tessel
 {
+enum class EndAnswer
+{
+    kEnd,
+    kWaitOn,
+    kNobodyToAsk // there is no terminal whose foreground the program has
+};
+
 // Asks the person at the terminal and waits for the answer; safe in a signal handler, which is the only place
-// left to ask from. False without a terminal whose foreground the program has.
-bool endIsWanted() noexcept;
+// left to ask from.
+EndAnswer askWhetherToEnd() noexcept;
 } // namespace tessel

@@ -1,11 +1,13 @@
 #include "host/console/InterruptKey.h"
 
 #include <cerrno>
+#include <string_view>
 #include <utility>
 
 #include <fcntl.h>
 #include <unistd.h>
 
+#include "host/commands/LastWords.h"
 #include "host/console/EndQuestion.h"
 
 namespace tessel
@@ -17,19 +19,40 @@ LineRunner* theKeysRunner = nullptr;
 volatile std::sig_atomic_t theWriteEnd = -1;
 
 constexpr int kEndedByKey = 128 + SIGINT; // as shells have it
+constexpr std::string_view kNobodysFault = "Tessel ends: what is running does not come back.\n";
+
+// Who has sent the signal for the third time means it: there is no other way to tell an application that does
+// not come back.
+void sayWhyItEnds()
+{
+    if (sayLastWords(SIGINT))
+        return;
+    [[maybe_unused]] const auto written =
+        write(STDERR_FILENO, kNobodysFault.data(), kNobodysFault.size());
+}
 
 // What runs would have to come back for a better end.
-[[noreturn]] void endAtOnce()
+void endUnlessSomebodyWaits()
 {
-    theKeysRunner->noteEndByKey();
+    switch (askWhetherToEnd())
+    {
+    case EndAnswer::kWaitOn:
+        return;
+    case EndAnswer::kEnd:
+        theKeysRunner->noteEndByKey();
+        break;
+    case EndAnswer::kNobodyToAsk:
+        sayWhyItEnds();
+        break;
+    }
     _exit(kEndedByKey);
 }
 
 void onKey(int)
 {
     const int before = errno;
-    if (theKeysRunner->interrupt() && endIsWanted())
-        endAtOnce();
+    if (theKeysRunner->interrupt())
+        endUnlessSomebodyWaits();
     // A pipe that is full has notes enough.
     [[maybe_unused]] const auto written = write(theWriteEnd, "", 1);
     errno = before;

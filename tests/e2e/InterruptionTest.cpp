@@ -177,13 +177,40 @@ TEST_F(Interruption, DoesNotAskWhileLispObeys)
     expectGoodEnd(terminal);
 }
 
-TEST_F(Interruption, WithoutATerminalAsksNobody)
+// Standard input is a file, as in a pipeline or under a service that somebody ends by its key.
+class InterruptionWithoutATerminal : public Interruption
 {
-    session.startBy(
-        "setsid \"$0\" \"$@\" & until [ -e '" + file().string() +
-        ".begun' ]; do :; done; for press in 1 2 3 4; do kill -INT $!; sleep 0.05; done; touch '" +
-        file().string() + "'; wait $!");
-    const auto result = session.run({"LOAD " + fixtureModule("Hangs.zmb"), "HANG"});
+protected:
+    HostResult hangAndPress(int presses)
+    {
+        std::string counted;
+        for (int press = 1; press <= presses; ++press)
+            counted += " " + std::to_string(press);
+        session.startBy("setsid \"$0\" \"$@\" & until [ -e '" + file().string() +
+                        ".begun' ]; do :; done; for press in" + counted +
+                        "; do kill -INT $!; sleep 0.1; done; touch '" + file().string() + "'; wait $!");
+        const auto result = session.run({"LOAD " + hanging, "HANG"});
+        session.startBy("exec \"$0\" \"$@\"");
+        return result;
+    }
+
+    std::string hanging = fixtureModule("Hangs.zmb");
+};
+
+TEST_F(InterruptionWithoutATerminal, EndsTheHostAtTheThirdTimeAndNamesTheApplication)
+{
+    const auto result = hangAndPress(kInVain);
+    EXPECT_EQ(result.exitStatus, kEndedByKey) << result.output;
+    EXPECT_THAT(result.output, HasSubstr("hanging\nThe application \"" + hanging +
+                                         "\" has ended Tessel while its command \"HANG\" ran: it did not "
+                                         "come back (SIGINT).\n"));
+    EXPECT_THAT(session.run({}).output, HasSubstr("while its command \"HANG\" ran (asked for by hand): it did "
+                                                  "not come back (SIGINT). "));
+}
+
+TEST_F(InterruptionWithoutATerminal, GoesOnWhenThereWereFewer)
+{
+    const auto result = hangAndPress(kInVain - 1);
     EXPECT_EQ(result.exitStatus, 0) << result.output;
     EXPECT_THAT(result.output, HasSubstr("hanging\nback again\n"));
 }
