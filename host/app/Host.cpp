@@ -168,7 +168,8 @@ bool Host::run(const std::wstring& input)
     const Interruption::Work work(mInterruption);
     if (!isLisp(input))
         return mParts->commandRunner.run(input);
-    const auto value = mParts->lisp->evaluate(input);
+    const Interruption::Wish wish(mInterruption);
+    const auto value = mParts->lisp->evaluate(input, &wish);
     if (mCommandLine.tell(value) && !value->empty())
         mCommandLine.say(*value);
     return finishLine() && value;
@@ -215,11 +216,13 @@ void Host::end()
 bool Host::interrupt() noexcept
 {
     LispInterpreter* lisp = mInterruptible;
+    // First: what begins meanwhile finds the wish, or is found at work.
+    const bool inVain = mInterruption.press(lisp ? lisp->evaluations() : 0);
     if (lisp)
         lisp->interrupt();
     if (Registry* registry = mInterruptibleRegistry)
         registry->interrupt();
-    return mInterruption.press(lisp ? lisp->evaluations() : 0);
+    return inVain;
 }
 
 void Host::noteEndByKey() noexcept

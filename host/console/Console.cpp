@@ -27,7 +27,13 @@ void Console::converse(LineEditor& editor, TypedHistory& history)
     {
         std::wstring line;
         makeRoomForPrompt(prompt(input));
-        const auto outcome = editor.read(prompt(input), line);
+        auto outcome = editor.read(prompt(input), line);
+        if (outcome == LineEditor::Outcome::kLine)
+        {
+            mCommandLine.tell(history.add(line));
+            if (editor.isInterrupted()) // nobody wants what they have stopped before it ran
+                outcome = LineEditor::Outcome::kInterrupted;
+        }
         if (outcome != LineEditor::Outcome::kLine)
             mCommandLine.print(L"\n");
         if (outcome == LineEditor::Outcome::kEnd)
@@ -37,7 +43,6 @@ void Console::converse(LineEditor& editor, TypedHistory& history)
             input.discard();
             continue;
         }
-        mCommandLine.tell(history.add(line));
         if (const auto whole = input.add(line))
             mRunner.run(*whole);
     }

@@ -8,25 +8,50 @@
 
 namespace tessel
 {
+InputSource::InputSource(int interruptKey, int endRequest)
+    : mInput(STDIN_FILENO), mInterruptKey(interruptKey), mEndRequest(endRequest)
+{
+}
+
+InputSource InputSource::from(int input) const
+{
+    InputSource other = *this;
+    other.mInput = input;
+    return other;
+}
+
 InputSource::Outcome InputSource::wait() const
 {
     std::array<pollfd, 3> sources = {
-        {{STDIN_FILENO, POLLIN, 0}, {mInterruptKey, POLLIN, 0}, {mEndRequest, POLLIN, 0}}};
+        {{mInput, POLLIN, 0}, {mInterruptKey, POLLIN, 0}, {mEndRequest, POLLIN, 0}}};
     while (poll(sources.data(), sources.size(), -1) < 0)
         if (errno != EINTR)
             return Outcome::kEnd;
     if (sources[2].revents != 0)
         return Outcome::kEnd;
-    return sources[1].revents != 0 ? Outcome::kInterrupted : Outcome::kReady;
+    return sources[1].revents != 0 ? Outcome::kInterrupted : Outcome::kBytes;
 }
 
-std::size_t InputSource::read(char* bytes, std::size_t size) const
+// A terminal that forgets what was typed, as it does at Ctrl-C, takes away what there was to read.
+InputSource::Outcome InputSource::read(char* bytes, std::size_t size, std::size_t& count) const
 {
-    ssize_t count = 0;
-    do
-        count = ::read(STDIN_FILENO, bytes, size);
-    while (count < 0 && errno == EINTR);
-    return count > 0 ? static_cast<std::size_t>(count) : 0;
+    for (;;)
+    {
+        if (const Outcome waited = wait(); waited != Outcome::kBytes)
+            return waited;
+        const ssize_t came = ::read(mInput, bytes, size);
+        count = came > 0 ? static_cast<std::size_t>(came) : 0;
+        if (came > 0)
+            return Outcome::kBytes;
+        if (came == 0 || (errno != EINTR && errno != EAGAIN))
+            return Outcome::kEnd;
+    }
+}
+
+bool InputSource::isInterrupted() const
+{
+    pollfd key = {mInterruptKey, POLLIN, 0};
+    return poll(&key, 1, 0) > 0;
 }
 
 void InputSource::forgetInterrupts() const

@@ -10,24 +10,30 @@ class InputSource
 public:
     enum class Outcome
     {
-        kReady, // bytes can be read, or the end of the input
+        kBytes,
         kInterrupted,
-        kEnd // the session is to end
+        kEnd // of the input, or of the session
     };
 
     // Descriptors, -1 for none. `interruptKey` does not block, and can be read from when the key was pressed;
     // `endRequest` when the session is to end.
-    InputSource(int interruptKey, int endRequest) : mInterruptKey(interruptKey), mEndRequest(endRequest) {}
+    InputSource(int interruptKey, int endRequest);
 
-    Outcome wait() const;
+    // The same from another descriptor than standard input, which may be one that does not block.
+    InputSource from(int input) const;
 
-    // The number of bytes that came, at most `size`; 0 at the end of the input.
-    std::size_t read(char* bytes, std::size_t size) const;
+    // Waits for bytes, and takes at most `size` of them; `count` is set for kBytes only, and not 0 then.
+    Outcome read(char* bytes, std::size_t size, std::size_t& count) const;
 
+    // Whether the key was pressed since that was last forgotten.
+    bool isInterrupted() const;
     // Forgets what was pressed before now.
     void forgetInterrupts() const;
 
 private:
+    Outcome wait() const;
+
+    int mInput;
     int mInterruptKey;
     int mEndRequest;
 };

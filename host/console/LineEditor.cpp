@@ -144,4 +144,9 @@ LineEditor::Outcome LineEditor::read(const std::wstring& prompt, std::wstring& l
         line.pop_back();
     return Outcome::kLine;
 }
+
+bool LineEditor::isInterrupted() const
+{
+    return mTerminal->input.isInterrupted();
+}
 } // namespace tessel

@@ -32,6 +32,9 @@ public:
     // Waits for a line; `line` is set for kLine only, without its line break.
     Outcome read(const std::wstring& prompt, std::wstring& line);
 
+    // Whether Ctrl-C was pressed since the prompt was shown.
+    bool isInterrupted() const;
+
 private:
     struct Terminal;
     std::unique_ptr<Terminal> mTerminal;

@@ -2,6 +2,9 @@
 
 #include <cwchar>
 
+#include <fcntl.h>
+#include <unistd.h>
+
 namespace tessel
 {
 namespace
@@ -9,7 +12,33 @@ namespace
 constexpr wchar_t kReplacement = 0xFFFD;
 constexpr auto kIncomplete = static_cast<std::size_t>(-2);
 constexpr auto kInvalid = static_cast<std::size_t>(-1);
+
+// None where the system does not say which terminal it is, or where it is another person's.
+Descriptor openTerminal()
+{
+    const char* name = ttyname(STDIN_FILENO);
+    return Descriptor(name ? open(name, O_RDONLY | O_NONBLOCK | O_NOCTTY | O_CLOEXEC) : -1);
+}
+
+TerminalInput::Outcome outcomeOf(InputSource::Outcome outcome)
+{
+    switch (outcome)
+    {
+    case InputSource::Outcome::kBytes:
+        return TerminalInput::Outcome::kCharacter;
+    case InputSource::Outcome::kInterrupted:
+        return TerminalInput::Outcome::kInterrupted;
+    case InputSource::Outcome::kEnd:
+        break;
+    }
+    return TerminalInput::Outcome::kEnd;
+}
 } // namespace
+
+TerminalInput::TerminalInput(const InputSource& source)
+    : mTerminal(openTerminal()), mSource(mTerminal ? source.from(mTerminal.number()) : source)
+{
+}
 
 TerminalInput::Outcome TerminalInput::read(wchar_t& character)
 {
@@ -17,22 +46,14 @@ TerminalInput::Outcome TerminalInput::read(wchar_t& character)
     for (;;)
     {
         char byte = 0;
-        if (const Outcome outcome = readByte(byte); outcome != Outcome::kCharacter)
-            return outcome;
+        std::size_t count = 0;
+        if (const auto outcome = mSource.read(&byte, 1, count); outcome != InputSource::Outcome::kBytes)
+            return outcomeOf(outcome);
         const std::size_t used = std::mbrtowc(&character, &byte, 1, &state);
         if (used == kInvalid)
             character = kReplacement;
         if (used != kIncomplete)
             return Outcome::kCharacter;
     }
-}
-
-TerminalInput::Outcome TerminalInput::readByte(char& byte) const
-{
-    const InputSource::Outcome waited = mSource.wait();
-    if (waited == InputSource::Outcome::kInterrupted)
-        return Outcome::kInterrupted;
-    const bool came = waited == InputSource::Outcome::kReady && mSource.read(&byte, 1) == 1;
-    return came ? Outcome::kCharacter : Outcome::kEnd;
 }
 } // namespace tessel

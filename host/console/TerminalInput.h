@@ -2,6 +2,7 @@
 #pragma once
 
 #include "host/console/InputSource.h"
+#include "host/platform/Descriptor.h"
 
 namespace tessel
 {
@@ -15,17 +16,19 @@ public:
         kEnd // of the input, or of the session
     };
 
-    explicit TerminalInput(InputSource source) : mSource(source) {}
+    explicit TerminalInput(const InputSource& source);
 
     // Waits for a character in the encoding of the locale; what is no character becomes U+FFFD.
     Outcome read(wchar_t& character);
 
     // Forgets what was pressed before now.
     void forgetInterrupts() const { mSource.forgetInterrupts(); }
+    // Whether the key was pressed since.
+    bool isInterrupted() const { return mSource.isInterrupted(); }
 
 private:
-    Outcome readByte(char& byte) const;
-
+    // The terminal opened for ourselves, so that reading does not block while other programs' does.
+    Descriptor mTerminal;
     InputSource mSource;
 };
 } // namespace tessel

@@ -96,12 +96,12 @@ Result<LispMachine*> LispInterpreter::machine()
     return mMachine.get();
 }
 
-Result<std::wstring> LispInterpreter::evaluate(std::wstring_view expressions)
+Result<std::wstring> LispInterpreter::evaluate(std::wstring_view expressions, const Interruption::Wish* wish)
 {
     const std::size_t depth = mMarker.depth();
     mLoads->begin();
     const auto machine = this->machine();
-    auto value = machine ? (*machine)->evaluate(expressions) : machine.failure();
+    auto value = machine ? (*machine)->evaluate(expressions, wish) : machine.failure();
     const int code = mLoads->end(value);
     mMarker.endTo(depth); // Lisp may have been left by a jump
     if (code == Admission::kToldAtStart)

@@ -8,6 +8,7 @@
 #include <string>
 #include <string_view>
 
+#include "host/commands/Interruption.h"
 #include "host/commands/RunningMarker.h"
 #include "host/text/Result.h"
 
@@ -49,8 +50,9 @@ public:
 
     // What a typed line does: every form is evaluated, the printed value is that of the last, empty when
     // there is none to show. What is said of a failure is one line of error text; that Lisp does not start
-    // is one, too, and the next expression tries it again.
-    Result<std::wstring> evaluate(std::wstring_view expressions);
+    // is one, too, and the next expression tries it again. A wish that is there when Lisp begins interrupts
+    // it: the key may have been pressed before it runs.
+    Result<std::wstring> evaluate(std::wstring_view expressions, const Interruption::Wish* wish = nullptr);
 
     bool removingTsLisp() const { return mOptions.removingTsLisp; }
 

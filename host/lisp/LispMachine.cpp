@@ -25,6 +25,7 @@ struct LispCall
     std::wstring_view text{};
     std::wstring_view name{};               // with COMPILE-TEXT
     const TsResultBuffer* values = nullptr; // with INVOKE
+    const Interruption::Wish* wish = nullptr;
 };
 
 cl_object apply(const LispCall& call)
@@ -139,6 +140,8 @@ struct LispMachine::Session
     {
         const std::size_t memoryBefore = cl_core.max_heap_size;
         interrupter.begin();
+        if (call.wish && call.wish->isThere())
+            interrupter.interrupt();
         cl_object pair = applyProtected(call);
         const bool interrupted = interrupter.hasTakenRequest();
         interrupter.end();
@@ -200,12 +203,12 @@ Result<std::unique_ptr<LispMachine>> LispMachine::start(LispSurroundings surroun
 
 LispMachine::~LispMachine() = default;
 
-Result<std::wstring> LispMachine::evaluate(std::wstring_view forms)
+Result<std::wstring> LispMachine::evaluate(std::wstring_view forms, const Interruption::Wish* wish)
 {
     if (findTooDeepForm(forms))
         return Failure{L"The expression is nested more than " + std::to_wstring(kDeepestNesting) +
                        L" levels deep."};
-    return mSession->runForText({.function = lispFunctions().evaluate, .text = forms});
+    return mSession->runForText({.function = lispFunctions().evaluate, .text = forms, .wish = wish});
 }
 
 Result<std::wstring> LispMachine::compile(const std::wstring& name, std::wstring_view text)

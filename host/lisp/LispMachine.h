@@ -13,6 +13,7 @@
 #include <string>
 #include <string_view>
 
+#include "host/commands/Interruption.h"
 #include "host/text/Result.h"
 
 struct TsResultBuffer;
@@ -59,7 +60,8 @@ public:
     static constexpr int kLeftByJump = 2;
 
     // Every form, one after the other; the printed value of the last, empty where there is none to print.
-    Result<std::wstring> evaluate(std::wstring_view forms);
+    // A wish that is there when Lisp begins interrupts it.
+    Result<std::wstring> evaluate(std::wstring_view forms, const Interruption::Wish* wish = nullptr);
 
     // Calls the function named by the first value with the rest. The values are the caller's to free, null
     // for nil.

@@ -177,6 +177,52 @@ TEST_F(Interruption, DoesNotAskWhileLispObeys)
     expectGoodEnd(terminal);
 }
 
+// Right after a line, in the same breath: the terminal forgets what was typed, which somebody may be about to
+// take.
+class InterruptionInTheSameBreath : public Interruption
+{
+protected:
+    InterruptionInTheSameBreath() { session.set("LD_PRELOAD", PRESSES_CONTROL_C); }
+};
+
+TEST_F(InterruptionInTheSameBreath, ShowsAPromptWhenTheTerminalForgetsWhatWasTyped)
+{
+    session.set("PRESS_WHEN", "read");
+    HostTerminal terminal(session);
+    type(terminal, "(progn (print :ran) (loop))");
+    type(terminal, "(+ 30 12)"); // at the next prompt, which comes by itself
+    EXPECT_TRUE(terminal.shows("\n42")) << terminal.screen();
+    EXPECT_THAT(terminal.screen(), Not(HasSubstr("\n:RAN")));
+    EXPECT_EQ(terminal.quit(), 0);
+}
+
+TEST_F(InterruptionInTheSameBreath, KeepsTheLineFromRunning)
+{
+    session.set("PRESS_WHEN", "run");
+    HostTerminal terminal(session);
+    type(terminal, "(progn (print :ran) (loop))");
+    type(terminal, "(+ 30 12)");
+    EXPECT_TRUE(terminal.shows("\n42")) << terminal.screen();
+    EXPECT_THAT(terminal.screen(), Not(HasSubstr("\n:RAN")));
+    EXPECT_EQ(terminal.quit(), 0);
+}
+
+// As it happens to a person, who hits another moment each time.
+TEST_F(InterruptionInTheSameBreath, LeavesAPromptWheneverItComes)
+{
+    HostTerminal terminal(session);
+    for (int time = 0; time < 300; ++time)
+    {
+        ASSERT_TRUE(terminal.showsWithin("Command: ", std::chrono::seconds(10))) << time << terminal.screen();
+        terminal.type("(loop)\r");
+        const auto moment = std::chrono::steady_clock::now() + std::chrono::microseconds(time);
+        while (std::chrono::steady_clock::now() < moment)
+        {
+        }
+        terminal.type(kControlC);
+    }
+}
+
 // Standard input is a file, as in a pipeline or under a service that somebody ends by its key.
 class InterruptionWithoutATerminal : public Interruption
 {

@@ -3,6 +3,7 @@
 
 #include <gmock/gmock.h>
 
+#include "host/commands/Interruption.h"
 #include "tests/host/lisp/LispSession.h"
 #include "tests/support/TemporaryFolder.h"
 
@@ -33,6 +34,19 @@ TEST_F(LispInterrupt, StopsAnEndlessLoop)
     EXPECT_EQ(interrupted("(loop)"), "Lisp was interrupted.");
     EXPECT_EQ(session.output(), "begun");
     EXPECT_FALSE(session.lisp().running());
+}
+
+TEST(LispInterruptBeforeItsTime, StopsLispThatHasNotBegunYet)
+{
+    LispSession session;
+    const tessel::EndRequest endRequest;
+    tessel::Interruption interruption(endRequest);
+    const tessel::Interruption::Work work(interruption);
+    const tessel::Interruption::Wish wish(interruption);
+    EXPECT_EQ(*session.lisp().evaluate(L"(+ 1 2)", &wish), L"3");
+    interruption.press(session.lisp().evaluations());
+    session.lisp().interrupt(); // as the key does it: nothing runs yet that this could stop
+    EXPECT_EQ(session.lisp().evaluate(L"(loop)", &wish).sentence(), L"Lisp was interrupted.");
 }
 
 TEST_F(LispInterrupt, LeavesLispInOrder)
