@@ -166,9 +166,10 @@ bool Host::run(const std::wstring& input)
 {
     const AutoreleasePool pool;
     const Interruption::Work work(mInterruption);
+    const Interruption::Wish wish =
+        std::exchange(mTypedLine, std::nullopt).value_or(Interruption::Wish(mInterruption));
     if (!isLisp(input))
         return mParts->commandRunner.run(input);
-    const Interruption::Wish wish(mInterruption);
     const auto value = mParts->lisp->evaluate(input, &wish);
     if (mCommandLine.tell(value) && !value->empty())
         mCommandLine.say(*value);

@@ -17,6 +17,7 @@
 #include <atomic>
 #include <filesystem>
 #include <memory>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -66,6 +67,8 @@ public:
     // Unloads every application, stores the registry, and takes the parts down.
     void end();
 
+    void lineBegins() override { mTypedLine.emplace(mInterruption); }
+    bool isLineInterrupted() const override { return mTypedLine && mTypedLine->isThere(); }
     bool isEnding() const override { return mEndRequest.isMade(); }
     bool interrupt() noexcept override;
     void noteEndByKey() noexcept override;
@@ -99,6 +102,7 @@ private:
     std::atomic<RunningMarker*> mMarker = nullptr;
     EndRequest mEndRequest;
     Interruption mInterruption{mEndRequest};
+    std::optional<Interruption::Wish> mTypedLine; // that it is not run; until it is
     int mScriptDepth = 0;
 };
 } // namespace tessel

@@ -27,11 +27,13 @@ void Console::converse(LineEditor& editor, TypedHistory& history)
     {
         std::wstring line;
         makeRoomForPrompt(prompt(input));
+        editor.forgetInterrupts();
+        mRunner.lineBegins();
         auto outcome = editor.read(prompt(input), line);
         if (outcome == LineEditor::Outcome::kLine)
         {
             mCommandLine.tell(history.add(line));
-            if (editor.isInterrupted()) // nobody wants what they have stopped before it ran
+            if (mRunner.isLineInterrupted()) // nobody wants what they have stopped before it ran
                 outcome = LineEditor::Outcome::kInterrupted;
         }
         if (outcome != LineEditor::Outcome::kLine)

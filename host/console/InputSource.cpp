@@ -48,12 +48,6 @@ InputSource::Outcome InputSource::read(char* bytes, std::size_t size, std::size_
     }
 }
 
-bool InputSource::isInterrupted() const
-{
-    pollfd key = {mInterruptKey, POLLIN, 0};
-    return poll(&key, 1, 0) > 0;
-}
-
 void InputSource::forgetInterrupts() const
 {
     std::array<char, 64> notes;

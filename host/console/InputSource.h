@@ -25,8 +25,6 @@ public:
     // Waits for bytes, and takes at most `size` of them; `count` is set for kBytes only, and not 0 then.
     Outcome read(char* bytes, std::size_t size, std::size_t& count) const;
 
-    // Whether the key was pressed since that was last forgotten.
-    bool isInterrupted() const;
     // Forgets what was pressed before now.
     void forgetInterrupts() const;
 

@@ -27,8 +27,7 @@ void sayWhyItEnds()
 {
     if (sayLastWords(SIGINT))
         return;
-    [[maybe_unused]] const auto written =
-        write(STDERR_FILENO, kNobodysFault.data(), kNobodysFault.size());
+    [[maybe_unused]] const auto written = write(STDERR_FILENO, kNobodysFault.data(), kNobodysFault.size());
 }
 
 // What runs would have to come back for a better end.

@@ -1,6 +1,6 @@
 // Ctrl-C: it stops what is running in the host, not the host. Where it is pressed in vain, the person at the
-// terminal is asked whether the program is to end all the same; where nobody can be asked, it ends. Its status
-// is 130 then.
+// terminal is asked whether the program is to end all the same; where nobody can be asked, it ends. Its
+// status is 130 then.
 #pragma once
 
 #include <csignal>

@@ -132,7 +132,6 @@ LineEditor::Outcome LineEditor::read(const std::wstring& prompt, std::wstring& l
     // Before the prompt invites to type: a Ctrl-D that the terminal still takes for the end of a line is
     // lost.
     el_wset(mTerminal->editLine, EL_PREP_TERM, 1);
-    mTerminal->input.forgetInterrupts();
     int length = 0;
     errno = 0;
     const wchar_t* typed = el_wgets(mTerminal->editLine, &length);
@@ -145,8 +144,8 @@ LineEditor::Outcome LineEditor::read(const std::wstring& prompt, std::wstring& l
     return Outcome::kLine;
 }
 
-bool LineEditor::isInterrupted() const
+void LineEditor::forgetInterrupts() const
 {
-    return mTerminal->input.isInterrupted();
+    mTerminal->input.forgetInterrupts();
 }
 } // namespace tessel

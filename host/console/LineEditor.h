@@ -29,11 +29,11 @@ public:
         kEnd          // Ctrl-D on an empty line, the terminal has gone, or the session is to end
     };
 
+    // Forgets what of Ctrl-C was pressed before now.
+    void forgetInterrupts() const;
+
     // Waits for a line; `line` is set for kLine only, without its line break.
     Outcome read(const std::wstring& prompt, std::wstring& line);
-
-    // Whether Ctrl-C was pressed since the prompt was shown.
-    bool isInterrupted() const;
 
 private:
     struct Terminal;

@@ -17,6 +17,11 @@ public:
     // False when it was unknown or failed, which has been told by then.
     virtual bool run(const std::wstring& input) = 0;
 
+    // A person is about to type the next line, and whether Ctrl-C was pressed since. Lisp that is run next
+    // stops at once if it was.
+    virtual void lineBegins() = 0;
+    virtual bool isLineInterrupted() const = 0;
+
     // Whether the session is to end.
     virtual bool isEnding() const = 0;
 

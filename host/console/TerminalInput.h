@@ -23,8 +23,6 @@ public:
 
     // Forgets what was pressed before now.
     void forgetInterrupts() const { mSource.forgetInterrupts(); }
-    // Whether the key was pressed since.
-    bool isInterrupted() const { return mSource.isInterrupted(); }
 
 private:
     // The terminal opened for ourselves, so that reading does not block while other programs' does.

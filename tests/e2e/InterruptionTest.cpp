@@ -250,8 +250,9 @@ TEST_F(InterruptionWithoutATerminal, EndsTheHostAtTheThirdTimeAndNamesTheApplica
     EXPECT_THAT(result.output, HasSubstr("hanging\nThe application \"" + hanging +
                                          "\" has ended Tessel while its command \"HANG\" ran: it did not "
                                          "come back (SIGINT).\n"));
-    EXPECT_THAT(session.run({}).output, HasSubstr("while its command \"HANG\" ran (asked for by hand): it did "
-                                                  "not come back (SIGINT). "));
+    EXPECT_THAT(session.run({}).output,
+                HasSubstr("while its command \"HANG\" ran (asked for by hand): it did "
+                          "not come back (SIGINT). "));
 }
 
 TEST_F(InterruptionWithoutATerminal, GoesOnWhenThereWereFewer)

@@ -1,6 +1,6 @@
-// Loaded in front of the system's libraries: presses Ctrl-C at moments that no person meets twice. PRESS_WHEN in
-// the environment says at which: "read" when typed text is there and not taken yet, as the terminal does it: the
-// text is gone; "run" when the line was taken and joins the typed history.
+// Loaded in front of the system's libraries: presses Ctrl-C at moments that no person meets twice. PRESS_WHEN
+// in the environment says at which: "read" when typed text is there and not taken yet, as the terminal does
+// it: the text is gone; "run" when the line was taken and joins the typed history.
 #include <cstdlib>
 #include <string>
 #include <string_view>

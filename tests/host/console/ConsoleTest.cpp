@@ -29,6 +29,8 @@ public:
             mCommandLine.print(L"no line break");
         return input != L"BAD";
     }
+    void lineBegins() override {}
+    bool isLineInterrupted() const override { return false; }
     bool isEnding() const override { return mEnding; }
     bool interrupt() noexcept override { return false; }
     void noteEndByKey() noexcept override {}

@@ -15,6 +15,8 @@ class EndingRunner : public tessel::LineRunner
 {
 public:
     bool run(const std::wstring&) override { return true; }
+    void lineBegins() override {}
+    bool isLineInterrupted() const override { return false; }
     bool isEnding() const override { return mEnding; }
     bool interrupt() noexcept override { return false; }
     void noteEndByKey() noexcept override {}

@@ -16,6 +16,8 @@ class CountingRunner : public tessel::LineRunner
 {
 public:
     bool run(const std::wstring&) override { return true; }
+    void lineBegins() override {}
+    bool isLineInterrupted() const override { return false; }
     bool isEnding() const override { return mEnds > 0; }
     bool interrupt() noexcept override
     {
