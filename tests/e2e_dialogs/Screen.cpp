@@ -124,9 +124,25 @@ void Screen::click(const std::string& window, Place place) const
     run("xdotool" + moveTo(window, place) + kPress);
 }
 
-void Screen::chooseFromMenuAt(const std::string& window, Place place, Place item) const
+void Screen::holdMenuOpenAt(const std::string& window, Place place) const
 {
     run("xdotool" + moveTo(window, place) + "mousedown 3 sleep 0.4");
+}
+
+void Screen::openMenuAt(const std::string& window, Place place) const
+{
+    holdMenuOpenAt(window, place);
+    letGoOfMenu();
+}
+
+void Screen::letGoOfMenu() const
+{
+    run("xdotool mouseup 3 sleep 0.4");
+}
+
+void Screen::chooseFromMenuAt(const std::string& window, Place place, Place item) const
+{
+    holdMenuOpenAt(window, place);
     run("xdotool" + moveTo(window, {place.x + item.x, place.y + item.y}) + "sleep 0.4 mouseup 3");
 }
 

@@ -48,6 +48,10 @@ public:
     void moveOn(const std::string& window, Place to) const;
     void letGo() const;
 
+    // Opens the menu of a place, by the other button, which is kept down, or clicked.
+    void holdMenuOpenAt(const std::string& window, Place place) const;
+    void openMenuAt(const std::string& window, Place place) const;
+    void letGoOfMenu() const;
     // Opens the menu of a place, by the other button, and lets go over one of its items: so far to the right
     // and below.
     void chooseFromMenuAt(const std::string& window, Place place, Place item) const;

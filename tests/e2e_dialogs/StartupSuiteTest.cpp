@@ -85,6 +85,38 @@ TEST_F(DialogStartupSuite, KeepsAFileOutAtStartsByTheMenuOfItsRow)
     EXPECT_THAT(output, HasSubstr("kept out at starts by DISABLE since "));
 }
 
+TEST_F(DialogStartupSuite, ClosesTheMenuOfARowByEscapeAndNothingElse)
+{
+    storeSuite({writeLisp("first.lsp")});
+    open();
+    openSuite();
+    const auto hasMenu = [this]
+    {
+        return !mScreen.window("Window").empty();
+    };
+    for (const bool isHeld : {false, true})
+    {
+        mScreen.holdMenuOpenAt(mSuite, places::kFirstSuiteRow);
+        if (!isHeld)
+            mScreen.letGoOfMenu();
+        ASSERT_TRUE(comesTrue(hasMenu)) << isHeld;
+        shoot("open");
+        press("x"); // is nobody's
+        mScreen.key("Escape");
+        EXPECT_TRUE(comesTrue([&] { return !hasMenu(); })) << isHeld;
+        if (isHeld)
+            mScreen.letGoOfMenu();
+        EXPECT_FALSE(mScreen.window(kSuiteDialog).empty()) << isHeld;
+        EXPECT_FALSE(mScreen.waitForActive(kSuiteDialog).empty()) << isHeld;
+    }
+    // The window goes on, and its own Escape is another one.
+    mScreen.chooseFromMenuAt(mSuite, places::kFirstSuiteRow, places::kKeepOutInSuiteMenu);
+    mScreen.key("Escape");
+    EXPECT_TRUE(mScreen.waitUntilGone(kSuiteDialog));
+    closeAndEnd();
+    EXPECT_THAT(runQuietly({"APPS"}), HasSubstr("kept out at starts by DISABLE since "));
+}
+
 TEST_F(DialogStartupSuite, ShowsTipsInAsManyLinesAsTheyNeed)
 {
     const std::string first = writeLisp(std::string(200, 'x') + ".lsp");

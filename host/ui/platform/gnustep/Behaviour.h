@@ -26,6 +26,9 @@ void keepScrollersSteady();
 // taken.
 void showWhereDropsLandInTables();
 
+// Lets Escape close an open menu, and no key that is pressed meanwhile go to the window under it.
+void letEscapeCloseMenus();
+
 // Draws whole pixels again when a view asks for it, whose edges lie within pixels at some scales.
 void drawWholePixels();
 

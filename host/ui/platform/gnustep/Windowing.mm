@@ -76,6 +76,7 @@ void completeBehaviour()
     keepModalWindowsInFront();
     keepScrollersSteady();
     showWhereDropsLandInTables();
+    letEscapeCloseMenus();
     drawWholePixels();
     placeContentsOfWindows();
     letTabsHaveTheKeyboard();
