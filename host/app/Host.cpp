@@ -37,6 +37,7 @@ bool Host::start()
     judgeEarlierSessions();
     const RunningMarker::ReasonScope atStart(*mParts->marker, RunningMarker::Reason::kAtStart);
     mParts->messageBox->collect();
+    mParts->loadOutcomes.expectSummary(true);
     if (!mOptions.safe)
     {
         mParts->sayRecordsTakenAlong();
@@ -65,6 +66,7 @@ void Host::tellOfStart()
 {
     const auto boxes = mParts->messageBox->takeCollected();
     noteRefusedFiles(boxes, mParts->loadOutcomes);
+    mParts->loadOutcomes.expectSummary(false);
     if (const auto summary = summarize(mParts->loadOutcomes.failed(), boxes))
         mParts->messageBox->show(summary->box, summary->lines, !summary->fits);
 }

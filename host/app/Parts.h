@@ -100,7 +100,9 @@ struct Parts
     DemandLoading demandLoading{folders.plugIns, *records, *linker, admission,
                                 [this](const std::wstring& path)
                                 {
-                                    return commandLine->tell(linker->load(path, kResolveNow));
+                                    const auto loaded = linker->load(path, kResolveNow);
+                                    return loadOutcomes.willBeTold(loaded.code()) ? static_cast<bool>(loaded)
+                                                                                  : commandLine->tell(loaded);
                                 }};
     Owned<Document> document;
     Owned<FileSearch> files{folders.resources, *variables};

@@ -114,7 +114,7 @@ bool DynamicLinker::loadModule(const wchar_t* path, bool sayWhyNot, bool resolve
         mMessageBox.passOver(fullPath);
     else
         mMessageBox.explain(fullPath, loaded.sentence() + L".");
-    if (sayWhyNot)
+    if (sayWhyNot && !mOutcomes.willBeTold(loaded.code()))
         mCommandLine.tell(whole(fullPath, loaded));
     return false;
 }

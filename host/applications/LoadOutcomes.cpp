@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <iterator>
 
+#include "host/applications/Admission.h"
+
 namespace tessel
 {
 void LoadOutcomes::note(const std::wstring& path, const Result<>& loaded, Clock::time_point begun)
@@ -13,6 +15,11 @@ void LoadOutcomes::note(const std::wstring& path, const Result<>& loaded, Clock:
         mOutcomes.push_back({path, loaded, took});
     else
         mOutcomes[known->second] = {path, loaded, took};
+}
+
+bool LoadOutcomes::willBeTold(int failureCode) const
+{
+    return mExpectsSummary && !Admission::isKeptOut(failureCode);
 }
 
 const LoadOutcome* LoadOutcomes::of(const std::wstring& path) const

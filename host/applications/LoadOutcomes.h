@@ -26,6 +26,11 @@ public:
     // Takes the place of what was noted of the path before.
     void note(const std::wstring& path, const Result<>& loaded, Clock::time_point begun);
 
+    // From now on, or no longer, a summary is to come: a failure that is noted need not be told at once. What
+    // is kept out has not failed, and no summary tells of it.
+    void expectSummary(bool isToCome) { mExpectsSummary = isToCome; }
+    bool willBeTold(int failureCode) const;
+
     // Null for a path of which nothing was noted.
     const LoadOutcome* of(const std::wstring& path) const;
 
@@ -35,5 +40,6 @@ public:
 private:
     std::vector<LoadOutcome> mOutcomes;
     std::unordered_map<std::wstring, std::size_t> mIndexes;
+    bool mExpectsSummary = false;
 };
 } // namespace tessel

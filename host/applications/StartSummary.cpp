@@ -65,6 +65,8 @@ std::wstring lineFor(const Entry& entry)
 {
     const bool isEnded =
         !entry.why.empty() && kEndsOfSentences.find(entry.why.back()) != std::wstring_view::npos;
+    if (quotedIn(entry.why) == entry.file) // a sentence of its own
+        return entry.why;
     return entry.file + L": " + entry.why + (isEnded ? L"" : L".");
 }
 

@@ -104,7 +104,8 @@ Result<std::wstring> LispInterpreter::evaluate(std::wstring_view expressions, co
     auto value = machine ? (*machine)->evaluate(expressions, wish) : machine.failure();
     const int code = mLoads->end(value);
     mMarker.endTo(depth); // Lisp may have been left by a jump
-    if (code == Admission::kToldAtStart)
+    const bool isTold = mOptions.outcomes && code != 0 && mOptions.outcomes->willBeTold(code);
+    if (code == Admission::kToldAtStart || isTold)
         return Failure{{}, code};
     return value;
 }

@@ -130,6 +130,6 @@ std::string startSummary(const std::vector<NotLoaded>& files)
                                          : "Message: " + std::to_string(files.size()) + " applications";
     text += " could not be loaded:\n";
     for (const auto& [file, why] : files)
-        text.append("  ").append(file).append(": ").append(why).append("\n");
+        text += "  " + (why.starts_with("“" + file) ? "" : file + ": ") + why + "\n";
     return text;
 }

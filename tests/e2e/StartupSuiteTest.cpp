@@ -110,8 +110,7 @@ TEST_F(StartupSuite, GoesOnAfterMissingFilesAndNamesThem)
     const std::string lisp = "/nowhere/größe.lsp";
     EXPECT_EQ(
         startWith({module, lisp, sample("primes.zmb")}),
-        linkerRefuses(module, "No such file or directory") + kPrimes + "Cannot load \"" + lisp +
-            "\": No such file or directory.\n" + kLispReady +
+        std::string(kPrimes) + kLispReady +
             startSummary({{module, "No such file or directory."}, {lisp, "No such file or directory."}}) +
             apps + listed(sample("primes.zmb")) +
             listedAsNotLoaded({{module, "No such file or directory"}, {lisp, "No such file or directory"}}));

@@ -51,6 +51,17 @@ TEST(StartSummary, SpeaksOfOneApplicationInTheSingular)
     EXPECT_EQ(summary->lines, L"1 application could not be loaded:\n  /a/tool.zmb: it is locked.");
 }
 
+TEST(StartSummary, NamesAFileOnceThatItsReasonNames)
+{
+    const auto summary = summarize({failed(L"/a/x.rpk", L"“/a/x.rpk” is not of a type that can be loaded."),
+                                    failed(L"/a/y.zmb", L"“/a/x.rpk” is in its way")},
+                                   {});
+    ASSERT_TRUE(summary);
+    EXPECT_EQ(summary->lines, L"2 applications could not be loaded:\n"
+                              L"  “/a/x.rpk” is not of a type that can be loaded.\n"
+                              L"  /a/y.zmb: “/a/x.rpk” is in its way.");
+}
+
 TEST(StartSummary, LeavesOutBoxesAboutFilesThatItNamesAndKeepsTheOthers)
 {
     const auto summary = summarize({failed(L"/a/tool.zmb", L"it is gone")},

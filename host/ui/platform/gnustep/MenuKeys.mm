@@ -1,5 +1,5 @@
-// While a menu is open the toolkit waits for the mouse alone. Keys wait, too, and go to the window under the menu
-// when that has closed: Escape would close the window with it.
+// While a menu is open the toolkit waits for the mouse alone. Keys wait, too, and go to the window under the
+// menu when that has closed: Escape would close the window with it.
 #import <AppKit/AppKit.h>
 
 #include "host/platform/gnustep/StandIn.h"
