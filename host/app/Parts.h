@@ -87,7 +87,7 @@ struct Parts
     Owned<RunningMarker> marker{foundations.profileFolder / kApplicationsFolder};
     KeptOut keptOut{foundations.profileFolder / kApplicationsFolder};
     Bisecting bisecting{foundations.profileFolder / kApplicationsFolder, !foundations.safe};
-    Admission admission{*marker, keptOut, bisecting, foundations.safe};
+    Admission admission{*commandLine, *marker, keptOut, bisecting, foundations.safe};
     Owned<KeptOutService> keptOutService{keptOut, admission, *commandLine};
     Owned<CallingApplication> callingApplication{*marker};
     Owned<CommandStack> commands{*callingApplication};

@@ -6,6 +6,7 @@
 #include "host/applications/Bisecting.h"
 #include "host/applications/KeptOut.h"
 #include "host/platform/RealPath.h"
+#include "host/text/CommandLine.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -40,12 +41,18 @@ Result<> Admission::check(const std::wstring& path)
     if (known && keepsOut(*known, reason))
         return Failure{L"it is " + reasonOf(*known),
                        isOfStart(reason) && mKeptOut.wasTold(*known) ? kToldAtStart : kKeptOut};
-    if (!isOfStart(reason))
-        return {};
-    mAskedFor.push_back(toUtf8(path));
-    if (mBisecting.keepsOut(mAskedFor.back()))
+    if (isOfStart(reason))
+        mAskedFor.push_back(toUtf8(path));
+    if (isOfStart(reason) && mBisecting.keepsOut(mAskedFor.back()))
         return Failure{L"it is kept out at this start by BISECT", kToldAtStart};
+    sayWhenOnTrial(toUtf8(path));
     return {};
+}
+
+void Admission::sayWhenOnTrial(const std::string& path)
+{
+    if (const auto sentence = mKeptOut.takeTrialSentence(path))
+        mCommandLine.say(*sentence);
 }
 
 void Admission::noteCarrier()

@@ -13,14 +13,16 @@
 namespace tessel
 {
 class Bisecting;
+class CommandLine;
 class KeptOut;
 
 class Admission
 {
 public:
     // `safe`: nothing is loaded by itself in this session but what a person needs for a command.
-    Admission(RunningMarker& marker, KeptOut& keptOut, const Bisecting& bisecting, bool safe)
-        : mMarker(marker), mKeptOut(keptOut), mBisecting(bisecting), mSafe(safe)
+    Admission(CommandLine& commandLine, RunningMarker& marker, KeptOut& keptOut, const Bisecting& bisecting,
+              bool safe)
+        : mCommandLine(commandLine), mMarker(marker), mKeptOut(keptOut), mBisecting(bisecting), mSafe(safe)
     {
     }
 
@@ -34,7 +36,7 @@ public:
     static bool isKeptOut(int code) { return code == kKeptOut || code == kToldAtStart; }
 
     // Asked with a full path before its file is opened. Why not is the end of a sentence, without its stop,
-    // and one of the codes above.
+    // and one of the codes above. Says when it is the trial of an application that has ended the host.
     Result<> check(const std::wstring& path);
     // Why the application is kept out at starts, as a part of a sentence; empty for one that is not.
     std::wstring whyKeptOut(const std::wstring& path) const;
@@ -56,6 +58,9 @@ public:
     std::vector<std::string> suspects() const;
 
 private:
+    void sayWhenOnTrial(const std::string& path);
+
+    CommandLine& mCommandLine;
     RunningMarker& mMarker;
     KeptOut& mKeptOut;
     const Bisecting& mBisecting;

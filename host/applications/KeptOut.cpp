@@ -233,12 +233,12 @@ KeptOut::Start KeptOut::begin(const std::vector<RunningMarker::Leftover>& leftov
                 mTold.push_back(realPath(leftover.work.path).native());
             }
             if (givesTrials)
-                giveTrials(applications, start.sentences);
+                giveTrials(applications);
         });
     return start;
 }
 
-void KeptOut::giveTrials(Applications& applications, std::vector<std::wstring>& sentences)
+void KeptOut::giveTrials(Applications& applications)
 {
     for (KeptOutApplication& application : applications)
     {
@@ -249,9 +249,16 @@ void KeptOut::giveTrials(Applications& applications, std::vector<std::wstring>& 
         mTried.push_back(application.path);
         application.stage = Stage::kOnTrial;
         application.hash = contentHash(application.path); // it is about to be opened in any case
-        sentences.push_back(L"The application \"" + toWide(application.path) + L"\" is tried once more: it " +
-                            whatHappened(application) + L".");
     }
+}
+
+std::optional<std::wstring> KeptOut::takeTrialSentence(const std::string& path)
+{
+    const KeptOutApplication* known = find(path);
+    if (!known || known->stage != Stage::kOnTrial || !mTrialsTold.insert(known->path).second)
+        return std::nullopt;
+    return L"The application \"" + toWide(known->path) + L"\" is tried once more: it " +
+           whatHappened(*known) + L".";
 }
 
 bool KeptOut::wasTold(const KeptOutApplication& application) const
@@ -286,7 +293,7 @@ std::wstring KeptOut::judge(const RunningMarker::Leftover& leftover, Application
         if (known != applications.end())
             applications.erase(known);
         applications.push_back(guilty);
-        return sentence + L"It is not loaded by itself at this start, and tried once more at the next.";
+        return sentence + L"It is not loaded by itself at this start; the next one lets it in once more.";
     }
     guilty.hash = known->hash;
     guilty.stage = Stage::kForGood;

@@ -14,6 +14,7 @@
 #include <filesystem>
 #include <functional>
 #include <optional>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -70,6 +71,10 @@ public:
     // Whether it was judged at this start, and a person was told.
     bool wasTold(const KeptOutApplication& application) const;
 
+    // What a person is to be told when the application at that full path is about to be loaded without being
+    // asked for, if this is its trial; once.
+    std::optional<std::wstring> takeTrialSentence(const std::string& path);
+
     // What is known of the application at that full path, links followed; null for most.
     const KeptOutApplication* find(const std::string& path) const;
     const std::vector<KeptOutApplication>& all() const { return mApplications; }
@@ -94,12 +99,13 @@ private:
     // Changes what is stored now, which another session may have changed since it was read.
     Result<> change(const std::function<void(Applications&)>& work);
     static std::wstring judge(const RunningMarker::Leftover& leftover, Applications& applications);
-    void giveTrials(Applications& applications, std::vector<std::wstring>& sentences);
+    void giveTrials(Applications& applications);
 
     std::filesystem::path mFile;
     Applications mApplications;
     std::vector<std::string> mTold;  // those judged at this start, links followed
     std::vector<std::string> mTried; // of those whose trial this session is
+    std::set<std::string> mTrialsTold;
 };
 
 // Why it is kept out: a part of a sentence, with the day.
