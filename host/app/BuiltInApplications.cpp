@@ -1,6 +1,4 @@
 // LOAD, UNLOAD, APPS: applications without the dialog.
-#include <algorithm>
-#include <array>
 #include <chrono>
 #include <iomanip>
 #include <limits>
@@ -9,6 +7,7 @@
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
+#include "host/applications/ApplicationFiles.h"
 #include "host/text/TerminalText.h"
 
 namespace tessel
@@ -18,13 +17,10 @@ namespace
 constexpr std::size_t kNameColumn = 24;
 constexpr std::size_t kFolderColumn = 48;
 constexpr std::size_t kAnyLength = std::numeric_limits<std::size_t>::max();
-constexpr std::array kLispExtensions = {L".lsp", L".qbc"};
 
 bool isLispFile(const std::wstring& path)
 {
-    const std::wstring extension = toText(toPath(path).extension());
-    return std::ranges::any_of(kLispExtensions,
-                               [&](const wchar_t* lisp) { return equalIgnoringCase(extension, lisp); });
+    return isCalledAsLisp(toPath(path));
 }
 
 // A Lisp string that the reader takes for this very text.
@@ -131,23 +127,32 @@ std::wstring withTime(const Parts& parts, const std::wstring& path, const std::w
     return outcome && outcome->loaded ? state + L", loaded in " + duration(outcome->took) : state;
 }
 
+// What kept it out at the start may do so no longer.
+std::wstring whyNotLoaded(const Parts& parts, const LoadOutcome& outcome)
+{
+    const bool wasKeptOut = Admission::isKeptOut(outcome.loaded.code());
+    if (wasKeptOut && !parts.admission.keptOutAtStart(outcome.path))
+        return L"was kept out of this start and is let in by now";
+    return outcome.loaded.sentence();
+}
+
 void sayNotLoaded(Parts& parts)
 {
     const auto failed = parts.loadOutcomes.failed();
     if (!failed.empty())
         sayLine(parts, L"Not loaded in this session:");
     for (const LoadOutcome& outcome : failed)
-        sayApplication(parts, outcome.path, outcome.loaded.sentence());
+        sayApplication(parts, outcome.path, whyNotLoaded(parts, outcome));
 }
 
-// What was asked for in vain stands among those that were not loaded, with the same reason.
+// What was asked for in vain for that very reason stands among those that were not loaded.
 void sayKeptOut(Parts& parts)
 {
     for (const auto& application : parts.keptOut.all())
     {
         const std::wstring path = toWide(application.path);
         const LoadOutcome* outcome = parts.loadOutcomes.of(path);
-        if (application.isOut() && (!outcome || outcome->loaded))
+        if (application.isOut() && !(outcome && Admission::isKeptOut(outcome->loaded.code())))
             sayApplication(parts, path, reasonOf(application));
     }
 }

@@ -5,6 +5,7 @@
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
+#include "host/applications/ApplicationFiles.h"
 
 namespace tessel
 {
@@ -23,8 +24,29 @@ bool isSameFile(const std::wstring& path, const std::wstring& other)
     return path == other || std::filesystem::equivalent(toPath(path), toPath(other), failed);
 }
 
+std::wstring profileKey(const Parts& parts)
+{
+    return std::wstring(kProductRegistryRoot) + L"\\Profiles\\" + parts.profiles.current();
+}
+
+// What applications have stored: in a safe session none of it was loaded, and nothing else knows of it.
+void addStoredPaths(Registry& registry, Registry::Key key, const std::wstring& name, Texts& paths)
+{
+    for (const auto& value : registry.values(key))
+        if (isCalled(value.data, name) && toPath(value.data).is_absolute())
+            paths.push_back(value.data);
+    for (const std::wstring& child : registry.subKeys(key))
+        addStoredPaths(registry, registry.find(child, key), name, paths);
+}
+
+void dropAllBut(Texts& paths, const std::wstring& name)
+{
+    std::erase_if(paths, [&](const auto& path)
+                  { return !isCalled(path, name) || !checkIsApplication(toPath(path)); });
+}
+
 // Of the applications that the host knows the whole path of.
-Texts applicationsCalled(const Parts& parts, const std::wstring& name)
+Texts applicationsCalled(Parts& parts, const std::wstring& name)
 {
     Texts known;
     for (const auto& module : parts.linker->loadedModules())
@@ -36,8 +58,11 @@ Texts applicationsCalled(const Parts& parts, const std::wstring& name)
     for (const auto& record : parts.records->all())
         known.push_back(record.module);
     known.push_back(toText(parts.folders.plugIns / toPath(name)));
-    std::erase_if(known, [&](const auto& path)
-                  { return !isCalled(path, name) || !KeptOut::checkIsApplication(toUtf8(path)); });
+    dropAllBut(known, name);
+    if (!known.empty())
+        return known;
+    addStoredPaths(*parts.registry, parts.registry->find(profileKey(parts)), name, known);
+    dropAllBut(known, name);
     return known;
 }
 
@@ -67,11 +92,11 @@ Result<std::wstring> onlyOneOf(const Texts& paths, const std::wstring& typed)
 }
 
 // The name alone is enough for what the host knows; a file of that name where the user is counts as well.
-Result<std::wstring> pathToKeepOut(const Parts& parts, const std::wstring& typed)
+Result<std::wstring> pathToKeepOut(Parts& parts, const std::wstring& typed)
 {
     Texts candidates = applicationsCalled(parts, typed);
     const std::wstring here = fullPath(parts, typed);
-    const auto checked = KeptOut::checkIsApplication(toUtf8(here));
+    const auto checked = checkIsApplication(toPath(here));
     if (checked)
         candidates.push_back(here);
     else if (candidates.empty())
@@ -82,6 +107,9 @@ Result<std::wstring> pathToKeepOut(const Parts& parts, const std::wstring& typed
 Result<std::wstring> pathToLetIn(const Parts& parts, const std::wstring& typed)
 {
     Texts candidates = keptOutCalled(parts, typed);
+    for (const std::string& suspect : parts.bisecting.keptOutNow())
+        if (isCalled(toWide(suspect), typed))
+            candidates.push_back(toWide(suspect));
     const std::wstring here = fullPath(parts, typed);
     if (const KeptOutApplication* known = parts.keptOut.find(toUtf8(here)); known || candidates.empty())
         candidates.push_back(known ? toWide(known->path) : here);
@@ -112,9 +140,15 @@ Result<> enable(Parts& parts, const CommandStack::Arguments& arguments)
     const auto path = pathToLetIn(parts, arguments.front());
     if (!path)
         return path.failure();
+    const std::wstring bisect = parts.bisecting.keepsOut(toUtf8(*path))
+                                    ? L"BISECT keeps it out at this start; BISECT STOP ends the search."
+                                    : L"";
+    if (!bisect.empty() && !parts.keptOut.find(toUtf8(*path)))
+        return Failure{L"\"" + *path + L"\" is not let in by ENABLE: " + bisect};
     if (auto let = parts.keptOut.letIn(toUtf8(*path)); !let)
         return let;
-    return succeed(parts, *path + L" is not kept out at starts any more.");
+    return succeed(parts, *path + L" is not kept out at starts any more." +
+                              (bisect.empty() ? L"" : L" But " + bisect));
 }
 
 Result<std::wstring> runBisect(Parts& parts, const std::wstring& word)

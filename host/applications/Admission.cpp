@@ -36,17 +36,26 @@ Result<> Admission::check(const std::wstring& path)
     if (reason == Reason::kByHand || (mSafe && !isOfStart(reason)))
         return {};
     if (mSafe)
-        return Failure{L"Tessel was started with --safe and loads nothing by itself", kKeptOut};
+        return refuseInSafety();
     const KeptOutApplication* known = mKeptOut.find(toUtf8(path));
     if (known && keepsOut(*known, reason))
         return Failure{L"it is " + reasonOf(*known),
-                       isOfStart(reason) && mKeptOut.wasTold(*known) ? kToldAtStart : kKeptOut};
+                       isOfStart(reason) && mKeptOut.wasTold(*known) ? kAlreadyTold : kKeptOut};
     if (isOfStart(reason))
         mAskedFor.push_back(toUtf8(path));
     if (isOfStart(reason) && mBisecting.keepsOut(mAskedFor.back()))
-        return Failure{L"it is kept out at this start by BISECT", kToldAtStart};
+        return Failure{L"it is kept out at this start by BISECT", kAlreadyTold};
     sayWhenOnTrial(toUtf8(path));
     return {};
+}
+
+// One sentence for all: each of them would say the same.
+Failure Admission::refuseInSafety()
+{
+    const std::wstring reason = L"Tessel was started with --safe and loads nothing by itself";
+    if (!std::exchange(mSafetyTold, true))
+        mCommandLine.say(reason + L": APPS lists what would have been loaded now, LOAD loads it by hand.");
+    return {reason, kAlreadyTold};
 }
 
 void Admission::sayWhenOnTrial(const std::string& path)

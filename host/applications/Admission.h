@@ -29,11 +29,11 @@ public:
     RunningMarker& marker() const { return mMarker; }
     bool isSafe() const { return mSafe; }
 
-    // Why an application is refused that is kept out: nothing has gone wrong. The start has told of the
-    // second kind already, by its path. Other failures of loading have the system's numbers, from 1 on.
+    // Why an application is refused that is kept out: nothing has gone wrong. A person was told of the second
+    // kind already. Other failures of loading have the system's numbers, from 1 on.
     static constexpr int kKeptOut = -1;
-    static constexpr int kToldAtStart = -2;
-    static bool isKeptOut(int code) { return code == kKeptOut || code == kToldAtStart; }
+    static constexpr int kAlreadyTold = -2;
+    static bool isKeptOut(int code) { return code == kKeptOut || code == kAlreadyTold; }
 
     // Asked with a full path before its file is opened. Why not is the end of a sentence, without its stop,
     // and one of the codes above. Says when it is the trial of an application that has ended the host.
@@ -58,6 +58,7 @@ public:
     std::vector<std::string> suspects() const;
 
 private:
+    Failure refuseInSafety();
     void sayWhenOnTrial(const std::string& path);
 
     CommandLine& mCommandLine;
@@ -68,5 +69,6 @@ private:
     std::vector<std::string> mAskedFor;
     std::set<std::string, std::less<>> mCarriers;
     std::set<std::string> mLoadedAllTheSame; // of what BISECT keeps out
+    bool mSafetyTold = false;
 };
 } // namespace tessel

@@ -88,6 +88,15 @@ bool Bisecting::keepsOut(const std::string& path) const
            !mApplied->bisection().isLoaded(static_cast<std::size_t>(found - mApplied->suspects.begin()));
 }
 
+std::vector<std::string> Bisecting::keptOutNow() const
+{
+    std::vector<std::string> paths;
+    if (mApplied)
+        std::ranges::copy_if(mApplied->suspects, std::back_inserter(paths),
+                             [this](const std::string& suspect) { return keepsOut(suspect); });
+    return paths;
+}
+
 std::vector<std::wstring> Bisecting::sentencesAtStart(const WhyNotAsPlanned& whyNotAsPlanned) const
 {
     if (!mReadAtStart)
@@ -95,9 +104,8 @@ std::vector<std::wstring> Bisecting::sentencesAtStart(const WhyNotAsPlanned& why
     if (!mApplied)
         return {};
     std::vector<std::wstring> lines;
-    for (const std::string& suspect : mApplied->suspects)
-        if (keepsOut(suspect))
-            lines.push_back(L"  " + toWide(suspect));
+    for (const std::string& suspect : keptOutNow())
+        lines.push_back(L"  " + toWide(suspect));
     lines.insert(lines.begin(), L"BISECT keeps " + std::to_wstring(lines.size()) + L" of " +
                                     counted(mApplied->suspects.size(), L" suspect", L" suspects") +
                                     L" out at this start:");

@@ -26,6 +26,8 @@ public:
     bool isGoingOn() const { return mApplied.has_value(); }
     // Whether this session keeps the application at that full path out.
     bool keepsOut(const std::string& path) const;
+    // All of these, links followed.
+    std::vector<std::string> keptOutNow() const;
     // Why a suspect that was to be loaded was not, or that one was loaded which was to stay out, the end of a
     // sentence; empty when all went as planned. A session in which it did not cannot be judged.
     using WhyNotAsPlanned = std::function<std::wstring(const std::string& suspect)>;

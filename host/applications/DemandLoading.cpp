@@ -1,13 +1,13 @@
 #include "host/applications/DemandLoading.h"
 
 #include <algorithm>
-#include <array>
 #include <set>
 #include <utility>
 
 #include <tessel/tsappinfo.h>
 
 #include "host/applications/Admission.h"
+#include "host/applications/ApplicationFiles.h"
 #include "host/applications/ApplicationRecords.h"
 #include "host/applications/DynamicLinker.h"
 #include "host/platform/RealPath.h"
@@ -18,14 +18,6 @@ namespace tessel
 namespace
 {
 constexpr wchar_t kGlobalNameMark = L'_';
-constexpr std::array<std::wstring_view, 3> kApplicationExtensions = {L".bundle", L".zmb", L".omp"};
-
-bool isApplication(const std::filesystem::path& path)
-{
-    const std::wstring extension = toWide(path.extension().native());
-    return std::ranges::any_of(kApplicationExtensions,
-                               [&](std::wstring_view known) { return equalIgnoringCase(extension, known); });
-}
 
 // Not there, and not merely out of reach.
 bool isGone(const std::wstring& module)
@@ -143,7 +135,7 @@ std::vector<std::filesystem::path> DemandLoading::plugIns() const
     std::error_code failed; // without a PlugIns folder there are no plug-ins
     for (std::filesystem::directory_iterator entry(mPlugInsFolder, failed), end; !failed && entry != end;
          entry.increment(failed))
-        if (isApplication(entry->path()))
+        if (isCalledAsModule(entry->path()))
             result.push_back(entry->path());
     std::ranges::sort(result);
     return result;

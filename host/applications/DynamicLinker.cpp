@@ -69,7 +69,7 @@ Result<> whole(const std::wstring& path, const Result<>& attempted)
 {
     if (attempted)
         return attempted;
-    if (attempted.code() == Admission::kToldAtStart)
+    if (attempted.code() == Admission::kAlreadyTold)
         return Failure{{}, attempted.code()};
     return Failure{sentence(path, L"is not loaded: ", attempted.sentence()), attempted.code()};
 }

@@ -7,7 +7,7 @@
 #include <ctime>
 #include <string_view>
 
-#include "host/platform/Bundle.h"
+#include "host/applications/ApplicationFiles.h"
 #include "host/platform/RealPath.h"
 #include "host/platform/SmallFile.h"
 #include "host/text/DayAndTime.h"
@@ -308,17 +308,6 @@ const KeptOutApplication* KeptOut::find(const std::string& path) const
         return nullptr;
     const auto found = findIn(mApplications, path);
     return found == mApplications.end() ? nullptr : &*found;
-}
-
-Result<> KeptOut::checkIsApplication(const std::string& path)
-{
-    std::error_code failed;
-    const auto status = std::filesystem::status(path, failed);
-    if (!std::filesystem::exists(status))
-        return Failure{L"There is no application \"" + toWide(path) + L"\" that could be kept out."};
-    if (std::filesystem::is_directory(status) && !isBundlePath(path))
-        return Failure{L"\"" + toWide(path) + L"\" is a folder and no application."};
-    return {};
 }
 
 Result<> KeptOut::keepOut(const std::string& path)

@@ -79,9 +79,6 @@ public:
     const KeptOutApplication* find(const std::string& path) const;
     const std::vector<KeptOutApplication>& all() const { return mApplications; }
 
-    // Whether there is an application at that full path: a file, or a bundle, which is a folder.
-    static Result<> checkIsApplication(const std::string& path);
-
     // A person keeps it out, or lets it in whatever kept it out. The first fails where there is no
     // application, the second when nothing keeps it out.
     Result<> keepOut(const std::string& path);

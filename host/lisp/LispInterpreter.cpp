@@ -105,7 +105,7 @@ Result<std::wstring> LispInterpreter::evaluate(std::wstring_view expressions, co
     const int code = mLoads->end(value);
     mMarker.endTo(depth); // Lisp may have been left by a jump
     const bool isTold = mOptions.outcomes && code != 0 && mOptions.outcomes->willBeTold(code);
-    if (code == Admission::kToldAtStart || isTold)
+    if (code == Admission::kAlreadyTold || isTold)
         return Failure{{}, code};
     return value;
 }

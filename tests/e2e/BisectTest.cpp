@@ -71,6 +71,25 @@ TEST_F(Bisect, NamesTheCulpritAndLeavesEverythingAsItWas)
                              HasSubstr(kTrouble), Not(HasSubstr("kept out"))));
 }
 
+TEST_F(Bisect, SaysHowToStopItToWhoeverLetsInWhatItKeepsOut)
+{
+    const std::string one = write("one");
+    const std::string two = write("two");
+    begin({one, two});
+    const std::string start = session.run({"VERSION"}).output;
+    const std::string out = start.find("one runs") == start.npos ? one : two;
+    const std::string way = "BISECT keeps it out at this start; BISECT STOP ends the search.\n";
+    for (const std::string& typed : {out, std::filesystem::path(out).filename().string()})
+    {
+        const auto result = session.run({"ENABLE " + typed});
+        EXPECT_EQ(result.exitStatus, 1);
+        EXPECT_THAT(result.output, HasSubstr("\n\"" + out + "\" is not let in by ENABLE: " + way));
+    }
+    session.run({"DISABLE " + out});
+    EXPECT_THAT(session.run({"ENABLE " + out}).output,
+                HasSubstr("\n" + out + " is not kept out at starts any more. But " + way));
+}
+
 TEST_F(Bisect, SaysWhichItKeepsOutAtEachStart)
 {
     const Paths suite = {write("a"), write("b"), write("c"), write("d")};

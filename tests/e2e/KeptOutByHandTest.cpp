@@ -165,6 +165,58 @@ TEST_F(KeptOutByHand, IsNoFolder)
     EXPECT_THAT(startSays(), Not(HasSubstr("kept out")));
 }
 
+TEST_F(KeptOutByHand, IsNoFileOfAnotherKind)
+{
+    const std::string letter = session.folder().write("letter.txt", "Dear Sir or Madam,\n").string();
+    const std::string bundle = session.folder().write("letter.bundle", "Dear Sir or Madam,\n").string();
+    const auto result = session.run({"DISABLE " + letter, "DISABLE " + bundle});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output,
+                HasSubstr("\n\"" + letter +
+                          "\" is no application: Tessel loads bundles, shared libraries (.zmb, "
+                          ".omp) and Lisp (.lsp, .qbc).\n"));
+    EXPECT_THAT(result.output, HasSubstr("\n\"" + bundle + "\" is a file and no bundle.\n"));
+    EXPECT_THAT(startSays(), Not(HasSubstr("kept out")));
+}
+
+TEST_F(KeptOutByHand, IsASharedLibraryWhateverItsName)
+{
+    const auto library = session.folder() / "tool.so.1";
+    std::filesystem::copy_file(good, library);
+    EXPECT_EQ(session.run({"DISABLE " + library.string()}).exitStatus, 0);
+}
+
+TEST_F(KeptOutByHand, IsAnEntryOfTheSuiteByItsNameInASafeSession)
+{
+    storeSuite(session, {good, lisp});
+    session.alwaysWith({"--safe"});
+    const auto result = session.run({"DISABLE Good.zmb", "DISABLE nothing.zmb"});
+    EXPECT_THAT(result.output, HasSubstr("\n" + good + " is kept out at starts from now on;"));
+    EXPECT_THAT(result.output, HasSubstr("nothing.zmb\" that could be kept out.\n"));
+    session.alwaysWith({});
+    EXPECT_THAT(startSays(), AllOf(HasSubstr("good.lsp: loaded"), Not(HasSubstr("message 1"))));
+}
+
+TEST_F(KeptOutByHand, IsListedAsItIsNowOnceItIsLetIn)
+{
+    storeSuite(session, {good});
+    session.run({"DISABLE " + good});
+    const std::string said = session.run({"ENABLE Good.zmb", "APPS"}).output;
+    const std::string apps = said.substr(said.find("Command: APPS"));
+    EXPECT_THAT(apps, HasSubstr(listed(good, "was kept out of this start and is let in by now")));
+    EXPECT_THAT(apps, Not(HasSubstr("DISABLE")));
+}
+
+TEST_F(KeptOutByHand, IsListedWithWhatElseIsWrongWithIt)
+{
+    const auto broken = session.folder().write("broken.lsp", "(").string();
+    storeSuite(session, {broken});
+    const std::string said = session.run({"DISABLE broken.lsp", "APPS"}).output;
+    const std::string apps = said.substr(said.find("Command: APPS"));
+    EXPECT_THAT(apps, ContainsRegex("  broken\\.lsp .* " + std::string(kReason) + "\n"));
+    EXPECT_THAT(apps, ContainsRegex("  broken\\.lsp .* line 1: "));
+}
+
 TEST_F(KeptOutByHand, IsNothingThatIsNotThere)
 {
     const auto result = session.run({"DISABLE " + session.folder().path().string() + "/nothere.zmb"});

@@ -1,0 +1,63 @@
+#include "host/applications/ApplicationFiles.h"
+
+#include <algorithm>
+#include <array>
+#include <string_view>
+
+#include "host/applications/ImageCheck.h"
+#include "host/platform/Bundle.h"
+#include "host/platform/RegularFile.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+constexpr std::array<std::wstring_view, 3> kModules = {L".bundle", L".zmb", L".omp"};
+constexpr std::array<std::wstring_view, 2> kLisp = {L".lsp", L".qbc"};
+
+template <std::size_t count>
+bool hasOneOf(const std::array<std::wstring_view, count>& extensions, const std::filesystem::path& path)
+{
+    const std::wstring extension = toWide(path.extension().native());
+    return std::ranges::any_of(extensions, [&](std::wstring_view known)
+                               { return equalIgnoringCase(extension, known); });
+}
+
+bool isSharedLibrary(const std::filesystem::path& path)
+{
+    const RegularFile file(path.native());
+    return file.opened() &&
+           checkMappable(file.size(), [&](std::uint64_t offset, void* buffer, std::size_t size)
+                         { return file.read(offset, buffer, size); });
+}
+} // namespace
+
+bool isCalledAsModule(const std::filesystem::path& path)
+{
+    return hasOneOf(kModules, path);
+}
+
+bool isCalledAsLisp(const std::filesystem::path& path)
+{
+    return hasOneOf(kLisp, path);
+}
+
+Result<> checkIsApplication(const std::filesystem::path& path)
+{
+    std::error_code failed;
+    const auto status = std::filesystem::status(path, failed);
+    const std::wstring name = L"\"" + toWide(path.native()) + L"\"";
+    if (!std::filesystem::exists(status))
+        return Failure{L"There is no application " + name + L" that could be kept out."};
+    const bool isFolder = std::filesystem::is_directory(status);
+    if (isBundlePath(path.native()))
+        return isFolder ? Result<>() : Failure{name + L" is a file and no bundle."};
+    if (isFolder)
+        return Failure{name + L" is a folder and no application."};
+    if (isCalledAsModule(path) || isCalledAsLisp(path) || isSharedLibrary(path))
+        return {};
+    return Failure{name + L" is no application: Tessel loads bundles, shared libraries (.zmb, .omp) and Lisp "
+                          L"(.lsp, .qbc)."};
+}
+} // namespace tessel
