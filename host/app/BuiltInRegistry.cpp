@@ -173,9 +173,9 @@ void addRegistryCommands(Parts& parts)
         parts,
         {L"Settings", kCommand,
          L"LIST|GET|SET|DELETE key [name] [data] | EXPORT key file [UTF8] | IMPORT file | RESTORE | RESET",
-         L"Works on the registry, below HKEY_CURRENT_USER; writes keys to registry files and takes such "
-         L"files in; of "
-         L"a damaged registry, puts back the copy or begins with nothing"},
+         L"Shows or changes stored values and keys; takes them to files and back; of a damaged registry, "
+         L"puts "
+         L"back the copy or begins with nothing"},
         registryCommand);
 }
 } // namespace tessel

@@ -53,6 +53,8 @@ void Host::judgeEarlierSessions()
     // A search compares starts: nothing else is to change from one to the next.
     const bool givesTrials = !mOptions.safe && !mParts->bisecting.isGoingOn();
     const auto begun = mParts->keptOut.begin(mParts->marker->leftovers(), givesTrials);
+    if (!mayBeEntered(mOptions.profileFolder / kApplicationsFolder))
+        return; // that has been told
     for (const auto& sentence : begun.sentences)
         mCommandLine.say(sentence);
     if (mCommandLine.tell(begun.stored))
@@ -60,6 +62,20 @@ void Host::judgeEarlierSessions()
     for (const auto& line : mParts->bisecting.sentencesAtStart([this](const std::string& suspect)
                                                                { return mParts->admission.whyOut(suspect); }))
         mCommandLine.say(line);
+}
+
+// One sentence, although everything that stands in the folder is out of reach.
+void Host::tellOfApplicationsFolder()
+{
+    const auto folder = mOptions.profileFolder / kApplicationsFolder;
+    if (mayBeEntered(folder))
+        mCommandLine.tell(mParts->marker->outlivesProcess());
+    else
+        mCommandLine.say(
+            L"The folder " + toText(folder) +
+            L" cannot be entered: what ends Tessel cannot be remembered, and nothing is kept out "
+            L"in this session. This puts it right: chmod 700 " +
+            toText(folder));
 }
 
 void Host::tellOfStart()
@@ -88,7 +104,7 @@ Result<> Host::makeParts()
                                                 return finishLine();
                                             }});
     tellOfRegistry();
-    mCommandLine.tell(mParts->marker->outlivesProcess());
+    tellOfApplicationsFolder();
     mInterruptible = &*mParts->lisp;
     mInterruptibleRegistry = &*mParts->registry;
     mMarker = &*mParts->marker;
@@ -146,8 +162,12 @@ bool Host::tellWhoElseWrites(const std::wstring& kind, const std::filesystem::pa
     const auto checked = checkNobodyElseWrites(path);
     if (checked || !std::filesystem::exists(path, unreachable))
         return true;
+    const bool isFolder = std::filesystem::is_directory(path, unreachable);
     mCommandLine.say(L"The " + kind + L" " + toText(path) + L" is not safe: " + checked.sentence() +
-                     L"; others could change what Tessel loads.");
+                     (checked.code() == kBelongsToAnother
+                          ? std::wstring(L", who could change what Tessel loads.")
+                          : L" and so decide what Tessel loads. This puts it right: chmod " +
+                                std::wstring(isFolder ? L"700 " : L"600 ") + toText(path)));
     return false;
 }
 

@@ -88,6 +88,7 @@ private:
     void tellOfRegistry();
     Result<> prepareProfileFolder();
     void judgeEarlierSessions();
+    void tellOfApplicationsFolder();
     void tellWhoElseWritesTheProfile();
     bool tellWhoElseWrites(const std::wstring& kind, const std::filesystem::path& path);
     void tellOfStart();

@@ -19,6 +19,11 @@ constexpr char kAfterword[] =
     "had an error. Otherwise it reads commands from the terminal, or line by line from a pipe, which is\n"
     "treated like a script. Wrong arguments end with status 2.";
 
+std::string isNamed(const std::string& folder)
+{
+    return folder.empty() ? "a folder is wanted, and nothing is named" : "";
+}
+
 void declare(CLI::App& app, Options& options)
 {
     app.footer(kAfterword);
@@ -26,10 +31,12 @@ void declare(CLI::App& app, Options& options)
     app.set_version_flag("--version", versionLine(), "Show the version and end");
     app.add_option("--profile-dir", options.profileFolder,
                    "Keep everything in this folder instead of your own")
-        ->type_name("DIR");
+        ->type_name("DIR")
+        ->check(isNamed);
     app.add_option("--layout-dir", options.layoutFolder,
                    "Take the values for everybody in this folder, too, to try them")
-        ->type_name("DIR");
+        ->type_name("DIR")
+        ->check(isNamed);
     auto* script =
         app.add_option("--script", options.script, "Run the commands in a file")->type_name("SCRIPT");
     // One argument each, so that a command may begin with a dash and a file name may follow.

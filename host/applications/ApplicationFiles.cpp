@@ -20,8 +20,8 @@ template <std::size_t count>
 bool hasOneOf(const std::array<std::wstring_view, count>& extensions, const std::filesystem::path& path)
 {
     const std::wstring extension = toWide(path.extension().native());
-    return std::ranges::any_of(extensions, [&](std::wstring_view known)
-                               { return equalIgnoringCase(extension, known); });
+    return std::ranges::any_of(extensions,
+                               [&](std::wstring_view known) { return equalIgnoringCase(extension, known); });
 }
 
 bool isSharedLibrary(const std::filesystem::path& path)

@@ -11,7 +11,7 @@ namespace tessel
 bool isCalledAsModule(const std::filesystem::path& path);
 bool isCalledAsLisp(const std::filesystem::path& path);
 
-// Whether an application stands at the full path: a file, or a bundle, which is a folder. A file that is called
-// as neither is looked into. Why not is a sentence.
+// Whether an application stands at the full path: a file, or a bundle, which is a folder. A file that is
+// called as neither is looked into. Why not is a sentence.
 Result<> checkIsApplication(const std::filesystem::path& path);
 } // namespace tessel

@@ -31,7 +31,8 @@ bool areAnswers(std::string_view text)
 }
 } // namespace
 
-Bisecting::Bisecting(std::filesystem::path folder, bool applies) : mFile(folder / kFileName)
+Bisecting::Bisecting(std::filesystem::path folder, bool applies)
+    : mFile(folder / kFileName), mApplies(applies)
 {
     auto search = read();
     if (!search)
@@ -139,6 +140,7 @@ Result<std::wstring> Bisecting::begin(const std::vector<std::string>& suspects)
         return stored.failure();
     mReadAtStart = {};
     mApplied.reset();
+    mBegunHere = true;
     return L"BISECT searches among " + counted(suspects.size(), L" application", L" applications") + L"; " +
            startsLeft(search.bisection()) + L". Start Tessel again.";
 }
@@ -153,15 +155,22 @@ Result<Bisecting::Search> Bisecting::current() const
     return **std::move(search);
 }
 
+std::wstring Bisecting::whyNotOfThisSession() const
+{
+    if (!mApplies)
+        return L"it was started with --safe, and no suspect is tried then.";
+    return mBegunHere ? L"the search has begun in it, and nothing was kept out of its start."
+                      : L"the search has gone on since it was started.";
+}
+
 Result<std::wstring> Bisecting::answer(bool wasGood, const WhyNotAsPlanned& whyNotAsPlanned)
 {
     auto search = current();
     if (!search)
         return search.failure();
     if (mApplied != *search)
-        return Failure{
-            L"This session cannot be judged: it was not started with the suspects that are to be tried. "
-            L"Start Tessel again, without --safe."};
+        return Failure{L"This session cannot be judged: " + whyNotOfThisSession() +
+                       L" Start Tessel again, without --safe."};
     if (auto fair = checkWentAsPlanned(whyNotAsPlanned); !fair)
         return fair.failure();
     search->answers.push_back(wasGood);

@@ -55,9 +55,12 @@ private:
     Result<> store(const Search& search) const;
     Result<> forget() const;
     Result<Search> current() const;
+    std::wstring whyNotOfThisSession() const;
     Result<> checkWentAsPlanned(const WhyNotAsPlanned& whyNotAsPlanned) const;
 
     std::filesystem::path mFile;
+    bool mApplies = false;
+    bool mBegunHere = false;
     std::optional<Search> mApplied; // what this session was started with
     Result<> mReadAtStart;
 };

@@ -64,6 +64,13 @@ std::wstring sentence(const std::wstring& path, const wchar_t* whatHappened, con
     return L"The application \"" + path + L"\" " + whatHappened + why + L".";
 }
 
+// What is wrong with the program in a bundle.
+Failure ofProgram(const ModuleFile& file, const Result<>& loadable)
+{
+    return {L"its program \"" + toWide(file.program) + L"\" cannot be used, since " + loadable.sentence(),
+            loadable.code()};
+}
+
 // What a person is told of an attempt.
 Result<> whole(const std::wstring& path, const Result<>& attempted)
 {
@@ -154,7 +161,7 @@ Result<> DynamicLinker::loadNew(const std::wstring& path, bool resolveNow)
     if (!file)
         return file.failure();
     if (auto loadable = checkLoadable(program); !loadable)
-        return loadable;
+        return file->program == toUtf8(path) ? loadable : ofProgram(*file, loadable);
     if (mHalfMapped.contains(program.identity()))
         return Failure{
             L"it threw an exception before while it was being mapped, and what is in memory of it since "

@@ -159,6 +159,27 @@ bool isGuilty(const RunningMarker::Leftover& leftover)
     return !leftover.work.path.empty() && !(leftover.work.waitsForPerson && fromOutside);
 }
 
+// Several sessions may have ended alike: of what an application has done the last is told, and how many it
+// was.
+std::vector<std::pair<RunningMarker::Leftover, std::size_t>>
+lastOfEach(const std::vector<RunningMarker::Leftover>& leftovers)
+{
+    std::vector<std::pair<RunningMarker::Leftover, std::size_t>> result;
+    for (const auto& leftover : leftovers)
+    {
+        if (!isGuilty(leftover))
+            continue;
+        const auto path = realPath(leftover.work.path);
+        const auto known = std::ranges::find_if(result, [&](const auto& other)
+                                                { return realPath(other.first.work.path) == path; });
+        if (known == result.end())
+            result.emplace_back(leftover, 1);
+        else
+            *known = {leftover, known->second + 1};
+    }
+    return result;
+}
+
 // A new version is tried without being asked for.
 void forgetChanged(std::vector<KeptOutApplication>& applications)
 {
@@ -181,7 +202,7 @@ Result<KeptOut::Applications> KeptOut::read() const
 {
     const auto content = readSmallFile(mFile);
     if (!content)
-        return content.failure();
+        return Failure{content.sentence() + L" Nothing is kept out in this session."};
     Applications applications;
     if (!*content)
         return applications;
@@ -225,11 +246,9 @@ KeptOut::Start KeptOut::begin(const std::vector<RunningMarker::Leftover>& leftov
         [&](Applications& applications)
         {
             forgetChanged(applications);
-            for (const auto& leftover : leftovers)
+            for (const auto& [leftover, sessions] : lastOfEach(leftovers))
             {
-                if (!isGuilty(leftover))
-                    continue;
-                start.sentences.push_back(judge(leftover, applications));
+                start.sentences.push_back(judge(leftover, sessions, applications));
                 mTold.push_back(realPath(leftover.work.path).native());
             }
             if (givesTrials)
@@ -267,7 +286,8 @@ bool KeptOut::wasTold(const KeptOutApplication& application) const
                                [&](const std::string& path) { return isWithin(path, application.realPath); });
 }
 
-std::wstring KeptOut::judge(const RunningMarker::Leftover& leftover, Applications& applications)
+std::wstring KeptOut::judge(const RunningMarker::Leftover& leftover, std::size_t sessions,
+                            Applications& applications)
 {
     KeptOutApplication guilty;
     guilty.path = leftover.work.path;
@@ -278,7 +298,8 @@ std::wstring KeptOut::judge(const RunningMarker::Leftover& leftover, Application
     guilty.ending = leftover.ending;
     guilty.detail = leftover.work.detail;
     const std::wstring sentence =
-        L"The application \"" + toWide(guilty.path) + L"\" " + whatHappened(guilty) + L". ";
+        L"The application \"" + toWide(guilty.path) + L"\" " + whatHappened(guilty) + L". " +
+        (sessions > 1 ? L"It has ended " + std::to_wstring(sessions) + L" sessions. " : std::wstring());
     const auto known = findIn(applications, guilty.path);
     // A person's wish stands as it was said.
     if (known != applications.end() && known->stage == Stage::kByPerson)
@@ -378,6 +399,6 @@ std::wstring reasonOf(const KeptOutApplication& application)
 {
     if (application.stage == Stage::kByPerson)
         return L"kept out at starts by DISABLE since " + toWide(dayAndTime(application.since));
-    return L"kept out: it " + whatHappened(application);
+    return L"kept out because it " + whatHappened(application);
 }
 } // namespace tessel

@@ -95,7 +95,8 @@ private:
     Result<Applications> read() const;
     // Changes what is stored now, which another session may have changed since it was read.
     Result<> change(const std::function<void(Applications&)>& work);
-    static std::wstring judge(const RunningMarker::Leftover& leftover, Applications& applications);
+    static std::wstring judge(const RunningMarker::Leftover& leftover, std::size_t sessions,
+                              Applications& applications);
     void giveTrials(Applications& applications);
 
     std::filesystem::path mFile;

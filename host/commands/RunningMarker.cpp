@@ -287,12 +287,14 @@ std::string_view wordsForEnding(int ending) noexcept
         int ending;
         std::string_view text;
     };
-    static constexpr Words kWords[] = {{RunningMarker::kVanished, "killed or switched off"},
+    static constexpr Words kWords[] = {{RunningMarker::kVanished,
+                                        "it ended without a signal that can be caught, by \"_exit\", a kill "
+                                        "or a power cut"},
                                        {RunningMarker::kCalledExit, "it called \"exit\""},
                                        {RunningMarker::kEndedByKey, "you ended it with Ctrl-C"},
                                        {SIGSEGV, "memory fault (SIGSEGV)"},
                                        {SIGBUS, "memory fault (SIGBUS)"},
-                                       {SIGABRT, "it was given up (SIGABRT)"},
+                                       {SIGABRT, "it stopped at an error of its own (SIGABRT)"},
                                        {SIGFPE, "arithmetic fault (SIGFPE)"},
                                        {SIGILL, "unknown instruction (SIGILL)"},
                                        {SIGTRAP, "breakpoint (SIGTRAP)"},

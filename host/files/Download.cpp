@@ -9,6 +9,7 @@
 #include "host/files/RemoteAddress.h"
 #include "host/files/Sha256.h"
 #include "host/platform/PartFile.h"
+#include "host/text/Sizes.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -123,7 +124,7 @@ Result<> ownOutcome(CURLcode status, const Sink& sink)
     if (sink.ledAstray)
         return Failure{L"the server leads from https to http"};
     if (sink.isFull() || status == CURLE_FILESIZE_EXCEEDED)
-        return Failure{L"it is larger than " + std::to_wstring(sink.limit) + L" bytes"};
+        return Failure{L"it is larger than " + sizeInWords(sink.limit)};
     return sink.written ? Result<>() : Failure{L"the local copy could not be written"};
 }
 

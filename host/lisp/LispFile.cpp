@@ -106,8 +106,6 @@ bool isCompiled(const std::wstring& name)
 Result<LispFile> readFound(const FoundFile& found)
 {
     const auto bytes = readOrdinaryFile(found.path, kLargestLispFile);
-    if (bytes.code() == kTooLarge)
-        return Failure{L"it is larger than 32 MB"};
     if (!bytes)
         return bytes.failure();
     return isCompiled(found.name) ? decodeCompiled(found.name, *bytes) : decodeSource(found.name, *bytes);

@@ -94,6 +94,8 @@ Result<std::string> programOfBundle(const std::string& folder)
     std::error_code failed;
     if (!std::filesystem::exists(folder, failed))
         return systemFailure(failed ? failed.value() : ENOENT);
+    if (!std::filesystem::is_directory(folder, failed))
+        return Failure{L"it is a file, and a bundle is a folder"};
     if (auto checked = checkDescription(folder); !checked)
         return checked.failure();
     Result<std::string> program = Failure{};

@@ -10,6 +10,7 @@
 
 #include "host/platform/Descriptor.h"
 #include "host/platform/SystemFailure.h"
+#include "host/text/Sizes.h"
 
 namespace tessel
 {
@@ -23,7 +24,7 @@ Failure whyUnreadable()
 
 Failure tooLarge(std::uintmax_t mostBytes)
 {
-    return {L"it is larger than " + std::to_wstring(mostBytes) + L" bytes", kTooLarge};
+    return {L"it is larger than " + sizeInWords(mostBytes)};
 }
 } // namespace
 

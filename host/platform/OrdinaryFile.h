@@ -12,9 +12,8 @@
 
 namespace tessel
 {
-// The code of a failure when nothing stands at the path at all, and when the file is larger than it may be.
+// The code of a failure when nothing stands at the path at all.
 inline constexpr int kNothingThere = 2;
-inline constexpr int kTooLarge = 3;
 
 // Whether an ordinary file stands at the path, links followed; no where the system cannot say.
 bool isOrdinaryFile(const std::filesystem::path& path);

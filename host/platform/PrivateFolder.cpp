@@ -43,10 +43,15 @@ Result<> checkNobodyElseWrites(const std::filesystem::path& path)
     if (stat(path.c_str(), &status) != 0)
         return systemFailure(errno);
     if (status.st_uid != geteuid() && status.st_uid != kAdministrator)
-        return Failure{L"it belongs to another user"};
+        return Failure{L"it belongs to another user", kBelongsToAnother};
     if ((status.st_mode & (S_IWGRP | S_IWOTH)) != 0)
         return Failure{L"other users may write to it"};
     return {};
+}
+
+bool mayBeEntered(const std::filesystem::path& folder)
+{
+    return !isFolder(folder) || access(folder.c_str(), X_OK) == 0;
 }
 
 bool othersMayEnter(const std::filesystem::path& folder)

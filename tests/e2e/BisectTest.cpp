@@ -177,13 +177,18 @@ TEST_F(Bisect, SuspectsNoneThatOthersCameWithAndNoneThatIsOutAlready)
 TEST_F(Bisect, JudgesOnlySessionsThatWereStartedForIt)
 {
     storeSuite(session, {write("a"), write("b")});
-    EXPECT_THAT(session.run({"BISECT START", "BISECT GOOD"}).output,
-                HasSubstr("This session cannot be judged: "));
-    EXPECT_THAT(session.start({"--safe", "-c", "BISECT GOOD"}).output,
-                HasSubstr("This session cannot be judged: "));
+    EXPECT_THAT(
+        session.run({"BISECT START", "BISECT GOOD"}).output,
+        HasSubstr("This session cannot be judged: the search has begun in it, and nothing was kept out "
+                  "of its start. Start Tessel again"));
+    EXPECT_THAT(
+        session.start({"--safe", "-c", "BISECT GOOD"}).output,
+        HasSubstr("This session cannot be judged: it was started with --safe, and no suspect is tried "
+                  "then. Start Tessel again"));
     const auto result = session.run({"BISECT GOOD", "BISECT GOOD"});
     EXPECT_EQ(result.exitStatus, 1);
-    EXPECT_THAT(result.output, HasSubstr("This session cannot be judged: "));
+    EXPECT_THAT(result.output,
+                HasSubstr("This session cannot be judged: the search has gone on since it was started. "));
 }
 
 TEST_F(Bisect, JudgesNoSessionInWhichThePersonLoadedWhatItKeepsOut)
@@ -291,9 +296,10 @@ TEST_F(BisectAndCrash, LetsATrialWaitUntilTheSearchIsOver)
     {
         const auto result = session.run({command});
         EXPECT_EQ(result.exitStatus, 0) << result.output;
-        EXPECT_THAT(result.output, AllOf(HasSubstr("BISECT keeps 1 of 2 suspects out"),
-                                         HasSubstr("Cannot load \"" + bad + "\": it is kept out: it ended "),
-                                         Not(HasSubstr(kTriedOnceMore))));
+        EXPECT_THAT(result.output,
+                    AllOf(HasSubstr("BISECT keeps 1 of 2 suspects out"),
+                          HasSubstr("Cannot load \"" + bad + "\": it is kept out because it ended "),
+                          Not(HasSubstr(kTriedOnceMore))));
     }
     const auto trial = session.run({"VERSION"});
     EXPECT_EQ(trial.exitStatus, -SIGSEGV);
@@ -326,7 +332,7 @@ TEST_F(BisectAndCrash, JudgesNoSessionThatKeepsOutWhatWasToBeTried)
     begin({bad, write("a")});
     raiseFlag();
     EXPECT_EQ(session.run({"VERSION"}).exitStatus, -SIGSEGV);
-    expectNotJudged(bad, "is kept out: it ended Tessel ");
+    expectNotJudged(bad, "is kept out because it ended Tessel ");
     lowerFlag();
     EXPECT_EQ(session.run({"ENABLE " + bad}).exitStatus, 0);
     EXPECT_THAT(session.run({"BISECT GOOD"}).output,

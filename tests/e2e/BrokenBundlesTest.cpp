@@ -1,6 +1,8 @@
 // Bundles with a broken description, at every place where a person meets them: loaded by hand, from the
 // Startup Suite, by the records of the host. One sentence each, and the
 // host goes on.
+#include <fstream>
+
 #include <gmock/gmock.h>
 
 #include "tests/e2e/Applications.h"
@@ -213,4 +215,25 @@ TEST_F(BundlesWithLinks, AreRefusedWhereAFolderOnTheWayLeadsElsewhere)
     fs::create_directory_symlink(outside, bundle / "inner");
     program = bundle / "inner" / "Good";
     EXPECT_THAT(loading(bundle), HasSubstr(refusal(outside / "Good")));
+}
+
+TEST_F(BrokenBundles, WithABadProgramAreToldWithItsName)
+{
+    const fs::path bundle = session.folder() / "bad.bundle";
+    fs::copy(fixtureModule("Good.bundle"), bundle, fs::copy_options::recursive);
+    std::string program;
+    for (const auto& entry : fs::directory_iterator(bundle))
+        if (entry.is_regular_file())
+            program = entry.path();
+    std::ofstream(program) << "Dear Sir or Madam,\n";
+    EXPECT_THAT(session.run({"LOAD " + bundle.string()}).output,
+                HasSubstr("The application \"" + bundle.string() + "\" is not loaded: its program \"" +
+                          program + "\" cannot be used, since it is not a shared library.\n"));
+}
+
+TEST_F(BrokenBundles, ThatAreFilesAreTold)
+{
+    const std::string file = session.folder().write("postcard.bundle", "Dear Sir or Madam,\n");
+    EXPECT_THAT(session.run({"LOAD " + file}).output,
+                HasSubstr("\"" + file + "\" is not loaded: it is a file, and a bundle is a folder.\n"));
 }

@@ -344,8 +344,11 @@ protected:
         EXPECT_EQ(result.exitStatus, 0) << result.output;
         const std::string start = result.output.substr(0, result.output.find("Command: "));
         EXPECT_THAT(start, HasSubstr("The application \"" + named + "\" ended Tessel "));
-        EXPECT_THAT(start, HasSubstr(" (asked for by hand): it was given up (SIGABRT). It stays kept out at "
-                                     "starts, until you let it in (ENABLE).\n"));
+        EXPECT_THAT(
+            start,
+            HasSubstr(
+                " (asked for by hand): it stopped at an error of its own (SIGABRT). It stays kept out at "
+                "starts, until you let it in (ENABLE).\n"));
         EXPECT_EQ(start.find("abort"), start.rfind("abort")) << "said once: " << start;
         EXPECT_THAT(result.output.substr(start.size()), ContainsRegex("  abort\\.zmb .* " + since + "\n"));
     }

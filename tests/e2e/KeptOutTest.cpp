@@ -106,7 +106,7 @@ TEST_F(KeptOut, IsTriedOnceMoreAndThenKeptOutForGood)
         const auto result = session.run({"VERSION"});
         EXPECT_EQ(result.exitStatus, 0) << result.output;
         EXPECT_THAT(result.output,
-                    AllOf(HasSubstr("\"" + bad + "\" is not loaded: it is kept out: it ended "),
+                    AllOf(HasSubstr("\"" + bad + "\" is not loaded: it is kept out because it ended "),
                           Not(HasSubstr(kForGood)), Not(HasSubstr("could not be loaded"))));
     }
 }
@@ -118,7 +118,7 @@ TEST_F(KeptOut, StaysInTheStartupSuiteAndIsShownWithTheReasonAndTheDay)
     session.run({});
     const auto result = session.run({"APPS", std::string("REGISTRY GET ") + kSuiteKey + " 1Startup"});
     EXPECT_THAT(result.output, HasSubstr("\n" + bad + "\n"));
-    EXPECT_THAT(result.output, ContainsRegex("  segv\\.zmb .* kept out: it ended Tessel " +
+    EXPECT_THAT(result.output, ContainsRegex("  segv\\.zmb .* kept out because it ended Tessel " +
                                              std::string(kDay) + " " + kInSuite));
 }
 
@@ -140,7 +140,8 @@ TEST_F(KeptOut, IsNotForGoodWhatWasAtWorkWhenThePowerWent)
     EXPECT_THAT(
         second,
         ContainsRegex(named(
-            file, R"(while its Lisp ran \(loaded from the Startup Suite\): killed or switched off\.)")));
+            file,
+            R"(while its Lisp ran \(loaded from the Startup Suite\): it ended without a signal that can be caught, by "_exit", a kill or a power cut\.)")));
     EXPECT_EQ(second.find(file.string()), second.rfind(file.string())) << "said once: " << second;
     EXPECT_THAT(second, Not(HasSubstr("could not be loaded")));
     EXPECT_THAT(second, Not(HasSubstr("slow.lsp: begun")));
@@ -203,7 +204,7 @@ TEST_F(KeptOut, IsNotForgottenWhenASafeSessionEndsWell)
     EXPECT_EQ(session.run({}).exitStatus, 0);
     EXPECT_EQ(session.run({}).exitStatus, -SIGABRT);
     session.start({"--safe", "-c", "VERSION"});
-    EXPECT_THAT(startSays(), HasSubstr("\"" + bad + "\" is not loaded: it is kept out: "));
+    EXPECT_THAT(startSays(), HasSubstr("\"" + bad + "\" is not loaded: it is kept out because "));
 }
 
 namespace
@@ -262,7 +263,7 @@ TEST_F(KeptOutForGood, StaysOutWhenTheSameFileWasPutThereAgain)
     fs::remove(bad);
     std::ofstream(bad, std::ios::binary) << content;
     fs::last_write_time(bad, time);
-    EXPECT_THAT(startSays(), HasSubstr("\"" + bad + "\" is not loaded: it is kept out: "));
+    EXPECT_THAT(startSays(), HasSubstr("\"" + bad + "\" is not loaded: it is kept out because "));
     const OpeningWatch watch(bad);
     EXPECT_EQ(session.run({"VERSION"}).exitStatus, 0);
     EXPECT_FALSE(watch.wasOpened()) << "compared once, it is known again";
@@ -273,14 +274,14 @@ TEST_F(KeptOutForGood, StaysOutByWhateverPathItIsAskedFor)
     const auto link = session.folder() / "link.zmb";
     fs::create_symlink(bad, link);
     storeSuite(session, {link.string()});
-    EXPECT_THAT(startSays(), HasSubstr("\"" + link.string() + "\" is not loaded: it is kept out: "));
+    EXPECT_THAT(startSays(), HasSubstr("\"" + link.string() + "\" is not loaded: it is kept out because "));
 }
 
 TEST_F(KeptOutForGood, StaysOutWhileItsFileIsGone)
 {
     const auto elsewhere = session.folder() / "elsewhere";
     fs::rename(bad, elsewhere);
-    EXPECT_THAT(startSays(), HasSubstr("\"" + bad + "\" is not loaded: it is kept out: "));
+    EXPECT_THAT(startSays(), HasSubstr("\"" + bad + "\" is not loaded: it is kept out because "));
     fs::rename(elsewhere, bad);
     EXPECT_EQ(session.run({"VERSION"}).exitStatus, 0) << "it is the same file";
 }
@@ -332,6 +333,35 @@ TEST_F(KeptOut, AreThoseOfAllSessionsThatAreOver)
         << "nothing loads the first";
 }
 
+TEST_F(KeptOut, IsNamedOnceHoweverManySessionsItHasEnded)
+{
+    const std::string looping = lispFixture("endless_loop.lsp");
+    {
+        HostTerminal one(session, {"--safe", "-c", "LOAD " + looping});
+        HostTerminal other(session, {"--safe", "-c", "LOAD " + looping});
+        for (HostTerminal* terminal : {&one, &other})
+        {
+            ASSERT_TRUE(terminal->shows("endless_loop.lsp: begun")) << terminal->screen();
+            kill(terminal->process(), SIGKILL);
+            EXPECT_EQ(terminal->waitForEnd(), -SIGKILL);
+        }
+    }
+    const std::string start = startSays();
+    EXPECT_EQ(start.find(looping), start.rfind(looping)) << start;
+    EXPECT_THAT(start, HasSubstr(" a power cut. It has ended 2 sessions. " + std::string(kThisTime)));
+}
+
+TEST_F(KeptOut, IsNoneWhereAFolderStandsInThePlaceOfTheList)
+{
+    const auto list = session.profile() / "applications" / "kept-out";
+    fs::create_directories(list);
+    const std::string start = startSays();
+    EXPECT_THAT(start, HasSubstr("The file " + list.string() +
+                                 " cannot be read: it is a folder, not a file. Nothing is kept out in this "
+                                 "session.\n"));
+    EXPECT_EQ(start.find(list), start.rfind(list)) << start;
+}
+
 TEST_F(KeptOut, IsFromItsCommandToo)
 {
     const std::string bad = deadly(session, "segv-command");
@@ -341,7 +371,7 @@ TEST_F(KeptOut, IsFromItsCommandToo)
     EXPECT_EQ(session.run({"PERISH"}).exitStatus, -SIGSEGV);
     const auto result = session.run({"PERISH"});
     EXPECT_EQ(result.exitStatus, 1);
-    EXPECT_THAT(result.output, HasSubstr("\"" + bad + "\" is not loaded: it is kept out: "));
+    EXPECT_THAT(result.output, HasSubstr("\"" + bad + "\" is not loaded: it is kept out because "));
     EXPECT_THAT(result.output, HasSubstr("Unknown command \"PERISH\"."));
 }
 

@@ -63,7 +63,7 @@ TEST_F(Script, OfNoSensibleSizeIsRefused)
 {
     const fs::path script = session.folder().write("large.script", "VERSION\n");
     fs::resize_file(script, (32u << 20) + 1);
-    expectRefused(script, "it is larger than 33554432 bytes");
+    expectRefused(script, "it is larger than 32 MB");
 }
 
 TEST_F(Script, MayBeEmptyOrALink)

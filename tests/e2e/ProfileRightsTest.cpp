@@ -4,7 +4,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
-#include "tests/e2e/HostProcess.h"
+#include "tests/e2e/Applications.h"
 
 namespace fs = std::filesystem;
 
@@ -37,7 +37,8 @@ protected:
     std::string notSafe(const std::string& reason) const
     {
         return "The profile folder " + session.profile().string() + " is not safe: " + reason +
-               "; others could change what Tessel loads.\n";
+               " and so decide what Tessel loads. This puts it right: chmod 700 " +
+               session.profile().string() + "\n";
     }
 
     // What a start says when others may enter the folder, and something in it has these rights.
@@ -54,7 +55,8 @@ protected:
     std::string notSafeInside(const std::string& name, const std::string& reason) const
     {
         return (session.profile() / name).string() + " is not safe: " + reason +
-               "; others could change what Tessel loads.\n";
+               " and so decide what Tessel loads. This puts it right: chmod " +
+               (name == "applications" ? "700 " : "600 ") + (session.profile() / name).string() + "\n";
     }
 
     HostSession session;
@@ -92,7 +94,28 @@ TEST_F(ProfileRights, OfAnotherUserAreTold)
         GTEST_SKIP() << "only the administrator can give a folder away";
     fs::create_directories(session.profile());
     ASSERT_EQ(chown(session.profile().c_str(), 12345, 12345), 0);
-    EXPECT_THAT(outputWith(0755), HasSubstr(notSafe("it belongs to another user")));
+    EXPECT_THAT(outputWith(0755),
+                HasSubstr("is not safe: it belongs to another user, who could change what Tessel loads.\n"));
+}
+
+TEST_F(ProfileRights, ThatLetNobodyIntoTheFolderOfApplicationsAreToldOnce)
+{
+    if (geteuid() != 0)
+        GTEST_SKIP() << "only the administrator can be somebody without rights";
+    constexpr uid_t kSomebody = 12345;
+    const auto applications = session.profile() / "applications";
+    fs::create_directories(applications);
+    for (const auto& path : {session.folder().path(), session.profile(), applications})
+        ASSERT_EQ(chown(path.c_str(), kSomebody, kSomebody), 0);
+    chmod(applications.c_str(), 0);
+    session.startBy("exec setpriv --reuid 12345 --regid 12345 --clear-groups \"$0\" \"$@\"");
+    const auto result = session.run({"VERSION"});
+    EXPECT_EQ(result.output,
+              kBanner +
+                  ("The folder " + applications.string() +
+                   " cannot be entered: what ends Tessel cannot be remembered, and nothing is kept out in "
+                   "this session. This puts it right: chmod 700 " +
+                   applications.string() + "\nCommand: VERSION\n" + kVersionLine));
 }
 
 TEST_F(ProfileRights, AreAskedOfTheRegistryInIt)

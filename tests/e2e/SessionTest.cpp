@@ -54,7 +54,7 @@ TEST(Session, ListsItsCommandsByGroup)
 TEST(Session, PartsALongUsageFromItsSummary)
 {
     const HostSession session;
-    EXPECT_THAT(session.run({"HELP REGISTRY"}).output, HasSubstr(" | RESTORE | RESET Works on the registry"));
+    EXPECT_THAT(session.run({"HELP REGISTRY"}).output, HasSubstr(" | RESTORE | RESET Shows or changes"));
 }
 
 TEST(Session, LoadsFromHttpAndHttpsAddressesOnly)

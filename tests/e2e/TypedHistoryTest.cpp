@@ -185,7 +185,7 @@ TEST_F(TypedHistory, OfNoSensibleSizeIsNeitherReadNorWritten)
 {
     put("");
     fs::resize_file(file(), (16u << 20) + 1);
-    expectNotUsed("it is larger than 16777216 bytes");
+    expectNotUsed("it is larger than 16 MB");
     EXPECT_EQ(fs::file_size(file()), (16u << 20) + 1);
 }
 

@@ -1,6 +1,7 @@
 #include <gmock/gmock.h>
 
 #include "host/app/Options.h"
+#include "host/text/Unicode.h"
 
 using testing::ElementsAre;
 using testing::HasSubstr;
@@ -42,6 +43,15 @@ TEST(Options, TakeAProfileFolderAndAScript)
     EXPECT_EQ(parsed->options->layoutFolder, "/tmp/all");
     EXPECT_EQ(parsed->options->script, "tour.script");
     EXPECT_TRUE(parsed->options->isBatch());
+}
+
+TEST(Options, RefuseAProfileFolderWithoutAName)
+{
+    const auto parsed = parse({"--profile-dir", ""});
+    ASSERT_FALSE(parsed);
+    EXPECT_EQ(parsed.code(), 2);
+    EXPECT_THAT(tessel::toUtf8(parsed.sentence()), HasSubstr("--profile-dir: a folder is wanted"));
+    EXPECT_FALSE(parse({"--profile-dir="}));
 }
 
 TEST(Options, TakeFilesToLoadInTheirOrderWhereverTheyStand)

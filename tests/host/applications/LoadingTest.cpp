@@ -131,7 +131,7 @@ TEST_F(Loading, SaysInWordsWhatStandsInTheFilesPlace)
         {"nothing.bundle", "No such file or directory"},
         {"folder.zmb", "it is a folder, not a file"},
         {"hollow.bundle", "the bundle holds no program for this system"},
-        {"file.bundle", "the bundle holds no program for this system"},
+        {"file.bundle", "it is a file, and a bundle is a folder"},
         {"pipe.zmb", "it is not an ordinary file"},
         {"empty.zmb", "the file is empty"},
         {"text.zmb", "it is not a shared library"},
@@ -149,7 +149,8 @@ TEST_F(Loading, ChecksTheProgramInABundleToo)
     const auto bundle = fixture("Classes.bundle");
     std::filesystem::resize_file(bundle / "Classes", 5000);
     EXPECT_FALSE(load(bundle));
-    EXPECT_EQ(output(), notLoaded(bundle, "the file is cut short"));
+    EXPECT_EQ(output(), notLoaded(bundle, "its program \"" + (bundle / "Classes").string() +
+                                              "\" cannot be used, since the file is cut short"));
 }
 
 TEST_F(Loading, PassesOnTheSystemLinkersOwnWords)

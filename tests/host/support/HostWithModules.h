@@ -59,7 +59,7 @@ protected:
     tessel::RunningMarker mMarker;
     tessel::KeptOut mKeptOut;
     tessel::Bisecting mBisecting;
-    tessel::Admission mAdmission{mMarker, mKeptOut, mBisecting, false};
+    tessel::Admission mAdmission{mCommandLine, mMarker, mKeptOut, mBisecting, false};
     tessel::CallingApplication mCalls{mMarker};
     tessel::CommandStack mCommands{mCalls};
     tessel::CommandRunner mRunner{mCommands, mCommandLine, mCalls};
