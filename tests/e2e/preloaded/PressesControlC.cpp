@@ -40,7 +40,7 @@ bool isHistory(int file)
 }
 } // namespace
 
-extern "C" __attribute__((visibility("default"))) int poll(pollfd* sources, nfds_t count, int time) noexcept
+extern "C" __attribute__((visibility("default"))) int poll(pollfd* sources, nfds_t count, int time)
 {
     const int ready = original<int (*)(pollfd*, nfds_t, int)>("poll")(sources, count, time);
     if (ready > 0 && (sources[0].revents & POLLIN) != 0 && isatty(sources[0].fd) && isTime("read"))
