@@ -22,7 +22,7 @@ void LockWait::begin()
 
 bool LockWait::pause(milliseconds moment)
 {
-    if (mWaited >= mPatience || (mIsUnwanted && mIsUnwanted()))
+    if (mWaited >= mPatience || isUnwanted())
         return false;
     const auto before = Clock::now();
     std::this_thread::sleep_for(std::min<Clock::duration>(moment, mPatience - mWaited));

@@ -26,6 +26,9 @@ public:
     // Who can stop the waits; nobody, until this is called.
     void letStop(IsUnwanted isUnwanted) { mIsUnwanted = std::move(isUnwanted); }
 
+    // Whether who can stop them wants that now.
+    bool isUnwanted() const { return mIsUnwanted && mIsUnwanted(); }
+
     // Waits for a moment. False, at once, when there has been enough of it.
     bool pause(std::chrono::milliseconds moment);
 

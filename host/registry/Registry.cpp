@@ -329,7 +329,7 @@ Result<> Registry::checkBeforeRemoval()
 {
     if (mLookedAt)
         return {};
-    const LongStatements looking = whileIt(L"looks through");
+    const LongStatements looking = whileIt(L"looks through", false);
     const auto sound = checkSoundness(mDatabase, kSchemaVersion);
     mLookedAt = static_cast<bool>(sound);
     return sound ? sound : giveUp(whatIsWrong(sound.failure()));

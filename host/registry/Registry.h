@@ -165,7 +165,7 @@ private:
     Result<> prepareStatements();
     Result<> chooseJournal();
     // What a person is told meanwhile; `deed` as in "looks through the registry".
-    LongStatements whileIt(const std::wstring& deed);
+    LongStatements whileIt(const std::wstring& deed, bool canBeStopped);
     void lookAtAll(int version);
     void renewCopy(bool changed);
     Failure whatIsWrong(const Failure& found);

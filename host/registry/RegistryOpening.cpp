@@ -368,23 +368,34 @@ Result<> Registry::prepare()
     return journal;
 }
 
-LongStatements Registry::whileIt(const std::wstring& deed)
+LongStatements Registry::whileIt(const std::wstring& deed, bool canBeStopped)
 {
-    return {mDatabase, mWork,
-            L"Tessel " + deed + L" the registry " + toWide(mFile.string()) + L", which takes its time."};
+    const std::wstring sentence =
+        L"Tessel " + deed + L" the registry " + toWide(mFile.string()) + L", which takes its time.";
+    if (!canBeStopped)
+        return {mDatabase, mWork, sentence, {}};
+    return {mDatabase, mWork, sentence + L" Ctrl-C ends that.",
+            [this]
+            {
+                return mWait.isUnwanted();
+            }};
 }
 
-// Damage is told at once. What is sound among it is read, each row on its own account.
+// Damage is told at once. What is sound among it is read, each row on its own account. A person need not
+// wait: the first removal looks again.
 void Registry::lookAtAll(int version)
 {
     std::random_device random;
     const bool old = version < kSchemaVersion;
     if (!old && !mLeftOpen && random() % startsBetweenLooks(mDatabase) != 0)
         return;
-    const LongStatements looking = whileIt(L"looks through");
+    const LongStatements looking = whileIt(L"looks through", true);
     const auto sound = checkSoundness(mDatabase, version);
     mLookedAt = static_cast<bool>(sound);
-    if (!sound)
+    if (sound.code() == SQLITE_INTERRUPT)
+        mWork.say(L"The registry " + toWide(mFile.string()) +
+                  L" was not looked through to its end. That is done before anything is removed from it.");
+    else if (!sound)
         mCanStore = whatIsWrong(sound.failure());
 }
 
@@ -397,7 +408,7 @@ Result<> Registry::bringUpToDate(int version)
         return mReadOnly ? Failure{L"it is empty and may not be written"} : makeTables(mDatabase);
     if (!mReadOnly && mCanStore)
     {
-        const LongStatements changing = whileIt(L"brings up to date");
+        const LongStatements changing = whileIt(L"brings up to date", false);
         const auto changed = addChecksums(mDatabase);
         if (changed)
             return changed;

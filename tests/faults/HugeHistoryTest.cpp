@@ -42,9 +42,31 @@ TEST(HugeHistory, IsToldAboutWhileItsRegistryIsLookedThrough)
     const auto result = session.start({"--safe", "-c", "VERSION"});
     EXPECT_EQ(result.exitStatus, 0);
     EXPECT_NE(result.output.find("Tessel looks through the registry " + file.string() +
-                                 ", which takes its time.\n"),
+                                 ", which takes its time. Ctrl-C ends that.\n"),
               std::string::npos)
         << result.output;
+}
+
+TEST(HugeHistory, IsOpenedWithoutALookWhenThePersonStopsThat)
+{
+    HostSession session;
+    const auto file = session.profile() / "registry.db";
+    std::filesystem::create_directories(session.profile());
+    ASSERT_EQ(runSql(file, kHugeHistory), "");
+    session.set("LD_PRELOAD", FAULTY_CALLS);
+    session.set("MODRIG_FAULT_DELAY", "500");
+    session.alwaysWith({"--safe"});
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.shows("takes its time. Ctrl-C ends that.")) << terminal.screen();
+    terminal.type(kControlC);
+    EXPECT_TRUE(terminal.shows("The registry " + file.string() + " was not looked through to its end."))
+        << terminal.screen();
+    EXPECT_TRUE(terminal.shows("Command: ")) << terminal.screen();
+    terminal.type("REGISTRY GET Software\\Tessel\\R21\\Profiles\r");
+    EXPECT_TRUE(terminal.shows("\nDefault\r\n")) << terminal.screen();
+    terminal.type("QUIT\r");
+    EXPECT_EQ(terminal.waitForEnd(), 0);
+    EXPECT_EQ(runSql(file, "SELECT count(*) FROM value WHERE key=9"), "200001");
 }
 
 TEST(HugeHistory, IsToldAboutWhileItIsReadAndKeptWhenThePersonStopsThat)
