@@ -173,9 +173,7 @@ void addRegistryCommands(Parts& parts)
         parts,
         {L"Settings", kCommand,
          L"LIST|GET|SET|DELETE key [name] [data] | EXPORT key file [UTF8] | IMPORT file | RESTORE | RESET",
-         L"Shows or changes stored values and keys; takes them to files and back; of a damaged registry, "
-         L"puts "
-         L"back the copy or begins with nothing"},
+         L"Shows and changes what is stored, takes it to files and back, mends a damaged registry"},
         registryCommand);
 }
 } // namespace tessel

@@ -15,8 +15,12 @@ constexpr std::size_t kUsageColumn = 49;
 void sayCommand(Parts& parts, const CommandStack::Description& command)
 {
     const std::wstring usage = command.name + (command.usage.empty() ? L"" : L" ") + command.usage;
-    sayLine(parts,
-            L"  " + (command.summary.empty() ? usage : padded(usage, kUsageColumn) + L" " + command.summary));
+    const bool isShort = usage.size() <= kUsageColumn;
+    sayLine(parts, L"  " + (isShort && !command.summary.empty()
+                                ? padded(usage, kUsageColumn) + L" " + command.summary
+                                : usage));
+    if (!isShort)
+        sayLine(parts, std::wstring(kUsageColumn + 3, L' ') + command.summary);
 }
 
 Result<> listCommands(Parts& parts)

@@ -54,7 +54,9 @@ TEST(Session, ListsItsCommandsByGroup)
 TEST(Session, PartsALongUsageFromItsSummary)
 {
     const HostSession session;
-    EXPECT_THAT(session.run({"HELP REGISTRY"}).output, HasSubstr(" | RESTORE | RESET Shows or changes"));
+    EXPECT_THAT(
+        session.run({"HELP REGISTRY"}).output,
+        HasSubstr(" | RESTORE | RESET\n" + std::string(52, ' ') + "Shows and changes what is stored"));
 }
 
 TEST(Session, LoadsFromHttpAndHttpsAddressesOnly)
