@@ -109,7 +109,7 @@ TEST(Packages, NameWhatTheirProgramsNeed)
     EXPECT_THAT(field("tessel", "Depends"), AllOf(HasSubstr("libgnustep-gui"), HasSubstr("libecl"),
                                                   HasSubstr("-cairo"), HasSubstr("libc6")));
     EXPECT_THAT(field("modrig", "Depends"), AllOf(HasSubstr("libgnustep-gui"), Not(HasSubstr("libecl"))));
-    EXPECT_EQ(field("tessel-dev", "Depends"), "tessel (>= " MODRIG_VERSION ")\n");
+    EXPECT_EQ(field("tessel-dev", "Depends"), "tessel (= " MODRIG_VERSION ")\n");
     for (const char* package : {"tessel", "tessel-dev", "modrig"})
         EXPECT_EQ(field(package, "Version"), MODRIG_VERSION "\n");
 }

@@ -1,11 +1,14 @@
 # Texts by id: resource scripts become a portable executable without code that the host reads strings from.
-find_program(RESOURCE_COMPILER NAMES llvm-rc REQUIRED)
-find_program(RESOURCE_LINKER NAMES lld-link REQUIRED)
+find_program(RESOURCE_COMPILER NAMES llvm-rc)
+find_program(RESOURCE_LINKER NAMES lld-link)
 
 # add_resource_module(OUTPUT.dll SCRIPT.rc|OBJECT.obj...)
 # The scripts are UTF-8 and are not preprocessed, so that no C compiler is needed. The same scripts always give the
 # same bytes.
 function(add_resource_module output)
+  if(NOT RESOURCE_COMPILER OR NOT RESOURCE_LINKER)
+    message(FATAL_ERROR "Texts by id are made by llvm-rc and lld-link, which are not there: install LLVM and LLD")
+  endif()
   cmake_path(GET output PARENT_PATH folder)
   cmake_path(GET output FILENAME name)
   cmake_path(GET output STEM stem)

@@ -1,0 +1,102 @@
+# What a module's author calls, once find_package(Tessel) has found the SDK:
+#
+# tessel_add_module(NAME [KIND zmb|omp] [FOLDER folder] source...)
+#   A module that is one shared library: NAME.zmb, unless another KIND is asked for.
+# tessel_add_bundle(NAME [IDENTIFIER identifier] [TEXTS script.rc] [RESOURCES folder] [FOLDER folder] source...)
+#   A bundle, NAME.bundle. IDENTIFIER: what the system knows it by, org.example.NAME unless it is given. TEXTS: a script
+#   of texts by id, which becomes a file with .dll in the place of .rc. RESOURCES: a folder, whose content joins the
+#   bundle's resources.
+# tessel_add_test(NAME MODULE module [TYPES command...] SHOWS text...)
+#   A test of ctest: Tessel loads the module in a profile of the test's own, the commands are typed, and every text has
+#   to be in what is shown then. A command that fails makes the test fail.
+#
+# Modules are built in the current build folder unless a FOLDER is given. Each is a target of CMake's of that NAME; it
+# links with all of the host's services and exports its entry point alone.
+include_guard(GLOBAL)
+include("${CMAKE_CURRENT_LIST_DIR}/TesselResources.cmake")
+set(TESSEL_MODULES_FOLDER "${CMAKE_CURRENT_LIST_DIR}" CACHE INTERNAL "Where the files of these functions stand")
+
+function(tessel_add_module name)
+  cmake_parse_arguments(PARSE_ARGV 1 MODULE "" "KIND;FOLDER" "")
+  if(NOT MODULE_KIND)
+    set(MODULE_KIND zmb)
+  endif()
+  if(NOT MODULE_KIND MATCHES "^(zmb|omp)$")
+    message(FATAL_ERROR "tessel_add_module(${name}): KIND is zmb or omp, and not ${MODULE_KIND}")
+  endif()
+  if(NOT MODULE_FOLDER)
+    set(MODULE_FOLDER "${CMAKE_CURRENT_BINARY_DIR}")
+  endif()
+  tessel_add_library(${name} ${name}.${MODULE_KIND} "${MODULE_FOLDER}" ${MODULE_UNPARSED_ARGUMENTS})
+  set_target_properties(${name} PROPERTIES TESSEL_PATH "${MODULE_FOLDER}/${name}.${MODULE_KIND}")
+endfunction()
+
+function(tessel_add_bundle name)
+  cmake_parse_arguments(PARSE_ARGV 1 BUNDLE "" "IDENTIFIER;TEXTS;RESOURCES;FOLDER" "")
+  if(NOT BUNDLE_FOLDER)
+    set(BUNDLE_FOLDER "${CMAKE_CURRENT_BINARY_DIR}")
+  endif()
+  if(NOT BUNDLE_IDENTIFIER)
+    set(BUNDLE_IDENTIFIER "org.example.${name}")
+  endif()
+  set(bundle "${BUNDLE_FOLDER}/${name}.bundle")
+  if(APPLE)
+    set(binaries "${bundle}/Contents/MacOS")
+    set(resources "${bundle}/Contents/Resources")
+    set(info "${bundle}/Contents/Info.plist")
+  else()
+    set(binaries "${bundle}")
+    set(resources "${bundle}/Resources")
+    set(info "${resources}/Info-gnustep.plist")
+  endif()
+  tessel_add_library(${name} ${name} "${binaries}" ${BUNDLE_UNPARSED_ARGUMENTS})
+  set_target_properties(${name} PROPERTIES TESSEL_PATH "${bundle}")
+  set(BUNDLE_NAME ${name})
+  cmake_path(GET info FILENAME description)
+  configure_file("${TESSEL_MODULES_FOLDER}/${description}.in" "${info}" @ONLY)
+  if(BUNDLE_TEXTS)
+    cmake_path(GET BUNDLE_TEXTS STEM texts)
+    add_resource_module("${resources}/${texts}.dll" "${BUNDLE_TEXTS}")
+    add_custom_target(${name}_texts DEPENDS "${resources}/${texts}.dll")
+    add_dependencies(${name} ${name}_texts)
+  endif()
+  if(BUNDLE_RESOURCES)
+    cmake_path(ABSOLUTE_PATH BUNDLE_RESOURCES)
+    add_custom_target(${name}_resources
+      COMMAND ${CMAKE_COMMAND} -E copy_directory "${BUNDLE_RESOURCES}" "${resources}"
+      VERBATIM)
+    add_dependencies(${name} ${name}_resources)
+  endif()
+endfunction()
+
+function(tessel_add_test name)
+  cmake_parse_arguments(PARSE_ARGV 1 TEST "" "MODULE" "TYPES;SHOWS")
+  if(NOT TEST_MODULE OR NOT TEST_SHOWS OR TEST_UNPARSED_ARGUMENTS)
+    message(FATAL_ERROR "tessel_add_test(${name}) takes MODULE module [TYPES command...] SHOWS text...")
+  endif()
+  get_target_property(path ${TEST_MODULE} TESSEL_PATH)
+  add_test(NAME ${name} COMMAND ${CMAKE_COMMAND} "-DPROGRAM=$<TARGET_FILE:Tessel::program>" "-DMODULE=${path}"
+    "-DPROFILE=${CMAKE_CURRENT_BINARY_DIR}/${name}.profile" "-DTYPES=${TEST_TYPES}" "-DSHOWS=${TEST_SHOWS}"
+    -P "${TESSEL_MODULES_FOLDER}/TesselTest.cmake")
+endfunction()
+
+# What both are made of. All that the host offers has to resolve now, so that a misspelt name is found here and not when
+# somebody loads the module.
+function(tessel_add_library name file folder)
+  if(NOT ARGN)
+    message(FATAL_ERROR "The module ${name} is given no source files")
+  endif()
+  add_library(${name} MODULE ${ARGN})
+  target_link_libraries(${name} PRIVATE Tessel::host)
+  set_target_properties(${name} PROPERTIES
+    PREFIX "" SUFFIX "" OUTPUT_NAME "${file}"
+    LIBRARY_OUTPUT_DIRECTORY "${folder}"
+    CXX_VISIBILITY_PRESET hidden VISIBILITY_INLINES_HIDDEN ON
+    LINK_DEPENDS "${TESSEL_MODULES_FOLDER}/exports.map")
+  if(APPLE)
+    target_link_options(${name} PRIVATE -Wl,-exported_symbol,_tsrxEntryPoint)
+  else()
+    target_link_options(${name} PRIVATE
+      "-Wl,--version-script=${TESSEL_MODULES_FOLDER}/exports.map" -Wl,-z,defs)
+  endif()
+endfunction()

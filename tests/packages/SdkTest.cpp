@@ -1,0 +1,125 @@
+// What a module's author does with the packages, in folders outside of the tree.
+#include <fstream>
+#include <regex>
+
+#include <gmock/gmock.h>
+
+#include "tests/e2e/Applications.h"
+#include "tests/packages/Packages.h"
+
+namespace fs = std::filesystem;
+using testing::AllOf;
+using testing::HasSubstr;
+using testing::Not;
+
+namespace
+{
+class Sdk : public testing::Test
+{
+protected:
+    Sdk()
+    {
+        for (const char* package : {"tessel", "tessel-dev"})
+            did("dpkg-deb -x '" + packageFile(package).string() + "' '" + root.string() + "'");
+        session.startBy("exec '" + (root / "usr/bin/tessel").string() + "' \"$@\"");
+    }
+
+    // In the session's folder, with what was unpacked in the places of what is installed.
+    CommandOutcome run(const std::string& command) const
+    {
+        const std::string usr = (root / "usr").string();
+        return runCommand("cd '" + session.folder().path().string() + "' && export PATH='" + usr +
+                          "/bin':\"$PATH\" CMAKE_PREFIX_PATH='" + usr + "' PKG_CONFIG_PATH='" + usr +
+                          "/" LIBRARIES "/pkgconfig' && unset DISPLAY && " + command);
+    }
+
+    std::string did(const std::string& command) const
+    {
+        const auto outcome = run(command);
+        EXPECT_EQ(outcome.status, 0) << command << "\n" << outcome.output;
+        return outcome.output;
+    }
+
+    fs::path inFolder(const std::string& name) const { return session.folder() / name; }
+
+    HostSession session;
+    fs::path root = session.folder() / "installed";
+};
+
+std::string contentOf(const fs::path& file)
+{
+    std::ifstream stream(file);
+    return {std::istreambuf_iterator<char>(stream), {}};
+}
+
+// The first code of that language in a document, without what fences it.
+std::string firstCode(const std::string& document, const std::string& language)
+{
+    const std::string fence = "```" + language + "\n";
+    const std::size_t start = document.find(fence);
+    if (start == document.npos)
+        return {};
+    return document.substr(start + fence.size(), document.find("```", start + 1) - start - fence.size());
+}
+} // namespace
+
+TEST_F(Sdk, IsFoundByCMakeWhichBuildsModulesOfEveryKindThatLoad)
+{
+    fs::copy(OUTSIDE_PROJECT, inFolder("project"), fs::copy_options::recursive);
+    did("cmake -S project -B built -G Ninja && cmake --build built");
+    const std::string outside = inFolder("built/outside.zmb").string();
+    const std::string packed = inFolder("built/packed.bundle").string();
+    const auto result = session.run({"LOAD " + inQuotes(outside), "OUTSIDE", "LOAD " + inQuotes(packed),
+                                     "LOAD " + inQuotes(inFolder("built/objects.omp").string())});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, AllOf(HasSubstr("Command: OUTSIDE\nHello from outside.\n"),
+                                     HasSubstr("A text by its number.\nshapes.txt is there\n")));
+    for (const std::string& module : {outside, packed + "/packed"})
+        EXPECT_EQ(did("nm --dynamic --defined-only --format=just-symbols '" + module + "'"),
+                  "tsrxEntryPoint\n");
+}
+
+TEST_F(Sdk, RunsTheTestsOfAProject)
+{
+    fs::copy(OUTSIDE_PROJECT, inFolder("project"), fs::copy_options::recursive);
+    did("cmake -S project -B built -G Ninja && cmake --build built");
+    const std::string tested = run("ctest --test-dir built --output-on-failure").output;
+    EXPECT_THAT(tested, AllOf(HasSubstr("60% tests passed, 2 tests failed out of 5"),
+                              HasSubstr("This is not shown: Hello from inside."),
+                              HasSubstr("Tessel ended with 1")));
+}
+
+TEST_F(Sdk, FindsAMisspeltFunctionWhenTheModuleIsBuilt)
+{
+    fs::copy(OUTSIDE_PROJECT, inFolder("project"), fs::copy_options::recursive);
+    session.folder().write("project/Outside.cpp",
+                           "#include <tessel/tsrx.h>\nTESSEL_API int tsutPrimtf();\n"
+                           "extern \"C\" TESSEL_EXPORT int tsrxEntryPoint(unsigned, void*)\n"
+                           "{ return tsutPrimtf(); }\n");
+    const auto built = run("cmake -S project -B built -G Ninja && cmake --build built");
+    EXPECT_NE(built.status, 0);
+    EXPECT_THAT(built.output, HasSubstr("undefined reference to `tsutPrimtf()'"));
+}
+
+TEST_F(Sdk, RefusesWhatItsFunctionsDoNotTake)
+{
+    const std::string start =
+        "cmake_minimum_required(VERSION 3.25)\nproject(p LANGUAGES CXX)\nfind_package(Tessel REQUIRED)\n";
+    session.folder().write("kind/CMakeLists.txt", start + "tessel_add_module(a KIND bmz A.cpp)\n");
+    EXPECT_THAT(run("cmake -S kind -B built").output,
+                HasSubstr("tessel_add_module(a): KIND is zmb or omp, and not bmz"));
+    session.folder().write("none/CMakeLists.txt", start + "tessel_add_bundle(a IDENTIFIER a.b)\n");
+    EXPECT_THAT(run("cmake -S none -B built2").output, HasSubstr("The module a is given no source files"));
+}
+
+TEST_F(Sdk, LetsTheGuidesFirstModuleBeBuiltInTenLinesByTwoCommands)
+{
+    const std::string guide = contentOf(root / "usr/share/doc/tessel-dev/host-guide.md");
+    const std::string code = firstCode(guide, "cpp");
+    EXPECT_EQ(std::ranges::count(code, '\n'), 10) << code;
+    session.folder().write("hello.cpp", code);
+    std::smatch commands;
+    ASSERT_TRUE(std::regex_search(guide, commands, std::regex("\n    (g\\+\\+ .*)\n    (tessel .*)\n")));
+    did(commands[1]);
+    EXPECT_THAT(did("echo HELLO | HOME=\"$PWD\" " + commands[2].str()), HasSubstr("\nHello.\n"));
+}
