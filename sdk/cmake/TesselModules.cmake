@@ -6,12 +6,14 @@
 #   A bundle, NAME.bundle. IDENTIFIER: what the system knows it by, org.example.NAME unless it is given. TEXTS: a script
 #   of texts by id, which becomes a file with .dll in the place of .rc. RESOURCES: a folder, whose content joins the
 #   bundle's resources.
+# tessel_add_lisp(NAME [FOLDER folder] source.lsp)
+#   Compiled Lisp, NAME.qbc.
 # tessel_add_test(NAME MODULE module [TYPES command...] SHOWS text...)
 #   A test of ctest: Tessel loads the module in a profile of the test's own, the commands are typed, and every text has
 #   to be in what is shown then. A command that fails makes the test fail.
 #
-# Modules are built in the current build folder unless a FOLDER is given. Each is a target of CMake's of that NAME; it
-# links with all of the host's services and exports its entry point alone.
+# Modules are built in the current build folder unless a FOLDER is given. Each is a target of CMake's of that NAME. One
+# of C++ links with all of the host's services and exports its entry point alone.
 include_guard(GLOBAL)
 include("${CMAKE_CURRENT_LIST_DIR}/TesselResources.cmake")
 set(TESSEL_MODULES_FOLDER "${CMAKE_CURRENT_LIST_DIR}" CACHE INTERNAL "Where the files of these functions stand")
@@ -67,6 +69,26 @@ function(tessel_add_bundle name)
       VERBATIM)
     add_dependencies(${name} ${name}_resources)
   endif()
+endfunction()
+
+function(tessel_add_lisp name)
+  cmake_parse_arguments(PARSE_ARGV 1 LISP "" "FOLDER" "")
+  list(LENGTH LISP_UNPARSED_ARGUMENTS count)
+  if(NOT count EQUAL 1)
+    message(FATAL_ERROR "tessel_add_lisp(${name}) takes one source file")
+  endif()
+  if(NOT LISP_FOLDER)
+    set(LISP_FOLDER "${CMAKE_CURRENT_BINARY_DIR}")
+  endif()
+  cmake_path(ABSOLUTE_PATH LISP_UNPARSED_ARGUMENTS OUTPUT_VARIABLE source)
+  set(compiled "${LISP_FOLDER}/${name}.qbc")
+  add_custom_command(OUTPUT "${compiled}"
+    COMMAND Tessel::compiler "${source}" -o "${compiled}"
+    DEPENDS "${source}" Tessel::compiler
+    COMMENT "Compiling ${LISP_UNPARSED_ARGUMENTS}"
+    VERBATIM)
+  add_custom_target(${name} ALL DEPENDS "${compiled}")
+  set_target_properties(${name} PROPERTIES TESSEL_PATH "${compiled}")
 endfunction()
 
 function(tessel_add_test name)

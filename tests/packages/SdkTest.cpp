@@ -1,4 +1,5 @@
 // What a module's author does with the packages, in folders outside of the tree.
+#include <array>
 #include <fstream>
 #include <regex>
 
@@ -61,6 +62,16 @@ std::string firstCode(const std::string& document, const std::string& language)
         return {};
     return document.substr(start + fence.size(), document.find("```", start + 1) - start - fence.size());
 }
+struct Kind
+{
+    std::string name;
+    std::string extension;
+    std::string typed;
+};
+const std::array kKinds = {Kind{"zmb", ".zmb", "MY-ZMB"}, Kind{"omp", ".omp", "MY-OMP"},
+                           Kind{"bundle", ".bundle", "MY-BUNDLE"}, Kind{"lsp", ".qbc", "(my-lsp)"}};
+
+const std::regex kThreeCommands("\n    (cmake -S .*)\n    (cmake --build .*)\n    (ctest .*)\n");
 } // namespace
 
 TEST_F(Sdk, IsFoundByCMakeWhichBuildsModulesOfEveryKindThatLoad)
@@ -84,9 +95,9 @@ TEST_F(Sdk, RunsTheTestsOfAProject)
     fs::copy(OUTSIDE_PROJECT, inFolder("project"), fs::copy_options::recursive);
     did("cmake -S project -B built -G Ninja && cmake --build built");
     const std::string tested = run("ctest --test-dir built --output-on-failure").output;
-    EXPECT_THAT(tested, AllOf(HasSubstr("60% tests passed, 2 tests failed out of 5"),
-                              HasSubstr("This is not shown: Hello from inside."),
-                              HasSubstr("Tessel ended with 1")));
+    EXPECT_THAT(tested,
+                AllOf(HasSubstr("60% tests passed, 2 tests failed out of 5"),
+                      HasSubstr("This is not shown: Hello from inside."), HasSubstr("Tessel ended with 1")));
 }
 
 TEST_F(Sdk, FindsAMisspeltFunctionWhenTheModuleIsBuilt)
@@ -122,4 +133,53 @@ TEST_F(Sdk, LetsTheGuidesFirstModuleBeBuiltInTenLinesByTwoCommands)
     ASSERT_TRUE(std::regex_search(guide, commands, std::regex("\n    (g\\+\\+ .*)\n    (tessel .*)\n")));
     did(commands[1]);
     EXPECT_THAT(did("echo HELLO | HOME=\"$PWD\" " + commands[2].str()), HasSubstr("\nHello.\n"));
+}
+
+TEST_F(Sdk, WritesAProjectOfEveryKindThatBuildsPassesItsTestAndLoads)
+{
+    for (const Kind& kind : kKinds)
+    {
+        const std::string name = "my-" + kind.name;
+        const std::string told = did("umask 022 && tessel-new-module " + name + " " + kind.name);
+        EXPECT_EQ(fs::status(inFolder(name)).permissions(), fs::perms(0755));
+        const std::string built = name + "/build/" + name + kind.extension;
+        std::smatch commands;
+        ASSERT_TRUE(std::regex_search(told, commands, kThreeCommands)) << told;
+        EXPECT_THAT(told, HasSubstr("\n    tessel " + built + "\n"));
+        did(commands[1].str() + " -G Ninja && " + commands[2].str());
+        EXPECT_THAT(did(commands[3]), HasSubstr("100% tests passed, 0 tests failed out of 1\n"));
+        const auto result = session.run({"LOAD " + inQuotes(inFolder(built).string()), kind.typed});
+        EXPECT_EQ(result.exitStatus, 0) << result.output;
+        EXPECT_THAT(result.output, AllOf(HasSubstr("\n" + name + ": type " + kind.typed + ".\n"),
+                                         HasSubstr("\nHello from " + name + ".\n")));
+    }
+}
+
+TEST_F(Sdk, RefusesNamesThatNoProjectCanHave)
+{
+    for (const char* name : {"''", "1st", "a/b", "'a b'", "../a", "-a", "ä", "'a\nb'", "Test", "help",
+                             "aaaaaaaaaaaaaaaaaaaaaaaaaaaaaaaaaaaaaaaaa"})
+    {
+        const auto refused = run(std::string("tessel-new-module ") + name + " zmb");
+        EXPECT_EQ(refused.status, 2) << name;
+        EXPECT_THAT(refused.output,
+                    testing::ContainsRegex("^tessel-new-module: (the name|there is no option)"));
+    }
+    EXPECT_EQ(run("tessel-new-module hello xyz").output,
+              "tessel-new-module: the kind is bundle, zmb, omp or lsp, and not \"xyz\".\n");
+    EXPECT_EQ(run("tessel-new-module hello").status, 2);
+    EXPECT_EQ(did("ls"), "home\ninstalled\n") << "nothing is left behind";
+}
+
+TEST_F(Sdk, LeavesAFolderThatIsThereAlreadyAsItIs)
+{
+    session.folder().write("hello/mine", "mine");
+    fs::create_symlink("nowhere", inFolder("link"));
+    const auto refused = run("tessel-new-module hello zmb");
+    EXPECT_EQ(refused.status, 1);
+    EXPECT_EQ(refused.output,
+              "tessel-new-module: \"hello\" is here already and is left as it is; take another "
+              "name or another folder.\n");
+    EXPECT_EQ(run("tessel-new-module link zmb").status, 1);
+    EXPECT_EQ(did("ls -A . hello"), ".:\nhello\nhome\ninstalled\nlink\n\nhello:\nmine\n");
 }
