@@ -9,6 +9,7 @@
 #include "host/applications/ExceptionGuard.h"
 #include "host/applications/ImageCheck.h"
 #include "host/applications/LoadOutcomes.h"
+#include "host/applications/SdkVersion.h"
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandStack.h"
 #include "host/messages/MessageBox.h"
@@ -55,8 +56,13 @@ Result<> checkLoadable(const RegularFile& program)
 {
     if (!program.opened())
         return program.opened();
-    return checkMappable(program.size(), [&](std::uint64_t offset, void* buffer, std::size_t size)
-                         { return program.read(offset, buffer, size); });
+    const auto readAt = [&](std::uint64_t offset, void* buffer, std::size_t size)
+    {
+        return program.read(offset, buffer, size);
+    };
+    if (auto mappable = checkMappable(program.size(), readAt); !mappable)
+        return mappable;
+    return checkSdkVersion(sdkVersionIn(program.size(), readAt));
 }
 
 std::wstring sentence(const std::wstring& path, const wchar_t* whatHappened, const std::wstring& why)

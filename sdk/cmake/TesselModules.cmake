@@ -13,7 +13,7 @@
 #   to be in what is shown then. A command that fails makes the test fail.
 #
 # Modules are built in the current build folder unless a FOLDER is given. Each is a target of CMake's of that NAME. One
-# of C++ links with all of the host's services and exports its entry point alone.
+# of C++ links with all of the host's services, exports its entry point alone and tells the version of the SDK.
 include_guard(GLOBAL)
 include("${CMAKE_CURRENT_LIST_DIR}/TesselResources.cmake")
 set(TESSEL_MODULES_FOLDER "${CMAKE_CURRENT_LIST_DIR}" CACHE INTERNAL "Where the files of these functions stand")
@@ -108,7 +108,7 @@ function(tessel_add_library name file folder)
   if(NOT ARGN)
     message(FATAL_ERROR "The module ${name} is given no source files")
   endif()
-  add_library(${name} MODULE ${ARGN})
+  add_library(${name} MODULE ${ARGN} "${TESSEL_MODULES_FOLDER}/TesselSdkVersion.cpp")
   target_link_libraries(${name} PRIVATE Tessel::host)
   set_target_properties(${name} PROPERTIES
     PREFIX "" SUFFIX "" OUTPUT_NAME "${file}"

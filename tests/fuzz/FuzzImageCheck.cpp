@@ -6,7 +6,7 @@
 
 #include <elf.h>
 
-#include "host/applications/ImageCheck.h"
+#include "host/applications/SdkVersion.h"
 
 namespace
 {
@@ -30,6 +30,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     };
     if (!tessel::checkMappable(kFileSize, readAt))
         return 0;
+    static_cast<void>(tessel::sdkVersionIn(kFileSize, readAt)); // ends, and reads what is there
     Elf64_Ehdr header;
     if (!readAt(0, &header, sizeof header))
         std::abort();

@@ -6,7 +6,7 @@
 
 #include <mach-o/loader.h>
 
-#include "host/applications/ImageCheck.h"
+#include "host/applications/SdkVersion.h"
 
 namespace
 {
@@ -35,5 +35,6 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     const auto checked = tessel::checkMappable(kFileSize, readAt);
     if (checked ? !isLibrary(last) : checked.sentence().empty())
         std::abort();
+    static_cast<void>(tessel::sdkVersionIn(kFileSize, readAt)); // ends, and reads what is there
     return 0;
 }

@@ -86,8 +86,11 @@ TEST_F(Sdk, IsFoundByCMakeWhichBuildsModulesOfEveryKindThatLoad)
     EXPECT_THAT(result.output, AllOf(HasSubstr("Command: OUTSIDE\nHello from outside.\n"),
                                      HasSubstr("A text by its number.\nshapes.txt is there\n")));
     for (const std::string& module : {outside, packed + "/packed"})
+    {
         EXPECT_EQ(did("nm --dynamic --defined-only --format=just-symbols '" + module + "'"),
                   "tsrxEntryPoint\n");
+        EXPECT_THAT(did("readelf --notes '" + module + "'"), HasSubstr("Tessel")) << "the version of the SDK";
+    }
 }
 
 TEST_F(Sdk, RunsTheTestsOfAProject)

@@ -7,6 +7,8 @@
 #include <mach-o/fat.h>
 #include <mach-o/loader.h>
 
+#include "host/applications/platform/MachOFile.h"
+
 namespace tessel
 {
 namespace
@@ -44,10 +46,16 @@ Result<> checkThin(std::uint64_t start, std::uint64_t size, const ReadAt& readAt
     return header.sizeofcmds <= size - sizeof header ? Result<>() : refused(kCutShort);
 }
 
+} // namespace
+
 // A universal file: one image per processor, big-endian headers in front.
-Result<> checkUniversal(std::uint64_t fileSize, const ReadAt& readAt)
+Result<MachOImage> imageForThisProcessor(std::uint64_t fileSize, const ReadAt& readAt)
 {
     fat_header header = {};
+    if (!readAt(0, &header.magic, sizeof header.magic))
+        return refused(kNoLibrary);
+    if (header.magic != FAT_CIGAM)
+        return MachOImage{0, fileSize};
     if (!readAt(0, &header, sizeof header))
         return refused(kCutShort);
     const std::uint32_t count = OSSwapBigToHostInt32(header.nfat_arch);
@@ -63,18 +71,16 @@ Result<> checkUniversal(std::uint64_t fileSize, const ReadAt& readAt)
             continue;
         const std::uint64_t start = OSSwapBigToHostInt32(image.offset);
         const std::uint64_t size = OSSwapBigToHostInt32(image.size);
-        return size <= fileSize && start <= fileSize - size ? checkThin(start, size, readAt)
-                                                            : refused(kCutShort);
+        if (size > fileSize || start > fileSize - size)
+            return refused(kCutShort);
+        return MachOImage{start, size};
     }
     return refused(kOtherMachine);
 }
-} // namespace
 
 Result<> checkMappable(std::uint64_t fileSize, const ReadAt& readAt)
 {
-    std::uint32_t magic = 0;
-    if (!readAt(0, &magic, sizeof magic))
-        return refused(kNoLibrary);
-    return magic == FAT_CIGAM ? checkUniversal(fileSize, readAt) : checkThin(0, fileSize, readAt);
+    const auto image = imageForThisProcessor(fileSize, readAt);
+    return image ? checkThin(image->start, image->size, readAt) : image.failure();
 }
 } // namespace tessel

@@ -7,6 +7,7 @@
 
 #include <gmock/gmock.h>
 #include <tessel/tsed.h>
+#include <tessel/tsversion.h>
 
 using testing::EndsWith;
 using testing::HasSubstr;
@@ -91,6 +92,31 @@ TEST_F(Loading, ExplainsAFailureInTheBoxThatNamesTheFile)
     EXPECT_FALSE(detail.empty());
     EXPECT_EQ(said,
               "The application \"" + path.native() + "\" is not loaded: " + tessel::toUtf8(detail) + "\n");
+}
+
+TEST_F(Loading, LoadsWhatIsBuiltWithThisSdkOrAnEarlierOne)
+{
+    for (const char* name : {"SameSdk.zmb", "LastMajor.zmb"})
+        EXPECT_TRUE(load(fixture(name))) << output();
+    EXPECT_EQ(names(), L"SameSdk.zmb LastMajor.zmb ");
+}
+
+TEST_F(Loading, RefusesWhatIsBuiltWithANewerSdkBeforeTheSystemsLinkerNamesAFunction)
+{
+    const std::string major = std::to_string(TESSEL_SDK_VERSION_MAJOR);
+    const std::string next = std::to_string(TESSEL_SDK_VERSION_MAJOR + 1);
+    const std::string minor = "." + std::to_string(TESSEL_SDK_VERSION_MINOR);
+    const std::string nextMinor = "." + std::to_string(TESSEL_SDK_VERSION_MINOR + 1);
+    for (const auto& [name, version] :
+         {std::pair("NextMajor.zmb", next + ".0"), std::pair("NextMinor.zmb", major + nextMinor)})
+    {
+        const auto path = fixture(name);
+        EXPECT_FALSE(load(path));
+        EXPECT_EQ(output(), "The application \"" + path.native() +
+                                "\" is not loaded: it is built for version " + version +
+                                " of the SDK, and this Tessel has " + major + minor +
+                                "; it needs a newer Tessel, or to be built with the SDK of this one.\n");
+    }
 }
 
 TEST_F(Loading, TakesARelativePathFromTheCurrentFolder)
