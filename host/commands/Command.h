@@ -17,9 +17,9 @@ public:
     std::wstring localName;
     std::wstring owner; // the path of the application that registered it; empty for the host's own
     TsEdCommandHandler handler = nullptr;
+    std::wstring summary; // one line, or empty
 
     // The host's own commands have these instead of a handler.
     std::function<tessel::Result<>(const std::vector<std::wstring>& arguments)> builtIn;
     std::wstring usage;
-    std::wstring summary;
 };

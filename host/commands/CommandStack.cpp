@@ -5,6 +5,7 @@
 
 #include "host/commands/CallingApplication.h"
 #include "host/commands/Command.h"
+#include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
 bool TsEdCommandStack::isKindOf(const wchar_t* className) const
@@ -32,6 +33,18 @@ bool answersTo(const TsEdCommand& command, std::wstring_view typedName)
         return true;
     return typedName.starts_with(kGlobalNameMark) &&
            equalIgnoringCase(command.globalName, typedName.substr(1));
+}
+
+bool isOneLine(std::wstring_view text)
+{
+    return !text.empty() &&
+           std::ranges::none_of(text, [](wchar_t c) { return std::iswcntrl(static_cast<wint_t>(c)); });
+}
+
+// What comes with the host was there before commands could be described.
+std::wstring summaryFromTheBeginning(std::wstring_view globalName)
+{
+    return globalName == L"MODRIG" ? L"Loads and unloads applications, in a dialog" : L"";
 }
 
 bool isIn(const TsEdCommand& command, const wchar_t* group)
@@ -76,11 +89,29 @@ int CommandStack::addCommand(const wchar_t* group, const wchar_t* globalName, co
     added->group = group;
     added->globalName = globalName;
     added->localName = localName;
+    added->summary = summaryFromTheBeginning(added->globalName);
     added->owner = mCalls.path();
     added->handler = handler;
     if (command)
         *command = added.get();
     mCommands.push_back(std::move(added));
+    return TSED_COMMAND_OK;
+}
+
+int CommandStack::describe(const wchar_t* group, const wchar_t* globalName, std::wstring_view description)
+{
+    if (!isOneLine(description))
+        return TSED_COMMAND_INVALID;
+    const auto described = std::ranges::find_if(mCommands,
+                                                [&](const auto& command)
+                                                {
+                                                    return !isOwn(*command) && globalName &&
+                                                           isIn(*command, group) &&
+                                                           equalIgnoringCase(command->globalName, globalName);
+                                                });
+    if (described == mCommands.end())
+        return TSED_COMMAND_UNKNOWN;
+    (*described)->summary = description;
     return TSED_COMMAND_OK;
 }
 
@@ -100,14 +131,13 @@ int CommandStack::removeGroup(const wchar_t* group)
 
 std::size_t CommandStack::removeIf(const std::function<bool(const TsEdCommand&)>& goes)
 {
-    return std::erase_if(mCommands,
-                         [&](const Command& command) { return !isOwn(*command) && goes(*command); });
+    return std::erase_if(mCommands, [&](const auto& command) { return !isOwn(*command) && goes(*command); });
 }
 
 CommandStack::Command CommandStack::find(std::wstring_view typedName) const
 {
-    const auto found = std::ranges::find_if(mCommands, [&](const Command& command)
-                                            { return answersTo(*command, typedName); });
+    const auto found =
+        std::ranges::find_if(mCommands, [&](const auto& command) { return answersTo(*command, typedName); });
     return found == mCommands.end() ? nullptr : *found;
 }
 
@@ -149,3 +179,10 @@ std::vector<CommandStack::Description> CommandStack::descriptions() const
     return result;
 }
 } // namespace tessel
+
+int tsedDescribeCommand(const wchar_t* group, const wchar_t* globalName, const wchar_t* description)
+{
+    auto* commands = tessel::running<tessel::CommandStack>();
+    return commands ? commands->describe(group, globalName, description ? description : L"")
+                    : TSED_COMMAND_UNKNOWN;
+}

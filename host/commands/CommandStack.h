@@ -28,7 +28,7 @@ public:
         std::wstring group;
         std::wstring name;    // what a person types
         std::wstring usage;   // the arguments, for commands of the host
-        std::wstring summary; // one line, for commands of the host
+        std::wstring summary; // one line; empty where an application has given none
     };
 
     // Shared: a handler may remove the command that runs it.
@@ -47,6 +47,9 @@ public:
                    TsEdCommand** command) override;
     int removeCommand(const wchar_t* group, const wchar_t* globalName) override;
     int removeGroup(const wchar_t* group) override;
+
+    // As `tsedDescribeCommand`.
+    int describe(const wchar_t* group, const wchar_t* globalName, std::wstring_view description);
 
     // The command that a person types so, or null. Where several share a name, it is the one that was
     // registered first, so that nobody can take the host's own away.
@@ -68,6 +71,6 @@ private:
     std::size_t removeIf(const std::function<bool(const TsEdCommand&)>& goes);
 
     const CallingApplication& mCalls;
-    std::vector<Command> mCommands;
+    std::vector<std::shared_ptr<TsEdCommand>> mCommands;
 };
 } // namespace tessel

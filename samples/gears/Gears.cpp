@@ -64,6 +64,7 @@ int load()
 {
     if (!commands() || commands()->addCommand(kGroup, kCommand, kCommand, 0, showGears) != TSED_COMMAND_OK)
         return TSRX_RET_ERROR;
+    tsedDescribeCommand(kGroup, kCommand, L"Shows the table of a speed reducer");
     tsutPrintf(L"Gears: type GEARS for the table of a speed reducer.\n");
     return TSRX_RET_OK;
 }

@@ -63,9 +63,12 @@ TsEdCommandStack* commands()
     return TsEdCommandStack::cast(tsrxSysRegistry()->at(TSED_REGISTERED_COMMANDS));
 }
 
-bool addCommand(const wchar_t* name, TsEdCommandHandler handler)
+bool addCommand(const wchar_t* name, TsEdCommandHandler handler, unsigned description)
 {
-    return commands()->addCommand(kGroup, name, name, 0, handler) == TSED_COMMAND_OK;
+    if (commands()->addCommand(kGroup, name, name, 0, handler) != TSED_COMMAND_OK)
+        return false;
+    tsedDescribeCommand(kGroup, name, Text(description).characters);
+    return true;
 }
 
 void giveBack()
@@ -82,8 +85,9 @@ int load(void* application)
 {
     theApplication = application;
     theTexts = LoadLibrary(L"MoonRes.dll");
-    if (theTexts && commands() && addCommand(L"MOONPHASE", showMoon) && addCommand(L"LOCKMOON", lockMoon) &&
-        addCommand(L"UNLOCKMOON", unlockMoon))
+    if (theTexts && commands() && addCommand(L"MOONPHASE", showMoon, moon::kShowsTheMoon) &&
+        addCommand(L"LOCKMOON", lockMoon, moon::kLocksTheModule) &&
+        addCommand(L"UNLOCKMOON", unlockMoon, moon::kUnlocksTheModule))
     {
         printLine(moon::kGreeting);
         return TSRX_RET_OK;

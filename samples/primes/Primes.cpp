@@ -62,6 +62,7 @@ int load()
 {
     if (!commands() || commands()->addCommand(kGroup, kCommand, kCommand, 0, showSpiral) != TSED_COMMAND_OK)
         return TSRX_RET_ERROR;
+    tsedDescribeCommand(kGroup, kCommand, L"Shows the primes on a spiral");
     tsutPrintf(L"Primes: type PRIMES to see them on a spiral.\n");
     return TSRX_RET_OK;
 }

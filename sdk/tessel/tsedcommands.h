@@ -41,3 +41,10 @@ public:
 
     bool isKindOf(const wchar_t* className) const override;
 };
+
+// Gives a command of an application the one line with which `HELP` tells what it does; the text is copied,
+// and goes with the command. TSED_COMMAND_INVALID for an empty text or one with control characters (line
+// breaks, too), TSED_COMMAND_UNKNOWN when the group has no such command; what was described before then
+// stays. Nothing else depends on a description.
+TESSEL_API int tsedDescribeCommand(const wchar_t* group, const wchar_t* globalName,
+                                   const wchar_t* description);

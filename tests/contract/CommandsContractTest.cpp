@@ -119,6 +119,20 @@ TEST_F(CommandsContract, RemovesAGroupWhole)
     EXPECT_EQ(runsOf(L"CONTRACTTHREE"), 1);
 }
 
+TEST_F(CommandsContract, DescribesACommandInOneLine)
+{
+    add(L"CONTRACT", L"CONTRACTONE", L"CONTRACTEINS");
+    EXPECT_EQ(tsedDescribeCommand(L"contract", L"contractone", L"Does one thing"), TSED_COMMAND_OK);
+    EXPECT_EQ(tsedDescribeCommand(L"CONTRACT", L"CONTRACTONE", L"Does another"), TSED_COMMAND_OK);
+    EXPECT_EQ(tsedDescribeCommand(L"CONTRACT", L"CONTRACTTWO", L"Does one thing"), TSED_COMMAND_UNKNOWN);
+    EXPECT_EQ(tsedDescribeCommand(L"OTHER", L"CONTRACTONE", L"Does one thing"), TSED_COMMAND_UNKNOWN);
+    EXPECT_EQ(tsedDescribeCommand(nullptr, L"CONTRACTONE", L"Does one thing"), TSED_COMMAND_UNKNOWN);
+    EXPECT_EQ(tsedDescribeCommand(L"CONTRACT", nullptr, L"Does one thing"), TSED_COMMAND_UNKNOWN);
+    for (const wchar_t* noLine : {L"", L"two\nlines", L"a\ttab", static_cast<const wchar_t*>(nullptr)})
+        EXPECT_EQ(tsedDescribeCommand(L"CONTRACT", L"CONTRACTONE", noLine), TSED_COMMAND_INVALID);
+    EXPECT_EQ(runsOf(L"CONTRACTEINS"), 1);
+}
+
 TEST_F(CommandsContract, LetsACommandRemoveItself)
 {
     commands->addCommand(L"CONTRACT", L"CONTRACTONE", L"CONTRACTONE", 0,

@@ -46,6 +46,9 @@ const RecordingResources::Texts kMoonTexts = {
     {moon::kTonight, L"%s, %d %%, %d days"},
     {moon::kLocked, L"locked"},
     {moon::kUnlocked, L"unlocked"},
+    {moon::kShowsTheMoon, L"shows"},
+    {moon::kLocksTheModule, L"locks"},
+    {moon::kUnlocksTheModule, L"unlocks"},
 };
 
 class CompiledSamples : public testing::Test
@@ -79,6 +82,20 @@ TEST_F(CompiledSamples, GreetInOneLineAndOfferTheirCommands)
             EXPECT_TRUE(recordingHost().commands.has(command));
         EXPECT_EQ(unload(sample.entryPoint), TSRX_RET_OK);
     }
+}
+
+TEST_F(CompiledSamples, DescribeTheirCommands)
+{
+    for (const Sample& sample : kSamples)
+        ASSERT_EQ(load(sample.entryPoint), TSRX_RET_OK);
+    const auto& commands = recordingHost().commands;
+    EXPECT_EQ(commands.descriptionOf(L"MOONPHASE"), L"shows");
+    EXPECT_EQ(commands.descriptionOf(L"LOCKMOON"), L"locks");
+    EXPECT_EQ(commands.descriptionOf(L"UNLOCKMOON"), L"unlocks");
+    EXPECT_EQ(commands.descriptionOf(L"PRIMES"), L"Shows the primes on a spiral");
+    EXPECT_EQ(commands.descriptionOf(L"GEARS"), L"Shows the table of a speed reducer");
+    for (const Sample& sample : kSamples)
+        unload(sample.entryPoint);
 }
 
 TEST_F(CompiledSamples, TakeTheirCommandsAlongAndCanBeLoadedAgain)

@@ -16,7 +16,8 @@ namespace
 constexpr char kSegment[] = "__TEXT";
 constexpr char kSection[] = "__tessel_sdk";
 
-template <std::size_t Size> bool isNamed(const char (&name)[Size], const char* wanted)
+template <std::size_t Size>
+bool isNamed(const char (&name)[Size], const char* wanted)
 {
     return std::strncmp(name, wanted, Size) == 0;
 }
@@ -24,9 +25,8 @@ template <std::size_t Size> bool isNamed(const char (&name)[Size], const char* w
 std::optional<SdkVersion> versionAt(std::uint64_t place, const ReadAt& readAt)
 {
     TsRxSdkNote note = {};
-    const bool isThere =
-        readAt(place, &note, sizeof note) && note.type == TSRX_SDK_NOTE_TYPE &&
-        std::memcmp(note.owner, TSRX_SDK_NOTE_OWNER, sizeof note.owner) == 0;
+    const bool isThere = readAt(place, &note, sizeof note) && note.type == TSRX_SDK_NOTE_TYPE &&
+                         std::memcmp(note.owner, TSRX_SDK_NOTE_OWNER, sizeof note.owner) == 0;
     return isThere ? std::optional(SdkVersion{note.majorNumber, note.minorNumber}) : std::nullopt;
 }
 

@@ -236,6 +236,30 @@ TEST_F(Commands, AreDescribedGroupByGroup)
     EXPECT_THAT(order, ElementsAre(L"Session:HELP", L"Session:QUIT", L"DRAW:EINS"));
 }
 
+TEST_F(Commands, AreDescribedInOneLineThatGoesWithThem)
+{
+    add(kFirst, L"G", L"ONE", L"EINS");
+    EXPECT_EQ(tsedDescribeCommand(L"g", L"one", L"Does one thing"), TSED_COMMAND_OK);
+    EXPECT_EQ(stack.descriptions().back().summary, L"Does one thing");
+    stack.removeGroup(L"G");
+    add(kFirst, L"G", L"ONE", L"EINS");
+    EXPECT_EQ(stack.descriptions().back().summary, L"");
+}
+
+TEST_F(Commands, OfTheHostAreNotDescribedByOthers)
+{
+    stack.addBuiltIn({L"Session", L"OWN", L"", L"the host's"},
+                     [](const auto&) { return tessel::Result<>(); });
+    EXPECT_EQ(tsedDescribeCommand(L"Session", L"OWN", L"Does one thing"), TSED_COMMAND_UNKNOWN);
+    EXPECT_EQ(stack.descriptions().back().summary, L"the host's");
+}
+
+TEST_F(Commands, ThatComeWithTheHostAreDescribedByIt)
+{
+    add(kFirst, L"G", L"MODRIG", L"MODRIG");
+    EXPECT_EQ(stack.descriptions().back().summary, L"Loads and unloads applications, in a dialog");
+}
+
 TEST_F(Commands, AreFoundByTheNameOfTheirClass)
 {
     EXPECT_EQ(TsEdCommandStack::cast(&stack), &stack);

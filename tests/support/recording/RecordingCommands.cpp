@@ -79,6 +79,30 @@ int RecordingCommands::removeGroup(const wchar_t* group)
     return gone > 0 ? TSED_COMMAND_OK : TSED_COMMAND_UNKNOWN;
 }
 
+int RecordingCommands::describe(const std::wstring& group, const std::wstring& globalName,
+                                const std::wstring& description)
+{
+    recordingHost().journal.add(L"tsedDescribeCommand", {group, globalName, description});
+    const bool isOneLine =
+        std::none_of(description.begin(), description.end(),
+                     [](wchar_t character) { return std::iswcntrl(static_cast<wint_t>(character)) != 0; });
+    if (description.empty() || !isOneLine)
+        return TSED_COMMAND_INVALID;
+    for (const auto& command : mCommands)
+        if (isCommand(*command, group, globalName))
+        {
+            command->description = description;
+            return TSED_COMMAND_OK;
+        }
+    return TSED_COMMAND_UNKNOWN;
+}
+
+std::wstring RecordingCommands::descriptionOf(const std::wstring& globalName) const
+{
+    const TsEdCommand* found = find(L"_" + globalName);
+    return found ? found->description : std::wstring();
+}
+
 const TsEdCommand* RecordingCommands::find(const std::wstring& typedName) const
 {
     for (const auto& command : mCommands)
@@ -102,4 +126,9 @@ int RecordingCommands::statusOfAdding(const TsEdCommand& command) const
 bool TsEdCommandStack::isKindOf(const wchar_t* className) const
 {
     return className && std::wstring_view(className) == kClassName;
+}
+
+int tsedDescribeCommand(const wchar_t* group, const wchar_t* globalName, const wchar_t* description)
+{
+    return recordingHost().commands.describe(orEmpty(group), orEmpty(globalName), orEmpty(description));
 }

@@ -19,8 +19,9 @@ public:
     TsEdUIContext* uiContext = nullptr;
     int functionCode = 0;
     void* resources = nullptr;
-    bool hasResult = false; // whether the caller asked for the new command
-    std::wstring owner;     // the application that was being called
+    bool hasResult = false;        // whether the caller asked for the new command
+    std::wstring owner;            // the application that was being called
+    std::wstring description = {}; // what HELP would tell
     int status = TSED_COMMAND_OK;
 };
 
@@ -46,6 +47,10 @@ public:
                    TsEdCommand** command) override;
     int removeCommand(const wchar_t* group, const wchar_t* globalName) override;
     int removeGroup(const wchar_t* group) override;
+
+    int describe(const std::wstring& group, const std::wstring& globalName, const std::wstring& description);
+    // What a command of that global name was described with.
+    std::wstring descriptionOf(const std::wstring& globalName) const;
 
 private:
     const TsEdCommand* find(const std::wstring& typedName) const;
