@@ -96,13 +96,13 @@ Result<> Host::makeParts()
     tellWhoElseWritesTheProfile();
     // The applications that are loaded next may bring Objective-C along.
     static_cast<void>(keepToolkitFilesIn(mOptions.profileFolder / kToolkitFolder));
-    mParts =
-        std::make_unique<Parts>(Foundations{mCommandLine, mEndRequest, mInterruption, mOptions.profileFolder,
-                                            mOptions.layoutFolders, mOptions.downloads, mOptions.safe,
-                                            [this]
-                                            {
-                                                return finishLine();
-                                            }});
+    mParts = std::make_unique<Parts>(Foundations{mCommandLine, mQuestions, mEndRequest, mInterruption,
+                                                 mOptions.profileFolder, mOptions.layoutFolders,
+                                                 mOptions.downloads, mOptions.safe,
+                                                 [this]
+                                                 {
+                                                     return finishLine();
+                                                 }});
     tellOfRegistry();
     tellOfApplicationsFolder();
     mInterruptible = &*mParts->lisp;
@@ -212,7 +212,7 @@ Result<> Host::runScript(const std::filesystem::path& script)
         return Failure{L"The script " + toText(script) +
                        L" is not run: it seems to be a script that runs itself."};
     ++mScriptDepth;
-    auto done = Console(mCommandLine, *this).runScript(script);
+    auto done = Console(mCommandLine, mQuestions, *this).runScript(script);
     --mScriptDepth;
     return done;
 }

@@ -26,6 +26,7 @@
 #include "host/commands/Interruption.h"
 #include "host/console/LineRunner.h"
 #include "host/files/RemoteFiles.h"
+#include "host/messages/Questions.h"
 #include "host/text/CommandLine.h"
 
 namespace tessel
@@ -79,6 +80,7 @@ public:
     int endRequest() const { return mEndRequest.descriptor(); }
 
     CommandLine& commandLine() { return mCommandLine; }
+    Questions& questions() { return mQuestions; }
 
     // What the Tab key completes: the commands that are there or that the host knows how to load.
     std::vector<std::wstring> commandNames() const;
@@ -103,6 +105,7 @@ private:
     std::atomic<RunningMarker*> mMarker = nullptr;
     EndRequest mEndRequest;
     Interruption mInterruption{mEndRequest};
+    Questions mQuestions{mCommandLine, mInterruption};
     std::optional<Interruption::Wish> mTypedLine; // that it is not run; until it is
     int mScriptDepth = 0;
 };

@@ -32,6 +32,7 @@
 #include "host/messages/Browser.h"
 #include "host/messages/Help.h"
 #include "host/messages/MessageBox.h"
+#include "host/messages/Questions.h"
 #include "host/registry/LayeredRegistry.h"
 #include "host/registry/Profiles.h"
 #include "host/registry/Registry.h"
@@ -52,6 +53,7 @@ inline constexpr char kRegistryFile[] = "registry.db";
 struct Foundations
 {
     CommandLine& commandLine;
+    Questions& questions;
     EndRequest& endRequest;
     Interruption& interruption;
     const std::filesystem::path& profileFolder; // is there
@@ -70,6 +72,7 @@ struct Parts
     const Foundations foundations;
     const ProductFolders folders = runningProductFolders();
     Published<CommandLine> commandLine{foundations.commandLine};
+    Published<Questions> questions{foundations.questions};
     Published<EndRequest> endRequest{foundations.endRequest};
     Owned<Registry> registry{foundations.profileFolder / kRegistryFile, Registry::kBusyTimeout,
                              [this](const std::wstring& sentence) { foundations.commandLine.say(sentence); },

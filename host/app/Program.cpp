@@ -88,7 +88,7 @@ int runBatch(Host& host, const Options& options)
 {
     if (options.modrig)
         return showDialog(host);
-    Console console(host.commandLine(), host);
+    Console console(host.commandLine(), host.questions(), host);
     bool allWell = options.script.empty() || host.commandLine().tell(host.runScript(options.script));
     for (const auto& command : options.commands)
         allWell = (host.isEnding() || console.runLine(command)) && allWell;
@@ -102,7 +102,7 @@ int converse(Host& host, const std::filesystem::path& profileFolder, InputSource
     LineEditor editor(
         host.commandLine().tell(earlier) ? *earlier : std::vector<std::wstring>(),
         [&host] { return host.commandNames(); }, source);
-    Console(host.commandLine(), host).converse(editor, history);
+    Console(host.commandLine(), host.questions(), host).converse(editor, history);
     return kAllWell;
 }
 
@@ -110,7 +110,7 @@ int runPipe(Host& host, InputSource source)
 {
     PipedInput bytes(source);
     std::istream lines(&bytes);
-    return Console(host.commandLine(), host).runLines(lines) ? kAllWell : kSomethingFailed;
+    return Console(host.commandLine(), host.questions(), host).runLines(lines) ? kAllWell : kSomethingFailed;
 }
 
 int runSession(Host& host, const Options& options, const InterruptKey& interruptKey)

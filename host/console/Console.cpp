@@ -1,11 +1,13 @@
 #include "host/console/Console.h"
 
 #include <cstdint>
+#include <optional>
 #include <sstream>
 #include <utility>
 
 #include "host/console/LineEditor.h"
 #include "host/console/TypedHistory.h"
+#include "host/messages/Questions.h"
 #include "host/platform/OrdinaryFile.h"
 #include "host/text/Unicode.h"
 
@@ -14,15 +16,86 @@ namespace tessel
 namespace
 {
 constexpr std::uintmax_t kLargestScript = std::uintmax_t{32} << 20;
+
+// The next line, in the one encoding and with the one kind of line break.
+std::optional<std::wstring> nextLine(std::istream& lines)
+{
+    std::string utf8;
+    if (!std::getline(lines, utf8))
+        return std::nullopt;
+    if (utf8.ends_with('\r'))
+        utf8.pop_back();
+    return toWide(utf8);
 }
 
-Console::Console(CommandLine& commandLine, LineRunner& runner) : mCommandLine(commandLine), mRunner(runner)
+void startLine(CommandLine& commandLine)
+{
+    if (!commandLine.atLineStart())
+        commandLine.print(L"\n");
+}
+
+class PersonAtTerminal : public Answerer
+{
+public:
+    PersonAtTerminal(LineEditor& editor, CommandLine& commandLine)
+        : mEditor(editor), mCommandLine(commandLine)
+    {
+    }
+
+    std::optional<std::wstring> answer(const std::wstring& prompt) override
+    {
+        startLine(mCommandLine);
+        std::wstring line;
+        if (mEditor.readAnswer(prompt, line) == LineEditor::Outcome::kLine)
+            return line;
+        mEditor.forgetInterrupts(); // it was meant for this question
+        mCommandLine.print(L"\n");
+        return std::nullopt;
+    }
+
+    bool isPerson() const override { return true; }
+
+private:
+    LineEditor& mEditor;
+    CommandLine& mCommandLine;
+};
+
+class FollowingLines : public Answerer
+{
+public:
+    FollowingLines(std::istream& lines, CommandLine& commandLine, const LineRunner& runner)
+        : mLines(lines), mCommandLine(commandLine), mRunner(runner)
+    {
+    }
+
+    std::optional<std::wstring> answer(const std::wstring& prompt) override
+    {
+        startLine(mCommandLine);
+        mCommandLine.print(prompt);
+        const auto line = mRunner.isEnding() ? std::nullopt : nextLine(mLines);
+        mCommandLine.print(line.value_or(L"") + L"\n");
+        return line;
+    }
+
+    bool isPerson() const override { return false; }
+
+private:
+    std::istream& mLines;
+    CommandLine& mCommandLine;
+    const LineRunner& mRunner;
+};
+} // namespace
+
+Console::Console(CommandLine& commandLine, Questions& questions, LineRunner& runner)
+    : mCommandLine(commandLine), mQuestions(questions), mRunner(runner)
 {
 }
 
 void Console::converse(LineEditor& editor, TypedHistory& history)
 {
     InputAssembler input;
+    PersonAtTerminal person(editor, mCommandLine);
+    const Questions::Asked asked(mQuestions, person);
     while (!mRunner.isEnding())
     {
         std::wstring line;
@@ -52,15 +125,22 @@ void Console::converse(LineEditor& editor, TypedHistory& history)
 
 bool Console::runLines(std::istream& lines)
 {
+    FollowingLines following(lines, mCommandLine, mRunner);
+    const Questions::Asked asked(mQuestions, following);
+    return runEach(lines);
+}
+
+bool Console::runEach(std::istream& lines)
+{
     bool allWell = true;
     InputAssembler input;
-    for (std::string utf8; !mRunner.isEnding() && std::getline(lines, utf8);)
+    while (!mRunner.isEnding())
     {
-        if (utf8.ends_with('\r'))
-            utf8.pop_back();
-        const std::wstring line = toWide(utf8);
-        echo(input, line);
-        if (const auto whole = input.add(line))
+        const auto line = nextLine(lines);
+        if (!line)
+            break;
+        echo(input, *line);
+        if (const auto whole = input.add(*line))
             allWell = mRunner.run(*whole) && allWell;
     }
     return !tellIfUnfinished(input) && allWell;
@@ -69,7 +149,7 @@ bool Console::runLines(std::istream& lines)
 bool Console::runLine(std::string_view line)
 {
     std::istringstream lines{std::string(line)};
-    return runLines(lines);
+    return runEach(lines);
 }
 
 Result<> Console::runScript(const std::filesystem::path& script)
@@ -93,8 +173,8 @@ void Console::makeRoomForPrompt(const wchar_t* prompt)
 {
     if (mCommandLine.openLine() == prompt)
         mCommandLine.returnToLineStart();
-    else if (!mCommandLine.atLineStart())
-        mCommandLine.print(L"\n");
+    else
+        startLine(mCommandLine);
 }
 
 void Console::echo(const InputAssembler& input, const std::wstring& line)

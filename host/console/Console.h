@@ -14,6 +14,7 @@
 namespace tessel
 {
 class LineEditor;
+class Questions;
 class TypedHistory;
 
 // What the host shows when it waits for a command, and when Lisp goes on on the next line.
@@ -23,8 +24,9 @@ inline constexpr wchar_t kContinuationPrompt[] = L"     ... ";
 class Console
 {
 public:
-    // Both are kept for the console's lifetime.
-    Console(CommandLine& commandLine, LineRunner& runner);
+    // All are kept for the console's lifetime. What asks while a line runs is answered from where the line
+    // came from.
+    Console(CommandLine& commandLine, Questions& questions, LineRunner& runner);
 
     // Talks with the person at the terminal until the session ends: Ctrl-D, or a command. Ctrl-C gives a
     // fresh prompt, or stops the Lisp that is running. Each line joins the history before it runs.
@@ -33,6 +35,7 @@ public:
     // Runs lines as if typed; each is printed after the prompt, so that the output is a transcript. A line
     // that fails does not keep the following ones from running. True when none failed.
     bool runLines(std::istream& lines);
+    // The same with a line that nobody goes on after: there is no answer to what it asks.
     bool runLine(std::string_view line);
 
     // The same with an ordinary file of commands. Fails when it cannot be read, and without a sentence when
@@ -40,12 +43,14 @@ public:
     Result<> runScript(const std::filesystem::path& script);
 
 private:
+    bool runEach(std::istream& lines);
     const wchar_t* prompt(const InputAssembler& input) const;
     void makeRoomForPrompt(const wchar_t* prompt);
     void echo(const InputAssembler& input, const std::wstring& line);
     bool tellIfUnfinished(const InputAssembler& input);
 
     CommandLine& mCommandLine;
+    Questions& mQuestions;
     LineRunner& mRunner;
 };
 } // namespace tessel

@@ -46,7 +46,9 @@ struct LineEditor::Terminal
     static int readCharacter(EditLine* editor, wchar_t* character);
 
     void remember(const wchar_t* line);
+    Outcome read(const std::wstring& prompt, std::wstring& line);
 
+    bool readsCommand = true;
     Names commandNames;
     TerminalInput input;
     std::wstring promptText;
@@ -80,6 +82,8 @@ LineEditor::Terminal::~Terminal()
 
 unsigned char LineEditor::Terminal::complete(EditLine* editor, int)
 {
+    if (!of(editor).readsCommand)
+        return CC_REFRESH_BEEP;
     const LineInfoW* line = el_wline(editor);
     const std::wstring typed(line->buffer, line->cursor);
     const auto completion = completeCommand(typed, of(editor).commandNames());
@@ -127,17 +131,31 @@ LineEditor::~LineEditor() = default;
 
 LineEditor::Outcome LineEditor::read(const std::wstring& prompt, std::wstring& line)
 {
-    mTerminal->promptText = prompt;
-    el_resize(mTerminal->editLine); // the window may have changed its size while a command ran
+    mTerminal->readsCommand = true;
+    const Outcome outcome = mTerminal->read(prompt, line);
+    if (outcome == Outcome::kLine)
+        mTerminal->remember((line + L"\n").c_str());
+    return outcome;
+}
+
+LineEditor::Outcome LineEditor::readAnswer(const std::wstring& prompt, std::wstring& line)
+{
+    mTerminal->readsCommand = false;
+    return mTerminal->read(prompt, line);
+}
+
+LineEditor::Outcome LineEditor::Terminal::read(const std::wstring& prompt, std::wstring& line)
+{
+    promptText = prompt;
+    el_resize(editLine); // the window may have changed its size while a command ran
     // Before the prompt invites to type: a Ctrl-D that the terminal still takes for the end of a line is
     // lost.
-    el_wset(mTerminal->editLine, EL_PREP_TERM, 1);
+    el_wset(editLine, EL_PREP_TERM, 1);
     int length = 0;
     errno = 0;
-    const wchar_t* typed = el_wgets(mTerminal->editLine, &length);
+    const wchar_t* typed = el_wgets(editLine, &length);
     if (!typed || length <= 0)
         return errno == EINTR ? Outcome::kInterrupted : Outcome::kEnd;
-    mTerminal->remember(typed);
     line.assign(typed, static_cast<std::size_t>(length));
     while (!line.empty() && (line.back() == L'\n' || line.back() == L'\r'))
         line.pop_back();

@@ -34,6 +34,8 @@ public:
 
     // Waits for a line; `line` is set for kLine only, without its line break.
     Outcome read(const std::wstring& prompt, std::wstring& line);
+    // The same for a line that is no command: nothing is completed, and the arrow keys do not bring it back.
+    Outcome readAnswer(const std::wstring& prompt, std::wstring& line);
 
 private:
     struct Terminal;

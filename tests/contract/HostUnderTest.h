@@ -58,6 +58,8 @@ public:
 
     // Types a command; false when the host knows none of that name.
     virtual bool type(const std::wstring& command) = 0;
+    // Runs a script whose first line is a command, and the others what it asks for.
+    virtual void typeScript(const std::vector<std::wstring>& lines) = 0;
     // Lets the host evaluate what Lisp is queued.
     virtual void becomeIdle() = 0;
 

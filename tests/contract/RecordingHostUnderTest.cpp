@@ -105,6 +105,14 @@ public:
 
     bool type(const std::wstring& command) override { return recordingHost().commands.type(command); }
 
+    void typeScript(const std::vector<std::wstring>& lines) override
+    {
+        recordingHost().questions.answers.assign(lines.begin() + 1, lines.end());
+        recordingHost().questions.answers.emplace_back(); // the input ends
+        recordingHost().commands.type(lines.front());
+        recordingHost().questions.answers.clear();
+    }
+
     void becomeIdle() override { recordingHost().lisp.runQueued(); }
 
     void tellLisp(const std::wstring& expression, const std::optional<std::wstring>& prints) override

@@ -151,6 +151,15 @@ public:
 
     bool type(const std::wstring& command) override { return mHost.run(command); }
 
+    void typeScript(const std::vector<std::wstring>& lines) override
+    {
+        std::string script;
+        for (const std::wstring& line : lines)
+            script += tessel::toUtf8(line) + "\n";
+        const std::wstring file = toText(mFolder.write("answers.script", script));
+        mHost.run(L"SCRIPT \"" + file + L"\""); // a line that answers nothing may be no command
+    }
+
     // Any line will do: what is queued is evaluated after it.
     void becomeIdle() override { mHost.run(L"(princ)"); }
 

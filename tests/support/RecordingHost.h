@@ -34,6 +34,7 @@
 #include "tests/support/recording/RecordingLisp.h"
 #include "tests/support/recording/RecordingLoadedModules.h"
 #include "tests/support/recording/RecordingOutput.h"
+#include "tests/support/recording/RecordingQuestions.h"
 #include "tests/support/recording/RecordingRegistry.h"
 #include "tests/support/recording/RecordingResources.h"
 #include "tests/support/recording/RecordingServices.h"
@@ -71,6 +72,7 @@ public:
     RecordingLisp lisp;                               // qxr_queueexpr, tsedInvoke, RemovingTsLISP
     RecordingDocument document;                       // curDoc
     RecordingOutput output;                           // tsutPrintf, VqHostMessageBox, tsedHelp
+    RecordingQuestions questions;                     // tsask...
 
 private:
     std::wstring mProfile;

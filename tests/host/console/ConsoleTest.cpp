@@ -3,7 +3,10 @@
 #include <sstream>
 #include <vector>
 
+#include "host/commands/EndRequest.h"
+#include "host/commands/Interruption.h"
 #include "host/console/Console.h"
+#include "host/messages/Questions.h"
 #include "tests/host/support/HostParts.h"
 #include "tests/support/TemporaryFolder.h"
 
@@ -17,7 +20,10 @@ namespace
 class RecordingRunner : public tessel::LineRunner
 {
 public:
-    explicit RecordingRunner(tessel::CommandLine& commandLine) : mCommandLine(commandLine) {}
+    RecordingRunner(tessel::CommandLine& commandLine, tessel::Questions& questions)
+        : mCommandLine(commandLine), mQuestions(questions)
+    {
+    }
 
     bool run(const std::wstring& input) override
     {
@@ -27,7 +33,19 @@ public:
             mCommandLine.print(L"\nCommand: ");
         if (input == L"OPEN")
             mCommandLine.print(L"no line break");
+        if (input == L"ASK")
+            answered =
+                mQuestions.ask({L"Why", {}, L"so"}, [this](const std::wstring& text) { return take(text); });
         return input != L"BAD";
+    }
+
+    // "NO" does not fit.
+    tessel::Result<> take(const std::wstring& text)
+    {
+        if (text == L"NO")
+            return tessel::Failure{L"Not that."};
+        answer = text;
+        return {};
     }
     void lineBegins() override {}
     bool isLineInterrupted() const override { return false; }
@@ -38,9 +56,12 @@ public:
     bool runsLisp() const noexcept override { return false; }
 
     std::vector<std::wstring> inputs;
+    bool answered = false;
+    std::wstring answer;
 
 private:
     tessel::CommandLine& mCommandLine;
+    tessel::Questions& mQuestions;
     bool mEnding = false;
 };
 
@@ -54,8 +75,11 @@ protected:
     }
 
     CapturedOutput output;
-    RecordingRunner runner{output.commandLine()};
-    tessel::Console console{output.commandLine(), runner};
+    tessel::EndRequest endRequest;
+    tessel::Interruption interruption{endRequest};
+    tessel::Questions questions{output.commandLine(), interruption};
+    RecordingRunner runner{output.commandLine(), questions};
+    tessel::Console console{output.commandLine(), questions, runner};
 };
 } // namespace
 
@@ -64,6 +88,38 @@ TEST_F(Console, EchoesEachLineAfterThePrompt)
     EXPECT_TRUE(runLines("HELP\n\nVERSION"));
     EXPECT_THAT(runner.inputs, ElementsAre(L"HELP", L"VERSION"));
     EXPECT_EQ(output.text(), "Command: HELP\nCommand: \nCommand: VERSION\n");
+}
+
+TEST_F(Console, AnswersAQuestionWithTheNextLine)
+{
+    EXPECT_TRUE(runLines("ASK\nbecause\r\nHELP\n"));
+    EXPECT_TRUE(runner.answered);
+    EXPECT_EQ(runner.answer, L"because");
+    EXPECT_THAT(runner.inputs, ElementsAre(L"ASK", L"HELP"));
+    EXPECT_EQ(output.text(), "Command: ASK\nWhy <so>: because\nCommand: HELP\n");
+}
+
+TEST_F(Console, CancelsAQuestionAtTheEndOfTheLines)
+{
+    EXPECT_TRUE(runLines("ASK\n"));
+    EXPECT_FALSE(runner.answered);
+    EXPECT_EQ(output.text(), "Command: ASK\nWhy <so>: \n");
+}
+
+TEST_F(Console, CancelsAQuestionThatALineDoesNotAnswerAndGoesOnWithTheNext)
+{
+    EXPECT_TRUE(runLines("ASK\nNO\nHELP\n"));
+    EXPECT_FALSE(runner.answered);
+    EXPECT_THAT(runner.inputs, ElementsAre(L"ASK", L"HELP"));
+    EXPECT_EQ(output.text(), "Command: ASK\nWhy <so>: NO\nNot that.\nCommand: HELP\n");
+}
+
+TEST_F(Console, TakesTheDefaultInALineByItself)
+{
+    EXPECT_TRUE(console.runLine("ASK\nHELP"));
+    EXPECT_TRUE(runner.answered);
+    EXPECT_EQ(runner.answer, L"so");
+    EXPECT_EQ(output.text(), "Command: ASK\nWhy <so>: so\nCommand: HELP\n");
 }
 
 TEST_F(Console, ShowsAContinuationPromptInsideOfLisp)
