@@ -115,6 +115,26 @@ TEST_F(Sdk, FindsAMisspeltFunctionWhenTheModuleIsBuilt)
     EXPECT_THAT(built.output, HasSubstr("undefined reference to `tsutPrimtf()'"));
 }
 
+TEST_F(Sdk, NamesTheLineOfATextThatCannotBeRead)
+{
+    fs::copy(OUTSIDE_PROJECT, inFolder("project"), fs::copy_options::recursive);
+    const auto wrong = [this](const std::string& lines)
+    {
+        const auto script =
+            session.folder().write("project/OutsideRes.rc", "LANGUAGE 9, 1\n\nSTRINGTABLE\nBEGIN\n" + lines);
+        const auto built =
+            run("cmake -S project -B built -G Ninja && cmake --build built --target packed_texts");
+        EXPECT_NE(built.status, 0);
+        const std::size_t place = built.output.find(script.string() + ":");
+        return place == built.output.npos ? built.output
+                                          : built.output.substr(place + script.string().size(), 30);
+    };
+    EXPECT_THAT(wrong(" 1 \"one\"\n 2 two\n 3 \"three\"\nEND\n"), HasSubstr(":6: error: expected string"));
+    EXPECT_THAT(wrong(" 1 \"one\"\n 2 \"[;]\"\n 1 \"\u00FCber\"\nEND\n"), HasSubstr(":7: error: Multiple"));
+    EXPECT_THAT(wrong(" 1 \"one\"\n 2 \"two\n 3 \"three\"\nEND\n"), HasSubstr(":6: error: String literal"));
+    EXPECT_THAT(wrong(" 1 \"one\"\n"), HasSubstr(":5: error: expected"));
+}
+
 TEST_F(Sdk, RefusesWhatItsFunctionsDoNotTake)
 {
     const std::string start =
