@@ -32,11 +32,13 @@ set(CPACK_DEBIAN_DEV_PACKAGE_NAME tessel-dev)
 set(CPACK_DEBIAN_DEV_PACKAGE_SECTION devel)
 set(CPACK_DEBIAN_DEV_PACKAGE_DEPENDS "tessel (= ${PROJECT_VERSION})")
 set(CPACK_DEBIAN_DEV_PACKAGE_RECOMMENDS "g++, cmake, llvm, lld")
+set(CPACK_DEBIAN_DEV_PACKAGE_SUGGESTS "libgtest-dev, libgmock-dev, libicu-dev, pkgconf")
 set(CPACK_DEBIAN_DEV_DESCRIPTION "what applications for Tessel are written with
 The SDK of Tessel: headers that describe every service of the host, what
 CMake and pkg-config find it by, a command that writes a project to begin
-with, the guide for authors of modules, and the sources of a sample of every
-kind of application.")
+with, a host in memory for tests of modules, the tests that every host has
+to pass, the guide for authors of modules, and the sources of a sample of
+every kind of application.")
 
 set(CPACK_DEBIAN_MODRIG_PACKAGE_NAME modrig)
 set(CPACK_DEBIAN_MODRIG_PACKAGE_SECTION graphics)

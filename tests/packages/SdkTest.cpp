@@ -115,6 +115,16 @@ TEST_F(Sdk, FindsAMisspeltFunctionWhenTheModuleIsBuilt)
     EXPECT_THAT(built.output, HasSubstr("undefined reference to `tsutPrimtf()'"));
 }
 
+TEST_F(Sdk, TestsAModuleWithoutAHostAndAHostByItsContract)
+{
+    fs::copy(OUTSIDE_PROJECT, inFolder("sdk"), fs::copy_options::recursive);
+    fs::copy(KIT_PROJECT, inFolder("kit"), fs::copy_options::recursive);
+    did("cmake -S kit -B built -G Ninja && cmake --build built -j 2");
+    const std::string tested = run("ctest --test-dir built --output-on-failure").output;
+    EXPECT_THAT(tested, AllOf(HasSubstr(", 1 tests failed out of "), HasSubstr("not given back to the host"),
+                              HasSubstr("contract.QuestionsContract.TakesNumbers")));
+}
+
 TEST_F(Sdk, NamesTheLineOfATextThatCannotBeRead)
 {
     fs::copy(OUTSIDE_PROJECT, inFolder("project"), fs::copy_options::recursive);
