@@ -15,7 +15,7 @@ namespace fs = std::filesystem;
 namespace
 {
 constexpr std::uintmax_t kMostLayerBytes = std::uintmax_t{64} << 20;
-constexpr wchar_t kSeparator = L'\\';
+constexpr wchar_t kKeySeparator = L'\\';
 
 std::vector<fs::path> registryFilesIn(const fs::path& folder)
 {
@@ -46,7 +46,7 @@ std::vector<std::wstring> partsOfKeyPath(std::wstring_view path)
     std::vector<std::wstring> parts;
     while (!path.empty())
     {
-        const std::size_t end = std::min(path.find(kSeparator), path.size());
+        const std::size_t end = std::min(path.find(kKeySeparator), path.size());
         if (end > 0)
             parts.emplace_back(path.substr(0, end));
         path.remove_prefix(std::min(end + 1, path.size()));
@@ -92,7 +92,7 @@ void RegistryTree::removeKey(std::wstring_view path)
     parts.pop_back();
     std::wstring above;
     for (const std::wstring& part : parts)
-        above += part + kSeparator;
+        above += part + kKeySeparator;
     Node& node = make(above);
     const Node* gone = node.keys.at(fold);
     node.keys.erase(fold);

@@ -62,7 +62,7 @@ bool isLineBreak(wchar_t character)
     return character == L'\n' || character == L'\r';
 }
 
-bool isBlank(wchar_t character)
+bool isBlankInLine(wchar_t character)
 {
     return character == L' ' || character == L'\t';
 }
@@ -112,7 +112,7 @@ private:
     }
     void skipBlanks()
     {
-        while (!atEnd() && isBlank(mText[mAt]))
+        while (!atEnd() && isBlankInLine(mText[mAt]))
             ++mAt;
     }
 
@@ -123,7 +123,7 @@ private:
         while (!atEnd() && !isLineBreak(mText[mAt]))
             ++mAt;
         std::wstring_view rest = mText.substr(begin, mAt - begin);
-        while (!rest.empty() && isBlank(rest.back()))
+        while (!rest.empty() && isBlankInLine(rest.back()))
             rest.remove_suffix(1);
         return rest;
     }
@@ -134,7 +134,7 @@ private:
         while (!atEnd())
             if (mText[mAt] == L';')
                 takeRestOfLine();
-            else if (isBlank(mText[mAt]) || isLineBreak(mText[mAt]))
+            else if (isBlankInLine(mText[mAt]) || isLineBreak(mText[mAt]))
                 ++mAt;
             else
                 return true;

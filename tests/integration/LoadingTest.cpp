@@ -14,7 +14,7 @@ namespace
 {
 constexpr int kNotLoaded = 0;
 constexpr int kLoaded = 1;
-constexpr int kAlreadyLoaded = 2;
+constexpr int kIsLoadedAlready = 2;
 
 constexpr char kReady[] = "\nReady. ";
 
@@ -51,7 +51,7 @@ TEST_F(Loading, OfAModuleIsDoneOnce)
     const auto good = module("Good.zmb");
     EXPECT_EQ(load(good), kLoaded);
     EXPECT_EQ(said(), "Good.zmb: message 1\n");
-    EXPECT_EQ(load(good), kAlreadyLoaded);
+    EXPECT_EQ(load(good), kIsLoadedAlready);
     EXPECT_EQ(said(), "");
     EXPECT_THAT(ModrigUnderTest::loaded(), ElementsAre(wide(good)));
     EXPECT_THAT(ModrigUnderTest::history(), IsEmpty());
