@@ -115,6 +115,12 @@ bool belongs(const Identity& before, const LogIdentity& log, const Identity& aft
            log.first.count <= after.count + 1 && before.count <= log.last.count;
 }
 
+bool isTaken(const std::filesystem::path& path)
+{
+    std::error_code unreachable;
+    return exists(symlink_status(path, unreachable));
+}
+
 bool isForeign(const std::filesystem::path& file)
 {
     std::error_code missing;
@@ -144,12 +150,20 @@ bool isInUse(const std::filesystem::path& journal)
     return stream.get() > 0;
 }
 
+std::filesystem::path freeNameLike(const std::filesystem::path& first)
+{
+    auto name = first;
+    for (int number = 2; isTaken(name) || isTaken(logOf(name)) || isTaken(rollbackJournalOf(name)); ++number)
+        name = first.string() + "-" + std::to_string(number);
+    return name;
+}
+
 Result<std::optional<std::wstring>> setForeignLogAside(const std::filesystem::path& file)
 {
     if (!isForeign(file))
         return std::optional<std::wstring>();
     const auto log = logOf(file);
-    const std::filesystem::path aside = log.string() + ".foreign";
+    const auto aside = freeNameLike(log.string() + ".foreign");
     const std::wstring belongsElsewhere =
         L"the write-ahead log " + toWide(log.string()) +
         L" does not belong to it, but to another registry or to another state of it";

@@ -26,6 +26,9 @@ std::string asFixedFile(const std::filesystem::path& file);
 std::filesystem::path logOf(const std::filesystem::path& file);
 std::filesystem::path rollbackJournalOf(const std::filesystem::path& file);
 
+// "NAME", or "NAME-2" and so on, at which nothing stands yet, nor a journal of it.
+std::filesystem::path freeNameLike(const std::filesystem::path& first);
+
 // Whether such a file holds what the registry's own file does not say.
 bool isInUse(const std::filesystem::path& journal);
 

@@ -81,21 +81,9 @@ Result<std::string> readCopy(const std::filesystem::path& copy)
     return std::string(image.get(), image.get() + size);
 }
 
-bool isTaken(const std::filesystem::path& path)
-{
-    std::error_code unreachable;
-    return exists(symlink_status(path, unreachable));
-}
-
-// "registry.db.damaged", or "registry.db.damaged-2" and so on, which nobody has yet, nor its journals' names.
 std::filesystem::path nameToKeep(const std::filesystem::path& file)
 {
-    const auto first = beside(file, ".damaged");
-    auto name = first;
-    for (int number = 2; isTaken(name) || isTaken(beside(name, "-wal")) || isTaken(beside(name, "-journal"));
-         ++number)
-        name = beside(first, ("-" + std::to_string(number)).c_str());
-    return name;
+    return freeNameLike(beside(file, ".damaged"));
 }
 
 // What stands at the path gets a second name. A folder, which can have only one name, loses its first.

@@ -245,17 +245,19 @@ TEST_F(TakenOver, WithoutTheLogOfAnotherRegistry)
         fs::copy_file(other.string() + "-wal", file().string() + "-wal");
     }
     const std::string log = contentOf(file().string() + "-wal");
+    folder.write("registry.db-wal.foreign", "an earlier one");
     {
         Registry registry(file());
         EXPECT_EQ(said(registry), "");
         const std::string notice = tessel::toUtf8(registry.notice().value_or(L""));
         EXPECT_THAT(notice, AllOf(HasSubstr("The registry " + file().string() + " is read without its log"),
                                   HasSubstr("does not belong to it"),
-                                  HasSubstr("set aside as " + file().string() + "-wal.foreign")));
+                                  HasSubstr("set aside as " + file().string() + "-wal.foreign-2")));
         EXPECT_EQ(generationOf(registry), 1);
     }
     EXPECT_TRUE(contentOf(file()) == before);
-    EXPECT_TRUE(contentOf(file().string() + "-wal.foreign") == log);
+    EXPECT_TRUE(contentOf(file().string() + "-wal.foreign-2") == log);
+    EXPECT_EQ(contentOf(file().string() + "-wal.foreign"), "an earlier one");
     Registry again(file());
     EXPECT_EQ(again.notice(), std::nullopt);
 }
