@@ -47,7 +47,7 @@ std::string bytesOf(std::u16string_view units)
     return bytes;
 }
 
-Result<std::wstring> decoded(std::string_view bytes)
+Result<std::wstring> decodedText(std::string_view bytes)
 {
     const bool lowFirst = bytes.starts_with(kLowFirstMark);
     if (!lowFirst && !bytes.starts_with(kHighFirstMark))
@@ -326,7 +326,7 @@ std::wstring lineOf(const RegistryChange& change)
 
 Result<std::vector<RegistryChange>> readRegistryText(std::string_view bytes)
 {
-    const auto text = decoded(bytes);
+    const auto text = decodedText(bytes);
     return text ? Reader(*text).read() : text.failure();
 }
 

@@ -221,7 +221,7 @@ TEST_F(Messages, KeepTheirNumbers)
         {41, kTemporaryInternetFile},
         {46, kPackagedLispFilter},
         {47, kMacroProjectFilter},
-        {48, kAlreadyLoaded},
+        {48, ModrigMessages::kAlreadyLoaded},
         {51, kCoreModuleFilter},
         {60, kDialogFailed},
     };

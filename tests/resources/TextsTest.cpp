@@ -57,7 +57,7 @@ const std::vector<Message> kMessages = {
     {"kLoadFailed", kLoadFailed, kOneText},
     {"kUrlNotFetched", kUrlNotFetched, kNone},
     {"kTemporaryInternetFile", kTemporaryInternetFile, kOneText},
-    {"kAlreadyLoaded", kAlreadyLoaded, kOneText},
+    {"kAlreadyLoaded", ModrigMessages::kAlreadyLoaded, kOneText},
     {"kDialogFailed", kDialogFailed, kOneText},
 };
 
