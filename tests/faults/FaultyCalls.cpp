@@ -9,6 +9,7 @@
 //     MODRIG_FAULT_COUNTS=file         tells at the end how many calls of each kind there were
 //     MODRIG_FAULT_NETWORK=1           every folder lies on another machine
 //     MODRIG_FAULT_DELAY=500           every read at a place takes so many microseconds more
+//     MODRIG_FAULT_TOUCH=1             a file that is copied by the system is changed when it has been
 //
 // What a failing call would have done is not done; of a write, half of it is, and a file that is to be closed
 // is closed.
@@ -26,6 +27,7 @@
 #include <fcntl.h>
 #include <sys/file.h>
 #include <sys/mman.h>
+#include <sys/sendfile.h>
 #include <sys/stat.h>
 #include <sys/vfs.h>
 #include <unistd.h>
@@ -210,6 +212,15 @@ INTERPOSED ssize_t read(int file, void* bytes, size_t count)
     }
 READING(pread)
 READING(pread64)
+
+INTERPOSED ssize_t sendfile(int to, int from, off_t* offset, size_t count)
+{
+    const ssize_t sent = next<decltype(sendfile)>("sendfile")(to, from, offset, count);
+    static const bool touches = std::getenv("MODRIG_FAULT_TOUCH") != nullptr;
+    if (touches && sent > 0)
+        futimens(from, nullptr);
+    return sent;
+}
 
 INTERPOSED ssize_t write(int file, const void* bytes, size_t count)
 {
