@@ -8,6 +8,7 @@
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
 #include "host/applications/ApplicationFiles.h"
+#include "host/text/Quotes.h"
 #include "host/text/TerminalText.h"
 
 namespace tessel
@@ -23,22 +24,9 @@ bool isLispFile(const std::wstring& path)
     return isCalledAsLisp(toPath(path));
 }
 
-// A Lisp string that the reader takes for this very text.
-std::wstring quoted(const std::wstring& text)
-{
-    std::wstring result = L"\"";
-    for (const wchar_t character : text)
-    {
-        if (character == L'"' || character == L'\\')
-            result += L'\\';
-        result += character;
-    }
-    return result + L"\"";
-}
-
 Result<> loadLisp(Parts& parts, const std::wstring& path)
 {
-    const auto value = parts.lisp->evaluate(L"(load " + quoted(path) + L")");
+    const auto value = parts.lisp->evaluate(L"(load " + inQuotes(path) + L")");
     return value ? succeed(parts, path + L" is loaded.") : value.failure();
 }
 

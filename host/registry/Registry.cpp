@@ -1,4 +1,5 @@
 #include "host/registry/Registry.h"
+#include "host/registry/KeyPath.h"
 
 #include <sqlite3.h>
 
@@ -25,14 +26,6 @@ constexpr unsigned kWritesFlushedAtOnce = 64;
 // Columns of what the statements find, after the row's number and whether it is what was stored.
 constexpr int kThird = 2;
 constexpr int kFourth = 3;
-
-std::wstring_view takePart(std::wstring_view& path)
-{
-    const std::size_t end = std::min(path.find(L'\\'), path.size());
-    const std::wstring_view part = path.substr(0, end);
-    path.remove_prefix(std::min(end + 1, path.size()));
-    return part;
-}
 
 // The store has tried for ten seconds, and would for every row.
 bool isLockRefused(int status)
@@ -106,7 +99,7 @@ Registry::Key Registry::find(std::wstring_view path, Key from)
     Key key = from;
     for (std::wstring_view rest = path; !rest.empty() && key != kNoKey;)
     {
-        const std::wstring_view part = takePart(rest);
+        const std::wstring_view part = takeKeyPart(rest);
         if (!part.empty())
             key = findChild(key, part);
     }
@@ -143,7 +136,7 @@ Result<Registry::Key> Registry::makePath(std::wstring_view path, Key from)
     Key key = from;
     for (std::wstring_view rest = path; !rest.empty();)
     {
-        const std::wstring_view part = takePart(rest);
+        const std::wstring_view part = takeKeyPart(rest);
         if (part.empty())
             continue;
         const Key found = findChild(key, part);

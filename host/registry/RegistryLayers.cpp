@@ -6,6 +6,7 @@
 #include <utility>
 
 #include "host/platform/OrdinaryFile.h"
+#include "host/registry/KeyPath.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -45,12 +46,8 @@ std::vector<std::wstring> partsOfKeyPath(std::wstring_view path)
 {
     std::vector<std::wstring> parts;
     while (!path.empty())
-    {
-        const std::size_t end = std::min(path.find(kKeySeparator), path.size());
-        if (end > 0)
-            parts.emplace_back(path.substr(0, end));
-        path.remove_prefix(std::min(end + 1, path.size()));
-    }
+        if (const auto part = takeKeyPart(path); !part.empty())
+            parts.emplace_back(part);
     return parts;
 }
 

@@ -5,7 +5,9 @@
 #include <cstdint>
 #include <optional>
 
+#include "host/registry/KeyPath.h"
 #include "host/text/Hexadecimal.h"
+#include "host/text/Quotes.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -162,11 +164,10 @@ private:
 
     static std::optional<std::wstring> belowRoot(std::wstring_view path)
     {
-        const std::size_t end = std::min(path.find(L'\\'), path.size());
-        const std::wstring_view root = path.substr(0, end);
+        const std::wstring_view root = takeKeyPart(path);
         if (!equalIgnoringCase(root, kRootName) && !equalIgnoringCase(root, kShortRootName))
             return std::nullopt;
-        return std::wstring(path.substr(std::min(end + 1, path.size())));
+        return std::wstring(path);
     }
 
     Result<> readValue()
@@ -276,18 +277,6 @@ private:
     std::optional<std::wstring> mKey; // to which values belong
     std::vector<RegistryChange> mChanges;
 };
-
-std::wstring inQuotes(std::wstring_view text)
-{
-    std::wstring result = L"\"";
-    for (const wchar_t character : text)
-    {
-        if (character == L'"' || character == L'\\')
-            result += L'\\';
-        result += character;
-    }
-    return result + L"\"";
-}
 
 std::wstring byUnits(std::wstring_view text)
 {
