@@ -9,32 +9,37 @@
 #include <utility>
 
 #include "host/platform/SystemFailure.h"
+#include "host/registry/Journals.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
 {
 namespace
 {
-constexpr std::array kParts = {"", "-wal", "-journal"};
+constexpr std::size_t kPartCount = 3;
+
+std::array<std::filesystem::path, kPartCount> partsOf(const std::filesystem::path& file)
+{
+    return {file, logOf(file), rollbackJournalOf(file)};
+}
 
 // What changes with every writing; zeros for what is not there.
 using PartState = std::pair<std::filesystem::file_time_type, std::uintmax_t>;
 
-std::array<PartState, kParts.size()> stateOf(const std::filesystem::path& file)
+PartState stateOf(const std::filesystem::path& part)
 {
-    std::array<PartState, kParts.size()> states;
-    for (std::size_t part = 0; part < kParts.size(); ++part)
-    {
-        const std::string path = file.string() + kParts[part];
-        std::error_code missing;
-        if (std::filesystem::is_regular_file(path, missing))
-            states[part] = {std::filesystem::last_write_time(path, missing),
-                            std::filesystem::file_size(path, missing)};
-    }
-    return states;
+    std::error_code missing;
+    if (!std::filesystem::is_regular_file(part, missing))
+        return {};
+    return {std::filesystem::last_write_time(part, missing), std::filesystem::file_size(part, missing)};
 }
 
-std::error_code copyPart(const std::string& from, const std::string& to)
+std::array<PartState, kPartCount> stateOfAll(const std::array<std::filesystem::path, kPartCount>& parts)
+{
+    return {stateOf(parts[0]), stateOf(parts[1]), stateOf(parts[2])};
+}
+
+std::error_code copyPart(const std::filesystem::path& from, const std::filesystem::path& to)
 {
     std::error_code failed;
     if (!std::filesystem::is_regular_file(from, failed))
@@ -64,10 +69,12 @@ Result<> CopyElsewhere::make(const std::filesystem::path& file)
     if (failed || !mkdtemp(name.data()))
         return failed ? Failure{toWide(failed.message())} : systemFailure(errno);
     mFolder = name;
-    const auto before = stateOf(file);
-    for (const char* part : kParts)
-        if (const auto error = copyPart(file.string() + part, this->file().string() + part); error)
+    const auto parts = partsOf(file);
+    const auto places = partsOf(this->file());
+    const auto before = stateOfAll(parts);
+    for (std::size_t part = 0; part < kPartCount; ++part)
+        if (const auto error = copyPart(parts[part], places[part]); error)
             return Failure{toWide(error.message())};
-    return stateOf(file) == before ? Result<>() : Failure{L"it is being written"};
+    return stateOfAll(parts) == before ? Result<>() : Failure{L"it is being written"};
 }
 } // namespace tessel

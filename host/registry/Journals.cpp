@@ -143,6 +143,11 @@ std::filesystem::path rollbackJournalOf(const std::filesystem::path& file)
     return file.string() + "-journal";
 }
 
+std::filesystem::path indexOfLog(const std::filesystem::path& file)
+{
+    return file.string() + "-shm";
+}
+
 // One that is kept for the next transaction is empty or begins with a zero.
 bool isInUse(const std::filesystem::path& journal)
 {
@@ -172,7 +177,7 @@ Result<std::optional<std::wstring>> setForeignLogAside(const std::filesystem::pa
         const Failure failure = fileFailure(errno);
         return Failure{belongsElsewhere + L", and cannot be set aside: " + failure.sentence, failure.code};
     }
-    static_cast<void>(remove((file.string() + "-shm").c_str())); // it tells what is in the log
+    static_cast<void>(remove(indexOfLog(file).c_str()));
     return std::optional(L"The registry " + toWide(file.string()) + L" is read without its log: " +
                          belongsElsewhere + L". It was set aside as " + toWide(aside.string()) + L".");
 }

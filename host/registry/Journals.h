@@ -25,6 +25,8 @@ std::string asFixedFile(const std::filesystem::path& file);
 // "registry.db-wal" and "registry.db-journal" of "registry.db".
 std::filesystem::path logOf(const std::filesystem::path& file);
 std::filesystem::path rollbackJournalOf(const std::filesystem::path& file);
+// "registry.db-shm", which tells what is in the log.
+std::filesystem::path indexOfLog(const std::filesystem::path& file);
 
 // "NAME", or "NAME-2" and so on, at which nothing stands yet, nor a journal of it.
 std::filesystem::path freeNameLike(const std::filesystem::path& first);

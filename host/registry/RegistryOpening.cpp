@@ -65,14 +65,11 @@ Result<> checkKind(const std::filesystem::path& file)
 // The store takes a folder for a journal that it may not write.
 Result<> checkPlacesOfJournals(const std::filesystem::path& file)
 {
-    for (const char* ending : {"-wal", "-shm", "-journal"})
-    {
-        const std::filesystem::path journal = file.string() + ending;
+    for (const auto& journal : {logOf(file), indexOfLog(file), rollbackJournalOf(file)})
         if (const auto ordinary = checkKind(journal); ordinary.code() == SQLITE_NOTADB)
             return Failure{L"what stands at " + toWide(journal.string()) + L" is in its way: " +
                                ordinary.sentence(),
                            kInTheWay};
-    }
     return {};
 }
 

@@ -1,6 +1,7 @@
 // The copy of a registry's last sound state, and what takes the place of one that is damaged.
 #include <sqlite3.h>
 
+#include "host/registry/Journals.h"
 #include "host/registry/Registry.h"
 #include "host/registry/SoundCopy.h"
 #include "host/registry/StoreFailure.h"
@@ -53,8 +54,7 @@ void Registry::renewCopy(bool changed)
         return;
     const auto copy = soundCopyOf(mFile);
     mHasStored =
-        changed ||
-        (mLeftOpen && (!standsThere(copy) || isNewer(mFile, copy) || isNewer(mFile.string() + "-wal", copy)));
+        changed || (mLeftOpen && (!standsThere(copy) || isNewer(mFile, copy) || isNewer(logOf(mFile), copy)));
     static_cast<void>(keepCopy()); // the session's end makes it, and tells
 }
 

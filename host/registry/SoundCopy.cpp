@@ -23,7 +23,6 @@ namespace tessel
 namespace
 {
 constexpr int kNoCopy = SQLITE_NOTFOUND;
-constexpr std::array kJournals = {"-wal", "-journal"};
 
 struct CloseDatabase
 {
@@ -101,10 +100,10 @@ Result<bool> nameToo(const std::filesystem::path& file, const std::filesystem::p
 // A journal is part of the file that it was written for.
 Result<> setJournalsAside(const std::filesystem::path& file, const std::filesystem::path& kept)
 {
-    for (const char* ending : kJournals)
-        if (rename(beside(file, ending).c_str(), beside(kept, ending).c_str()) != 0 && errno != ENOENT)
+    for (const auto journalOf : {logOf, rollbackJournalOf})
+        if (rename(journalOf(file).c_str(), journalOf(kept).c_str()) != 0 && errno != ENOENT)
             return systemFailure(errno);
-    unlink(beside(file, "-shm").c_str());
+    unlink(indexOfLog(file).c_str());
     return {};
 }
 
