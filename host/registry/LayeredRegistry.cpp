@@ -11,11 +11,6 @@ namespace
 {
 // Unlike every handle that the person's own registry gives.
 constexpr std::uintptr_t kFirstLayeredHandle = 0x40000001;
-
-bool isCalled(std::wstring_view name, const std::wstring& other)
-{
-    return equalIgnoringCase(name, other);
-}
 } // namespace
 
 LayeredRegistry::LayeredRegistry(Registry& own, RegistryLayers layers, Say say)
@@ -170,12 +165,13 @@ std::vector<LayeredRegistry::Value> LayeredRegistry::values(Key key)
         return counting;
     for (const auto& laidDown : mLayers.policy.values(pathOf(key)))
     {
-        std::erase_if(counting, [&](const Value& value) { return isCalled(value.name, laidDown.name); });
+        std::erase_if(counting,
+                      [&](const Value& value) { return equalIgnoringCase(value.name, laidDown.name); });
         counting.push_back({laidDown.name, laidDown.data, laidDown.file});
     }
     for (const auto& byDefault : mLayers.defaults.values(pathOf(key)))
-        if (std::ranges::none_of(counting,
-                                 [&](const Value& value) { return isCalled(value.name, byDefault.name); }))
+        if (std::ranges::none_of(counting, [&](const Value& value)
+                                 { return equalIgnoringCase(value.name, byDefault.name); }))
             counting.push_back({byDefault.name, byDefault.data, byDefault.file});
     return counting;
 }
