@@ -24,13 +24,9 @@ bool isSameFile(const std::wstring& path, const std::wstring& other)
     return path == other || std::filesystem::equivalent(toPath(path), toPath(other), failed);
 }
 
-std::wstring profileKey(const Parts& parts)
-{
-    return std::wstring(kProductRegistryRoot) + L"\\Profiles\\" + parts.profiles.current();
-}
-
 // What applications have stored: in a safe session none of it was loaded, and nothing else knows of it.
-void addStoredPaths(Registry& registry, Registry::Key key, const std::wstring& name, Texts& paths)
+void addStoredPaths(LayeredRegistry& registry, LayeredRegistry::Key key, const std::wstring& name,
+                    Texts& paths)
 {
     for (const auto& value : registry.values(key))
         if (isCalled(value.data, name) && toPath(value.data).is_absolute())
@@ -61,7 +57,7 @@ Texts applicationsCalled(Parts& parts, const std::wstring& name)
     dropAllBut(known, name);
     if (!known.empty())
         return known;
-    addStoredPaths(*parts.registry, parts.registry->find(profileKey(parts)), name, known);
+    addStoredPaths(*parts.layered, parts.layered->find(parts.profiles.currentKey()), name, known);
     dropAllBut(known, name);
     return known;
 }

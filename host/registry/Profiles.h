@@ -19,6 +19,9 @@ public:
     // The current profile's name; empty when the registry cannot be read.
     std::wstring current() const;
 
+    // Its key, below which applications keep what is theirs.
+    std::wstring currentKey() const { return mKey + L"\\" + current(); }
+
     // Makes a profile the current one; one that is new begins empty. Fails when the name cannot be that of a
     // key or the registry cannot be written.
     Result<> setCurrent(const std::wstring& name);

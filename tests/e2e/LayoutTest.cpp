@@ -73,6 +73,16 @@ TEST_F(Layout, ThatIsPolicyCannotBeTakenOutAndThePersonIsTold)
                          "    (from " + file + ")\n"));
 }
 
+// In a safe session nothing of it was loaded; only the layout knows the whole path.
+TEST_F(Layout, OfASuiteIsKnownToDisableByItsNames)
+{
+    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    session.alwaysWith({"--layout-dir", (session.folder() / "layout").string(), "--safe"});
+    const auto disabled = session.run({"DISABLE hilbert.lsp"});
+    EXPECT_EQ(disabled.exitStatus, 0) << disabled.output;
+    EXPECT_THAT(disabled.output, HasSubstr(sample("hilbert.lsp")));
+}
+
 TEST_F(Layout, ThatIsDamagedIsToldAtEveryStartAndDoesNotCount)
 {
     layOutSuite("suite.reg", sample("hilbert.lsp"));
