@@ -29,16 +29,29 @@ constexpr const char* kHugeHistory =
     " SELECT 9, i || 'History', i || 'history', '/nowhere/tool' || i || '.lsp' FROM n;"
     "PRAGMA user_version=1;"
     "COMMIT;";
+
+class HugeHistory : public testing::Test
+{
+protected:
+    void SetUp() override
+    {
+        std::filesystem::create_directories(session.profile());
+        ASSERT_EQ(runSql(file, kHugeHistory), "");
+    }
+    void delayReads(const std::string& microseconds)
+    {
+        session.set("LD_PRELOAD", FAULTY_CALLS);
+        session.set("MODRIG_FAULT_DELAY", microseconds);
+    }
+
+    HostSession session;
+    const std::filesystem::path file = session.profile() / "registry.db";
+};
 } // namespace
 
-TEST(HugeHistory, IsToldAboutWhileItsRegistryIsLookedThrough)
+TEST_F(HugeHistory, IsToldAboutWhileItsRegistryIsLookedThrough)
 {
-    HostSession session;
-    const auto file = session.profile() / "registry.db";
-    std::filesystem::create_directories(session.profile());
-    ASSERT_EQ(runSql(file, kHugeHistory), "");
-    session.set("LD_PRELOAD", FAULTY_CALLS);
-    session.set("MODRIG_FAULT_DELAY", "100");
+    delayReads("100");
     const auto result = session.start({"--safe", "-c", "VERSION"});
     EXPECT_EQ(result.exitStatus, 0);
     EXPECT_NE(result.output.find("Tessel looks through the registry " + file.string() +
@@ -47,14 +60,9 @@ TEST(HugeHistory, IsToldAboutWhileItsRegistryIsLookedThrough)
         << result.output;
 }
 
-TEST(HugeHistory, IsOpenedWithoutALookWhenThePersonStopsThat)
+TEST_F(HugeHistory, IsOpenedWithoutALookWhenThePersonStopsThat)
 {
-    HostSession session;
-    const auto file = session.profile() / "registry.db";
-    std::filesystem::create_directories(session.profile());
-    ASSERT_EQ(runSql(file, kHugeHistory), "");
-    session.set("LD_PRELOAD", FAULTY_CALLS);
-    session.set("MODRIG_FAULT_DELAY", "500");
+    delayReads("500");
     session.alwaysWith({"--safe"});
     HostTerminal terminal(session);
     ASSERT_TRUE(terminal.shows("takes its time. Ctrl-C ends that.")) << terminal.screen();
@@ -69,15 +77,10 @@ TEST(HugeHistory, IsOpenedWithoutALookWhenThePersonStopsThat)
     EXPECT_EQ(runSql(file, "SELECT count(*) FROM value WHERE key=9"), "200001");
 }
 
-TEST(HugeHistory, IsToldAboutWhileItIsReadAndKeptWhenThePersonStopsThat)
+TEST_F(HugeHistory, IsToldAboutWhileItIsReadAndKeptWhenThePersonStopsThat)
 {
-    HostSession session;
-    const auto file = session.profile() / "registry.db";
-    std::filesystem::create_directories(session.profile());
-    ASSERT_EQ(runSql(file, kHugeHistory), "");
     ASSERT_EQ(session.start({"--safe", "-c", "VERSION"}).exitStatus, 0); // reads none of it
-    session.set("LD_PRELOAD", FAULTY_CALLS);
-    session.set("MODRIG_FAULT_DELAY", "500");
+    delayReads("500");
     HostTerminal terminal(session);
     ASSERT_TRUE(terminal.shows("values so far. Ctrl-C stops it.")) << terminal.screen();
     terminal.type(kControlC);
