@@ -107,12 +107,12 @@ bool holds(std::string_view line, std::uintptr_t address)
 std::string fileIn(const std::string& line)
 {
     constexpr int kFieldsBefore = 3;
-    constexpr int kFields = 2;
+    constexpr int kFieldsTaken = 2;
     std::size_t start = 0;
     for (int field = 0; field < kFieldsBefore; ++field)
         start = line.find(' ', start) + 1;
     std::size_t end = start;
-    for (int field = 0; field < kFields; ++field)
+    for (int field = 0; field < kFieldsTaken; ++field)
         end = line.find(' ', end) + 1;
     return line.substr(start, end - start);
 }
