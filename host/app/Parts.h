@@ -8,7 +8,6 @@
 #include <filesystem>
 #include <memory>
 
-#include "host/app/ProductFolders.h"
 #include "host/app/WindowBox.h"
 #include "host/applications/Admission.h"
 #include "host/applications/ApplicationRecords.h"
@@ -33,6 +32,7 @@
 #include "host/messages/Help.h"
 #include "host/messages/MessageBox.h"
 #include "host/messages/Questions.h"
+#include "host/platform/ProductFolders.h"
 #include "host/registry/LayeredRegistry.h"
 #include "host/registry/Profiles.h"
 #include "host/registry/Registry.h"

@@ -13,7 +13,7 @@
 
 #include "host/app/Host.h"
 #include "host/app/Options.h"
-#include "host/app/ProductFolders.h"
+#include "host/app/PersonalFolders.h"
 #include "host/app/WindowBox.h"
 #include "host/commands/CommandRunner.h"
 #include "host/commands/LastWords.h"
@@ -24,6 +24,7 @@
 #include "host/console/PipedInput.h"
 #include "host/console/StandardOutput.h"
 #include "host/console/TypedHistory.h"
+#include "host/platform/ProductFolders.h"
 #include "host/text/TerminalText.h"
 #include "host/text/Unicode.h"
 #include "host/text/Version.h"
@@ -148,6 +149,7 @@ int runHost(Options options, StandardOutput& output)
 int runProgram(int count, const char* const* arguments)
 {
     useUtf8();
+    usePersonsLanguage();
     surviveFailingWrites();
     takeStandardDescriptors();
     const auto parsed = parseOptions(count, arguments);

@@ -13,6 +13,7 @@
 #include "host/lisp/LispFile.h"
 #include "host/lisp/LispMachine.h"
 #include "host/platform/PartFile.h"
+#include "host/platform/ProductFolders.h"
 #include "host/text/TerminalText.h"
 #include "host/text/Unicode.h"
 #include "host/text/Version.h"
@@ -105,6 +106,7 @@ Result<> compileGuarded(const fs::path& input, const fs::path& output)
 
 int runCompilerProgram(int count, const char* const* arguments)
 {
+    usePersonsLanguage();
     CLI::App app("Compiles a Lisp file for Tessel to byte code.", "tesselc");
     app.footer(kCompilerAfterword);
     app.set_version_flag("--version", versionLine("tesselc, the Lisp compiler of Tessel R21"),

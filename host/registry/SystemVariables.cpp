@@ -9,6 +9,7 @@
 
 #include "host/registry/LayeredRegistry.h"
 #include "host/text/Running.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -20,12 +21,13 @@ std::vector<SystemVariables::Variable> hostVariables()
     using Storage = SystemVariables::Storage;
     return {
         {kLispEnabled, std::int16_t{1}, 0, 1, Storage::kSession,
-         L"1: applications may load Lisp files; 0: not"},
+         translated(L"1: applications may load Lisp files; 0: not")},
         {kRemovingTsLisp, std::int16_t{1}, 0, 1, Storage::kStored,
-         L"1: compiled and packaged Lisp can be loaded (read at the next start)"},
+         translated(L"1: compiled and packaged Lisp can be loaded (read at the next start)")},
         {kSearchPath, std::wstring(), 0, 0, Storage::kStored,
-         L"Folders to look for files in, separated by ;"},
-        {kTesselVersion, std::wstring(L"R21"), 0, 0, Storage::kReadOnly, L"The release of this host"},
+         translated(L"Folders to look for files in, separated by ;")},
+        {kTesselVersion, std::wstring(L"R21"), 0, 0, Storage::kReadOnly,
+         translated(L"The release of this host")},
     };
 }
 
@@ -53,8 +55,8 @@ std::optional<SystemVariables::Value> parseFor(const SystemVariables::Variable& 
 
 std::wstring rangeSentence(const SystemVariables::Variable& variable)
 {
-    return variable.name + L" takes a whole number from " + std::to_wstring(variable.smallest) + L" to " +
-           std::to_wstring(variable.largest) + L".";
+    return translated(L"{} takes a whole number from {} to {}.", variable.name, variable.smallest,
+                      variable.largest);
 }
 } // namespace
 
@@ -90,9 +92,9 @@ Result<> SystemVariables::set(std::wstring_view name, std::wstring_view text)
 {
     const auto* found = find(name);
     if (!found)
-        return Failure{L"There is no variable called \"" + std::wstring(name) + L"\"."};
+        return Failure{translated(L"There is no variable called \"{}\".", name)};
     if (found->storage == Storage::kReadOnly)
-        return Failure{found->name + L" can only be read."};
+        return Failure{translated(L"{} can only be read.", found->name)};
     const auto value = parseFor(*found, text);
     if (!value)
         return Failure{rangeSentence(*found)};
@@ -100,7 +102,8 @@ Result<> SystemVariables::set(std::wstring_view name, std::wstring_view text)
     variable.value = *value;
     const bool store = variable.storage == Storage::kStored && mRegistry;
     if (store && !mRegistry->write(mStorageKey, variable.name, toText(variable.value)))
-        return Failure{variable.name + L" is set for this session only: the registry cannot be written."};
+        return Failure{
+            translated(L"{} is set for this session only: the registry cannot be written.", variable.name)};
     return {};
 }
 

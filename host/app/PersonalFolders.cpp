@@ -1,11 +1,8 @@
-#include "host/app/ProductFolders.h"
+#include "host/app/PersonalFolders.h"
 
-#include <cstdlib>
 #include <iterator>
 #include <sstream>
 #include <string>
-
-#include <dlfcn.h>
 
 #include "host/app/platform/DataHome.h"
 #include "host/registry/RegistryLayers.h"
@@ -17,25 +14,7 @@ namespace
 {
 constexpr wchar_t kLayoutKey[] = L"Software\\Tessel\\Layout";
 constexpr char kProductFolder[] = "Tessel";
-constexpr char kProgramsOfBundle[] = "MacOS"; // Tessel.app/Contents/MacOS
 } // namespace
-
-ProductFolders productFoldersOf(const std::filesystem::path& binaries)
-{
-    const auto contents = binaries.filename() == kProgramsOfBundle ? binaries.parent_path() : binaries;
-    return {binaries, contents / "Resources", contents / "PlugIns"};
-}
-
-ProductFolders runningProductFolders()
-{
-    Dl_info library{};
-    static const char insideOfLibrary = 0;
-    std::error_code error;
-    std::filesystem::path file;
-    if (dladdr(&insideOfLibrary, &library) != 0)
-        file = std::filesystem::canonical(library.dli_fname, error);
-    return productFoldersOf(file.parent_path());
-}
 
 std::filesystem::path personalFolder()
 {

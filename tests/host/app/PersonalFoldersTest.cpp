@@ -3,25 +3,11 @@
 #include <cstdlib>
 #include <string>
 
-#include "host/app/ProductFolders.h"
+#include "host/app/PersonalFolders.h"
 #include "tests/support/EnvironmentVariable.h"
 #include "tests/support/TemporaryFolder.h"
 
-TEST(ProductFolders, FindsThePartsBesideThePrograms)
-{
-    const auto folders = tessel::productFoldersOf("/moved/Tessel.app");
-    EXPECT_EQ(folders.resources, "/moved/Tessel.app/Resources");
-    EXPECT_EQ(folders.plugIns, "/moved/Tessel.app/PlugIns");
-}
-
-TEST(ProductFolders, FindsThePartsOfABundleInItsContents)
-{
-    const auto folders = tessel::productFoldersOf("/moved/Tessel.app/Contents/MacOS");
-    EXPECT_EQ(folders.resources, "/moved/Tessel.app/Contents/Resources");
-    EXPECT_EQ(folders.plugIns, "/moved/Tessel.app/Contents/PlugIns");
-}
-
-TEST(ProductFolders, KeepsThePersonsOwnProfileWhereTheSystemWantsIt)
+TEST(PersonalFolders, KeepAProfileWhereTheSystemWantsIt)
 {
     const char* dataHome = std::getenv("XDG_DATA_HOME");
     const std::string before = dataHome ? dataHome : "";
@@ -33,7 +19,7 @@ TEST(ProductFolders, KeepsThePersonsOwnProfileWhereTheSystemWantsIt)
     dataHome ? setenv("XDG_DATA_HOME", before.c_str(), 1) : unsetenv("XDG_DATA_HOME");
 }
 
-TEST(ProductFolders, TakeTheMachinesOwnLayoutLastWhateverTheEnvironmentSays)
+TEST(PersonalFolders, TakeTheMachinesOwnLayoutLastWhateverTheEnvironmentSays)
 {
     const EnvironmentVariable folders("XDG_CONFIG_DIRS", "/first:relative:/second");
     EXPECT_THAT(tessel::layoutFolders(""),
@@ -44,7 +30,7 @@ TEST(ProductFolders, TakeTheMachinesOwnLayoutLastWhateverTheEnvironmentSays)
     EXPECT_THAT(tessel::layoutFolders(""), testing::ElementsAre("/etc/xdg/tessel", "/etc/tessel"));
 }
 
-TEST(ProductFolders, TakeTheFurtherOnesThatALayoutNames)
+TEST(PersonalFolders, TakeTheFurtherOnesThatALayoutNames)
 {
     const TemporaryFolder folder;
     EXPECT_THAT(tessel::furtherLayoutFolders(folder.path()), testing::IsEmpty());
