@@ -264,49 +264,34 @@ DeedWords wordsFor(RunningMarker::Deed deed) noexcept
     return {"while it was being loaded", {}};
 }
 
-std::string_view wordsFor(RunningMarker::Reason reason) noexcept
-{
-    switch (reason)
-    {
-    case RunningMarker::Reason::kAtStart:
-        return "loaded at the start";
-    case RunningMarker::Reason::kForAnother:
-        return "loaded from the Startup Suite";
-    case RunningMarker::Reason::kOnCommand:
-        return "loaded on command";
-    case RunningMarker::Reason::kByHand:
-        break;
-    }
-    return "asked for by hand";
-}
-
-std::string_view wordsForEnding(int ending) noexcept
+Sentence<> wordsForEnding(int ending) noexcept
 {
     struct Words
     {
         int ending;
-        std::string_view text;
+        Sentence<> text;
     };
-    static constexpr Words kWords[] = {{RunningMarker::kVanished,
-                                        "it ended without a signal that can be caught, by \"_exit\", a kill "
-                                        "or a power cut"},
-                                       {RunningMarker::kCalledExit, "it called \"exit\""},
-                                       {RunningMarker::kEndedByKey, "you ended it with Ctrl-C"},
-                                       {SIGSEGV, "memory fault (SIGSEGV)"},
-                                       {SIGBUS, "memory fault (SIGBUS)"},
-                                       {SIGABRT, "it stopped at an error of its own (SIGABRT)"},
-                                       {SIGFPE, "arithmetic fault (SIGFPE)"},
-                                       {SIGILL, "unknown instruction (SIGILL)"},
-                                       {SIGTRAP, "breakpoint (SIGTRAP)"},
-                                       {SIGSYS, "unknown call of the system (SIGSYS)"},
-                                       {SIGQUIT, "quit from outside (SIGQUIT)"},
-                                       {SIGTERM, "it did not come back (SIGTERM)"},
-                                       {SIGHUP, "it did not come back (SIGHUP)"},
-                                       {SIGINT, "it did not come back (SIGINT)"},
-                                       {SIGXCPU, "too much time used (SIGXCPU)"}};
+    static constexpr Words kWords[] = {
+        {RunningMarker::kVanished,
+         Sentence(L"it ended without a signal that can be caught, by \"_exit\", a kill "
+                  L"or a power cut")},
+        {RunningMarker::kCalledExit, Sentence(L"it called \"exit\"")},
+        {RunningMarker::kEndedByKey, Sentence(L"you ended it with Ctrl-C")},
+        {SIGSEGV, Sentence(L"memory fault (SIGSEGV)")},
+        {SIGBUS, Sentence(L"memory fault (SIGBUS)")},
+        {SIGABRT, Sentence(L"it stopped at an error of its own (SIGABRT)")},
+        {SIGFPE, Sentence(L"arithmetic fault (SIGFPE)")},
+        {SIGILL, Sentence(L"unknown instruction (SIGILL)")},
+        {SIGTRAP, Sentence(L"breakpoint (SIGTRAP)")},
+        {SIGSYS, Sentence(L"unknown call of the system (SIGSYS)")},
+        {SIGQUIT, Sentence(L"quit from outside (SIGQUIT)")},
+        {SIGTERM, Sentence(L"it did not come back (SIGTERM)")},
+        {SIGHUP, Sentence(L"it did not come back (SIGHUP)")},
+        {SIGINT, Sentence(L"it did not come back (SIGINT)")},
+        {SIGXCPU, Sentence(L"too much time used (SIGXCPU)")}};
     for (const Words& words : kWords)
         if (words.ending == ending)
             return words.text;
-    return "a signal";
+    return Sentence(L"a signal");
 }
 } // namespace tessel

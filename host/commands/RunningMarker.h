@@ -15,6 +15,7 @@
 #include <vector>
 
 #include "host/text/Result.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -165,6 +166,5 @@ struct DeedWords
     std::string_view after;  // and after the detail: "\" ran"
 };
 DeedWords wordsFor(RunningMarker::Deed deed) noexcept;
-std::string_view wordsFor(RunningMarker::Reason reason) noexcept;
-std::string_view wordsForEnding(int ending) noexcept;
+Sentence<> wordsForEnding(int ending) noexcept; // ASCII
 } // namespace tessel
