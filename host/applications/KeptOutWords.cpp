@@ -95,9 +95,9 @@ std::wstring sentenceOfReason(const KeptOutApplication& application)
 
 std::wstring whatItDid(const KeptOutApplication& application, std::size_t sessions)
 {
-    const std::wstring done = translated(L"The application \"{}\" ended Tessel on {} {} ({}): {}.",
-                                         toWide(application.path), dayOf(application), deedOf(application),
-                                         wishOf(application), endingOf(application));
+    const std::wstring done =
+        translated(L"The application \"{}\" ended Tessel on {} {} ({}): {}.", toWide(application.path),
+                   dayOf(application), deedOf(application), wishOf(application), endingOf(application));
     if (sessions == 1)
         return done;
     return done + L' ' +
