@@ -17,6 +17,7 @@ namespace tessel
 namespace
 {
 constexpr const char* kEntryPointName = "tsrxEntryPoint";
+constexpr std::string_view kUndefinedSymbol = "undefined symbol: "; // how the linker says it
 
 // The linker begins with the path, which the sentence around its words names already.
 std::wstring linkersWords(const std::string& program)
@@ -26,7 +27,11 @@ std::wstring linkersWords(const std::string& program)
         return translated(L"the system does not say why");
     const std::string words = error;
     const std::string start = program + ": ";
-    return toWide(withReadableSymbols(words.starts_with(start) ? words.substr(start.size()) : words));
+    const std::string readable =
+        withReadableSymbols(words.starts_with(start) ? words.substr(start.size()) : words);
+    if (readable.starts_with(kUndefinedSymbol))
+        return translated(L"undefined symbol: {}", toWide(readable.substr(kUndefinedSymbol.size())));
+    return toWide(readable);
 }
 
 // The system's headers declare that these never throw, so the compiler leaves out what an exception needs to

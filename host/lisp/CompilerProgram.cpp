@@ -14,6 +14,7 @@
 #include "host/lisp/LispMachine.h"
 #include "host/platform/PartFile.h"
 #include "host/platform/ProductFolders.h"
+#include "host/text/ProgramHelp.h"
 #include "host/text/TerminalText.h"
 #include "host/text/Translation.h"
 #include "host/text/Unicode.h"
@@ -117,6 +118,7 @@ int runCompilerProgram(int count, const char* const* arguments)
     app.add_option("FILE", input, inUtf8(Sentence(L"The Lisp file (.lsp)")))->required();
     app.add_option("-o,--output", output,
                    inUtf8(Sentence(L"The compiled file; otherwise FILE with the extension .qbc")));
+    translateHelp(app);
     try
     {
         app.parse(count, arguments);
