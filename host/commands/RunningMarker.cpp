@@ -264,7 +264,7 @@ DeedWords wordsFor(RunningMarker::Deed deed) noexcept
     return {"while it was being loaded", {}};
 }
 
-Sentence<> wordsForEnding(int ending) noexcept
+Sentence<> wordsForEnding(int ending)
 {
     struct Words
     {

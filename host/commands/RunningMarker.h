@@ -166,5 +166,5 @@ struct DeedWords
     std::string_view after;  // and after the detail: "\" ran"
 };
 DeedWords wordsFor(RunningMarker::Deed deed) noexcept;
-Sentence<> wordsForEnding(int ending) noexcept; // ASCII
+Sentence<> wordsForEnding(int ending); // ASCII
 } // namespace tessel
