@@ -19,7 +19,8 @@ public:
     TsEdCommandHandler handler = nullptr;
     std::wstring summary; // one line, or empty
 
-    // The host's own commands have these instead of a handler.
+    std::wstring usage; // its arguments; empty where it takes none
+
+    // The host's own commands have this instead of a handler.
     std::function<tessel::Result<>(const std::vector<std::wstring>& arguments)> builtIn;
-    std::wstring usage;
 };
