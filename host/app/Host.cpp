@@ -6,6 +6,7 @@
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
+#include "host/applications/ShippedRecords.h"
 #include "host/applications/StartSummary.h"
 #include "host/console/Console.h"
 #include "host/platform/AutoreleasePool.h"
@@ -109,6 +110,7 @@ Result<> Host::makeParts()
     mInterruptibleRegistry = &*mParts->registry;
     mMarker = &*mParts->marker;
     addCommands();
+    addShippedRecords();
     return {};
 }
 
@@ -169,6 +171,17 @@ bool Host::tellWhoElseWrites(const std::wstring& kind, const std::filesystem::pa
                           : L" and so decide what Tessel loads. This puts it right: chmod " +
                                 std::wstring(isFolder ? L"700 " : L"600 ") + toText(path)));
     return false;
+}
+
+// What waits for its commands is listed with them from the beginning.
+void Host::addShippedRecords()
+{
+    for (const auto& shipped : readShippedRecords(mParts->folders.plugIns, kProductRegistryRoot))
+    {
+        mParts->records->add(shipped.record);
+        for (const auto& command : shipped.commands)
+            mParts->commands->announce(command);
+    }
 }
 
 void Host::addCommands()
