@@ -1,5 +1,5 @@
-// What the commands say beside the module's own messages, by id: texts of ModrigLists.rc. The comment after each
-// says what its placeholders stand for.
+// What the commands say beside the module's own messages, by id: texts of ModrigLists.rc. The comment after
+// each says what its placeholders stand for.
 #pragma once
 
 namespace ModrigMessages

@@ -118,18 +118,30 @@ CStdStr LaidDownInstead(const CStdStr& key, const CStdStr& name, const CStdStr& 
 const KeptList& KeptStartupSuite()
 {
     using namespace ModrigMessages;
-    static const KeptList list{L"suite",           kStoredStartupSuite,     gStartupList,
-                               kStartupSuiteName,  kOneAddedToStartupSuite, kManyAddedToStartupSuite,
-                               kOneRemovedFromSuite, kManyRemovedFromSuite, true};
+    static const KeptList list{L"suite",
+                               kStoredStartupSuite,
+                               gStartupList,
+                               kStartupSuiteName,
+                               kOneAddedToStartupSuite,
+                               kManyAddedToStartupSuite,
+                               kOneRemovedFromSuite,
+                               kManyRemovedFromSuite,
+                               true};
     return list;
 }
 
 const KeptList& KeptHistory()
 {
     using namespace ModrigMessages;
-    static const KeptList list{L"history",    kStoredHistory,     gHistoryList,
-                               kHistoryName,  kOneAddedToHistory, kManyAddedToHistory,
-                               kOneRemovedFromHistory, kManyRemovedFromHistory, false};
+    static const KeptList list{L"history",
+                               kStoredHistory,
+                               gHistoryList,
+                               kHistoryName,
+                               kOneAddedToHistory,
+                               kManyAddedToHistory,
+                               kOneRemovedFromHistory,
+                               kManyRemovedFromHistory,
+                               false};
     return list;
 }
 
@@ -192,10 +204,11 @@ Change MoveFile(const CStdStr& typed, const CStdStr& place)
     const std::size_t number = isNumber ? std::stoul(digits) : 0;
     const std::vector<CStdStr> entries(suite.files.begin(), suite.files.end());
     if (number < 1 || number > entries.size())
-        return {CStdStr::Formatted(ModrigMessages::kNoSuchPlace, place.c_str(),
-                                   Decimal(entries.size()).c_str())};
+        return {
+            CStdStr::Formatted(ModrigMessages::kNoSuchPlace, place.c_str(), Decimal(entries.size()).c_str())};
     static_cast<void>(MoveInStartupSuite(path, entries[number - 1])); // both are in it
-    return {{}, CStdStr::Formatted(ModrigMessages::kMoved, FileNameOf(path).c_str(), Decimal(number).c_str())};
+    return {{},
+            CStdStr::Formatted(ModrigMessages::kMoved, FileNameOf(path).c_str(), Decimal(number).c_str())};
 }
 
 CStdStr LaidDownInstead(const KeptList& list)

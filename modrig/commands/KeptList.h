@@ -36,7 +36,8 @@ struct Change
     CStdStr told = {};
 };
 
-// The changes concern `list.files` alone, as a whole or not at all; nothing is stored. Paths as they were typed.
+// The changes concern `list.files` alone, as a whole or not at all; nothing is stored. Paths as they were
+// typed.
 [[nodiscard]] Change AddFiles(const KeptList& list, const std::vector<CStdStr>& typed);
 [[nodiscard]] Change RemoveFiles(const KeptList& list, const std::vector<CStdStr>& typed);
 [[nodiscard]] Change RemoveAllFiles(const KeptList& list);

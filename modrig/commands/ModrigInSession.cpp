@@ -28,8 +28,7 @@ bool IsLoadedByItsCommand()
 {
     TesselAppInfo record;
     record.setAppName(kRecordName);
-    return record.readFromRegistry() == TSRX_APPINFO_OK &&
-           (record.loadReason() & TSRX_LOAD_ON_COMMAND) != 0;
+    return record.readFromRegistry() == TSRX_APPINFO_OK && (record.loadReason() & TSRX_LOAD_ON_COMMAND) != 0;
 }
 
 TsRxDynamicLinker* Linker()
@@ -70,7 +69,8 @@ void UpdateRecordOfModrig(bool hasStartup)
     if (record.readFromRegistry() != TSRX_APPINFO_OK)
         return;
     const unsigned reasons = record.loadReason();
-    const unsigned wanted = hasStartup ? reasons | TSRX_LOAD_AT_HOST_START : reasons & ~TSRX_LOAD_AT_HOST_START;
+    const unsigned wanted =
+        hasStartup ? reasons | TSRX_LOAD_AT_HOST_START : reasons & ~TSRX_LOAD_AT_HOST_START;
     record.setLoadReason(wanted);
     if (wanted != reasons)
         record.writeToRegistry(false, false); // the commands in it are Modrig's

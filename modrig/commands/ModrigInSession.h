@@ -1,5 +1,5 @@
-// Modrig while it is loaded: it holds the lists that it has read, and stores them when its dialog is closed. Whoever
-// changes what is stored has to see that Modrig reads it again.
+// Modrig while it is loaded: it holds the lists that it has read, and stores them when its dialog is closed.
+// Whoever changes what is stored has to see that Modrig reads it again.
 #pragma once
 
 #include "modrig/base/CStdStr.h"
@@ -7,8 +7,9 @@
 
 namespace ModrigUtils
 {
-// Takes Modrig out of service for as long as the object lives, if it is loaded and can be. It reads the lists again
-// when it is loaded, by its command; where its record does not say that, it is loaded at the end of the scope.
+// Takes Modrig out of service for as long as the object lives, if it is loaded and can be. It reads the lists
+// again when it is loaded, by its command; where its record does not say that, it is loaded at the end of the
+// scope.
 class ModrigOutOfService
 {
 public:
@@ -31,7 +32,7 @@ private:
 // Why nobody can change the list now, whoever they are; empty when nothing is in the way.
 [[nodiscard]] CStdStr WhyNobodyCanChange(const KeptList& list);
 
-// Keeps the host's record of Modrig in step with the Startup Suite, as Modrig does itself: it is loaded at the start
-// as long as there is something to load.
+// Keeps the host's record of Modrig in step with the Startup Suite, as Modrig does itself: it is loaded at
+// the start as long as there is something to load.
 void UpdateRecordOfModrig(bool hasStartup);
 } // namespace ModrigUtils

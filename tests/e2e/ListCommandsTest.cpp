@@ -15,8 +15,9 @@ using testing::Not;
 
 namespace
 {
-constexpr char kModrigWaits[] = "Modrig is unloaded. It is loaded again when MODRIG is typed, and the Lisp of "
-                                "the Startup Suite with it.\n";
+constexpr char kModrigWaits[] =
+    "Modrig is unloaded. It is loaded again when MODRIG is typed, and the Lisp of "
+    "the Startup Suite with it.\n";
 constexpr char kNoDisplay[] = "Tessel cannot open a window: there is no display.\n";
 
 class ListCommands : public testing::Test
@@ -55,10 +56,10 @@ protected:
 
     void layDownSuite(const std::string& file, const std::string& application) const
     {
-        session.folder().write("layout/" + file, "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
-                                                     std::string(kSuiteKey) +
-                                                     "]\n\"NumStartup\"=\"1\"\n\"1Startup\"=\"" + application +
-                                                     "\"\n");
+        session.folder().write("layout/" + file,
+                               "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
+                                   std::string(kSuiteKey) + "]\n\"NumStartup\"=\"1\"\n\"1Startup\"=\"" +
+                                   application + "\"\n");
     }
 
     HostSession session;
@@ -136,7 +137,8 @@ TEST_F(ListCommands, KnowAFileAsTheModuleDoes)
     quietly("SUITE ADD " + first);
     std::string inCapitals = first;
     inCapitals.replace(inCapitals.rfind("first"), 5, "FIRST");
-    EXPECT_EQ(quietly("SUITE ADD " + first), "first.lsp was added to the Startup Suite.\n") << "it is there already";
+    EXPECT_EQ(quietly("SUITE ADD " + first), "first.lsp was added to the Startup Suite.\n")
+        << "it is there already";
     EXPECT_THAT(suite(), ElementsAre(first));
     const auto object = session.folder() / "a/gears.omp";
     std::filesystem::create_directories(object.parent_path());
@@ -184,15 +186,16 @@ TEST_F(ListCommands, AddToAListOfManyEntries)
     Paths many;
     for (int number = 1; number <= 3000; ++number)
         many.push_back("/nowhere/" + std::to_string(number) + ".lsp");
-    session.folder().write("many.reg",
-                           [&]
-                           {
-                               std::string text = "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
-                                                  std::string(kSuiteKey) + "]\n\"NumStartup\"=\"3000\"\n";
-                               for (std::size_t index = 0; index < many.size(); ++index)
-                                   text += "\"" + std::to_string(index + 1) + "Startup\"=\"" + many[index] + "\"\n";
-                               return text;
-                           }());
+    session.folder().write(
+        "many.reg",
+        [&]
+        {
+            std::string text = "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
+                               std::string(kSuiteKey) + "]\n\"NumStartup\"=\"3000\"\n";
+            for (std::size_t index = 0; index < many.size(); ++index)
+                text += "\"" + std::to_string(index + 1) + "Startup\"=\"" + many[index] + "\"\n";
+            return text;
+        }());
     quietly("REGISTRY IMPORT " + (session.folder() / "many.reg").string());
     quietly("SUITE ADD " + first);
     many.push_back(first);
@@ -201,9 +204,11 @@ TEST_F(ListCommands, AddToAListOfManyEntries)
 
 TEST_F(ListCommands, TellWhenTheyAreTypedWrongly)
 {
-    const std::string usage = "Usage: SUITE LIST | ADD file... | REMOVE file... | MOVE file place | CLEAR [--json]\n";
-    const std::vector<std::string> wrong = {"SUITE", "SUITE GROW", "SUITE LIST " + first, "SUITE ADD",
-                                            "SUITE REMOVE", "SUITE CLEAR all", "SUITE MOVE " + first};
+    const std::string usage =
+        "Usage: SUITE LIST | ADD file... | REMOVE file... | MOVE file place | CLEAR [--json]\n";
+    const std::vector<std::string> wrong = {
+        "SUITE",        "SUITE GROW",      "SUITE LIST " + first, "SUITE ADD",
+        "SUITE REMOVE", "SUITE CLEAR all", "SUITE MOVE " + first};
     for (const std::string& command : wrong)
         EXPECT_EQ(quietly(command, 1), usage) << command;
 }
@@ -217,14 +222,16 @@ TEST_F(ListCommands, AreToldOfByHelpBeforeAndAfterTheyAreLoaded)
     const std::string before = output.substr(begin, end - begin);
     const std::string after = output.substr(output.find("Session\n", end));
     EXPECT_EQ(before, after);
-    EXPECT_THAT(before, HasSubstr("SUITE LIST | ADD file... | REMOVE file... | MOVE file place | CLEAR [--json]"));
+    EXPECT_THAT(before,
+                HasSubstr("SUITE LIST | ADD file... | REMOVE file... | MOVE file place | CLEAR [--json]"));
     EXPECT_THAT(before, HasSubstr("Shows and changes the History list of Modrig"));
 }
 
 TEST_F(ListCommands, AreNotLoadedBeforeTheyAreTyped)
 {
     putOffModrig(session);
-    EXPECT_EQ(session.run({"APPS"}).output, std::string(kBanner) + "Command: APPS\nNo application is loaded.\n");
+    EXPECT_EQ(session.run({"APPS"}).output,
+              std::string(kBanner) + "Command: APPS\nNo application is loaded.\n");
 }
 
 TEST_F(ListCommands, ShowEntriesThatAreNotThere)
@@ -257,7 +264,8 @@ TEST_F(ListCommands, WriteNamesThatAreNoTextAsJson)
 TEST_F(ListCommands, BelongToTheCurrentProfile)
 {
     quietly("SUITE ADD " + first);
-    const auto other = session.start({"--safe", "-c", "PROFILE Other", "-c", "SUITE LIST", "-c", "SUITE ADD " + second});
+    const auto other =
+        session.start({"--safe", "-c", "PROFILE Other", "-c", "SUITE LIST", "-c", "SUITE ADD " + second});
     EXPECT_THAT(other.output, HasSubstr("There is nothing in the Startup Suite.\n"));
     EXPECT_THAT(suite(), ElementsAre(second));
     quietly("PROFILE Default");
@@ -269,12 +277,14 @@ TEST_F(ListCommands, HaveModrigReadTheListAgainWhichIsLoaded)
 {
     quietly("SUITE ADD " + sample("primes.zmb"));
     session.run({}); // Modrig makes its record
-    const auto result = session.run({"SUITE ADD " + sample("gears.omp"), "SUITE REMOVE " + sample("primes.zmb"),
-                                     "SUITE LIST", "MODRIG", "APPS"});
+    const auto result = session.run({"SUITE ADD " + sample("gears.omp"),
+                                     "SUITE REMOVE " + sample("primes.zmb"), "SUITE LIST", "MODRIG", "APPS"});
     EXPECT_EQ(result.exitStatus, 0);
-    EXPECT_THAT(result.output, HasSubstr("gears.omp was added to the Startup Suite.\n" + std::string(kModrigWaits)));
-    EXPECT_THAT(result.output, HasSubstr("primes.zmb was removed from the Startup Suite.\nCommand: SUITE LIST\n1  " +
-                                         sample("gears.omp") + "\nCommand: MODRIG\nGears:"));
+    EXPECT_THAT(result.output,
+                HasSubstr("gears.omp was added to the Startup Suite.\n" + std::string(kModrigWaits)));
+    EXPECT_THAT(result.output,
+                HasSubstr("primes.zmb was removed from the Startup Suite.\nCommand: SUITE LIST\n1  " +
+                          sample("gears.omp") + "\nCommand: MODRIG\nGears:"));
     EXPECT_THAT(result.output, HasSubstr(kNoDisplay));
     EXPECT_THAT(result.output, HasSubstr(listed(modrigBundle())));
     EXPECT_THAT(suite(), ElementsAre(sample("gears.omp")));
@@ -283,8 +293,9 @@ TEST_F(ListCommands, HaveModrigReadTheListAgainWhichIsLoaded)
 TEST_F(ListCommands, BringModrigBackThatNoCommandWouldBring)
 {
     const auto result = session.run({"SUITE ADD " + sample("primes.zmb"), "MODRIG"});
-    EXPECT_EQ(result.output, kBanner + ("Command: SUITE ADD " + sample("primes.zmb") + "\n" + kPrimes +
-                                        "primes.zmb was added to the Startup Suite.\nCommand: MODRIG\n" + kNoDisplay));
+    EXPECT_EQ(result.output,
+              kBanner + ("Command: SUITE ADD " + sample("primes.zmb") + "\n" + kPrimes +
+                         "primes.zmb was added to the Startup Suite.\nCommand: MODRIG\n" + kNoDisplay));
 }
 
 TEST_F(ListCommands, LeaveModrigLoadedWhenNothingChanges)
@@ -316,9 +327,10 @@ TEST_F(ListCommands, ChangeNothingWhileAnotherTesselWorksWithTheProfile)
     quietly("SUITE ADD " + first);
     HostTerminal other(session);
     ASSERT_TRUE(other.awaitPrompt());
-    EXPECT_EQ(quietly("SUITE ADD " + second, 1),
-              "Another Tessel works with this profile, and would put back what it has read once its dialog is "
-              "closed: the Startup Suite stays as it is. End the other Tessel first.\n");
+    EXPECT_EQ(
+        quietly("SUITE ADD " + second, 1),
+        "Another Tessel works with this profile, and would put back what it has read once its dialog is "
+        "closed: the Startup Suite stays as it is. End the other Tessel first.\n");
     EXPECT_THAT(suite(), ElementsAre(first)) << "to look is no change";
     EXPECT_EQ(other.quit(), 0);
     EXPECT_EQ(quietly("SUITE ADD " + second), "second.lsp was added to the Startup Suite.\n");
@@ -329,7 +341,8 @@ TEST_F(ListCommands, ChangeNothingThatTheAdministratorHasLaidDown)
     session.alwaysWith({"--layout-dir", (session.folder() / "layout").string()});
     layDownSuite("policy/suite.reg", first);
     const std::string stays = "The administrator has laid down the Startup Suite in " +
-                              (session.folder() / "layout/policy/suite.reg").string() + ": it stays as it is.\n";
+                              (session.folder() / "layout/policy/suite.reg").string() +
+                              ": it stays as it is.\n";
     EXPECT_EQ(quietly("SUITE LIST"), "1  " + first + "  (laid down by the administrator)\n");
     EXPECT_EQ(asJson("SUITE LIST")["files"][0]["isLaidDown"], true);
     EXPECT_EQ(quietly("SUITE REMOVE " + first, 1), stays);
@@ -360,9 +373,10 @@ TEST_F(ListCommands, FailWhenTheRegistryCannotBeWritten)
     std::filesystem::permissions(file, std::filesystem::perms::owner_read);
     const auto result = session.start({"--safe", "-c", "SUITE ADD " + second, "-c", "SUITE LIST"});
     EXPECT_EQ(result.exitStatus, 1);
-    EXPECT_THAT(result.output, HasSubstr("SUITE ADD " + second +
-                                         "\nA list of applications could not be stored in the registry. Changes "
-                                         "made since it was last stored may be lost.\n"));
+    EXPECT_THAT(result.output,
+                HasSubstr("SUITE ADD " + second +
+                          "\nA list of applications could not be stored in the registry. Changes "
+                          "made since it was last stored may be lost.\n"));
     EXPECT_THAT(result.output, HasSubstr("Command: SUITE LIST\n1  " + first + "\n"));
     EXPECT_THAT(result.output, Not(HasSubstr("2  ")));
 }
