@@ -5,6 +5,7 @@
 
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
+#include "host/app/Listings.h"
 #include "host/app/Parts.h"
 #include "host/applications/ShippedRecords.h"
 #include "host/applications/StartSummary.h"
@@ -195,6 +196,7 @@ void Host::addCommands()
     addKeptOutCommands(*mParts);
     addSettingCommands(*mParts);
     addRegistryCommands(*mParts);
+    addListings(*mParts);
 }
 
 bool Host::run(const std::wstring& input)

@@ -22,5 +22,7 @@ public:
     std::wstring usage; // its arguments; empty where it takes none
 
     // The host's own commands have this instead of a handler.
-    std::function<tessel::Result<>(const std::vector<std::wstring>& arguments)> builtIn;
+    using BuiltIn = std::function<tessel::Result<>(const std::vector<std::wstring>& arguments)>;
+    BuiltIn builtIn;
+    BuiltIn listing; // what answers programs, if anything does
 };

@@ -12,6 +12,8 @@ namespace tessel
 {
 namespace
 {
+constexpr wchar_t kForPrograms[] = L"--json";
+
 bool isBlank(wchar_t character)
 {
     return character == L' ' || character == L'\t' || character == L'\r' || character == L'\n';
@@ -44,6 +46,8 @@ Result<> call(const TsEdCommand& command, const CommandStack::Arguments& argumen
 {
     try
     {
+        if (command.listing && !arguments.empty() && arguments.back() == kForPrograms)
+            return command.listing({arguments.begin(), arguments.end() - 1});
         if (command.builtIn)
             return command.builtIn(arguments);
         if (!arguments.empty() && command.usage.empty())
@@ -113,6 +117,12 @@ CommandStack::Arguments splitLine(std::wstring_view line)
         at += doubled ? 1 : 0;
     }
     return parts;
+}
+
+bool isForPrograms(std::wstring_view line)
+{
+    const CommandStack::Arguments parts = splitLine(line);
+    return parts.size() > 1 && parts.back() == kForPrograms;
 }
 
 std::wstring asPart(std::wstring_view text)

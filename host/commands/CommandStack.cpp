@@ -107,6 +107,13 @@ int CommandStack::addCommand(const wchar_t* group, const wchar_t* globalName, co
     return TSED_COMMAND_OK;
 }
 
+void CommandStack::addListing(std::wstring_view name, BuiltIn handler)
+{
+    for (const auto& command : mCommands)
+        if (isOwn(*command) && command->localName == name)
+            command->listing = handler;
+}
+
 void CommandStack::announce(const Description& description)
 {
     mAnnounced.push_back(description);

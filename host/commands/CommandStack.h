@@ -41,6 +41,10 @@ public:
     // A command of the host itself: its arguments follow on the line, and no application can remove it.
     void addBuiltIn(const Description& description, BuiltIn handler);
 
+    // What answers when a command of the host is typed with `--json` as its last argument, which is taken
+    // away.
+    void addListing(std::wstring_view name, BuiltIn handler);
+
     // A command of an application that is not loaded yet. It is listed until the application registers one of
     // that name, and again when that has gone.
     void announce(const Description& description);

@@ -38,7 +38,12 @@ protected:
         return output.substr(std::min(before.size(), output.size()));
     }
 
-    json asJson(const std::string& command) const { return json::parse(quietly(command + " --json")); }
+    json asJson(const std::string& command) const
+    {
+        const auto result = session.start({"--safe", "-c", command + " --json"});
+        EXPECT_EQ(result.exitStatus, 0) << result.output;
+        return json::parse(result.output);
+    }
 
     std::vector<std::string> suite() const
     {
