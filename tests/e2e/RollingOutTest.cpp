@@ -32,7 +32,8 @@ protected:
         const std::string home = (session.folder() / "home").string();
         std::filesystem::create_directories(home);
         return runCommand("HOME='" + home +
-                          "' LC_ALL=C.UTF-8 ANSIBLE_NOCOWS=1 ansible-playbook -i localhost, -c local -e '@" +
+                          "' LC_ALL=C.UTF-8 ANSIBLE_NOCOWS=1 '" ANSIBLE_PLAYBOOK
+                          "' -i localhost, -c local -e '@" +
                           file.string() + "' '" + EXAMPLES + "/ansible/tessel.yml'");
     }
 
