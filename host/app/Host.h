@@ -94,6 +94,7 @@ private:
     void tellWhoElseWritesTheProfile();
     bool tellWhoElseWrites(const std::wstring& kind, const std::filesystem::path& path);
     void tellOfStart();
+    void addShippedRecords();
     void addCommands();
     bool finishLine();
 

@@ -1,5 +1,6 @@
 #include "host/app/Program.h"
 
+#include <algorithm>
 #include <clocale>
 #include <csignal>
 #include <cstdio>
@@ -69,6 +70,14 @@ void greet(CommandLine& commandLine)
     commandLine.say(toWide(kProgramLine) + L". Type HELP for the list of commands, QUIT to leave.");
 }
 
+// Nothing but documents is to be printed then.
+bool answersPrograms(const Options& options)
+{
+    return !options.commands.empty() && options.script.empty() &&
+           std::ranges::all_of(options.commands,
+                               [](const auto& command) { return isForPrograms(toWide(command)); });
+}
+
 // Each that fails has been told, and keeps the others from nothing.
 bool loadFiles(Host& host, const std::vector<std::string>& files)
 {
@@ -136,7 +145,7 @@ int runHost(Options options, StandardOutput& output)
                }});
     const InterruptKey interruptKey(host); // applications that load at start may run away too
     const EndSignals endSignals(host);
-    if (!options.modrig)
+    if (!options.modrig && !answersPrograms(options))
         greet(host.commandLine());
     if (!host.start())
         return kSomethingFailed;

@@ -19,7 +19,10 @@ public:
     TsEdCommandHandler handler = nullptr;
     std::wstring summary; // one line, or empty
 
-    // The host's own commands have these instead of a handler.
-    std::function<tessel::Result<>(const std::vector<std::wstring>& arguments)> builtIn;
-    std::wstring usage;
+    std::wstring usage; // its arguments; empty where it takes none
+
+    // The host's own commands have this instead of a handler.
+    using BuiltIn = std::function<tessel::Result<>(const std::vector<std::wstring>& arguments)>;
+    BuiltIn builtIn;
+    BuiltIn listing; // what answers programs, if anything does
 };

@@ -12,9 +12,16 @@ namespace tessel
 {
 namespace
 {
+constexpr wchar_t kForPrograms[] = L"--json";
+
 bool isBlank(wchar_t character)
 {
     return character == L' ' || character == L'\t' || character == L'\r' || character == L'\n';
+}
+
+std::wstring usageOf(const TsEdCommand& command)
+{
+    return L"Usage: " + command.localName + (command.usage.empty() ? L"" : L" ") + command.usage;
 }
 
 Failure failed(const std::wstring& name, const std::wstring& reason)
@@ -22,19 +29,30 @@ Failure failed(const std::wstring& name, const std::wstring& reason)
     return {L"The command \"" + name + L"\" failed: " + reason};
 }
 
+Result<> callHandler(const TsEdCommand& command, const CommandStack::Arguments& arguments,
+                     CallingApplication& calls)
+{
+    CommandCall typed{arguments};
+    const CallingApplication::Scope calling(calls, command.owner, RunningMarker::Deed::kCommand,
+                                            command.localName, &typed);
+    command.handler();
+    if (!typed.failure)
+        return {};
+    return Failure{typed.failure->empty() ? usageOf(command) : *typed.failure};
+}
+
 // What runs here may come from anybody's application: whatever it throws ends with the command.
 Result<> call(const TsEdCommand& command, const CommandStack::Arguments& arguments, CallingApplication& calls)
 {
     try
     {
+        if (command.listing && !arguments.empty() && arguments.back() == kForPrograms)
+            return command.listing({arguments.begin(), arguments.end() - 1});
         if (command.builtIn)
             return command.builtIn(arguments);
-        if (!arguments.empty())
+        if (!arguments.empty() && command.usage.empty())
             return failed(command.localName, L"it takes no arguments.");
-        const CallingApplication::Scope calling(calls, command.owner, RunningMarker::Deed::kCommand,
-                                                command.localName);
-        command.handler();
-        return {};
+        return callHandler(command, arguments, calls);
     }
     catch (const std::exception& error)
     {
@@ -99,6 +117,12 @@ CommandStack::Arguments splitLine(std::wstring_view line)
         at += doubled ? 1 : 0;
     }
     return parts;
+}
+
+bool isForPrograms(std::wstring_view line)
+{
+    const CommandStack::Arguments parts = splitLine(line);
+    return parts.size() > 1 && parts.back() == kForPrograms;
 }
 
 std::wstring asPart(std::wstring_view text)

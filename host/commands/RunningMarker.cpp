@@ -12,6 +12,7 @@
 #include <sys/mman.h>
 #include <unistd.h>
 
+#include "host/platform/Descriptor.h"
 #include "host/platform/PrivateFolder.h"
 #include "host/platform/SmallFile.h"
 #include "host/platform/SystemFailure.h"
@@ -33,6 +34,15 @@ static_assert(std::atomic<std::uint32_t>::is_always_lock_free, "a signal handler
 bool readWhole(int descriptor, void* buffer, std::size_t size)
 {
     return pread(descriptor, buffer, size, 0) == static_cast<ssize_t>(size);
+}
+
+bool isHeldElsewhere(const std::filesystem::path& path)
+{
+    const Descriptor file(open(path.c_str(), O_RDWR | O_CLOEXEC | O_NOFOLLOW | O_NONBLOCK));
+    struct flock whole = {};
+    whole.l_type = F_WRLCK;
+    whole.l_whence = SEEK_SET;
+    return file && fcntl(file.number(), F_GETLK, &whole) == 0 && whole.l_type != F_UNLCK;
 }
 
 // Written, not only made long: a page that the disk has no room for would end the process when it is touched.
@@ -154,6 +164,26 @@ void RunningMarker::collect(const std::filesystem::path& folder)
         }
     }
     std::ranges::sort(mLeftovers, {}, [](const Leftover& leftover) { return leftover.work.since; });
+}
+
+// Asked, not tried: a lock that is taken, if only for a moment, would make a session of the dead look alive.
+bool RunningMarker::otherSessionRuns() const
+{
+    std::error_code failed;
+    if (mFile.descriptor < 0)
+        return false;
+    for (std::filesystem::directory_iterator entry(mFile.path.parent_path(), failed), end;
+         !failed && entry != end; entry.increment(failed))
+        if (entry->path().filename().native().starts_with(kFilePrefix) && !holds(entry->path()) &&
+            isHeldElsewhere(entry->path()))
+            return true;
+    return false;
+}
+
+// Of these the locks would go with any descriptor that is closed.
+bool RunningMarker::holds(const std::filesystem::path& path) const
+{
+    return path == mFile.path || std::ranges::find(mOld, path, &OpenFile::path) != mOld.end();
 }
 
 void RunningMarker::forgetLeftovers()

@@ -79,6 +79,9 @@ public:
     const std::vector<Leftover>& leftovers() const { return mLeftovers; }
     void forgetLeftovers();
 
+    // Whether another session keeps its marks in the folder now.
+    bool otherSessionRuns() const;
+
     // One piece of work, for as long as the object lives. These nest; the innermost is the one that counts.
     class Scope
     {
@@ -146,6 +149,7 @@ private:
         int descriptor = -1;
     };
 
+    bool holds(const std::filesystem::path& path) const;
     void collect(const std::filesystem::path& folder);
     void make(const std::filesystem::path& folder);
     Result<> keepIn(const std::filesystem::path& folder);

@@ -5,6 +5,7 @@
 #include <sstream>
 #include <utility>
 
+#include "host/commands/CommandRunner.h"
 #include "host/console/LineEditor.h"
 #include "host/console/TypedHistory.h"
 #include "host/messages/Questions.h"
@@ -139,7 +140,8 @@ bool Console::runEach(std::istream& lines)
         const auto line = nextLine(lines);
         if (!line)
             break;
-        echo(input, *line);
+        if (!isForPrograms(*line))
+            echo(input, *line);
         if (const auto whole = input.add(*line))
             allWell = mRunner.run(*whole) && allWell;
     }
