@@ -114,7 +114,7 @@ struct Parts
     Owned<RemoteFiles> remote{foundations.profileFolder / "remote-files", foundations.downloads,
                               foundations.interruption};
     Owned<HostInformation> information{toWide(foundations.profileFolder.string()), *remote, *commandLine};
-    Owned<Help> help{folders.resources / "help", openInBrowser};
+    Owned<Help> help{folders.resources / "help", openInBrowser, personsLanguages()};
     // The variable is read here, before any application is loaded, and holds for the session.
     Owned<LispInterpreter> lisp{
         LispInterpreter::Options{.removingTsLisp = variables->number(kRemovingTsLisp) != 0,

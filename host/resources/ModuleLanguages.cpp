@@ -37,8 +37,7 @@ bool suits(LanguageNumber language, LanguageNumber wanted)
 std::tuple<std::size_t, LanguageNumber> rank(LanguageNumber language,
                                              const std::vector<LanguageNumber>& wanted)
 {
-    const auto found =
-        std::ranges::find_if(wanted, [&](LanguageNumber one) { return suits(language, one); });
+    const auto found = std::ranges::find_if(wanted, [&](LanguageNumber one) { return suits(language, one); });
     const LanguageNumber country = found == wanted.end() ? 0 : std::min(countryIn(language), 2U);
     return {static_cast<std::size_t>(found - wanted.begin()), country};
 }

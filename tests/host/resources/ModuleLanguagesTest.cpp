@@ -9,7 +9,8 @@ using tessel::inWantedOrder;
 using tessel::numbersOf;
 using Numbers = std::vector<tessel::LanguageNumber>;
 
-constexpr tessel::LanguageNumber kGerman = 0x0007, kGermany = 0x0407, kSwitzerland = 0x0807, kAustria = 0x0c07;
+constexpr tessel::LanguageNumber kGerman = 0x0007, kGermany = 0x0407, kSwitzerland = 0x0807,
+                                 kAustria = 0x0c07;
 constexpr tessel::LanguageNumber kAmerica = 0x0409, kBritain = 0x0809, kFrench = 0x000c;
 
 TEST(ModuleLanguages, HaveTheNumbersThatScriptsOfResourcesName)
