@@ -28,7 +28,7 @@ protected:
                                          shown = page;
                                          return hasBrowser;
                                      },
-                                     {"de_AT", "de", "en", "fr"}};
+                                     std::vector<std::string>{"de_AT", "de", "en", "fr"}};
 };
 } // namespace
 
