@@ -1,6 +1,8 @@
 // The dialogs for a person whose language is German, on a system that has no data of it.
 #include "tests/e2e_dialogs/DialogTest.h"
 
+#include <cstdio>
+
 using testing::HasSubstr;
 
 namespace
@@ -14,7 +16,7 @@ constexpr Place kGermanHistoryTab{245, 410};
 class GermanDialog : public DialogTest
 {
 protected:
-    GermanDialog()
+    explicit GermanDialog(DisplayKind kind = {}) : DialogTest(kind)
     {
         mSession.set("LC_ALL", "");
         mSession.set("LANGUAGE", "");
@@ -101,5 +103,45 @@ TEST_F(GermanDialog, IsGermanWhateverLanguageIsSetForTheToolkit)
 {
     setToolkitSetting("NSLanguages", "French");
     openGerman();
+    closeGerman();
+}
+
+namespace
+{
+class GermanDialogOnLowScreens : public GermanDialog
+{
+protected:
+    GermanDialogOnLowScreens() : GermanDialog({.width = 800, .height = 600}) {}
+};
+
+class GermanDialogEnlarged : public GermanDialog
+{
+protected:
+    GermanDialogEnlarged() : GermanDialog({.width = 2000, .height = 1600}) {}
+};
+} // namespace
+
+TEST_F(GermanDialogOnLowScreens, FitsThem)
+{
+    storeHistory({writeLisp("eins.lsp")});
+    setSetting("LastTab", "1");
+    openGerman();
+    int width = 0;
+    int height = 0;
+    ASSERT_EQ(2, std::sscanf(mScreen.sizeOf(mDialog).c_str(), "%dx%d", &width, &height));
+    EXPECT_LE(width, 800);
+    EXPECT_LE(height, 600);
+    closeGerman();
+}
+
+TEST_F(GermanDialogEnlarged, IsAsLargeAsInEnglish)
+{
+    setToolkitSetting("GSScaleFactor", "1.5");
+    storeHistory({writeLisp("eins.lsp")});
+    setSetting("LastTab", "1");
+    openGerman();
+    int width = 0;
+    ASSERT_EQ(1, std::sscanf(mScreen.sizeOf(mDialog).c_str(), "%dx", &width));
+    EXPECT_NEAR(width, places::kDialogWidth * 1.5, 3);
     closeGerman();
 }
