@@ -29,30 +29,14 @@ MEMBERS_BEGIN = {
 COMBINED = re.compile(r"(Options|Mask|Flags|Traits|Actions)$|^NSDragOperation$")
 # The headers beside this file have these.
 BY_HAND = {"NSNotFound", "NSZeroPoint", "NSZeroSize", "NSZeroRect", "NSAppKitVersionNumber"}
-# What we call though the system's headers say that it should not be called any more, and since when.
+# What we call though the system's headers say, since when, that it should not be called any more.
 OUT_OF_USE = {
-    "setDirectory:": "10.6", "directory": "10.6", "filenames": "10.6", "filename": "10.6", "requiredFileType": "10.6",
-    "setRequiredFileType:": "10.6", "runModalForDirectory:file:": "10.6", "runModalForDirectory:file:types:": "10.6",
-    "panel:shouldShowFilename:": "10.6", "FSPathMakeRef": "10.8", "NSFilenamesPboardType": "10.14",
-    "NSStringPboardType": "10.14", "NSOKButton": "10.10", "NSCancelButton": "10.10", "NSWarningAlertStyle": "10.12",
-    "NSInformationalAlertStyle": "10.12", "NSCriticalAlertStyle": "10.12", "NSCommandKeyMask": "10.12",
-    "NSAlternateKeyMask": "10.12", "NSControlKeyMask": "10.12", "NSShiftKeyMask": "10.12",
-    "NSDeviceIndependentModifierFlagsMask": "10.12", "NSKeyDown": "10.12", "NSKeyUp": "10.12",
-    "NSLeftMouseDown": "10.12", "NSLeftMouseUp": "10.12", "NSLeftMouseDragged": "10.12", "NSRightMouseDown": "10.12",
-    "NSRightMouseUp": "10.12", "NSMouseMoved": "10.12", "NSFlagsChanged": "10.12", "NSApplicationDefined": "10.12",
-    "NSAnyEventMask": "10.12", "NSTitledWindowMask": "10.12", "NSClosableWindowMask": "10.12",
-    "NSResizableWindowMask": "10.12", "NSMiniaturizableWindowMask": "10.12", "NSBorderlessWindowMask": "10.12",
-    "NSRightTextAlignment": "10.12", "NSCenterTextAlignment": "10.12", "NSLeftTextAlignment": "10.12",
-    "NSCompositeSourceOver": "10.12", "NSCompositeCopy": "10.12", "NSOnState": "", "NSOffState": "",
-    "dragImage:at:offset:event:pasteboard:source:slideBack:": "10.7", "convertBaseToScreen:": "10.7",
-    "convertScreenToBase:": "10.7", "loadNibNamed:owner:": "10.8", "useOptimizedDrawing:": "10.10",
-    "lockFocus": "10.14", "unlockFocus": "10.14", "cacheImageInRect:": "10.10", "replyToOpenOrPrint:": "",
-    "stringByAddingPercentEscapesUsingEncoding:": "10.11", "cString": "10.4", "initWithCString:": "10.4",
-    "stringWithContentsOfFile:": "10.4", "initWithContentsOfFile:": "", "fileAttributesAtPath:traverseLink:": "10.5",
-    "writeToFile:atomically:": "", "launchedTask": "", "setLaunchPath:": "10.15", "launch": "10.15",
-    "shadowColor": "10.8", "tableView:writeRows:toPasteboard:": "10.4",
+    "setDirectory:": "10.6", "directory": "10.6", "filenames": "10.6", "panel:shouldShowFilename:": "10.6",
+    "FSPathMakeRef": "10.8", "NSOKButton": "10.10", "NSCancelButton": "10.10", "NSFilenamesPboardType": "10.14",
+    "NSStringPboardType": "10.14", "NSAlternateKeyMask": "10.12", "NSAnyEventMask": "10.12", "NSApplicationDefined": "10.12",
+    "NSCommandKeyMask": "10.12", "NSControlKeyMask": "10.12", "NSInformationalAlertStyle": "10.12", "NSKeyDown": "10.12",
+    "NSLeftMouseDown": "10.12", "NSLeftMouseUp": "10.12", "NSShiftKeyMask": "10.12", "NSWarningAlertStyle": "10.12",
 }
-OUT_OF_USE = {name: since for name, since in OUT_OF_USE.items() if since}
 
 
 class Headers:

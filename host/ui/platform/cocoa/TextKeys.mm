@@ -8,7 +8,8 @@ namespace tessel::windowing
 void takeTextKeys()
 {
     NSMenu* edit = [[[NSMenu alloc] initWithTitle:@"Edit"] autorelease];
-    [edit addItemWithTitle:@"Undo" action:@selector(undo:) keyEquivalent:@"z"];
+    // Texts take this one, though no header says so.
+    [edit addItemWithTitle:@"Undo" action:NSSelectorFromString(@"undo:") keyEquivalent:@"z"];
     [edit addItemWithTitle:@"Cut" action:@selector(cut:) keyEquivalent:@"x"];
     [edit addItemWithTitle:@"Copy" action:@selector(copy:) keyEquivalent:@"c"];
     [edit addItemWithTitle:@"Paste" action:@selector(paste:) keyEquivalent:@"v"];
