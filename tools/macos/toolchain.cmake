@@ -7,7 +7,7 @@ set(CMAKE_OSX_SYSROOT "${MACOS_SDK}")
 set(CMAKE_OSX_ARCHITECTURES "${MACOS_PROCESSOR}" CACHE STRING "" FORCE)
 
 foreach(language C CXX OBJC OBJCXX)
-  set(CMAKE_${language}_COMPILER_TARGET "${MACOS_PROCESSOR}-apple-macos12")
+  set(CMAKE_${language}_COMPILER_TARGET "${MACOS_PROCESSOR}-apple-macos")
   # What stands in the configuration of the C++ library as a Mac has it.
   set(CMAKE_${language}_FLAGS_INIT "-D_LIBCPP_ABI_VERSION=1 -D_LIBCPP_ABI_NAMESPACE=__1 -stdlib=libc++ -fuse-ld=lld -Wno-unused-command-line-argument")
 endforeach()
