@@ -32,7 +32,7 @@ def exported(file, processor):
 
 
 def oldest_system(file, processor):
-    commands = run("llvm-otool", "-arch", processor, "-l", file)
+    commands = run("llvm-objdump", "--macho", f"--arch={processor}", "--private-headers", file)
     found = re.search(r"cmd LC_BUILD_VERSION\n(?:.*\n)*?\s*minos (\S+)", commands)
     return found.group(1) if found else "none"
 

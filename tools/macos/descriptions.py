@@ -15,8 +15,8 @@ PROGRAM = {"CFBundleIconFile": ANY_TEXT, "NSPrincipalClass": ANY_TEXT}
 SWITCHES = {"NSHighResolutionCapable"}
 
 
-def faults(name, data):
-    """Of a property list's bytes."""
+def faults(name, data, system):
+    """Of a property list's bytes. `system`: the oldest version that the build is for."""
     try:
         described = plistlib.loads(data)
     except Exception as error:  # whatever the parser has to say
@@ -32,3 +32,5 @@ def faults(name, data):
     for key in SWITCHES if described.get("CFBundlePackageType") == "APPL" else ():
         if described.get(key) is not True:
             yield f"{name}: {key} is not switched on"
+    if described.get("LSMinimumSystemVersion", system) != system:
+        yield f"{name}: LSMinimumSystemVersion is not {system}, which the build is for"

@@ -42,7 +42,8 @@ class Layout:
             self._elements[name] = element
 
     def _class_of(self, element):
-        return element.get("customClass") or self._system_class(element)
+        custom = element.get("customClass")
+        return custom if custom in self._sources.classes else self._system_class(element)
 
     @staticmethod
     def _system_class(element):

@@ -11,6 +11,7 @@ from .listings import Listings
 from .tables import Tables
 
 HERE = Path(__file__).resolve().parent
+MADE_BY = ("declarations", "fetched", "listings", "sdk", "stubs", "tables")
 DECLARED = ("AppKit", "Foundation")  # from the tables; of the others a few functions are declared by hand
 FRAMEWORKS = ("AppKit", "CoreFoundation", "CoreGraphics", "CoreServices", "Foundation")
 LIBRARIES = "/System/Library/Frameworks/{0}.framework/Versions/A/{0}"
@@ -125,7 +126,7 @@ def put_libraries(sdk, folder, tables, listings):
 
 def state(folder):
     """What the SDK is made from, in one word."""
-    sources = sorted([*HERE.glob("*.py"), *(path for path in (HERE / "headers").rglob("*") if path.is_file())])
+    sources = [*(HERE / f"{name}.py" for name in MADE_BY), *sorted(path for path in (HERE / "headers").rglob("*") if path.is_file())]
     words = [(folder / "complete").read_text(encoding="utf-8"), *(path.read_text(encoding="utf-8") for path in sources)]
     return hashlib.sha256("\0".join(words).encode()).hexdigest()
 

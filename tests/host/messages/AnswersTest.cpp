@@ -16,7 +16,8 @@ TEST(Answers, ANumberIsTakenWithASignAPointAndAnExponent)
 
 TEST(Answers, WhatIsNoNumberByItselfIsNotTakenForOne)
 {
-    for (const wchar_t* text : {L"", L"-", L"1 2", L"1,5", L"--3", L"+-3", L"12x", L"inf", L"nan", L"0x10", L"1e400"})
+    for (const wchar_t* text :
+         {L"", L"-", L"1 2", L"1,5", L"--3", L"+-3", L"12x", L"inf", L"nan", L"0x10", L"1e400"})
         EXPECT_EQ(numberIn(text), std::nullopt) << text;
 }
 

@@ -21,7 +21,8 @@
 #define NSNotFound NSIntegerMax
 #define IBOutlet __attribute__((annotate("outlet")))
 #define IBAction void
-#define NSLocalizedString(key, comment) [[NSBundle mainBundle] localizedStringForKey:(key) value:@"" table:nil]
+#define NSLocalizedString(key, comment)                                                                      \
+    [[NSBundle mainBundle] localizedStringForKey:(key) value:@"" table:nil]
 
 #define NSIntegerMax LONG_MAX
 #define NSIntegerMin LONG_MIN
