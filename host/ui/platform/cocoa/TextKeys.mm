@@ -10,7 +10,8 @@ namespace tessel::windowing
 void takeTextKeys()
 {
     NSMenu* edit = [[[NSMenu alloc] initWithTitle:word(@"EDIT")] autorelease];
-    [edit addItemWithTitle:word(@"UNDO") action:@selector(undo:) keyEquivalent:@"z"];
+    // Texts take this one, though no header says so.
+    [edit addItemWithTitle:word(@"UNDO") action:NSSelectorFromString(@"undo:") keyEquivalent:@"z"];
     [edit addItemWithTitle:word(@"CUT") action:@selector(cut:) keyEquivalent:@"x"];
     [edit addItemWithTitle:word(@"COPY") action:@selector(copy:) keyEquivalent:@"c"];
     [edit addItemWithTitle:word(@"PASTE") action:@selector(paste:) keyEquivalent:@"v"];
