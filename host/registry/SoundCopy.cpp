@@ -17,7 +17,6 @@
 #include "host/registry/StoreFailure.h"
 #include "host/text/DayAndTime.h"
 #include "host/text/Translation.h"
-#include "host/text/Unicode.h"
 
 namespace tessel
 {
@@ -144,7 +143,7 @@ std::wstring timeOfCopy(const std::filesystem::path& file)
     struct stat status = {};
     if (stat(soundCopyOf(file).c_str(), &status) != 0)
         return {};
-    return toWide(dayAndTime(status.st_mtime));
+    return dayAndTimeInWords(status.st_mtime);
 }
 
 std::wstring helpAgainstDamage(const std::filesystem::path& file)
