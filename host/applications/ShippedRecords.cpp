@@ -42,10 +42,10 @@ std::vector<ShippedRecord> readShippedRecords(const std::filesystem::path& folde
                                               const std::wstring& productRoot)
 {
     const RegistryTree tree = readRegistryLayers({folder}).defaults;
-    const std::wstring root = productRoot + L"\\Applications";
+    const std::wstring above = productRoot + L"\\Applications\\";
     std::vector<ShippedRecord> records;
-    for (const std::wstring& name : tree.subKeys(root))
-        if (auto record = readRecord(tree, root + L"\\" + name, name, folder))
+    for (const std::wstring& name : tree.subKeys(above))
+        if (auto record = readRecord(tree, above + name, name, folder))
             records.push_back(*std::move(record));
     return records;
 }

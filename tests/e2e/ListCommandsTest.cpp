@@ -18,7 +18,7 @@ namespace
 constexpr char kModrigWaits[] =
     "Modrig is unloaded. It is loaded again when MODRIG is typed, and the Lisp of "
     "the Startup Suite with it.\n";
-constexpr char kNoDisplay[] = "Tessel cannot open a window: there is no display.\n";
+constexpr char kNoWindow[] = "Tessel cannot open a window: there is no display.\n";
 
 class ListCommands : public testing::Test
 {
@@ -290,7 +290,7 @@ TEST_F(ListCommands, HaveModrigReadTheListAgainWhichIsLoaded)
     EXPECT_THAT(result.output,
                 HasSubstr("primes.zmb was removed from the Startup Suite.\nCommand: SUITE LIST\n1  " +
                           sample("gears.omp") + "\nCommand: MODRIG\nGears:"));
-    EXPECT_THAT(result.output, HasSubstr(kNoDisplay));
+    EXPECT_THAT(result.output, HasSubstr(kNoWindow));
     EXPECT_THAT(result.output, HasSubstr(listed(modrigBundle())));
     EXPECT_THAT(suite(), ElementsAre(sample("gears.omp")));
 }
@@ -300,7 +300,7 @@ TEST_F(ListCommands, BringModrigBackThatNoCommandWouldBring)
     const auto result = session.run({"SUITE ADD " + sample("primes.zmb"), "MODRIG"});
     EXPECT_EQ(result.output,
               kBanner + ("Command: SUITE ADD " + sample("primes.zmb") + "\n" + kPrimes +
-                         "primes.zmb was added to the Startup Suite.\nCommand: MODRIG\n" + kNoDisplay));
+                         "primes.zmb was added to the Startup Suite.\nCommand: MODRIG\n" + kNoWindow));
 }
 
 TEST_F(ListCommands, LeaveModrigLoadedWhenNothingChanges)
