@@ -13,6 +13,7 @@
 #include "host/platform/AutoreleasePool.h"
 #include "host/platform/PrivateFolder.h"
 #include "host/platform/ToolkitPlaces.h"
+#include "host/text/Languages.h"
 
 namespace tessel
 {
@@ -177,7 +178,8 @@ bool Host::tellWhoElseWrites(const std::wstring& kind, const std::filesystem::pa
 // What waits for its commands is listed with them from the beginning.
 void Host::addShippedRecords()
 {
-    for (const auto& shipped : readShippedRecords(mParts->folders.plugIns, kProductRegistryRoot))
+    for (const auto& shipped :
+         readShippedRecords(mParts->folders.plugIns, kProductRegistryRoot, personsLanguages()))
     {
         mParts->records->add(shipped.record);
         for (const auto& command : shipped.commands)

@@ -9,14 +9,27 @@ namespace tessel
 {
 namespace
 {
+using Languages = std::vector<std::string>;
+
 std::wstring textAt(const RegistryTree& tree, const std::wstring& key, const std::wstring& name)
 {
     const auto* value = tree.value(key, name);
     return value ? value->data : L"";
 }
 
+// The value of that name in the first of the languages that has it, or else beside them.
+std::wstring spokenText(const RegistryTree& tree, const std::wstring& key, const std::wstring& name,
+                        const Languages& languages)
+{
+    for (const std::string& language : languages)
+        if (const auto* value = tree.value(key + L"\\" + toWide(language), name))
+            return value->data;
+    return textAt(tree, key, name);
+}
+
 std::optional<ShippedRecord> readRecord(const RegistryTree& tree, const std::wstring& key,
-                                        const std::wstring& name, const std::filesystem::path& folder)
+                                        const std::wstring& name, const std::filesystem::path& folder,
+                                        const Languages& languages)
 {
     const std::wstring module = textAt(tree, key, L"Module");
     const auto reasons = parseLoadReasons(textAt(tree, key, L"LoadReasons"));
@@ -31,21 +44,21 @@ std::optional<ShippedRecord> readRecord(const RegistryTree& tree, const std::wst
     {
         shipped.record.commands.emplace_back(command.name, command.data);
         shipped.commands.push_back({textAt(tree, key, L"Group"), command.data,
-                                    textAt(tree, key + L"\\Usage", command.name),
-                                    textAt(tree, key + L"\\Summaries", command.name)});
+                                    spokenText(tree, key + L"\\Usage", command.name, languages),
+                                    spokenText(tree, key + L"\\Summaries", command.name, languages)});
     }
     return shipped;
 }
 } // namespace
 
 std::vector<ShippedRecord> readShippedRecords(const std::filesystem::path& folder,
-                                              const std::wstring& productRoot)
+                                              const std::wstring& productRoot, const Languages& languages)
 {
     const RegistryTree tree = readRegistryLayers({folder}).defaults;
-    const std::wstring root = productRoot + L"\\Applications";
+    const std::wstring above = productRoot + L"\\Applications\\";
     std::vector<ShippedRecord> records;
-    for (const std::wstring& name : tree.subKeys(root))
-        if (auto record = readRecord(tree, root + L"\\" + name, name, folder))
+    for (const std::wstring& name : tree.subKeys(above))
+        if (auto record = readRecord(tree, above + name, name, folder, languages))
             records.push_back(*std::move(record));
     return records;
 }

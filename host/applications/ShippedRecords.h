@@ -18,8 +18,10 @@ struct ShippedRecord
 };
 
 // From the files `*.reg` in the folder, by name. `Module` is a file of that folder. Beside what every record
-// has, such a one may have a `Group` and the keys `Usage` and `Summaries` with a value for each command. A
-// record that is not whole is passed over.
+// has, such a one may have a `Group` and the keys `Usage` and `Summaries` with a value for each command, or
+// keys below these for languages (`Usage\de`), of which the first of `languages` counts. A record that is not
+// whole is passed over.
 std::vector<ShippedRecord> readShippedRecords(const std::filesystem::path& folder,
-                                              const std::wstring& productRoot);
+                                              const std::wstring& productRoot,
+                                              const std::vector<std::string>& languages);
 } // namespace tessel

@@ -1,5 +1,7 @@
 #include "host/text/Json.h"
 
+#include <algorithm>
+
 namespace tessel::json
 {
 namespace
@@ -67,9 +69,8 @@ std::wstring list(const std::vector<std::wstring>& values)
 
 std::wstring listOfTexts(const std::vector<std::wstring>& contents)
 {
-    std::vector<std::wstring> values;
-    for (const std::wstring& content : contents)
-        values.push_back(text(content));
+    std::vector<std::wstring> values(contents.size());
+    std::ranges::transform(contents, values.begin(), text);
     return list(values);
 }
 

@@ -12,11 +12,11 @@ namespace ModrigUtils
 namespace
 {
 constexpr const wchar_t* kModule = L"Modrig.bundle";
-constexpr const wchar_t* kRecordName = L"TesselModrig";
+constexpr const wchar_t* kRecordOfModrig = L"TesselModrig";
 constexpr std::size_t kPathSize = 1024;
-constexpr bool kDoNotSayWhyNot = false;
-constexpr bool kSayWhyNot = true;
-constexpr bool kResolveNow = true;
+constexpr bool kQuietly = false;
+constexpr bool kTellWhyNot = true;
+constexpr bool kResolveAllNow = true;
 
 CStdStr PathOfModrig()
 {
@@ -27,7 +27,7 @@ CStdStr PathOfModrig()
 bool IsLoadedByItsCommand()
 {
     TesselAppInfo record;
-    record.setAppName(kRecordName);
+    record.setAppName(kRecordOfModrig);
     return record.readFromRegistry() == TSRX_APPINFO_OK && (record.loadReason() & TSRX_LOAD_ON_COMMAND) != 0;
 }
 
@@ -41,14 +41,14 @@ ModrigOutOfService::ModrigOutOfService() : mPath(PathOfModrig())
 {
     if (mPath.IsEmpty())
         return;
-    mSucceeded = Linker() && Linker()->unloadModule(mPath.c_str(), kDoNotSayWhyNot);
+    mSucceeded = Linker() && Linker()->unloadModule(mPath.c_str(), kQuietly);
     mWaits = mSucceeded && IsLoadedByItsCommand();
 }
 
 ModrigOutOfService::~ModrigOutOfService()
 {
     if (!mPath.IsEmpty() && mSucceeded && !mWaits)
-        Linker()->loadModule(mPath.c_str(), kSayWhyNot, kResolveNow);
+        Linker()->loadModule(mPath.c_str(), kTellWhyNot, kResolveAllNow);
 }
 
 CStdStr WhyNobodyCanChange(const KeptList& list)
@@ -65,7 +65,7 @@ CStdStr WhyNobodyCanChange(const KeptList& list)
 void UpdateRecordOfModrig(bool hasStartup)
 {
     TesselAppInfo record;
-    record.setAppName(kRecordName);
+    record.setAppName(kRecordOfModrig);
     if (record.readFromRegistry() != TSRX_APPINFO_OK)
         return;
     const unsigned reasons = record.loadReason();

@@ -1,5 +1,6 @@
 // SUITE and HISTORY: what the dialog keeps, on the command line of the real host.
 #include <filesystem>
+#include <sstream>
 
 #include <gmock/gmock.h>
 
@@ -18,7 +19,7 @@ namespace
 constexpr char kModrigWaits[] =
     "Modrig is unloaded. It is loaded again when MODRIG is typed, and the Lisp of "
     "the Startup Suite with it.\n";
-constexpr char kNoDisplay[] = "Tessel cannot open a window: there is no display.\n";
+constexpr char kNoWindow[] = "Tessel cannot open a window: there is no display.\n";
 
 class ListCommands : public testing::Test
 {
@@ -220,16 +221,34 @@ TEST_F(ListCommands, TellWhenTheyAreTypedWrongly)
 
 TEST_F(ListCommands, AreToldOfByHelpBeforeAndAfterTheyAreLoaded)
 {
-    const auto result = session.start({"--safe", "-c", "HELP", "-c", "HISTORY LIST", "-c", "HELP"});
-    const std::string& output = result.output;
-    const auto begin = output.find("Session\n");
-    const auto end = output.find("Command: HISTORY");
-    const std::string before = output.substr(begin, end - begin);
-    const std::string after = output.substr(output.find("Session\n", end));
-    EXPECT_EQ(before, after);
-    EXPECT_THAT(before,
-                HasSubstr("SUITE LIST | ADD file... | REMOVE file... | MOVE file place | CLEAR [--json]"));
-    EXPECT_THAT(before, HasSubstr("Shows and changes the History list of Modrig"));
+    for (const char* language : {"C.UTF-8", "de_DE.UTF-8"})
+    {
+        session.set("LC_ALL", language);
+        const auto result =
+            session.start({"--safe", "-c", "HELP --json", "-c", "HISTORY LIST --json", "-c", "HELP --json"});
+        std::istringstream lines(result.output);
+        std::string before;
+        std::string after;
+        std::getline(lines, before);
+        std::getline(lines, after);
+        std::getline(lines, after);
+        EXPECT_EQ(json::parse(before), json::parse(after)) << language;
+        EXPECT_THAT(before, HasSubstr("\"SUITE\""));
+    }
+    EXPECT_THAT(session.start({"--safe", "-c", "HELP"}).output,
+                HasSubstr("Zeigt und ändert den Verlauf von Modrig"));
+    session.set("LC_ALL", "C.UTF-8");
+    EXPECT_THAT(session.start({"--safe", "-c", "HELP"}).output,
+                HasSubstr("Shows and changes the History list of Modrig"));
+}
+
+TEST_F(ListCommands, SpeakThePersonsLanguage)
+{
+    session.set("LC_ALL", "de_AT.UTF-8");
+    EXPECT_THAT(session.start({"--safe", "-c", "SUITE LIST"}).output,
+                HasSubstr("In der Startgruppe steht nichts.\n"));
+    const auto refused = session.start({"--safe", "-c", "HISTORY REMOVE " + first});
+    EXPECT_THAT(refused.output, HasSubstr("„" + first + "“ steht nicht in dem Verlauf.\n"));
 }
 
 TEST_F(ListCommands, AreNotLoadedBeforeTheyAreTyped)
@@ -290,7 +309,7 @@ TEST_F(ListCommands, HaveModrigReadTheListAgainWhichIsLoaded)
     EXPECT_THAT(result.output,
                 HasSubstr("primes.zmb was removed from the Startup Suite.\nCommand: SUITE LIST\n1  " +
                           sample("gears.omp") + "\nCommand: MODRIG\nGears:"));
-    EXPECT_THAT(result.output, HasSubstr(kNoDisplay));
+    EXPECT_THAT(result.output, HasSubstr(kNoWindow));
     EXPECT_THAT(result.output, HasSubstr(listed(modrigBundle())));
     EXPECT_THAT(suite(), ElementsAre(sample("gears.omp")));
 }
@@ -300,7 +319,7 @@ TEST_F(ListCommands, BringModrigBackThatNoCommandWouldBring)
     const auto result = session.run({"SUITE ADD " + sample("primes.zmb"), "MODRIG"});
     EXPECT_EQ(result.output,
               kBanner + ("Command: SUITE ADD " + sample("primes.zmb") + "\n" + kPrimes +
-                         "primes.zmb was added to the Startup Suite.\nCommand: MODRIG\n" + kNoDisplay));
+                         "primes.zmb was added to the Startup Suite.\nCommand: MODRIG\n" + kNoWindow));
 }
 
 TEST_F(ListCommands, LeaveModrigLoadedWhenNothingChanges)

@@ -19,9 +19,9 @@ protected:
     {
         folder.write(file, "Windows Registry Editor Version 5.00\n\n[HKCU\\Product\\Applications\\" + record);
     }
-    std::vector<tessel::ShippedRecord> read() const
+    std::vector<tessel::ShippedRecord> read(const std::vector<std::string>& languages = {}) const
     {
-        return tessel::readShippedRecords(folder.path(), L"Product");
+        return tessel::readShippedRecords(folder.path(), L"Product", languages);
     }
 
     const TemporaryFolder folder;
@@ -59,4 +59,20 @@ TEST_F(ShippedRecords, ThatAreNotWholeArePassedOver)
     EXPECT_THAT(read(), IsEmpty());
     write("e.reg", "Whole]\n\"Module\"=\"e.zmb\"\n\"LoadReasons\"=\"2\"\n");
     EXPECT_EQ(read().size(), 1U);
+}
+
+TEST_F(ShippedRecords, SpeakTheFirstLanguageThatTheyKnow)
+{
+    write("a.reg",
+          "One]\n\"Module\"=\"One.zmb\"\n\"LoadReasons\"=\"4\"\n"
+          "[HKCU\\Product\\Applications\\One\\Commands]\n\"A\"=\"A\"\n\"B\"=\"B\"\n"
+          "[HKCU\\Product\\Applications\\One\\Summaries]\n\"A\"=\"a, plainly\"\n\"B\"=\"b, plainly\"\n"
+          "[HKCU\\Product\\Applications\\One\\Summaries\\de]\n\"A\"=\"größe\"\n"
+          "[HKCU\\Product\\Applications\\One\\Usage\\de]\n\"A\"=\"[Wort]\"\n");
+    const auto german = read({"fr", "de_AT", "de"});
+    EXPECT_EQ(german.at(0).commands.at(0).summary, L"größe");
+    EXPECT_EQ(german.at(0).commands.at(0).usage, L"[Wort]");
+    EXPECT_EQ(german.at(0).commands.at(1).summary, L"b, plainly");
+    EXPECT_EQ(read({"fr"}).at(0).commands.at(0).summary, L"a, plainly");
+    EXPECT_EQ(read().at(0).commands.at(0).usage, L"");
 }
