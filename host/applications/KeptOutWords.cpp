@@ -8,7 +8,6 @@ namespace tessel
 {
 namespace
 {
-using Deed = RunningMarker::Deed;
 using Reason = RunningMarker::Reason;
 
 bool isByPerson(const KeptOutApplication& application)
@@ -23,20 +22,7 @@ std::wstring dayOf(const KeptOutApplication& application)
 
 std::wstring deedOf(const KeptOutApplication& application)
 {
-    switch (application.deed)
-    {
-    case Deed::kEntryPoint:
-        return translated(L"while its entry point ran");
-    case Deed::kUnloading:
-        return translated(L"while it was being unloaded");
-    case Deed::kCommand:
-        return translated(L"while its command \"{}\" ran", toWide(application.detail));
-    case Deed::kLispFile:
-        return translated(L"while its Lisp ran");
-    case Deed::kLoading:
-        break;
-    }
-    return translated(L"while it was being loaded");
+    return wordsFor(application.deed, toWide(application.detail));
 }
 
 std::wstring wishOf(const KeptOutApplication& application)
@@ -57,7 +43,7 @@ std::wstring wishOf(const KeptOutApplication& application)
 
 std::wstring endingOf(const KeptOutApplication& application)
 {
-    return translated(wordsForEnding(application.ending));
+    return wordsForEnding(application.ending);
 }
 } // namespace
 

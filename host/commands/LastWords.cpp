@@ -4,12 +4,15 @@
 #include <cstdio>
 #include <cstdlib>
 #include <cstring>
+#include <initializer_list>
+#include <string>
 #include <string_view>
 
 #include <unistd.h>
 
 #include "host/commands/RunningMarker.h"
 #include "host/text/Running.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -50,15 +53,22 @@ public:
                 mBytes[mLength++] = isShown ? byte : '?';
         }
     }
-    // ASCII.
-    void add(const wchar_t* text)
+    // The sentence with what belongs in its numbered places.
+    void fill(std::string_view sentence, std::initializer_list<std::string_view> things)
     {
-        for (; *text != L'\0'; ++text)
+        while (!sentence.empty())
         {
-            const char byte = static_cast<char>(*text);
-            add(std::string_view(&byte, 1));
+            std::size_t before = 0;
+            while (before < sentence.size() && Place::at(sentence.substr(before)).length == 0)
+                ++before;
+            add(sentence.substr(0, before));
+            sentence.remove_prefix(before);
+            const Place place = Place::at(sentence);
+            add(place.length > 0 ? things.begin()[place.number - 1] : std::string_view());
+            sentence.remove_prefix(place.length);
         }
     }
+    std::string_view text() const { return {mBytes.data(), mLength}; }
     void print()
     {
         mBytes[mLength++] = '\n';
@@ -69,6 +79,37 @@ private:
     std::array<char, 6000> mBytes; // a path may have 4096
     std::size_t mLength = 0;
 };
+
+constexpr std::size_t kDeeds = static_cast<std::size_t>(RunningMarker::Deed::kLispFile) + 1;
+
+// What can be said, in UTF-8, made while there is still time: a handler translates nothing.
+struct Words
+{
+    std::string sentence;                  // with numbered places for these
+    std::array<std::string, kDeeds> deeds; // with a place for the name of a command
+    std::array<std::string, NSIG> endings; // by signal
+    std::string calledExit;
+};
+Words theWords;
+
+Words wordsInPersonsLanguage()
+{
+    Words words;
+    words.sentence =
+        toUtf8(translated(L"The application \"{}\" has ended Tessel {}: {}.", L"{1}", L"{2}", L"{3}"));
+    for (std::size_t deed = 0; deed < words.deeds.size(); ++deed)
+        words.deeds[deed] = toUtf8(wordsFor(static_cast<RunningMarker::Deed>(deed), L"{1}"));
+    for (std::size_t signal = 0; signal < words.endings.size(); ++signal)
+        words.endings[signal] = toUtf8(wordsForEnding(static_cast<int>(signal)));
+    words.calledExit = toUtf8(wordsForEnding(RunningMarker::kCalledExit));
+    return words;
+}
+
+std::string_view preparedWordsFor(int ending)
+{
+    return ending == RunningMarker::kCalledExit ? theWords.calledExit
+                                                : theWords.endings[static_cast<std::size_t>(ending)];
+}
 
 // Nothing of what waits for a person is running, as far as anybody knows.
 bool isAnothersDoing(int ending, const RunningMarker::AtWork& work)
@@ -85,16 +126,9 @@ bool speak(int ending)
         return false;
     marker->noteEnding(ending);
     static Line line;
-    line.add("The application \"");
-    line.add(work.path);
-    line.add("\" has ended Tessel ");
-    const DeedWords words = wordsFor(work.deed);
-    line.add(words.before);
-    line.add(work.detail);
-    line.add(words.after);
-    line.add(": ");
-    line.add(wordsForEnding(ending).english);
-    line.add(".");
+    static Line deed;
+    deed.fill(theWords.deeds[static_cast<std::size_t>(work.deed)], {work.detail});
+    line.fill(theWords.sentence, {work.path, deed.text(), preparedWordsFor(ending)});
     line.print();
     return true;
 }
@@ -126,6 +160,7 @@ bool sayLastWords(int signal)
 
 LastWords::LastWords()
 {
+    theWords = wordsInPersonsLanguage();
     stack_t stack = {};
     stack.ss_sp = theStack.data();
     stack.ss_size = theStack.size();

@@ -16,7 +16,7 @@
 #include "host/platform/PrivateFolder.h"
 #include "host/platform/SmallFile.h"
 #include "host/platform/SystemFailure.h"
-#include "host/text/Unicode.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -98,7 +98,8 @@ RunningMarker::RunningMarker(const std::filesystem::path& folder)
 {
     auto kept = keepIn(folder);
     if (!kept)
-        mOutlivesProcess = Failure{L"What ends Tessel cannot be remembered: " + kept.sentence() + L"."};
+        mOutlivesProcess =
+            Failure{translated(L"What ends Tessel cannot be remembered: {}.", kept.sentence())};
     if (!mPage)
         map(MAP_ANONYMOUS, -1);
 }
@@ -107,8 +108,8 @@ Result<> RunningMarker::keepIn(const std::filesystem::path& folder)
 {
     std::error_code failed;
     if (std::filesystem::create_directories(folder, failed); failed)
-        return Failure{L"the folder " + toWide(folder.string()) + L" cannot be made: " +
-                       toWide(failed.message())};
+        return Failure{
+            translated(L"the folder {} cannot be made: {}", folder, systemFailure(failed.value()).sentence)};
     // Held while we look for what others have left and make our own file: one that has no lock yet would be
     // taken for one of the dead.
     const FileLock locked(folder / kLockName);
@@ -118,8 +119,8 @@ Result<> RunningMarker::keepIn(const std::filesystem::path& folder)
     make(folder);
     const int file = mFile.descriptor;
     if (file < 0 || !lockNow(file) || !fillWithZeros(file, sizeof(Page)) || !map(0, file))
-        return Failure{L"the file " + toWide(mFile.path.string()) + L" cannot be written: " +
-                       systemFailure(errno).sentence};
+        return Failure{
+            translated(L"the file {} cannot be written: {}", mFile.path, systemFailure(errno).sentence)};
     return {};
 }
 
@@ -276,25 +277,25 @@ void RunningMarker::noteEnding(int ending) noexcept
         mPage->ending = ending;
 }
 
-DeedWords wordsFor(RunningMarker::Deed deed) noexcept
+std::wstring wordsFor(RunningMarker::Deed deed, const std::wstring& detail)
 {
     switch (deed)
     {
     case RunningMarker::Deed::kEntryPoint:
-        return {"while its entry point ran", {}};
+        return translated(L"while its entry point ran");
     case RunningMarker::Deed::kUnloading:
-        return {"while it was being unloaded", {}};
+        return translated(L"while it was being unloaded");
     case RunningMarker::Deed::kCommand:
-        return {"while its command \"", "\" ran"};
+        return translated(L"while its command \"{}\" ran", detail);
     case RunningMarker::Deed::kLispFile:
-        return {"while its Lisp ran", {}};
+        return translated(L"while its Lisp ran");
     case RunningMarker::Deed::kLoading:
         break;
     }
-    return {"while it was being loaded", {}};
+    return translated(L"while it was being loaded");
 }
 
-Sentence<> wordsForEnding(int ending)
+std::wstring wordsForEnding(int ending)
 {
     struct Words
     {
@@ -321,7 +322,7 @@ Sentence<> wordsForEnding(int ending)
         {SIGXCPU, Sentence(L"too much time used (SIGXCPU)")}};
     for (const Words& words : kWords)
         if (words.ending == ending)
-            return words.text;
-    return Sentence(L"a signal");
+            return translated(words.text);
+    return translated(L"a signal");
 }
 } // namespace tessel

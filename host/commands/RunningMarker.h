@@ -15,7 +15,6 @@
 #include <vector>
 
 #include "host/text/Result.h"
-#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -163,12 +162,7 @@ private:
     Reason mReason = Reason::kByHand;
 };
 
-// The words for these, as parts of a sentence. Safe in a signal handler.
-struct DeedWords
-{
-    std::string_view before; // "while its command \""
-    std::string_view after;  // and after the detail: "\" ran"
-};
-DeedWords wordsFor(RunningMarker::Deed deed) noexcept;
-Sentence<> wordsForEnding(int ending); // ASCII
+// The words for these, as parts of a sentence; the detail is the name of a command.
+std::wstring wordsFor(RunningMarker::Deed deed, const std::wstring& detail);
+std::wstring wordsForEnding(int ending);
 } // namespace tessel
