@@ -97,10 +97,11 @@ TEST(KeptOutWords, NameEveryDeed)
 
 TEST(KeptOutWords, NameEveryWayToBeAskedFor)
 {
-    const std::pair<Reason, std::wstring> reasons[] = {{Reason::kByHand, L"asked for by hand"},
-                                                       {Reason::kAtStart, L"loaded at the start"},
-                                                       {Reason::kForAnother, L"loaded from the Startup Suite"},
-                                                       {Reason::kOnCommand, L"loaded on command"}};
+    const std::pair<Reason, std::wstring> reasons[] = {
+        {Reason::kByHand, L"asked for by hand"},
+        {Reason::kAtStart, L"loaded at the start"},
+        {Reason::kForAnother, L"loaded from the Startup Suite"},
+        {Reason::kOnCommand, L"loaded on command"}};
     KeptOutApplication application = guilty();
     application.ending = SIGUSR1;
     for (const auto& [reason, words] : reasons)
