@@ -116,3 +116,27 @@ TEST(LispEvaluation, KeepsTheFunctionsOfLispAndOfTheSystem)
     EXPECT_EQ(session.error("(defun princ (x) x)"), "Attempt to redefine function PRINC in locked package.");
     EXPECT_EQ(session.value("(list 1)"), "(1)");
 }
+
+TEST(LispSentences, PutInWhatLispPrintsEvenNil)
+{
+    LispSession session;
+    session.value("(setf *print-base* 2)");
+    EXPECT_EQ(session.value("(tessel-host::translated \"{} and {}\" 10 nil)"), "\"10 and NIL\"");
+    EXPECT_EQ(session.value("(tessel-host::translated \"{}\" \"a {}\")"), "\"a {}\"");
+}
+
+TEST(LispSentences, StandAsTheyAreWhenTheirPlacesDoNotFit)
+{
+    LispSession session;
+    EXPECT_EQ(session.value("(tessel-host::translated \"{} and {}\" 1)"), "\"{} and {}\"");
+    EXPECT_EQ(session.value("(tessel-host::translated \"none\" 1)"), "\"none\"");
+}
+
+TEST(LispSentences, AreFoundInEveryThread)
+{
+    LispSession session;
+    EXPECT_EQ(session.value("(let* ((said nil) (thread (mp:process-run-function 'talker (lambda ()"
+                            " (setf said (handler-case (quit) (error (e) (princ-to-string e))))))))"
+                            " (mp:process-join thread) said)"),
+              "\"Lisp cannot end the host; type QUIT without parentheses to do so.\"");
+}
