@@ -9,6 +9,7 @@
 #include "host/app/Parts.h"
 #include "host/applications/ApplicationFiles.h"
 #include "host/text/Quotes.h"
+#include "host/text/Table.h"
 #include "host/text/TerminalText.h"
 
 namespace tessel
@@ -82,15 +83,14 @@ Result<> unload(Parts& parts, const CommandStack::Arguments& arguments)
     return succeed(parts, module + L" is unloaded.");
 }
 
-void sayApplication(Parts& parts, const std::wstring& path, const std::wstring& state)
+void addApplication(Table& table, const std::wstring& path, const std::wstring& state)
 {
     const auto file = toPath(path);
-    const auto column = [](const std::filesystem::path& text, std::size_t width)
+    const auto cell = [](const std::filesystem::path& text)
     {
-        return padded(forTerminal(toText(text)), width); // an escape is longer than what it stands for
+        return forTerminal(toText(text)); // an escape is wider than what it stands for
     };
-    sayLine(parts, L"  " + column(file.filename(), kNameColumn) + L" " +
-                       column(file.parent_path(), kFolderColumn) + L" " + state);
+    table.add({cell(file.filename()), cell(file.parent_path()), forTerminal(state)});
 }
 
 // "0.4 ms", "37 ms", "2.1 s".
@@ -124,54 +124,53 @@ std::wstring whyNotLoaded(const Parts& parts, const LoadOutcome& outcome)
     return outcome.loaded.sentence();
 }
 
-void sayNotLoaded(Parts& parts)
+void addNotLoaded(const Parts& parts, Table& table)
 {
     const auto failed = parts.loadOutcomes.failed();
     if (!failed.empty())
-        sayLine(parts, L"Not loaded in this session:");
+        table.addHeading(L"Not loaded in this session:");
     for (const LoadOutcome& outcome : failed)
-        sayApplication(parts, outcome.path, whyNotLoaded(parts, outcome));
+        addApplication(table, outcome.path, whyNotLoaded(parts, outcome));
 }
 
 // What was asked for in vain for that very reason stands among those that were not loaded.
-void sayKeptOut(Parts& parts)
+void addKeptOut(const Parts& parts, Table& table)
 {
     for (const auto& application : parts.keptOut.all())
     {
         const std::wstring path = toWide(application.path);
         const LoadOutcome* outcome = parts.loadOutcomes.of(path);
         if (application.isOut() && !(outcome && Admission::isKeptOut(outcome->loaded.code())))
-            sayApplication(parts, path, reasonOf(application));
+            addApplication(table, path, reasonOf(application));
     }
 }
 
 Result<> listApplications(Parts& parts, const CommandStack::Arguments&)
 {
+    Table table({kNameColumn, kFolderColumn});
     const auto modules = parts.linker->loadedModules();
     for (const auto& module : modules)
-        sayApplication(parts, module.path,
+        addApplication(table, module.path,
                        withTime(parts, module.path, module.locked ? L"locked" : L"may be unloaded"));
     const int lispFiles = parts.document->loadedApplicationCount();
     for (int index = 0; index < lispFiles; ++index)
     {
         const std::wstring path = parts.document->loadedApplicationName(index);
-        sayApplication(parts, path, withTime(parts, path, L"Lisp"));
+        addApplication(table, path, withTime(parts, path, L"Lisp"));
     }
     if (modules.empty() && lispFiles == 0)
-        sayLine(parts, L"No application is loaded.");
-    sayKeptOut(parts);
-    sayNotLoaded(parts);
+        table.addHeading(L"No application is loaded.");
+    addKeptOut(parts, table);
+    addNotLoaded(parts, table);
+    parts.commandLine->show(table);
     return {};
 }
 } // namespace
 
 void addApplicationCommands(Parts& parts)
 {
-    addBuiltIn(parts,
-               {kApplicationsGroup, L"LOAD", L"file or address", L"Loads a compiled module or a Lisp file"},
-               load);
-    addBuiltIn(parts, {kApplicationsGroup, L"UNLOAD", L"file", L"Unloads a compiled module"}, unload);
-    addBuiltIn(parts, {kApplicationsGroup, L"APPS", L"", L"Lists what is loaded, and what could not be"},
-               listApplications);
+    addBuiltIn(parts, L"LOAD", load);
+    addBuiltIn(parts, L"UNLOAD", unload);
+    addBuiltIn(parts, L"APPS", listApplications);
 }
 } // namespace tessel

@@ -171,17 +171,8 @@ Result<> bisect(Parts& parts, const CommandStack::Arguments& arguments)
 
 void addKeptOutCommands(Parts& parts)
 {
-    addBuiltIn(parts,
-               {kApplicationsGroup, L"DISABLE", L"file",
-                L"Keeps an application out at starts; it stays in every list"},
-               disable);
-    addBuiltIn(parts,
-               {kApplicationsGroup, L"ENABLE", L"file",
-                L"Lets an application in again that was disabled or that ended Tessel"},
-               enable);
-    addBuiltIn(parts,
-               {kApplicationsGroup, L"BISECT", L"[START|GOOD|BAD|STOP]",
-                L"Finds the application that makes trouble, in a few starts"},
-               bisect);
+    addBuiltIn(parts, L"DISABLE", disable);
+    addBuiltIn(parts, L"ENABLE", enable);
+    addBuiltIn(parts, L"BISECT", bisect);
 }
 } // namespace tessel

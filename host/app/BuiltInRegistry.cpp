@@ -169,11 +169,6 @@ Result<> registryCommand(Parts& parts, const Arguments& arguments)
 
 void addRegistryCommands(Parts& parts)
 {
-    addBuiltIn(
-        parts,
-        {L"Settings", kCommand,
-         L"LIST|GET|SET|DELETE key [name] [data] | EXPORT key file [UTF8] | IMPORT file | RESTORE | RESET",
-         L"Shows and changes what is stored, takes it to files and back, mends a damaged registry"},
-        registryCommand);
+    addBuiltIn(parts, kCommand, registryCommand);
 }
 } // namespace tessel

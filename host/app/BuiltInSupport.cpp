@@ -1,15 +1,30 @@
 #include "host/app/BuiltInSupport.h"
 
-#include <algorithm>
 #include <functional>
+#include <sstream>
+#include <utility>
 
 #include "host/app/Parts.h"
+#include "host/commands/CommandTexts.h"
+#include "host/text/DisplayWidth.h"
 
 namespace tessel
 {
-void addBuiltIn(Parts& parts, const CommandStack::Description& description, BuiltInCommand* command)
+namespace
 {
-    parts.commands->addBuiltIn(description, std::bind_front(command, std::ref(parts)));
+constexpr wchar_t kUsageLabel[] = L"Usage: ";
+}
+
+void addBuiltIn(Parts& parts, const std::wstring& name, CommandStack::BuiltIn command)
+{
+    const CommandText& text = *findCommandText(name);
+    parts.commands->addBuiltIn({text.group, text.name, text.usage, text.summary, text.example},
+                               std::move(command));
+}
+
+void addBuiltIn(Parts& parts, const std::wstring& name, BuiltInCommand* command)
+{
+    addBuiltIn(parts, name, CommandStack::BuiltIn(std::bind_front(command, std::ref(parts))));
 }
 
 void sayLine(Parts& parts, const std::wstring& sentence)
@@ -23,11 +38,23 @@ Result<> succeed(Parts& parts, const std::wstring& sentence)
     return {};
 }
 
+std::vector<std::wstring> usageLines(const CommandStack::Description& command)
+{
+    std::vector<std::wstring> lines;
+    std::wstring label = kUsageLabel;
+    std::wistringstream ways(command.usage.empty() ? L"\n" : command.usage);
+    for (std::wstring way; std::getline(ways, way);)
+        lines.push_back(std::exchange(label, std::wstring(displayWidth(kUsageLabel), L' ')) + command.name +
+                        (way.empty() ? L"" : L" " + way));
+    return lines;
+}
+
 Failure wrongUsage(const Parts& parts, const std::wstring& command)
 {
-    const auto known = parts.commands->descriptions();
-    const auto found = std::ranges::find_if(known, [&](const auto& entry) { return entry.name == command; });
-    return {L"Usage: " + command + L" " + (found == known.end() ? L"" : found->usage)};
+    std::wstring sentence;
+    for (const auto& line : usageLines(*parts.commands->description(command)))
+        sentence += (sentence.empty() ? L"" : L"\n") + line;
+    return {sentence};
 }
 
 std::wstring fullPath(const Parts& parts, const std::wstring& typed)
@@ -47,11 +74,5 @@ std::filesystem::path toPath(const std::wstring& text)
 std::wstring toText(const std::filesystem::path& path)
 {
     return toWide(path.string());
-}
-
-std::wstring padded(std::wstring text, std::size_t width)
-{
-    text.resize(std::max(text.size(), width), L' ');
-    return text;
 }
 } // namespace tessel

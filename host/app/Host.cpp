@@ -19,7 +19,8 @@ namespace
 constexpr int kDeepestScript = 16;
 } // namespace
 
-Host::Host(HostOptions options) : mOptions(std::move(options)), mCommandLine(mOptions.output)
+Host::Host(HostOptions options)
+    : mOptions(std::move(options)), mCommandLine(mOptions.output, mOptions.outputTo)
 {
 }
 
@@ -270,13 +271,6 @@ bool Host::runsLisp() const noexcept
 
 std::vector<std::wstring> Host::commandNames() const
 {
-    std::vector<std::wstring> names = mParts->commands->names();
-    for (const auto& record : mParts->records->all())
-        for (const auto& command : record.commands)
-            names.push_back(command.second);
-    mParts->registry->storeSoFar(); // the next command is to read what is stored by then
-    std::ranges::sort(names);
-    names.erase(std::unique(names.begin(), names.end()), names.end());
-    return names;
+    return mParts->commandNames();
 }
 } // namespace tessel

@@ -43,6 +43,7 @@ struct HostOptions
     std::vector<std::filesystem::path> layoutFolders = {};
     bool safe = false;                  // load no application by itself
     CommandLine::Sink output;           // receives everything that the host says
+    OutputSurroundings outputTo = {};   // what is known about where that goes
     RemoteFiles::Limits downloads = {}; // of the files that are fetched for applications
 };
 

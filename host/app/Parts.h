@@ -5,6 +5,7 @@
 // host/text/Running.h).
 #pragma once
 
+#include <algorithm>
 #include <filesystem>
 #include <memory>
 
@@ -119,18 +120,37 @@ struct Parts
                                  .outcomes = &loadOutcomes,
                                  .admission = &admission},
         *commandLine, *document, *endRequest};
-    CommandRunner commandRunner{*commands, *commandLine, *callingApplication,
+    CommandRunner commandRunner{*commands,
+                                *commandLine,
+                                *callingApplication,
                                 [this](const std::wstring& name)
                                 {
                                     sayRecordsTakenAlong();
                                     return demandLoading.loadForCommand(name);
                                 },
-                                foundations.afterLine};
+                                foundations.afterLine,
+                                [this]
+                                {
+                                    return commandNames();
+                                }};
 
     void sayRecordsTakenAlong()
     {
         for (const auto& sentence : demandLoading.takeRecordsAlong())
             commandLine->say(sentence);
+    }
+
+    // What can be typed: the commands that are there or that the host knows how to load; sorted.
+    std::vector<std::wstring> commandNames()
+    {
+        std::vector<std::wstring> names = commands->names();
+        for (const auto& record : records->all())
+            for (const auto& command : record.commands)
+                names.push_back(command.second);
+        registry->storeSoFar(); // the next command is to read what is stored by then
+        std::ranges::sort(names);
+        names.erase(std::unique(names.begin(), names.end()), names.end());
+        return names;
     }
 };
 } // namespace tessel

@@ -23,6 +23,7 @@
 #include "host/console/LineEditor.h"
 #include "host/console/PipedInput.h"
 #include "host/console/StandardOutput.h"
+#include "host/console/TerminalSize.h"
 #include "host/console/TypedHistory.h"
 #include "host/platform/ProductFolders.h"
 #include "host/text/TerminalText.h"
@@ -129,11 +130,14 @@ int runHost(Options options, StandardOutput& output)
     if (options.profileFolder.empty())
         options.profileFolder = personalFolder();
     const LastWords lastWords; // before Lisp takes a signal of them
-    Host host({options.profileFolder, layoutFolders(options.layoutFolder), options.safe,
-               [&output](std::string_view text)
-               {
-                   output.write(text);
-               }});
+    Host host({options.profileFolder,
+               layoutFolders(options.layoutFolder),
+               options.safe,
+               [&output](std::string_view text) { output.write(text); },
+               {[]
+                {
+                    return terminalSize(STDOUT_FILENO);
+                }}});
     const InterruptKey interruptKey(host); // applications that load at start may run away too
     const EndSignals endSignals(host);
     if (!options.modrig)

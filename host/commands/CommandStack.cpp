@@ -5,6 +5,7 @@
 
 #include "host/commands/CallingApplication.h"
 #include "host/commands/Command.h"
+#include "host/commands/CommandTexts.h"
 #include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
@@ -41,12 +42,6 @@ bool isOneLine(std::wstring_view text)
            std::ranges::none_of(text, [](wchar_t c) { return std::iswcntrl(static_cast<wint_t>(c)); });
 }
 
-// What comes with the host was there before commands could be described.
-std::wstring summaryFromTheBeginning(std::wstring_view globalName)
-{
-    return globalName == L"MODRIG" ? L"Loads and unloads applications, in a dialog" : L"";
-}
-
 bool isIn(const TsEdCommand& command, const wchar_t* group)
 {
     return group && equalIgnoringCase(command.group, group);
@@ -55,6 +50,11 @@ bool isIn(const TsEdCommand& command, const wchar_t* group)
 bool isOwn(const TsEdCommand& command)
 {
     return static_cast<bool>(command.builtIn);
+}
+
+CommandStack::Description descriptionOf(const TsEdCommand& command)
+{
+    return {command.group, command.localName, command.usage, command.summary, command.example};
 }
 } // namespace
 
@@ -71,6 +71,7 @@ void CommandStack::addBuiltIn(const Description& description, BuiltIn handler)
     command->globalName = command->localName = description.name;
     command->usage = description.usage;
     command->summary = description.summary;
+    command->example = description.example;
     command->builtIn = std::move(handler);
     mCommands.push_back(std::move(command));
 }
@@ -89,7 +90,12 @@ int CommandStack::addCommand(const wchar_t* group, const wchar_t* globalName, co
     added->group = group;
     added->globalName = globalName;
     added->localName = localName;
-    added->summary = summaryFromTheBeginning(added->globalName);
+    if (const CommandText* text = findCommandText(globalName)) // it comes with the host
+    {
+        added->summary = text->summary;
+        added->usage = text->usage;
+        added->example = text->example;
+    }
     added->owner = mCalls.path();
     added->handler = handler;
     if (command)
@@ -141,6 +147,12 @@ CommandStack::Command CommandStack::find(std::wstring_view typedName) const
     return found == mCommands.end() ? nullptr : *found;
 }
 
+std::optional<CommandStack::Description> CommandStack::description(std::wstring_view typedName) const
+{
+    const Command found = find(typedName);
+    return found ? std::optional(descriptionOf(*found)) : std::nullopt;
+}
+
 std::vector<CommandStack::Names> CommandStack::commandsOf(const std::wstring& applicationPath) const
 {
     std::vector<Names> result;
@@ -174,7 +186,7 @@ std::vector<CommandStack::Description> CommandStack::descriptions() const
             std::find_if(result.rbegin(), result.rend(),
                          [&](const Description& other) { return isIn(*command, other.group.c_str()); });
         const auto place = lastOfGroup == result.rend() ? result.end() : lastOfGroup.base();
-        result.insert(place, {command->group, command->localName, command->usage, command->summary});
+        result.insert(place, descriptionOf(*command));
     }
     return result;
 }

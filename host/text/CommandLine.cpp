@@ -6,12 +6,14 @@
 #include <tessel/tsformat.h>
 
 #include "host/text/Running.h"
+#include "host/text/Table.h"
 #include "host/text/TerminalText.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
 {
-CommandLine::CommandLine(Sink write) : mWrite(std::move(write))
+CommandLine::CommandLine(Sink write, OutputSurroundings surroundings)
+    : mWrite(std::move(write)), mSurroundings(std::move(surroundings))
 {
 }
 
@@ -39,6 +41,13 @@ void CommandLine::say(std::wstring_view sentence)
         print(L"\n");
     print(sentence);
     print(L"\n");
+}
+
+void CommandLine::show(const Table& table)
+{
+    const auto screen = mSurroundings.screen ? mSurroundings.screen() : std::nullopt;
+    for (const auto& line : table.lines(screen ? std::optional(screen->columns) : std::nullopt))
+        say(line);
 }
 
 bool CommandLine::tell(const Outcome& outcome)

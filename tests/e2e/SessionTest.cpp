@@ -44,19 +44,77 @@ TEST(Session, ListsItsCommandsByGroup)
     const auto result = session.run({"HELP", "help load"});
     EXPECT_EQ(result.exitStatus, 0);
     for (const char* name : {"HELP", "QUIT", "EXIT", "SETVAR", "LOAD", "UNLOAD", "APPS", "REGISTRY",
-                             "PROFILE", "VERSION", "CD", "SCRIPT"})
+                             "PROFILE", "VERSION", "CD", "SCRIPT", "?", "DISABLE", "ENABLE", "BISECT"})
         EXPECT_THAT(result.output, HasSubstr(std::string("\n  ") + name)) << name;
     EXPECT_THAT(result.output, HasSubstr(std::string("Command: HELP\n") + kVersionLine));
-    EXPECT_THAT(result.output, HasSubstr("Session\n  HELP [name]"));
-    EXPECT_THAT(result.output, HasSubstr("Command: help load\n  LOAD"));
+    EXPECT_THAT(result.output, HasSubstr("Session\n  HELP         Lists the commands, or tells how"));
+    EXPECT_THAT(result.output,
+                HasSubstr("\nHELP and a name, such as HELP LOAD, tells how a command is typed.\n"
+                          "Command: help load\nLOAD: Loads"));
 }
 
-TEST(Session, PartsALongUsageFromItsSummary)
+TEST(Session, TellsOfACommandHowItIsTypedWithAnExample)
 {
     const HostSession session;
-    EXPECT_THAT(
-        session.run({"HELP REGISTRY"}).output,
-        HasSubstr(" | RESTORE | RESET\n" + std::string(52, ' ') + "Shows and changes what is stored"));
+    EXPECT_THAT(session.run({"HELP disable"}).output,
+                EndsWith("Command: HELP disable\n"
+                         "DISABLE: Keeps an application out at starts; it stays in every list\n"
+                         "Usage: DISABLE file\nExample: DISABLE moon.bundle\n"));
+    EXPECT_THAT(session.run({"HELP CD"}).output, EndsWith("\nExample: CD \"~/My drawings\"\n"));
+    EXPECT_THAT(session.run({"HELP VERSION"}).output,
+                EndsWith("VERSION: Shows the version\nUsage: VERSION\n"));
+}
+
+TEST(Session, ListsEachWayOfTypingACommandOnALine)
+{
+    const HostSession session;
+    const std::string ways = "Usage: REGISTRY LIST key\n"
+                             "       REGISTRY GET key [name]\n"
+                             "       REGISTRY SET key [name data]\n"
+                             "       REGISTRY DELETE key [name]\n"
+                             "       REGISTRY EXPORT key file [UTF8]\n"
+                             "       REGISTRY IMPORT file\n"
+                             "       REGISTRY RESTORE\n"
+                             "       REGISTRY RESET\n";
+    EXPECT_THAT(session.run({"HELP REGISTRY"}).output, HasSubstr("damaged registry\n" + ways + "Example: "));
+    EXPECT_THAT(session.run({"REGISTRY MEND"}).output, EndsWith("Command: REGISTRY MEND\n" + ways));
+}
+
+TEST(Session, TakesAQuestionMarkForHelp)
+{
+    const HostSession session;
+    const auto result = session.run({"? unload", "?"});
+    EXPECT_EQ(result.exitStatus, 0);
+    EXPECT_THAT(result.output, HasSubstr("Command: ? unload\nUNLOAD: Unloads a compiled module\n"));
+    EXPECT_THAT(result.output, HasSubstr(std::string("Command: ?\n") + kVersionLine + "Session\n  HELP "));
+    EXPECT_EQ(session.run({"? nothing"}).exitStatus, 1);
+}
+
+TEST(Session, TellsOfACommandThatIsLoadedWhenItIsTyped)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"});
+    const std::string key = R"(REGISTRY SET Software\Tessel\R21\Applications\Later)";
+    const auto result =
+        session.run({key + " Module /opt/later.zmb", key + " LoadReasons 4", key + R"(\Commands LATER LATER)",
+                     key + R"(\Commands MODRIG MODRIG)", "HELP later", "HELP modrig"});
+    EXPECT_EQ(result.exitStatus, 0);
+    EXPECT_THAT(result.output, HasSubstr("Command: HELP later\nThe application /opt/later.zmb is loaded when "
+                                         "LATER is typed, and HELP tells more about it then.\n"));
+    EXPECT_THAT(result.output, EndsWith("Command: HELP modrig\nMODRIG: Loads and unloads applications, in a "
+                                        "dialog\nUsage: MODRIG\n"));
+}
+
+TEST(Session, AnswersAMistypedCommandWithTheNearestOne)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"});
+    const auto result = session.run({"laod x.lsp", "HELP registy", "HELP HLEP"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, HasSubstr("\nUnknown command \"laod\". Did you mean LOAD? Type HELP for the "
+                                         "list of commands.\n"));
+    EXPECT_THAT(result.output, HasSubstr("\nThere is no help on \"registy\". Did you mean REGISTRY?\n"));
+    EXPECT_THAT(result.output, EndsWith("\nThere is no help on \"HLEP\". Did you mean HELP?\n"));
 }
 
 TEST(Session, LoadsFromHttpAndHttpsAddressesOnly)
