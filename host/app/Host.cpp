@@ -8,6 +8,7 @@
 #include "host/app/Parts.h"
 #include "host/applications/StartSummary.h"
 #include "host/console/Console.h"
+#include "host/console/FolderContent.h"
 #include "host/platform/AutoreleasePool.h"
 #include "host/platform/PrivateFolder.h"
 #include "host/platform/ToolkitPlaces.h"
@@ -17,6 +18,28 @@ namespace tessel
 namespace
 {
 constexpr int kDeepestScript = 16;
+
+std::vector<std::wstring> namesOf(const std::vector<SystemVariables::Variable>& variables)
+{
+    std::vector<std::wstring> names;
+    for (const auto& variable : variables)
+        names.push_back(variable.name);
+    return names;
+}
+
+// Of the key of a path that ends with a backslash, or of the root. A read is no part of a command.
+std::vector<Branch> keysBelow(LayeredRegistry& registry, std::wstring path)
+{
+    if (path.ends_with(L'\\'))
+        path.pop_back();
+    std::vector<Branch> keys;
+    const auto key = registry.find(path);
+    const auto names = key == Registry::kNoKey ? std::vector<std::wstring>() : registry.subKeys(key);
+    for (const std::wstring& name : names)
+        keys.push_back({name, !registry.subKeys(registry.find(name, key)).empty()});
+    registry.own().storeSoFar();
+    return keys;
+}
 } // namespace
 
 Host::Host(HostOptions options)
@@ -269,8 +292,33 @@ bool Host::runsLisp() const noexcept
     return lisp && lisp->running();
 }
 
-std::vector<std::wstring> Host::commandNames() const
+CompletionSources Host::completionSources()
 {
-    return mParts->commandNames();
+    CompletionSources sources;
+    sources.commands = [this]
+    {
+        return mParts->commandNames();
+    };
+    sources.usage = [this](const std::wstring& command)
+    {
+        const auto known = mParts->commands->description(command);
+        return known ? known->usage : std::wstring();
+    };
+    sources.variables = [this]
+    {
+        return namesOf(mParts->variables->all());
+    };
+    sources.files = contentOfFolder;
+    sources.keys = [this](const std::wstring& key)
+    {
+        return keysBelow(*mParts->layered, key);
+    };
+    sources.lispSymbols = [this](const std::wstring& beginning)
+    {
+        const AutoreleasePool pool;
+        const Interruption::Work work(mInterruption);
+        return mParts->lisp->symbolsBeginning(beginning);
+    };
+    return sources;
 }
 } // namespace tessel

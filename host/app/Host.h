@@ -24,6 +24,7 @@
 #include "host/app/Export.h"
 #include "host/commands/EndRequest.h"
 #include "host/commands/Interruption.h"
+#include "host/console/Completion.h"
 #include "host/console/LineRunner.h"
 #include "host/files/RemoteFiles.h"
 #include "host/messages/Questions.h"
@@ -83,8 +84,8 @@ public:
     CommandLine& commandLine() { return mCommandLine; }
     Questions& questions() { return mQuestions; }
 
-    // What the Tab key completes: the commands that are there or that the host knows how to load.
-    std::vector<std::wstring> commandNames() const;
+    // What the Tab key completes; for as long as the host runs.
+    CompletionSources completionSources();
 
 private:
     Result<> makeParts();

@@ -101,9 +101,8 @@ int converse(Host& host, const std::filesystem::path& profileFolder, InputSource
 {
     TypedHistory history(profileFolder / kHistoryFile);
     const auto earlier = history.read();
-    LineEditor editor(
-        host.commandLine().tell(earlier) ? *earlier : std::vector<std::wstring>(),
-        [&host] { return host.commandNames(); }, source);
+    LineEditor editor(host.commandLine().tell(earlier) ? *earlier : std::vector<std::wstring>(),
+                      host.completionSources(), source);
     Console(host.commandLine(), host.questions(), host).converse(editor, history);
     return kAllWell;
 }

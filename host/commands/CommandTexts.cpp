@@ -40,7 +40,7 @@ const std::vector<CommandText>& commandTexts()
          L"SETVAR LISPENABLED 0"},
         {kSettings, L"PROFILE", L"[name]", L"Shows or changes the current profile", L"PROFILE Drafting"},
         {kSettings, L"REGISTRY",
-         L"LIST key\nGET key [name]\nSET key [name data]\nDELETE key [name]\nEXPORT key file [UTF8]\n"
+         L"LIST [key]\nGET key [name]\nSET key [name data]\nDELETE key [name]\nEXPORT key file [UTF8]\n"
          L"IMPORT file\nRESTORE\nRESET",
          L"Shows and changes what is stored, takes it to files and back, mends a damaged registry",
          L"REGISTRY EXPORT Software\\Tessel ~/tessel.reg UTF8"},

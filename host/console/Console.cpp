@@ -102,7 +102,7 @@ void Console::converse(LineEditor& editor, TypedHistory& history)
         makeRoomForPrompt(prompt(input));
         editor.forgetInterrupts();
         mRunner.lineBegins();
-        auto outcome = editor.read(prompt(input), line);
+        auto outcome = editor.read(prompt(input), line, input.begun());
         if (outcome == LineEditor::Outcome::kLine)
         {
             mCommandLine.tell(history.add(line));

@@ -5,10 +5,11 @@
 
 #include <histedit.h>
 
-#include "host/console/Completion.h"
 #include "host/console/TerminalInput.h"
+#include "host/console/TerminalSize.h"
 #include "host/console/TypedHistory.h"
 #include "host/text/Credentials.h"
+#include "host/text/DisplayWidth.h"
 #include "host/text/TerminalText.h"
 #include "host/text/Unicode.h"
 
@@ -20,17 +21,20 @@ constexpr wchar_t kCompletionFunction[] = L"tessel-complete";
 
 void showCandidates(const std::vector<std::wstring>& candidates)
 {
-    std::fputc('\n', stdout);
+    std::wstring all;
     for (const auto& candidate : candidates)
-        std::fprintf(stdout, "%s  ", toUtf8(forTerminal(candidate)).c_str());
+        all += (all.empty() ? L"" : L"  ") + forTerminal(candidate);
+    const auto screen = terminalSize(STDOUT_FILENO);
     std::fputc('\n', stdout);
+    for (const auto& line : wrapped(all, screen ? screen->columns : all.size()))
+        std::fprintf(stdout, "%s\n", toUtf8(line).c_str());
     std::fflush(stdout);
 }
 } // namespace
 
 struct LineEditor::Terminal
 {
-    Terminal(const std::vector<std::wstring>& earlier, Names names, InputSource source);
+    Terminal(const std::vector<std::wstring>& earlier, CompletionSources given, InputSource source);
     ~Terminal();
     Terminal(const Terminal&) = delete;
     Terminal& operator=(const Terminal&) = delete;
@@ -49,7 +53,8 @@ struct LineEditor::Terminal
     Outcome read(const std::wstring& prompt, std::wstring& line);
 
     bool readsCommand = true;
-    Names commandNames;
+    CompletionSources sources;
+    std::wstring lispBefore;
     TerminalInput input;
     std::wstring promptText;
     EditLine* editLine;
@@ -57,8 +62,9 @@ struct LineEditor::Terminal
     HistEventW event{};
 };
 
-LineEditor::Terminal::Terminal(const std::vector<std::wstring>& earlier, Names names, InputSource source)
-    : commandNames(std::move(names)), input(source), editLine(el_init("Tessel", stdin, stdout, stderr)),
+LineEditor::Terminal::Terminal(const std::vector<std::wstring>& earlier, CompletionSources given,
+                               InputSource source)
+    : sources(std::move(given)), input(source), editLine(el_init("Tessel", stdin, stdout, stderr)),
       history(history_winit())
 {
     history_w(history, &event, H_SETSIZE, static_cast<int>(kMostHistoryLines));
@@ -70,7 +76,7 @@ LineEditor::Terminal::Terminal(const std::vector<std::wstring>& earlier, Names n
     el_wset(editLine, EL_HIST, history_w, history);
     el_wset(editLine, EL_GETCFN, &Terminal::readCharacter);
     el_wset(editLine, EL_EDITOR, L"emacs");
-    el_wset(editLine, EL_ADDFN, kCompletionFunction, L"Complete the name of a command", &Terminal::complete);
+    el_wset(editLine, EL_ADDFN, kCompletionFunction, L"Complete what is typed", &Terminal::complete);
     el_wset(editLine, EL_BIND, L"^I", kCompletionFunction, nullptr);
 }
 
@@ -86,15 +92,15 @@ unsigned char LineEditor::Terminal::complete(EditLine* editor, int)
         return CC_REFRESH_BEEP;
     const LineInfoW* line = el_wline(editor);
     const std::wstring typed(line->buffer, line->cursor);
-    const auto completion = completeCommand(typed, of(editor).commandNames());
+    const auto completion = tessel::complete(typed, of(editor).sources, of(editor).lispBefore);
     if (!completion)
         return CC_REFRESH_BEEP;
-    if (!completion->candidates.empty() && completion->text.size() == typed.size())
+    if (!completion->candidates.empty() && completion->text.size() == completion->replaced)
     {
         showCandidates(completion->candidates);
         return CC_REDISPLAY;
     }
-    el_wdeletestr(editor, static_cast<int>(typed.size()));
+    el_wdeletestr(editor, static_cast<int>(completion->replaced));
     el_winsertstr(editor, completion->text.c_str());
     return CC_REFRESH;
 }
@@ -122,16 +128,19 @@ void LineEditor::Terminal::remember(const wchar_t* line)
         history_w(history, &event, H_ENTER, kept.c_str());
 }
 
-LineEditor::LineEditor(const std::vector<std::wstring>& earlier, Names names, InputSource source)
-    : mTerminal(std::make_unique<Terminal>(earlier, std::move(names), source))
+LineEditor::LineEditor(const std::vector<std::wstring>& earlier, CompletionSources sources,
+                       InputSource source)
+    : mTerminal(std::make_unique<Terminal>(earlier, std::move(sources), source))
 {
 }
 
 LineEditor::~LineEditor() = default;
 
-LineEditor::Outcome LineEditor::read(const std::wstring& prompt, std::wstring& line)
+LineEditor::Outcome LineEditor::read(const std::wstring& prompt, std::wstring& line,
+                                     const std::wstring& lispBefore)
 {
     mTerminal->readsCommand = true;
+    mTerminal->lispBefore = lispBefore;
     const Outcome outcome = mTerminal->read(prompt, line);
     if (outcome == Outcome::kLine)
         mTerminal->remember((line + L"\n").c_str());

@@ -3,12 +3,13 @@
 #include "host/text/Nearest.h"
 
 using tessel::nearest;
-using testing::Optional;
 using testing::Eq;
+using testing::Optional;
 
 namespace
 {
-const std::vector<std::wstring> kTypable = {L"APPS", L"CD", L"HELP", L"LOAD", L"MODRIG", L"UNLOAD", L"Öffnen"};
+const std::vector<std::wstring> kTypable = {L"APPS",   L"CD",     L"HELP",  L"LOAD",
+                                            L"MODRIG", L"UNLOAD", L"Öffnen"};
 }
 
 TEST(Nearest, FindsWhatOneSlipMadeOfAName)

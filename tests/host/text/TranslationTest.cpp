@@ -32,7 +32,10 @@ protected:
         ASSERT_EQ(std::system(made.c_str()), 0); // NOLINT(cert-env33-c): the names are our own
     }
 
-    void use(const std::vector<std::string>& languages) { tessel::useTranslations(mFolder.path(), languages); }
+    void use(const std::vector<std::string>& languages)
+    {
+        tessel::useTranslations(mFolder.path(), languages);
+    }
 
     TemporaryFolder mFolder;
 };
