@@ -53,9 +53,8 @@ Result<std::wstring> localFile(Parts& parts, const std::wstring& typed)
 
 Result<> load(Parts& parts, const CommandStack::Arguments& arguments)
 {
-    if (arguments.size() != 1)
-        return wrongUsage(parts, L"LOAD");
-    const auto file = localFile(parts, arguments.front());
+    const auto typed = onlyFile(parts, L"LOAD", arguments);
+    const auto file = typed ? localFile(parts, *typed) : typed;
     if (!file)
         return file.failure();
     const std::wstring& path = *file;
@@ -67,13 +66,14 @@ Result<> load(Parts& parts, const CommandStack::Arguments& arguments)
 
 Result<> unload(Parts& parts, const CommandStack::Arguments& arguments)
 {
-    if (arguments.size() != 1)
-        return wrongUsage(parts, L"UNLOAD");
-    const std::wstring path = fullPath(parts, arguments.front());
+    const auto typed = onlyFile(parts, L"UNLOAD", arguments);
+    if (!typed)
+        return typed.failure();
+    const std::wstring path = fullPath(parts, *typed);
     if (isLispFile(path))
         return Failure{path + L" cannot be unloaded: Lisp stays until the session ends."};
     // The name alone is enough for what is loaded.
-    const std::wstring loaded = parts.linker->pathOfModule(arguments.front());
+    const std::wstring loaded = parts.linker->pathOfModule(*typed);
     const std::wstring module = loaded.empty() ? path : loaded;
     const auto unloaded = parts.linker->unload(module);
     if (!unloaded)

@@ -112,16 +112,10 @@ Result<std::wstring> pathToLetIn(const Parts& parts, const std::wstring& typed)
     return onlyOneOf(candidates, typed);
 }
 
-bool isOneFile(const CommandStack::Arguments& arguments)
-{
-    return arguments.size() == 1 && !arguments.front().empty();
-}
-
 Result<> disable(Parts& parts, const CommandStack::Arguments& arguments)
 {
-    if (!isOneFile(arguments))
-        return wrongUsage(parts, L"DISABLE");
-    const auto path = pathToKeepOut(parts, arguments.front());
+    const auto typed = onlyFile(parts, L"DISABLE", arguments);
+    const auto path = typed ? pathToKeepOut(parts, *typed) : typed;
     if (!path)
         return path.failure();
     if (auto kept = parts.keptOut.keepOut(toUtf8(*path)); !kept)
@@ -131,9 +125,8 @@ Result<> disable(Parts& parts, const CommandStack::Arguments& arguments)
 
 Result<> enable(Parts& parts, const CommandStack::Arguments& arguments)
 {
-    if (!isOneFile(arguments))
-        return wrongUsage(parts, L"ENABLE");
-    const auto path = pathToLetIn(parts, arguments.front());
+    const auto typed = onlyFile(parts, L"ENABLE", arguments);
+    const auto path = typed ? pathToLetIn(parts, *typed) : typed;
     if (!path)
         return path.failure();
     const std::wstring bisect = parts.bisecting.keepsOut(toUtf8(*path))

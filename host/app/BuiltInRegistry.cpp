@@ -125,9 +125,10 @@ Result<> exportTo(Parts& parts, const std::wstring& path, const Arguments& argum
 {
     const auto form = arguments.size() > 3 ? RegistryTextForm::kUtf8 : RegistryTextForm::kUtf16;
     std::error_code currentFolderIsGone;
-    return tell(parts, exportRegistry(
-                           *parts.registry, path,
-                           std::filesystem::absolute(toPath(at(arguments, 2)), currentFolderIsGone), form));
+    return tell(parts,
+                exportRegistry(*parts.registry, path,
+                               std::filesystem::absolute(typedPath(at(arguments, 2)), currentFolderIsGone),
+                               form));
 }
 
 // What is damaged gives way to the copy of what it held.

@@ -90,12 +90,15 @@ Result<> help(Parts& parts, const CommandStack::Arguments& arguments)
 
 Result<> changeFolder(Parts& parts, const CommandStack::Arguments& arguments)
 {
+    const auto typed =
+        arguments.empty() ? Result<std::wstring>(std::wstring()) : onlyFile(parts, L"CD", arguments);
+    if (!typed)
+        return typed.failure();
     std::error_code error;
-    if (!arguments.empty())
-        std::filesystem::current_path(toPath(arguments.front()), error);
+    if (!typed->empty())
+        std::filesystem::current_path(typedPath(*typed), error);
     if (error)
-        return Failure{L"The folder " + arguments.front() + L" cannot be entered: " +
-                       toWide(error.message()) + L"."};
+        return Failure{L"The folder " + *typed + L" cannot be entered: " + toWide(error.message()) + L"."};
     const auto folder = std::filesystem::current_path(error);
     if (error)
         return Failure{L"The current folder is gone."};
@@ -117,7 +120,8 @@ void addSessionCommands(Parts& parts, SessionActions actions)
     };
     const auto script = [&parts, run = std::move(actions.runScript)](const CommandStack::Arguments& arguments)
     {
-        return arguments.size() == 1 ? run(toPath(arguments.front())) : wrongUsage(parts, L"SCRIPT");
+        const auto file = onlyFile(parts, L"SCRIPT", arguments);
+        return file ? run(typedPath(*file)) : file.failure();
     };
     addBuiltIn(parts, L"HELP", help);
     addBuiltIn(parts, L"?", help);

@@ -6,7 +6,9 @@
 
 #include "host/app/Parts.h"
 #include "host/commands/CommandTexts.h"
+#include "host/platform/HomeFolder.h"
 #include "host/text/DisplayWidth.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -57,12 +59,37 @@ Failure wrongUsage(const Parts& parts, const std::wstring& command)
     return {sentence};
 }
 
+std::filesystem::path typedPath(const std::wstring& typed)
+{
+    std::error_code unreachable;
+    const std::filesystem::path path = toPath(typed);
+    return std::filesystem::exists(path, unreachable) ? path
+                                                      : std::filesystem::path(withHomeFolder(path.native()));
+}
+
+Result<std::wstring> onlyFile(const Parts& parts, const std::wstring& command,
+                              const CommandStack::Arguments& arguments)
+{
+    if (arguments.size() == 1 && !arguments.front().empty())
+        return arguments.front();
+    std::wstring withBlanks;
+    for (const auto& argument : arguments)
+        withBlanks += (withBlanks.empty() ? L"" : L" ") + argument;
+    const Failure usage = wrongUsage(parts, command);
+    if (arguments.size() < 2)
+        return usage;
+    return Failure{
+        usage.sentence + L"\n" +
+        translated(L"A name with blanks in it is typed in quotes: {}", command + L" " + asPart(withBlanks))};
+}
+
 std::wstring fullPath(const Parts& parts, const std::wstring& typed)
 {
-    if (const auto found = parts.files->find(toPath(typed)))
+    const auto meant = typedPath(typed);
+    if (const auto found = parts.files->find(meant))
         return toText(*found);
     std::error_code currentFolderIsGone;
-    const auto path = std::filesystem::absolute(toPath(typed), currentFolderIsGone);
+    const auto path = std::filesystem::absolute(meant, currentFolderIsGone);
     return toText(path.has_filename() ? path : path.parent_path());
 }
 

@@ -28,6 +28,14 @@ std::vector<std::wstring> usageLines(const CommandStack::Description& command);
 // The same for who has typed it otherwise.
 Failure wrongUsage(const Parts& parts, const std::wstring& command);
 
+// The path that was typed as an argument. A tilde at its beginning stands for a home folder, unless something
+// has just that name.
+std::filesystem::path typedPath(const std::wstring& typed);
+
+// The one argument of a command that takes one file; otherwise how it is to be typed.
+Result<std::wstring> onlyFile(const Parts& parts, const std::wstring& command,
+                              const CommandStack::Arguments& arguments);
+
 // Where the file is, along the host's search path; a file that is not found is looked for where the user is,
 // so that what is said about it names a whole path.
 std::wstring fullPath(const Parts& parts, const std::wstring& typed);

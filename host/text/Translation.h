@@ -1,7 +1,7 @@
 // What the host says to a person, in that person's language.
 //
-// A sentence stands in English where it is said: as one literal, whole, with a place {} for each thing that is
-// put in. Translators find it by the names of these functions, and write it into host/languages/.
+// A sentence stands in English where it is said: as one literal, whole, with a place {} for each thing that
+// is put in. Translators find it by the names of these functions, and write it into host/languages/.
 //
 //     translated(L"The registry {} could not be read: {}.", file, reason)
 //     translatedByCount(starts, L"{} start is left", L"{} starts are left")
@@ -69,7 +69,7 @@ struct Sentence
 
     const wchar_t* english;
 };
-Sentence(const wchar_t*) -> Sentence<>;
+Sentence(const wchar_t*)->Sentence<>;
 
 // How something is put in.
 template <class Thing>

@@ -68,7 +68,7 @@ TEST(Session, TellsOfACommandHowItIsTypedWithAnExample)
 TEST(Session, ListsEachWayOfTypingACommandOnALine)
 {
     const HostSession session;
-    const std::string ways = "Usage: REGISTRY LIST key\n"
+    const std::string ways = "Usage: REGISTRY LIST [key]\n"
                              "       REGISTRY GET key [name]\n"
                              "       REGISTRY SET key [name data]\n"
                              "       REGISTRY DELETE key [name]\n"
@@ -125,6 +125,50 @@ TEST(Session, LoadsFromHttpAndHttpsAddressesOnly)
     EXPECT_THAT(result.output, HasSubstr("a.lsp\nThe address ftp://nowhere.invalid/a.lsp cannot be loaded: "
                                          "only http and https addresses can be fetched.\n"));
     EXPECT_THAT(result.output, HasSubstr("Cannot load \"")) << "what is no address is a file";
+}
+
+TEST(Session, SaysToQuoteANameWithBlanks)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"});
+    const auto result = session.run(
+        {"LOAD my lisp/one two.lsp", "CD a b", "SCRIPT a b", "UNLOAD a b", "DISABLE a b", "ENABLE a b"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output,
+                HasSubstr("\nUsage: LOAD file\n       LOAD address\nA name with blanks in it is "
+                          "typed in quotes: LOAD \"my lisp/one two.lsp\"\n"));
+    for (const std::string command : {"CD", "SCRIPT", "UNLOAD", "DISABLE", "ENABLE"})
+        EXPECT_THAT(result.output, HasSubstr(" is typed in quotes: " + command + " \"a b\"\n"));
+    EXPECT_THAT(session.run({"LOAD"}).output,
+                EndsWith("Command: LOAD\nUsage: LOAD file\n       LOAD address\n"));
+}
+
+TEST(Session, FindsHomeFoldersByATilde)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"});
+    const std::string home = (session.folder() / "home").string();
+    const std::string lisp = session.folder().write("home/my lisp/one.lsp", "(princ \"one\")\n").string();
+    session.folder().write("home/two.scr", "VERSION\n");
+    const auto result = session.run({"LOAD \"~/my lisp/one.lsp\"", "CD ~", "SCRIPT ~/two.scr",
+                                     "REGISTRY EXPORT Software ~/all.reg UTF8", "REGISTRY IMPORT ~/all.reg",
+                                     "CD ~root", "CD ~nobody-at-all/x", "DISABLE \"~/my lisp/one.lsp\""});
+    EXPECT_THAT(result.output, HasSubstr("one\n" + lisp + " is loaded.\nCommand: CD ~\n" + home + "\n"));
+    EXPECT_THAT(result.output, HasSubstr(std::string("Command: VERSION\n") + kVersionLine));
+    EXPECT_THAT(result.output, HasSubstr("Command: CD ~root\n/root\n"));
+    EXPECT_THAT(result.output, HasSubstr("The folder ~nobody-at-all/x cannot be entered: No such file"));
+    EXPECT_THAT(result.output, HasSubstr(lisp + " is kept out at starts from now on"));
+    EXPECT_TRUE(std::filesystem::exists(session.folder() / "home/all.reg"));
+    EXPECT_EQ(result.exitStatus, 1) << "nobody has that home";
+}
+
+TEST(Session, TakesATildeForWhatItIsWhereAFileIsCalledSo)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"});
+    session.folder().write("~/one.lsp", "(princ \"literal\")\n");
+    const auto result = session.run({"CD " + session.folder().path().string(), "LOAD ~/one.lsp"});
+    EXPECT_THAT(result.output, HasSubstr("\nliteral\n"));
 }
 
 TEST(Session, ShowsTheHelpBookWithoutABrowser)
