@@ -1,13 +1,11 @@
 // LOAD, UNLOAD, APPS: applications without the dialog.
-#include <chrono>
-#include <iomanip>
 #include <limits>
-#include <sstream>
 
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
 #include "host/applications/ApplicationFiles.h"
+#include "host/text/Duration.h"
 #include "host/text/Quotes.h"
 #include "host/text/Table.h"
 #include "host/text/TerminalText.h"
@@ -28,7 +26,7 @@ bool isLispFile(const std::wstring& path)
 Result<> loadLisp(Parts& parts, const std::wstring& path)
 {
     const auto value = parts.lisp->evaluate(L"(load " + inQuotes(path) + L")");
-    return value ? succeed(parts, path + L" is loaded.") : value.failure();
+    return value ? confirm(parts, path + L" is loaded.") : value.failure();
 }
 
 // "ftp://host/file". A file may be called so all the same.
@@ -61,7 +59,7 @@ Result<> load(Parts& parts, const CommandStack::Arguments& arguments)
     if (isLispFile(path))
         return loadLisp(parts, path);
     auto loaded = parts.linker->load(path, kResolveNow);
-    return loaded ? succeed(parts, path + L" is loaded.") : loaded;
+    return loaded ? confirm(parts, path + L" is loaded.") : loaded;
 }
 
 Result<> unload(Parts& parts, const CommandStack::Arguments& arguments)
@@ -80,7 +78,7 @@ Result<> unload(Parts& parts, const CommandStack::Arguments& arguments)
         return unloaded.failure();
     if (!unloaded->empty())
         sayLine(parts, *unloaded);
-    return succeed(parts, module + L" is unloaded.");
+    return confirm(parts, module + L" is unloaded.");
 }
 
 void addApplication(Table& table, const std::wstring& path, const std::wstring& state)
@@ -93,26 +91,10 @@ void addApplication(Table& table, const std::wstring& path, const std::wstring& 
     table.add({cell(file.filename()), cell(file.parent_path()), forTerminal(state)});
 }
 
-// "0.4 ms", "37 ms", "2.1 s".
-std::wstring duration(std::chrono::microseconds time)
-{
-    using Milliseconds = std::chrono::duration<double, std::milli>;
-    constexpr Milliseconds kWithoutTenths{10};
-    constexpr Milliseconds kSecond{1000};
-    const Milliseconds milliseconds = time;
-    std::wostringstream text;
-    text << std::fixed << std::setprecision(milliseconds < kWithoutTenths || milliseconds >= kSecond ? 1 : 0);
-    if (milliseconds < kSecond)
-        text << milliseconds.count() << L" ms";
-    else
-        text << milliseconds / kSecond << L" s";
-    return text.str();
-}
-
 std::wstring withTime(const Parts& parts, const std::wstring& path, const std::wstring& state)
 {
     const LoadOutcome* outcome = parts.loadOutcomes.of(path);
-    return outcome && outcome->loaded ? state + L", loaded in " + duration(outcome->took) : state;
+    return outcome && outcome->loaded ? state + L", loaded in " + durationInWords(outcome->took) : state;
 }
 
 // What kept it out at the start may do so no longer.

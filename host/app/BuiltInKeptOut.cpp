@@ -120,7 +120,7 @@ Result<> disable(Parts& parts, const CommandStack::Arguments& arguments)
         return path.failure();
     if (auto kept = parts.keptOut.keepOut(toUtf8(*path)); !kept)
         return kept;
-    return succeed(parts, *path + L" is kept out at starts from now on; ENABLE lets it in again.");
+    return confirm(parts, *path + L" is kept out at starts from now on; ENABLE lets it in again.");
 }
 
 Result<> enable(Parts& parts, const CommandStack::Arguments& arguments)
@@ -136,7 +136,7 @@ Result<> enable(Parts& parts, const CommandStack::Arguments& arguments)
         return Failure{L"\"" + *path + L"\" is not let in by ENABLE: " + bisect};
     if (auto let = parts.keptOut.letIn(toUtf8(*path)); !let)
         return let;
-    return succeed(parts, *path + L" is not kept out at starts any more." +
+    return confirm(parts, *path + L" is not kept out at starts any more." +
                               (bisect.empty() ? L"" : L" But " + bisect));
 }
 

@@ -56,11 +56,13 @@ Result<> list(Parts& parts, const std::wstring& path)
     const auto key = registry.find(path);
     if (key == Registry::kNoKey)
         return notFound(registry.own(), path, L"does not exist");
+    std::vector<std::wstring> lines;
     for (const auto& name : registry.subKeys(key))
-        sayLine(parts, L"[" + name + L"]");
+        lines.push_back(L"[" + name + L"]");
     for (const auto& value : registry.values(key))
-        sayLine(parts, (value.name.empty() ? L"(unnamed)" : value.name) + L" = " + value.data +
-                           (value.file.empty() ? L"" : L"    (from " + toText(value.file) + L")"));
+        lines.push_back((value.name.empty() ? L"(unnamed)" : value.name) + L" = " + value.data +
+                        (value.file.empty() ? L"" : L"    (from " + toText(value.file) + L")"));
+    parts.commandLine->show(lines);
     if (registry.own().readFailed())
         return storeFailureAt(registry.own(), path, L"cannot be read to its end");
     return {};
@@ -113,7 +115,7 @@ Result<> remove(Parts& parts, const std::wstring& path, const Arguments& argumen
 
 Result<> tell(Parts& parts, const Result<std::wstring>& done)
 {
-    return done ? succeed(parts, *done) : done.failure();
+    return done ? confirm(parts, *done) : done.failure();
 }
 
 bool isUtf8(const std::wstring& word)

@@ -34,6 +34,12 @@ void sayLine(Parts& parts, const std::wstring& sentence)
     parts.commandLine->say(sentence);
 }
 
+Result<> confirm(Parts& parts, const std::wstring& sentence)
+{
+    parts.commandLine->confirm(sentence);
+    return {};
+}
+
 Result<> succeed(Parts& parts, const std::wstring& sentence)
 {
     sayLine(parts, sentence);
@@ -87,7 +93,11 @@ std::wstring fullPath(const Parts& parts, const std::wstring& typed)
 {
     const auto meant = typedPath(typed);
     if (const auto found = parts.files->find(meant))
+    {
+        if (*found != meant)
+            parts.commandLine->explain(translated(L"{} is the file {}.", typed, *found));
         return toText(*found);
+    }
     std::error_code currentFolderIsGone;
     const auto path = std::filesystem::absolute(meant, currentFolderIsGone);
     return toText(path.has_filename() ? path : path.parent_path());

@@ -20,7 +20,10 @@ void addBuiltIn(Parts& parts, const std::wstring& name, BuiltInCommand* command)
 
 void sayLine(Parts& parts, const std::wstring& sentence);
 
-// Says the sentence with which a command ends well.
+// Says that a command has done what it was to do; those who want it quiet know.
+Result<> confirm(Parts& parts, const std::wstring& sentence);
+
+// Says the sentence that a command was to find out.
 Result<> succeed(Parts& parts, const std::wstring& sentence);
 
 // The ways in which a command is typed, a line each, the first after the label.

@@ -35,6 +35,7 @@ namespace tessel
 class LispInterpreter;
 class Registry;
 class RunningMarker;
+struct LoadOutcome;
 struct Parts;
 
 struct HostOptions
@@ -96,6 +97,10 @@ private:
     void tellWhoElseWritesTheProfile();
     bool tellWhoElseWrites(const std::wstring& kind, const std::filesystem::path& path);
     void tellOfStart();
+    void explainPlaces();
+    void explainLoad(const LoadOutcome& outcome);
+    bool runLisp(const std::wstring& input, const Interruption::Wish& wish);
+    OutputSurroundings withPagerForPersons(OutputSurroundings surroundings);
     void addCommands();
     bool finishLine();
 

@@ -76,7 +76,7 @@ struct Parts
     Published<Questions> questions{foundations.questions};
     Published<EndRequest> endRequest{foundations.endRequest};
     Owned<Registry> registry{foundations.profileFolder / kRegistryFile, Registry::kBusyTimeout,
-                             [this](const std::wstring& sentence) { foundations.commandLine.say(sentence); },
+                             [this](const std::wstring& sentence) { foundations.commandLine.warn(sentence); },
                              [wish = Interruption::Wish(foundations.interruption)]
                              {
                                  return wish.isThere();
@@ -84,7 +84,7 @@ struct Parts
     Owned<LayeredRegistry> layered{*registry, readRegistryLayers(foundations.layoutFolders),
                                    [this](const std::wstring& sentence)
                                    {
-                                       foundations.commandLine.say(sentence);
+                                       foundations.commandLine.warn(sentence);
                                    }};
     Profiles profiles{*layered, kProductRegistryRoot};
     Owned<SystemVariables> variables{&*layered, kProductRegistryRoot};
@@ -111,7 +111,11 @@ struct Parts
     Owned<Document> document;
     Owned<FileSearch> files{folders.resources, *variables};
     Owned<RemoteFiles> remote{foundations.profileFolder / "remote-files", foundations.downloads,
-                              foundations.interruption};
+                              foundations.interruption,
+                              [this](const std::wstring& sentence)
+                              {
+                                  foundations.commandLine.warn(sentence);
+                              }};
     Owned<HostInformation> information{toWide(foundations.profileFolder.string()), *remote, *commandLine};
     Owned<Help> help{folders.resources / "help", openInBrowser};
     // The variable is read here, before any application is loaded, and holds for the session.
@@ -137,7 +141,7 @@ struct Parts
     void sayRecordsTakenAlong()
     {
         for (const auto& sentence : demandLoading.takeRecordsAlong())
-            commandLine->say(sentence);
+            commandLine->warn(sentence);
     }
 
     // What can be typed: the commands that are there or that the host knows how to load; sorted.
