@@ -17,7 +17,7 @@ constexpr char kAfterword[] =
     "status 0, or with 1 if a file could not be loaded, a command was unknown or failed or a Lisp "
     "expression\n"
     "had an error. Otherwise it reads commands from the terminal, or line by line from a pipe, which is\n"
-    "treated like a script. Wrong arguments end with status 2.";
+    "treated like a script. What goes wrong is said on standard error. Wrong arguments end with status 2.";
 
 std::string isNamed(const std::string& folder)
 {

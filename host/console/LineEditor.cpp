@@ -2,10 +2,12 @@
 
 #include <cerrno>
 #include <cstdio>
+#include <optional>
 
 #include <histedit.h>
 
 #include "host/console/TerminalInput.h"
+#include "host/console/TerminalSignals.h"
 #include "host/console/TerminalSize.h"
 #include "host/console/TypedHistory.h"
 #include "host/text/Credentials.h"
@@ -48,6 +50,7 @@ struct LineEditor::Terminal
     static wchar_t* prompt(EditLine* editor) { return of(editor).promptText.data(); }
     static unsigned char complete(EditLine* editor, int);
     static int readCharacter(EditLine* editor, wchar_t* character);
+    void obeySignals();
 
     void remember(const wchar_t* line);
     Outcome read(const std::wstring& prompt, std::wstring& line);
@@ -56,6 +59,7 @@ struct LineEditor::Terminal
     CompletionSources sources;
     std::wstring lispBefore;
     TerminalInput input;
+    std::optional<TerminalSignals> signals; // while a line is read
     std::wstring promptText;
     EditLine* editLine;
     HistoryW* history;
@@ -105,13 +109,39 @@ unsigned char LineEditor::Terminal::complete(EditLine* editor, int)
     return CC_REFRESH;
 }
 
+// Whoever uses the terminal meanwhile finds it as usual, and leaves it as they like; the prompt comes back
+// with what was typed.
+void LineEditor::Terminal::obeySignals()
+{
+    const auto came = signals->take();
+    if (came.stop)
+    {
+        el_wset(editLine, EL_PREP_TERM, 0);
+        std::fputc('\n', stdout);
+        std::fflush(stdout);
+        signals->stop();
+        static_cast<void>(signals->take()); // that it goes on
+    }
+    if (came.resize)
+        el_resize(editLine);
+    if (came.stop || came.resume)
+        el_wset(editLine, EL_PREP_TERM, 1);
+    std::fputc('\r', stdout); // over what may still stand there
+    std::fflush(stdout);
+    el_wset(editLine, EL_REFRESH);
+}
+
 // The editor's own reading would miss a Ctrl-C that comes between the prompt and the waiting.
 int LineEditor::Terminal::readCharacter(EditLine* editor, wchar_t* character)
 {
-    switch (of(editor).input.read(*character))
+    TerminalInput::Outcome outcome{};
+    while ((outcome = of(editor).input.read(*character)) == TerminalInput::Outcome::kWoken)
+        of(editor).obeySignals();
+    switch (outcome)
     {
     case TerminalInput::Outcome::kCharacter:
         return 1;
+    case TerminalInput::Outcome::kWoken:
     case TerminalInput::Outcome::kInterrupted:
         errno = EINTR;
         return -1;
@@ -161,10 +191,15 @@ LineEditor::Outcome LineEditor::Terminal::read(const std::wstring& prompt, std::
     // lost.
     el_wset(editLine, EL_PREP_TERM, 1);
     int length = 0;
+    signals.emplace();
+    input.wakeBy(signals->wakeUp());
     errno = 0;
     const wchar_t* typed = el_wgets(editLine, &length);
+    const int error = errno;
+    input.wakeBy(-1);
+    signals.reset();
     if (!typed || length <= 0)
-        return errno == EINTR ? Outcome::kInterrupted : Outcome::kEnd;
+        return error == EINTR ? Outcome::kInterrupted : Outcome::kEnd;
     line.assign(typed, static_cast<std::size_t>(length));
     while (!line.empty() && (line.back() == L'\n' || line.back() == L'\r'))
         line.pop_back();

@@ -85,8 +85,7 @@ std::optional<pid_t> start(Words words, int input)
         pointers.push_back(word.data());
     pointers.push_back(nullptr);
     pid_t process = 0;
-    const int error =
-        posix_spawnp(&process, pointers.front(), &files, &attributes, pointers.data(), environ);
+    const int error = posix_spawnp(&process, pointers.front(), &files, &attributes, pointers.data(), environ);
     posix_spawnattr_destroy(&attributes);
     posix_spawn_file_actions_destroy(&files);
     return error == 0 ? std::optional(process) : std::nullopt;

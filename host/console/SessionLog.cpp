@@ -47,8 +47,8 @@ Result<SessionLog> SessionLog::open(const std::filesystem::path& file)
     {
         return Failure{translated(L"The log {} cannot be written: {}.", file, reason)};
     };
-    Descriptor opened(::open(file.c_str(), O_WRONLY | O_APPEND | O_CREAT | O_CLOEXEC | O_NONBLOCK | O_NOCTTY,
-                             kOwnersOnly));
+    Descriptor opened(
+        ::open(file.c_str(), O_WRONLY | O_APPEND | O_CREAT | O_CLOEXEC | O_NONBLOCK | O_NOCTTY, kOwnersOnly));
     if (!opened)
         return failed(systemFailure(errno).sentence);
     if (const auto ordinary = checkIsOrdinary(opened); !ordinary)
@@ -82,7 +82,6 @@ Result<> SessionLog::finish()
     mOpenLine.clear();
     if (mWritten)
         return {};
-    return Failure{
-        translated(L"Some of the log {} could not be written: {}.", mFile, mWritten.sentence())};
+    return Failure{translated(L"Some of the log {} could not be written: {}.", mFile, mWritten.sentence())};
 }
 } // namespace tessel

@@ -13,12 +13,12 @@ namespace tessel
 class SessionLog
 {
 public:
-    // Opens the file to add to it; a new one is the person's alone. Nothing but an ordinary file is taken: why
-    // not is a sentence.
+    // Opens the file to add to it; a new one is the person's alone. Nothing but an ordinary file is taken:
+    // why not is a sentence.
     static Result<SessionLog> open(const std::filesystem::path& file);
 
-    // Pieces of lines, UTF-8. Each line is written when it is whole, after the time by the clock of the place:
-    // "2026-11-22T09:41:07.250+0100 ".
+    // Pieces of lines, UTF-8. Each line is written when it is whole, after the time by the clock of the
+    // place: "2026-11-22T09:41:07.250+0100 ".
     void record(std::string_view text);
 
     // Writes what is left of a line. Whether all of it has arrived: a sentence about the first failure.

@@ -39,15 +39,17 @@ TEST_F(Telling, NamesFileAndLineOfWhatFailsInAScript)
     EXPECT_THAT(result.output, HasSubstr("\n" + script + ":3: In function CAR"));
     EXPECT_THAT(result.output, HasSubstr("\n" + inner + ":3: Unknown command \"BAD\"."));
     EXPECT_THAT(result.output, HasSubstr("\n" + script + ":6: There is no variable called \"NONE\".\n"));
-    EXPECT_THAT(result.output, EndsWith("\n" + script + ":7: The Lisp expression is not finished: the input ends "
-                                                        "inside of it.\n"));
+    EXPECT_THAT(result.output, EndsWith("\n" + script +
+                                        ":7: The Lisp expression is not finished: the input ends "
+                                        "inside of it.\n"));
 }
 
 TEST_F(Telling, CountsEmptyLinesOfAScript)
 {
     const auto script = session.folder().write("a.scr", "\r\n\r\nBAD\r\n").string();
     EXPECT_THAT(session.start({"--script", script}).output, HasSubstr("\n" + script + ":3: Unknown"));
-    EXPECT_THAT(session.runPipe("\n\nBAD\n").output, HasSubstr("\nUnknown command \"BAD\"")) << "a pipe is no file";
+    EXPECT_THAT(session.runPipe("\n\nBAD\n").output, HasSubstr("\nUnknown command \"BAD\""))
+        << "a pipe is no file";
 }
 
 TEST_F(Telling, PutsErrorsOnStandardError)
@@ -55,13 +57,15 @@ TEST_F(Telling, PutsErrorsOnStandardError)
     session.startBy(kErrorsAlone);
     const auto errors = session.run({"VERSION", "FOO", "(car 1)"});
     EXPECT_EQ(errors.exitStatus, 1);
-    EXPECT_THAT(errors.output, StartsWith("Unknown command \"FOO\". Type HELP for the list of commands.\nIn function CAR"));
+    EXPECT_THAT(errors.output,
+                StartsWith("Unknown command \"FOO\". Type HELP for the list of commands.\nIn function CAR"));
     EXPECT_THAT(errors.output, Not(HasSubstr("VERSION")));
     session.startBy(kOutputAlone);
-    EXPECT_EQ(session.run({"VERSION", "FOO"}).output,
-              std::string("Tessel R21, reference host for Modrig. Type HELP for the list of commands, QUIT to "
-                          "leave.\nCommand: VERSION\n") +
-                  kVersionLine + "Command: FOO\n");
+    EXPECT_EQ(
+        session.run({"VERSION", "FOO"}).output,
+        std::string("Tessel R21, reference host for Modrig. Type HELP for the list of commands, QUIT to "
+                    "leave.\nCommand: VERSION\n") +
+            kVersionLine + "Command: FOO\n");
 }
 
 TEST_F(Telling, PutsWhatNobodyAskedForOnStandardErrorToo)
@@ -77,11 +81,12 @@ TEST_F(Telling, IsQuietWithAnOption)
     const auto lisp = session.folder().write("one.lsp", "(princ \"one\")\n").string();
     for (const std::string option : {"-q", "--quiet"})
     {
-        const auto result =
-            session.start({option, "-c", "LOAD " + lisp, "-c", "SETVAR LISPENABLED", "-c", "(+ 1 2)", "-c", "FOO"});
+        const auto result = session.start(
+            {option, "-c", "LOAD " + lisp, "-c", "SETVAR LISPENABLED", "-c", "(+ 1 2)", "-c", "FOO"});
         EXPECT_EQ(result.exitStatus, 1);
-        EXPECT_EQ(result.output, "one\nLISPENABLED = 1\n3\nUnknown command \"FOO\". Type HELP for the list of "
-                                 "commands.\n");
+        EXPECT_EQ(result.output,
+                  "one\nLISPENABLED = 1\n3\nUnknown command \"FOO\". Type HELP for the list of "
+                  "commands.\n");
     }
 }
 
@@ -91,15 +96,17 @@ TEST_F(Telling, SaysWhatItDoesWithAnOption)
     for (const std::string option : {"-v", "--verbose"})
     {
         session.startBy(kErrorsAlone);
-        const auto result = session.start({option, "-c", "CD " + lisp.parent_path().string(), "-c", "LOAD one.lsp"});
+        const auto result =
+            session.start({option, "-c", "CD " + lisp.parent_path().string(), "-c", "LOAD one.lsp"});
         const std::string time = "[0-9.]+ m?s\\.\n";
-        EXPECT_THAT(result.output, StartsWith("The profile is kept in " + session.profile().string() + ".\n"
+        EXPECT_THAT(result.output, StartsWith("The profile is kept in " + session.profile().string() +
+                                              ".\n"
                                               "Values for everybody are looked for in /"));
         EXPECT_THAT(result.output, HasSubstr("\nApplications are looked for in /"));
         EXPECT_THAT(result.output, testing::ContainsRegex("\nThe start took " + time + "That took " + time));
         EXPECT_THAT(result.output, HasSubstr("\none.lsp is the file " + lisp.string() + ".\n"));
-        EXPECT_THAT(result.output,
-                    testing::ContainsRegex("\n" + lisp.string() + " was loaded in " + time + "That took " + time));
+        EXPECT_THAT(result.output, testing::ContainsRegex("\n" + lisp.string() + " was loaded in " + time +
+                                                          "That took " + time));
     }
     EXPECT_EQ(session.start({"-q", "-v"}).exitStatus, 2);
 }
@@ -117,8 +124,8 @@ TEST_F(Telling, IsKeptInALogWithTimes)
     ASSERT_EQ(session.start({"--log", log.string(), "-c", "FOO", "-c", "(princ \"open\")"}).exitStatus, 1);
     const std::string time = "20[0-9]{2}-[0-9]{2}-[0-9]{2}T[0-9:]{8}\\.[0-9]{3}[+-][0-9]{4} ";
     const std::string once = time + "Tessel R21, [^\n]*\n" + time + "Command: FOO\n" + time +
-                             "Unknown command \"FOO\"[^\n]*\n" + time + "Command: [(]princ \"open\"[)]\n" + time +
-                             "open\n(" + time + "\"open\"\n)?";
+                             "Unknown command \"FOO\"[^\n]*\n" + time + "Command: [(]princ \"open\"[)]\n" +
+                             time + "open\n(" + time + "\"open\"\n)?";
     EXPECT_THAT(contentOf(log), MatchesRegex(once));
     EXPECT_EQ(std::filesystem::status(log).permissions(), std::filesystem::perms(0600));
     session.start({"--log", log.string(), "-c", "FOO", "-c", "(princ \"open\")"});
