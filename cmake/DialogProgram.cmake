@@ -5,18 +5,12 @@ function(make_dialog_program target name)
   set(app "${CMAKE_CURRENT_BINARY_DIR}/${name}.app")
   set_target_properties(${target} PROPERTIES
     RUNTIME_OUTPUT_DIRECTORY "${app}" OUTPUT_NAME ${name} LINKER_LANGUAGE OBJCXX)
-  foreach(resource modrig/resources/Modrig.xib modrig/resources/ModrigStartupSuit.xib
-                   modrig/resources/en.lproj/Localizable.strings host/ui/resources/en.lproj/FilePanel.strings)
-    set(source "${CMAKE_SOURCE_DIR}/${resource}")
-    string(REGEX REPLACE "^.*/resources/" "" resource "${resource}")
-    set(place "${app}/Resources/${resource}")
-    add_custom_command(
-      OUTPUT "${place}"
-      COMMAND ${CMAKE_COMMAND} -E copy "${source}" "${place}"
-      DEPENDS "${source}"
-      VERBATIM)
-    target_sources(${target} PRIVATE "${place}")
-  endforeach()
+  set(resources "${CMAKE_SOURCE_DIR}/modrig/resources")
+  copy_strings(texts "${CMAKE_SOURCE_DIR}/host/ui/resources" Windows "${app}/Resources")
+  copy_strings(texts "${resources}" Localizable "${app}/Resources")
+  translate_layout(texts "${resources}" Modrig "${app}/Resources")
+  translate_layout(texts "${resources}" ModrigStartupSuit "${app}/Resources")
+  target_sources(${target} PRIVATE ${texts})
   if(NOT APPLE)
     foreach(theme Tessel TesselDark) # the host's look, which is measured and timed as well
       add_custom_command(

@@ -5,6 +5,7 @@
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
 #include "host/applications/ApplicationFiles.h"
+#include "host/applications/KeptOutWords.h"
 #include "host/text/Duration.h"
 #include "host/text/Quotes.h"
 #include "host/text/Table.h"

@@ -1,13 +1,16 @@
 // REGISTRY: looks into the registry and changes it, so that scripts can prepare and inspect what applications
 // keep there.
 #include <filesystem>
+#include <functional>
 #include <optional>
 #include <string>
+#include <vector>
 
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
 #include "host/app/RegistryTransfer.h"
+#include "host/text/Json.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -75,6 +78,36 @@ Result<> get(Parts& parts, const std::wstring& path, const std::wstring& name)
         return notFound(*parts.registry, path, L"has no value \"" + name + L"\"");
     sayLine(parts, *data);
     return {};
+}
+
+Result<> listForPrograms(Parts& parts, const std::wstring& path)
+{
+    LayeredRegistry& registry = *parts.layered;
+    const auto key = registry.find(path);
+    if (key == Registry::kNoKey)
+        return notFound(registry.own(), path, L"does not exist");
+    std::vector<std::wstring> values;
+    for (const auto& value : registry.values(key))
+        values.push_back(
+            json::object({{L"name", json::text(value.name)},
+                          {L"data", json::text(value.data)},
+                          {L"file", value.file.empty() ? L"null" : json::text(toText(value.file))}}));
+    const auto keys = registry.subKeys(key);
+    if (registry.own().readFailed())
+        return storeFailureAt(registry.own(), path, L"cannot be read to its end");
+    return succeed(parts, json::object({{L"key", json::text(path)},
+                                        {L"keys", json::listOfTexts(keys)},
+                                        {L"values", json::list(values)}}));
+}
+
+Result<> getForPrograms(Parts& parts, const std::wstring& path, const std::wstring& name)
+{
+    const auto data = parts.layered->read(path, name);
+    if (!data)
+        return notFound(*parts.registry, path, L"has no value \"" + name + L"\"");
+    return succeed(
+        parts, json::object(
+                   {{L"key", json::text(path)}, {L"name", json::text(name)}, {L"data", json::text(*data)}}));
 }
 
 // A key alone is made; with a name, the value is stored.
@@ -168,10 +201,20 @@ Result<> registryCommand(Parts& parts, const Arguments& arguments)
         return reset(parts);
     return wrongUsage(parts, kCommand);
 }
+Result<> registryListing(Parts& parts, const Arguments& arguments)
+{
+    const std::wstring action = at(arguments, 0);
+    if (equalIgnoringCase(action, L"LIST") && arguments.size() <= 2)
+        return listForPrograms(parts, at(arguments, 1));
+    if (equalIgnoringCase(action, L"GET") && (arguments.size() == 2 || arguments.size() == 3))
+        return getForPrograms(parts, at(arguments, 1), at(arguments, 2));
+    return wrongUsage(parts, kCommand);
+}
 } // namespace
 
 void addRegistryCommands(Parts& parts)
 {
     addBuiltIn(parts, kCommand, registryCommand);
+    parts.commands->addListing(kCommand, std::bind_front(registryListing, std::ref(parts)));
 }
 } // namespace tessel

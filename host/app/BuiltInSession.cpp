@@ -36,7 +36,7 @@ void describeCommand(Parts& parts, const CommandStack::Description& command)
     Table table({});
     if (!command.summary.empty())
         table.addHeading(command.name + L": " + command.summary);
-    for (const auto& line : usageLines(command))
+    for (const auto& line : usageLines(command.name, command.usage))
         table.addHeading(line);
     if (!command.example.empty())
         table.addHeading(L"Example: " + command.example);
@@ -80,9 +80,10 @@ Result<> help(Parts& parts, const CommandStack::Arguments& arguments)
     if (arguments.empty())
         return listCommands(parts);
     const std::wstring& name = arguments.front();
-    if (const auto command = parts.commands->description(name))
+    const auto command = parts.commands->description(name);
+    if (command)
         describeCommand(parts, *command);
-    if (parts.commands->find(name) || describeCommandToCome(parts, name))
+    if (command || describeCommandToCome(parts, name))
         return {};
     const auto shown = parts.help->show(name);
     return shown ? succeed(parts, *shown) : noHelp(parts, name, shown.failure());

@@ -1,22 +1,15 @@
 #include "host/app/BuiltInSupport.h"
 
 #include <functional>
-#include <sstream>
 #include <utility>
 
 #include "host/app/Parts.h"
 #include "host/commands/CommandTexts.h"
 #include "host/platform/HomeFolder.h"
-#include "host/text/DisplayWidth.h"
 #include "host/text/Translation.h"
 
 namespace tessel
 {
-namespace
-{
-constexpr wchar_t kUsageLabel[] = L"Usage: ";
-}
-
 void addBuiltIn(Parts& parts, const std::wstring& name, CommandStack::BuiltIn command)
 {
     const CommandText& text = *findCommandText(name);
@@ -46,23 +39,9 @@ Result<> succeed(Parts& parts, const std::wstring& sentence)
     return {};
 }
 
-std::vector<std::wstring> usageLines(const CommandStack::Description& command)
-{
-    std::vector<std::wstring> lines;
-    std::wstring label = kUsageLabel;
-    std::wistringstream ways(command.usage.empty() ? L"\n" : command.usage);
-    for (std::wstring way; std::getline(ways, way);)
-        lines.push_back(std::exchange(label, std::wstring(displayWidth(kUsageLabel), L' ')) + command.name +
-                        (way.empty() ? L"" : L" " + way));
-    return lines;
-}
-
 Failure wrongUsage(const Parts& parts, const std::wstring& command)
 {
-    std::wstring sentence;
-    for (const auto& line : usageLines(*parts.commands->description(command)))
-        sentence += (sentence.empty() ? L"" : L"\n") + line;
-    return {sentence};
+    return {usageText(command, parts.commands->description(command)->usage)};
 }
 
 std::filesystem::path typedPath(const std::wstring& typed)

@@ -26,9 +26,7 @@ Result<> confirm(Parts& parts, const std::wstring& sentence);
 // Says the sentence that a command was to find out.
 Result<> succeed(Parts& parts, const std::wstring& sentence);
 
-// The ways in which a command is typed, a line each, the first after the label.
-std::vector<std::wstring> usageLines(const CommandStack::Description& command);
-// The same for who has typed it otherwise.
+// How the command is to be typed.
 Failure wrongUsage(const Parts& parts, const std::wstring& command);
 
 // The path that was typed as an argument. A tilde at its beginning stands for a home folder, unless something

@@ -5,7 +5,9 @@
 
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
+#include "host/app/Listings.h"
 #include "host/app/Parts.h"
+#include "host/applications/ShippedRecords.h"
 #include "host/applications/StartSummary.h"
 #include "host/console/Console.h"
 #include "host/console/FolderContent.h"
@@ -175,6 +177,7 @@ Result<> Host::makeParts()
     mInterruptibleRegistry = &*mParts->registry;
     mMarker = &*mParts->marker;
     addCommands();
+    addShippedRecords();
     return {};
 }
 
@@ -237,6 +240,17 @@ bool Host::tellWhoElseWrites(const std::wstring& kind, const std::filesystem::pa
     return false;
 }
 
+// What waits for its commands is listed with them from the beginning.
+void Host::addShippedRecords()
+{
+    for (const auto& shipped : readShippedRecords(mParts->folders.plugIns, kProductRegistryRoot))
+    {
+        mParts->records->add(shipped.record);
+        for (const auto& command : shipped.commands)
+            mParts->commands->announce(command);
+    }
+}
+
 void Host::addCommands()
 {
     addSessionCommands(*mParts, {[this] { mEndRequest.make(); },
@@ -248,6 +262,7 @@ void Host::addCommands()
     addKeptOutCommands(*mParts);
     addSettingCommands(*mParts);
     addRegistryCommands(*mParts);
+    addListings(*mParts);
 }
 
 bool Host::run(const std::wstring& input)

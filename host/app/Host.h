@@ -101,6 +101,7 @@ private:
     void explainLoad(const LoadOutcome& outcome);
     bool runLisp(const std::wstring& input, const Interruption::Wish& wish);
     OutputSurroundings withPagerForPersons(OutputSurroundings surroundings);
+    void addShippedRecords();
     void addCommands();
     bool finishLine();
 

@@ -40,6 +40,7 @@
 #include "host/registry/SystemVariables.h"
 #include "host/resources/ResourceModules.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Languages.h"
 #include "host/text/Running.h"
 #include "host/text/Unicode.h"
 #include "host/text/Version.h"
@@ -95,7 +96,8 @@ struct Parts
     Owned<KeptOutService> keptOutService{keptOut, admission, *commandLine};
     Owned<CallingApplication> callingApplication{*marker};
     Owned<CommandStack> commands{*callingApplication};
-    Owned<ResourceModules> resources{toWide(folders.resources.string()), *callingApplication};
+    Owned<ResourceModules> resources{toWide(folders.resources.string()), *callingApplication,
+                                     personsLanguages()};
     Owned<MessageBox> messageBox{*commandLine, quietWhenSafe(windowBoxes(folders.binaries), admission)};
     LoadOutcomes loadOutcomes;
     Owned<DynamicLinker> linker{*commandLine, *callingApplication, *commands,
@@ -117,7 +119,7 @@ struct Parts
                                   foundations.commandLine.warn(sentence);
                               }};
     Owned<HostInformation> information{toWide(foundations.profileFolder.string()), *remote, *commandLine};
-    Owned<Help> help{folders.resources / "help", openInBrowser};
+    Owned<Help> help{folders.resources / "help", openInBrowser, personsLanguages()};
     // The variable is read here, before any application is loaded, and holds for the session.
     Owned<LispInterpreter> lisp{
         LispInterpreter::Options{.removingTsLisp = variables->number(kRemovingTsLisp) != 0,

@@ -1,5 +1,6 @@
 #include "host/app/Program.h"
 
+#include <algorithm>
 #include <clocale>
 #include <csignal>
 #include <cstdio>
@@ -71,6 +72,14 @@ void takeStandardDescriptors()
 void greet(CommandLine& commandLine)
 {
     commandLine.confirm(toWide(kProgramLine) + L". Type HELP for the list of commands, QUIT to leave.");
+}
+
+// Nothing but documents is to be printed then.
+bool answersPrograms(const Options& options)
+{
+    return !options.commands.empty() && options.script.empty() &&
+           std::ranges::all_of(options.commands,
+                               [](const auto& command) { return isForPrograms(toWide(command)); });
 }
 
 // Each that fails has been told, and keeps the others from nothing.
@@ -167,7 +176,7 @@ int runHost(Options options, StandardOutput& output, SessionLog* log)
                surroundingsFor(options, errors, log)});
     const InterruptKey interruptKey(host); // applications that load at start may run away too
     const EndSignals endSignals(host);
-    if (!options.modrig)
+    if (!options.modrig && !answersPrograms(options))
         greet(host.commandLine());
     if (!host.start())
         return kSomethingFailed;

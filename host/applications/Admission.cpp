@@ -5,8 +5,10 @@
 
 #include "host/applications/Bisecting.h"
 #include "host/applications/KeptOut.h"
+#include "host/applications/KeptOutWords.h"
 #include "host/platform/RealPath.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -39,12 +41,12 @@ Result<> Admission::check(const std::wstring& path)
         return refuseInSafety();
     const KeptOutApplication* known = mKeptOut.find(toUtf8(path));
     if (known && keepsOut(*known, reason))
-        return Failure{L"it is " + reasonOf(*known),
+        return Failure{clauseOfReason(*known),
                        isOfStart(reason) && mKeptOut.wasTold(*known) ? kAlreadyTold : kKeptOut};
     if (isOfStart(reason))
         mAskedFor.push_back(toUtf8(path));
     if (isOfStart(reason) && mBisecting.keepsOut(mAskedFor.back()))
-        return Failure{L"it is kept out at this start by BISECT", kAlreadyTold};
+        return Failure{translated(L"it is kept out at this start by BISECT"), kAlreadyTold};
     sayWhenOnTrial(toUtf8(path));
     return {};
 }
@@ -52,10 +54,10 @@ Result<> Admission::check(const std::wstring& path)
 // One sentence for all: each of them would say the same.
 Failure Admission::refuseInSafety()
 {
-    const std::wstring reason = L"Tessel was started with --safe and loads nothing by itself";
     if (!std::exchange(mSafetyTold, true))
-        mCommandLine.say(reason + L": APPS lists what would have been loaded now, LOAD loads it by hand.");
-    return {reason, kAlreadyTold};
+        mCommandLine.say(translated(L"Tessel was started with --safe and loads nothing by itself: APPS lists "
+                                    L"what would have been loaded now, LOAD loads it by hand."));
+    return {translated(L"Tessel was started with --safe and loads nothing by itself"), kAlreadyTold};
 }
 
 void Admission::sayWhenOnTrial(const std::string& path)
@@ -84,14 +86,16 @@ std::wstring Admission::whyKeptOut(const std::wstring& path) const
 {
     const KeptOutApplication* known = mKeptOut.find(toUtf8(path));
     if (known && known->isOut())
-        return reasonOf(*known);
-    return mBisecting.keepsOut(toUtf8(path)) ? L"kept out at this start by BISECT" : L"";
+        return sentenceOfReason(*known);
+    return mBisecting.keepsOut(toUtf8(path))
+               ? translated(L"This application is kept out at this start by BISECT.")
+               : L"";
 }
 
 std::wstring Admission::whyOut(const std::string& path) const
 {
     const KeptOutApplication* known = mBisecting.keepsOut(path) ? nullptr : mKeptOut.find(path);
-    return known && known->isOut() ? L"is " + reasonOf(*known) : L"";
+    return known && known->isOut() ? predicateOfReason(*known) : L"";
 }
 
 std::function<std::wstring(const std::string&)> Admission::whyNotAsPlanned() const
@@ -102,11 +106,11 @@ std::function<std::wstring(const std::string&)> Admission::whyNotAsPlanned() con
     return [this, letIn = std::move(letIn)](const std::string& path) -> std::wstring
     {
         if (mBisecting.keepsOut(path))
-            return mLoadedAllTheSame.contains(path) ? L"was loaded all the same" : L"";
+            return mLoadedAllTheSame.contains(path) ? translated(L"was loaded all the same") : L"";
         if (letIn.contains(path))
             return {};
         const std::wstring reason = whyOut(path);
-        return reason.empty() ? L"was kept out of this start or not asked for" : reason;
+        return reason.empty() ? translated(L"was kept out of this start or not asked for") : reason;
     };
 }
 

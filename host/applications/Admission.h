@@ -38,7 +38,7 @@ public:
     // Asked with a full path before its file is opened. Why not is the end of a sentence, without its stop,
     // and one of the codes above. Says when it is the trial of an application that has ended the host.
     Result<> check(const std::wstring& path);
-    // Why the application is kept out at starts, as a part of a sentence; empty for one that is not.
+    // Why the application is kept out at starts, a sentence; empty for one that is not.
     std::wstring whyKeptOut(const std::wstring& path) const;
     // Why what BISECT lets in is kept out all the same, the end of a sentence: "is kept out ...". Empty for
     // what BISECT itself keeps out.

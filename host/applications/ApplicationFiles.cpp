@@ -7,6 +7,7 @@
 #include "host/applications/ImageCheck.h"
 #include "host/platform/Bundle.h"
 #include "host/platform/RegularFile.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -47,17 +48,18 @@ Result<> checkIsApplication(const std::filesystem::path& path)
 {
     std::error_code failed;
     const auto status = std::filesystem::status(path, failed);
-    const std::wstring name = L"\"" + toWide(path.native()) + L"\"";
     if (!std::filesystem::exists(status))
-        return Failure{L"There is no application " + name + L" that could be kept out."};
+        return Failure{translated(L"There is no application \"{}\" that could be kept out.", path)};
     const bool isFolder = std::filesystem::is_directory(status);
     if (isBundlePath(path.native()))
-        return isFolder ? Result<>() : Failure{name + L" is a file and no bundle."};
+        return isFolder ? Result<>() : Failure{translated(L"\"{}\" is a file and no bundle.", path)};
     if (isFolder)
-        return Failure{name + L" is a folder and no application."};
+        return Failure{translated(L"\"{}\" is a folder and no application.", path)};
     if (isCalledAsModule(path) || isCalledAsLisp(path) || isSharedLibrary(path))
         return {};
-    return Failure{name + L" is no application: Tessel loads bundles, shared libraries (.zmb, .omp) and Lisp "
-                          L"(.lsp, .qbc)."};
+    return Failure{
+        translated(L"\"{}\" is no application: Tessel loads bundles, shared libraries (.zmb, .omp) "
+                   L"and Lisp (.lsp, .qbc).",
+                   path)};
 }
 } // namespace tessel

@@ -2,6 +2,7 @@
 
 #include <tessel/tsappinfo.h>
 
+#include <algorithm>
 #include <charconv>
 
 #include "host/commands/CallingApplication.h"
@@ -24,8 +25,9 @@ bool isRecordName(const std::wstring& name)
 {
     return !name.empty() && name.find(L'\\') == std::wstring::npos;
 }
+} // namespace
 
-std::optional<unsigned> parseReasons(const std::wstring& text)
+std::optional<unsigned> parseLoadReasons(const std::wstring& text)
 {
     const std::string digits = toUtf8(text);
     unsigned reasons = 0;
@@ -33,7 +35,6 @@ std::optional<unsigned> parseReasons(const std::wstring& text)
     return error == std::errc() && end == digits.data() + digits.size() ? std::optional(reasons)
                                                                         : std::nullopt;
 }
-} // namespace
 
 ApplicationRecords::ApplicationRecords(LayeredRegistry& registry, const CommandStack& commands,
                                        const CallingApplication& calls, const std::wstring& productRoot)
@@ -55,17 +56,23 @@ std::vector<ApplicationRecord> ApplicationRecords::all() const
 {
     std::vector<ApplicationRecord> records;
     const Registry::Key key = mRegistry.find(mKey);
-    if (key == Registry::kNoKey)
-        return records;
-    for (const std::wstring& name : mRegistry.subKeys(key))
-    {
-        auto record = read(name);
-        if (!record)
-            continue;
-        readCommands(*record);
-        records.push_back(*std::move(record));
-    }
+    if (key != Registry::kNoKey)
+        for (const std::wstring& name : mRegistry.subKeys(key))
+            if (auto record = read(name))
+            {
+                readCommands(*record);
+                records.push_back(*std::move(record));
+            }
+    for (const ApplicationRecord& added : mAdded)
+        if (std::ranges::none_of(records, [&](const auto& stored)
+                                 { return equalIgnoringCase(stored.name, added.name); }))
+            records.push_back(added);
     return records;
+}
+
+void ApplicationRecords::add(const ApplicationRecord& record)
+{
+    mAdded.push_back(record);
 }
 
 // A record without a module or readable load reasons is none: somebody else's key, or half of one.
@@ -73,7 +80,7 @@ std::optional<ApplicationRecord> ApplicationRecords::read(const std::wstring& na
 {
     const std::wstring key = keyOf(name);
     const auto module = mRegistry.read(key, kModule);
-    const auto reasons = parseReasons(mRegistry.read(key, kLoadReasons).value_or(L""));
+    const auto reasons = parseLoadReasons(mRegistry.read(key, kLoadReasons).value_or(L""));
     if (!module || !reasons)
         return std::nullopt;
     ApplicationRecord record;

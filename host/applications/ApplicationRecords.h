@@ -24,13 +24,19 @@ struct ApplicationRecord
     std::vector<std::pair<std::wstring, std::wstring>> commands; // global and local names
 };
 
+// The sum of bits that a text stands for.
+std::optional<unsigned> parseLoadReasons(const std::wstring& text);
+
 class ApplicationRecords
 {
 public:
     ApplicationRecords(LayeredRegistry& registry, const CommandStack& commands,
                        const CallingApplication& calls, const std::wstring& productRoot);
 
-    // Every record, in the order in which they were made.
+    // A record that counts in this session as long as none of its name is stored.
+    void add(const ApplicationRecord& record);
+
+    // Every record, in the order in which they were made; what was added comes last.
     std::vector<ApplicationRecord> all() const;
 
     // The record of that name, without its commands.
@@ -54,5 +60,6 @@ private:
     const CommandStack& mCommands;
     const CallingApplication& mCalls;
     std::wstring mKey;
+    std::vector<ApplicationRecord> mAdded;
 };
 } // namespace tessel

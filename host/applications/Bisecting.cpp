@@ -4,6 +4,8 @@
 
 #include "host/platform/RealPath.h"
 #include "host/platform/SmallFile.h"
+#include "host/platform/SystemFailure.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -15,14 +17,17 @@ constexpr std::string_view kFirstLine = "Tessel looks for the culprit, 1";
 constexpr char kGood = 'g';
 constexpr char kBad = 'b';
 
-std::wstring counted(std::size_t count, const wchar_t* one, const wchar_t* many)
-{
-    return std::to_wstring(count) + (count == 1 ? one : many);
-}
-
+// The end of a sentence.
 std::wstring startsLeft(const Bisection& bisection)
 {
-    return L"at most " + counted(bisection.startsLeft(), L" start is", L" starts are") + L" left";
+    return translatedByCount(bisection.startsLeft(), L"at most {} start is left",
+                             L"at most {} starts are left");
+}
+
+std::wstring stillSuspected(const Bisection& bisection)
+{
+    return translatedByCount(bisection.stillSuspected(), L"{} application is still suspected; {}.",
+                             L"{} applications are still suspected; {}.", startsLeft(bisection));
 }
 
 bool areAnswers(std::string_view text)
@@ -50,8 +55,8 @@ Result<std::optional<Bisecting::Search>> Bisecting::read() const
         return std::optional<Search>();
     const auto lines = linesOf(**content);
     if (lines.size() < 3 || lines[0] != kFirstLine || !areAnswers(lines[1]))
-        return Failure{L"The file " + toWide(mFile.string()) +
-                       L" is damaged; BISECT STOP ends the search that it is about."};
+        return Failure{
+            translated(L"The file {} is damaged; BISECT STOP ends the search that it is about.", mFile)};
     Search search;
     for (const char answer : lines[1])
         search.answers.push_back(answer == kGood);
@@ -75,8 +80,8 @@ Result<> Bisecting::forget() const
     std::error_code failed;
     std::filesystem::remove(mFile, failed);
     if (failed)
-        return Failure{L"The file " + toWide(mFile.string()) + L" cannot be removed: " +
-                       toWide(failed.message()) + L"."};
+        return Failure{
+            translated(L"The file {} cannot be removed: {}.", mFile, systemFailure(failed.value()).sentence)};
     return {};
 }
 
@@ -107,13 +112,16 @@ std::vector<std::wstring> Bisecting::sentencesAtStart(const WhyNotAsPlanned& why
     std::vector<std::wstring> lines;
     for (const std::string& suspect : keptOutNow())
         lines.push_back(L"  " + toWide(suspect));
-    lines.insert(lines.begin(), L"BISECT keeps " + std::to_wstring(lines.size()) + L" of " +
-                                    counted(mApplied->suspects.size(), L" suspect", L" suspects") +
-                                    L" out at this start:");
+    const std::size_t keptOut = lines.size();
+    lines.insert(lines.begin(),
+                 translatedByCount(mApplied->suspects.size(),
+                                   L"BISECT keeps {2} of {1} suspect out at this start:",
+                                   L"BISECT keeps {2} of {1} suspects out at this start:", keptOut));
     const auto fair = checkWentAsPlanned(whyNotAsPlanned);
-    lines.push_back(fair ? L"Type BISECT GOOD when the trouble is gone, BISECT BAD when it is there; " +
-                               startsLeft(mApplied->bisection()) + L"."
-                         : fair.sentence());
+    lines.push_back(
+        fair ? translated(L"Type BISECT GOOD when the trouble is gone, BISECT BAD when it is there; {}.",
+                          startsLeft(mApplied->bisection()))
+             : fair.sentence());
     return lines;
 }
 
@@ -121,18 +129,22 @@ Result<> Bisecting::checkWentAsPlanned(const WhyNotAsPlanned& whyNotAsPlanned) c
 {
     for (const std::string& suspect : mApplied->suspects)
         if (const std::wstring why = whyNotAsPlanned(suspect); !why.empty())
-            return Failure{L"This session cannot be judged: \"" + toWide(suspect) + L"\", which was to " +
-                           (keepsOut(suspect) ? L"stay out, " + why + L". Start Tessel again"
-                                              : L"be loaded, " + why + L". ENABLE lets in what is kept out") +
-                           L"; BISECT STOP ends the search."};
+            return Failure{
+                keepsOut(suspect)
+                    ? translated(L"This session cannot be judged: \"{}\", which was to stay out, {}. Start "
+                                 L"Tessel again; BISECT STOP ends the search.",
+                                 toWide(suspect), why)
+                    : translated(L"This session cannot be judged: \"{}\", which was to be loaded, {}. ENABLE "
+                                 L"lets in what is kept out; BISECT STOP ends the search.",
+                                 toWide(suspect), why)};
     return {};
 }
 
 Result<std::wstring> Bisecting::begin(const std::vector<std::string>& suspects)
 {
     if (suspects.empty())
-        return Failure{
-            L"There is nothing to search among: no application was loaded by itself in this session."};
+        return Failure{translated(
+            L"There is nothing to search among: no application was loaded by itself in this session.")};
     Search search;
     std::ranges::transform(suspects, std::back_inserter(search.suspects),
                            [](const std::string& path) { return realPath(path).native(); });
@@ -141,8 +153,9 @@ Result<std::wstring> Bisecting::begin(const std::vector<std::string>& suspects)
     mReadAtStart = {};
     mApplied.reset();
     mBegunHere = true;
-    return L"BISECT searches among " + counted(suspects.size(), L" application", L" applications") + L"; " +
-           startsLeft(search.bisection()) + L". Start Tessel again.";
+    return translatedByCount(
+        suspects.size(), L"BISECT searches among {} application; {}. Start Tessel again.",
+        L"BISECT searches among {} applications; {}. Start Tessel again.", startsLeft(search.bisection()));
 }
 
 Result<Bisecting::Search> Bisecting::current() const
@@ -151,16 +164,39 @@ Result<Bisecting::Search> Bisecting::current() const
     if (!search)
         return search.failure();
     if (!*search)
-        return Failure{L"No search is going on; BISECT START begins one."};
+        return Failure{translated(L"No search is going on; BISECT START begins one.")};
     return **std::move(search);
 }
 
 std::wstring Bisecting::whyNotOfThisSession() const
 {
     if (!mApplies)
-        return L"it was started with --safe, and no suspect is tried then.";
-    return mBegunHere ? L"the search has begun in it, and nothing was kept out of its start."
-                      : L"the search has gone on since it was started.";
+        return translated(L"it was started with --safe, and no suspect is tried then");
+    return mBegunHere ? translated(L"the search has begun in it, and nothing was kept out of its start")
+                      : translated(L"the search has gone on since it was started");
+}
+
+std::wstring Bisecting::verdictIn(const Search& search)
+{
+    const Bisection bisection = search.bisection();
+    switch (bisection.verdict())
+    {
+    case Bisection::Verdict::kFound:
+        return translated(L"BISECT has found it: \"{}\" makes the trouble. DISABLE keeps it out at starts.",
+                          toWide(search.suspects[bisection.culprit()]));
+    case Bisection::Verdict::kNone:
+        return search.suspects.size() == 1
+                   ? translated(L"BISECT says that it is none of them: the trouble is there when the only "
+                                L"suspect is kept out.")
+                   : translated(L"BISECT says that it is none of them: the trouble is there when all of the "
+                                L"{} suspects are kept out.",
+                                search.suspects.size());
+    case Bisection::Verdict::kTogether:
+        return translated(L"BISECT says that none of them does it alone: several are needed together.");
+    case Bisection::Verdict::kOpen:
+        break;
+    }
+    return stillSuspected(bisection) + L' ' + translated(L"Start Tessel again.");
 }
 
 Result<std::wstring> Bisecting::answer(bool wasGood, const WhyNotAsPlanned& whyNotAsPlanned)
@@ -169,33 +205,15 @@ Result<std::wstring> Bisecting::answer(bool wasGood, const WhyNotAsPlanned& whyN
     if (!search)
         return search.failure();
     if (mApplied != *search)
-        return Failure{L"This session cannot be judged: " + whyNotOfThisSession() +
-                       L" Start Tessel again, without --safe."};
+        return Failure{translated(L"This session cannot be judged: {}. Start Tessel again, without --safe.",
+                                  whyNotOfThisSession())};
     if (auto fair = checkWentAsPlanned(whyNotAsPlanned); !fair)
         return fair.failure();
     search->answers.push_back(wasGood);
-    const Bisection bisection = search->bisection();
-    const bool isOpen = bisection.verdict() == Bisection::Verdict::kOpen;
+    const bool isOpen = search->bisection().verdict() == Bisection::Verdict::kOpen;
     if (auto stored = isOpen ? store(*search) : forget(); !stored)
         return stored.failure();
-    switch (bisection.verdict())
-    {
-    case Bisection::Verdict::kFound:
-        return L"BISECT has found it: \"" + toWide(search->suspects[bisection.culprit()]) +
-               L"\" makes the trouble. DISABLE keeps it out at starts.";
-    case Bisection::Verdict::kNone:
-        return L"BISECT says that it is none of them: the trouble is there when " +
-               (search->suspects.size() == 1
-                    ? std::wstring(L"the only suspect is")
-                    : L"all of the " + std::to_wstring(search->suspects.size()) + L" suspects are") +
-               L" kept out.";
-    case Bisection::Verdict::kTogether:
-        return std::wstring(L"BISECT says that none of them does it alone: several are needed together.");
-    case Bisection::Verdict::kOpen:
-        break;
-    }
-    return counted(bisection.stillSuspected(), L" application is", L" applications are") +
-           L" still suspected; " + startsLeft(bisection) + L". Start Tessel again.";
+    return verdictIn(*search);
 }
 
 Result<std::wstring> Bisecting::stop()
@@ -203,7 +221,7 @@ Result<std::wstring> Bisecting::stop()
     if (auto forgotten = forget(); !forgotten)
         return forgotten.failure();
     mApplied.reset();
-    return std::wstring(L"BISECT keeps nothing out any more.");
+    return translated(L"BISECT keeps nothing out any more.");
 }
 
 Result<std::wstring> Bisecting::tell() const
@@ -211,7 +229,6 @@ Result<std::wstring> Bisecting::tell() const
     const auto search = current();
     if (!search)
         return search.failure();
-    return counted(search->bisection().stillSuspected(), L" application is", L" applications are") +
-           L" still suspected; " + startsLeft(search->bisection()) + L".";
+    return stillSuspected(search->bisection());
 }
 } // namespace tessel

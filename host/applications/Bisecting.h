@@ -56,6 +56,7 @@ private:
     Result<> forget() const;
     Result<Search> current() const;
     std::wstring whyNotOfThisSession() const;
+    static std::wstring verdictIn(const Search& search);
     Result<> checkWentAsPlanned(const WhyNotAsPlanned& whyNotAsPlanned) const;
 
     std::filesystem::path mFile;

@@ -11,6 +11,7 @@
 #include "host/applications/ApplicationRecords.h"
 #include "host/applications/DynamicLinker.h"
 #include "host/platform/RealPath.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -89,8 +90,8 @@ std::wstring DemandLoading::takeAlong(ApplicationRecord record, const std::wstri
     const std::wstring before = std::exchange(record.module, plugIn);
     if (const auto written = mRecords.write(record); !written)
         return written.sentence();
-    return gone ? L"The application \"" + record.name + L"\" is " + plugIn + L" now; " + before +
-                      L" is not there any more."
+    return gone ? translated(L"The application \"{}\" is {} now; {} is not there any more.", record.name,
+                             plugIn, before)
                 : std::wstring();
 }
 

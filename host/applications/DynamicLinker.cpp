@@ -15,6 +15,7 @@
 #include "host/messages/MessageBox.h"
 #include "host/platform/RealPath.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 bool TsRxDynamicLinker::isKindOf(const wchar_t* className) const
@@ -65,16 +66,12 @@ Result<> checkLoadable(const RegularFile& program)
     return checkSdkVersion(sdkVersionIn(program.size(), readAt));
 }
 
-std::wstring sentence(const std::wstring& path, const wchar_t* whatHappened, const std::wstring& why)
-{
-    return L"The application \"" + path + L"\" " + whatHappened + why + L".";
-}
-
 // What is wrong with the program in a bundle.
 Failure ofProgram(const ModuleFile& file, const Result<>& loadable)
 {
-    return {L"its program \"" + toWide(file.program) + L"\" cannot be used, since " + loadable.sentence(),
-            loadable.code()};
+    return {
+        translated(L"its program \"{}\" cannot be used, since {}", toWide(file.program), loadable.sentence()),
+        loadable.code()};
 }
 
 // What a person is told of an attempt.
@@ -84,7 +81,8 @@ Result<> whole(const std::wstring& path, const Result<>& attempted)
         return attempted;
     if (attempted.code() == Admission::kAlreadyTold)
         return Failure{{}, attempted.code()};
-    return Failure{sentence(path, L"is not loaded: ", attempted.sentence()), attempted.code()};
+    return Failure{translated(L"The application \"{}\" is not loaded: {}.", path, attempted.sentence()),
+                   attempted.code()};
 }
 
 // The program at a path, or a file that is not open.
@@ -146,7 +144,7 @@ Result<> DynamicLinker::attempt(const std::wstring& path, bool resolveNow)
 Result<> DynamicLinker::loadAdmitted(const std::wstring& path, bool resolveNow)
 {
     if (mEnding)
-        return Failure{L"the host is ending"};
+        return Failure{translated(L"the host is ending")};
     if (const Module* known = mModules.withPath(path))
         return answerForKnown(*known);
     if (auto admitted = mAdmission.check(path); !admitted)
@@ -169,9 +167,8 @@ Result<> DynamicLinker::loadNew(const std::wstring& path, bool resolveNow)
     if (auto loadable = checkLoadable(program); !loadable)
         return file->program == toUtf8(path) ? loadable : ofProgram(*file, loadable);
     if (mHalfMapped.contains(program.identity()))
-        return Failure{
-            L"it threw an exception before while it was being mapped, and what is in memory of it since "
-            L"cannot be used"};
+        return Failure{translated(L"it threw an exception before while it was being mapped, and what is in "
+                                  L"memory of it since cannot be used")};
     auto opened = open(*file, program, resolveNow);
     if (opened.code() == ModuleLibrary::kThrew)
         mHalfMapped.insert(program.identity());
@@ -196,9 +193,10 @@ Result<std::unique_ptr<Module>> DynamicLinker::open(const ModuleFile& file, cons
     if (!library)
         return library.failure();
     if (!(*library)->isFrom(program))
-        return Failure{(*library)->close()
-                           ? L"its file was replaced while it was being loaded"
-                           : L"the code of another file is in memory in its place, until the session ends"};
+        return Failure{
+            (*library)->close()
+                ? translated(L"its file was replaced while it was being loaded")
+                : translated(L"the code of another file is in memory in its place, until the session ends")};
     auto module = std::make_unique<Module>();
     module->library = *std::move(library);
     module->entryPoint = module->library->entryPoint();
@@ -209,13 +207,13 @@ Result<> DynamicLinker::answerForKnown(const Module& module) const
 {
     if (module.isLoaded)
         return {};
-    return Failure{L"its load message is still running, and it has not registered itself"};
+    return Failure{translated(L"its load message is still running, and it has not registered itself")};
 }
 
 Result<> DynamicLinker::start(Module& module)
 {
     auto started = module.entryPoint ? send(module, TSRX_MSG_LOAD)
-                                     : Failure{L"it has no entry point \"tsrxEntryPoint\""};
+                                     : Failure{translated(L"it has no entry point \"tsrxEntryPoint\"")};
     if (started)
         mModules.countAsLoaded(module);
     else
@@ -232,9 +230,9 @@ Result<> DynamicLinker::send(Module& module, unsigned message) const
     const RunningMarker::ReasonScope forIt(mCalls.marker(), RunningMarker::Reason::kForAnother);
     int answer = TSRX_RET_OK;
     if (const auto returned = catchAnything([&] { answer = module.entryPoint(message, &module); }); !returned)
-        return Failure{L"its entry point threw " + returned.sentence()};
+        return Failure{translated(L"its entry point threw {}", returned.sentence())};
     if (answer != TSRX_RET_OK)
-        return Failure{L"its entry point answered " + std::to_wstring(answer)};
+        return Failure{translated(L"its entry point answered {}", answer)};
     return {};
 }
 
@@ -243,10 +241,12 @@ Result<std::wstring> DynamicLinker::unload(const std::wstring& path)
     const std::wstring fullPath = fullPathOf(path.c_str());
     Module* module = find(fullPath.c_str());
     if (const auto gone = sendOff(module); !gone)
-        return Failure{sentence(fullPath, L"is not unloaded: ", gone.sentence())};
+        return Failure{translated(L"The application \"{}\" is not unloaded: {}.", fullPath, gone.sentence())};
     if (takeOut(*module))
         return std::wstring();
-    return sentence(fullPath, L"is out of service; ", L"its code stays in memory until the session ends");
+    return translated(L"The application \"{}\" is out of service; its code stays in memory until the session "
+                      L"ends.",
+                      fullPath);
 }
 
 bool DynamicLinker::unloadModule(const wchar_t* path, bool sayWhyNot)
@@ -268,11 +268,11 @@ Result<> DynamicLinker::sendOff(Module* module)
 Result<> DynamicLinker::checkFreeToGo(const Module* module) const
 {
     if (!module || !module->isLoaded)
-        return Failure{L"it is not loaded"};
+        return Failure{translated(L"it is not loaded")};
     if (module->locked)
-        return Failure{L"it is locked"};
+        return Failure{translated(L"it is locked")};
     if (mCalls.isAtWork(module->path))
-        return Failure{L"it is at work"};
+        return Failure{translated(L"it is at work")};
     return {};
 }
 
@@ -342,7 +342,8 @@ void DynamicLinker::unloadAll()
     {
         Module& last = *mModules.loaded().back();
         if (const auto ended = send(last, TSRX_MSG_UNLOAD); !ended)
-            mCommandLine.say(sentence(last.path, L"did not end as it should: ", ended.sentence()));
+            mCommandLine.say(translated(L"The application \"{}\" did not end as it should: {}.", last.path,
+                                        ended.sentence()));
         mCommands.removeCommandsOf(last.path);
         mModules.remove(last);
     }

@@ -8,9 +8,10 @@
 #include <string_view>
 
 #include "host/applications/ApplicationFiles.h"
+#include "host/applications/KeptOutWords.h"
 #include "host/platform/RealPath.h"
 #include "host/platform/SmallFile.h"
-#include "host/text/DayAndTime.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -121,18 +122,9 @@ std::optional<KeptOutApplication> parseLine(std::string_view line)
 
 Failure damaged(const std::filesystem::path& file)
 {
-    return {
-        L"The file " + toWide(file.string()) +
-        L" is damaged; without it Tessel does not know which applications to keep out. Remove it to begin "
-        L"with none."};
-}
-
-std::wstring whatHappened(const KeptOutApplication& application)
-{
-    const DeedWords words = wordsFor(application.deed);
-    const std::string deed = std::string(words.before) + application.detail + std::string(words.after);
-    return L"ended Tessel on " + toWide(dayAndTime(application.since)) + L" " + toWide(deed) + L" (" +
-           toWide(wordsFor(application.reason)) + L"): " + toWide(wordsForEnding(application.ending));
+    return {translated(L"The file {} is damaged; without it Tessel does not know which applications to keep "
+                       L"out. Remove it to begin with none.",
+                       file)};
 }
 
 // A file that is gone counts as unchanged: there is no new version of it to try.
@@ -202,7 +194,7 @@ Result<KeptOut::Applications> KeptOut::read() const
 {
     const auto content = readSmallFile(mFile);
     if (!content)
-        return Failure{content.sentence() + L" Nothing is kept out in this session."};
+        return Failure{content.sentence() + L' ' + translated(L"Nothing is kept out in this session.")};
     Applications applications;
     if (!*content)
         return applications;
@@ -235,8 +227,9 @@ Result<> KeptOut::change(const std::function<void(Applications&)>& work)
     const auto after = serialized(mApplications);
     if (before == after)
         return {};
-    return locked.held() ? replaceSmallFile(mFile, after)
-                         : Failure{L"What is kept out cannot be stored: " + locked.held().sentence() + L"."};
+    return locked.held()
+               ? replaceSmallFile(mFile, after)
+               : Failure{translated(L"What is kept out cannot be stored: {}.", locked.held().sentence())};
 }
 
 KeptOut::Start KeptOut::begin(const std::vector<RunningMarker::Leftover>& leftovers, bool givesTrials)
@@ -276,8 +269,7 @@ std::optional<std::wstring> KeptOut::takeTrialSentence(const std::string& path)
     const KeptOutApplication* known = find(path);
     if (!known || known->stage != Stage::kOnTrial || !mTrialsTold.insert(known->path).second)
         return std::nullopt;
-    return L"The application \"" + toWide(known->path) + L"\" is tried once more: it " +
-           whatHappened(*known) + L".";
+    return isTriedOnceMore(*known);
 }
 
 bool KeptOut::wasTold(const KeptOutApplication& application) const
@@ -297,16 +289,14 @@ std::wstring KeptOut::judge(const RunningMarker::Leftover& leftover, std::size_t
     guilty.reason = leftover.work.reason;
     guilty.ending = leftover.ending;
     guilty.detail = leftover.work.detail;
-    const std::wstring sentence =
-        L"The application \"" + toWide(guilty.path) + L"\" " + whatHappened(guilty) + L". " +
-        (sessions > 1 ? L"It has ended " + std::to_wstring(sessions) + L" sessions. " : std::wstring());
+    const std::wstring done = whatItDid(guilty, sessions) + L' ';
     const auto known = findIn(applications, guilty.path);
     // A person's wish stands as it was said.
     if (known != applications.end() && known->stage == Stage::kByPerson)
-        return sentence + L"It stays kept out at starts, until you let it in (ENABLE).";
+        return done + translated(L"It stays kept out at starts, until you let it in (ENABLE).");
     const auto facts = factsOf(guilty.path);
     if (facts && facts->statusTime / kNanoseconds > guilty.since)
-        return sentence + L"Its file is another one by now, and is tried.";
+        return done + translated(L"Its file is another one by now, and is tried.");
     guilty.facts = facts.value_or(FileFacts());
     // One that has not been tried since still gets its trial.
     if (known == applications.end() || known->stage == Stage::kThisTime)
@@ -314,13 +304,14 @@ std::wstring KeptOut::judge(const RunningMarker::Leftover& leftover, std::size_t
         if (known != applications.end())
             applications.erase(known);
         applications.push_back(guilty);
-        return sentence + L"It is not loaded by itself at this start; the next one lets it in once more.";
+        return done +
+               translated(L"It is not loaded by itself at this start; the next one lets it in once more.");
     }
     guilty.hash = known->hash;
     guilty.stage = Stage::kForGood;
     *known = guilty;
-    return sentence + L"It is not loaded by itself any more, until you load it by hand or let it in "
-                      L"(ENABLE), or its file changes.";
+    return done + translated(L"It is not loaded by itself any more, until you load it by hand or let it in "
+                             L"(ENABLE), or its file changes.");
 }
 
 const KeptOutApplication* KeptOut::find(const std::string& path) const
@@ -334,7 +325,7 @@ const KeptOutApplication* KeptOut::find(const std::string& path) const
 Result<> KeptOut::keepOut(const std::string& path)
 {
     if (path.empty())
-        return Failure{L"An application without a path cannot be kept out."};
+        return Failure{translated(L"An application without a path cannot be kept out.")};
     if (auto checked = checkIsApplication(path); !checked)
         return checked;
     return change(
@@ -363,7 +354,7 @@ Result<> KeptOut::letIn(const std::string& path)
                 applications.erase(known);
         });
     if (changed && !found)
-        return Failure{L"The application \"" + toWide(path) + L"\" is not kept out."};
+        return Failure{translated(L"The application \"{}\" is not kept out.", toWide(path))};
     return changed;
 }
 
@@ -393,12 +384,5 @@ void KeptOut::noteGoodEnd()
                                      std::ranges::find(mTried, application.path) != mTried.end();
                           });
         }));
-}
-
-std::wstring reasonOf(const KeptOutApplication& application)
-{
-    if (application.stage == Stage::kByPerson)
-        return L"kept out at starts by DISABLE since " + toWide(dayAndTime(application.since));
-    return L"kept out because it " + whatHappened(application);
 }
 } // namespace tessel

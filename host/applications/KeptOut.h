@@ -105,7 +105,4 @@ private:
     std::vector<std::string> mTried; // of those whose trial this session is
     std::set<std::string> mTrialsTold;
 };
-
-// Why it is kept out: a part of a sentence, with the day.
-std::wstring reasonOf(const KeptOutApplication& application);
 } // namespace tessel

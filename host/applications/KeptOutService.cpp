@@ -16,11 +16,8 @@ namespace tessel
 {
 const wchar_t* KeptOutService::whyKeptOut(const wchar_t* path)
 {
-    const std::wstring reason = mAdmission.whyKeptOut(path ? path : L"");
-    if (reason.empty())
-        return nullptr;
-    mSentence = L"This application is " + reason + L".";
-    return mSentence.c_str();
+    mSentence = mAdmission.whyKeptOut(path ? path : L"");
+    return mSentence.empty() ? nullptr : mSentence.c_str();
 }
 
 bool KeptOutService::keepOut(const wchar_t* path)

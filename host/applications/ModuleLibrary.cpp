@@ -9,6 +9,7 @@
 #include "host/applications/platform/MappedImage.h"
 #include "host/applications/platform/ObjectiveCRuntime.h"
 #include "host/platform/Bundle.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -16,14 +17,21 @@ namespace tessel
 namespace
 {
 constexpr const char* kEntryPointName = "tsrxEntryPoint";
+constexpr std::string_view kUndefinedSymbol = "undefined symbol: "; // how the linker says it
 
 // The linker begins with the path, which the sentence around its words names already.
 std::wstring linkersWords(const std::string& program)
 {
     const char* error = dlerror();
-    std::string words = error ? error : "the system does not say why";
+    if (!error)
+        return translated(L"the system does not say why");
+    const std::string words = error;
     const std::string start = program + ": ";
-    return toWide(withReadableSymbols(words.starts_with(start) ? words.substr(start.size()) : words));
+    const std::string readable =
+        withReadableSymbols(words.starts_with(start) ? words.substr(start.size()) : words);
+    if (readable.starts_with(kUndefinedSymbol))
+        return translated(L"undefined symbol: {}", toWide(readable.substr(kUndefinedSymbol.size())));
+    return toWide(readable);
 }
 
 // The system's headers declare that these never throw, so the compiler leaves out what an exception needs to
@@ -39,7 +47,7 @@ void* map(const std::string& program, bool resolveNow)
 
 Failure threwInMapping(const std::wstring& what)
 {
-    return {L"while it was being mapped, its code threw " + what, ModuleLibrary::kThrew};
+    return {translated(L"while it was being mapped, its code threw {}", what), ModuleLibrary::kThrew};
 }
 
 // A handle of its own for a library that is mapped, or null.
@@ -95,14 +103,14 @@ Result<std::unique_ptr<ModuleLibrary>> ModuleLibrary::openBundle(const ModuleFil
     if (loaded.code() == kBundleNotAccepted && !map(file.program, true))
         return Failure{linkersWords(file.program)};
     if (loaded.code() == kBundleRaised)
-        return threwInMapping(L"an exception: " + loaded.sentence());
+        return threwInMapping(translated(L"an exception: {}", loaded.sentence()));
     if (!loaded)
         return loaded.failure();
     void* handle = mappedLibrary(file.program);
     if (!handle)
-        return Failure{L"the platform has loaded another program in its place"};
+        return Failure{translated(L"the platform has loaded another program in its place")};
     if (const std::string missing = resolveNow ? firstUnresolvedFunction(handle) : ""; !missing.empty())
-        return Failure{L"undefined symbol: " + toWide(withReadableSymbols(missing))};
+        return Failure{translated(L"undefined symbol: {}", toWide(withReadableSymbols(missing)))};
     return std::unique_ptr<ModuleLibrary>(new ModuleLibrary(file, handle, true));
 }
 

@@ -4,6 +4,8 @@
 
 #include <tessel/tsversion.h>
 
+#include "host/text/Translation.h"
+
 namespace tessel
 {
 namespace
@@ -20,7 +22,9 @@ Result<> checkSdkVersion(const std::optional<SdkVersion>& wanted)
 {
     if (!wanted || *wanted <= kOwnSdk)
         return {};
-    return Failure{L"it is built for version " + asText(*wanted) + L" of the SDK, and this Tessel has " +
-                   asText(kOwnSdk) + L"; it needs a newer Tessel, or to be built with the SDK of this one"};
+    return Failure{
+        translated(L"it is built for version {} of the SDK, and this Tessel has {}; it needs a newer "
+                   L"Tessel, or to be built with the SDK of this one",
+                   asText(*wanted), asText(kOwnSdk))};
 }
 } // namespace tessel

@@ -8,6 +8,7 @@
 #include <tessel/tsmessagebox.h>
 
 #include "host/applications/Admission.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -78,12 +79,6 @@ std::wstring joined(const Texts& texts, const std::wstring& between)
     return result;
 }
 
-std::wstring countOf(std::size_t applications)
-{
-    return applications == 1 ? L"1 application could not be loaded"
-                             : std::to_wstring(applications) + L" applications could not be loaded";
-}
-
 // As many as fit into a box, each on as many lines as fit.
 std::wstring fitted(const Texts& texts)
 {
@@ -93,8 +88,9 @@ std::wstring fitted(const Texts& texts)
         if (text.size() > kLongestInBox)
             text.replace(kLongestInBox - 1, text.npos, 1, L'…');
     if (texts.size() > kMostInBox)
-        shown.push_back(L"And " + std::to_wstring(texts.size() - kMostInBox) +
-                        L" more: the command line lists them all.");
+        shown.push_back(translatedByCount(texts.size() - kMostInBox,
+                                          L"And {} more: the command line lists them all.",
+                                          L"And {} more: the command line lists them all."));
     return joined(shown, L"\n\n");
 }
 
@@ -109,7 +105,8 @@ Texts textsOf(const Boxes& boxes)
 StartSummary summaryOf(const std::vector<Entry>& entries, const Texts& messages)
 {
     Texts texts;
-    std::wstring lines = countOf(entries.size()) + L":";
+    std::wstring lines = translatedByCount(entries.size(), L"{} application could not be loaded:",
+                                           L"{} applications could not be loaded:");
     for (const Entry& entry : entries)
     {
         texts.push_back(lineFor(entry));
@@ -121,7 +118,10 @@ StartSummary summaryOf(const std::vector<Entry>& entries, const Texts& messages)
         lines += L"\n" + message;
     }
     const std::wstring detail = fitted(texts);
-    return {{.text = countOf(entries.size()) + L".", .detail = detail, .style = MB_ICONEXCLAMATION},
+    return {{.text = translatedByCount(entries.size(), L"{} application could not be loaded.",
+                                       L"{} applications could not be loaded."),
+             .detail = detail,
+             .style = MB_ICONEXCLAMATION},
             lines,
             detail == joined(texts, L"\n\n")};
 }

@@ -2,13 +2,22 @@
 #pragma once
 
 #include <deque>
+#include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "host/commands/RunningMarker.h"
 
 namespace tessel
 {
+// One command of an application while it runs: what it was typed with, and what it says of itself.
+struct CommandCall
+{
+    const std::vector<std::wstring>& arguments;
+    std::optional<std::wstring> failure = {}; // an empty one: it does not take these arguments
+};
+
 class CallingApplication
 {
 public:
@@ -23,10 +32,10 @@ public:
     class Scope
     {
     public:
-        // An empty path stands for the host itself. The detail: which command.
+        // An empty path stands for the host itself. The detail: which command. The command is the caller's.
         Scope(CallingApplication& calls, const std::wstring& path, Deed deed = Deed::kEntryPoint,
-              const std::wstring& detail = {});
-        ~Scope() { mCalls.mPaths.pop_back(); }
+              const std::wstring& detail = {}, CommandCall* command = nullptr);
+        ~Scope() { mCalls.mCalled.pop_back(); }
         Scope(const Scope&) = delete;
         Scope& operator=(const Scope&) = delete;
 
@@ -41,6 +50,9 @@ public:
     // stays in its place until that call ends.
     const std::wstring& path() const;
 
+    // The command that is being called; null while an entry point is, or nothing.
+    CommandCall* command() const;
+
     // Whether a call of that application has not returned yet, be it the innermost or not. Its code must
     // stay in the process until then.
     bool isAtWork(std::wstring_view path) const;
@@ -48,6 +60,11 @@ public:
 private:
     RunningMarker mNoMarker;
     RunningMarker& mMarker = mNoMarker;
-    std::deque<std::wstring> mPaths; // a deque: what `path` gave out does not move when calls nest
+    struct Called
+    {
+        std::wstring path;
+        CommandCall* command;
+    };
+    std::deque<Called> mCalled; // a deque: what `path` gave out does not move when calls nest
 };
 } // namespace tessel

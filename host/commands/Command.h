@@ -21,6 +21,8 @@ public:
     std::wstring usage;   // as in `CommandText`
     std::wstring example; // the whole line, or empty
 
-    // The host's own commands have these instead of a handler.
-    std::function<tessel::Result<>(const std::vector<std::wstring>& arguments)> builtIn;
+    // The host's own commands have this instead of a handler.
+    using BuiltIn = std::function<tessel::Result<>(const std::vector<std::wstring>& arguments)>;
+    BuiltIn builtIn;
+    BuiltIn listing; // what answers programs, if anything does
 };

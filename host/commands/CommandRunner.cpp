@@ -5,6 +5,7 @@
 
 #include "host/commands/CallingApplication.h"
 #include "host/commands/Command.h"
+#include "host/commands/CommandTexts.h"
 #include "host/text/CommandLine.h"
 #include "host/text/Nearest.h"
 #include "host/text/Unicode.h"
@@ -13,6 +14,8 @@ namespace tessel
 {
 namespace
 {
+constexpr wchar_t kForPrograms[] = L"--json";
+
 bool isBlank(wchar_t character)
 {
     return character == L' ' || character == L'\t' || character == L'\r' || character == L'\n';
@@ -23,19 +26,30 @@ Failure failed(const std::wstring& name, const std::wstring& reason)
     return {L"The command \"" + name + L"\" failed: " + reason};
 }
 
+Result<> callHandler(const TsEdCommand& command, const CommandStack::Arguments& arguments,
+                     CallingApplication& calls)
+{
+    CommandCall typed{arguments};
+    const CallingApplication::Scope calling(calls, command.owner, RunningMarker::Deed::kCommand,
+                                            command.localName, &typed);
+    command.handler();
+    if (!typed.failure)
+        return {};
+    return Failure{typed.failure->empty() ? usageText(command.localName, command.usage) : *typed.failure};
+}
+
 // What runs here may come from anybody's application: whatever it throws ends with the command.
 Result<> call(const TsEdCommand& command, const CommandStack::Arguments& arguments, CallingApplication& calls)
 {
     try
     {
+        if (command.listing && !arguments.empty() && arguments.back() == kForPrograms)
+            return command.listing({arguments.begin(), arguments.end() - 1});
         if (command.builtIn)
             return command.builtIn(arguments);
-        if (!arguments.empty())
+        if (!arguments.empty() && command.usage.empty())
             return failed(command.localName, L"it takes no arguments.");
-        const CallingApplication::Scope calling(calls, command.owner, RunningMarker::Deed::kCommand,
-                                                command.localName);
-        command.handler();
-        return {};
+        return callHandler(command, arguments, calls);
     }
     catch (const std::exception& error)
     {
@@ -109,6 +123,12 @@ CommandStack::Arguments splitLine(std::wstring_view line)
         at += doubled ? 1 : 0;
     }
     return parts;
+}
+
+bool isForPrograms(std::wstring_view line)
+{
+    const CommandStack::Arguments parts = splitLine(line);
+    return parts.size() > 1 && parts.back() == kForPrograms;
 }
 
 std::wstring asPart(std::wstring_view text)

@@ -54,6 +54,9 @@ private:
 // closed reaches to the end of the line.
 CommandStack::Arguments splitLine(std::wstring_view line);
 
+// Whether the command in the line is asked to answer a program, as one JSON document: by --json at its end.
+bool isForPrograms(std::wstring_view line);
+
 // The text so quoted that in a line it is one part, whatever stands in it.
 std::wstring asPart(std::wstring_view text);
 } // namespace tessel

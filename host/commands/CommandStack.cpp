@@ -47,6 +47,15 @@ bool isIn(const TsEdCommand& command, const wchar_t* group)
     return group && equalIgnoringCase(command.group, group);
 }
 
+// After the last one of its group; a new group comes last.
+void insertIntoGroup(std::vector<CommandStack::Description>& all, CommandStack::Description added)
+{
+    const auto lastOfGroup = std::find_if(all.rbegin(), all.rend(),
+                                          [&](const CommandStack::Description& other)
+                                          { return equalIgnoringCase(other.group, added.group); });
+    all.insert(lastOfGroup == all.rend() ? all.end() : lastOfGroup.base(), std::move(added));
+}
+
 bool isOwn(const TsEdCommand& command)
 {
     return static_cast<bool>(command.builtIn);
@@ -90,7 +99,7 @@ int CommandStack::addCommand(const wchar_t* group, const wchar_t* globalName, co
     added->group = group;
     added->globalName = globalName;
     added->localName = localName;
-    if (const CommandText* text = findCommandText(globalName)) // it comes with the host
+    if (const CommandText* text = find(globalName) ? nullptr : findCommandText(globalName)) // Modrig's
     {
         added->summary = text->summary;
         added->usage = text->usage;
@@ -104,20 +113,43 @@ int CommandStack::addCommand(const wchar_t* group, const wchar_t* globalName, co
     return TSED_COMMAND_OK;
 }
 
+void CommandStack::addListing(std::wstring_view name, BuiltIn handler)
+{
+    for (const auto& command : mCommands)
+        if (isOwn(*command) && command->localName == name)
+            command->listing = handler;
+}
+
+void CommandStack::announce(const Description& description)
+{
+    mAnnounced.push_back(description);
+}
+
 int CommandStack::describe(const wchar_t* group, const wchar_t* globalName, std::wstring_view description)
 {
-    if (!isOneLine(description))
+    return setLine(group, globalName, &TsEdCommand::summary, description);
+}
+
+int CommandStack::takeArguments(const wchar_t* group, const wchar_t* globalName, std::wstring_view usage)
+{
+    return setLine(group, globalName, &TsEdCommand::usage, usage);
+}
+
+int CommandStack::setLine(const wchar_t* group, const wchar_t* globalName, std::wstring TsEdCommand::*line,
+                          std::wstring_view text)
+{
+    if (!isOneLine(text))
         return TSED_COMMAND_INVALID;
-    const auto described = std::ranges::find_if(mCommands,
-                                                [&](const auto& command)
-                                                {
-                                                    return !isOwn(*command) && globalName &&
-                                                           isIn(*command, group) &&
-                                                           equalIgnoringCase(command->globalName, globalName);
-                                                });
-    if (described == mCommands.end())
+    const auto found = std::ranges::find_if(mCommands,
+                                            [&](const auto& command)
+                                            {
+                                                return !isOwn(*command) && globalName &&
+                                                       isIn(*command, group) &&
+                                                       equalIgnoringCase(command->globalName, globalName);
+                                            });
+    if (found == mCommands.end())
         return TSED_COMMAND_UNKNOWN;
-    (*described)->summary = description;
+    (**found).*line = text;
     return TSED_COMMAND_OK;
 }
 
@@ -149,8 +181,11 @@ CommandStack::Command CommandStack::find(std::wstring_view typedName) const
 
 std::optional<CommandStack::Description> CommandStack::description(std::wstring_view typedName) const
 {
-    const Command found = find(typedName);
-    return found ? std::optional(descriptionOf(*found)) : std::nullopt;
+    if (const Command found = find(typedName))
+        return descriptionOf(*found);
+    const auto announced = std::ranges::find_if(mAnnounced, [&](const Description& other)
+                                                { return equalIgnoringCase(other.name, typedName); });
+    return announced == mAnnounced.end() ? std::nullopt : std::optional(*announced);
 }
 
 std::vector<CommandStack::Names> CommandStack::commandsOf(const std::wstring& applicationPath) const
@@ -172,6 +207,8 @@ std::vector<std::wstring> CommandStack::names() const
     std::vector<std::wstring> result;
     for (const auto& command : mCommands)
         result.push_back(command->localName);
+    for (const auto& announced : mAnnounced)
+        result.push_back(announced.name);
     std::ranges::sort(result);
     result.erase(std::unique(result.begin(), result.end()), result.end());
     return result;
@@ -181,13 +218,10 @@ std::vector<CommandStack::Description> CommandStack::descriptions() const
 {
     std::vector<Description> result;
     for (const auto& command : mCommands)
-    {
-        const auto lastOfGroup =
-            std::find_if(result.rbegin(), result.rend(),
-                         [&](const Description& other) { return isIn(*command, other.group.c_str()); });
-        const auto place = lastOfGroup == result.rend() ? result.end() : lastOfGroup.base();
-        result.insert(place, descriptionOf(*command));
-    }
+        insertIntoGroup(result, descriptionOf(*command));
+    for (const auto& announced : mAnnounced)
+        if (!find(announced.name))
+            insertIntoGroup(result, announced);
     return result;
 }
 } // namespace tessel
@@ -197,4 +231,10 @@ int tsedDescribeCommand(const wchar_t* group, const wchar_t* globalName, const w
     auto* commands = tessel::running<tessel::CommandStack>();
     return commands ? commands->describe(group, globalName, description ? description : L"")
                     : TSED_COMMAND_UNKNOWN;
+}
+
+int tsedTakeArguments(const wchar_t* group, const wchar_t* globalName, const wchar_t* usage)
+{
+    auto* commands = tessel::running<tessel::CommandStack>();
+    return commands ? commands->takeArguments(group, globalName, usage ? usage : L"") : TSED_COMMAND_UNKNOWN;
 }

@@ -43,6 +43,14 @@ public:
     // A command of the host itself: its arguments follow on the line, and no application can remove it.
     void addBuiltIn(const Description& description, BuiltIn handler);
 
+    // What answers when a command of the host is typed with `--json` as its last argument, which is taken
+    // away.
+    void addListing(std::wstring_view name, BuiltIn handler);
+
+    // A command of an application that is not loaded yet. It is listed until the application registers one of
+    // that name, and again when that has gone.
+    void announce(const Description& description);
+
     // The command belongs to the application that is being called.
     int addCommand(const wchar_t* group, const wchar_t* globalName, const wchar_t* localName, int flags,
                    TsEdCommandHandler handler, TsEdUIContext* uiContext, int functionCode, void* resources,
@@ -52,12 +60,14 @@ public:
 
     // As `tsedDescribeCommand`.
     int describe(const wchar_t* group, const wchar_t* globalName, std::wstring_view description);
+    // As `tsedTakeArguments`.
+    int takeArguments(const wchar_t* group, const wchar_t* globalName, std::wstring_view usage);
 
     // The command that a person types so, or null. Where several share a name, it is the one that was
     // registered first, so that nobody can take the host's own away.
     Command find(std::wstring_view typedName) const;
 
-    // The same command, as a person is told of it.
+    // The same command, or one that is announced, as a person is told of it.
     std::optional<Description> description(std::wstring_view typedName) const;
 
     // The commands that the application at that path has registered, in the order of registration.
@@ -66,16 +76,19 @@ public:
     // An application that is unloaded takes its commands along.
     void removeCommandsOf(const std::wstring& applicationPath);
 
-    // What a person may type now, sorted, in the spelling of registration.
+    // What a person may type, sorted, in the spelling of registration.
     std::vector<std::wstring> names() const;
 
     // Every command, group by group, groups in the order in which they were made.
     std::vector<Description> descriptions() const;
 
 private:
+    int setLine(const wchar_t* group, const wchar_t* globalName, std::wstring TsEdCommand::*line,
+                std::wstring_view text);
     std::size_t removeIf(const std::function<bool(const TsEdCommand&)>& goes);
 
     const CallingApplication& mCalls;
     std::vector<std::shared_ptr<TsEdCommand>> mCommands;
+    std::vector<Description> mAnnounced;
 };
 } // namespace tessel

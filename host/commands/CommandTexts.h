@@ -11,9 +11,10 @@ struct CommandText
 {
     const wchar_t* group;
     const wchar_t* name; // the global one
-    // How the arguments can be typed, a way a line; empty: there are none. Capitals are typed as they stand
-    // (of several with bars between them, one), small letters stand for something, and what is in brackets
-    // can be left out. The Tab key knows `command`, `file`, `folder`, `key` and `variable`.
+    // How the arguments can be typed; empty: there are none. Between several ways stands " | ". Small letters
+    // stand for something, all else is typed as it stands (of several with bars between them, one); what is
+    // in brackets can be left out, and what ends with dots be repeated. The Tab key knows `command`, `file`,
+    // `folder`, `key` and `variable`.
     const wchar_t* usage;
     const wchar_t* summary; // one line
     const wchar_t* example; // the whole line; empty where the name says it all
@@ -21,6 +22,13 @@ struct CommandText
 
 // In the order in which HELP lists them.
 const std::vector<CommandText>& commandTexts();
+
+// Each way of typing the arguments.
+std::vector<std::wstring> waysOfTyping(std::wstring_view usage);
+
+// The command with each way of typing it, a line each, the first after "Usage: ".
+std::vector<std::wstring> usageLines(const std::wstring& name, std::wstring_view usage);
+std::wstring usageText(const std::wstring& name, std::wstring_view usage);
 
 // Null where the host has nothing to say of a command. The name in any case.
 const CommandText* findCommandText(std::wstring_view globalName);

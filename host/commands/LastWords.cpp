@@ -50,6 +50,15 @@ public:
                 mBytes[mLength++] = isShown ? byte : '?';
         }
     }
+    // ASCII.
+    void add(const wchar_t* text)
+    {
+        for (; *text != L'\0'; ++text)
+        {
+            const char byte = static_cast<char>(*text);
+            add(std::string_view(&byte, 1));
+        }
+    }
     void print()
     {
         mBytes[mLength++] = '\n';
@@ -84,7 +93,7 @@ bool speak(int ending)
     line.add(work.detail);
     line.add(words.after);
     line.add(": ");
-    line.add(wordsForEnding(ending));
+    line.add(wordsForEnding(ending).english);
     line.add(".");
     line.print();
     return true;

@@ -12,6 +12,7 @@
 #include <sys/mman.h>
 #include <unistd.h>
 
+#include "host/platform/Descriptor.h"
 #include "host/platform/PrivateFolder.h"
 #include "host/platform/SmallFile.h"
 #include "host/platform/SystemFailure.h"
@@ -33,6 +34,15 @@ static_assert(std::atomic<std::uint32_t>::is_always_lock_free, "a signal handler
 bool readWhole(int descriptor, void* buffer, std::size_t size)
 {
     return pread(descriptor, buffer, size, 0) == static_cast<ssize_t>(size);
+}
+
+bool isHeldElsewhere(const std::filesystem::path& path)
+{
+    const Descriptor file(open(path.c_str(), O_RDWR | O_CLOEXEC | O_NOFOLLOW | O_NONBLOCK));
+    struct flock whole = {};
+    whole.l_type = F_WRLCK;
+    whole.l_whence = SEEK_SET;
+    return file && fcntl(file.number(), F_GETLK, &whole) == 0 && whole.l_type != F_UNLCK;
 }
 
 // Written, not only made long: a page that the disk has no room for would end the process when it is touched.
@@ -156,6 +166,26 @@ void RunningMarker::collect(const std::filesystem::path& folder)
     std::ranges::sort(mLeftovers, {}, [](const Leftover& leftover) { return leftover.work.since; });
 }
 
+// Asked, not tried: a lock that is taken, if only for a moment, would make a session of the dead look alive.
+bool RunningMarker::otherSessionRuns() const
+{
+    std::error_code failed;
+    if (mFile.descriptor < 0)
+        return false;
+    for (std::filesystem::directory_iterator entry(mFile.path.parent_path(), failed), end;
+         !failed && entry != end; entry.increment(failed))
+        if (entry->path().filename().native().starts_with(kFilePrefix) && !holds(entry->path()) &&
+            isHeldElsewhere(entry->path()))
+            return true;
+    return false;
+}
+
+// Of these the locks would go with any descriptor that is closed.
+bool RunningMarker::holds(const std::filesystem::path& path) const
+{
+    return path == mFile.path || std::ranges::find(mOld, path, &OpenFile::path) != mOld.end();
+}
+
 void RunningMarker::forgetLeftovers()
 {
     for (const OpenFile& file : std::exchange(mOld, {}))
@@ -264,49 +294,34 @@ DeedWords wordsFor(RunningMarker::Deed deed) noexcept
     return {"while it was being loaded", {}};
 }
 
-std::string_view wordsFor(RunningMarker::Reason reason) noexcept
-{
-    switch (reason)
-    {
-    case RunningMarker::Reason::kAtStart:
-        return "loaded at the start";
-    case RunningMarker::Reason::kForAnother:
-        return "loaded from the Startup Suite";
-    case RunningMarker::Reason::kOnCommand:
-        return "loaded on command";
-    case RunningMarker::Reason::kByHand:
-        break;
-    }
-    return "asked for by hand";
-}
-
-std::string_view wordsForEnding(int ending) noexcept
+Sentence<> wordsForEnding(int ending)
 {
     struct Words
     {
         int ending;
-        std::string_view text;
+        Sentence<> text;
     };
-    static constexpr Words kWords[] = {{RunningMarker::kVanished,
-                                        "it ended without a signal that can be caught, by \"_exit\", a kill "
-                                        "or a power cut"},
-                                       {RunningMarker::kCalledExit, "it called \"exit\""},
-                                       {RunningMarker::kEndedByKey, "you ended it with Ctrl-C"},
-                                       {SIGSEGV, "memory fault (SIGSEGV)"},
-                                       {SIGBUS, "memory fault (SIGBUS)"},
-                                       {SIGABRT, "it stopped at an error of its own (SIGABRT)"},
-                                       {SIGFPE, "arithmetic fault (SIGFPE)"},
-                                       {SIGILL, "unknown instruction (SIGILL)"},
-                                       {SIGTRAP, "breakpoint (SIGTRAP)"},
-                                       {SIGSYS, "unknown call of the system (SIGSYS)"},
-                                       {SIGQUIT, "quit from outside (SIGQUIT)"},
-                                       {SIGTERM, "it did not come back (SIGTERM)"},
-                                       {SIGHUP, "it did not come back (SIGHUP)"},
-                                       {SIGINT, "it did not come back (SIGINT)"},
-                                       {SIGXCPU, "too much time used (SIGXCPU)"}};
+    static constexpr Words kWords[] = {
+        {RunningMarker::kVanished,
+         Sentence(L"it ended without a signal that can be caught, by \"_exit\", a kill "
+                  L"or a power cut")},
+        {RunningMarker::kCalledExit, Sentence(L"it called \"exit\"")},
+        {RunningMarker::kEndedByKey, Sentence(L"you ended it with Ctrl-C")},
+        {SIGSEGV, Sentence(L"memory fault (SIGSEGV)")},
+        {SIGBUS, Sentence(L"memory fault (SIGBUS)")},
+        {SIGABRT, Sentence(L"it stopped at an error of its own (SIGABRT)")},
+        {SIGFPE, Sentence(L"arithmetic fault (SIGFPE)")},
+        {SIGILL, Sentence(L"unknown instruction (SIGILL)")},
+        {SIGTRAP, Sentence(L"breakpoint (SIGTRAP)")},
+        {SIGSYS, Sentence(L"unknown call of the system (SIGSYS)")},
+        {SIGQUIT, Sentence(L"quit from outside (SIGQUIT)")},
+        {SIGTERM, Sentence(L"it did not come back (SIGTERM)")},
+        {SIGHUP, Sentence(L"it did not come back (SIGHUP)")},
+        {SIGINT, Sentence(L"it did not come back (SIGINT)")},
+        {SIGXCPU, Sentence(L"too much time used (SIGXCPU)")}};
     for (const Words& words : kWords)
         if (words.ending == ending)
             return words.text;
-    return "a signal";
+    return Sentence(L"a signal");
 }
 } // namespace tessel

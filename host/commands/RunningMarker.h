@@ -15,6 +15,7 @@
 #include <vector>
 
 #include "host/text/Result.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -77,6 +78,9 @@ public:
     // they are forgotten.
     const std::vector<Leftover>& leftovers() const { return mLeftovers; }
     void forgetLeftovers();
+
+    // Whether another session keeps its marks in the folder now.
+    bool otherSessionRuns() const;
 
     // One piece of work, for as long as the object lives. These nest; the innermost is the one that counts.
     class Scope
@@ -145,6 +149,7 @@ private:
         int descriptor = -1;
     };
 
+    bool holds(const std::filesystem::path& path) const;
     void collect(const std::filesystem::path& folder);
     void make(const std::filesystem::path& folder);
     Result<> keepIn(const std::filesystem::path& folder);
@@ -165,6 +170,5 @@ struct DeedWords
     std::string_view after;  // and after the detail: "\" ran"
 };
 DeedWords wordsFor(RunningMarker::Deed deed) noexcept;
-std::string_view wordsFor(RunningMarker::Reason reason) noexcept;
-std::string_view wordsForEnding(int ending) noexcept;
+Sentence<> wordsForEnding(int ending); // ASCII
 } // namespace tessel

@@ -36,3 +36,9 @@ void tsrxBeforeWaiting(bool actionIsOver)
     else
         registry->storeSoFar();
 }
+
+bool tsrxOtherSessionRuns()
+{
+    const auto* marker = running<tessel::RunningMarker>();
+    return marker && marker->otherSessionRuns();
+}

@@ -5,6 +5,7 @@
 #include <sstream>
 #include <utility>
 
+#include "host/commands/CommandTexts.h"
 #include "host/console/InputAssembler.h"
 #include "host/text/Unicode.h"
 
@@ -164,9 +165,9 @@ std::optional<Completion> completePath(const OpenPart& typed, const Notation& no
     return result;
 }
 
-bool isCapital(wchar_t character)
+bool isKind(const std::wstring& word)
 {
-    return (character >= L'A' && character <= L'Z') || (character >= L'0' && character <= L'9');
+    return word.front() >= L'a' && word.front() <= L'z';
 }
 
 // What may stand in one place of a command: words that are typed as they are, and kinds of things.
@@ -178,21 +179,29 @@ struct Expected
     bool has(const wchar_t* kind) const { return std::ranges::find(kinds, kind) != kinds.end(); }
 };
 
-// "[START|GOOD]" is START and GOOD.
+// "[START|GOOD]" is START and GOOD, "file..." a file.
 Names wordsOfPlace(std::wstring place)
 {
-    std::erase_if(place, [](wchar_t character) { return character == L'[' || character == L']'; });
+    std::erase_if(place, [](wchar_t character)
+                  { return character == L'[' || character == L']' || character == L'.'; });
     Names words;
     std::wistringstream choices(place);
     for (std::wstring word; std::getline(choices, word, L'|');)
-        words.push_back(word);
+        if (!word.empty())
+            words.push_back(word);
     return words;
 }
 
 bool canStandThere(const std::wstring& part, const Names& words)
 {
     return std::ranges::any_of(words, [&](const auto& word)
-                               { return !isCapital(word.front()) || equalIgnoringCase(word, part); });
+                               { return isKind(word) || equalIgnoringCase(word, part); });
+}
+
+// The next place of a way; one that can be repeated stays the next one.
+bool takePlace(std::wistringstream& places, std::wstring& place)
+{
+    return place.ends_with(L"...") || places >> place;
 }
 
 void addExpected(Expected& expected, const std::wstring& way, const Names& arguments)
@@ -200,19 +209,18 @@ void addExpected(Expected& expected, const std::wstring& way, const Names& argum
     std::wistringstream places(way);
     std::wstring place;
     for (const std::wstring& argument : arguments)
-        if (!(places >> place) || !canStandThere(argument, wordsOfPlace(place)))
+        if (!takePlace(places, place) || !canStandThere(argument, wordsOfPlace(place)))
             return;
-    if (places >> place)
+    if (takePlace(places, place))
         for (const std::wstring& word : wordsOfPlace(place))
-            (isCapital(word.front()) ? expected.words : expected.kinds).push_back(word);
+            (isKind(word) ? expected.kinds : expected.words).push_back(word);
 }
 
 Expected expectedAfter(const Names& parts, const CompletionSources& sources)
 {
     Expected expected;
-    std::wistringstream ways(sources.usage ? sources.usage(parts.front()) : L"");
     const Names arguments(parts.begin() + 1, parts.end());
-    for (std::wstring way; std::getline(ways, way);)
+    for (const std::wstring& way : waysOfTyping(sources.usage ? sources.usage(parts.front()) : L""))
         addExpected(expected, way, arguments);
     return expected;
 }

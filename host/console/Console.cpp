@@ -5,6 +5,7 @@
 #include <sstream>
 #include <utility>
 
+#include "host/commands/CommandRunner.h"
 #include "host/console/LineEditor.h"
 #include "host/console/TypedHistory.h"
 #include "host/messages/Questions.h"
@@ -154,7 +155,8 @@ bool Console::runEach(FollowingLines& lines, const std::wstring& file)
         const auto line = lines.next();
         if (!line)
             break;
-        echo(input, *line);
+        if (!isForPrograms(*line))
+            echo(input, *line);
         if (const auto whole = input.add(*line))
             allWell = runAt(file, begun, *whole) && allWell;
     }

@@ -5,6 +5,8 @@
 #include <ecl/ecl.h>
 #include <zlib.h>
 
+#include "host/text/Translation.h"
+
 namespace tessel
 {
 namespace
@@ -62,19 +64,19 @@ std::string packCompiledLisp(std::string_view byteCode)
 Result<std::string_view> unpackCompiledLisp(std::string_view bytes)
 {
     if (!bytes.starts_with(kSignature))
-        return Failure{L"is not compiled Lisp"};
+        return Failure{translated(L"it is not compiled Lisp")};
     bytes.remove_prefix(kSignature.size());
     if (bytes.size() < kNumbersSize)
-        return Failure{L"is cut short"};
+        return Failure{translated(L"it is cut short")};
     const auto numbers = bytes.substr(0, kNumbersSize);
     const auto byteCode = bytes.substr(kNumbersSize);
     if (numberAt(numbers, 0) != kFormatVersion || numberAt(numbers, kLispVersionAt) != kLispVersion)
-        return Failure{L"was compiled for another version of Lisp; compile it again"};
+        return Failure{translated(L"it was compiled for another version of Lisp; compile it again")};
     if (byteCode.size() < numberAt(numbers, kLengthAt))
-        return Failure{L"is cut short"};
+        return Failure{translated(L"it is cut short")};
     if (byteCode.size() > numberAt(numbers, kLengthAt) ||
         checksumOf(numbers, byteCode) != numberAt(numbers, kChecksumAt))
-        return Failure{L"is damaged"};
+        return Failure{translated(L"it is damaged")};
     return byteCode;
 }
 } // namespace tessel

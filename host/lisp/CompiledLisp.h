@@ -14,7 +14,6 @@ namespace tessel
 // The bytes of a file that holds the byte code.
 std::string packCompiledLisp(std::string_view byteCode);
 
-// The byte code within the bytes that were given; why not is the end of a sentence that begins with the
-// file's name.
+// The byte code within the bytes that were given; why not is the end of a sentence.
 Result<std::string_view> unpackCompiledLisp(std::string_view bytes);
 } // namespace tessel

@@ -14,7 +14,9 @@
 #include "host/lisp/LispMachine.h"
 #include "host/platform/PartFile.h"
 #include "host/platform/ProductFolders.h"
+#include "host/text/ProgramHelp.h"
 #include "host/text/TerminalText.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 #include "host/text/Version.h"
 
@@ -27,16 +29,16 @@ namespace fs = std::filesystem;
 constexpr int kNotCompiled = 1;
 constexpr int kUnusable = 2;
 
-constexpr char kCompilerAfterword[] =
-    "Tessel loads the compiled file as it loads the source: (load \"FILE.qbc\"). "
-    "It is for the version of Lisp\n"
-    "that this host has. Status 0: compiled; 1: the file has an error or cannot be "
-    "read or written; 2: wrong\n"
-    "arguments.";
+constexpr auto kCompilerAfterword =
+    Sentence(L"Tessel loads the compiled file as it loads the source: (load \"FILE.qbc\"). "
+             L"It is for the version of Lisp\n"
+             L"that this host has. Status 0: compiled; 1: the file has an error or cannot be "
+             L"read or written; 2: wrong\n"
+             L"arguments.");
 
-std::wstring quoted(const fs::path& path)
+std::string inUtf8(Sentence<> sentence)
 {
-    return toWide("\"" + path.string() + "\"");
+    return toUtf8(translated(sentence));
 }
 
 LispSurroundings terminal()
@@ -55,7 +57,7 @@ LispSurroundings terminal()
 
 Failure notWritten(const fs::path& output, const std::wstring& reason)
 {
-    return {L"cannot write " + quoted(output) + L": " + reason + L"."};
+    return {translated(L"cannot write \"{}\": {}.", output, reason)};
 }
 
 // Whole or not at all: a build that is stopped midway must not leave a file that looks finished.
@@ -78,12 +80,12 @@ Result<> compileFile(const fs::path& input, const fs::path& output)
 {
     std::error_code error;
     if (fs::equivalent(input, output, error))
-        return Failure{quoted(input) + L" would be overwritten by its own byte code."};
+        return Failure{translated(L"\"{}\" would be overwritten by its own byte code.", input)};
     const auto file = readLispFile(toWide(input.string()), true);
     if (!file)
         return Failure{cannotLoad(toWide(input.string()), file.sentence())};
     if (file->kind == LispFile::Kind::kCompiled)
-        return Failure{quoted(input) + L" is compiled already."};
+        return Failure{translated(L"\"{}\" is compiled already.", input)};
     const auto lisp = LispMachine::start(terminal());
     if (!lisp)
         return lisp.failure();
@@ -107,14 +109,16 @@ Result<> compileGuarded(const fs::path& input, const fs::path& output)
 int runCompilerProgram(int count, const char* const* arguments)
 {
     usePersonsLanguage();
-    CLI::App app("Compiles a Lisp file for Tessel to byte code.", "tesselc");
-    app.footer(kCompilerAfterword);
+    CLI::App app(inUtf8(Sentence(L"Compiles a Lisp file for Tessel to byte code.")), "tesselc");
+    app.footer(inUtf8(kCompilerAfterword));
     app.set_version_flag("--version", versionLine("tesselc, the Lisp compiler of Tessel R21"),
-                         "Show the version and end");
+                         inUtf8(Sentence(L"Show the version and end")));
     std::string input;
     std::string output;
-    app.add_option("FILE", input, "The Lisp file (.lsp)")->required();
-    app.add_option("-o,--output", output, "The compiled file; otherwise FILE with the extension .qbc");
+    app.add_option("FILE", input, inUtf8(Sentence(L"The Lisp file (.lsp)")))->required();
+    app.add_option("-o,--output", output,
+                   inUtf8(Sentence(L"The compiled file; otherwise FILE with the extension .qbc")));
+    translateHelp(app);
     try
     {
         app.parse(count, arguments);

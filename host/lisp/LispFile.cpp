@@ -10,6 +10,8 @@
 #include "host/lisp/CompiledLisp.h"
 #include "host/lisp/LispSource.h"
 #include "host/platform/OrdinaryFile.h"
+#include "host/platform/SystemFailure.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -26,7 +28,7 @@ constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
 
 Failure missing(std::error_code error)
 {
-    return {toWide(error.message()), LispFile::kMissing};
+    return {systemFailure(error.value()).sentence, LispFile::kMissing};
 }
 
 struct FoundFile
@@ -62,7 +64,7 @@ Result<FoundFile> find(const std::wstring& given)
         }
     // The first error says more than those of the other names.
     if (fs::is_directory(fs::path(toUtf8(given)), error))
-        return Failure{L"it is a folder"};
+        return Failure{translated(L"it is a folder")};
     return missing(first);
 }
 
@@ -82,8 +84,8 @@ Result<LispFile> decodeSource(const std::wstring& name, std::string_view bytes)
     if (const auto form = findTooDeepForm(text))
     {
         const auto line = 1 + countLineBreaks(std::wstring_view(text).substr(0, *form));
-        return Failure{L"the form that begins in line " + std::to_wstring(line) + L" is nested more than " +
-                       std::to_wstring(kDeepestNesting) + L" levels deep"};
+        return Failure{translated(L"the form that begins in line {} is nested more than {} levels deep", line,
+                                  kDeepestNesting)};
     }
     return LispFile{LispFile::Kind::kSource, name, std::move(text)};
 }
@@ -92,7 +94,7 @@ Result<LispFile> decodeCompiled(const std::wstring& name, std::string_view bytes
 {
     const auto unpacked = unpackCompiledLisp(bytes);
     if (!unpacked)
-        return Failure{L"it " + unpacked.sentence()};
+        return unpacked.failure();
     return LispFile{LispFile::Kind::kCompiled, name, toWide(*unpacked)};
 }
 
@@ -114,7 +116,7 @@ Result<LispFile> readFound(const FoundFile& found)
 
 std::wstring cannotLoad(const std::wstring& path, const std::wstring& reason)
 {
-    return L"Cannot load \"" + path + L"\": " + reason + L".";
+    return translated(L"Cannot load \"{}\": {}.", path, reason);
 }
 
 Result<LispFile> readLispFile(const std::wstring& path, bool compiledFiles, const LispFileBegins& begins)
@@ -123,7 +125,7 @@ Result<LispFile> readLispFile(const std::wstring& path, bool compiledFiles, cons
     if (!found)
         return found.failure();
     if (!compiledFiles && isCompiled(found->name))
-        return Failure{L"this host does not load compiled Lisp"};
+        return Failure{translated(L"this host does not load compiled Lisp")};
     if (auto begun = begins ? begins(fullPath(found->path)) : Result<>(); !begun)
         return begun.failure();
     return readFound(*found);

@@ -9,7 +9,8 @@
 #include <poll.h>
 #include <unistd.h>
 
-#include "host/text/Unicode.h"
+#include "host/platform/SystemFailure.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -37,12 +38,12 @@ try
 {
     auto notes = openPipe();
     if (!notes)
-        return Failure{L"no pipe for interrupting Lisp: " + notes.sentence()};
+        return Failure{translated(L"no pipe for interrupting Lisp: {}", notes.sentence())};
     return std::unique_ptr<LispInterrupter>(new LispInterrupter(std::move(ways), *std::move(notes)));
 }
 catch (const std::system_error& error) // the library's way to say that there is no thread
 {
-    return Failure{toWide(error.what())};
+    return systemFailure(error.code().value());
 }
 
 LispInterrupter::LispInterrupter(Ways ways, Pipe notes) : mWays(std::move(ways)), mNotes(std::move(notes))

@@ -10,6 +10,7 @@
 #include "host/lisp/LispSource.h"
 #include "host/lisp/LispStart.h"
 #include "host/lisp/LispValues.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -164,14 +165,15 @@ struct LispMachine::Session
         {
             takeBackReserve(surroundings.heapBytes);
             if (memoryWasExhausted)
-                return L"the memory for Lisp is exhausted.";
+                return translated(L"the memory for Lisp is exhausted.");
             // A second interrupt can meet the jump that the first one began; what it carried is lost then.
-            return interrupted ? L"Lisp was interrupted." : L"Lisp has given up what it was doing.";
+            return interrupted ? translated(L"Lisp was interrupted.")
+                               : translated(L"Lisp has given up what it was doing.");
         }
         // The user's symbols fill the memory.
         if (!beginSession(surroundings))
-            return L"the memory for Lisp is exhausted; only a new start of the host frees it.";
-        return L"the memory for Lisp is exhausted; everything that was defined is forgotten.";
+            return translated(L"the memory for Lisp is exhausted; only a new start of the host frees it.");
+        return translated(L"the memory for Lisp is exhausted; everything that was defined is forgotten.");
     }
 
     Result<std::wstring> runForText(const LispCall& call)
@@ -194,10 +196,10 @@ Result<std::unique_ptr<LispMachine>> LispMachine::start(LispSurroundings surroun
         return started.failure();
     const auto interrupter = lispInterrupter();
     if (!interrupter)
-        return Failure{L"Lisp did not start: " + interrupter.sentence() + L"."};
+        return Failure{translated(L"Lisp did not start: {}.", interrupter.sentence())};
     auto session = std::make_unique<Session>(std::move(surroundings), **interrupter);
     if (!beginSession(session->surroundings))
-        return Failure{L"Lisp cannot begin a new session."};
+        return Failure{translated(L"Lisp cannot begin a new session.")};
     return std::unique_ptr<LispMachine>(new LispMachine(std::move(session)));
 }
 
@@ -206,8 +208,7 @@ LispMachine::~LispMachine() = default;
 Result<std::wstring> LispMachine::evaluate(std::wstring_view forms, const Interruption::Wish* wish)
 {
     if (findTooDeepForm(forms))
-        return Failure{L"The expression is nested more than " + std::to_wstring(kDeepestNesting) +
-                       L" levels deep."};
+        return Failure{translated(L"The expression is nested more than {} levels deep.", kDeepestNesting)};
     return mSession->runForText({.function = lispFunctions().evaluate, .text = forms, .wish = wish});
 }
 
@@ -224,7 +225,7 @@ Result<std::wstring> LispMachine::compile(const std::wstring& name, std::wstring
 Result<TsResultBuffer*> LispMachine::call(const TsResultBuffer* call)
 {
     if (!call || call->type != TS_STRING || !call->value.string)
-        return Failure{L"A Lisp function is called by its name, as the first value of the list."};
+        return Failure{translated(L"A Lisp function is called by its name, as the first value of the list.")};
     const auto value =
         mSession->run({.function = lispFunctions().invoke, .text = call->value.string, .values = call});
     return value ? Result<TsResultBuffer*>(resultFromLisp(*value)) : value.failure();

@@ -11,6 +11,7 @@
 #include "host/lisp/LispInterrupter.h"
 #include "host/lisp/LispOutput.h"
 #include "host/lisp/LispValues.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -48,7 +49,7 @@ void runCatching(Work work) noexcept
     }
     catch (...)
     {
-        connection().hostCode = Failure{L"The host failed for a reason of its own."};
+        connection().hostCode = Failure{translated(L"The host failed for a reason of its own.")};
     }
 }
 
@@ -58,13 +59,21 @@ bool isThreadOfLisp()
     return std::this_thread::get_id() == connection().thread;
 }
 
+// An error of Lisp is left by a jump, which no destructor takes part in.
+[[noreturn]] void refuseThread()
+{
+    thread_local std::wstring why;
+    why = translated(L"Files are loaded by Lisp's main thread only.");
+    FEerror("~A", 1, toLisp(why));
+}
+
 // Runs code of the host for Lisp, which is not made for two threads at once. An interrupt waits meanwhile: it
 // would jump over destructors. What the code throws becomes an error of Lisp.
 template <typename Work>
 void callHost(Work work)
 {
     if (!isThreadOfLisp())
-        FEerror("Files are loaded by Lisp's main thread only.", 0);
+        refuseThread();
     const cl_env_ptr environment = ecl_process_env();
     ecl_disable_interrupts_env(environment);
     runCatching(work);
@@ -112,6 +121,38 @@ cl_object column()
     if (isThreadOfLisp())
         callHost([&count] { count = connection().output.column(); });
     return answer(ecl_make_fixnum(static_cast<cl_fixnum>(count)));
+}
+
+// Nothing is put in for NIL. A sentence with other places than that is said as it stands.
+std::wstring translate(cl_object english, cl_object first, cl_object second)
+{
+    const std::wstring sentence = fromLisp(english);
+    const std::size_t things = (first == ECL_NIL ? 0U : 1U) + (second == ECL_NIL ? 0U : 1U);
+    if (!hasPlacesFor(things, sentence))
+        return sentence;
+    if (things == 0)
+        return translateAndFill(sentence.c_str(), {});
+    if (things == 1)
+        return translateAndFill(sentence.c_str(), {fromLisp(first)});
+    return translateAndFill(sentence.c_str(), {fromLisp(first), fromLisp(second)});
+}
+
+// In any thread: what is known of languages is only read. The text outlives a jump for want of memory.
+cl_object translatedText(cl_object english, cl_object first, cl_object second)
+{
+    thread_local std::wstring text;
+    const cl_env_ptr environment = ecl_process_env();
+    ecl_disable_interrupts_env(environment);
+    try
+    {
+        text = translate(english, first, second);
+    }
+    catch (const std::exception&) // there is no memory for more
+    {
+        text.clear();
+    }
+    ecl_enable_interrupts_env(environment);
+    return answer(toLisp(text));
 }
 
 cl_object kindOf(const Result<LispFile>& file)
@@ -237,6 +278,7 @@ void define(const char* name, cl_object (*function)(Arguments...))
 
 void defineLispPrimitives()
 {
+    define("%TRANSLATED", translatedText);
     define("%WRITE", writeText);
     define("%WRITE-CHAR", writeCharacter);
     define("%FLUSH", flush);

@@ -12,6 +12,7 @@
 #include "host/lisp/LispValues.h"
 #include "host/lisp/MemoryFaults.h"
 #include "host/lisp/Prelude.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -104,7 +105,7 @@ Result<LispFunctions> boot()
     raiseStackLimit();
     cl_object fault = startPrelude(toWide(lispPrelude()));
     if (fault != ECL_NIL)
-        return Failure{L"Lisp did not start: " + fromLisp(fault)};
+        return Failure{translated(L"Lisp did not start: {}", fromLisp(fault))};
     return LispFunctions{functionNamed("BEGIN-SESSION"),   functionNamed("EVALUATE"),
                          functionNamed("INVOKE"),          functionNamed("SYMBOLS-BEGINNING"),
                          functionNamed("COMPILE-TEXT"),    functionNamed("INTERRUPTED"),

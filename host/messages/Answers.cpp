@@ -1,9 +1,9 @@
 #include "host/messages/Answers.h"
 
-#include <array>
-#include <charconv>
-#include <cmath>
 #include <cstdlib>
+#include <limits>
+#include <locale>
+#include <sstream>
 
 #include "host/text/Unicode.h"
 
@@ -29,23 +29,34 @@ std::wstring trimmed(std::wstring_view text)
     return std::wstring(text.substr(first, text.find_last_not_of(kBlanks) - first + 1));
 }
 
+// By streams: not every C++ library that this is built with has the newer functions for numbers with a point.
 std::optional<double> numberIn(std::wstring_view answer)
 {
-    std::string text = toUtf8(trimmed(answer));
-    if (text.starts_with('+') && !text.starts_with("+-"))
-        text.erase(0, 1);
+    const std::string text = toUtf8(trimmed(answer));
+    if (text.find_first_not_of("0123456789.eE+-") != text.npos) // neither "inf" nor hexadecimal digits
+        return std::nullopt;
+    std::istringstream stream(text);
+    stream.imbue(std::locale::classic());
     double number = 0;
-    const char* end = text.data() + text.size();
-    const auto read = std::from_chars(text.data(), end, number);
-    const bool isWhole = read.ec == std::errc() && read.ptr == end && std::isfinite(number);
+    stream >> number;
+    const bool isWhole = !stream.fail() && stream.peek() == std::istringstream::traits_type::eof();
     return isWhole ? std::optional(number) : std::nullopt;
 }
 
 std::wstring asText(double number)
 {
-    std::array<char, 32> text; // the shortest form of any number has at most 24 characters
-    const auto written = std::to_chars(text.data(), text.data() + text.size(), number);
-    return toWide(std::string_view(text.data(), written.ptr));
+    std::ostringstream stream;
+    // The fewest digits that stand for this number and no other.
+    for (int digits = 6; digits <= std::numeric_limits<double>::max_digits10; ++digits)
+    {
+        stream = std::ostringstream();
+        stream.imbue(std::locale::classic());
+        stream.precision(digits);
+        stream << number;
+        if (numberIn(toWide(stream.str())) == number)
+            break;
+    }
+    return toWide(stream.str());
 }
 
 std::optional<bool> yesOrNoIn(std::wstring_view answer)

@@ -14,6 +14,7 @@ namespace tessel
 namespace
 {
 constexpr wchar_t kFirstPage[] = L"index";
+constexpr char kLanguageOfBooks[] = "en"; // of the pages in no folder
 
 // A topic is a name and no path: it must not lead out of the book.
 bool isTopicName(const std::wstring& topic)
@@ -22,14 +23,25 @@ bool isTopicName(const std::wstring& topic)
 }
 } // namespace
 
-Help::Help(std::filesystem::path book, Browser browser) : mBook(std::move(book)), mBrowser(std::move(browser))
+Help::Help(std::filesystem::path book, Browser browser, std::vector<std::string> languages)
+    : mBook(std::move(book)), mBrowser(std::move(browser)), mLanguages(std::move(languages))
 {
+}
+
+std::filesystem::path Help::pageIn(const std::filesystem::path& book, const std::string& name) const
+{
+    for (const std::string& language : mLanguages)
+        if (const auto page = book / language / name; isOrdinaryFile(page))
+            return page;
+        else if (language == kLanguageOfBooks)
+            break;
+    return book / name;
 }
 
 Result<std::wstring> Help::show(const std::wstring& topic, const std::filesystem::path& otherBook)
 {
     const std::wstring name = topic.empty() ? kFirstPage : topic;
-    const auto page = (otherBook.empty() ? mBook : otherBook) / (toUtf8(name) + ".html");
+    const auto page = pageIn(otherBook.empty() ? mBook : otherBook, toUtf8(name) + ".html");
     if (!isTopicName(name) || !isOrdinaryFile(page))
         return Failure{L"There is no help on \"" + name + L"\"."};
     const bool shown = mBrowser(page);

@@ -176,6 +176,12 @@ std::vector<LayeredRegistry::Value> LayeredRegistry::values(Key key)
     return counting;
 }
 
+std::optional<std::filesystem::path> LayeredRegistry::laidDownIn(Key key, std::wstring_view name) const
+{
+    const auto* laidDown = isPlain() ? nullptr : mLayers.policy.value(pathOf(key), name);
+    return laidDown ? std::optional(laidDown->file) : std::nullopt;
+}
+
 HKEY LayeredRegistry::openHandle(Key key)
 {
     if (isPlain())

@@ -58,6 +58,9 @@ public:
     std::optional<std::wstring> read(std::wstring_view path, std::wstring_view name);
     Result<> write(std::wstring_view path, std::wstring_view name, std::wstring_view data);
 
+    // The file in which the administrator has laid the value down, if one has: it stands before the person's.
+    std::optional<std::filesystem::path> laidDownIn(Key key, std::wstring_view name) const;
+
     HKEY openHandle(Key key);
     std::optional<Key> keyOf(HKEY handle) const;
     bool closeHandle(HKEY handle);

@@ -6,6 +6,7 @@
 
 #include "host/registry/LayeredRegistry.h"
 #include "host/text/Running.h"
+#include "host/text/Unicode.h"
 
 using tessel::LayeredRegistry;
 using tessel::Registry;
@@ -129,4 +130,13 @@ LONG tsudRegSetString(HKEY key, const wchar_t* name, const wchar_t* data)
     const Target target = targetOf(key);
     return target ? target.registry->writeValue(target.key, orEmpty(name), orEmpty(data)).code()
                   : ERROR_INVALID_HANDLE;
+}
+
+bool tsRegIsLaidDown(HKEY key, const wchar_t* name, wchar_t* place, std::size_t capacity)
+{
+    const Target target = targetOf(key);
+    const auto file = target ? target.registry->laidDownIn(target.key, orEmpty(name)) : std::nullopt;
+    if (file && place && capacity > 0)
+        place[tessel::toWide(file->native()).copy(place, capacity - 1)] = L'\0';
+    return file.has_value();
 }

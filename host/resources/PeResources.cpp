@@ -1,6 +1,8 @@
 #include "host/resources/PeResources.h"
 
+#include <algorithm>
 #include <optional>
+#include <ranges>
 #include <utility>
 
 #include "host/resources/ByteReader.h"
@@ -163,12 +165,10 @@ private:
     unsigned mCount;
 };
 
-// The extent, in the tree, of the block that hangs below a node of languages.
-Extent blockBelow(const Node& languages, const ByteReader& tree, std::uint32_t treeAddress)
+// The extent, in the tree, of the block that a node of languages holds for one of them.
+Extent blockOf(const Node& languages, unsigned entry, const ByteReader& tree, std::uint32_t treeAddress)
 {
-    if (languages.count() == 0)
-        throw DamagedFile{kBadTree};
-    const std::size_t leaf = languages.leaf(0);
+    const std::size_t leaf = languages.leaf(entry);
     const std::uint32_t address = tree.u32(leaf);
     const std::uint32_t size = tree.u32(leaf + 4);
     if (address < treeAddress)
@@ -189,28 +189,75 @@ void checkTexts(const ByteReader& block)
     }
 }
 
-// The blocks of texts by their numbers, and where each begins in the tree.
-std::map<unsigned, std::size_t> blocksIn(std::span<const std::uint8_t> bytes, std::uint32_t treeAddress)
+// The blocks of texts, by languages and by their numbers, and where each begins in the tree.
+class TextTables
 {
-    std::map<unsigned, std::size_t> blocks;
-    const ByteReader tree(bytes, kBadTree);
-    const Node types(tree, 0);
-    for (unsigned type = types.firstNumbered(); type < types.count(); ++type)
+public:
+    using Blocks = std::map<LanguageNumber, std::map<unsigned, std::size_t>>;
+
+    TextTables(std::span<const std::uint8_t> bytes, std::uint32_t treeAddress)
+        : mTree(bytes, kBadTree), mTreeAddress(treeAddress)
     {
-        if (types.number(type) != kStringTables)
-            continue;
-        const Node tables = types.child(type);
+    }
+
+    Blocks read()
+    {
+        const Node types(mTree, 0);
+        for (unsigned type = types.firstNumbered(); type < types.count(); ++type)
+            if (types.number(type) == kStringTables)
+                readTables(types.child(type));
+        return std::move(mBlocks);
+    }
+
+private:
+    void readTables(const Node& tables)
+    {
         for (unsigned i = tables.firstNumbered(); i < tables.count(); ++i)
         {
             const unsigned number = tables.number(i);
-            if (!blocks.empty() && number <= blocks.rbegin()->first)
+            if (number <= mLastNumber)
                 throw DamagedFile{kBadTree};
-            const Extent block = blockBelow(tables.child(i), tree, treeAddress);
-            checkTexts({tree.part(block.offset, block.size), kBadTexts});
-            blocks.emplace_hint(blocks.end(), number, block.offset);
+            mLastNumber = number;
+            readLanguages(tables.child(i), number);
         }
     }
-    return blocks;
+
+    void readLanguages(const Node& languages, unsigned number)
+    {
+        if (languages.firstNumbered() == languages.count())
+            throw DamagedFile{kBadTree};
+        for (unsigned i = languages.firstNumbered(); i < languages.count(); ++i)
+        {
+            const Extent block = blockOf(languages, i, mTree, mTreeAddress);
+            countEntry();
+            checkTexts({mTree.part(block.offset, block.size), kBadTexts});
+            if (!mBlocks[languages.number(i)].emplace(number, block.offset).second)
+                throw DamagedFile{kBadTree}; // a language twice
+        }
+    }
+
+    // Each entry has a place of its own. A tree whose nodes are hung up many times over would take for ever.
+    void countEntry()
+    {
+        if (++mEntries * kEntrySize > mTree.size())
+            throw DamagedFile{kBadTree};
+    }
+
+    ByteReader mTree;
+    std::uint32_t mTreeAddress;
+    Blocks mBlocks;
+    unsigned mLastNumber = 0;
+    std::size_t mEntries = 0;
+};
+
+std::vector<LanguageNumber> inOrderOfTheFile(const TextTables::Blocks& blocks)
+{
+    std::vector<std::pair<std::size_t, LanguageNumber>> beginnings;
+    for (const auto& [language, ofIt] : blocks)
+        beginnings.emplace_back(std::ranges::min(ofIt | std::views::values), language);
+    std::ranges::sort(beginnings);
+    const auto languages = beginnings | std::views::values;
+    return {languages.begin(), languages.end()};
 }
 
 std::wstring decode(const ByteReader& units)
@@ -229,9 +276,11 @@ try
     const Headers headers = headersOf(file);
     const Extent tree = resourcesIn(file, headers);
     PeResources result;
-    result.mBlocks = blocksIn(file.part(tree.offset, tree.size), headers.resourceAddress);
-    for (auto& block : result.mBlocks)
-        block.second += tree.offset;
+    result.mBlocks = TextTables(file.part(tree.offset, tree.size), headers.resourceAddress).read();
+    result.mLanguages = inOrderOfTheFile(result.mBlocks);
+    for (auto& ofALanguage : result.mBlocks)
+        for (auto& block : ofALanguage.second)
+            block.second += tree.offset;
     result.mBytes = std::move(bytes);
     return result;
 }
@@ -240,10 +289,13 @@ catch (const DamagedFile& damage)
     return Failure{damage.why};
 }
 
-std::wstring PeResources::string(unsigned id) const
+std::wstring PeResources::string(unsigned id, LanguageNumber language) const
 {
-    const auto block = mBlocks.find(id / kTextsPerBlock + 1);
-    if (block == mBlocks.end())
+    const auto blocks = mBlocks.find(language);
+    if (blocks == mBlocks.end())
+        return {};
+    const auto block = blocks->second.find(id / kTextsPerBlock + 1);
+    if (block == blocks->second.end())
         return {};
     const ByteReader file(mBytes, kBadTexts); // checked when the file was read: nothing is outside
     std::size_t offset = block->second;

@@ -11,6 +11,7 @@
 #include <string>
 #include <vector>
 
+#include "host/resources/ModuleLanguages.h"
 #include "host/text/Result.h"
 
 namespace tessel
@@ -21,14 +22,22 @@ public:
     // Why the bytes are no sound file with resources is the end of a sentence.
     static Result<PeResources> read(std::vector<std::uint8_t> bytes);
 
-    // The text of that id; empty when there is none. Where the file has it in several languages, the first in
-    // the file. Halves of a character outside the basic plane become one character, a lone half U+FFFD.
-    std::wstring string(unsigned id) const;
+    // The languages that the file has texts in, as they stand in it: the first is the one whose texts come
+    // first. Resource compilers keep the order of their script there, while the tree is sorted by numbers.
+    const std::vector<LanguageNumber>& languages() const { return mLanguages; }
+
+    // The text of that id in one of the languages; empty when there is none. Halves of a character outside
+    // the basic plane become one character, a lone half U+FFFD.
+    std::wstring string(unsigned id, LanguageNumber language) const;
 
 private:
+    using TextBlocks =
+        std::map<unsigned, std::size_t>; // number of a block of sixteen texts -> where it begins
+
     PeResources() = default;
 
     std::vector<std::uint8_t> mBytes;
-    std::map<unsigned, std::size_t> mBlocks; // number of a block of sixteen texts -> where it begins
+    std::map<LanguageNumber, TextBlocks> mBlocks;
+    std::vector<LanguageNumber> mLanguages;
 };
 } // namespace tessel

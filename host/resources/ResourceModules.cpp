@@ -52,8 +52,10 @@ Failure notOpened(const std::wstring& name, const std::wstring& reason)
 }
 } // namespace
 
-ResourceModules::ResourceModules(std::wstring hostFolder, const CallingApplication& calls)
-    : mHostFolder(std::move(hostFolder)), mCalls(calls), mLastHandle(kHandlesBegin)
+ResourceModules::ResourceModules(std::wstring hostFolder, const CallingApplication& calls,
+                                 const std::vector<std::string>& languages)
+    : mHostFolder(std::move(hostFolder)), mCalls(calls), mWantedLanguages(numbersOf(languages)),
+      mLastHandle(kHandlesBegin)
 {
 }
 
@@ -111,7 +113,8 @@ Result<HMODULE> ResourceModules::openFile(const RegularFile& file)
     if (!resources)
         return resources.failure();
     const auto handle = reinterpret_cast<HMODULE>(++mLastHandle);
-    mEntries.emplace(handle, Entry{file.identity(), *std::move(resources), 1});
+    auto languages = inWantedOrder(resources->languages(), mWantedLanguages);
+    mEntries.emplace(handle, Entry{file.identity(), *std::move(resources), std::move(languages), 1});
     return handle;
 }
 
@@ -128,6 +131,11 @@ bool ResourceModules::close(HMODULE module)
 std::wstring ResourceModules::string(HMODULE module, unsigned id) const
 {
     const auto entry = mEntries.find(module ? module : mCurrent);
-    return entry == mEntries.end() ? std::wstring() : entry->second.resources.string(id);
+    if (entry == mEntries.end())
+        return {};
+    for (const LanguageNumber language : entry->second.languages)
+        if (std::wstring text = entry->second.resources.string(id, language); !text.empty())
+            return text;
+    return {};
 }
 } // namespace tessel

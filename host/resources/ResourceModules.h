@@ -10,6 +10,7 @@
 #include <wincompat/winres.h>
 
 #include "host/platform/RegularFile.h"
+#include "host/resources/ModuleLanguages.h"
 #include "host/resources/PeResources.h"
 
 namespace tessel
@@ -19,8 +20,9 @@ class CallingApplication;
 class ResourceModules
 {
 public:
-    // `hostFolder`: where the host's own resources are.
-    ResourceModules(std::wstring hostFolder, const CallingApplication& calls);
+    // `hostFolder`: where the host's own resources are. `languages`: the person's, the most wanted first.
+    ResourceModules(std::wstring hostFolder, const CallingApplication& calls,
+                    const std::vector<std::string>& languages);
 
     // Opens a module by its full path, or by a name looked for first in the resources of the application that
     // is being called (a bundle's; a plain library has its own folder) and then in the host's. A file that is
@@ -33,7 +35,8 @@ public:
     HMODULE current() const { return mCurrent; }
     void setCurrent(HMODULE module) { mCurrent = module; }
 
-    // A text of the module (null: the current one); empty when there is no such text or module.
+    // A text of the module (null: the current one), in the first of the person's languages in which the
+    // module has it, else in the first of the module's own; empty when there is no such text or module.
     std::wstring string(HMODULE module, unsigned id) const;
 
 private:
@@ -41,6 +44,7 @@ private:
     {
         FileIdentity identity;
         PeResources resources;
+        std::vector<LanguageNumber> languages; // those of the resources, in the person's order
         unsigned references;
     };
 
@@ -49,6 +53,7 @@ private:
 
     std::wstring mHostFolder;
     const CallingApplication& mCalls;
+    std::vector<LanguageNumber> mWantedLanguages;
     std::map<HMODULE, Entry> mEntries;
     std::uintptr_t mLastHandle;
     HMODULE mCurrent = nullptr;

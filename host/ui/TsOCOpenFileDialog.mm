@@ -6,6 +6,7 @@
 #include <tesselui/tsuifilepanel.h>
 
 #include "host/ui/Label.h"
+#include "host/ui/Words.h"
 
 namespace
 {
@@ -53,7 +54,7 @@ const NSRect kFilterChoice = {{104, 10}, {308, 26}};
     [choice setAction:@selector(onChoice:)];
     [choice setAutoresizingMask:NSViewWidthSizable];
     NSView* bar = [[[NSView alloc] initWithFrame:kFilterBar] autorelease];
-    [bar addSubview:tessel::windowing::makeLabel(@"Show:", kFilterLabel)];
+    [bar addSubview:tessel::windowing::makeLabel(tessel::word(@"SHOW"), kFilterLabel)];
     [bar addSubview:choice];
     [bar setAutoresizingMask:NSViewWidthSizable];
     return bar;

@@ -21,7 +21,8 @@
 // anybody yet.
 + (void)fill:(NSArrayController*)controller withPathNames:(NSArray*)paths;
 
-// The text of the key in the string table of the module's bundle; the key itself when there is none.
+// The text of the key in the string table of the module's bundle, in English where the person's language has
+// none; the key itself when there is none.
 + (NSString*)modrigLoadString:(NSString*)key;
 
 // Appends the file types that the dialogs offer, `TsOCFileFilter`s: all applications, then kind by kind.

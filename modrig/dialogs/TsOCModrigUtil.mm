@@ -2,6 +2,7 @@
 
 #import <tesselui/TsOCFileFilter.h>
 #include <tesselui/tsuieach.h>
+#include <tesselui/tsuitexts.h>
 #include <wincompat/winfile.h>
 #include <wincompat/winstring.h>
 
@@ -77,8 +78,7 @@ NSArray* rowsOf(NSArray* paths)
 
 + (NSString*)modrigLoadString:(NSString*)key
 {
-    NSBundle* bundle = [NSBundle bundleForClass:[TsOCModrigUtil class]];
-    return [bundle localizedStringForKey:key value:@"" table:nil];
+    return tsuiTextOf([NSBundle bundleForClass:[TsOCModrigUtil class]], key, nil);
 }
 
 + (void)populateModrigFileFilter:(NSMutableArray*)filters

@@ -111,14 +111,18 @@ void ReadStoredList(const StoredListNames& names, CStringList& list,
             appended(*added);
 }
 
-void WriteStoredList(const StoredListNames& names, const CStringList& list)
+bool StoreList(const StoredListNames& names, const CStringList& list)
 {
     const CStdStr subKey = SubKeyOf(names);
     // Without a value name this only makes the key.
     static_cast<void>(WriteModrigRegString(HKEY_CURRENT_USER, subKey, CStdStr(), CStdStr()));
-    const bool stored = DeleteStoredValues(subKey) && WriteCount(names, subKey, list.GetCount()) &&
-                        WriteEntries(names, subKey, list);
-    if (!stored)
+    return DeleteStoredValues(subKey) && WriteCount(names, subKey, list.GetCount()) &&
+           WriteEntries(names, subKey, list);
+}
+
+void WriteStoredList(const StoredListNames& names, const CStringList& list)
+{
+    if (!StoreList(names, list))
         ModrigAfxMessageBox(ModrigMessages::kListNotStored, CStdStr());
 }
 } // namespace ModrigUtils

@@ -25,7 +25,9 @@ inline constexpr StoredListNames kStoredStartupSuite = {L"Startup", L"NumStartup
 void ReadStoredList(const StoredListNames& names, CStringList& list,
                     const std::function<void(const CStdStr& path)>& appended);
 
-// Replaces what is stored with the list. A failure is told in a message box; the store may then hold a part
-// of the list, unless the host undoes it.
+// Replaces what is stored with the list. On failure the store may hold a part of the list, unless the host
+// undoes it.
+[[nodiscard]] bool StoreList(const StoredListNames& names, const CStringList& list);
+// The same; a failure is told in a message box.
 void WriteStoredList(const StoredListNames& names, const CStringList& list);
 } // namespace ModrigUtils

@@ -1,6 +1,7 @@
 // The service "TESSEL_REGISTERED_COMMANDS": the commands that a person can type.
 #pragma once
 
+#include "tsresbuf.h"
 #include "tsrx.h"
 
 class TsEdCommand;   // one command; owned by the host
@@ -48,3 +49,19 @@ public:
 // stays. Nothing else depends on a description.
 TESSEL_API int tsedDescribeCommand(const wchar_t* group, const wchar_t* globalName,
                                    const wchar_t* description);
+
+// Lets a command of an application be typed with arguments. `usage` says in one line which: `HELP` shows it
+// after the command's name. Status and limits are those of `tsedDescribeCommand`. A command for which this
+// was not called fails when it is typed with arguments.
+TESSEL_API int tsedTakeArguments(const wchar_t* group, const wchar_t* globalName, const wchar_t* usage);
+
+// The arguments that the running command was typed with, as TS_STRING values in their order, without the
+// quotes that kept blanks together; null when there are none, or when no command of the caller's runs. The
+// caller frees the list with `tsutRelRb`.
+TESSEL_API TsResultBuffer* tsedCommandArguments();
+
+// Makes the running command one that has failed: when its handler has returned, the host tells the sentence
+// as it tells its own errors, and a script counts the line as failed. Null stands for arguments that the
+// command does not take: the host then says how it is typed. The last call counts; outside of a command
+// nothing happens.
+TESSEL_API void tsedFailCommand(const wchar_t* sentence);

@@ -18,3 +18,7 @@ TESSEL_API int tsrxEndRequest();
 // is tried again. Otherwise the wait is a question in the midst of an action, and a failure lasts: what is
 // left of the action is not stored without what it belongs to.
 TESSEL_API void tsrxBeforeWaiting(bool actionIsOver);
+
+// Whether another session works with the same profile now. What it has read before stays in its memory: it
+// does not learn of what is stored here. False outside of a session, and where the host cannot tell.
+TESSEL_API bool tsrxOtherSessionRuns();

@@ -45,3 +45,8 @@ TESSEL_API LONG tsRegGetValue(HKEY key, const wchar_t* name, DWORD reserved, DWO
 
 // Stores a string value (REG_SZ). A value that exists keeps its place in the order.
 TESSEL_API LONG tsudRegSetString(HKEY key, const wchar_t* name, const wchar_t* data);
+
+// Whether an administrator has laid the value down for everybody: then it counts, and not what is stored
+// under its name here. `place`, when not null, receives where it is laid down, as far as it fits (capacity in
+// characters, the terminator included). False for a handle that is not open.
+TESSEL_API bool tsRegIsLaidDown(HKEY key, const wchar_t* name, wchar_t* place, std::size_t capacity);

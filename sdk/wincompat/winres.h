@@ -15,7 +15,8 @@ TESSEL_API int FreeLibrary(HMODULE module);
 TESSEL_API HMODULE AfxGetResourceHandle();
 TESSEL_API void AfxSetResourceHandle(HMODULE module);
 
-// Copies string `id` of the module (null: the current one) into the buffer, cut to capacity - 1 characters
+// Copies string `id` of the module (null: the current one), in the first of the person's languages in which
+// the module has it and else in the first of the module's, into the buffer, cut to capacity - 1 characters
 // and terminated. Answers the characters copied, 0 when there is no such string (the buffer is then an empty
 // text). Text outside the basic plane becomes one wide character.
 TESSEL_API int loadStringFromWin32ResourceDLL(HMODULE module, unsigned id, wchar_t* buffer, int capacity);

@@ -133,6 +133,60 @@ TEST_F(CommandsContract, DescribesACommandInOneLine)
     EXPECT_EQ(runsOf(L"CONTRACTEINS"), 1);
 }
 
+std::vector<std::wstring> argumentsSeen;
+
+void takeArguments()
+{
+    count();
+    argumentsSeen.clear();
+    TsResultBuffer* list = tsedCommandArguments();
+    for (const TsResultBuffer* value = list; value; value = value->next)
+        argumentsSeen.emplace_back(value->type == TS_STRING ? value->value.string : L"(no text)");
+    tsutRelRb(list);
+}
+
+TEST_F(CommandsContract, GivesArgumentsToACommandThatTakesThem)
+{
+    commands->addCommand(L"CONTRACT", L"CONTRACTONE", L"CONTRACTEINS", 0, takeArguments);
+    EXPECT_FALSE(host->type(L"CONTRACTEINS one"));
+    EXPECT_EQ(timesRun, 0) << "nobody said that it takes any";
+    EXPECT_EQ(tsedTakeArguments(L"contract", L"contractone", L"[word...]"), TSED_COMMAND_OK);
+    EXPECT_EQ(runsOf(L"CONTRACTEINS one  two"), 1);
+    EXPECT_EQ(argumentsSeen, (std::vector<std::wstring>{L"one", L"two"}));
+    EXPECT_EQ(runsOf(L"_CONTRACTONE"), 1);
+    EXPECT_EQ(argumentsSeen, std::vector<std::wstring>());
+    EXPECT_EQ(tsedCommandArguments(), nullptr) << "no command runs";
+}
+
+TEST_F(CommandsContract, TakesArgumentsOfAKnownCommandInOneLineOfUsage)
+{
+    add(L"CONTRACT", L"CONTRACTONE", L"CONTRACTEINS");
+    EXPECT_EQ(tsedTakeArguments(L"CONTRACT", L"CONTRACTTWO", L"[word]"), TSED_COMMAND_UNKNOWN);
+    EXPECT_EQ(tsedTakeArguments(nullptr, L"CONTRACTONE", L"[word]"), TSED_COMMAND_UNKNOWN);
+    for (const wchar_t* noLine : {L"", L"two\nlines", static_cast<const wchar_t*>(nullptr)})
+        EXPECT_EQ(tsedTakeArguments(L"CONTRACT", L"CONTRACTONE", noLine), TSED_COMMAND_INVALID);
+    EXPECT_FALSE(host->type(L"CONTRACTEINS one"));
+}
+
+TEST_F(CommandsContract, CountsACommandAsFailedThatSaysSo)
+{
+    commands->addCommand(L"CONTRACT", L"CONTRACTONE", L"CONTRACTEINS", 0,
+                         []
+                         {
+                             count();
+                             if (timesRun == 1)
+                                 tsedFailCommand(L"There is nothing to do.");
+                             if (timesRun == 2)
+                                 tsedFailCommand(nullptr);
+                         });
+    EXPECT_FALSE(host->type(L"CONTRACTEINS"));
+    EXPECT_FALSE(host->type(L"CONTRACTEINS"));
+    EXPECT_TRUE(host->type(L"CONTRACTEINS")) << "the next one does not pay for it";
+    tsedFailCommand(L"Nothing runs.");
+    EXPECT_TRUE(host->type(L"CONTRACTEINS"));
+    EXPECT_EQ(timesRun, 4);
+}
+
 TEST_F(CommandsContract, LetsACommandRemoveItself)
 {
     commands->addCommand(L"CONTRACT", L"CONTRACTONE", L"CONTRACTONE", 0,

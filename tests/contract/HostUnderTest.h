@@ -41,6 +41,9 @@ public:
     // A file that holds the texts, made so that `LoadLibrary` opens it by the path answered.
     virtual std::wstring makeResourceModule(const std::wstring& name,
                                             const std::map<unsigned, std::wstring>& texts) = 0;
+    // The same with texts in several languages, none of which is the person's.
+    virtual std::wstring makeTranslatedModule(const std::wstring& name,
+                                              const std::vector<std::map<unsigned, std::wstring>>& texts) = 0;
 
     // A compiled application, not loaded yet.
     virtual std::wstring makeModule(const std::wstring& name, ContractModule behaviour) = 0;

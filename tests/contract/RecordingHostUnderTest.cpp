@@ -67,6 +67,15 @@ public:
         return kFolder + name;
     }
 
+    std::wstring makeTranslatedModule(const std::wstring& name,
+                                      const std::vector<std::map<unsigned, std::wstring>>& texts) override
+    {
+        std::map<unsigned, std::wstring> found;
+        for (const auto& ofALanguage : texts)
+            found.insert(ofALanguage.begin(), ofALanguage.end());
+        return makeResourceModule(name, found);
+    }
+
     std::wstring makeModule(const std::wstring& name, ContractModule behaviour) override
     {
         recordingHost().linker.setEntryPoint(kFolder + name, entryPoint(behaviour));

@@ -97,6 +97,15 @@ TEST_F(RegistryContract, OpensWhatItIsAskedToMakeTwice)
     RegCloseKey(again);
 }
 
+TEST_F(RegistryContract, HasNothingLaidDownWhereNobodyDidSo)
+{
+    set(L"Name", L"1");
+    wchar_t place[8] = L"before";
+    EXPECT_FALSE(tsRegIsLaidDown(key, L"Name", place, 8));
+    EXPECT_STREQ(place, L"before");
+    EXPECT_FALSE(tsRegIsLaidDown(nullptr, L"Name", nullptr, 0));
+}
+
 TEST_F(RegistryContract, OpensAKeyBelowAnOpenKey)
 {
     const HKEY child = create(L"Child\\Grandchild", key);

@@ -41,6 +41,20 @@ TEST_F(ResourcesContract, GivesAnEmptyTextForAnIdThatIsMissing)
     EXPECT_NE(FreeLibrary(module), 0);
 }
 
+TEST_F(ResourcesContract, TakesWhatALanguageLacksFromTheNextOneOfTheModule)
+{
+    const HMODULE module =
+        LoadLibrary(host->makeTranslatedModule(L"Texts.dll",
+                                               {{{1, L"one"}}, {{1, L"ein"}, {2, L"twee"}}, {{40, L"amane"}}})
+                        .c_str());
+    ASSERT_NE(module, nullptr);
+    EXPECT_EQ(text(module, 1), L"one");
+    EXPECT_EQ(text(module, 2), L"twee");   // beside one in the first language
+    EXPECT_EQ(text(module, 40), L"amane"); // where the others have no text
+    EXPECT_EQ(text(module, 3), L"");
+    EXPECT_NE(FreeLibrary(module), 0);
+}
+
 TEST_F(ResourcesContract, GivesOneCharacterForOneOfAnotherPlane)
 {
     const HMODULE module =

@@ -35,6 +35,11 @@ TEST_F(SessionContract, IsNotToEndAsLongAsNobodyAsksForIt)
     EXPECT_EQ(poll(&request, 1, 0), 0);
 }
 
+TEST_F(SessionContract, IsAloneWithItsProfile)
+{
+    EXPECT_FALSE(tsrxOtherSessionRuns());
+}
+
 TEST_F(SessionContract, KeepsKeysOpenAndValuesStoredOverAWait)
 {
     EXPECT_EQ(set(L"1"), ERROR_SUCCESS);

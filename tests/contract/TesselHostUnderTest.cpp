@@ -98,10 +98,23 @@ public:
     std::wstring makeResourceModule(const std::wstring& name,
                                     const std::map<unsigned, std::wstring>& texts) override
     {
-        std::string script = "STRINGTABLE\nBEGIN\n";
-        for (const auto& [id, text] : texts)
-            script += std::to_string(id) + " " + quoted(text) + "\n";
-        mFolder.write("texts.rc", script + "END\n");
+        return makeTranslatedModule(name, {texts});
+    }
+
+    std::wstring makeTranslatedModule(const std::wstring& name,
+                                      const std::vector<std::map<unsigned, std::wstring>>& texts) override
+    {
+        // Languages of the south of Africa, from the largest number to the smallest.
+        static constexpr unsigned kLanguages[] = {54, 53, 52};
+        std::string script;
+        for (std::size_t i = 0; i < texts.size(); ++i)
+        {
+            script += "LANGUAGE " + std::to_string(kLanguages[i]) + ", 1\nSTRINGTABLE\nBEGIN\n";
+            for (const auto& [id, text] : texts[i])
+                script += std::to_string(id) + " " + quoted(text) + "\n";
+            script += "END\n";
+        }
+        mFolder.write("texts.rc", script);
         const fs::path module = mFolder / toPath(name);
         // Relative names: an absolute one can be read as an option.
         const std::string inFolder = "cd " + mFolder.path().string() + " && ";

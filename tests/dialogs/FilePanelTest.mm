@@ -1,11 +1,11 @@
 // The list of the host's file panel, by mouse and keyboard.
 #include "tests/dialogs/support/FilePanelTest.h"
+#include "tests/dialogs/support/LanguageOfKeys.h"
 
 #include <ctime>
 #include <fstream>
 #include <set>
 
-#include <objc/runtime.h>
 #include <sys/inotify.h>
 #include <unistd.h>
 #include <utime.h>
@@ -39,49 +39,6 @@ public:
 private:
     std::vector<int> mTaken;
 };
-
-using LocalizedString = NSString* (*)(id, SEL, NSString*, NSString*, NSString*);
-LocalizedString gLocalizedString;
-
-NSString* keyInBrackets(id bundle, SEL selector, NSString* key, NSString* value, NSString* table)
-{
-    if (![table isEqual:@"FilePanel"])
-        return gLocalizedString(bundle, selector, key, value, table);
-    return [NSString stringWithFormat:@"<%@>", key];
-}
-
-// A language whose words are the keys.
-class LanguageOfKeys
-{
-public:
-    LanguageOfKeys()
-    {
-        gLocalizedString = LocalizedString(method_setImplementation(kMethod, IMP(keyInBrackets)));
-    }
-    ~LanguageOfKeys() { method_setImplementation(kMethod, IMP(gLocalizedString)); }
-    LanguageOfKeys(const LanguageOfKeys&) = delete;
-    LanguageOfKeys& operator=(const LanguageOfKeys&) = delete;
-
-private:
-    const Method kMethod = class_getInstanceMethod([NSBundle class], @selector(localizedStringForKey:
-                                                                                               value:table:));
-};
-
-// What is written in the view and below it, but for the titles of folders.
-void collectTexts(NSView* view, std::set<std::wstring>& texts)
-{
-    if ([view isKindOfClass:NSClassFromString(@"TsPathBar")])
-        return;
-    if ([view isKindOfClass:[NSPopUpButton class]])
-        texts.insert(wide([(NSPopUpButton*)view itemTitleAtIndex:0]));
-    else if ([view isKindOfClass:[NSButton class]])
-        texts.insert(wide([(NSButton*)view title]));
-    else if ([view isKindOfClass:[NSTextField class]])
-        texts.insert(wide([(NSTextField*)view stringValue]));
-    texts.insert(wide([view toolTip]));
-    for (NSView* part : tsuiEach<NSView*>([view subviews]))
-        collectTexts(part, texts);
-}
 
 class FilePanelList : public FilePanelTest
 {
@@ -422,13 +379,10 @@ TEST_F(FilePanelList, TakesEveryWordFromTheTableOfItsLanguage)
     std::set<std::wstring> texts;
     use({[&]
          {
-             collectTexts([mPanel contentView], texts);
-             for (NSTableColumn* column : tsuiEach<NSTableColumn*>([table() tableColumns]))
-                 texts.insert(wide([[column headerCell] stringValue]));
+             texts = textsIn([mPanel contentView]);
              for (NSInteger row = 0; row < 4; ++row)
                  texts.insert(textIn(@"kind", row));
          }});
-    texts.erase(L"");
     EXPECT_THAT(texts, UnorderedElementsAre(L"<UP>", L"<HOME>", L"<RECENT>", L"<RECENT_TIP>",
                                             L"<NAME_COLUMN>  \u2191", L"<KIND_COLUMN>", L"<DATE_COLUMN>",
                                             L"<FOLDER>", L"<PACKAGE>", L"<FILE>", L"<FILE_OF_KIND>",

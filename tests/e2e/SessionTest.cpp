@@ -68,8 +68,8 @@ TEST(Session, TellsOfACommandHowItIsTypedWithAnExample)
 TEST(Session, ListsEachWayOfTypingACommandOnALine)
 {
     const HostSession session;
-    const std::string ways = "Usage: REGISTRY LIST [key]\n"
-                             "       REGISTRY GET key [name]\n"
+    const std::string ways = "Usage: REGISTRY LIST [key] [--json]\n"
+                             "       REGISTRY GET key [name] [--json]\n"
                              "       REGISTRY SET key [name data]\n"
                              "       REGISTRY DELETE key [name]\n"
                              "       REGISTRY EXPORT key file [UTF8]\n"

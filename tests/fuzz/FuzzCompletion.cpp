@@ -38,9 +38,9 @@ tessel::CompletionSources sourcesOf(const std::vector<std::wstring>& names)
     };
     const auto usage = [names](const std::wstring&)
     {
-        std::wstring ways = L"file\nLIST key";
+        std::wstring ways = L"file | LIST key";
         for (const auto& name : names)
-            ways += L"\n" + name;
+            ways += L" | " + name;
         return ways;
     };
     return {all, usage, all, branches, branches, all};

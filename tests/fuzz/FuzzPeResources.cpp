@@ -34,7 +34,8 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     const auto blocks = possibleBlocks(data, size);
     for (unsigned block = 1; block <= kBlocks; ++block)
         for (unsigned text = 0; blocks.test(block) && text < kTextsPerBlock; ++text)
-            if (resources->string((block - 1) * kTextsPerBlock + text).size() > size)
-                std::abort();
+            for (const auto language : resources->languages())
+                if (resources->string((block - 1) * kTextsPerBlock + text, language).size() > size)
+                    std::abort();
     return 0;
 }

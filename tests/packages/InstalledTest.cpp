@@ -60,6 +60,18 @@ TEST_F(Installed, RunsForAnOrdinaryUser)
                 HasSubstr(library("Tessel.app/Resources/help/startup_suite_dialog.html").string()));
 }
 
+TEST_F(Installed, HasTheCommandsOfModrigsLists)
+{
+    giveToOrdinaryUser();
+    const std::string primes = library("samples/primes.zmb");
+    const auto stored =
+        session.start({"--safe", "-c", "SUITE ADD " + inQuotes(primes), "-c", "HISTORY LIST"});
+    EXPECT_EQ(stored.exitStatus, 0);
+    EXPECT_THAT(stored.output, HasSubstr("primes.zmb was added to the Startup Suite.\nCommand: HISTORY LIST\n"
+                                         "There is nothing in the History list.\n"));
+    EXPECT_THAT(session.run({"HELP"}).output, HasSubstr(kPrimes));
+}
+
 TEST_F(Installed, CompilesLisp)
 {
     const auto source = session.folder().write("hello.lsp", "(write-line \"hello\")\n").string();

@@ -99,25 +99,30 @@ std::vector<std::string> parts(const std::string& extensions)
     return result;
 }
 
-class LocalizedStrings : public testing::Test
+// In each of the languages.
+class LocalizedStrings : public testing::TestWithParam<const char*>
 {
 protected:
     void SetUp() override
     {
-        const auto read = readStringsFile(MODRIG_LOCALIZED_STRINGS);
-        ASSERT_TRUE(read.has_value()) << "not a string table: " << MODRIG_LOCALIZED_STRINGS;
+        const std::string file =
+            std::string(MODRIG_BUNDLE_RESOURCES "/") + GetParam() + ".lproj/Localizable.strings";
+        const auto read = readStringsFile(file);
+        ASSERT_TRUE(read.has_value()) << "not a string table: " << file;
         mTexts = *read;
     }
 
     Table mTexts;
 };
 
-TEST_F(LocalizedStrings, HoldTheirKeysAndNoOther)
+INSTANTIATE_TEST_SUITE_P(Of, LocalizedStrings, testing::Values("en", "de"));
+
+TEST_P(LocalizedStrings, HoldTheirKeysAndNoOther)
 {
     EXPECT_EQ(keysOf(mTexts), everyKey());
 }
 
-TEST_F(LocalizedStrings, HoldEveryKeyThatTheSourcesName)
+TEST_P(LocalizedStrings, HoldEveryKeyThatTheSourcesName)
 {
     for (const std::string& key : keysIn(moduleSources()))
         EXPECT_TRUE(mTexts.contains(key)) << key;
@@ -126,7 +131,7 @@ TEST_F(LocalizedStrings, HoldEveryKeyThatTheSourcesName)
         << "keys are overlooked";
 }
 
-TEST_F(LocalizedStrings, AreNeverEmptyAndHoldThePlaceholdersThatAreFilled)
+TEST_P(LocalizedStrings, AreNeverEmptyAndHoldThePlaceholdersThatAreFilled)
 {
     for (const auto& [key, text] : mTexts)
     {
@@ -138,13 +143,13 @@ TEST_F(LocalizedStrings, AreNeverEmptyAndHoldThePlaceholdersThatAreFilled)
     }
 }
 
-TEST_F(LocalizedStrings, NameTheExtensionsThatAFilterShowsWithoutDotsOrStars)
+TEST_P(LocalizedStrings, NameTheExtensionsThatAFilterShowsWithoutDotsOrStars)
 {
     for (const auto& [key, extensions] : kShownExtensions)
         EXPECT_EQ(mTexts.at(key + kExtensionSuffix), extensions) << key;
 }
 
-TEST_F(LocalizedStrings, ShowEveryKindOfApplicationInTheFirstFilterAndNothingElse)
+TEST_P(LocalizedStrings, ShowEveryKindOfApplicationInTheFirstFilterAndNothingElse)
 {
     std::set<std::string> kinds;
     for (const CExtInfo& kind : sExtInfo)
@@ -157,7 +162,7 @@ TEST_F(LocalizedStrings, ShowEveryKindOfApplicationInTheFirstFilterAndNothingEls
     EXPECT_EQ(shown.size(), kinds.size());
 }
 
-TEST_F(LocalizedStrings, DescribeEveryFilterDifferently)
+TEST_P(LocalizedStrings, DescribeEveryFilterDifferently)
 {
     std::set<std::string> descriptions;
     for (const auto& [key, extensions] : kShownExtensions)

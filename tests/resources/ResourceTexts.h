@@ -4,6 +4,14 @@
 #include <filesystem>
 #include <map>
 #include <string>
+#include <vector>
 
-// Every text by its id. Throws std::runtime_error for a file that the host could not use.
-std::map<unsigned, std::wstring> readResourceTexts(const std::filesystem::path& module);
+// The texts of a language by their ids.
+struct ResourceTexts
+{
+    unsigned language;
+    std::map<unsigned, std::wstring> texts;
+};
+
+// Every language, as they stand in the file. Throws std::runtime_error for one that the host could not use.
+std::vector<ResourceTexts> readResourceTexts(const std::filesystem::path& module);

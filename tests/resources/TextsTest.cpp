@@ -1,5 +1,6 @@
 #include <gmock/gmock.h>
 
+#include <algorithm>
 #include <regex>
 #include <set>
 
@@ -92,13 +93,40 @@ Placeholders placeholdersOf(const std::wstring& text)
     return found;
 }
 
-class Texts : public testing::Test
+constexpr unsigned kEnglish = 0x0409, kGerman = 0x0007;
+
+const std::vector<ResourceTexts>& allTexts()
+{
+    static const auto texts = readResourceTexts(MODRIG_RESOURCE_MODULE);
+    return texts;
+}
+
+// In each of the languages.
+class Texts : public testing::TestWithParam<unsigned>
 {
 protected:
-    const std::map<unsigned, std::wstring> mTexts = readResourceTexts(MODRIG_RESOURCE_MODULE);
+    static std::map<unsigned, std::wstring> textsIn(unsigned language)
+    {
+        const auto& all = allTexts();
+        const auto found = std::ranges::find(all, language, &ResourceTexts::language);
+        return found == all.end() ? std::map<unsigned, std::wstring>() : found->texts;
+    }
+
+    const std::map<unsigned, std::wstring> mTexts = textsIn(GetParam());
 };
 
-TEST_F(Texts, ArePlacedInTheTableOfPlaceholdersForEveryIdOfTheHeader)
+TEST(LanguagesOfTexts, BeginWithTheOneThatIsTakenWhereNoneSuitsThePerson)
+{
+    std::vector<unsigned> languages;
+    for (const ResourceTexts& texts : allTexts())
+        languages.push_back(texts.language);
+    EXPECT_EQ(languages, std::vector({kEnglish, kGerman}));
+}
+
+INSTANTIATE_TEST_SUITE_P(InEnglish, Texts, testing::Values(kEnglish));
+INSTANTIATE_TEST_SUITE_P(InGerman, Texts, testing::Values(kGerman));
+
+TEST_P(Texts, ArePlacedInTheTableOfPlaceholdersForEveryIdOfTheHeader)
 {
     std::map<std::string, unsigned> table;
     for (const Message& message : kMessages)
@@ -106,7 +134,7 @@ TEST_F(Texts, ArePlacedInTheTableOfPlaceholdersForEveryIdOfTheHeader)
     EXPECT_EQ(constantsOfTheHeader(), table);
 }
 
-TEST_F(Texts, ExistForEveryIdThatTheCodeKnowsAndForNoOther)
+TEST_P(Texts, ExistForEveryIdThatTheCodeKnowsAndForNoOther)
 {
     std::set<unsigned> known;
     for (const Message& message : kMessages)
@@ -117,13 +145,13 @@ TEST_F(Texts, ExistForEveryIdThatTheCodeKnowsAndForNoOther)
     EXPECT_EQ(present, known);
 }
 
-TEST_F(Texts, HoldExactlyThePlaceholdersThatTheirUsersFillIn)
+TEST_P(Texts, HoldExactlyThePlaceholdersThatTheirUsersFillIn)
 {
     for (const Message& message : kMessages)
         EXPECT_EQ(placeholdersOf(mTexts.at(message.id)), message.placeholders) << message.name;
 }
 
-TEST_F(Texts, ShowTheirArgumentsAndNothingUnfilled)
+TEST_P(Texts, ShowTheirArgumentsAndNothingUnfilled)
 {
     for (const Message& message : kMessages)
     {
@@ -136,15 +164,16 @@ TEST_F(Texts, ShowTheirArgumentsAndNothingUnfilled)
     }
 }
 
-TEST_F(Texts, NameTheReleaseAndTheProductInTheFirstFilter)
+TEST_P(Texts, NameTheReleaseAndTheProductInTheFirstFilter)
 {
     CStdStr text;
     text.Fmt(mTexts.at(kAllApplicationsFilter).c_str(), 21, L"Tessel");
-    EXPECT_EQ(text.Text(),
-              L"All release 21 applications for Tessel|" + kFilterPatterns.at(kAllApplicationsFilter));
+    const std::wstring& shown = text.Text();
+    EXPECT_LT(shown.find(L"21"), shown.find(L"Tessel"));
+    EXPECT_LT(shown.find(L"Tessel|"), shown.size());
 }
 
-TEST_F(Texts, DescribeAFilterBeforeTheBarAndListItsPatternsAfterIt)
+TEST_P(Texts, DescribeAFilterBeforeTheBarAndListItsPatternsAfterIt)
 {
     for (const auto& [id, patterns] : kFilterPatterns)
     {
@@ -156,7 +185,7 @@ TEST_F(Texts, DescribeAFilterBeforeTheBarAndListItsPatternsAfterIt)
     }
 }
 
-TEST_F(Texts, OfferEveryApplicationKindInTheFirstFilter)
+TEST_P(Texts, OfferEveryApplicationKindInTheFirstFilter)
 {
     const std::wstring& text = mTexts.at(kAllApplicationsFilter);
     for (const CExtInfo& kind : sExtInfo)
@@ -164,7 +193,7 @@ TEST_F(Texts, OfferEveryApplicationKindInTheFirstFilter)
             << CStdStr(kind.mExtension).c_str();
 }
 
-TEST_F(Texts, GiveTheCommandItsThreeNames)
+TEST_P(Texts, GiveTheCommandItsThreeNames)
 {
     EXPECT_EQ(mTexts.at(kCommandGroup), L"MODRIG");
     EXPECT_EQ(mTexts.at(kCommandGlobalName), L"MODRIG");
@@ -172,12 +201,12 @@ TEST_F(Texts, GiveTheCommandItsThreeNames)
 }
 
 // The host prints the text inside a Lisp string, where these two would end it or begin something else.
-TEST_F(Texts, KeepTheLispPromptFreeOfWhatLispReadsInAString)
+TEST_P(Texts, KeepTheLispPromptFreeOfWhatLispReadsInAString)
 {
     EXPECT_EQ(mTexts.at(kLispPrompt).find_first_of(L"\"\\"), std::wstring::npos);
 }
 
-TEST_F(Texts, NeitherBeginNorEndWithBlanksOrLineEnds)
+TEST_P(Texts, NeitherBeginNorEndWithBlanksOrLineEnds)
 {
     for (const auto& [id, text] : mTexts)
     {

@@ -10,6 +10,8 @@
 #include <elf.h>
 #include <link.h>
 
+#include "host/text/Translation.h"
+
 // The host's own header, put there by the linker: what we load must be made for the same machine.
 extern "C" const ElfW(Ehdr) __ehdr_start __attribute__((visibility("hidden")));
 
@@ -23,16 +25,16 @@ using Segment = ElfW(Phdr);
 constexpr std::size_t kMostSegments = 128;    // linkers write about a dozen
 constexpr std::uint64_t kSmallestPage = 4096; // the smallest page that segments are laid out for
 
-constexpr std::wstring_view kNoLibrary = L"it is not a shared library";
-constexpr std::wstring_view kProgram = L"it is a program, not a shared library";
-constexpr std::wstring_view kObjectFile = L"it is an object file, not a shared library";
-constexpr std::wstring_view kOtherMachine = L"it is built for another kind of processor";
-constexpr std::wstring_view kCutShort = L"the file is cut short";
-constexpr std::wstring_view kDamaged = L"its program headers are damaged";
+constexpr auto kNoLibrary = Sentence(L"it is not a shared library");
+constexpr auto kProgram = Sentence(L"it is a program, not a shared library");
+constexpr auto kObjectFile = Sentence(L"it is an object file, not a shared library");
+constexpr auto kOtherMachine = Sentence(L"it is built for another kind of processor");
+constexpr auto kCutShort = Sentence(L"the file is cut short");
+constexpr auto kDamaged = Sentence(L"its program headers are damaged");
 
-Failure refused(std::wstring_view reason)
+Failure refused(Sentence<> reason)
 {
-    return {std::wstring(reason)};
+    return {translated(reason)};
 }
 
 bool fits(std::uint64_t offset, std::uint64_t size, std::uint64_t whole)

@@ -8,6 +8,7 @@
 #include <mach-o/loader.h>
 
 #include "host/applications/platform/MachOFile.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -15,14 +16,14 @@ namespace
 {
 constexpr std::uint32_t kMostArchitectures = 32;
 
-constexpr std::wstring_view kNoLibrary = L"it is not a shared library";
-constexpr std::wstring_view kProgram = L"it is a program, not a shared library";
-constexpr std::wstring_view kOtherMachine = L"it is built for another kind of processor";
-constexpr std::wstring_view kCutShort = L"the file is cut short";
+constexpr auto kNoLibrary = Sentence(L"it is not a shared library");
+constexpr auto kProgram = Sentence(L"it is a program, not a shared library");
+constexpr auto kOtherMachine = Sentence(L"it is built for another kind of processor");
+constexpr auto kCutShort = Sentence(L"the file is cut short");
 
-Failure refused(std::wstring_view reason)
+Failure refused(Sentence<> reason)
 {
-    return {std::wstring(reason)};
+    return {translated(reason)};
 }
 
 cpu_type_t ownProcessor()

@@ -22,7 +22,8 @@
     (loop while waiting
           do (let ((next (pop waiting)))
                (cond ((> (incf count) +most-values+)
-                      (error "The answer holds more than ~D values, or is circular." +most-values+))
+                      (error "~A" (translated "The answer holds more than {} values, or is circular."
+                                              +most-values+)))
                      ((consp next)
                       (when (cdr next)
                         (push (cdr next) waiting))
@@ -34,7 +35,7 @@
   (let ((symbol (find-symbol (string-upcase name) *package*)))
     (if (and symbol (fboundp symbol) (not (macro-function symbol)) (not (special-operator-p symbol)))
         (fdefinition symbol)
-        (error "There is no Lisp function ~A." name))))
+        (error "~A" (translated "There is no Lisp function {}." name)))))
 
 (defun invoke (name arguments)
   (call-guarded

@@ -57,12 +57,13 @@
 
 (defun report (condition)
   (typecase condition
-    (ext:stack-overflow "stack overflow: the recursion is endless or too deep.")
-    (storage-condition "the memory for Lisp is exhausted.")
-    (division-by-zero "division by zero.")
-    (end-of-file "the end of the input was reached too soon.")
+    (ext:stack-overflow *stack-overflow*)
+    (storage-condition *memory-exhausted*)
+    (division-by-zero (translated "division by zero."))
+    (end-of-file (translated "the end of the input was reached too soon."))
     (t (handler-case (with-plain-printing (report-text condition))
-         (error () (format nil "an error of the type ~S, which cannot be printed." (type-of condition)))))))
+         (error () (translated "an error of the type {}, which cannot be printed."
+                                    (prin1-to-string (type-of condition))))))))
 
 (defun reader-fault (condition)
   "The report of a reader error without its first line, which names a stream; the place says more."
@@ -78,14 +79,14 @@
                                (cl:princ-to-string condition)))))
     ;; Some have no report of their own.
     (if (eql 0 (search "#<" line))
-        (format nil "an error of the type ~S." (type-of condition))
+        (translated "an error of the type {}." (prin1-to-string (type-of condition)))
         line)))
 
 (defun failed (text &optional (at (current-place)))
   (destructuring-bind (place file in-that-file) at
     (when file
       (%file-failed file (cond ((null place) nil)
-                               (in-that-file (format nil "line ~D: ~A" (cdr place) text))
+                               (in-that-file (translated "line {}: {}" (cdr place) text))
                                (t (placed place text)))))
     (cons :failed (placed place text))))
 
@@ -101,7 +102,7 @@
 (defun interrupted ()
   "Runs in the midst of whatever Lisp is doing. The request may have come too late, for an evaluation that is over."
   (when (%interrupt-wanted)
-    (throw '%abandoned (failed "Lisp was interrupted."))))
+    (throw '%abandoned (failed *interrupted*))))
 
 (defun call-guarded (function)
   (catch '%abandoned
@@ -119,7 +120,7 @@
 (defun next-form (text start end-marker)
   (handler-case (read-from-string text nil end-marker :start start)
     (end-of-file ()
-      (error "The form that begins here is never closed."))))
+      (error "~A" (translated "The form that begins here is never closed.")))))
 
 (defun white-space-p (character)
   (member character '(#\Space #\Newline #\Tab #\Return #\Page)))

@@ -58,7 +58,7 @@
         (*load-truename* (ignore-errors (truename name))))
     (let ((*place* (cons name 1)))
       (when (> *loading-depth* +deepest-loading+)
-        (error "Files load one another more than ~D deep." +deepest-loading+))
+        (error "~A" (translated "Files load one another more than {} deep." +deepest-loading+)))
       (ecase kind
         (:source (run-source text))
         (:compiled (run-compiled text))))

@@ -39,4 +39,5 @@
   (let ((package (make-package "TESSEL-USER" :use '("COMMON-LISP"))))
     (shadowing-import (if removing (append *always-offered* *offered-when-removing*) *always-offered*) package)
     (setf *user-package* package
-          *user-readtable* (mended (copy-readtable nil)))))
+          *user-readtable* (mended (copy-readtable nil))))
+  (find-words))

@@ -18,7 +18,7 @@
   (tessel:load file))
 
 (defun tessel:qz-unload-rpk (name)
-  (format t "~&No packaged application named ~A is loaded.~%" name)
+  (format t "~&~A~%" (translated "No packaged application named {} is loaded." name))
   nil)
 
 (defun tessel:princ (&optional (object nil given) (stream *standard-output*))
@@ -37,7 +37,7 @@
 
 (defun refuse-to-quit (&rest arguments)
   (declare (ignore arguments))
-  (error "Lisp cannot end the host; type QUIT without parentheses to do so."))
+  (error "~A" (translated "Lisp cannot end the host; type QUIT without parentheses to do so.")))
 
 (defun tessel:quit (&rest arguments)
   (apply #'refuse-to-quit arguments))

@@ -13,10 +13,24 @@
 
 #import <Foundation/Foundation.h>
 
+namespace
+{
+// Whoever runs the tests reads the texts that they expect, unless a run asks for another language.
+void speakOneLanguage()
+{
+    const char* language = std::getenv("LANGUAGE_OF_TESTS");
+    unsetenv("LANGUAGE");
+    unsetenv("LC_ALL");
+    setenv("LANG", "C.UTF-8", 1);
+    setenv("LC_MESSAGES", language ? language : "C", 1);
+}
+} // namespace
+
 int main(int argc, char** argv)
 try
 {
     testing::InitGoogleTest(&argc, argv);
+    speakOneLanguage();
     const VirtualDisplay display;
     setenv("DISPLAY", display.name().c_str(), 1);
     NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];

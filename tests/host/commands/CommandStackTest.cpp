@@ -183,6 +183,72 @@ TEST_F(Commands, OfApplicationsTakeNoArguments)
     EXPECT_EQ(output.text(), "The command \"A\" failed: it takes no arguments.\n");
 }
 
+TEST_F(Commands, OfApplicationsTakeArgumentsWhenTheySaySo)
+{
+    add(kFirst, L"DRAW", L"A", L"A");
+    EXPECT_EQ(tsedTakeArguments(L"draw", L"a", L"[word]"), TSED_COMMAND_OK);
+    EXPECT_TRUE(runner.run(LR"(A 1 "2 3")"));
+    EXPECT_EQ(calls, 1);
+    EXPECT_EQ(stack.descriptions().back().usage, L"[word]");
+}
+
+TEST_F(Commands, OfApplicationsSayThatTheyHaveFailed)
+{
+    stack.addCommand(
+        L"DRAW", L"A", L"EINS", 0, [] { tsedFailCommand(L"Nothing to do."); }, nullptr, -1, nullptr, nullptr);
+    EXPECT_FALSE(runner.run(L"EINS"));
+    EXPECT_EQ(output.text(), "Nothing to do.\n");
+    stack.addCommand(
+        L"DRAW", L"B", L"ZWEI", 0, [] { tsedFailCommand(nullptr); }, nullptr, -1, nullptr, nullptr);
+    EXPECT_EQ(tsedTakeArguments(L"DRAW", L"B", L"[word]"), TSED_COMMAND_OK);
+    EXPECT_FALSE(runner.run(L"ZWEI x"));
+    EXPECT_EQ(output.text(), "Nothing to do.\nUsage: ZWEI [word]\n");
+}
+
+TEST_F(Commands, ThatAreAnnouncedAreListedUntilTheyAreThere)
+{
+    const auto listed = [this]
+    {
+        std::vector<std::wstring> all;
+        for (const auto& description : stack.descriptions())
+            all.push_back(description.group + L":" + description.name + L":" + description.summary);
+        return all;
+    };
+    add(kFirst, L"DRAW", L"A", L"A");
+    add(kSecond, L"OTHER", L"B", L"B");
+    stack.announce({L"draw", L"LATER", L"[word]", L"Announced"});
+    EXPECT_THAT(listed(), ElementsAre(L"DRAW:A:", L"draw:LATER:Announced", L"OTHER:B:"));
+    EXPECT_THAT(stack.names(), ElementsAre(L"A", L"B", L"LATER"));
+    EXPECT_FALSE(runner.run(L"LATER")) << "nobody has loaded it";
+    add(kFirst, L"DRAW", L"LATER", L"LATER");
+    EXPECT_THAT(listed(), ElementsAre(L"DRAW:A:", L"DRAW:LATER:", L"OTHER:B:"));
+    EXPECT_THAT(stack.names(), ElementsAre(L"A", L"B", L"LATER"));
+    stack.removeCommandsOf(kFirst);
+    EXPECT_THAT(listed(), ElementsAre(L"OTHER:B:", L"draw:LATER:Announced"));
+}
+
+TEST_F(Commands, OfTheHostAnswerProgramsByAnotherHandler)
+{
+    std::vector<std::wstring> asked;
+    const auto into = [&asked](const wchar_t* whom)
+    {
+        return [&asked, whom](const auto& arguments)
+        {
+            asked.emplace_back(whom + std::to_wstring(arguments.size()));
+            return tessel::Result<>();
+        };
+    };
+    stack.addBuiltIn({L"Session", L"SHOW", L"", L""}, into(L"person"));
+    stack.addBuiltIn({L"Session", L"OTHER", L"", L""}, into(L"other"));
+    stack.addListing(L"SHOW", into(L"program"));
+    for (const wchar_t* line : {L"SHOW", L"SHOW --json", L"SHOW a --json", L"SHOW --json a", L"OTHER --json"})
+        EXPECT_TRUE(runner.run(line));
+    EXPECT_THAT(asked, ElementsAre(L"person0", L"program0", L"program1", L"person2", L"other1"));
+    EXPECT_TRUE(tessel::isForPrograms(L"SHOW  a --json "));
+    EXPECT_FALSE(tessel::isForPrograms(L"--json"));
+    EXPECT_FALSE(tessel::isForPrograms(L"SHOW --json a"));
+}
+
 TEST_F(Commands, OfTheHostTakeArgumentsAndStay)
 {
     std::vector<std::wstring> seen;

@@ -145,6 +145,30 @@ TEST_F(Marker, DoesNotTakeARunningSessionForOneThatIsOver)
     EXPECT_EQ(filesOfSessions(), 1U) << "the other's is still there, and ours is gone";
 }
 
+TEST_F(Marker, KnowsWhetherAnotherSessionRuns)
+{
+    vanishAfter([](RunningMarker& marker) { marker.begin(Deed::kLoading, "/a"); });
+    const RunningMarker own(mFolder.path());
+    EXPECT_EQ(filesOfSessions(), 2U);
+    EXPECT_FALSE(own.otherSessionRuns()) << "one that is over does not count, nor does this one";
+    {
+        const ChildProcess other(
+            [this](int output)
+            {
+                const RunningMarker marker(mFolder.path());
+                const std::string answer = marker.otherSessionRuns() ? "sees it\n" : "is alone\n";
+                [[maybe_unused]] const auto told = write(output, answer.data(), answer.size());
+                for (;;)
+                    pause();
+            });
+        ASSERT_EQ(other.readLine(), "sees it");
+        EXPECT_TRUE(own.otherSessionRuns());
+        EXPECT_TRUE(own.otherSessionRuns()) << "asking changes nothing";
+    }
+    EXPECT_FALSE(own.otherSessionRuns());
+    EXPECT_FALSE(RunningMarker().otherSessionRuns());
+}
+
 // An application may start programs of its own that outlive the host.
 TEST_F(Marker, DoesNotTakeAChildOfTheSessionForTheSession)
 {

@@ -29,12 +29,13 @@ protected:
     {
         sources.usage = [](const std::wstring& command)
         {
-            return command == L"load"  ? L"file\naddress"
+            return command == L"load"  ? L"file | address"
                    : command == L"CD"  ? L"[folder]"
                    : command == L"SET" ? L"[variable [value]]"
-                   : command == L"REG" ? L"LIST [key]\nEXPORT key file [UTF8]\nRESET\nRESTORE"
+                   : command == L"REG" ? L"LIST [key] | EXPORT key file [UTF8] | RESET | RESTORE"
                    : command == L"BI"  ? L"[START|GOOD|BAD|STOP]"
-                   : command == L"HE"  ? L"[command]\ntopic"
+                   : command == L"HE"  ? L"[command] | topic"
+                   : command == L"SUI" ? L"LIST | ADD file... | CLEAR [--json]"
                                        : L"";
         };
         sources.variables = []
@@ -184,6 +185,8 @@ TEST_F(Completions, OfArgumentsFollowTheWaysOfTypingTheCommand)
     EXPECT_EQ(after(L"BI st"), L"BI ST|START|STOP");
     EXPECT_EQ(after(L"BI START "), L"nothing");
     EXPECT_EQ(after(L"UNKNOWN "), L"nothing");
+    EXPECT_EQ(after(L"SUI CLEAR -"), L"SUI CLEAR --json ");
+    EXPECT_EQ(after(L"SUI ADD one two ge"), L"SUI ADD one two gears.lsp ") << "it can be repeated";
 }
 
 TEST_F(Completions, OfKeysKnowWhereAPathGoesOn)

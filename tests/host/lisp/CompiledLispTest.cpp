@@ -72,12 +72,12 @@ TEST(CompiledLisp, IsRefusedAtAnyOtherLength)
 TEST(CompiledLisp, TellsWhatIsWrong)
 {
     const std::string whole = packCompiledLisp("(1 . code)");
-    EXPECT_EQ(unpackCompiledLisp("(defun a () 1)").sentence(), L"is not compiled Lisp");
+    EXPECT_EQ(unpackCompiledLisp("(defun a () 1)").sentence(), L"it is not compiled Lisp");
     EXPECT_EQ(unpackCompiledLisp(std::string_view(whole).substr(0, whole.size() - 1)).sentence(),
-              L"is cut short");
-    EXPECT_EQ(unpackCompiledLisp(whole + "x").sentence(), L"is damaged");
+              L"it is cut short");
+    EXPECT_EQ(unpackCompiledLisp(whole + "x").sentence(), L"it is damaged");
     std::string other = whole;
     other[8] = 99;
     EXPECT_EQ(unpackCompiledLisp(other).sentence(),
-              L"was compiled for another version of Lisp; compile it again");
+              L"it was compiled for another version of Lisp; compile it again");
 }

@@ -22,11 +22,13 @@ protected:
     TemporaryFolder folder;
     bool hasBrowser = false;
     std::filesystem::path shown;
-    tessel::Owned<tessel::Help> help{folder / "book", [this](const auto& page)
+    tessel::Owned<tessel::Help> help{folder / "book",
+                                     [this](const auto& page)
                                      {
                                          shown = page;
                                          return hasBrowser;
-                                     }};
+                                     },
+                                     std::vector<std::string>{"de_AT", "de", "en", "fr"}};
 };
 } // namespace
 
@@ -68,6 +70,34 @@ TEST_F(HelpBook, CanBeAnApplicationsOwn)
     folder.write("other/topic.html", "<p>Other</p>");
     EXPECT_TRUE(tsedHelp((folder / "other").wstring().c_str(), L"topic", 0));
     EXPECT_EQ(shown, folder / "other/topic.html");
+}
+
+TEST_F(HelpBook, OpensAPageInTheFirstOfThePersonsLanguagesThatHasIt)
+{
+    folder.write("book/de/suite.html", "<p>Gruppe</p>");
+    folder.write("book/fr/suite.html", "<p>Suite</p>");
+    EXPECT_TRUE(tsedHelp(nullptr, L"suite", 0));
+    EXPECT_EQ(shown, folder / "book/de/suite.html");
+    folder.write("book/de_AT/suite.html", "<p>Gruppe</p>");
+    EXPECT_TRUE(tsedHelp(nullptr, L"suite", 0));
+    EXPECT_EQ(shown, folder / "book/de_AT/suite.html");
+}
+
+// Nobody who would rather read English gets French.
+TEST_F(HelpBook, OpensThePageOfNoFolderInTheTurnOfEnglish)
+{
+    folder.write("book/fr/suite.html", "<p>Suite</p>");
+    EXPECT_TRUE(tsedHelp(nullptr, L"suite", 0));
+    EXPECT_EQ(shown, folder / "book/suite.html");
+}
+
+TEST_F(HelpBook, HasPagesInOneLanguageThatAnotherLacks)
+{
+    folder.write("book/fr/topic.html", "<p>Sujet</p>");
+    folder.write("book/de/suite.html", "<p>Gruppe</p>");
+    EXPECT_TRUE(tsedHelp(nullptr, L"index", 0));
+    EXPECT_EQ(shown, folder / "book/index.html");
+    EXPECT_FALSE(tsedHelp(nullptr, L"topic", 0));
 }
 
 TEST(Help, IsNotThereWithoutAHost)

@@ -181,6 +181,24 @@ TEST_F(Layers, IsWhatTheCallsOfApplicationsSee)
     EXPECT_EQ(RegOpenKeyExW(HKEY_CURRENT_USER, L"No", 0, KEY_READ, &key), ERROR_FILE_NOT_FOUND);
 }
 
+TEST_F(Layers, TellsApplicationsWhatIsLaidDownAndWhere)
+{
+    layOut("near/a.reg", "[HKCU\\K]\n\"a\"=\"default\"\n");
+    layOut("near/policy/a.reg", "[HKCU\\K]\n\"p\"=\"policy\"\n");
+    HKEY key = nullptr;
+    ASSERT_EQ(RegOpenKeyExW(HKEY_CURRENT_USER, L"K", 0, KEY_READ, &key), ERROR_SUCCESS);
+    wchar_t place[300] = L"before";
+    EXPECT_FALSE(tsRegIsLaidDown(key, L"a", place, 300));
+    EXPECT_STREQ(place, L"before");
+    EXPECT_TRUE(tsRegIsLaidDown(key, L"P", place, 300));
+    EXPECT_EQ(tessel::toUtf8(place), (host.folder() / "near/policy/a.reg").string());
+    EXPECT_TRUE(tsRegIsLaidDown(key, L"p", place, 4));
+    EXPECT_EQ(tessel::toUtf8(place), (host.folder() / "near/policy/a.reg").string().substr(0, 3));
+    EXPECT_TRUE(tsRegIsLaidDown(key, L"p", nullptr, 0));
+    EXPECT_EQ(RegCloseKey(key), ERROR_SUCCESS);
+    EXPECT_FALSE(tsRegIsLaidDown(key, L"p", nullptr, 0));
+}
+
 // Who replaces all values removes them one by one: those that cannot go would never end.
 TEST_F(Layers, IsGoneThroughByIndexInThePersonsOwnValues)
 {

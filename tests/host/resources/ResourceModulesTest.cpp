@@ -36,7 +36,7 @@ TEST_F(ResourceModulesOfAHost, OpenAFileByItsFullPathWithEitherSeparator)
 {
     const auto path = texts("folder/Texts.dll");
     const HMODULE module = open(path);
-    EXPECT_EQ(text(module, 1), L"Load/Unload Applications");
+    EXPECT_EQ(text(module, 15), L"Größe, çà, Ελλάδα");
     EXPECT_EQ(LoadLibrary((toWide((mFolder / "folder").native()) + L"\\Texts.dll").c_str()), module);
     EXPECT_EQ(output(), "");
 }
@@ -156,4 +156,27 @@ TEST_F(ResourceModulesOfAHost, CutATextToTheBufferAndCountOneCharacterForAnEmoji
     buffer[0] = L'?';
     EXPECT_EQ(loadStringFromWin32ResourceDLL(module, 3, buffer, 8), 0);
     EXPECT_STREQ(buffer, L"");
+}
+
+// The person's are those of Austria and German of any country; the module has that of Germany.
+TEST_F(ResourceModulesOfAHost, AnswerInThePersonsLanguageAndElseInTheFirstOfTheModule)
+{
+    const HMODULE module = open(texts("Texts.dll"));
+    EXPECT_EQ(text(module, 1), L"Anwendungen laden/entladen");
+    EXPECT_EQ(text(module, 2), L"%s \"quoted\" 100%% \\ tab\there"); // beside German ones
+    EXPECT_EQ(text(module, 16), L"漢字とかな");
+    EXPECT_EQ(text(module, 4), L"Bereit.");
+    EXPECT_EQ(text(module, 5), L"Délier"); // nobody wants French, but there is nothing else
+    EXPECT_EQ(text(module, 6), L"");
+}
+
+TEST_F(ResourceModulesOfAHost, AnswerInTheFirstLanguageOfTheModuleWhereThePersonNamesNone)
+{
+    const auto path = texts("Texts.dll");
+    tessel::ResourceModules resources(L"", mCalls, {});
+    const auto module = resources.open(toWide(path.native()).c_str());
+    ASSERT_TRUE(module);
+    EXPECT_EQ(resources.string(*module, 1), L"Load/Unload Applications");
+    EXPECT_EQ(resources.string(*module, 4), L"Bereit."); // German stands before French in the file
+    EXPECT_EQ(resources.string(*module, 40), L"Nur auf Deutsch");
 }

@@ -70,7 +70,8 @@ protected:
                                    }};
     tessel::LoadOutcomes mOutcomes;
     tessel::DynamicLinker mLinker{mCommandLine, mCalls, mCommands, mMessageBox, mOutcomes, mAdmission};
-    tessel::ResourceModules mResources{tessel::toWide((mFolder / "HostResources").native()), mCalls};
+    tessel::ResourceModules mResources{
+        tessel::toWide((mFolder / "HostResources").native()), mCalls, {"de_AT", "de"}};
 
 private:
     tessel::Published<tessel::CommandLine> mPublishedCommandLine{mCommandLine};

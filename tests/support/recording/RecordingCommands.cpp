@@ -2,6 +2,8 @@
 
 #include <algorithm>
 #include <cwctype>
+#include <iterator>
+#include <sstream>
 
 #include "host/text/Unicode.h"
 #include "tests/support/RecordingHost.h"
@@ -22,15 +24,22 @@ bool isCommand(const TsEdCommand& command, const std::wstring& group, const std:
 }
 } // namespace
 
-bool RecordingCommands::type(const std::wstring& name)
+bool RecordingCommands::type(const std::wstring& line)
 {
+    std::wistringstream words(line);
+    std::wstring name;
+    words >> name;
+    const std::vector<std::wstring> typed{std::istream_iterator<std::wstring, wchar_t>(words), {}};
     const TsEdCommand* found = find(name);
-    if (!found)
+    if (!found || (!typed.empty() && found->usage.empty()))
         return false;
     const TsEdCommandHandler handler = found->handler; // the handler may remove its own command
     const RecordingCaller caller(found->owner);
+    failure.reset();
+    arguments = typed;
     handler();
-    return true;
+    arguments.clear();
+    return !failure;
 }
 
 void RecordingCommands::removeCommandsOf(const std::wstring& applicationPath)
@@ -83,15 +92,28 @@ int RecordingCommands::describe(const std::wstring& group, const std::wstring& g
                                 const std::wstring& description)
 {
     recordingHost().journal.add(L"tsedDescribeCommand", {group, globalName, description});
+    return setLine(group, globalName, &TsEdCommand::description, description);
+}
+
+int RecordingCommands::takeArguments(const std::wstring& group, const std::wstring& globalName,
+                                     const std::wstring& usage)
+{
+    recordingHost().journal.add(L"tsedTakeArguments", {group, globalName, usage});
+    return setLine(group, globalName, &TsEdCommand::usage, usage);
+}
+
+int RecordingCommands::setLine(const std::wstring& group, const std::wstring& globalName,
+                               std::wstring TsEdCommand::*line, const std::wstring& text)
+{
     const bool isOneLine =
-        std::none_of(description.begin(), description.end(),
+        std::none_of(text.begin(), text.end(),
                      [](wchar_t character) { return std::iswcntrl(static_cast<wint_t>(character)) != 0; });
-    if (description.empty() || !isOneLine)
+    if (text.empty() || !isOneLine)
         return TSED_COMMAND_INVALID;
     for (const auto& command : mCommands)
         if (isCommand(*command, group, globalName))
         {
-            command->description = description;
+            (*command).*line = text;
             return TSED_COMMAND_OK;
         }
     return TSED_COMMAND_UNKNOWN;
@@ -131,4 +153,26 @@ bool TsEdCommandStack::isKindOf(const wchar_t* className) const
 int tsedDescribeCommand(const wchar_t* group, const wchar_t* globalName, const wchar_t* description)
 {
     return recordingHost().commands.describe(orEmpty(group), orEmpty(globalName), orEmpty(description));
+}
+
+int tsedTakeArguments(const wchar_t* group, const wchar_t* globalName, const wchar_t* usage)
+{
+    return recordingHost().commands.takeArguments(orEmpty(group), orEmpty(globalName), orEmpty(usage));
+}
+
+TsResultBuffer* tsedCommandArguments()
+{
+    TsResultBuffer* list = nullptr;
+    TsResultBuffer** end = &list;
+    for (const std::wstring& argument : recordingHost().commands.arguments)
+    {
+        *end = tsutBuildList({TsRbValue::String(argument.c_str())});
+        end = &(*end)->next;
+    }
+    return list;
+}
+
+void tsedFailCommand(const wchar_t* sentence)
+{
+    recordingHost().commands.failure = orEmpty(sentence);
 }

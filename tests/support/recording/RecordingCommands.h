@@ -22,6 +22,7 @@ public:
     bool hasResult = false;        // whether the caller asked for the new command
     std::wstring owner;            // the application that was being called
     std::wstring description = {}; // what HELP would tell
+    std::wstring usage = {};       // its arguments; empty where it takes none
     int status = TSED_COMMAND_OK;
 };
 
@@ -34,9 +35,14 @@ public:
     // When set, `addCommand` answers this and adds nothing.
     std::optional<int> answerToAdd;
 
-    // Runs the command of that local name, or of that global name after a "_", in any case. False when there
-    // is none.
-    bool type(const std::wstring& name);
+    // Runs the command of that local name, or of that global name after a "_", in any case, with the words
+    // after it as its arguments. False when there is none, when it takes no arguments, or when it says that
+    // it has failed.
+    bool type(const std::wstring& line);
+    // What the running command was typed with, and what the last one said of itself; empty for wrong
+    // arguments.
+    std::vector<std::wstring> arguments;
+    std::optional<std::wstring> failure;
     bool has(const std::wstring& localName) const { return find(localName) != nullptr; }
 
     // The commands that go when their application is unloaded.
@@ -49,11 +55,14 @@ public:
     int removeGroup(const wchar_t* group) override;
 
     int describe(const std::wstring& group, const std::wstring& globalName, const std::wstring& description);
+    int takeArguments(const std::wstring& group, const std::wstring& globalName, const std::wstring& usage);
     // What a command of that global name was described with.
     std::wstring descriptionOf(const std::wstring& globalName) const;
 
 private:
     const TsEdCommand* find(const std::wstring& typedName) const;
+    int setLine(const std::wstring& group, const std::wstring& globalName, std::wstring TsEdCommand::*line,
+                const std::wstring& text);
     int statusOfAdding(const TsEdCommand& command) const;
 
     std::vector<std::unique_ptr<TsEdCommand>> mCommands; // those that can be typed now

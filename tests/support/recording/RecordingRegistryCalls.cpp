@@ -49,3 +49,9 @@ LONG tsudRegSetString(HKEY key, const wchar_t* name, const wchar_t* data)
 {
     return recordingHost().registry.write(key, name, data);
 }
+
+// Nobody lays values down here.
+bool tsRegIsLaidDown(HKEY, const wchar_t*, wchar_t*, std::size_t)
+{
+    return false;
+}

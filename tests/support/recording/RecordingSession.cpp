@@ -13,3 +13,8 @@ void tsrxBeforeWaiting(bool actionIsOver)
 {
     recordingHost().session.waits.push_back(actionIsOver);
 }
+
+bool tsrxOtherSessionRuns()
+{
+    return recordingHost().session.otherSessionRuns;
+}

@@ -5,6 +5,7 @@
 
 struct RecordingSession
 {
-    int endRequest = -1;     // tsrxEndRequest; the descriptor stays the caller's
+    int endRequest = -1; // tsrxEndRequest; the descriptor stays the caller's
+    bool otherSessionRuns = false;
     std::vector<bool> waits; // the calls of tsrxBeforeWaiting, and whether an action was over
 };

@@ -2,18 +2,21 @@
 
 #import <AppKit/AppKit.h>
 
+#include "host/ui/Words.h"
+
 namespace tessel::windowing
 {
 // Command with a letter is a matter of the Edit menu here, which a host without a menu bar has not got.
 void takeTextKeys()
 {
-    NSMenu* edit = [[[NSMenu alloc] initWithTitle:@"Edit"] autorelease];
-    [edit addItemWithTitle:@"Undo" action:@selector(undo:) keyEquivalent:@"z"];
-    [edit addItemWithTitle:@"Cut" action:@selector(cut:) keyEquivalent:@"x"];
-    [edit addItemWithTitle:@"Copy" action:@selector(copy:) keyEquivalent:@"c"];
-    [edit addItemWithTitle:@"Paste" action:@selector(paste:) keyEquivalent:@"v"];
-    [edit addItemWithTitle:@"Select All" action:@selector(selectAll:) keyEquivalent:@"a"];
-    NSMenuItem* item = [[[NSMenuItem alloc] initWithTitle:@"Edit" action:nullptr
+    NSMenu* edit = [[[NSMenu alloc] initWithTitle:word(@"EDIT")] autorelease];
+    // Texts take this one, though no header says so.
+    [edit addItemWithTitle:word(@"UNDO") action:NSSelectorFromString(@"undo:") keyEquivalent:@"z"];
+    [edit addItemWithTitle:word(@"CUT") action:@selector(cut:) keyEquivalent:@"x"];
+    [edit addItemWithTitle:word(@"COPY") action:@selector(copy:) keyEquivalent:@"c"];
+    [edit addItemWithTitle:word(@"PASTE") action:@selector(paste:) keyEquivalent:@"v"];
+    [edit addItemWithTitle:word(@"SELECT_ALL") action:@selector(selectAll:) keyEquivalent:@"a"];
+    NSMenuItem* item = [[[NSMenuItem alloc] initWithTitle:word(@"EDIT") action:nullptr
                                             keyEquivalent:@""] autorelease];
     [item setSubmenu:edit];
     NSMenu* bar = [[[NSMenu alloc] initWithTitle:@""] autorelease];

@@ -4,6 +4,7 @@
 
 #include <algorithm>
 
+#include "host/ui/Words.h"
 #include "host/ui/platform/Windowing.h"
 #include "host/ui/platform/gnustep/Keys.h"
 #include "host/ui/platform/gnustep/TesselTheme.h"
@@ -128,7 +129,7 @@ NSBezierPath* triangleIn(NSRect frame)
 {
     NSButton* button = [[[NSButton alloc]
         initWithFrame:NSMakeRect(origin.x, origin.y, kButtonSize.width, kButtonSize.height)] autorelease];
-    [button setTitle:@"OK"];
+    [button setTitle:tessel::word(@"OK")];
     [button setFont:[NSFont systemFontOfSize:kMessageFontSize]];
     [button setBezelStyle:NSRoundedBezelStyle];
     [button setKeyEquivalent:@"\r"];

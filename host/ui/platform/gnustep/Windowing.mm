@@ -6,6 +6,7 @@
 
 #include "host/ui/platform/gnustep/Behaviour.h"
 #include "host/ui/platform/gnustep/DisplayProbe.h"
+#include "host/ui/platform/gnustep/Languages.h"
 #include "host/ui/platform/gnustep/Mnemonics.h"
 #include "host/ui/platform/gnustep/Settings.h"
 #include "host/ui/platform/gnustep/TabKeys.h"
@@ -50,6 +51,7 @@ void prepareToolkit(NSString* folder)
     keepSettingsIn(folder);
     keepComplaintsIn(folder);
     keepHelperProgramsToTheSession();
+    takePersonsLanguages();
 }
 
 void chooseLook()

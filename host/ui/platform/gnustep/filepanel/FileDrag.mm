@@ -2,11 +2,12 @@
 
 #include <string>
 
+#include "host/ui/Words.h"
 #include "host/ui/platform/gnustep/Keys.h"
 #include "host/ui/platform/gnustep/filepanel/PanelState.h"
-#include "host/ui/platform/gnustep/filepanel/Words.h"
 
 using namespace tessel::filepanel;
+using tessel::wordWith;
 
 namespace
 {

@@ -5,15 +5,16 @@
 #include <tessel/tsmessagebox.h>
 #include <wincompat/winstring.h>
 
+#include "host/ui/Words.h"
 #import "host/ui/platform/gnustep/filepanel/FileDrag.h"
 #import "host/ui/platform/gnustep/filepanel/FilePanel.h"
 #import "host/ui/platform/gnustep/filepanel/FileTable.h"
 #include "host/ui/platform/gnustep/filepanel/Folders.h"
 #include "host/ui/platform/gnustep/filepanel/PanelState.h"
 #include "host/ui/platform/gnustep/filepanel/TypedNames.h"
-#include "host/ui/platform/gnustep/filepanel/Words.h"
 
 using namespace tessel::filepanel;
+using tessel::wordWith;
 
 namespace
 {

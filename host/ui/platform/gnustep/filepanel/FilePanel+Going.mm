@@ -1,13 +1,14 @@
 #import <tesselui/TsUIPersistentStore.h>
 
+#include "host/ui/Words.h"
 #include "host/ui/platform/gnustep/Keys.h"
 #import "host/ui/platform/gnustep/filepanel/FilePanel.h"
 #import "host/ui/platform/gnustep/filepanel/FileTable.h"
 #include "host/ui/platform/gnustep/filepanel/Folders.h"
 #include "host/ui/platform/gnustep/filepanel/PanelState.h"
-#include "host/ui/platform/gnustep/filepanel/Words.h"
 
 using namespace tessel::filepanel;
+using tessel::word;
 
 namespace
 {

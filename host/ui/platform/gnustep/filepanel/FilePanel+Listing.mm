@@ -4,6 +4,7 @@
 #include <tesselui/tsuieach.h>
 
 #include "host/text/DayAndTime.h"
+#include "host/ui/Words.h"
 #include "host/ui/platform/gnustep/ThemePictures.h"
 #import "host/ui/platform/gnustep/filepanel/FileNameCell.h"
 #import "host/ui/platform/gnustep/filepanel/FilePanel.h"
@@ -11,9 +12,9 @@
 #include "host/ui/platform/gnustep/filepanel/Folders.h"
 #include "host/ui/platform/gnustep/filepanel/PanelState.h"
 #import "host/ui/platform/gnustep/filepanel/PathBar.h"
-#include "host/ui/platform/gnustep/filepanel/Words.h"
 
 using namespace tessel::filepanel;
+using tessel::word;
 
 namespace
 {

@@ -4,14 +4,15 @@
 #include <tesselui/tsuifilepanel.h>
 
 #include "host/ui/Label.h"
+#include "host/ui/Words.h"
 #import "host/ui/platform/gnustep/filepanel/FileNameCell.h"
 #import "host/ui/platform/gnustep/filepanel/FilePanel.h"
 #import "host/ui/platform/gnustep/filepanel/FileTable.h"
 #include "host/ui/platform/gnustep/filepanel/Layout.h"
 #import "host/ui/platform/gnustep/filepanel/PathBar.h"
-#include "host/ui/platform/gnustep/filepanel/Words.h"
 
 using namespace tessel::filepanel;
+using tessel::word;
 using tessel::windowing::kControlFontSize;
 using tessel::windowing::makeLabel;
 

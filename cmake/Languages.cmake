@@ -1,0 +1,45 @@
+# Texts of windows in every language: one folder a language below a folder of resources, as both platforms have it.
+set(LANGUAGES en de) # the first is that of the sources
+
+# copy_strings(OUTPUTS RESOURCES TABLE PLACE): RESOURCES/<language>.lproj/TABLE.strings below the place. Appends the files
+# to the list named OUTPUTS.
+function(copy_strings outputs resources table place)
+  foreach(language IN LISTS LANGUAGES)
+    set(source "${resources}/${language}.lproj/${table}.strings")
+    set(copy "${place}/${language}.lproj/${table}.strings")
+    add_custom_command(
+      OUTPUT "${copy}"
+      COMMAND ${CMAKE_COMMAND} "-DFROM=${source}" "-DTO=${copy}" -P "${CMAKE_SOURCE_DIR}/cmake/CopyStrings.cmake"
+      DEPENDS "${source}" "${CMAKE_SOURCE_DIR}/cmake/CopyStrings.cmake"
+      COMMENT "Copying ${table}.strings (${language})"
+      VERBATIM)
+    list(APPEND ${outputs} "${copy}")
+  endforeach()
+  set(${outputs} "${${outputs}}" PARENT_SCOPE)
+endfunction()
+
+# translate_layout(OUTPUTS RESOURCES LAYOUT PLACE): the windows of RESOURCES/LAYOUT.xib in every language. Their texts in
+# other languages than the first stand in RESOURCES/<language>.lproj/LAYOUT.strings.
+function(translate_layout outputs resources layout place)
+  set(source "${resources}/${layout}.xib")
+  file(REMOVE "${place}/${layout}.xib") # of a build from before there were languages: it would be found first
+  foreach(language IN LISTS LANGUAGES)
+    set(output "${place}/${language}.lproj/${layout}.xib")
+    set(strings "${resources}/${language}.lproj/${layout}.strings")
+    set(make ${CMAKE_COMMAND} "-DLAYOUT=${source}" "-DSTRINGS=${strings}" "-DOUTPUT=${output}"
+        -P "${CMAKE_SOURCE_DIR}/cmake/TranslateLayout.cmake")
+    set(read "${strings}" "${CMAKE_SOURCE_DIR}/cmake/TranslateLayout.cmake")
+    if(NOT EXISTS "${strings}")
+      set(make ${CMAKE_COMMAND} -E copy "${source}" "${output}")
+      set(read "")
+    endif()
+    add_custom_command(
+      OUTPUT "${output}"
+      COMMAND ${make}
+      DEPENDS "${source}" ${read}
+      COMMENT "Laying out ${layout} (${language})"
+      VERBATIM)
+    list(APPEND ${outputs} "${output}")
+  endforeach()
+  set(${outputs} "${${outputs}}" PARENT_SCOPE)
+endfunction()

@@ -1,0 +1,42 @@
+# Writes a layout of windows in another language: LAYOUT (a XIB file), STRINGS and OUTPUT are given. A line of the strings
+# names an object by its id and one of its texts, in the form that AppKit reads beside a layout; GNUstep does not read it.
+# A text without a translation stays as it is in the layout.
+cmake_minimum_required(VERSION 3.25)
+file(READ "${LAYOUT}" layout)
+file(READ "${STRINGS}" rest)
+
+# translate(PATTERN ATTRIBUTE TEXT): in the one element whose beginning fits.
+function(translate pattern attribute text)
+  string(REGEX MATCH "${pattern}" element "${layout}")
+  string(REGEX REPLACE " ${attribute}=\"[^\"]*\"" " ${attribute}=\"@TEXT@\"" translated "${element}")
+  if(element STREQUAL translated OR element STREQUAL "")
+    message(FATAL_ERROR "${STRINGS}: ${LAYOUT} has no text \"${key}\"")
+  endif()
+  string(REPLACE "@TEXT@" "${text}" translated "${translated}")
+  string(REPLACE "${element}" "${translated}" layout "${layout}")
+  set(layout "${layout}" PARENT_SCOPE)
+endfunction()
+
+set(line "\"([^\"]+)\" = \"([^\"]*)\";")
+while(rest MATCHES "${line}")
+  set(key "${CMAKE_MATCH_1}")
+  set(text "${CMAKE_MATCH_2}")
+  string(FIND "${rest}" "${CMAKE_MATCH_0}" start)
+  string(LENGTH "${CMAKE_MATCH_0}" length)
+  math(EXPR start "${start} + ${length}")
+  string(SUBSTRING "${rest}" ${start} -1 rest)
+  string(REPLACE "&" "&amp;" text "${text}")
+  string(REPLACE "<" "&lt;" text "${text}")
+
+  string(REGEX MATCH "^[^.]+" id "${key}")
+  set(element "<[A-Za-z]+ ([^<>]* )?id=\"${id}\"[^<>]*>")
+  if(key MATCHES "[.]ibShadowedToolTip$")
+    translate("${element}" toolTip "${text}")
+  elseif(key MATCHES "[.]headerCell[.]title$")
+    translate("${element}[^<>]*<tableHeaderCell [^<>]*>" title "${text}")
+  else()
+    string(REGEX MATCH "[^.]+$" attribute "${key}")
+    translate("${element}" ${attribute} "${text}")
+  endif()
+endwhile()
+file(WRITE "${OUTPUT}" "${layout}")

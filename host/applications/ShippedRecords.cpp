@@ -1,0 +1,52 @@
+#include "host/applications/ShippedRecords.h"
+
+#include <optional>
+
+#include "host/registry/RegistryLayers.h"
+#include "host/text/Unicode.h"
+
+namespace tessel
+{
+namespace
+{
+std::wstring textAt(const RegistryTree& tree, const std::wstring& key, const std::wstring& name)
+{
+    const auto* value = tree.value(key, name);
+    return value ? value->data : L"";
+}
+
+std::optional<ShippedRecord> readRecord(const RegistryTree& tree, const std::wstring& key,
+                                        const std::wstring& name, const std::filesystem::path& folder)
+{
+    const std::wstring module = textAt(tree, key, L"Module");
+    const auto reasons = parseLoadReasons(textAt(tree, key, L"LoadReasons"));
+    if (module.empty() || !reasons)
+        return std::nullopt;
+    ShippedRecord shipped;
+    shipped.record.name = name;
+    shipped.record.module = toWide((folder / toUtf8(module)).native());
+    shipped.record.description = textAt(tree, key, L"Description");
+    shipped.record.loadReasons = *reasons;
+    for (const auto& command : tree.values(key + L"\\Commands"))
+    {
+        shipped.record.commands.emplace_back(command.name, command.data);
+        shipped.commands.push_back({textAt(tree, key, L"Group"), command.data,
+                                    textAt(tree, key + L"\\Usage", command.name),
+                                    textAt(tree, key + L"\\Summaries", command.name)});
+    }
+    return shipped;
+}
+} // namespace
+
+std::vector<ShippedRecord> readShippedRecords(const std::filesystem::path& folder,
+                                              const std::wstring& productRoot)
+{
+    const RegistryTree tree = readRegistryLayers({folder}).defaults;
+    const std::wstring root = productRoot + L"\\Applications";
+    std::vector<ShippedRecord> records;
+    for (const std::wstring& name : tree.subKeys(root))
+        if (auto record = readRecord(tree, root + L"\\" + name, name, folder))
+            records.push_back(*std::move(record));
+    return records;
+}
+} // namespace tessel

@@ -1,0 +1,31 @@
+// What the commands say beside the module's own messages, by id: texts of ModrigLists.rc. The comment after
+// each says what its placeholders stand for.
+#pragma once
+
+namespace ModrigMessages
+{
+inline constexpr unsigned kListsGroup = 128; // of the commands
+inline constexpr unsigned kSuiteUsage = 129;
+inline constexpr unsigned kSuiteSummary = 130;
+inline constexpr unsigned kHistoryUsage = 131;
+inline constexpr unsigned kHistorySummary = 132;
+
+inline constexpr unsigned kStartupSuiteName = 133; // as it stands within a sentence
+inline constexpr unsigned kHistoryName = 134;
+inline constexpr unsigned kListIsEmpty = 135; // name of the list
+
+inline constexpr unsigned kFileNotThere = 144;      // full path
+inline constexpr unsigned kPathTooLong = 145;       // full path
+inline constexpr unsigned kNotInList = 146;         // full path, name of the list
+inline constexpr unsigned kNoSuchPlace = 147;       // what was typed, how many places there are
+inline constexpr unsigned kOneAddedToHistory = 148; // file name
+inline constexpr unsigned kManyAddedToHistory = 149;
+inline constexpr unsigned kOneRemovedFromSuite = 150; // file name
+inline constexpr unsigned kManyRemovedFromSuite = 151;
+inline constexpr unsigned kMoved = 152; // file name, its place
+
+inline constexpr unsigned kLaidDown = 160;         // name of the list, file
+inline constexpr unsigned kOtherSessionRuns = 161; // name of the list
+inline constexpr unsigned kModrigStays = 162;      // name of the list
+inline constexpr unsigned kModrigIsOut = 163;
+} // namespace ModrigMessages

@@ -1,0 +1,228 @@
+#include "modrig/commands/KeptList.h"
+
+#include <wincompat/winfile.h>
+
+#include <charconv>
+#include <cwctype>
+#include <filesystem>
+#include <string>
+
+#include "modrig/base/SplitPath.h"
+#include "modrig/commands/CommandTexts.h"
+#include "modrig/lists/FileIntake.h"
+#include "modrig/lists/Globals.h"
+#include "modrig/lists/StartupOrder.h"
+#include "modrig/messages/MessageIds.h"
+#include "modrig/profile/ProfileRegistry.h"
+#include "modrig/types/ApplicationTypes.h"
+#include "modrig/types/FileValidation.h"
+
+namespace ModrigUtils
+{
+namespace
+{
+constexpr std::size_t kLongestPath = 1023; // what can be read back
+constexpr std::size_t kPlaceSize = 1024;
+
+CStdStr Decimal(std::size_t number)
+{
+    return CStdStr(std::to_wstring(number));
+}
+
+CStdStr FileNameOf(const CStdStr& path)
+{
+    return SplitPath(path).FileName();
+}
+
+CStdStr Summary(unsigned oneText, unsigned manyText, const std::vector<CStdStr>& paths)
+{
+    return paths.size() == 1 ? CStdStr::Formatted(oneText, FileNameOf(paths.front()).c_str())
+                             : CStdStr::Formatted(manyText, Decimal(paths.size()).c_str());
+}
+
+// From the root of the file system on; what is typed with a path counts from the current folder.
+CStdStr WholePath(const CStdStr& typed)
+{
+    if (typed.Text().starts_with(L'/'))
+        return typed;
+    wchar_t folder[kPlaceSize] = {};
+    GetCurrentDirectory(kPlaceSize, folder); // a folder that does not fit leaves the text empty
+    std::wstring rest = typed.Text();
+    while (rest.starts_with(L"./"))
+        rest.erase(0, 2);
+    return CStdStr(std::wstring(folder)) + CStdStr(L"/") + CStdStr(rest);
+}
+
+// Why a file cannot join a list; otherwise the path becomes the one that it is found at.
+CStdStr WhyRefused(const KeptList& list, CStdStr& path)
+{
+    if (!FindExtension(path.AfterLastDot()))
+        return CStdStr::Formatted(ModrigMessages::kCannotLoadFile, path.c_str());
+    if (ValidateFileExists(path) == INVALID_FILE_ATTRIBUTES)
+        return CStdStr::Formatted(ModrigMessages::kFileNotThere, path.c_str());
+    if (path.Text().size() > kLongestPath)
+        return CStdStr::Formatted(ModrigMessages::kPathTooLong, path.c_str());
+    if (list.isLoadedAtStart && IsTempInternetFile(path))
+        return CStdStr::Formatted(ModrigMessages::kTemporaryInternetFile, path.c_str());
+    return {};
+}
+
+bool Holds(const CStringList& files, const CStdStr& path)
+{
+    return std::any_of(files.begin(), files.end(),
+                       [&path](const CStdStr& entry) { return entry.EqualsNoCase(path); });
+}
+
+// As it is kept: as it was typed, or by the whole path. Empty where it is not.
+CStdStr EntryFor(const KeptList& list, const CStdStr& typed)
+{
+    for (const CStdStr& path : {typed, WholePath(typed)})
+        if (Holds(list.files, path))
+            return path;
+    return {};
+}
+
+CStdStr NotInList(const KeptList& list, const CStdStr& typed)
+{
+    return CStdStr::Formatted(ModrigMessages::kNotInList, WholePath(typed).c_str(),
+                              CStdStr::OfId(list.nameText).c_str());
+}
+
+CStdStr KeyOf(const KeptList& list)
+{
+    return GetModrigProfileRegKey() + CStdStr(L"\\") + CStdStr(list.names.subKey);
+}
+
+CStdStr NameOfEntry(const KeptList& list, std::size_t place)
+{
+    CStdStr name;
+    name.Fmt(list.names.entryFormat, place);
+    return name;
+}
+
+// The place of what counts instead of the data; empty when the data would count.
+CStdStr LaidDownInstead(const CStdStr& key, const CStdStr& name, const CStdStr& data)
+{
+    HKEY open = nullptr;
+    if (RegOpenKeyExW(HKEY_CURRENT_USER, key.c_str(), 0, KEY_READ, &open) != ERROR_SUCCESS)
+        return {};
+    wchar_t place[kPlaceSize] = {};
+    const bool laidDown = tsRegIsLaidDown(open, name.c_str(), place, kPlaceSize);
+    RegCloseKey(open);
+    CStdStr counts;
+    const bool isTheSame = ReadModrigRegString(HKEY_CURRENT_USER, key, name, counts) && counts == data;
+    return laidDown && !isTheSame ? CStdStr(std::wstring(place)) : CStdStr();
+}
+} // namespace
+
+const KeptList& KeptStartupSuite()
+{
+    using namespace ModrigMessages;
+    static const KeptList list{L"suite",
+                               kStoredStartupSuite,
+                               gStartupList,
+                               kStartupSuiteName,
+                               kOneAddedToStartupSuite,
+                               kManyAddedToStartupSuite,
+                               kOneRemovedFromSuite,
+                               kManyRemovedFromSuite,
+                               true};
+    return list;
+}
+
+const KeptList& KeptHistory()
+{
+    using namespace ModrigMessages;
+    static const KeptList list{L"history",
+                               kStoredHistory,
+                               gHistoryList,
+                               kHistoryName,
+                               kOneAddedToHistory,
+                               kManyAddedToHistory,
+                               kOneRemovedFromHistory,
+                               kManyRemovedFromHistory,
+                               false};
+    return list;
+}
+
+void ReadKept(const KeptList& list)
+{
+    ReadStoredList(list.names, list.files, [](const CStdStr&) {});
+}
+
+Change AddFiles(const KeptList& list, const std::vector<CStdStr>& typed)
+{
+    if (typed.size() > kMaxFilesAtOnce)
+        return {CStdStr::Formatted(ModrigMessages::kTooManyFiles, Decimal(kMaxFilesAtOnce).c_str())};
+    std::vector<CStdStr> paths;
+    for (const CStdStr& file : typed)
+    {
+        CStdStr path = WholePath(file);
+        if (CStdStr refused = WhyRefused(list, path); !refused.IsEmpty())
+            return {refused};
+        paths.push_back(path);
+    }
+    for (const CStdStr& path : paths)
+        static_cast<void>(list.files.AddTailUnlessHeld(path)); // what is there already counts as added
+    return {{}, Summary(list.oneAdded, list.manyAdded, paths)};
+}
+
+Change RemoveFiles(const KeptList& list, const std::vector<CStdStr>& typed)
+{
+    std::vector<CStdStr> paths;
+    for (const CStdStr& file : typed)
+    {
+        CStdStr path = EntryFor(list, file);
+        if (path.IsEmpty())
+            return {NotInList(list, file)};
+        paths.push_back(std::move(path));
+    }
+    for (const CStdStr& path : paths)
+        static_cast<void>(list.files.RemoveFirstNoCase(path)); // typed twice, it is gone by now
+    return {{}, Summary(list.oneRemoved, list.manyRemoved, paths)};
+}
+
+Change RemoveAllFiles(const KeptList& list)
+{
+    const std::vector<CStdStr> paths(list.files.begin(), list.files.end());
+    list.files.RemoveAll();
+    if (paths.empty())
+        return {{}, CStdStr::Formatted(ModrigMessages::kListIsEmpty, CStdStr::OfId(list.nameText).c_str())};
+    return {{}, Summary(list.oneRemoved, list.manyRemoved, paths)};
+}
+
+Change MoveFile(const CStdStr& typed, const CStdStr& place)
+{
+    const KeptList& suite = KeptStartupSuite();
+    const CStdStr path = EntryFor(suite, typed);
+    if (path.IsEmpty())
+        return {NotInList(suite, typed)};
+    const std::wstring& digits = place.Text();
+    const bool isNumber = !digits.empty() && digits.size() < 10 && // fits into the number
+                          std::all_of(digits.begin(), digits.end(),
+                                      [](wchar_t digit) { return digit >= L'0' && digit <= L'9'; });
+    const std::size_t number = isNumber ? std::stoul(digits) : 0;
+    const std::vector<CStdStr> entries(suite.files.begin(), suite.files.end());
+    if (number < 1 || number > entries.size())
+        return {
+            CStdStr::Formatted(ModrigMessages::kNoSuchPlace, place.c_str(), Decimal(entries.size()).c_str())};
+    static_cast<void>(MoveInStartupSuite(path, entries[number - 1])); // both are in it
+    return {{},
+            CStdStr::Formatted(ModrigMessages::kMoved, FileNameOf(path).c_str(), Decimal(number).c_str())};
+}
+
+CStdStr LaidDownInstead(const KeptList& list)
+{
+    const CStdStr key = KeyOf(list);
+    CStdStr place = LaidDownInstead(key, CStdStr(list.names.count), Decimal(list.files.GetCount()));
+    std::size_t number = 0;
+    for (auto entry = list.files.begin(); place.IsEmpty() && entry != list.files.end(); ++entry)
+        place = LaidDownInstead(key, NameOfEntry(list, ++number), *entry);
+    return place;
+}
+
+bool IsEntryLaidDown(const KeptList& list, std::size_t place)
+{
+    return !LaidDownInstead(KeyOf(list), NameOfEntry(list, place), CStdStr()).IsEmpty();
+}
+} // namespace ModrigUtils

@@ -1,0 +1,78 @@
+#include "modrig/commands/ModrigInSession.h"
+
+#include <tessel/tsappinfo.h>
+#include <tessel/tsed.h>
+#include <tessel/tsrxlinker.h>
+#include <tessel/tssession.h>
+
+#include "modrig/commands/CommandTexts.h"
+
+namespace ModrigUtils
+{
+namespace
+{
+constexpr const wchar_t* kModule = L"Modrig.bundle";
+constexpr const wchar_t* kRecordName = L"TesselModrig";
+constexpr std::size_t kPathSize = 1024;
+constexpr bool kDoNotSayWhyNot = false;
+constexpr bool kSayWhyNot = true;
+constexpr bool kResolveNow = true;
+
+CStdStr PathOfModrig()
+{
+    wchar_t path[kPathSize] = {};
+    return tsedGetModuleFileName(kModule, path, kPathSize) == 0 ? CStdStr(std::wstring(path)) : CStdStr();
+}
+
+bool IsLoadedByItsCommand()
+{
+    TesselAppInfo record;
+    record.setAppName(kRecordName);
+    return record.readFromRegistry() == TSRX_APPINFO_OK && (record.loadReason() & TSRX_LOAD_ON_COMMAND) != 0;
+}
+
+TsRxDynamicLinker* Linker()
+{
+    return TsRxDynamicLinker::cast(tsrxSysRegistry()->at(TSRX_DYNAMIC_LINKER));
+}
+} // namespace
+
+ModrigOutOfService::ModrigOutOfService() : mPath(PathOfModrig())
+{
+    if (mPath.IsEmpty())
+        return;
+    mSucceeded = Linker() && Linker()->unloadModule(mPath.c_str(), kDoNotSayWhyNot);
+    mWaits = mSucceeded && IsLoadedByItsCommand();
+}
+
+ModrigOutOfService::~ModrigOutOfService()
+{
+    if (!mPath.IsEmpty() && mSucceeded && !mWaits)
+        Linker()->loadModule(mPath.c_str(), kSayWhyNot, kResolveNow);
+}
+
+CStdStr WhyNobodyCanChange(const KeptList& list)
+{
+    const CStdStr name = CStdStr::OfId(list.nameText);
+    if (const CStdStr place = LaidDownInstead(list); !place.IsEmpty())
+        return CStdStr::Formatted(ModrigMessages::kLaidDown, name.c_str(), place.c_str());
+    if (tsrxOtherSessionRuns())
+        return CStdStr::Formatted(ModrigMessages::kOtherSessionRuns, name.c_str());
+    return {};
+}
+
+// Without a record Modrig is loaded at each start, and makes one when there is something to load.
+void UpdateRecordOfModrig(bool hasStartup)
+{
+    TesselAppInfo record;
+    record.setAppName(kRecordName);
+    if (record.readFromRegistry() != TSRX_APPINFO_OK)
+        return;
+    const unsigned reasons = record.loadReason();
+    const unsigned wanted =
+        hasStartup ? reasons | TSRX_LOAD_AT_HOST_START : reasons & ~TSRX_LOAD_AT_HOST_START;
+    record.setLoadReason(wanted);
+    if (wanted != reasons)
+        record.writeToRegistry(false, false); // the commands in it are Modrig's
+}
+} // namespace ModrigUtils

@@ -1,0 +1,385 @@
+// SUITE and HISTORY: what the dialog keeps, on the command line of the real host.
+#include <filesystem>
+
+#include <gmock/gmock.h>
+
+#include <nlohmann/json.hpp>
+
+#include "tests/e2e/Applications.h"
+#include "tests/e2e/HostTerminal.h"
+
+using nlohmann::json;
+using testing::ElementsAre;
+using testing::HasSubstr;
+using testing::Not;
+
+namespace
+{
+constexpr char kModrigWaits[] =
+    "Modrig is unloaded. It is loaded again when MODRIG is typed, and the Lisp of "
+    "the Startup Suite with it.\n";
+constexpr char kNoDisplay[] = "Tessel cannot open a window: there is no display.\n";
+
+class ListCommands : public testing::Test
+{
+protected:
+    // Runs one command in a session that loads nothing by itself; what is said after the echo of the command.
+    std::string quietly(const std::string& command, int status = 0) const
+    {
+        const auto result = session.start({"--safe", "-c", command});
+        EXPECT_EQ(result.exitStatus, status) << result.output;
+        return afterEcho(result.output, command);
+    }
+
+    static std::string afterEcho(const std::string& output, const std::string& command)
+    {
+        const std::string before = kBanner + ("Command: " + command + "\n");
+        EXPECT_TRUE(output.starts_with(before)) << output;
+        return output.substr(std::min(before.size(), output.size()));
+    }
+
+    json asJson(const std::string& command) const
+    {
+        const auto result = session.start({"--safe", "-c", command + " --json"});
+        EXPECT_EQ(result.exitStatus, 0) << result.output;
+        return json::parse(result.output);
+    }
+
+    std::vector<std::string> suite() const
+    {
+        std::vector<std::string> paths;
+        const json list = asJson("SUITE LIST");
+        for (const auto& file : list["files"])
+            paths.push_back(file["path"]);
+        return paths;
+    }
+
+    std::string write(const std::string& name) const
+    {
+        return session.folder().write(name, "(princ \"" + name + " runs\")\n").string();
+    }
+
+    void layDownSuite(const std::string& file, const std::string& application) const
+    {
+        session.folder().write("layout/" + file,
+                               "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
+                                   std::string(kSuiteKey) + "]\n\"NumStartup\"=\"1\"\n\"1Startup\"=\"" +
+                                   application + "\"\n");
+    }
+
+    HostSession session;
+    const std::string first = write("first.lsp");
+    const std::string second = write("second.lsp");
+    const std::string third = write("third.lsp");
+};
+} // namespace
+
+TEST_F(ListCommands, TellOfEmptyLists)
+{
+    EXPECT_EQ(quietly("SUITE LIST"), "There is nothing in the Startup Suite.\n");
+    EXPECT_EQ(quietly("history list"), "There is nothing in the History list.\n");
+    EXPECT_EQ(quietly("SUITE CLEAR"), "There is nothing in the Startup Suite.\n");
+    EXPECT_EQ(asJson("SUITE LIST"), json({{"list", "suite"}, {"files", json::array()}}));
+}
+
+TEST_F(ListCommands, KeepAStartupSuiteThatTheNextStartLoads)
+{
+    EXPECT_EQ(quietly("SUITE ADD " + first), "first.lsp was added to the Startup Suite.\n");
+    EXPECT_EQ(quietly("SUITE ADD " + second + " " + sample("primes.zmb")),
+              "2 applications were added to the Startup Suite.\n");
+    EXPECT_EQ(quietly("SUITE LIST"),
+              "1  " + first + "\n2  " + second + "\n3  " + sample("primes.zmb") + "\n");
+    const auto started = session.run({"APPS"});
+    EXPECT_THAT(started.output, HasSubstr(listed(first, "Lisp") + listed(second, "Lisp")));
+    EXPECT_THAT(started.output, HasSubstr(listed(sample("primes.zmb"))));
+}
+
+TEST_F(ListCommands, MoveAnEntryToAPlace)
+{
+    quietly("SUITE ADD " + first + " " + second + " " + third);
+    EXPECT_EQ(quietly("SUITE MOVE " + third + " 1"), "third.lsp is in place 1 of the Startup Suite now.\n");
+    EXPECT_THAT(suite(), ElementsAre(third, first, second));
+    EXPECT_EQ(quietly("SUITE MOVE " + third + " 2"), "third.lsp is in place 2 of the Startup Suite now.\n");
+    EXPECT_THAT(suite(), ElementsAre(first, third, second));
+    for (const std::string place : {"0", "4", "-1", "one", "1x", "99999999999"})
+        EXPECT_EQ(quietly("SUITE MOVE " + first + " " + place, 1),
+                  "“" + place + "” is no place in the Startup Suite: its places are 1 to 3.\n");
+    EXPECT_THAT(suite(), ElementsAre(first, third, second));
+}
+
+TEST_F(ListCommands, RemoveEntriesAsAWholeOrNotAtAll)
+{
+    quietly("SUITE ADD " + first + " " + second + " " + third);
+    EXPECT_EQ(quietly("SUITE REMOVE " + first + " /nowhere.lsp", 1),
+              "“/nowhere.lsp” is not in the Startup Suite.\n");
+    EXPECT_THAT(suite(), ElementsAre(first, second, third));
+    EXPECT_EQ(quietly("SUITE REMOVE " + third), "third.lsp was removed from the Startup Suite.\n");
+    EXPECT_EQ(quietly("SUITE REMOVE " + first + " " + second),
+              "2 applications were removed from the Startup Suite.\n");
+    EXPECT_TRUE(suite().empty());
+}
+
+TEST_F(ListCommands, ClearAList)
+{
+    quietly("HISTORY ADD " + first + " " + second);
+    EXPECT_EQ(quietly("HISTORY CLEAR"), "2 entries were removed from the History list.\n");
+    EXPECT_EQ(asJson("HISTORY LIST")["files"], json::array());
+}
+
+TEST_F(ListCommands, KeepTheHistoryByItself)
+{
+    EXPECT_EQ(quietly("HISTORY ADD " + first), "first.lsp was added to the History list.\n");
+    EXPECT_EQ(quietly("HISTORY ADD " + second + " " + third),
+              "2 applications were added to the History list.\n");
+    EXPECT_EQ(quietly("HISTORY REMOVE " + first), "first.lsp was removed from the History list.\n");
+    EXPECT_EQ(quietly("HISTORY LIST"), "1  " + second + "\n2  " + third + "\n");
+    EXPECT_TRUE(suite().empty());
+    EXPECT_THAT(quietly("HISTORY MOVE " + second + " 1", 1), HasSubstr("Usage: HISTORY LIST"));
+}
+
+TEST_F(ListCommands, KnowAFileAsTheModuleDoes)
+{
+    quietly("SUITE ADD " + first);
+    std::string inCapitals = first;
+    inCapitals.replace(inCapitals.rfind("first"), 5, "FIRST");
+    EXPECT_EQ(quietly("SUITE ADD " + first), "first.lsp was added to the Startup Suite.\n")
+        << "it is there already";
+    EXPECT_THAT(suite(), ElementsAre(first));
+    const auto object = session.folder() / "a/gears.omp";
+    std::filesystem::create_directories(object.parent_path());
+    std::filesystem::copy_file(sample("gears.omp"), object);
+    quietly("SUITE ADD " + object.string());
+    quietly("SUITE ADD " + sample("gears.omp"));
+    EXPECT_THAT(suite(), ElementsAre(first, object.string())) << "an object-database module goes by its name";
+    quietly("SUITE REMOVE " + inCapitals);
+    EXPECT_THAT(suite(), ElementsAre(object.string()));
+}
+
+TEST_F(ListCommands, TakeFilesFromTheCurrentFolder)
+{
+    const auto result = session.start({"--safe", "-c", "CD " + session.folder().path().string(), "-c",
+                                       "SUITE ADD first.lsp ./second.lsp", "-c", "SUITE REMOVE first.lsp"});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(suite(), ElementsAre(second));
+}
+
+TEST_F(ListCommands, RefuseWhatCannotBeLoadedAndChangeNothing)
+{
+    const std::string text = session.folder().write("notes.txt", "").string();
+    const std::string bare = session.folder().write("bare", "").string();
+    const std::string missing = (session.folder() / "missing.lsp").string();
+    EXPECT_EQ(quietly("SUITE ADD " + first + " " + missing, 1), "“" + missing + "” is not there.\n");
+    EXPECT_EQ(quietly("SUITE ADD " + first + " " + text, 1), notOfAType(text) + "\n");
+    EXPECT_EQ(quietly("SUITE ADD " + bare, 1), notOfAType(bare) + "\n");
+    EXPECT_TRUE(suite().empty());
+}
+
+TEST_F(ListCommands, TakeNoMoreThanFiftyFilesAtOnce)
+{
+    std::string fifty = "SUITE ADD";
+    for (int count = 0; count < 50; ++count)
+        fifty += " " + first;
+    EXPECT_EQ(quietly(fifty + " " + second, 1),
+              "No more than 50 files can be taken at once. None of them has been loaded.\n");
+    EXPECT_TRUE(suite().empty());
+    quietly(fifty);
+    EXPECT_THAT(suite(), ElementsAre(first));
+}
+
+TEST_F(ListCommands, AddToAListOfManyEntries)
+{
+    Paths many;
+    for (int number = 1; number <= 3000; ++number)
+        many.push_back("/nowhere/" + std::to_string(number) + ".lsp");
+    session.folder().write(
+        "many.reg",
+        [&]
+        {
+            std::string text = "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
+                               std::string(kSuiteKey) + "]\n\"NumStartup\"=\"3000\"\n";
+            for (std::size_t index = 0; index < many.size(); ++index)
+                text += "\"" + std::to_string(index + 1) + "Startup\"=\"" + many[index] + "\"\n";
+            return text;
+        }());
+    quietly("REGISTRY IMPORT " + (session.folder() / "many.reg").string());
+    quietly("SUITE ADD " + first);
+    many.push_back(first);
+    EXPECT_EQ(suite(), many);
+}
+
+TEST_F(ListCommands, TellWhenTheyAreTypedWrongly)
+{
+    const std::string usage = "Usage: SUITE LIST\n       SUITE ADD file...\n       SUITE REMOVE file...\n"
+                              "       SUITE MOVE file place\n       SUITE CLEAR [--json]\n";
+    const std::vector<std::string> wrong = {
+        "SUITE",        "SUITE GROW",      "SUITE LIST " + first, "SUITE ADD",
+        "SUITE REMOVE", "SUITE CLEAR all", "SUITE MOVE " + first};
+    for (const std::string& command : wrong)
+        EXPECT_EQ(quietly(command, 1), usage) << command;
+}
+
+TEST_F(ListCommands, AreToldOfByHelpBeforeAndAfterTheyAreLoaded)
+{
+    const auto result = session.start({"--safe", "-c", "HELP", "-c", "HISTORY LIST", "-c", "HELP"});
+    const std::string& output = result.output;
+    const auto begin = output.find("Session\n");
+    const auto end = output.find("Command: HISTORY");
+    const std::string before = output.substr(begin, end - begin);
+    const std::string after = output.substr(output.find("Session\n", end));
+    EXPECT_EQ(before, after);
+    EXPECT_THAT(before, HasSubstr("Shows and changes the History list of Modrig"));
+}
+
+TEST_F(ListCommands, AreNotLoadedBeforeTheyAreTyped)
+{
+    putOffModrig(session);
+    EXPECT_EQ(session.run({"APPS"}).output,
+              std::string(kBanner) + "Command: APPS\nNo application is loaded.\n");
+}
+
+TEST_F(ListCommands, ShowEntriesThatAreNotThere)
+{
+    quietly("SUITE ADD " + first + " " + second);
+    std::filesystem::remove(second);
+    EXPECT_EQ(quietly("SUITE LIST"), "1  " + first + "\n2  " + second + "  (not there)\n");
+    EXPECT_EQ(asJson("SUITE LIST")["files"],
+              json::array({{{"place", 1}, {"path", first}, {"isThere", true}, {"isLaidDown", false}},
+                           {{"place", 2}, {"path", second}, {"isThere", false}, {"isLaidDown", false}}}));
+    EXPECT_EQ(quietly("SUITE REMOVE " + second), "second.lsp was removed from the Startup Suite.\n");
+}
+
+TEST_F(ListCommands, AnswerEveryChangeAsJson)
+{
+    EXPECT_EQ(asJson("HISTORY ADD " + first)["files"][0]["path"], first);
+    EXPECT_EQ(asJson("HISTORY REMOVE " + first), json({{"list", "history"}, {"files", json::array()}}));
+}
+
+TEST_F(ListCommands, WriteNamesThatAreNoTextAsJson)
+{
+    const std::string odd = "odd \xE9 \"q\" \\ \t\x1B[31m größe.lsp";
+    const std::string path = write(odd);
+    const auto result = session.start({"--safe", "-c", "HISTORY ADD " + inQuotes(path)});
+    ASSERT_EQ(result.exitStatus, 0) << result.output;
+    const std::string listed = asJson("HISTORY LIST")["files"][0]["path"];
+    EXPECT_TRUE(listed.ends_with("odd \U0010FEE9 \"q\" \\ \t\x1B[31m größe.lsp")) << listed;
+}
+
+TEST_F(ListCommands, BelongToTheCurrentProfile)
+{
+    quietly("SUITE ADD " + first);
+    const auto other =
+        session.start({"--safe", "-c", "PROFILE Other", "-c", "SUITE LIST", "-c", "SUITE ADD " + second});
+    EXPECT_THAT(other.output, HasSubstr("There is nothing in the Startup Suite.\n"));
+    EXPECT_THAT(suite(), ElementsAre(second));
+    quietly("PROFILE Default");
+    EXPECT_THAT(suite(), ElementsAre(first));
+}
+
+// Modrig holds what it has read: it is taken out of service, and reads the list again.
+TEST_F(ListCommands, HaveModrigReadTheListAgainWhichIsLoaded)
+{
+    quietly("SUITE ADD " + sample("primes.zmb"));
+    session.run({}); // Modrig makes its record
+    const auto result = session.run({"SUITE ADD " + sample("gears.omp"),
+                                     "SUITE REMOVE " + sample("primes.zmb"), "SUITE LIST", "MODRIG", "APPS"});
+    EXPECT_EQ(result.exitStatus, 0);
+    EXPECT_THAT(result.output,
+                HasSubstr("gears.omp was added to the Startup Suite.\n" + std::string(kModrigWaits)));
+    EXPECT_THAT(result.output,
+                HasSubstr("primes.zmb was removed from the Startup Suite.\nCommand: SUITE LIST\n1  " +
+                          sample("gears.omp") + "\nCommand: MODRIG\nGears:"));
+    EXPECT_THAT(result.output, HasSubstr(kNoDisplay));
+    EXPECT_THAT(result.output, HasSubstr(listed(modrigBundle())));
+    EXPECT_THAT(suite(), ElementsAre(sample("gears.omp")));
+}
+
+TEST_F(ListCommands, BringModrigBackThatNoCommandWouldBring)
+{
+    const auto result = session.run({"SUITE ADD " + sample("primes.zmb"), "MODRIG"});
+    EXPECT_EQ(result.output,
+              kBanner + ("Command: SUITE ADD " + sample("primes.zmb") + "\n" + kPrimes +
+                         "primes.zmb was added to the Startup Suite.\nCommand: MODRIG\n" + kNoDisplay));
+}
+
+TEST_F(ListCommands, LeaveModrigLoadedWhenNothingChanges)
+{
+    quietly("SUITE ADD " + sample("primes.zmb"));
+    session.run({});
+    const auto result = session.run({"SUITE ADD " + sample("primes.zmb"), "SUITE LIST", "APPS"});
+    EXPECT_THAT(result.output, Not(HasSubstr("Modrig is unloaded")));
+    EXPECT_THAT(result.output, HasSubstr(listed(modrigBundle())));
+}
+
+TEST_F(ListCommands, KeepTheRecordOfModrigInStep)
+{
+    quietly("SUITE ADD " + sample("primes.zmb"));
+    session.run({});
+    const std::string reasons = std::string("REGISTRY GET ") + kRecordKey + " LoadReasons";
+    EXPECT_EQ(quietly(reasons), "6\n");
+    quietly("SUITE CLEAR");
+    EXPECT_EQ(quietly(reasons), "4\n");
+    EXPECT_THAT(session.run({"APPS"}).output, HasSubstr("No application is loaded."));
+    quietly("SUITE ADD " + first);
+    EXPECT_EQ(quietly(reasons), "6\n");
+    EXPECT_EQ(quietly(std::string("REGISTRY LIST ") + kRecordKey + "\\Commands"), "MODRIG = MODRIG\n");
+    EXPECT_THAT(session.run({"APPS"}).output, HasSubstr(listed(first, "Lisp")));
+}
+
+TEST_F(ListCommands, ChangeNothingWhileAnotherTesselWorksWithTheProfile)
+{
+    quietly("SUITE ADD " + first);
+    HostTerminal other(session);
+    ASSERT_TRUE(other.awaitPrompt());
+    EXPECT_EQ(
+        quietly("SUITE ADD " + second, 1),
+        "Another Tessel works with this profile, and would put back what it has read once its dialog is "
+        "closed: the Startup Suite stays as it is. End the other Tessel first.\n");
+    EXPECT_THAT(suite(), ElementsAre(first)) << "to look is no change";
+    EXPECT_EQ(other.quit(), 0);
+    EXPECT_EQ(quietly("SUITE ADD " + second), "second.lsp was added to the Startup Suite.\n");
+}
+
+TEST_F(ListCommands, ChangeNothingThatTheAdministratorHasLaidDown)
+{
+    session.alwaysWith({"--layout-dir", (session.folder() / "layout").string()});
+    layDownSuite("policy/suite.reg", first);
+    const std::string stays = "The administrator has laid down the Startup Suite in " +
+                              (session.folder() / "layout/policy/suite.reg").string() +
+                              ": it stays as it is.\n";
+    EXPECT_EQ(quietly("SUITE LIST"), "1  " + first + "  (laid down by the administrator)\n");
+    EXPECT_EQ(asJson("SUITE LIST")["files"][0]["isLaidDown"], true);
+    EXPECT_EQ(quietly("SUITE REMOVE " + first, 1), stays);
+    EXPECT_EQ(quietly("SUITE CLEAR", 1), stays);
+    EXPECT_EQ(quietly("SUITE ADD " + second, 1), stays);
+    EXPECT_EQ(quietly("SUITE ADD " + first), "first.lsp was added to the Startup Suite.\n");
+    EXPECT_EQ(quietly("HISTORY ADD " + second), "second.lsp was added to the History list.\n");
+    session.alwaysWith({});
+    EXPECT_TRUE(suite().empty()) << "nothing was stored under it";
+}
+
+TEST_F(ListCommands, ChangeWhatIsOnlyADefault)
+{
+    session.alwaysWith({"--layout-dir", (session.folder() / "layout").string()});
+    layDownSuite("suite.reg", first);
+    quietly("SUITE ADD " + second);
+    EXPECT_THAT(suite(), ElementsAre(first, second));
+    quietly("SUITE REMOVE " + first);
+    EXPECT_THAT(suite(), ElementsAre(second));
+    quietly("SUITE CLEAR");
+    EXPECT_TRUE(suite().empty());
+}
+
+TEST_F(ListCommands, FailWhenTheRegistryCannotBeWritten)
+{
+    quietly("SUITE ADD " + first);
+    const auto file = session.profile() / "registry.db";
+    std::filesystem::permissions(file, std::filesystem::perms::owner_read);
+    const auto result = session.start({"--safe", "-c", "SUITE ADD " + second, "-c", "SUITE LIST"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output,
+                HasSubstr("SUITE ADD " + second +
+                          "\nA list of applications could not be stored in the registry. Changes "
+                          "made since it was last stored may be lost.\n"));
+    EXPECT_THAT(result.output, HasSubstr("Command: SUITE LIST\n1  " + first + "\n"));
+    EXPECT_THAT(result.output, Not(HasSubstr("2  ")));
+}

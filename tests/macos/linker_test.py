@@ -1,0 +1,70 @@
+"""What is linked for macOS may call only what the system has, and exports only what it should."""
+import tempfile
+import unittest
+from pathlib import Path
+
+from support import binaries, clang
+
+MODULE = """#import <AppKit/AppKit.h>
+extern "C" int tsrxEntryPoint()
+{
+    return [NSOpenPanel openPanel] != nil;
+}
+extern "C" int another()
+{
+    return 1;
+}
+"""
+MISSING = """#import <AppKit/AppKit.h>
+extern "C" void NSBeeps();
+@interface NSOpenPanels : NSObject
+@end
+extern "C" int tsrxEntryPoint()
+{
+    NSBeeps();
+    return [NSOpenPanels class] != nil;
+}
+"""
+LINKED = ("-bundle", "-framework", "Cocoa", "-Wl,-exported_symbol,_tsrxEntryPoint")
+
+
+class Linker(unittest.TestCase):
+    def setUp(self):
+        self._folder = tempfile.TemporaryDirectory()
+        self.addCleanup(self._folder.cleanup)
+        self.folder = Path(self._folder.name)
+
+    def link(self, processor, *options, system="12.0"):
+        half = self.folder / f"{processor}.half"
+        taken, said = clang(MODULE, "-target", f"{processor}-apple-macos{system}", *LINKED, *options, "-o", half)
+        self.assertTrue(taken, said)
+        return half
+
+    def joined(self, *halves):
+        whole = self.folder / "whole"
+        binaries.join(halves, whole)
+        return list(binaries.faults(whole, {"_tsrxEntryPoint"}, "12.0"))
+
+    def test_a_module_with_its_entry_point_alone_passes(self):
+        self.assertEqual(self.joined(self.link("arm64"), self.link("x86_64")), [])
+
+    def test_a_further_export_of_one_half_is_found(self):
+        faults = self.joined(self.link("arm64"), self.link("x86_64", "-Wl,-exported_symbol,_another"))
+        self.assertEqual(faults, ["whole exports, for x86_64: _another, _tsrxEntryPoint"])
+
+    def test_a_missing_half_is_found(self):
+        self.assertEqual(self.joined(self.link("x86_64")), ["whole has no half for arm64"])
+
+    def test_another_oldest_system_is_found(self):
+        faults = self.joined(self.link("arm64"), self.link("x86_64", system="13.0"))
+        self.assertEqual(faults, ["whole runs from macOS 13.0 on, for x86_64, and not 12.0"])
+
+    def test_functions_and_classes_that_the_system_has_not_got_are_found(self):
+        taken, said = clang(MISSING, *LINKED, "-o", self.folder / "half")
+        self.assertFalse(taken)
+        self.assertIn("undefined symbol: _NSBeeps", said)
+        self.assertIn("undefined symbol: _OBJC_CLASS_$_NSOpenPanels", said)
+
+
+if __name__ == "__main__":
+    unittest.main()

@@ -1,0 +1,50 @@
+"""Checks what has been linked for macOS: processors, what is exported, and from which version of the system on it runs."""
+import re
+import shutil
+import subprocess
+
+
+def program(name):
+    """Where a program of LLVM's is, which may have its version in its name."""
+    found = shutil.which(name) or shutil.which(f"{name}-14")
+    if not found:
+        raise SystemExit(f"{name} is missing: tools/setup installs it")
+    return found
+
+
+def run(name, *words):
+    return subprocess.run([program(name), *(str(word) for word in words)], capture_output=True, text=True, check=True).stdout
+
+
+def join(parts, whole):
+    """One universal file of one for each processor."""
+    whole.parent.mkdir(parents=True, exist_ok=True)
+    run("llvm-lipo", "-create", *parts, "-output", whole)
+
+
+def processors(file):
+    return set(run("llvm-lipo", "-archs", file).split())
+
+
+def exported(file, processor):
+    listed = run("llvm-nm", f"--arch={processor}", "--extern-only", "--defined-only", "--just-symbol-name", file)
+    return {word for word in listed.split() if word.startswith("_") and word not in ("__mh_bundle_header", "__mh_execute_header")}
+
+
+def oldest_system(file, processor):
+    commands = run("llvm-objdump", "--macho", f"--arch={processor}", "--private-headers", file)
+    found = re.search(r"cmd LC_BUILD_VERSION\n(?:.*\n)*?\s*minos (\S+)", commands)
+    return found.group(1) if found else "none"
+
+
+def faults(file, wanted, system):
+    """`wanted`: the symbols that it exports, or None when any will do. `system`: the oldest version that it is built for."""
+    for processor in ("arm64", "x86_64"):
+        if processor not in processors(file):
+            yield f"{file.name} has no half for {processor}"
+            continue
+        symbols = exported(file, processor)
+        if wanted is not None and symbols != wanted:
+            yield f"{file.name} exports, for {processor}: {', '.join(sorted(symbols)) or 'nothing'}"
+        if oldest_system(file, processor) != system:
+            yield f"{file.name} runs from macOS {oldest_system(file, processor)} on, for {processor}, and not {system}"
