@@ -18,7 +18,7 @@ bool isByPerson(const KeptOutApplication& application)
 
 std::wstring dayOf(const KeptOutApplication& application)
 {
-    return toWide(dayAndTime(application.since));
+    return dayAndTimeInWords(application.since);
 }
 
 std::wstring deedOf(const KeptOutApplication& application)

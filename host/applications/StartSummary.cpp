@@ -28,11 +28,13 @@ struct Entry
     std::wstring why; // a sentence, or the end of one
 };
 
-// What stands between quotes in the text of a box; empty when nothing does.
+// What stands between quotes in the text of a box, in English or in German; empty when nothing does.
 std::wstring quotedIn(const std::wstring& text)
 {
-    const std::size_t start = text.find(L'“');
-    const std::size_t end = text.find(L'”', start);
+    const std::size_t start = text.find_first_of(L"“„");
+    if (start == text.npos)
+        return {};
+    const std::size_t end = text.find(text[start] == L'“' ? L'”' : L'“', start + 1);
     return end == text.npos ? std::wstring() : text.substr(start + 1, end - start - 1);
 }
 

@@ -11,6 +11,7 @@
 #include "host/files/Sha256.h"
 #include "host/platform/PartFile.h"
 #include "host/text/Sizes.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -132,12 +133,12 @@ void configure(CURL* transfer, const RemoteFiles::Limits& limits, Sink& sink, ch
 Result<> ownOutcome(CURLcode status, const Sink& sink)
 {
     if (sink.stopped)
-        return Failure{L"it was interrupted"};
+        return Failure{translated(L"it was interrupted")};
     if (sink.ledAstray)
-        return Failure{L"the server leads from https to http"};
+        return Failure{translated(L"the server leads from https to http")};
     if (sink.isFull() || status == CURLE_FILESIZE_EXCEEDED)
-        return Failure{L"it is larger than " + sizeInWords(sink.limit)};
-    return sink.written ? Result<>() : Failure{L"the local copy could not be written"};
+        return Failure{translated(L"it is larger than {}", sizeInWords(sink.limit))};
+    return sink.written ? Result<>() : Failure{translated(L"the local copy could not be written")};
 }
 
 Result<> outcomeOf(CURLcode status, const Sink& sink, const char* words)
@@ -149,7 +150,7 @@ Result<> outcomeOf(CURLcode status, const Sink& sink, const char* words)
     long answer = 0;
     curl_easy_getinfo(sink.transfer, CURLINFO_RESPONSE_CODE, &answer);
     if (answer != kWholeFile)
-        return Failure{L"the server answered " + std::to_wstring(answer)};
+        return Failure{translated(L"the server answered {}", answer)};
     return {};
 }
 } // namespace
@@ -159,7 +160,7 @@ Result<std::string> download(const RemoteAddress& address, PartFile& file, const
 {
     const Transfer transfer(curl_easy_init());
     if (!transfer)
-        return Failure{L"the network library cannot be started"};
+        return Failure{translated(L"the network library cannot be started")};
     char words[CURL_ERROR_SIZE] = "";
     Sink sink(file, limits.bytes, interruption, tell);
     sink.transfer = transfer.get();

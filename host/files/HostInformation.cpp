@@ -7,6 +7,7 @@
 
 #include "host/text/CommandLine.h"
 #include "host/text/Running.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 #include "host/text/Version.h"
 
@@ -37,10 +38,11 @@ Result<RemoteFiles::Copy> HostInformation::fetch(const std::wstring& url, std::s
                                                  bool ignoreCache) const
 {
     if (!isUrl(url.c_str()))
-        return Failure{L"\"" + url + L"\" is no http or https address.", TS_FETCH_FAILED};
+        return Failure{translated(L"\"{}\" is no http or https address.", url), TS_FETCH_FAILED};
     if (capacity == 0)
-        return Failure{url + L" could not be fetched: there is no room for the path of its local copy.",
-                       TS_FETCH_FAILED};
+        return Failure{
+            translated(L"{} could not be fetched: there is no room for the path of its local copy.", url),
+            TS_FETCH_FAILED};
     return mRemote.fetch(url, capacity - 1, ignoreCache);
 }
 

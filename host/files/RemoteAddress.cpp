@@ -6,6 +6,8 @@
 #include <cstdint>
 #include <optional>
 
+#include "host/text/Translation.h"
+
 namespace tessel
 {
 namespace
@@ -96,7 +98,8 @@ Result<std::string> checksumIn(std::string_view fragment)
             digits.size() == kChecksumDigits &&
             std::ranges::all_of(digits, [](char digit) { return hexDigit(digit).has_value(); });
         if (!isChecksum || (!found.empty() && found != digits))
-            return Failure{L"the checksum in the address is not one SHA-256 of 64 hexadecimal digits"};
+            return Failure{
+                translated(L"the checksum in the address is not one SHA-256 of 64 hexadecimal digits")};
         found = digits;
     }
     return found;

@@ -50,34 +50,41 @@ std::filesystem::path resolved(const std::filesystem::path& path)
 
 Failure notFetched(const std::string& address, const std::wstring& reason)
 {
-    return {toWide(withoutUserInfo(address)) + L" could not be fetched: " + reason + L".", TS_FETCH_FAILED};
+    return {translated(L"{} could not be fetched: {}.", toWide(withoutUserInfo(address)), reason),
+            TS_FETCH_FAILED};
 }
 
-Failure about(const std::string& what, const std::filesystem::path& path, const std::wstring& reason)
+// Hands on what failed with the file or folder, after the words that say with which.
+Failure about(Sentence<2> words, const std::filesystem::path& path, const Outcome& failed)
 {
-    return {toWide("the " + what + " " + path.string()) + reason};
+    return {translated(words, path, failed.sentence())};
 }
+
+constexpr auto kNoFolder = Sentence<2>(L"the cache folder {} cannot be made: {}");
+constexpr auto kUnsafeFolder = Sentence<2>(L"the cache folder {} is not safe: {}");
+constexpr auto kNoOrigin = Sentence<2>(L"the cache folder {} cannot be written: {}");
+constexpr auto kNoCopy = Sentence<2>(L"the local copy {} cannot be made: {}");
 
 // A folder of the cache's own: made where it is missing, and closed to others where an older version has left
 // it open.
 Result<> prepareFolder(const std::filesystem::path& folder)
 {
     if (const auto made = makePrivateFolder(folder); !made)
-        return about("cache folder", folder, L" cannot be made: " + made.sentence());
+        return about(kNoFolder, folder, made);
     if (!checkNobodyElseWrites(folder))
     {
         std::error_code notOurs; // is told by the next look
         std::filesystem::permissions(folder, std::filesystem::perms::owner_all, notOurs);
     }
     const auto checked = checkNobodyElseWrites(folder);
-    return checked ? checked : about("cache folder", folder, L" is not safe: " + checked.sentence());
+    return checked ? checked : about(kUnsafeFolder, folder, checked);
 }
 
 Result<> checkContent(const std::string& sha256, const RemoteAddress& address)
 {
     if (address.sha256.empty() || sha256 == address.sha256)
         return {};
-    return Failure{L"its SHA-256 is " + toWide(sha256) + L", not the one that the address asks for"};
+    return Failure{translated(L"its SHA-256 is {}, not the one that the address asks for", toWide(sha256))};
 }
 
 std::string sha256Of(const std::filesystem::path& file, std::uintmax_t mostBytes)
@@ -95,13 +102,13 @@ Result<> store(PartFile& part, const std::filesystem::path& copy, const std::str
     // What an earlier fetch wrote stays: a copy without its origin would be lost.
     const bool isKnown = originIn(folder) == url && checkNobodyElseWrites(folder / kOriginFile);
     if (const auto moved = part.moveTo(copy); !moved)
-        return about("local copy", copy, L" cannot be made: " + moved.sentence());
+        return about(kNoCopy, copy, moved);
     const auto noted = isKnown ? Result<>() : replaceFile(folder / kOriginFile, url);
     if (noted)
         return noted;
     std::error_code gone;
     std::filesystem::remove(copy, gone);
-    return about("cache folder", folder, L" cannot be written: " + noted.sentence());
+    return about(kNoOrigin, folder, noted);
 }
 } // namespace
 
@@ -141,8 +148,9 @@ Result<RemoteFiles::Copy> RemoteFiles::fetch(const std::wstring& url, std::size_
     const std::filesystem::path copy = copyOf(address->url);
     const std::wstring path = toWide(copy.string());
     if (path.size() > longestPath)
-        return notFetched(text, L"the path of its local copy has more than " + std::to_wstring(longestPath) +
-                                    L" characters");
+        return notFetched(text, translatedByCount(longestPath,
+                                                  L"the path of its local copy has more than {} character",
+                                                  L"the path of its local copy has more than {} characters"));
     if (!ignoreCache && !address->hasCredentials() && hasCopy(copy, *address))
         return Copy{TS_FROM_CACHE, path};
     if (const auto fetched = fetchInto(copy, *address); !fetched)
@@ -157,7 +165,7 @@ Result<> RemoteFiles::fetchInto(const std::filesystem::path& copy, const RemoteA
         return prepared;
     PartFile part(mCacheFolder);
     if (!part.made())
-        return about("local copy", copy, L" cannot be made: " + part.made().sentence());
+        return about(kNoCopy, copy, part.made());
     const auto tell = [&](std::uint64_t bytes)
     {
         constexpr std::uint64_t kThousand = 1024;

@@ -11,8 +11,6 @@ namespace tessel
 {
 namespace
 {
-constexpr std::wstring_view kYes = L"Yes";
-constexpr std::wstring_view kNo = L"No";
 constexpr std::wstring_view kBlanks = L" \t\r\n";
 
 bool begins(std::wstring_view word, std::wstring_view beginning)
@@ -59,12 +57,12 @@ std::wstring asText(double number)
     return toWide(stream.str());
 }
 
-std::optional<bool> yesOrNoIn(std::wstring_view answer)
+std::optional<bool> yesOrNoIn(std::wstring_view answer, std::wstring_view yes, std::wstring_view no)
 {
     const std::wstring word = trimmed(answer);
-    if (begins(kYes, word))
+    if (begins(yes, word))
         return true;
-    return begins(kNo, word) ? std::optional(false) : std::nullopt;
+    return begins(no, word) ? std::optional(false) : std::nullopt;
 }
 
 std::wstring asText(bool yes)

@@ -7,6 +7,7 @@
 #include "host/platform/OrdinaryFile.h"
 #include "host/text/CommandLine.h"
 #include "host/text/Running.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -43,9 +44,9 @@ Result<std::wstring> Help::show(const std::wstring& topic, const std::filesystem
     const std::wstring name = topic.empty() ? kFirstPage : topic;
     const auto page = pageIn(otherBook.empty() ? mBook : otherBook, toUtf8(name) + ".html");
     if (!isTopicName(name) || !isOrdinaryFile(page))
-        return Failure{L"There is no help on \"" + name + L"\"."};
-    const bool shown = mBrowser(page);
-    return (shown ? L"The help opens in the browser: " : L"Help: ") + toWide(page.string());
+        return Failure{translated(L"There is no help on \"{}\".", name)};
+    return mBrowser(page) ? translated(L"The help opens in the browser: {}", page)
+                          : translated(L"Help: {}", page);
 }
 } // namespace tessel
 

@@ -6,6 +6,7 @@
 
 #include "host/text/CommandLine.h"
 #include "host/text/Running.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -73,7 +74,7 @@ int MessageBox::present(const Box& box) const
 
 void MessageBox::sayMessage(const std::wstring& text)
 {
-    mCommandLine.say(L"Message: " + text);
+    mCommandLine.say(translated(L"Message: {}", text));
 }
 
 int MessageBox::show(const wchar_t* text, unsigned style, void* parent)

@@ -7,6 +7,7 @@
 #include "host/messages/Answers.h"
 #include "host/messages/Questions.h"
 #include "host/text/Running.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace
@@ -14,6 +15,8 @@ namespace
 using tessel::Failure;
 using tessel::Questions;
 using tessel::Result;
+using tessel::translated;
+using tessel::translatedByCount;
 
 int ask(const Questions::Question& question, const Questions::Taker& take)
 {
@@ -29,10 +32,18 @@ std::optional<std::wstring> orNothing(const wchar_t* text)
 Result<> copyInto(const std::wstring& text, wchar_t* buffer, std::size_t capacity)
 {
     if (text.size() >= capacity)
-        return Failure{L"This is too long: at most " + std::to_wstring(capacity - 1) +
-                       L" characters can be taken."};
+        return Failure{translatedByCount(capacity - 1,
+                                         L"This is too long: at most {} character can be taken.",
+                                         L"This is too long: at most {} characters can be taken.")};
     *std::ranges::copy(text, buffer).out = L'\0';
     return {};
+}
+
+// The person's own words, or the English ones, which scripts have.
+std::optional<bool> yesOrNo(const std::wstring& text)
+{
+    const auto inOwnWords = tessel::yesOrNoIn(text, translated(L"Yes"), translated(L"No"));
+    return inOwnWords ? inOwnWords : tessel::yesOrNoIn(text);
 }
 
 // The full path, of a file that is there if it has to be.
@@ -40,13 +51,13 @@ Result<std::wstring> fileAt(const std::wstring& typed, bool mustExist)
 {
     const std::filesystem::path path = tessel::toUtf8(typed);
     if (path.empty())
-        return Failure{L"This is no name of a file."};
+        return Failure{translated(L"This is no name of a file.")};
     std::error_code failed;
     if (mustExist && !std::filesystem::is_regular_file(path, failed))
-        return Failure{L"There is no file " + typed + L"."};
+        return Failure{translated(L"There is no file {}.", typed)};
     const auto full = std::filesystem::absolute(path, failed);
     if (failed)
-        return Failure{L"The current folder is gone: name the whole path."};
+        return Failure{translated(L"The current folder is gone: name the whole path.")};
     return tessel::toWide(full.lexically_normal().native());
 }
 } // namespace
@@ -69,7 +80,7 @@ int tsaskNumber(const wchar_t* question, const double* byDefault, double* answer
                {
                    const auto number = tessel::numberIn(text);
                    if (!number)
-                       return Failure{L"This is no number: \"" + text + L"\"."};
+                       return Failure{translated(L"This is no number: \"{}\".", text)};
                    *answer = *number;
                    return {};
                });
@@ -79,13 +90,15 @@ int tsaskYesOrNo(const wchar_t* question, const bool* byDefault, bool* answer)
 {
     if (!question || !answer)
         return TSASK_INVALID;
-    const auto shownDefault = byDefault ? std::optional(tessel::asText(*byDefault)) : std::nullopt;
-    return ask({question, tessel::asText(true) + L"/" + tessel::asText(false), shownDefault},
+    const std::wstring yesInWords = translated(L"Yes");
+    const std::wstring noInWords = translated(L"No");
+    const auto shownDefault = byDefault ? std::optional(*byDefault ? yesInWords : noInWords) : std::nullopt;
+    return ask({question, yesInWords + L"/" + noInWords, shownDefault},
                [&](const std::wstring& text) -> Result<>
                {
-                   const auto yes = tessel::yesOrNoIn(text);
+                   const auto yes = yesOrNo(text);
                    if (!yes)
-                       return Failure{L"This is neither yes nor no: \"" + text + L"\"."};
+                       return Failure{translated(L"This is neither yes nor no: \"{}\".", text)};
                    *answer = *yes;
                    return {};
                });

@@ -13,6 +13,7 @@
 #include "host/platform/ObjectiveCGuard.h"
 #include "host/platform/RealPath.h"
 #include "host/platform/SystemFailure.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -42,11 +43,11 @@ Result<> checkProgramName(id name)
     if (!name)
         return {};
     if (![name isKindOfClass:[NSString class]])
-        return Failure{L"its description has no text for the name of its program"};
+        return Failure{translated(L"its description has no text for the name of its program")};
     if (leadsInside([name fileSystemRepresentation]))
         return {};
-    return Failure{L"its description names the program \"" + NSStringToWstring(name) +
-                   L"\", which leads out of the bundle"};
+    return Failure{translated(L"its description names the program \"{}\", which leads out of the bundle",
+                              NSStringToWstring(name))};
 }
 
 // By either name that the platforms have for it.
@@ -64,19 +65,19 @@ Result<std::string> askForProgram(const std::string& folder)
     const std::string bundleFolder = bundle ? [[bundle bundlePath] fileSystemRepresentation] : folder;
     if (!std::filesystem::equivalent(bundleFolder, folder, failed))
         // GNUstep answers with the bundle that it has opened before under the same identifier.
-        return Failure{L"the bundle \"" + toWide(bundleFolder) + L"\" has the same identifier"};
+        return Failure{translated(L"the bundle \"{}\" has the same identifier", toWide(bundleFolder))};
     if (auto checked = checkProgramNames(bundle); !checked)
         return checked.failure();
     NSString* path = [bundle executablePath];
     if (!path)
-        return Failure{L"the bundle holds no program for this system"};
+        return Failure{translated(L"the bundle holds no program for this system")};
     const std::string program = [path fileSystemRepresentation];
     if (!std::filesystem::exists(program, failed))
-        return Failure{L"its program \"" + toWide(program) + L"\" is missing"};
+        return Failure{translated(L"its program \"{}\" is missing", toWide(program))};
     const std::filesystem::path real = realPath(program);
     if (!isWithin(real.native(), realPath(folder).native()))
-        return Failure{L"its program \"" + toWide(program) + L"\" leads out of the bundle, to \"" +
-                       toWide(real.native()) + L"\""};
+        return Failure{
+            translated(L"its program \"{}\" leads out of the bundle, to \"{}\"", toWide(program), real)};
     return program;
 }
 } // namespace
@@ -95,12 +96,12 @@ Result<std::string> programOfBundle(const std::string& folder)
     if (!std::filesystem::exists(folder, failed))
         return systemFailure(failed ? failed.value() : ENOENT);
     if (!std::filesystem::is_directory(folder, failed))
-        return Failure{L"it is a file, and a bundle is a folder"};
+        return Failure{translated(L"it is a file, and a bundle is a folder")};
     if (auto checked = checkDescription(folder); !checked)
         return checked.failure();
     Result<std::string> program = Failure{};
     const auto returned = catchObjectiveC([&] { program = askForProgram(folder); });
-    return returned ? program : Failure{L"the platform's bundles raised " + returned.sentence()};
+    return returned ? program : Failure{translated(L"the platform's bundles raised {}", returned.sentence())};
 }
 
 Result<> loadBundle(const std::string& folder)
@@ -110,7 +111,8 @@ Result<> loadBundle(const std::string& folder)
     const auto returned = catchObjectiveC([&] { loaded = [bundleAt(folder) load] == YES; });
     if (!returned)
         return Failure{returned.sentence(), kBundleRaised};
-    return loaded ? Result<>() : Failure{L"the platform does not accept it as a bundle", kBundleNotAccepted};
+    return loaded ? Result<>()
+                  : Failure{translated(L"the platform does not accept it as a bundle"), kBundleNotAccepted};
 }
 
 Result<> unloadBundle(const std::string& folder)

@@ -9,6 +9,7 @@
 #include "host/platform/DescriptionPlaces.h"
 #include "host/platform/ObjectiveCGuard.h"
 #include "host/platform/RegularFile.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -32,16 +33,16 @@ Result<std::string> contentOf(const RegularFile& file)
     if (!file.opened())
         return file.opened().failure();
     if (file.size() > kMostBytes)
-        return Failure{L"it is too large for a description"};
+        return Failure{translated(L"it is too large for a description")};
     std::string content(file.size(), '\0');
     if (!file.read(0, content.data(), content.size()))
-        return Failure{L"it cannot be read to its end"};
+        return Failure{translated(L"it cannot be read to its end")};
     if (isForMachines(content))
-        return Failure{L"it is no property list that a person or a tool for bundles writes"};
+        return Failure{translated(L"it is no property list that a person or a tool for bundles writes")};
     const auto beginsList = [](char character)
     { return kBeginnings.find(character) != std::string_view::npos; };
     if (std::ranges::count_if(content, beginsList) > kMostLists)
-        return Failure{L"it holds too many lists for a description"};
+        return Failure{translated(L"it holds too many lists for a description")};
     return content;
 }
 
@@ -56,10 +57,10 @@ Result<> checkList(const std::string& content)
     if (description)
         return [description isKindOfClass:[NSDictionary class]]
                    ? Result<>()
-                   : Failure{L"it is no table of names and values"};
+                   : Failure{translated(L"it is no table of names and values")};
     NSString* why = [error localizedDescription];
-    return Failure{L"it is no property list" +
-                   (why ? L" (" + NSStringToWstring(why) + L")" : std::wstring())};
+    return Failure{why ? translated(L"it is no property list ({})", NSStringToWstring(why))
+                       : translated(L"it is no property list")};
 }
 
 Result<> checkFile(const RegularFile& file)
@@ -69,7 +70,7 @@ Result<> checkFile(const RegularFile& file)
         return content.failure();
     Result<> checked;
     const auto returned = catchObjectiveC([&] { checked = checkList(*content); });
-    return returned ? checked : Failure{L"it is no property list (" + returned.sentence() + L")"};
+    return returned ? checked : Failure{translated(L"it is no property list ({})", returned.sentence())};
 }
 } // namespace
 
@@ -83,8 +84,8 @@ Result<> checkDescription(const std::string& folder)
             continue;
         const auto checked = checkFile(file);
         return checked ? checked
-                       : Failure{L"its description \"" + toWide(path) + L"\" cannot be used: " +
-                                 checked.sentence()};
+                       : Failure{translated(L"its description \"{}\" cannot be used: {}", toWide(path),
+                                            checked.sentence())};
     }
     return {};
 }

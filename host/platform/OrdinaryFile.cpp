@@ -11,6 +11,7 @@
 #include "host/platform/Descriptor.h"
 #include "host/platform/SystemFailure.h"
 #include "host/text/Sizes.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -24,7 +25,7 @@ Failure whyUnreadable()
 
 Failure tooLarge(std::uintmax_t mostBytes)
 {
-    return {L"it is larger than " + sizeInWords(mostBytes)};
+    return {translated(L"it is larger than {}", sizeInWords(mostBytes))};
 }
 } // namespace
 
@@ -37,8 +38,8 @@ bool isOrdinaryFile(const std::filesystem::path& path)
 Result<> checkOrdinary(const struct stat& status)
 {
     if (S_ISDIR(status.st_mode))
-        return Failure{L"it is a folder, not a file"};
-    return S_ISREG(status.st_mode) ? Result<>() : Failure{L"it is not an ordinary file"};
+        return Failure{translated(L"it is a folder, not a file")};
+    return S_ISREG(status.st_mode) ? Result<>() : Failure{translated(L"it is not an ordinary file")};
 }
 
 Result<Descriptor> openOrdinaryFile(const std::filesystem::path& path, struct stat& status)

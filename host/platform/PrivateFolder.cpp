@@ -7,6 +7,7 @@
 #include <unistd.h>
 
 #include "host/platform/SystemFailure.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -43,9 +44,9 @@ Result<> checkNobodyElseWrites(const std::filesystem::path& path)
     if (stat(path.c_str(), &status) != 0)
         return systemFailure(errno);
     if (status.st_uid != geteuid() && status.st_uid != kAdministrator)
-        return Failure{L"it belongs to another user", kBelongsToAnother};
+        return Failure{translated(L"it belongs to another user"), kBelongsToAnother};
     if ((status.st_mode & (S_IWGRP | S_IWOTH)) != 0)
-        return Failure{L"other users may write to it"};
+        return Failure{translated(L"other users may write to it")};
     return {};
 }
 

@@ -6,6 +6,7 @@
 #include <unistd.h>
 
 #include "host/platform/OrdinaryFile.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -18,7 +19,7 @@ RegularFile::RegularFile(const std::string& path)
     if (!file)
         mOpened = file.failure();
     else if (mSize == 0)
-        mOpened = Failure{L"the file is empty"};
+        mOpened = Failure{translated(L"the file is empty")};
     else
         mFile = *std::move(file);
 }

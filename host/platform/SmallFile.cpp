@@ -10,18 +10,13 @@
 #include "host/platform/PartFile.h"
 #include "host/platform/PrivateFolder.h"
 #include "host/platform/SystemFailure.h"
-#include "host/text/Unicode.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
 namespace
 {
 constexpr std::uintmax_t kLargest = std::uintmax_t{4} << 20;
-
-Failure failed(const std::filesystem::path& file, const wchar_t* what, const std::wstring& why)
-{
-    return {L"The file " + toWide(file.string()) + what + why + L"."};
-}
 
 bool isHeldByAnother()
 {
@@ -48,11 +43,11 @@ FileLock::FileLock(const std::filesystem::path& file, std::chrono::milliseconds 
     : mFile(open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, kOwnersOnly))
 {
     if (!mFile)
-        mHeld = Failure{L"the file " + toWide(file.string()) + L" cannot be opened: " +
-                        systemFailure(errno).sentence};
+        mHeld = Failure{translated(L"the file {} cannot be opened: {}", file, systemFailure(errno).sentence)};
     else if (!lockWithin(patience, mFile.number()))
-        mHeld = Failure{L"the file " + toWide(file.string()) + L" cannot be locked: " +
-                        (isHeldByAnother() ? L"another program holds it" : systemFailure(errno).sentence)};
+        mHeld = Failure{translated(L"the file {} cannot be locked: {}", file,
+                                   isHeldByAnother() ? translated(L"another program holds it")
+                                                     : systemFailure(errno).sentence)};
 }
 
 // Locks of this kind belong to the process: a child that an application has left behind does not hold them.
@@ -76,7 +71,7 @@ Result<std::optional<std::string>> readSmallFile(const std::filesystem::path& fi
         return std::optional(*std::move(content));
     if (content.code() == kNothingThere)
         return std::optional<std::string>();
-    return failed(file, L" cannot be read: ", content.sentence());
+    return Failure{translated(L"The file {} cannot be read: {}.", file, content.sentence())};
 }
 
 std::string escaped(std::string_view text)
@@ -121,6 +116,7 @@ std::vector<std::string_view> linesOf(std::string_view text)
 Result<> replaceSmallFile(const std::filesystem::path& file, std::string_view content)
 {
     const auto replaced = replaceFile(file, content);
-    return replaced ? replaced : failed(file, L" cannot be written: ", replaced.sentence());
+    return replaced ? replaced
+                    : Failure{translated(L"The file {} cannot be written: {}.", file, replaced.sentence())};
 }
 } // namespace tessel

@@ -10,7 +10,7 @@
 
 #include "host/platform/SystemFailure.h"
 #include "host/registry/Journals.h"
-#include "host/text/Unicode.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -67,14 +67,14 @@ Result<> CopyElsewhere::make(const std::filesystem::path& file)
     std::error_code failed;
     std::string name = (std::filesystem::temp_directory_path(failed) / "tessel-XXXXXX").string();
     if (failed || !mkdtemp(name.data()))
-        return failed ? Failure{toWide(failed.message())} : systemFailure(errno);
+        return systemFailure(failed ? failed.value() : errno);
     mFolder = name;
     const auto parts = partsOf(file);
     const auto places = partsOf(this->file());
     const auto before = stateOfAll(parts);
     for (std::size_t part = 0; part < kPartCount; ++part)
         if (const auto error = copyPart(parts[part], places[part]); error)
-            return Failure{toWide(error.message())};
-    return stateOfAll(parts) == before ? Result<>() : Failure{L"it is being written"};
+            return systemFailure(error.value());
+    return stateOfAll(parts) == before ? Result<>() : Failure{translated(L"it is being written")};
 }
 } // namespace tessel

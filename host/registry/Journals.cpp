@@ -14,7 +14,7 @@
 
 #include "host/registry/StoreFailure.h"
 #include "host/text/Hexadecimal.h"
-#include "host/text/Unicode.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -169,17 +169,19 @@ Result<std::optional<std::wstring>> setForeignLogAside(const std::filesystem::pa
         return std::optional<std::wstring>();
     const auto log = logOf(file);
     const auto aside = freeNameLike(log.string() + ".foreign");
-    const std::wstring belongsElsewhere =
-        L"the write-ahead log " + toWide(log.string()) +
-        L" does not belong to it, but to another registry or to another state of it";
     if (rename(log.c_str(), aside.c_str()) != 0)
     {
         const Failure failure = fileFailure(errno);
-        return Failure{belongsElsewhere + L", and cannot be set aside: " + failure.sentence, failure.code};
+        return Failure{translated(L"the write-ahead log {} does not belong to it, but to another registry or "
+                                  L"to another state of it, and cannot be set aside: {}",
+                                  log, failure.sentence),
+                       failure.code};
     }
     static_cast<void>(remove(indexOfLog(file).c_str()));
-    return std::optional(L"The registry " + toWide(file.string()) + L" is read without its log: " +
-                         belongsElsewhere + L". It was set aside as " + toWide(aside.string()) + L".");
+    return std::optional(
+        translated(L"The registry {} is read without its log: the write-ahead log {} does not belong to it, "
+                   L"but to another registry or to another state of it. It was set aside as {}.",
+                   file, log, aside));
 }
 
 std::string asFixedFile(const std::filesystem::path& file)

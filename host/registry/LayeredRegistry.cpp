@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <utility>
 
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -104,8 +105,9 @@ Result<std::wstring> LayeredRegistry::readValue(Key key, std::wstring_view name)
 void LayeredRegistry::tellLaidDown(const std::wstring& path, const RegistryTree::Value& value)
 {
     if (mSay && mTold.insert(foldCase(path)).second)
-        mSay(L"Values of \"" + path + L"\" are laid down by the administrator, in " +
-             toWide(value.file.native()) + L": what is changed in them does not count.");
+        mSay(translated(L"Values of \"{}\" are laid down by the administrator, in {}: what is changed in "
+                        L"them does not count.",
+                        path, value.file));
 }
 
 Result<> LayeredRegistry::writeValue(Key key, std::wstring_view name, std::wstring_view data)

@@ -1,5 +1,7 @@
 #include "host/registry/LongWork.h"
 
+#include "host/text/Translation.h"
+
 namespace tessel
 {
 namespace
@@ -38,8 +40,8 @@ void LongWork::tell()
     begin();
     if (!isLong())
         return;
-    say(L"The registry has read or written " + std::to_wstring(mValues) +
-        L" values so far. Ctrl-C stops it.");
+    say(translatedByCount(mValues, L"The registry has read or written {} value so far. Ctrl-C stops it.",
+                          L"The registry has read or written {} values so far. Ctrl-C stops it."));
 }
 
 void LongWork::end()

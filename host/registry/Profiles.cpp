@@ -1,6 +1,7 @@
 #include "host/registry/Profiles.h"
 
 #include "host/registry/LayeredRegistry.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -34,10 +35,10 @@ std::wstring Profiles::current() const
 Result<> Profiles::setCurrent(const std::wstring& name)
 {
     if (!isProfileName(name))
-        return Failure{L"\"" + name + L"\" cannot be the name of a profile."};
+        return Failure{translated(L"\"{}\" cannot be the name of a profile.", name)};
     if (!mRegistry.write(mKey, kCurrentProfileValue, name))
-        return Failure{L"The profile cannot be changed to \"" + name +
-                       L"\": the registry cannot be written."};
+        return Failure{
+            translated(L"The profile cannot be changed to \"{}\": the registry cannot be written.", name)};
     return {};
 }
 } // namespace tessel

@@ -12,6 +12,7 @@
 #include "host/registry/Soundness.h"
 #include "host/registry/Statements.h"
 #include "host/registry/StoreFailure.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -35,24 +36,28 @@ bool isLockRefused(int status)
 
 Failure noSuchValue()
 {
-    return {L"There is no such value.", ERROR_FILE_NOT_FOUND};
+    return {translated(L"There is no such value."), ERROR_FILE_NOT_FOUND};
 }
 
 Failure noMoreValues()
 {
-    return {L"There are no more values.", ERROR_NO_MORE_ITEMS};
+    return {translated(L"There are no more values."), ERROR_NO_MORE_ITEMS};
 }
 } // namespace
 
 Registry::Registry(std::filesystem::path file, std::chrono::milliseconds busyTimeout, LongWork::Say say,
                    LockWait::IsUnwanted isUnwanted)
-    : mFile(std::move(file)), mWait(busyTimeout,
-                                    [this](bool canBeStopped)
-                                    {
-                                        mWork.say(L"Tessel waits for the registry " + toWide(mFile.string()) +
-                                                  L", which another program holds." +
-                                                  (canBeStopped ? L" Ctrl-C goes on without it." : L""));
-                                    }),
+    : mFile(std::move(file)),
+      mWait(busyTimeout,
+            [this](bool canBeStopped)
+            {
+                mWork.say(canBeStopped
+                              ? translated(L"Tessel waits for the registry {}, which another program holds. "
+                                           L"Ctrl-C goes on without it.",
+                                           mFile)
+                              : translated(L"Tessel waits for the registry {}, which another program holds.",
+                                           mFile));
+            }),
       mNextHandle(kFirstHandle)
 {
     mWork.tellBy(std::move(say));
@@ -165,7 +170,7 @@ std::vector<std::wstring> Registry::subKeys(Key key)
 Result<> Registry::removeKey(Key key)
 {
     if (key == kNoKey || key == kRoot)
-        return Failure{L"Only a key below the root can be removed.", ERROR_INVALID_PARAMETER};
+        return Failure{translated(L"Only a key below the root can be removed."), ERROR_INVALID_PARAMETER};
     if (auto writing = beginWriting(); !writing)
         return writing;
     if (auto sound = checkBeforeRemoval(); !sound)
@@ -288,7 +293,7 @@ Result<> Registry::beginWriting()
     letGoOfRows();
     mWork.count();
     if (mCommand && mWork.isInterrupted())
-        return fail(SQLITE_INTERRUPT, L"written");
+        return fail(SQLITE_INTERRUPT);
     if (!mCommand || mWriting)
         return mCommand;
     // What was read by now is of a moment that may be over; the writes are to stand on what is stored now.
@@ -300,7 +305,7 @@ Result<> Registry::beginWriting()
     mWriting = status == SQLITE_DONE;
     if (mWriting)
         status = mStatements->mark.run();
-    return status == SQLITE_DONE ? Result<>() : fail(status, L"written");
+    return status == SQLITE_DONE ? Result<>() : fail(status);
 }
 
 // What is written to a file that has lost its name is lost with it.
@@ -310,11 +315,10 @@ Result<> Registry::checkPlace()
     sqlite3_file_control(mDatabase, "main", SQLITE_FCNTL_HAS_MOVED, &moved);
     if (moved == 0)
         return {};
-    return giveUp(
-        {L"Nothing more can be stored in the registry " + toWide(mFile.string()) +
-             L" in this session: it was removed, or another file was put in its place. Start Tessel "
-             L"again.",
-         ERROR_WRITE_FAULT});
+    return giveUp({translated(L"Nothing more can be stored in the registry {} in this session: it was "
+                              L"removed, or another file was put in its place. Start Tessel again.",
+                              mFile),
+                   ERROR_WRITE_FAULT});
 }
 
 // What a removal rests on was read, and damage may have left some of it out.
@@ -322,7 +326,8 @@ Result<> Registry::checkBeforeRemoval()
 {
     if (mLookedAt)
         return {};
-    const LongStatements looking = whileIt(L"looks through", false);
+    const LongStatements looking = whileTelling(
+        translated(L"Tessel looks through the registry {}, which takes its time.", mFile), false);
     const auto sound = checkSoundness(mDatabase, kSchemaVersion);
     mLookedAt = static_cast<bool>(sound);
     return sound ? sound : giveUp(whatIsWrong(sound.failure()));
@@ -347,13 +352,13 @@ void Registry::lookInto(Key key)
 Result<> Registry::finishWrite(int status)
 {
     if (status != SQLITE_DONE)
-        return fail(status, L"written");
+        return fail(status);
     ++mWrites;
     if (mWrites > kWritesFlushedAtOnce && mWrites % kWritesFlushedAtOnce != 0)
         return {};
     status = sqlite3_db_cacheflush(mDatabase);
     // Pages in use are flushed another time.
-    return status == SQLITE_OK || status == SQLITE_BUSY ? Result<>() : fail(status, L"written");
+    return status == SQLITE_OK || status == SQLITE_BUSY ? Result<>() : fail(status);
 }
 
 // What could not be read must not be mistaken for what is not there and then be overwritten. The command's
@@ -373,7 +378,7 @@ int Registry::step(Statement& statement)
         return status;
     }
     statement.reset();
-    failRead(L"a row of it is not what was stored there", SQLITE_CORRUPT);
+    failRead(translated(L"a row of it is not what was stored there"), SQLITE_CORRUPT);
     return SQLITE_CORRUPT;
 }
 
@@ -397,7 +402,7 @@ bool Registry::isNext(Statement& statement, std::int64_t& last)
         return true;
     }
     statement.reset();
-    failRead(L"an index of it is out of order", SQLITE_CORRUPT);
+    failRead(translated(L"an index of it is out of order"), SQLITE_CORRUPT);
     return false;
 }
 
@@ -421,9 +426,9 @@ void Registry::failRead(const std::wstring& words, int code)
 
 Failure Registry::unreadable(const Failure& found)
 {
-    return {L"The registry " + toWide(mFile.string()) + L" could not be read: " + found.sentence +
-                L". Nothing more is stored in this session, so that nothing is lost. " +
-                whatHelps(found.code),
+    return {translated(L"The registry {} could not be read: {}. Nothing more is stored in this session, so "
+                       L"that nothing is lost. {}",
+                       mFile, found.sentence, whatHelps(found.code)),
             ERROR_READ_FAULT};
 }
 
@@ -440,7 +445,7 @@ Failure Registry::giveUp(Failure failure)
 
 // Undoes the command at once: until it ends it reads what was stored before, and not what half a command
 // left.
-Failure Registry::fail(int status, const wchar_t* done)
+Failure Registry::fail(int status)
 {
     if (!mCommand)
     {
@@ -449,10 +454,11 @@ Failure Registry::fail(int status, const wchar_t* done)
     }
     const Failure reason = storeFailure(mDatabase, status);
     const std::wstring help = whatHelpsInSession(reason.code);
-    mCommand = Failure{L"The registry " + toWide(mFile.string()) + L" could not be " + done + L": " +
-                           reason.sentence + L". What was stored before is unchanged." +
-                           (help.empty() ? L"" : L" " + help),
-                       statusOf(reason.code)};
+    mCommand =
+        Failure{translated(L"The registry {} could not be written: {}. What was stored before is unchanged.",
+                           mFile, reason.sentence) +
+                    (help.empty() ? L"" : L" " + help),
+                statusOf(reason.code)};
     undoCommand();
     return mCommand.failure();
 }
@@ -508,7 +514,7 @@ void Registry::commit()
     const int status = mStatements->commit.run();
     mHasStored = mHasStored || (mWriting && status == SQLITE_DONE);
     if (status != SQLITE_DONE)
-        static_cast<void>(fail(status, L"written")); // the command's end tells it
+        static_cast<void>(fail(status)); // the command's end tells it
     mWriting = false;
 }
 

@@ -164,15 +164,16 @@ private:
     Result<> bringUpToDate(int version);
     Result<> prepareStatements();
     Result<> chooseJournal();
-    // What a person is told meanwhile; `deed` as in "looks through the registry".
-    LongStatements whileIt(const std::wstring& deed, bool canBeStopped);
+    // The sentence is what a person is told meanwhile.
+    LongStatements whileTelling(const std::wstring& sentence, bool canBeStopped);
     void lookAtAll(int version);
     void renewCopy(bool changed);
     Failure whatIsWrong(const Failure& found);
     Failure unreadable(const Failure& found);
     std::wstring whatHelps(int code);
     Result<> checkIsDamaged() const;
-    Result<std::wstring> replaceWith(Result<std::filesystem::path> (*replace)(const std::filesystem::path&));
+    Result<std::filesystem::path>
+        replaceWith(Result<std::filesystem::path> (*replace)(const std::filesystem::path&));
     bool isFollowed(std::wstring_view path, Key from) const;
     void noteFollowed(std::wstring_view path, Key from, Key key);
     Key findChild(Key parent, std::wstring_view name);
@@ -193,7 +194,7 @@ private:
     void failStep(int status);
     void endOfWork();
     bool isNext(Statement& statement, std::int64_t& last);
-    Failure fail(int status, const wchar_t* done);
+    Failure fail(int status);
     void failRead(const std::wstring& words, int code);
     Failure giveUp(Failure failure);
     void undoCommand();

@@ -7,6 +7,7 @@
 
 #include "host/platform/OrdinaryFile.h"
 #include "host/registry/KeyPath.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -37,8 +38,8 @@ void take(const fs::path& file, RegistryTree& tree, std::vector<std::wstring>& s
     if (changes)
         tree.apply(*changes, file);
     else
-        sentences.push_back(L"The values for everybody in " + toWide(file.native()) + L" do not count: " +
-                            changes.sentence() + L".");
+        sentences.push_back(
+            translated(L"The values for everybody in {} do not count: {}.", file, changes.sentence()));
 }
 } // namespace
 

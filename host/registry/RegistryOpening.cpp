@@ -17,7 +17,7 @@
 #include "host/registry/Soundness.h"
 #include "host/registry/Statements.h"
 #include "host/registry/StoreFailure.h"
-#include "host/text/Unicode.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -67,8 +67,7 @@ Result<> checkPlacesOfJournals(const std::filesystem::path& file)
 {
     for (const auto& journal : {logOf(file), indexOfLog(file), rollbackJournalOf(file)})
         if (const auto ordinary = checkKind(journal); ordinary.code() == SQLITE_NOTADB)
-            return Failure{L"what stands at " + toWide(journal.string()) + L" is in its way: " +
-                               ordinary.sentence(),
+            return Failure{translated(L"what stands at {} is in its way: {}", journal, ordinary.sentence()),
                            kInTheWay};
     return {};
 }
@@ -79,7 +78,7 @@ Failure whyRefused(const std::filesystem::path& file, const Failure& failure)
 {
     const bool isUnclear = failure.code == SQLITE_CANTOPEN || failure.code == SQLITE_PERM;
     if (isUnclear && access(file.parent_path().c_str(), W_OK) != 0)
-        return {L"its folder may not be written", SQLITE_PERM};
+        return {translated(L"its folder may not be written"), SQLITE_PERM};
     return failure;
 }
 
@@ -119,10 +118,10 @@ void Registry::open()
     if (!ready)
         refuse(ready);
     else if (mReadOnly && mCanStore)
-        mCanStore =
-            Failure{L"The registry " + toWide(mFile.string()) +
-                        L" may only be read: what is stored there is used, and nothing new will be stored.",
-                    ERROR_ACCESS_DENIED};
+        mCanStore = Failure{translated(L"The registry {} may only be read: what is stored there is used, and "
+                                       L"nothing new will be stored.",
+                                       mFile),
+                            ERROR_ACCESS_DENIED};
 }
 
 void Registry::close()
@@ -136,19 +135,23 @@ void Registry::refuse(const Result<>& reason)
 {
     close();
     mDamaged = isDamage(reason.code());
-    mCanStore = Failure{L"The registry " + toWide(mFile.string()) + L" cannot be used: " + reason.sentence() +
-                            (fileExists(mFile) ? L". It was left as it is, and nothing will be stored. "
-                                               : L". Nothing will be stored. ") +
-                            whatHelps(reason.code()),
-                        ERROR_ACCESS_DENIED};
+    const std::wstring help = whatHelps(reason.code());
+    mCanStore = Failure{
+        fileExists(mFile)
+            ? translated(
+                  L"The registry {} cannot be used: {}. It was left as it is, and nothing will be stored. {}",
+                  mFile, reason.sentence(), help)
+            : translated(L"The registry {} cannot be used: {}. Nothing will be stored. {}", mFile,
+                         reason.sentence(), help),
+        ERROR_ACCESS_DENIED};
 }
 
 // What is there is read.
 void Registry::storeNothing(const Failure& reason)
 {
     mCanStore =
-        Failure{L"Nothing can be stored in the registry " + toWide(mFile.string()) + L": " + reason.sentence +
-                    L". What is stored there is used. " + whatHelpsAtStart(reason.code),
+        Failure{translated(L"Nothing can be stored in the registry {}: {}. What is stored there is used. {}",
+                           mFile, reason.sentence, whatHelpsAtStart(reason.code)),
                 ERROR_ACCESS_DENIED};
 }
 
@@ -160,7 +163,8 @@ Result<> Registry::makeMissingFile()
     if (holdsSomething(mFile))
         return {};
     if (hasCopy)
-        return Failure{L"it is empty or missing, but the copy of what it held is there", SQLITE_CORRUPT};
+        return Failure{translated(L"it is empty or missing, but the copy of what it held is there"),
+                       SQLITE_CORRUPT};
     if (fileExists(mFile))
         return {};
     auto bytes = emptyRegistry();
@@ -169,7 +173,7 @@ Result<> Registry::makeMissingFile()
     if (!isOnNetwork(mFile.parent_path().string()))
         bytes->replace(kJournalKind, kJournalKindBytes, kJournalKindBytes, '\2');
     const auto made = makeFileOnce(mFile, *bytes);
-    return made ? made : Failure{L"it cannot be made: " + made.sentence(), SQLITE_CANTOPEN};
+    return made ? made : Failure{translated(L"it cannot be made: {}", made.sentence()), SQLITE_CANTOPEN};
 }
 
 Result<> Registry::connect(const std::string& name, int flags)
@@ -329,16 +333,17 @@ Result<int> Registry::checkUnknown(int version)
     const bool hasCopy = fileExists(soundCopyOf(mFile));
     if (version > kSchemaVersion)
         return isOurs && hasCopy
-                   ? Failure{L"it was written by a newer Tessel, or its version is damaged", SQLITE_CORRUPT}
-                   : Failure{L"it was written by a newer Tessel", kOfANewerTessel};
+                   ? Failure{translated(L"it was written by a newer Tessel, or its version is damaged"),
+                             SQLITE_CORRUPT}
+                   : Failure{translated(L"it was written by a newer Tessel"), kOfANewerTessel};
     if (isOurs)
-        return Failure{L"its version is damaged", SQLITE_CORRUPT};
+        return Failure{translated(L"its version is damaged"), SQLITE_CORRUPT};
     const auto tables = firstNumber(mDatabase, "SELECT count(*) FROM sqlite_master");
     if (!tables)
         return tables.failure();
     if (version == 0 && *tables == 0)
         return version;
-    return Failure{L"it belongs to another program", hasCopy ? SQLITE_NOTADB : kOfAnotherProgram};
+    return Failure{translated(L"it belongs to another program"), hasCopy ? SQLITE_NOTADB : kOfAnotherProgram};
 }
 
 // What is somebody else's is recognised before anything is written: the journal's kind is part of the file.
@@ -365,13 +370,11 @@ Result<> Registry::prepare()
     return journal;
 }
 
-LongStatements Registry::whileIt(const std::wstring& deed, bool canBeStopped)
+LongStatements Registry::whileTelling(const std::wstring& sentence, bool canBeStopped)
 {
-    const std::wstring sentence =
-        L"Tessel " + deed + L" the registry " + toWide(mFile.string()) + L", which takes its time.";
     if (!canBeStopped)
         return {mDatabase, mWork, sentence, {}};
-    return {mDatabase, mWork, sentence + L" Ctrl-C ends that.",
+    return {mDatabase, mWork, sentence + L" " + translated(L"Ctrl-C ends that."),
             [this]
             {
                 return mWait.isUnwanted();
@@ -386,12 +389,14 @@ void Registry::lookAtAll(int version)
     const bool old = version < kSchemaVersion;
     if (!old && !mLeftOpen && random() % startsBetweenLooks(mDatabase) != 0)
         return;
-    const LongStatements looking = whileIt(L"looks through", true);
+    const LongStatements looking =
+        whileTelling(translated(L"Tessel looks through the registry {}, which takes its time.", mFile), true);
     const auto sound = checkSoundness(mDatabase, version);
     mLookedAt = static_cast<bool>(sound);
     if (sound.code() == SQLITE_INTERRUPT)
-        mWork.say(L"The registry " + toWide(mFile.string()) +
-                  L" was not looked through to its end. That is done before anything is removed from it.");
+        mWork.say(translated(L"The registry {} was not looked through to its end. That is done before "
+                             L"anything is removed from it.",
+                             mFile));
     else if (!sound)
         mCanStore = whatIsWrong(sound.failure());
 }
@@ -402,10 +407,11 @@ Result<> Registry::bringUpToDate(int version)
     if (version == kSchemaVersion)
         return {};
     if (version == 0)
-        return mReadOnly ? Failure{L"it is empty and may not be written"} : makeTables(mDatabase);
+        return mReadOnly ? Failure{translated(L"it is empty and may not be written")} : makeTables(mDatabase);
     if (!mReadOnly && mCanStore)
     {
-        const LongStatements changing = whileIt(L"brings up to date", false);
+        const LongStatements changing = whileTelling(
+            translated(L"Tessel brings up to date the registry {}, which takes its time.", mFile), false);
         const auto changed = addChecksums(mDatabase);
         if (changed)
             return changed;
@@ -431,8 +437,8 @@ Result<> Registry::chooseJournal()
     const bool network = isOnNetwork(mFile.parent_path().string());
     const auto kind = firstText(mDatabase, network ? kUseJournal : kUseLog);
     if (network && (!kind || *kind != L"delete"))
-        return Failure{
-            L"it lies in a folder of the network, and another session has it open as if it did not"};
+        return Failure{translated(
+            L"it lies in a folder of the network, and another session has it open as if it did not")};
     if (kind || !isRefusal(kind.code()))
         // Another process is about to change the journal's kind; until then the old one keeps the promises
         // too.

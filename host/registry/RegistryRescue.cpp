@@ -5,7 +5,7 @@
 #include "host/registry/Registry.h"
 #include "host/registry/SoundCopy.h"
 #include "host/registry/StoreFailure.h"
-#include "host/text/Unicode.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -31,9 +31,10 @@ Failure Registry::whatIsWrong(const Failure& found)
     if (!isDamage(found.code))
         return unreadable(found);
     mDamaged = true;
-    return {L"The registry " + toWide(mFile.string()) + L" is damaged: " + found.sentence +
-                L". It was left as it is, and nothing will be stored. " + helpAgainstDamage(mFile),
-            ERROR_ACCESS_DENIED};
+    return {
+        translated(L"The registry {} is damaged: {}. It was left as it is, and nothing will be stored. {}",
+                   mFile, found.sentence, helpAgainstDamage(mFile)),
+        ERROR_ACCESS_DENIED};
 }
 
 // A disk that does not answer may do so the next time.
@@ -44,7 +45,7 @@ std::wstring Registry::whatHelps(int code)
     if (!isUnreadable(code))
         return whatHelpsAtStart(code);
     mUnreadable = true;
-    return whatHelpsAtStart(code) + L" If that does not help: " + helpAgainstDamage(mFile);
+    return translated(L"{} If that does not help: {}", whatHelpsAtStart(code), helpAgainstDamage(mFile));
 }
 
 // A session that ended in good order has made its copy; one that did not has left the file newer than that.
@@ -65,16 +66,15 @@ Result<> Registry::keepCopy()
     const auto made = makeSoundCopy(mDatabase, mFile);
     mHasStored = !made;
     return made ? made
-                : Failure{L"The copy of the registry " + toWide(mFile.string()) + L" could not be made: " +
-                          made.sentence() + L"."};
+                : Failure{translated(L"The copy of the registry {} could not be made: {}.", mFile,
+                                     made.sentence())};
 }
 
 Result<> Registry::checkIsDamaged() const
 {
     if (mDamaged || mUnreadable)
         return {};
-    return Failure{L"The registry " + toWide(mFile.string()) +
-                   L" is not known to be damaged; it was left as it is."};
+    return Failure{translated(L"The registry {} is not known to be damaged; it was left as it is.", mFile)};
 }
 
 Result<std::wstring> Registry::restoreCopy()
@@ -85,7 +85,12 @@ Result<std::wstring> Registry::restoreCopy()
     const auto kept = replaceWith(putSoundCopyBack);
     if (!kept)
         return kept.failure();
-    return L"The registry " + toWide(mFile.string()) + L" was restored from the copy of " + time + *kept;
+    return kept->empty() ? translated(L"The registry {} was restored from the copy of {}. Start Tessel "
+                                      L"again: this session stores nothing more.",
+                                      mFile, time)
+                         : translated(L"The registry {} was restored from the copy of {}; what stood there "
+                                      L"is kept as {}. Start Tessel again: this session stores nothing more.",
+                                      mFile, time, *kept);
 }
 
 Result<std::wstring> Registry::beginEmpty()
@@ -93,30 +98,35 @@ Result<std::wstring> Registry::beginEmpty()
     if (const auto damaged = checkIsDamaged(); !damaged)
         return damaged.failure();
     if (const auto sound = checkSoundCopy(mFile))
-        return Failure{L"The registry " + toWide(mFile.string()) + L" was left as it is: " +
-                       helpAgainstDamage(mFile)};
+        return Failure{translated(L"The registry {} was left as it is: {}", mFile, helpAgainstDamage(mFile))};
     const auto kept = replaceWith(setAside);
     if (!kept)
         return kept.failure();
-    return L"The registry " + toWide(mFile.string()) + L" is empty now" + *kept;
+    return kept->empty()
+               ? translated(
+                     L"The registry {} is empty now. Start Tessel again: this session stores nothing more.",
+                     mFile)
+               : translated(L"The registry {} is empty now; what stood there is kept as {}. Start Tessel "
+                            L"again: this session stores nothing more.",
+                            mFile, *kept);
 }
 
-// Answers the end of the sentence about it. What applications have read is not what is there now.
-Result<std::wstring>
+// Answers where what stood there is kept, if anything did. What applications have read is not what is there
+// now.
+Result<std::filesystem::path>
 Registry::replaceWith(Result<std::filesystem::path> (*replace)(const std::filesystem::path&))
 {
     forgetAll();
     close();
-    const auto kept = replace(mFile);
+    auto kept = replace(mFile);
     mCanStore = {};
     mNotice.reset();
     open();
-    if (!kept)
-        return kept.failure();
-    mCanStore = Failure{L"Nothing is stored in the registry " + toWide(mFile.string()) +
-                            L" before Tessel is started again, since another one was put in its place.",
-                        ERROR_ACCESS_DENIED};
-    return (kept->empty() ? L"" : L"; what stood there is kept as " + toWide(kept->string())) +
-           std::wstring(L". Start Tessel again: this session stores nothing more.");
+    if (kept)
+        mCanStore = Failure{translated(L"Nothing is stored in the registry {} before Tessel is started "
+                                       L"again, since another one was put in its place.",
+                                       mFile),
+                            ERROR_ACCESS_DENIED};
+    return kept;
 }
 } // namespace tessel

@@ -8,6 +8,7 @@
 #include "host/registry/KeyPath.h"
 #include "host/text/Hexadecimal.h"
 #include "host/text/Quotes.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -25,7 +26,8 @@ constexpr std::size_t kUnitBytes = 2;
 constexpr int kDigitBits = 4;
 constexpr std::size_t kDigitsOfByte = 2;
 constexpr std::size_t kBytesInLine = 24;
-constexpr wchar_t kNoCharacter[] = L"a character of the number 0 stands, which no text has";
+constexpr auto kNoCharacter =
+    Sentence<1>(L"in line {} a character of the number 0 stands, which no text has");
 
 std::u16string unitsOf(std::string_view bytes, bool lowFirst)
 {
@@ -55,7 +57,7 @@ Result<std::wstring> decodedText(std::string_view bytes)
     if (!lowFirst && !bytes.starts_with(kHighFirstMark))
         return toWide(bytes.starts_with(kUtf8Mark) ? bytes.substr(kUtf8Mark.size()) : bytes);
     if (bytes.size() % kUnitBytes != 0)
-        return Failure{L"it ends in the middle of a character"};
+        return Failure{translated(L"it ends in the middle of a character")};
     return toWide(unitsOf(bytes.substr(kLowFirstMark.size()), lowFirst));
 }
 
@@ -82,7 +84,7 @@ public:
             return failureHere(kNoCharacter);
         }
         if (takeRestOfLine() != kFirstLine)
-            return failureHere(L"\"" + std::wstring(kFirstLine) + L"\" is missing", 1);
+            return Failure{translated(L"in line {} \"{}\" is missing", 1, kFirstLine)};
         while (skipToNext())
             if (auto done = mText[mAt] == L'[' ? readKey() : readValue(); !done)
                 return done.failure();
@@ -90,11 +92,7 @@ public:
     }
 
 private:
-    Failure failureHere(const std::wstring& what, std::size_t line) const
-    {
-        return {L"in line " + std::to_wstring(line) + L" " + what};
-    }
-    Failure failureHere(const std::wstring& what) const { return failureHere(what, line()); }
+    Failure failureHere(Sentence<1> what) const { return {translated(what, line())}; }
 
     // Counted from where it was asked last.
     std::size_t line() const
@@ -148,14 +146,14 @@ private:
         const std::size_t here = line();
         std::wstring_view path = takeRestOfLine();
         if (path.size() < 2 || path.back() != L']')
-            return failureHere(L"the \"]\" after the key is missing", here);
+            return Failure{translated(L"in line {} the \"]\" after the key is missing", here)};
         path = path.substr(1, path.size() - 2);
         const bool goes = path.starts_with(L'-');
         auto key = belowRoot(path.substr(goes ? 1 : 0));
         if (!key)
-            return failureHere(L"a key stands that is not below HKEY_CURRENT_USER", here);
+            return Failure{translated(L"in line {} a key stands that is not below HKEY_CURRENT_USER", here)};
         if (goes && key->empty())
-            return failureHere(L"all of HKEY_CURRENT_USER would go", here);
+            return Failure{translated(L"in line {} all of HKEY_CURRENT_USER would go", here)};
         using Kind = RegistryChange::Kind;
         mChanges.push_back({goes ? Kind::kRemoveKey : Kind::kMakeKey, *key, L"", L"", here});
         mKey = goes ? std::nullopt : std::move(key);
@@ -173,24 +171,24 @@ private:
     Result<> readValue()
     {
         if (!mKey)
-            return failureHere(L"a value stands without a key before it");
+            return failureHere(Sentence<1>(L"in line {} a value stands without a key before it"));
         RegistryChange change{RegistryChange::Kind::kSetValue, *mKey, L"", L"", line()};
         if (!take(L"@"))
         {
-            auto name = readQuoted(L"a name");
+            auto name = readQuoted(Sentence<1>(L"in line {} a name begins that never ends"));
             if (!name)
                 return name.failure();
             change.name = *std::move(name);
         }
         skipBlanks();
         if (!take(L"="))
-            return failureHere(L"the \"=\" after a name is missing");
+            return failureHere(Sentence<1>(L"in line {} the \"=\" after a name is missing"));
         skipBlanks();
         if (auto done = readData(change); !done)
             return done;
         skipBlanks();
         if (!atEnd() && !isLineBreak(mText[mAt]) && mText[mAt] != L';')
-            return failureHere(L"something stands after a value");
+            return failureHere(Sentence<1>(L"in line {} something stands after a value"));
         mChanges.push_back(std::move(change));
         return {};
     }
@@ -203,19 +201,21 @@ private:
             return {};
         }
         if (!startsWith(L"\"") && !startsWith(kTextByUnits))
-            return failureHere(L"a value stands that is no text, and the registry holds texts alone");
-        auto data = take(kTextByUnits) ? readUnits() : readQuoted(L"a text");
+            return failureHere(Sentence<1>(
+                L"in line {} a value stands that is no text, and the registry holds texts alone"));
+        auto data = take(kTextByUnits) ? readUnits()
+                                       : readQuoted(Sentence<1>(L"in line {} a text begins that never ends"));
         if (!data)
             return data.failure();
         change.data = *std::move(data);
         return {};
     }
 
-    Result<std::wstring> readQuoted(const std::wstring& what)
+    Result<std::wstring> readQuoted(Sentence<1> neverEnds)
     {
         const std::size_t here = line();
         if (!take(L"\""))
-            return failureHere(L"neither a key nor a name in quotes begins", here);
+            return Failure{translated(L"in line {} neither a key nor a name in quotes begins", here)};
         std::wstring text;
         while (!atEnd())
         {
@@ -223,10 +223,11 @@ private:
             if (character == L'"')
                 return text;
             if (character == L'\\' && (atEnd() || (mText[mAt] != L'\\' && mText[mAt] != L'"')))
-                return failureHere(L"a \"\\\" stands alone, and is to be written twice");
+                return failureHere(
+                    Sentence<1>(L"in line {} a \"\\\" stands alone, and is to be written twice"));
             text += character == L'\\' ? mText[mAt++] : character;
         }
-        return failureHere(what + L" begins that never ends", here);
+        return Failure{translated(neverEnds, here)};
     }
 
     Result<std::wstring> readUnits()
@@ -244,7 +245,7 @@ private:
             goOnToNextLine();
         } while (take(L","));
         if (bytes.size() % kUnitBytes != 0)
-            return failureHere(L"a text ends in the middle of a character");
+            return failureHere(Sentence<1>(L"in line {} a text ends in the middle of a character"));
         std::u16string units = unitsOf(bytes, true);
         if (units.ends_with(u'\0'))
             units.pop_back();
@@ -325,7 +326,8 @@ Result<std::string> writeRegistryText(const std::vector<RegistryChange>& changes
     for (const RegistryChange& change : changes)
     {
         if (std::ranges::any_of(change.key, isLineBreak))
-            return Failure{L"the name of a key in it has a line break, for which such files have no way"};
+            return Failure{
+                translated(L"the name of a key in it has a line break, for which such files have no way")};
         text += lineOf(change);
     }
     return form == RegistryTextForm::kUtf8 ? toUtf8(text)

@@ -10,6 +10,7 @@
 
 #include "host/registry/Statement.h"
 #include "host/registry/StoreFailure.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -230,13 +231,14 @@ Result<> checkTables(sqlite3* database, int version)
         if (isDefined(definitions, name, textOf(all, 2)))
             ++known;
         else if (!isOfTheStore(textOf(all, 0), name))
-            return Failure{L"its " + all.text(0) + L" \"" + all.text(1) +
-                               L"\" is not as Tessel makes it, and could do anything",
+            return Failure{translated(L"its {} \"{}\" is not as Tessel makes it, and could do anything",
+                                      all.text(0), all.text(1)),
                            SQLITE_CORRUPT};
     }
     if (status != SQLITE_DONE)
         return storeFailure(database, status);
-    return known == definitions.size() ? Result<>() : Failure{L"tables of it are missing", SQLITE_CORRUPT};
+    return known == definitions.size() ? Result<>()
+                                       : Failure{translated(L"tables of it are missing"), SQLITE_CORRUPT};
 }
 
 Result<> makeTables(sqlite3* database)

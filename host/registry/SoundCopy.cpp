@@ -16,7 +16,7 @@
 #include "host/registry/Soundness.h"
 #include "host/registry/StoreFailure.h"
 #include "host/text/DayAndTime.h"
-#include "host/text/Unicode.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -45,7 +45,7 @@ Result<> useCopy(sqlite3* database)
     if (!version)
         return version.failure();
     if (*version != kSchemaVersion)
-        return Failure{L"it is of another version"};
+        return Failure{translated(L"it is of another version")};
     auto sound = checkTables(database, kSchemaVersion);
     return sound ? checkSoundness(database, kSchemaVersion) : sound;
 }
@@ -57,7 +57,7 @@ Result<Database> openCopy(const std::filesystem::path& copy)
 {
     struct stat status = {};
     if (stat(copy.c_str(), &status) != 0)
-        return errno == ENOENT ? Failure{L"there is none", kNoCopy} : fileFailure(errno);
+        return errno == ENOENT ? Failure{translated(L"there is none"), kNoCopy} : fileFailure(errno);
     if (const auto ordinary = checkOrdinary(status); !ordinary)
         return ordinary.failure();
     sqlite3* opened = nullptr;
@@ -129,7 +129,7 @@ Result<std::filesystem::path> moveAside(const std::filesystem::path& file)
 
 Failure notRestored(const std::filesystem::path& file, const std::wstring& reason)
 {
-    return {L"The registry " + toWide(file.string()) + L" was not restored: " + reason + L"."};
+    return {translated(L"The registry {} was not restored: {}.", file, reason)};
 }
 } // namespace
 
@@ -143,19 +143,20 @@ std::wstring timeOfCopy(const std::filesystem::path& file)
     struct stat status = {};
     if (stat(soundCopyOf(file).c_str(), &status) != 0)
         return {};
-    return toWide(dayAndTime(status.st_mtime));
+    return dayAndTimeInWords(status.st_mtime);
 }
 
 std::wstring helpAgainstDamage(const std::filesystem::path& file)
 {
     const auto sound = checkSoundCopy(file);
     if (sound)
-        return L"REGISTRY RESTORE puts back the copy of " + timeOfCopy(file) + L".";
+        return translated(L"REGISTRY RESTORE puts back the copy of {}.", timeOfCopy(file));
     if (sound.code() == kNoCopy)
-        return L"There is no copy of an earlier state. REGISTRY RESET sets it aside and begins with an empty "
-               L"one.";
-    return L"Its copy " + toWide(soundCopyOf(file).string()) + L" is of no use: " + sound.sentence() +
-           L". REGISTRY RESET sets both aside and begins with an empty one.";
+        return translated(L"There is no copy of an earlier state. REGISTRY RESET sets it aside and begins "
+                          L"with an empty one.");
+    return translated(
+        L"Its copy {} is of no use: {}. REGISTRY RESET sets both aside and begins with an empty one.",
+        soundCopyOf(file), sound.sentence());
 }
 
 Result<> checkSoundCopy(const std::filesystem::path& file)
@@ -178,11 +179,10 @@ Result<std::filesystem::path> putSoundCopyBack(const std::filesystem::path& file
 {
     const auto copy = soundCopyOf(file);
     if (timeOfCopy(file).empty())
-        return notRestored(file, L"there is no copy of an earlier state");
+        return notRestored(file, translated(L"there is no copy of an earlier state"));
     const auto bytes = readCopy(copy);
     if (!bytes)
-        return notRestored(file,
-                           L"its copy " + toWide(copy.string()) + L" cannot be used: " + bytes.sentence());
+        return notRestored(file, translated(L"its copy {} cannot be used: {}", copy, bytes.sentence()));
     const auto kept = nameToKeep(file);
     const auto stood = keep(file, kept);
     const Result<> done = stood ? replaceFile(file, *bytes) : stood.failure();
@@ -196,9 +196,9 @@ Result<std::filesystem::path> setAside(const std::filesystem::path& file)
     auto moved = moveAside(soundCopyOf(file));
     if (moved)
         moved = moveAside(file);
-    return moved ? moved
-                 : Failure{L"The registry " + toWide(file.string()) + L" could not be set aside: " +
-                           moved.sentence() + L"."};
+    return moved
+               ? moved
+               : Failure{translated(L"The registry {} could not be set aside: {}.", file, moved.sentence())};
 }
 
 Result<> makeFileOnce(const std::filesystem::path& file, std::string_view bytes)

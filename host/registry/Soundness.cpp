@@ -3,6 +3,7 @@
 #include "host/registry/Schema.h"
 #include "host/registry/Statement.h"
 #include "host/registry/StoreFailure.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -48,8 +49,9 @@ std::wstring pathOf(sqlite3* database, std::int64_t key)
     return path;
 }
 
-// `sql` lists the rows whose checksum is wrong: a key, and a name in it.
-Result<> checkRows(sqlite3* database, const wchar_t* kind, const char* sql)
+// `sql` lists the rows whose checksum is wrong: a key, and a name in it. The sentence takes
+// the name, and the path of the key.
+Result<> checkRows(sqlite3* database, Sentence<2> isWrong, const char* sql)
 {
     Statement wrong;
     int status = wrong.prepare(database, sql);
@@ -59,9 +61,7 @@ Result<> checkRows(sqlite3* database, const wchar_t* kind, const char* sql)
         return {};
     if (status != SQLITE_ROW)
         return storeFailure(database, status);
-    return Failure{std::wstring(kind) + L" \"" + wrong.text(1) + L"\" in \"" +
-                       pathOf(database, wrong.number(0)) + L"\" is not what was stored there",
-                   SQLITE_CORRUPT};
+    return Failure{translated(isWrong, wrong.text(1), pathOf(database, wrong.number(0))), SQLITE_CORRUPT};
 }
 } // namespace
 
@@ -70,11 +70,11 @@ Result<> checkSoundness(sqlite3* database, int version)
     auto sound = checkPages(database);
     if (!sound || version != kSchemaVersion)
         return sound;
-    sound = checkRows(database, L"the key",
+    sound = checkRows(database, Sentence<2>(L"the key \"{}\" in \"{}\" is not what was stored there"),
                       "SELECT parent, name FROM key WHERE sum IS NOT row_sum(parent, name, fold) LIMIT 1");
     if (!sound)
         return sound;
-    return checkRows(database, L"the value",
+    return checkRows(database, Sentence<2>(L"the value \"{}\" in \"{}\" is not what was stored there"),
                      "SELECT key, name FROM value WHERE sum IS NOT row_sum(key, name, fold, data) LIMIT 1");
 }
 

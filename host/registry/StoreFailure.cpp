@@ -3,6 +3,7 @@
 #include <cerrno>
 
 #include "host/platform/SystemFailure.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -79,7 +80,7 @@ Failure systemsFailure(sqlite3* database, int status)
         return {wordsOf(database, status), status};
     // Where a file can be made neither for writing nor for reading, what it says of the second is no reason.
     if (error == ENOENT)
-        return {L"a file beside it cannot be made", status};
+        return {translated(L"a file beside it cannot be made"), status};
     const int code = codeOf(error);
     return {systemFailure(error).sentence, code == SQLITE_CANTOPEN ? status : code};
 }
@@ -89,22 +90,22 @@ std::wstring whatHelpsFirst(int code)
     switch (kindOf(code))
     {
     case SQLITE_BUSY:
-        return L"Close that program, or let it finish";
+        return translated(L"Close that program, or let it finish");
     case SQLITE_FULL:
-        return L"Make room on the disk";
+        return translated(L"Make room on the disk");
     case SQLITE_TOOBIG:
-        return L"Lift the limit on the size of files";
+        return translated(L"Lift the limit on the size of files");
     case SQLITE_PERM:
     case SQLITE_READONLY:
-        return L"Give yourself the right to read and write the file and its folder";
+        return translated(L"Give yourself the right to read and write the file and its folder");
     case SQLITE_CANTOPEN:
-        return L"Make sure that files can be made and opened there";
+        return translated(L"Make sure that files can be made and opened there");
     case kOfAnotherProgram:
-        return L"Move that file elsewhere, or name another folder by --profile-dir";
+        return translated(L"Move that file elsewhere, or name another folder by --profile-dir");
     case kOfANewerTessel:
-        return L"Use that Tessel, or name another folder by --profile-dir";
+        return translated(L"Use that Tessel, or name another folder by --profile-dir");
     case kInTheWay:
-        return L"Remove that";
+        return translated(L"Remove that");
     default:
         return {};
     }
@@ -117,15 +118,15 @@ Failure storeFailure(sqlite3* database, int status)
     switch (kindOf(status))
     {
     case SQLITE_BUSY:
-        return {L"another program holds it", status};
+        return {translated(L"another program holds it"), status};
     case SQLITE_FULL:
         return {systemFailure(ENOSPC).sentence, status};
     case SQLITE_READONLY:
-        return {extended == SQLITE_READONLY_DIRECTORY ? L"its folder may not be written"
-                                                      : L"it may not be written",
+        return {extended == SQLITE_READONLY_DIRECTORY ? translated(L"its folder may not be written")
+                                                      : translated(L"it may not be written"),
                 status};
     case SQLITE_PROTOCOL:
-        return {L"the file system refuses its locks", status};
+        return {translated(L"the file system refuses its locks"), status};
     case SQLITE_IOERR:
     case SQLITE_CANTOPEN:
         return systemsFailure(database, status);
@@ -172,12 +173,13 @@ bool isRefusal(int code)
 std::wstring whatHelpsAtStart(int code)
 {
     const std::wstring first = whatHelpsFirst(code);
-    return first.empty() ? L"Start Tessel again." : first + L", and start Tessel again.";
+    return first.empty() ? translated(L"Start Tessel again.")
+                         : translated(L"{}, and start Tessel again.", first);
 }
 
 std::wstring whatHelpsInSession(int code)
 {
     const std::wstring first = whatHelpsFirst(code);
-    return first.empty() ? first : first + L", and try again.";
+    return first.empty() ? first : translated(L"{}, and try again.", first);
 }
 } // namespace tessel

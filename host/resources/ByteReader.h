@@ -5,19 +5,21 @@
 #include <cstdint>
 #include <span>
 
+#include "host/text/Translation.h"
+
 namespace tessel
 {
-// Thrown where the bytes contradict themselves. Whoever reads a file catches it; `why` is a literal.
+// Thrown where the bytes contradict themselves. Whoever reads a file catches it.
 struct DamagedFile
 {
-    const wchar_t* why;
+    Sentence<> why; // the end of one
 };
 
 class ByteReader
 {
 public:
     // `whyOutside`: what a position outside of the bytes means for the file.
-    ByteReader(std::span<const std::uint8_t> bytes, const wchar_t* whyOutside)
+    ByteReader(std::span<const std::uint8_t> bytes, Sentence<> whyOutside)
         : mBytes(bytes), mWhyOutside(whyOutside)
     {
     }
@@ -42,6 +44,6 @@ public:
 
 private:
     std::span<const std::uint8_t> mBytes;
-    const wchar_t* mWhyOutside;
+    Sentence<> mWhyOutside;
 };
 } // namespace tessel

@@ -6,6 +6,7 @@
 #include <utility>
 
 #include "host/resources/ByteReader.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -33,12 +34,12 @@ constexpr std::uint32_t kStringTables = 6;
 constexpr unsigned kTextsPerBlock = 16;
 constexpr std::size_t kUnitSize = 2; // a UTF-16 code unit
 
-constexpr const wchar_t* kCutShort = L"the file is cut short";
-constexpr const wchar_t* kNoLibrary = L"it is not a Windows library";
-constexpr const wchar_t* kNoResources = L"it holds no resources";
-constexpr const wchar_t* kBadSections = L"its table of sections is damaged";
-constexpr const wchar_t* kBadTree = L"its resources are damaged";
-constexpr const wchar_t* kBadTexts = L"its string tables are damaged";
+constexpr auto kCutShort = Sentence(L"the file is cut short");
+constexpr auto kNoLibrary = Sentence(L"it is not a Windows library");
+constexpr auto kNoResources = Sentence(L"it holds no resources");
+constexpr auto kBadSections = Sentence(L"its table of sections is damaged");
+constexpr auto kBadTree = Sentence(L"its resources are damaged");
+constexpr auto kBadTexts = Sentence(L"its string tables are damaged");
 
 struct Extent
 {
@@ -286,7 +287,7 @@ try
 }
 catch (const DamagedFile& damage)
 {
-    return Failure{damage.why};
+    return Failure{translated(damage.why)};
 }
 
 std::wstring PeResources::string(unsigned id, LanguageNumber language) const

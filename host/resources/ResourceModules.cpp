@@ -6,6 +6,7 @@
 
 #include "host/commands/CallingApplication.h"
 #include "host/platform/Bundle.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -38,17 +39,17 @@ std::wstring resourcesOf(const std::wstring& application)
     return application;
 }
 
-std::wstring joined(const std::vector<std::wstring>& places)
+// Of two places at most.
+std::wstring noneOf(const std::vector<std::wstring>& places)
 {
-    std::wstring result;
-    for (const auto& place : places)
-        result += (result.empty() ? L"\"" : L" and no \"") + place + L"\"";
-    return result;
+    return places.size() > 1
+               ? translated(L"there is no \"{}\" and no \"{}\"", places.front(), places.back())
+               : translated(L"there is no \"{}\"", places.empty() ? std::wstring() : places.front());
 }
 
 Failure notOpened(const std::wstring& name, const std::wstring& reason)
 {
-    return {L"The resource module \"" + name + L"\" cannot be opened: " + reason + L"."};
+    return {translated(L"The resource module \"{}\" cannot be opened: {}.", name, reason)};
 }
 } // namespace
 
@@ -79,7 +80,7 @@ Result<HMODULE> ResourceModules::open(const wchar_t* name)
 {
     const std::wstring plainName = withOneKindOfSeparator(name);
     if (plainName.empty())
-        return notOpened(plainName, L"it has no name");
+        return notOpened(plainName, translated(L"it has no name"));
     const auto places = placesOf(plainName);
     for (const std::wstring& place : places)
     {
@@ -89,7 +90,7 @@ Result<HMODULE> ResourceModules::open(const wchar_t* name)
         const auto module = openFile(file);
         return module ? module : notOpened(place, module.sentence());
     }
-    return notOpened(plainName, L"there is no " + joined(places));
+    return notOpened(plainName, noneOf(places));
 }
 
 // What this says of a failure is the end of a sentence.
@@ -103,12 +104,12 @@ Result<HMODULE> ResourceModules::openFile(const RegularFile& file)
         return known->first;
     }
     if (file.size() > kLargestModule)
-        return Failure{L"the file is too large for a resource module"};
+        return Failure{translated(L"the file is too large for a resource module")};
     if (!file.opened())
         return file.opened().failure();
     std::vector<std::uint8_t> bytes(file.size());
     if (!file.read(0, bytes.data(), bytes.size()))
-        return Failure{L"the file cannot be read"};
+        return Failure{translated(L"the file cannot be read")};
     auto resources = PeResources::read(std::move(bytes));
     if (!resources)
         return resources.failure();

@@ -5,14 +5,23 @@
 #include <ctime>
 #include <string>
 
+#include "host/text/Translation.h"
+#include "host/text/Unicode.h"
+
 namespace tessel
 {
 // "2026-11-22 09:41", by the clock of the place.
-inline std::string dayAndTime(std::time_t seconds)
+inline std::string dayAndTime(std::time_t seconds, const std::string& form = "%Y-%m-%d %H:%M")
 {
     std::tm local = {};
-    std::array<char, 32> text = {};
+    std::array<char, 64> text = {};
     localtime_r(&seconds, &local);
-    return {text.data(), std::strftime(text.data(), text.size(), "%Y-%m-%d %H:%M", &local)};
+    return {text.data(), std::strftime(text.data(), text.size(), form.c_str(), &local)};
+}
+
+// As the person's language has it.
+inline std::wstring dayAndTimeInWords(std::time_t seconds)
+{
+    return toWide(dayAndTime(seconds, toUtf8(translated(L"%Y-%m-%d %H:%M"))));
 }
 } // namespace tessel

@@ -34,13 +34,16 @@ struct Place
     std::size_t length = 0; // 0: no place
     std::size_t number = 0; // 0: the next thing
 
-    static constexpr Place at(std::wstring_view text)
+    // Safe in a signal handler.
+    template <class Character>
+    static constexpr Place at(std::basic_string_view<Character> text) noexcept
     {
-        if (text.starts_with(L"{}"))
+        if (text.size() < 2 || text[0] != '{')
+            return {};
+        if (text[1] == '}')
             return {2, 0};
-        if (text.size() > 2 && text[0] == L'{' && text[1] >= L'1' && text[1] <= L'9' && text[2] == L'}')
-            return {3, static_cast<std::size_t>(text[1] - L'0')};
-        return {};
+        const bool isNumbered = text.size() > 2 && text[1] >= '1' && text[1] <= '9' && text[2] == '}';
+        return isNumbered ? Place{3, static_cast<std::size_t>(text[1] - '0')} : Place();
     }
 };
 

@@ -49,6 +49,17 @@ TEST_F(AskingAtTheTerminal, WaitsForEachAnswerAndTakesDefaults)
     EXPECT_EQ(terminal.quit(), 0);
 }
 
+TEST_F(Asking, UnderstandsThePersonsLanguageAndThatOfScripts)
+{
+    session.set("LC_ALL", "de_DE");
+    for (const std::string yes : {"j", "ja", "yes"})
+    {
+        const auto result = session.runScript(load + "\nASKS\nmoon\n\n" + yes + "\n" + file + "\n");
+        EXPECT_THAT(result.output, HasSubstr("Keep it? [Ja/Nein] <Nein>: "));
+        EXPECT_THAT(result.output, HasSubstr("size 2.5, kept, file " + file)) << yes;
+    }
+}
+
 TEST_F(AskingAtTheTerminal, AsksAgainForWhatDoesNotFit)
 {
     terminal.type("moon\r");

@@ -22,6 +22,13 @@ TEST_F(PersonsLanguage, IsSpokenWithoutALocaleOfItOnTheMachine)
     EXPECT_THAT(saysAbout("SETVAR NONE 1"), HasSubstr("Eine Variable „NONE“ gibt es nicht."));
 }
 
+TEST_F(PersonsLanguage, IsThatOfTheLispToo)
+{
+    mSession.set("LC_ALL", "de_DE");
+    EXPECT_THAT(saysAbout("(/ 1 0)"), HasSubstr("Division durch null."));
+    EXPECT_THAT(saysAbout("(load \"none\")"), HasSubstr("„none“ kann nicht geladen werden: "));
+}
+
 TEST_F(PersonsLanguage, IsEnglishWhereTheHostDoesNotSpeakIt)
 {
     mSession.set("LC_ALL", "tlh_AQ.UTF-8");
