@@ -6,14 +6,14 @@ _tessel() {
       mapfile -t COMPREPLY < <(compgen -d -- "$word")
       return
       ;;
-    --script)
+    --script | --log)
       mapfile -t COMPREPLY < <(compgen -f -- "$word")
       return
       ;;
     -c | --command) return ;;
   esac
   if [[ $word == -* ]]; then
-    mapfile -t COMPREPLY < <(compgen -W '--profile-dir --layout-dir --script -c --command --modrig --safe --help --version' -- "$word")
+    mapfile -t COMPREPLY < <(compgen -W '--profile-dir --layout-dir --script -c --command --modrig --safe -q --quiet -v --verbose --log -h --help --version' -- "$word")
   else
     mapfile -t COMPREPLY < <(
       compgen -f -X '!*.@(zmb|omp|lsp|qbc|rpk|mcp)' -- "$word"

@@ -1,15 +1,14 @@
 // LOAD, UNLOAD, APPS: applications without the dialog.
-#include <chrono>
-#include <iomanip>
 #include <limits>
-#include <sstream>
 
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
 #include "host/applications/ApplicationFiles.h"
 #include "host/applications/KeptOutWords.h"
+#include "host/text/Duration.h"
 #include "host/text/Quotes.h"
+#include "host/text/Table.h"
 #include "host/text/TerminalText.h"
 
 namespace tessel
@@ -28,7 +27,7 @@ bool isLispFile(const std::wstring& path)
 Result<> loadLisp(Parts& parts, const std::wstring& path)
 {
     const auto value = parts.lisp->evaluate(L"(load " + inQuotes(path) + L")");
-    return value ? succeed(parts, path + L" is loaded.") : value.failure();
+    return value ? confirm(parts, path + L" is loaded.") : value.failure();
 }
 
 // "ftp://host/file". A file may be called so all the same.
@@ -53,67 +52,50 @@ Result<std::wstring> localFile(Parts& parts, const std::wstring& typed)
 
 Result<> load(Parts& parts, const CommandStack::Arguments& arguments)
 {
-    if (arguments.size() != 1)
-        return wrongUsage(parts, L"LOAD");
-    const auto file = localFile(parts, arguments.front());
+    const auto typed = onlyFile(parts, L"LOAD", arguments);
+    const auto file = typed ? localFile(parts, *typed) : typed;
     if (!file)
         return file.failure();
     const std::wstring& path = *file;
     if (isLispFile(path))
         return loadLisp(parts, path);
     auto loaded = parts.linker->load(path, kResolveNow);
-    return loaded ? succeed(parts, path + L" is loaded.") : loaded;
+    return loaded ? confirm(parts, path + L" is loaded.") : loaded;
 }
 
 Result<> unload(Parts& parts, const CommandStack::Arguments& arguments)
 {
-    if (arguments.size() != 1)
-        return wrongUsage(parts, L"UNLOAD");
-    const std::wstring path = fullPath(parts, arguments.front());
+    const auto typed = onlyFile(parts, L"UNLOAD", arguments);
+    if (!typed)
+        return typed.failure();
+    const std::wstring path = fullPath(parts, *typed);
     if (isLispFile(path))
         return Failure{path + L" cannot be unloaded: Lisp stays until the session ends."};
     // The name alone is enough for what is loaded.
-    const std::wstring loaded = parts.linker->pathOfModule(arguments.front());
+    const std::wstring loaded = parts.linker->pathOfModule(*typed);
     const std::wstring module = loaded.empty() ? path : loaded;
     const auto unloaded = parts.linker->unload(module);
     if (!unloaded)
         return unloaded.failure();
     if (!unloaded->empty())
         sayLine(parts, *unloaded);
-    return succeed(parts, module + L" is unloaded.");
+    return confirm(parts, module + L" is unloaded.");
 }
 
-void sayApplication(Parts& parts, const std::wstring& path, const std::wstring& state)
+void addApplication(Table& table, const std::wstring& path, const std::wstring& state)
 {
     const auto file = toPath(path);
-    const auto column = [](const std::filesystem::path& text, std::size_t width)
+    const auto cell = [](const std::filesystem::path& text)
     {
-        return padded(forTerminal(toText(text)), width); // an escape is longer than what it stands for
+        return forTerminal(toText(text)); // an escape is wider than what it stands for
     };
-    sayLine(parts, L"  " + column(file.filename(), kNameColumn) + L" " +
-                       column(file.parent_path(), kFolderColumn) + L" " + state);
-}
-
-// "0.4 ms", "37 ms", "2.1 s".
-std::wstring duration(std::chrono::microseconds time)
-{
-    using Milliseconds = std::chrono::duration<double, std::milli>;
-    constexpr Milliseconds kWithoutTenths{10};
-    constexpr Milliseconds kSecond{1000};
-    const Milliseconds milliseconds = time;
-    std::wostringstream text;
-    text << std::fixed << std::setprecision(milliseconds < kWithoutTenths || milliseconds >= kSecond ? 1 : 0);
-    if (milliseconds < kSecond)
-        text << milliseconds.count() << L" ms";
-    else
-        text << milliseconds / kSecond << L" s";
-    return text.str();
+    table.add({cell(file.filename()), cell(file.parent_path()), forTerminal(state)});
 }
 
 std::wstring withTime(const Parts& parts, const std::wstring& path, const std::wstring& state)
 {
     const LoadOutcome* outcome = parts.loadOutcomes.of(path);
-    return outcome && outcome->loaded ? state + L", loaded in " + duration(outcome->took) : state;
+    return outcome && outcome->loaded ? state + L", loaded in " + durationInWords(outcome->took) : state;
 }
 
 // What kept it out at the start may do so no longer.
@@ -125,54 +107,53 @@ std::wstring whyNotLoaded(const Parts& parts, const LoadOutcome& outcome)
     return outcome.loaded.sentence();
 }
 
-void sayNotLoaded(Parts& parts)
+void addNotLoaded(const Parts& parts, Table& table)
 {
     const auto failed = parts.loadOutcomes.failed();
     if (!failed.empty())
-        sayLine(parts, L"Not loaded in this session:");
+        table.addHeading(L"Not loaded in this session:");
     for (const LoadOutcome& outcome : failed)
-        sayApplication(parts, outcome.path, whyNotLoaded(parts, outcome));
+        addApplication(table, outcome.path, whyNotLoaded(parts, outcome));
 }
 
 // What was asked for in vain for that very reason stands among those that were not loaded.
-void sayKeptOut(Parts& parts)
+void addKeptOut(const Parts& parts, Table& table)
 {
     for (const auto& application : parts.keptOut.all())
     {
         const std::wstring path = toWide(application.path);
         const LoadOutcome* outcome = parts.loadOutcomes.of(path);
         if (application.isOut() && !(outcome && Admission::isKeptOut(outcome->loaded.code())))
-            sayApplication(parts, path, reasonOf(application));
+            addApplication(table, path, reasonOf(application));
     }
 }
 
 Result<> listApplications(Parts& parts, const CommandStack::Arguments&)
 {
+    Table table({kNameColumn, kFolderColumn});
     const auto modules = parts.linker->loadedModules();
     for (const auto& module : modules)
-        sayApplication(parts, module.path,
+        addApplication(table, module.path,
                        withTime(parts, module.path, module.locked ? L"locked" : L"may be unloaded"));
     const int lispFiles = parts.document->loadedApplicationCount();
     for (int index = 0; index < lispFiles; ++index)
     {
         const std::wstring path = parts.document->loadedApplicationName(index);
-        sayApplication(parts, path, withTime(parts, path, L"Lisp"));
+        addApplication(table, path, withTime(parts, path, L"Lisp"));
     }
     if (modules.empty() && lispFiles == 0)
-        sayLine(parts, L"No application is loaded.");
-    sayKeptOut(parts);
-    sayNotLoaded(parts);
+        table.addHeading(L"No application is loaded.");
+    addKeptOut(parts, table);
+    addNotLoaded(parts, table);
+    parts.commandLine->show(table);
     return {};
 }
 } // namespace
 
 void addApplicationCommands(Parts& parts)
 {
-    addBuiltIn(parts,
-               {kApplicationsGroup, L"LOAD", L"file or address", L"Loads a compiled module or a Lisp file"},
-               load);
-    addBuiltIn(parts, {kApplicationsGroup, L"UNLOAD", L"file", L"Unloads a compiled module"}, unload);
-    addBuiltIn(parts, {kApplicationsGroup, L"APPS", L"", L"Lists what is loaded, and what could not be"},
-               listApplications);
+    addBuiltIn(parts, L"LOAD", load);
+    addBuiltIn(parts, L"UNLOAD", unload);
+    addBuiltIn(parts, L"APPS", listApplications);
 }
 } // namespace tessel

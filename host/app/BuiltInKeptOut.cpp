@@ -112,28 +112,21 @@ Result<std::wstring> pathToLetIn(const Parts& parts, const std::wstring& typed)
     return onlyOneOf(candidates, typed);
 }
 
-bool isOneFile(const CommandStack::Arguments& arguments)
-{
-    return arguments.size() == 1 && !arguments.front().empty();
-}
-
 Result<> disable(Parts& parts, const CommandStack::Arguments& arguments)
 {
-    if (!isOneFile(arguments))
-        return wrongUsage(parts, L"DISABLE");
-    const auto path = pathToKeepOut(parts, arguments.front());
+    const auto typed = onlyFile(parts, L"DISABLE", arguments);
+    const auto path = typed ? pathToKeepOut(parts, *typed) : typed;
     if (!path)
         return path.failure();
     if (auto kept = parts.keptOut.keepOut(toUtf8(*path)); !kept)
         return kept;
-    return succeed(parts, *path + L" is kept out at starts from now on; ENABLE lets it in again.");
+    return confirm(parts, *path + L" is kept out at starts from now on; ENABLE lets it in again.");
 }
 
 Result<> enable(Parts& parts, const CommandStack::Arguments& arguments)
 {
-    if (!isOneFile(arguments))
-        return wrongUsage(parts, L"ENABLE");
-    const auto path = pathToLetIn(parts, arguments.front());
+    const auto typed = onlyFile(parts, L"ENABLE", arguments);
+    const auto path = typed ? pathToLetIn(parts, *typed) : typed;
     if (!path)
         return path.failure();
     const std::wstring bisect = parts.bisecting.keepsOut(toUtf8(*path))
@@ -143,7 +136,7 @@ Result<> enable(Parts& parts, const CommandStack::Arguments& arguments)
         return Failure{L"\"" + *path + L"\" is not let in by ENABLE: " + bisect};
     if (auto let = parts.keptOut.letIn(toUtf8(*path)); !let)
         return let;
-    return succeed(parts, *path + L" is not kept out at starts any more." +
+    return confirm(parts, *path + L" is not kept out at starts any more." +
                               (bisect.empty() ? L"" : L" But " + bisect));
 }
 
@@ -171,17 +164,8 @@ Result<> bisect(Parts& parts, const CommandStack::Arguments& arguments)
 
 void addKeptOutCommands(Parts& parts)
 {
-    addBuiltIn(parts,
-               {kApplicationsGroup, L"DISABLE", L"file",
-                L"Keeps an application out at starts; it stays in every list"},
-               disable);
-    addBuiltIn(parts,
-               {kApplicationsGroup, L"ENABLE", L"file",
-                L"Lets an application in again that was disabled or that ended Tessel"},
-               enable);
-    addBuiltIn(parts,
-               {kApplicationsGroup, L"BISECT", L"[START|GOOD|BAD|STOP]",
-                L"Finds the application that makes trouble, in a few starts"},
-               bisect);
+    addBuiltIn(parts, L"DISABLE", disable);
+    addBuiltIn(parts, L"ENABLE", enable);
+    addBuiltIn(parts, L"BISECT", bisect);
 }
 } // namespace tessel

@@ -59,11 +59,13 @@ Result<> list(Parts& parts, const std::wstring& path)
     const auto key = registry.find(path);
     if (key == Registry::kNoKey)
         return notFound(registry.own(), path, L"does not exist");
+    std::vector<std::wstring> lines;
     for (const auto& name : registry.subKeys(key))
-        sayLine(parts, L"[" + name + L"]");
+        lines.push_back(L"[" + name + L"]");
     for (const auto& value : registry.values(key))
-        sayLine(parts, (value.name.empty() ? L"(unnamed)" : value.name) + L" = " + value.data +
-                           (value.file.empty() ? L"" : L"    (from " + toText(value.file) + L")"));
+        lines.push_back((value.name.empty() ? L"(unnamed)" : value.name) + L" = " + value.data +
+                        (value.file.empty() ? L"" : L"    (from " + toText(value.file) + L")"));
+    parts.commandLine->show(lines);
     if (registry.own().readFailed())
         return storeFailureAt(registry.own(), path, L"cannot be read to its end");
     return {};
@@ -146,7 +148,7 @@ Result<> remove(Parts& parts, const std::wstring& path, const Arguments& argumen
 
 Result<> tell(Parts& parts, const Result<std::wstring>& done)
 {
-    return done ? succeed(parts, *done) : done.failure();
+    return done ? confirm(parts, *done) : done.failure();
 }
 
 bool isUtf8(const std::wstring& word)
@@ -158,9 +160,10 @@ Result<> exportTo(Parts& parts, const std::wstring& path, const Arguments& argum
 {
     const auto form = arguments.size() > 3 ? RegistryTextForm::kUtf8 : RegistryTextForm::kUtf16;
     std::error_code currentFolderIsGone;
-    return tell(parts, exportRegistry(
-                           *parts.registry, path,
-                           std::filesystem::absolute(toPath(at(arguments, 2)), currentFolderIsGone), form));
+    return tell(parts,
+                exportRegistry(*parts.registry, path,
+                               std::filesystem::absolute(typedPath(at(arguments, 2)), currentFolderIsGone),
+                               form));
 }
 
 // What is damaged gives way to the copy of what it held.
@@ -211,12 +214,7 @@ Result<> registryListing(Parts& parts, const Arguments& arguments)
 
 void addRegistryCommands(Parts& parts)
 {
-    addBuiltIn(
-        parts,
-        {L"Settings", kCommand,
-         L"LIST|GET|SET|DELETE key [name] [data] | EXPORT key file [UTF8] | IMPORT file | RESTORE | RESET",
-         L"Shows and changes what is stored, takes it to files and back, mends a damaged registry"},
-        registryCommand);
+    addBuiltIn(parts, kCommand, registryCommand);
     parts.commands->addListing(kCommand, std::bind_front(registryListing, std::ref(parts)));
 }
 } // namespace tessel

@@ -4,37 +4,74 @@
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
+#include "host/commands/CommandTexts.h"
+#include "host/text/Nearest.h"
+#include "host/text/Table.h"
 
 namespace tessel
 {
 namespace
 {
-constexpr wchar_t kSessionGroup[] = L"Session";
-constexpr std::size_t kUsageColumn = 49;
-
-void sayCommand(Parts& parts, const CommandStack::Description& command)
-{
-    const std::wstring usage = command.name + (command.usage.empty() ? L"" : L" ") + command.usage;
-    const bool isShort = usage.size() <= kUsageColumn;
-    sayLine(parts, L"  " + (isShort && !command.summary.empty()
-                                ? padded(usage, kUsageColumn) + L" " + command.summary
-                                : usage));
-    if (!isShort)
-        sayLine(parts, std::wstring(kUsageColumn + 3, L' ') + command.summary);
-}
+constexpr std::size_t kCommandColumn = 12;
 
 Result<> listCommands(Parts& parts)
 {
-    sayLine(parts, toWide(versionLine()));
+    Table table({kCommandColumn});
+    table.addHeading(toWide(versionLine()));
     std::wstring group;
     for (const auto& command : parts.commands->descriptions())
     {
         if (!equalIgnoringCase(command.group, group))
-            sayLine(parts, command.group);
+            table.addHeading(command.group);
         group = command.group;
-        sayCommand(parts, command);
+        table.add({command.name, command.summary});
     }
+    table.addHeading(L"HELP and a name, such as HELP LOAD, tells how a command is typed.");
+    parts.commandLine->show(table);
     return {};
+}
+
+void describeCommand(Parts& parts, const CommandStack::Description& command)
+{
+    Table table({});
+    if (!command.summary.empty())
+        table.addHeading(command.name + L": " + command.summary);
+    for (const auto& line : usageLines(command.name, command.usage))
+        table.addHeading(line);
+    if (!command.example.empty())
+        table.addHeading(L"Example: " + command.example);
+    parts.commandLine->show(table);
+}
+
+// Of an application that is not loaded yet there is what the host has of its own to say, or whose it is.
+void describeCommandToCome(Parts& parts, const std::wstring& name, const std::wstring& module)
+{
+    if (const CommandText* text = findCommandText(name))
+        describeCommand(parts, {text->group, text->name, text->usage, text->summary, text->example});
+    else
+        sayLine(parts, L"The application " + module + L" is loaded when " + name +
+                           L" is typed, and HELP tells more about it then.");
+}
+
+// False when no application is loaded by that name.
+bool describeCommandToCome(Parts& parts, const std::wstring& typed)
+{
+    for (const auto& record : parts.records->all())
+        for (const auto& [globalName, name] : record.commands)
+            if (equalIgnoringCase(name, typed))
+            {
+                describeCommandToCome(parts, name, record.module);
+                return true;
+            }
+    return false;
+}
+
+Failure noHelp(Parts& parts, const std::wstring& name, const Failure& noTopic)
+{
+    const auto meant = nearest(name, parts.commandNames());
+    if (!meant)
+        return noTopic;
+    return {L"There is no help on \"" + name + L"\". Did you mean " + *meant + L"?"};
 }
 
 // A name is that of a command, or else a topic of the help book.
@@ -42,26 +79,27 @@ Result<> help(Parts& parts, const CommandStack::Arguments& arguments)
 {
     if (arguments.empty())
         return listCommands(parts);
-    const auto known = parts.commands->descriptions();
-    const auto found = std::ranges::find_if(known, [&](const auto& command)
-                                            { return equalIgnoringCase(command.name, arguments.front()); });
-    if (found == known.end())
-    {
-        const auto shown = parts.help->show(arguments.front());
-        return shown ? succeed(parts, *shown) : shown.failure();
-    }
-    sayCommand(parts, *found);
-    return {};
+    const std::wstring& name = arguments.front();
+    const auto command = parts.commands->description(name);
+    if (command)
+        describeCommand(parts, *command);
+    if (command || describeCommandToCome(parts, name))
+        return {};
+    const auto shown = parts.help->show(name);
+    return shown ? succeed(parts, *shown) : noHelp(parts, name, shown.failure());
 }
 
 Result<> changeFolder(Parts& parts, const CommandStack::Arguments& arguments)
 {
+    const auto typed =
+        arguments.empty() ? Result<std::wstring>(std::wstring()) : onlyFile(parts, L"CD", arguments);
+    if (!typed)
+        return typed.failure();
     std::error_code error;
-    if (!arguments.empty())
-        std::filesystem::current_path(toPath(arguments.front()), error);
+    if (!typed->empty())
+        std::filesystem::current_path(typedPath(*typed), error);
     if (error)
-        return Failure{L"The folder " + arguments.front() + L" cannot be entered: " +
-                       toWide(error.message()) + L"."};
+        return Failure{L"The folder " + *typed + L" cannot be entered: " + toWide(error.message()) + L"."};
     const auto folder = std::filesystem::current_path(error);
     if (error)
         return Failure{L"The current folder is gone."};
@@ -83,16 +121,15 @@ void addSessionCommands(Parts& parts, SessionActions actions)
     };
     const auto script = [&parts, run = std::move(actions.runScript)](const CommandStack::Arguments& arguments)
     {
-        return arguments.size() == 1 ? run(toPath(arguments.front())) : wrongUsage(parts, L"SCRIPT");
+        const auto file = onlyFile(parts, L"SCRIPT", arguments);
+        return file ? run(typedPath(*file)) : file.failure();
     };
-    addBuiltIn(parts,
-               {kSessionGroup, L"HELP", L"[name]", L"Lists the commands, or tells about one or a help topic"},
-               help);
-    parts.commands->addBuiltIn({kSessionGroup, L"QUIT", L"", L"Ends the session"}, quit);
-    parts.commands->addBuiltIn({kSessionGroup, L"EXIT", L"", L"Ends the session"}, quit);
-    parts.commands->addBuiltIn({kSessionGroup, L"SCRIPT", L"file", L"Runs the commands in a file"}, script);
-    addBuiltIn(parts, {kSessionGroup, L"CD", L"[folder]", L"Shows or changes the current folder"},
-               changeFolder);
-    addBuiltIn(parts, {kSessionGroup, L"VERSION", L"", L"Shows the version"}, tellVersion);
+    addBuiltIn(parts, L"HELP", help);
+    addBuiltIn(parts, L"?", help);
+    addBuiltIn(parts, L"QUIT", quit);
+    addBuiltIn(parts, L"EXIT", quit);
+    addBuiltIn(parts, L"SCRIPT", script);
+    addBuiltIn(parts, L"CD", changeFolder);
+    addBuiltIn(parts, L"VERSION", tellVersion);
 }
 } // namespace tessel

@@ -2,12 +2,12 @@
 #include "host/app/BuiltIn.h"
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
+#include "host/text/Table.h"
 
 namespace tessel
 {
 namespace
 {
-constexpr wchar_t kSettingsGroup[] = L"Settings";
 constexpr std::size_t kVariableColumn = 34;
 
 std::wstring assignment(const SystemVariables::Variable& variable)
@@ -17,8 +17,10 @@ std::wstring assignment(const SystemVariables::Variable& variable)
 
 Result<> listVariables(Parts& parts)
 {
+    Table table({kVariableColumn});
     for (const auto& variable : parts.variables->all())
-        sayLine(parts, L"  " + padded(assignment(variable), kVariableColumn) + L" " + variable.purpose);
+        table.add({assignment(variable), variable.purpose});
+    parts.commandLine->show(table);
     return {};
 }
 
@@ -55,9 +57,7 @@ Result<> profile(Parts& parts, const CommandStack::Arguments& arguments)
 
 void addSettingCommands(Parts& parts)
 {
-    addBuiltIn(parts, {kSettingsGroup, L"SETVAR", L"[name [value]]", L"Shows or sets system variables"},
-               setVariable);
-    addBuiltIn(parts, {kSettingsGroup, L"PROFILE", L"[name]", L"Shows or changes the current profile"},
-               profile);
+    addBuiltIn(parts, L"SETVAR", setVariable);
+    addBuiltIn(parts, L"PROFILE", profile);
 }
 } // namespace tessel

@@ -1,20 +1,36 @@
 #include "host/app/BuiltInSupport.h"
 
-#include <algorithm>
 #include <functional>
+#include <utility>
 
 #include "host/app/Parts.h"
+#include "host/commands/CommandTexts.h"
+#include "host/platform/HomeFolder.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
-void addBuiltIn(Parts& parts, const CommandStack::Description& description, BuiltInCommand* command)
+void addBuiltIn(Parts& parts, const std::wstring& name, CommandStack::BuiltIn command)
 {
-    parts.commands->addBuiltIn(description, std::bind_front(command, std::ref(parts)));
+    const CommandText& text = *findCommandText(name);
+    parts.commands->addBuiltIn({text.group, text.name, text.usage, text.summary, text.example},
+                               std::move(command));
+}
+
+void addBuiltIn(Parts& parts, const std::wstring& name, BuiltInCommand* command)
+{
+    addBuiltIn(parts, name, CommandStack::BuiltIn(std::bind_front(command, std::ref(parts))));
 }
 
 void sayLine(Parts& parts, const std::wstring& sentence)
 {
     parts.commandLine->say(sentence);
+}
+
+Result<> confirm(Parts& parts, const std::wstring& sentence)
+{
+    parts.commandLine->confirm(sentence);
+    return {};
 }
 
 Result<> succeed(Parts& parts, const std::wstring& sentence)
@@ -25,17 +41,44 @@ Result<> succeed(Parts& parts, const std::wstring& sentence)
 
 Failure wrongUsage(const Parts& parts, const std::wstring& command)
 {
-    const auto known = parts.commands->descriptions();
-    const auto found = std::ranges::find_if(known, [&](const auto& entry) { return entry.name == command; });
-    return {L"Usage: " + command + L" " + (found == known.end() ? L"" : found->usage)};
+    return {usageText(command, parts.commands->description(command)->usage)};
+}
+
+std::filesystem::path typedPath(const std::wstring& typed)
+{
+    std::error_code unreachable;
+    const std::filesystem::path path = toPath(typed);
+    return std::filesystem::exists(path, unreachable) ? path
+                                                      : std::filesystem::path(withHomeFolder(path.native()));
+}
+
+Result<std::wstring> onlyFile(const Parts& parts, const std::wstring& command,
+                              const CommandStack::Arguments& arguments)
+{
+    if (arguments.size() == 1 && !arguments.front().empty())
+        return arguments.front();
+    std::wstring withBlanks;
+    for (const auto& argument : arguments)
+        withBlanks += (withBlanks.empty() ? L"" : L" ") + argument;
+    const Failure usage = wrongUsage(parts, command);
+    if (arguments.size() < 2)
+        return usage;
+    return Failure{
+        usage.sentence + L"\n" +
+        translated(L"A name with blanks in it is typed in quotes: {}", command + L" " + asPart(withBlanks))};
 }
 
 std::wstring fullPath(const Parts& parts, const std::wstring& typed)
 {
-    if (const auto found = parts.files->find(toPath(typed)))
+    const auto meant = typedPath(typed);
+    if (const auto found = parts.files->find(meant))
+    {
+        if (*found != meant)
+            parts.commandLine->explain(translated(L"{} is the file {}.", typed, *found));
         return toText(*found);
+    }
     std::error_code currentFolderIsGone;
-    const auto path = std::filesystem::absolute(toPath(typed), currentFolderIsGone);
+    const auto path = std::filesystem::absolute(meant, currentFolderIsGone);
     return toText(path.has_filename() ? path : path.parent_path());
 }
 
@@ -47,11 +90,5 @@ std::filesystem::path toPath(const std::wstring& text)
 std::wstring toText(const std::filesystem::path& path)
 {
     return toWide(path.string());
-}
-
-std::wstring padded(std::wstring text, std::size_t width)
-{
-    text.resize(std::max(text.size(), width), L' ');
-    return text;
 }
 } // namespace tessel

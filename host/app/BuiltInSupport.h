@@ -11,21 +11,31 @@ namespace tessel
 {
 struct Parts;
 
-// Under which `HELP` lists the commands that load and keep out.
-inline constexpr wchar_t kApplicationsGroup[] = L"Applications";
-
 using BuiltInCommand = Result<>(Parts& parts, const CommandStack::Arguments& arguments);
 
-// Adds a command that works on the parts.
-void addBuiltIn(Parts& parts, const CommandStack::Description& description, BuiltInCommand* command);
+// Adds a command of the host, which `CommandTexts` has a row about.
+void addBuiltIn(Parts& parts, const std::wstring& name, CommandStack::BuiltIn command);
+// The same with one that works on the parts.
+void addBuiltIn(Parts& parts, const std::wstring& name, BuiltInCommand* command);
 
 void sayLine(Parts& parts, const std::wstring& sentence);
 
-// Says the sentence with which a command ends well.
+// Says that a command has done what it was to do; those who want it quiet know.
+Result<> confirm(Parts& parts, const std::wstring& sentence);
+
+// Says the sentence that a command was to find out.
 Result<> succeed(Parts& parts, const std::wstring& sentence);
 
 // How the command is to be typed.
 Failure wrongUsage(const Parts& parts, const std::wstring& command);
+
+// The path that was typed as an argument. A tilde at its beginning stands for a home folder, unless something
+// has just that name.
+std::filesystem::path typedPath(const std::wstring& typed);
+
+// The one argument of a command that takes one file; otherwise how it is to be typed.
+Result<std::wstring> onlyFile(const Parts& parts, const std::wstring& command,
+                              const CommandStack::Arguments& arguments);
 
 // Where the file is, along the host's search path; a file that is not found is looked for where the user is,
 // so that what is said about it names a whole path.
@@ -33,7 +43,4 @@ std::wstring fullPath(const Parts& parts, const std::wstring& typed);
 
 std::filesystem::path toPath(const std::wstring& text);
 std::wstring toText(const std::filesystem::path& path);
-
-// The text, filled up with blanks to the width of a column.
-std::wstring padded(std::wstring text, std::size_t width);
 } // namespace tessel

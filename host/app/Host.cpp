@@ -10,20 +10,63 @@
 #include "host/applications/ShippedRecords.h"
 #include "host/applications/StartSummary.h"
 #include "host/console/Console.h"
+#include "host/console/FolderContent.h"
 #include "host/platform/AutoreleasePool.h"
 #include "host/platform/PrivateFolder.h"
 #include "host/platform/ToolkitPlaces.h"
+#include "host/text/Duration.h"
 #include "host/text/Languages.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
 namespace
 {
 constexpr int kDeepestScript = 16;
+
+std::wstring durationSince(LoadOutcomes::Clock::time_point begun)
+{
+    return durationInWords(
+        std::chrono::duration_cast<std::chrono::microseconds>(LoadOutcomes::Clock::now() - begun));
+}
+
+std::vector<std::wstring> namesOf(const std::vector<SystemVariables::Variable>& variables)
+{
+    std::vector<std::wstring> names;
+    for (const auto& variable : variables)
+        names.push_back(variable.name);
+    return names;
+}
+
+// Of the key of a path that ends with a backslash, or of the root. A read is no part of a command.
+std::vector<Branch> keysBelow(LayeredRegistry& registry, std::wstring path)
+{
+    if (path.ends_with(L'\\'))
+        path.pop_back();
+    std::vector<Branch> keys;
+    const auto key = registry.find(path);
+    const auto names = key == Registry::kNoKey ? std::vector<std::wstring>() : registry.subKeys(key);
+    for (const std::wstring& name : names)
+        keys.push_back({name, !registry.subKeys(registry.find(name, key)).empty()});
+    registry.own().storeSoFar();
+    return keys;
+}
 } // namespace
 
-Host::Host(HostOptions options) : mOptions(std::move(options)), mCommandLine(mOptions.output)
+Host::Host(HostOptions options)
+    : mOptions(std::move(options)), mCommandLine(mOptions.output, withPagerForPersons(mOptions.outputTo))
 {
+}
+
+// A script, and whoever reads what it says, turns no pages.
+OutputSurroundings Host::withPagerForPersons(OutputSurroundings surroundings)
+{
+    if (surroundings.pager)
+        surroundings.pager = [this, show = std::move(surroundings.pager)](const std::string& list)
+        {
+            return mQuestions.asksPerson() && show(list);
+        };
+    return surroundings;
 }
 
 Host::~Host()
@@ -35,8 +78,10 @@ bool Host::start()
 {
     const AutoreleasePool pool;
     const Interruption::Work work(mInterruption);
+    const auto begun = LoadOutcomes::Clock::now();
     if (!mCommandLine.tell(makeParts()))
         return false;
+    explainPlaces();
     judgeEarlierSessions();
     const RunningMarker::ReasonScope atStart(*mParts->marker, RunningMarker::Reason::kAtStart);
     mParts->messageBox->collect();
@@ -48,7 +93,27 @@ bool Host::start()
     }
     finishLine();
     tellOfStart();
+    mCommandLine.explain(translated(L"The start took {}.", durationSince(begun)));
     return true;
+}
+
+void Host::explainPlaces()
+{
+    if (!mCommandLine.isTalkative())
+        return;
+    mCommandLine.explain(translated(L"The profile is kept in {}.", mOptions.profileFolder));
+    for (const auto& folder : mOptions.layoutFolders)
+        mCommandLine.explain(translated(L"Values for everybody are looked for in {}.", folder));
+    mCommandLine.explain(translated(L"Applications are looked for in {}.", mParts->folders.plugIns));
+}
+
+void Host::explainLoad(const LoadOutcome& outcome)
+{
+    const std::wstring time = durationInWords(outcome.took);
+    if (outcome.loaded)
+        mCommandLine.explain(translated(L"{} was loaded in {}.", outcome.path, time));
+    else
+        mCommandLine.explain(translated(L"{} was not loaded, which took {}.", outcome.path, time));
 }
 
 void Host::judgeEarlierSessions()
@@ -59,12 +124,12 @@ void Host::judgeEarlierSessions()
     if (!mayBeEntered(mOptions.profileFolder / kApplicationsFolder))
         return; // that has been told
     for (const auto& sentence : begun.sentences)
-        mCommandLine.say(sentence);
+        mCommandLine.warn(sentence);
     if (mCommandLine.tell(begun.stored))
         mParts->marker->forgetLeftovers();
     for (const auto& line : mParts->bisecting.sentencesAtStart([this](const std::string& suspect)
                                                                { return mParts->admission.whyOut(suspect); }))
-        mCommandLine.say(line);
+        mCommandLine.warn(line);
 }
 
 // One sentence, although everything that stands in the folder is out of reach.
@@ -74,7 +139,7 @@ void Host::tellOfApplicationsFolder()
     if (mayBeEntered(folder))
         mCommandLine.tell(mParts->marker->outlivesProcess());
     else
-        mCommandLine.say(
+        mCommandLine.warn(
             L"The folder " + toText(folder) +
             L" cannot be entered: what ends Tessel cannot be remembered, and nothing is kept out "
             L"in this session. This puts it right: chmod 700 " +
@@ -106,6 +171,7 @@ Result<> Host::makeParts()
                                                  {
                                                      return finishLine();
                                                  }});
+    mParts->loadOutcomes.tellBy([this](const LoadOutcome& outcome) { explainLoad(outcome); });
     tellOfRegistry();
     tellOfApplicationsFolder();
     mInterruptible = &*mParts->lisp;
@@ -124,9 +190,9 @@ void Host::tellOfRegistry()
         if (const auto read = registry.endOfCommand(); read.sentence() != registry.canStore().sentence())
             mCommandLine.tell(read);
     if (registry.notice())
-        mCommandLine.say(*registry.notice());
+        mCommandLine.warn(*registry.notice());
     for (const auto& sentence : mParts->layered->sentences())
-        mCommandLine.say(sentence);
+        mCommandLine.warn(sentence);
 }
 
 Result<> Host::prepareProfileFolder()
@@ -167,11 +233,11 @@ bool Host::tellWhoElseWrites(const std::wstring& kind, const std::filesystem::pa
     if (checked || !std::filesystem::exists(path, unreachable))
         return true;
     const bool isFolder = std::filesystem::is_directory(path, unreachable);
-    mCommandLine.say(L"The " + kind + L" " + toText(path) + L" is not safe: " + checked.sentence() +
-                     (checked.code() == kBelongsToAnother
-                          ? std::wstring(L", who could change what Tessel loads.")
-                          : L" and so decide what Tessel loads. This puts it right: chmod " +
-                                std::wstring(isFolder ? L"700 " : L"600 ") + toText(path)));
+    mCommandLine.warn(L"The " + kind + L" " + toText(path) + L" is not safe: " + checked.sentence() +
+                      (checked.code() == kBelongsToAnother
+                           ? std::wstring(L", who could change what Tessel loads.")
+                           : L" and so decide what Tessel loads. This puts it right: chmod " +
+                                 std::wstring(isFolder ? L"700 " : L"600 ") + toText(path)));
     return false;
 }
 
@@ -207,8 +273,14 @@ bool Host::run(const std::wstring& input)
     const Interruption::Work work(mInterruption);
     const Interruption::Wish wish =
         std::exchange(mTypedLine, std::nullopt).value_or(Interruption::Wish(mInterruption));
-    if (!isLisp(input))
-        return mParts->commandRunner.run(input);
+    const auto begun = LoadOutcomes::Clock::now();
+    const bool done = isLisp(input) ? runLisp(input, wish) : mParts->commandRunner.run(input);
+    mCommandLine.explain(translated(L"That took {}.", durationSince(begun)));
+    return done;
+}
+
+bool Host::runLisp(const std::wstring& input, const Interruption::Wish& wish)
+{
     const auto value = mParts->lisp->evaluate(input, &wish);
     if (mCommandLine.tell(value) && !value->empty())
         mCommandLine.say(*value);
@@ -285,15 +357,33 @@ bool Host::runsLisp() const noexcept
     return lisp && lisp->running();
 }
 
-std::vector<std::wstring> Host::commandNames() const
+CompletionSources Host::completionSources()
 {
-    std::vector<std::wstring> names = mParts->commands->names();
-    for (const auto& record : mParts->records->all())
-        for (const auto& command : record.commands)
-            names.push_back(command.second);
-    mParts->registry->storeSoFar(); // the next command is to read what is stored by then
-    std::ranges::sort(names);
-    names.erase(std::unique(names.begin(), names.end()), names.end());
-    return names;
+    CompletionSources sources;
+    sources.commands = [this]
+    {
+        return mParts->commandNames();
+    };
+    sources.usage = [this](const std::wstring& command)
+    {
+        const auto known = mParts->commands->description(command);
+        return known ? known->usage : std::wstring();
+    };
+    sources.variables = [this]
+    {
+        return namesOf(mParts->variables->all());
+    };
+    sources.files = contentOfFolder;
+    sources.keys = [this](const std::wstring& key)
+    {
+        return keysBelow(*mParts->layered, key);
+    };
+    sources.lispSymbols = [this](const std::wstring& beginning)
+    {
+        const AutoreleasePool pool;
+        const Interruption::Work work(mInterruption);
+        return mParts->lisp->symbolsBeginning(beginning);
+    };
+    return sources;
 }
 } // namespace tessel

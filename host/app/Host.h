@@ -24,6 +24,7 @@
 #include "host/app/Export.h"
 #include "host/commands/EndRequest.h"
 #include "host/commands/Interruption.h"
+#include "host/console/Completion.h"
 #include "host/console/LineRunner.h"
 #include "host/files/RemoteFiles.h"
 #include "host/messages/Questions.h"
@@ -34,6 +35,7 @@ namespace tessel
 class LispInterpreter;
 class Registry;
 class RunningMarker;
+struct LoadOutcome;
 struct Parts;
 
 struct HostOptions
@@ -43,6 +45,7 @@ struct HostOptions
     std::vector<std::filesystem::path> layoutFolders = {};
     bool safe = false;                  // load no application by itself
     CommandLine::Sink output;           // receives everything that the host says
+    OutputSurroundings outputTo = {};   // what is known about where that goes
     RemoteFiles::Limits downloads = {}; // of the files that are fetched for applications
 };
 
@@ -82,8 +85,8 @@ public:
     CommandLine& commandLine() { return mCommandLine; }
     Questions& questions() { return mQuestions; }
 
-    // What the Tab key completes: the commands that are there or that the host knows how to load.
-    std::vector<std::wstring> commandNames() const;
+    // What the Tab key completes; for as long as the host runs.
+    CompletionSources completionSources();
 
 private:
     Result<> makeParts();
@@ -94,6 +97,10 @@ private:
     void tellWhoElseWritesTheProfile();
     bool tellWhoElseWrites(const std::wstring& kind, const std::filesystem::path& path);
     void tellOfStart();
+    void explainPlaces();
+    void explainLoad(const LoadOutcome& outcome);
+    bool runLisp(const std::wstring& input, const Interruption::Wish& wish);
+    OutputSurroundings withPagerForPersons(OutputSurroundings surroundings);
     void addShippedRecords();
     void addCommands();
     bool finishLine();

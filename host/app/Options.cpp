@@ -17,17 +17,22 @@ constexpr char kAfterword[] =
     "status 0, or with 1 if a file could not be loaded, a command was unknown or failed or a Lisp "
     "expression\n"
     "had an error. Otherwise it reads commands from the terminal, or line by line from a pipe, which is\n"
-    "treated like a script. Wrong arguments end with status 2.";
+    "treated like a script. What goes wrong is said on standard error. Wrong arguments end with status 2.";
 
 std::string isNamed(const std::string& folder)
 {
     return folder.empty() ? "a folder is wanted, and nothing is named" : "";
 }
 
+std::string isNamedFile(const std::string& file)
+{
+    return file.empty() ? "a file is wanted, and nothing is named" : "";
+}
+
 void declare(CLI::App& app, Options& options)
 {
     app.footer(kAfterword);
-    app.set_help_flag("--help", "Show this text and end");
+    app.set_help_flag("-h,--help", "Show this text and end");
     app.set_version_flag("--version", versionLine(), "Show the version and end");
     app.add_option("--profile-dir", options.profileFolder,
                    "Keep everything in this folder instead of your own")
@@ -47,6 +52,16 @@ void declare(CLI::App& app, Options& options)
                         ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll)
                         ->allow_extra_args(false);
     app.add_option("FILE", options.files, "Load applications, as LOAD does")->type_name("");
+    auto* quiet = app.add_flag_callback(
+        "-q,--quiet", [&options] { options.loudness = Loudness::kQuiet; },
+        "Say only what is asked for and what goes wrong");
+    app.add_flag_callback(
+           "-v,--verbose", [&options] { options.loudness = Loudness::kTalkative; },
+           "Say also what is done: files looked at, time taken")
+        ->excludes(quiet);
+    app.add_option("--log", options.log, "Add everything that is said to a file, with times")
+        ->type_name("LOGFILE")
+        ->check(isNamedFile);
     app.add_flag("--modrig", options.modrig, "Open Modrig's dialog, and end with it")
         ->excludes(script)
         ->excludes(command);

@@ -6,6 +6,7 @@
 #include <string>
 #include <vector>
 
+#include "host/text/CommandLine.h"
 #include "host/text/Result.h"
 
 namespace tessel
@@ -18,7 +19,9 @@ struct Options
     std::vector<std::string> commands;   // -c, in their order; UTF-8
     std::vector<std::string> files;      // to be loaded first, as LOAD does, in their order
     bool safe = false;                   // start without loading any application by itself
-    bool modrig = false;                 // show Modrig's dialog, and nothing else
+    std::filesystem::path log;           // of everything that is said; empty: none
+    Loudness loudness = Loudness::kUsual;
+    bool modrig = false; // show Modrig's dialog, and nothing else
 
     // Whether the host ends after the script and the commands, or the dialog, instead of asking for more.
     bool isBatch() const { return !script.empty() || !commands.empty() || modrig; }

@@ -5,6 +5,7 @@
 // host/text/Running.h).
 #pragma once
 
+#include <algorithm>
 #include <filesystem>
 #include <memory>
 
@@ -76,7 +77,7 @@ struct Parts
     Published<Questions> questions{foundations.questions};
     Published<EndRequest> endRequest{foundations.endRequest};
     Owned<Registry> registry{foundations.profileFolder / kRegistryFile, Registry::kBusyTimeout,
-                             [this](const std::wstring& sentence) { foundations.commandLine.say(sentence); },
+                             [this](const std::wstring& sentence) { foundations.commandLine.warn(sentence); },
                              [wish = Interruption::Wish(foundations.interruption)]
                              {
                                  return wish.isThere();
@@ -84,7 +85,7 @@ struct Parts
     Owned<LayeredRegistry> layered{*registry, readRegistryLayers(foundations.layoutFolders),
                                    [this](const std::wstring& sentence)
                                    {
-                                       foundations.commandLine.say(sentence);
+                                       foundations.commandLine.warn(sentence);
                                    }};
     Profiles profiles{*layered, kProductRegistryRoot};
     Owned<SystemVariables> variables{&*layered, kProductRegistryRoot};
@@ -112,7 +113,11 @@ struct Parts
     Owned<Document> document;
     Owned<FileSearch> files{folders.resources, *variables};
     Owned<RemoteFiles> remote{foundations.profileFolder / "remote-files", foundations.downloads,
-                              foundations.interruption};
+                              foundations.interruption,
+                              [this](const std::wstring& sentence)
+                              {
+                                  foundations.commandLine.warn(sentence);
+                              }};
     Owned<HostInformation> information{toWide(foundations.profileFolder.string()), *remote, *commandLine};
     Owned<Help> help{folders.resources / "help", openInBrowser, personsLanguages()};
     // The variable is read here, before any application is loaded, and holds for the session.
@@ -121,18 +126,37 @@ struct Parts
                                  .outcomes = &loadOutcomes,
                                  .admission = &admission},
         *commandLine, *document, *endRequest};
-    CommandRunner commandRunner{*commands, *commandLine, *callingApplication,
+    CommandRunner commandRunner{*commands,
+                                *commandLine,
+                                *callingApplication,
                                 [this](const std::wstring& name)
                                 {
                                     sayRecordsTakenAlong();
                                     return demandLoading.loadForCommand(name);
                                 },
-                                foundations.afterLine};
+                                foundations.afterLine,
+                                [this]
+                                {
+                                    return commandNames();
+                                }};
 
     void sayRecordsTakenAlong()
     {
         for (const auto& sentence : demandLoading.takeRecordsAlong())
-            commandLine->say(sentence);
+            commandLine->warn(sentence);
+    }
+
+    // What can be typed: the commands that are there or that the host knows how to load; sorted.
+    std::vector<std::wstring> commandNames()
+    {
+        std::vector<std::wstring> names = commands->names();
+        for (const auto& record : records->all())
+            for (const auto& command : record.commands)
+                names.push_back(command.second);
+        registry->storeSoFar(); // the next command is to read what is stored by then
+        std::ranges::sort(names);
+        names.erase(std::unique(names.begin(), names.end()), names.end());
+        return names;
     }
 };
 } // namespace tessel

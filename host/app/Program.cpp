@@ -18,12 +18,16 @@
 #include "host/app/WindowBox.h"
 #include "host/commands/CommandRunner.h"
 #include "host/commands/LastWords.h"
+#include "host/console/Colours.h"
 #include "host/console/Console.h"
 #include "host/console/EndSignals.h"
 #include "host/console/InterruptKey.h"
 #include "host/console/LineEditor.h"
+#include "host/console/Pager.h"
 #include "host/console/PipedInput.h"
+#include "host/console/SessionLog.h"
 #include "host/console/StandardOutput.h"
+#include "host/console/TerminalSize.h"
 #include "host/console/TypedHistory.h"
 #include "host/platform/ProductFolders.h"
 #include "host/text/TerminalText.h"
@@ -67,7 +71,7 @@ void takeStandardDescriptors()
 
 void greet(CommandLine& commandLine)
 {
-    commandLine.say(toWide(kProgramLine) + L". Type HELP for the list of commands, QUIT to leave.");
+    commandLine.confirm(toWide(kProgramLine) + L". Type HELP for the list of commands, QUIT to leave.");
 }
 
 // Nothing but documents is to be printed then.
@@ -109,9 +113,8 @@ int converse(Host& host, const std::filesystem::path& profileFolder, InputSource
 {
     TypedHistory history(profileFolder / kHistoryFile);
     const auto earlier = history.read();
-    LineEditor editor(
-        host.commandLine().tell(earlier) ? *earlier : std::vector<std::wstring>(),
-        [&host] { return host.commandNames(); }, source);
+    LineEditor editor(host.commandLine().tell(earlier) ? *earlier : std::vector<std::wstring>(),
+                      host.completionSources(), source);
     Console(host.commandLine(), host.questions(), host).converse(editor, history);
     return kAllWell;
 }
@@ -133,16 +136,44 @@ int runSession(Host& host, const Options& options, const InterruptKey& interrupt
     return filesLoaded ? status : kSomethingFailed;
 }
 
-int runHost(Options options, StandardOutput& output)
+// Nobody turns pages where nobody types.
+bool isConversation(const Options& options)
+{
+    return !options.isBatch() && isatty(STDIN_FILENO) && isatty(STDOUT_FILENO);
+}
+
+OutputSurroundings surroundingsFor(const Options& options, StandardOutput& errors, SessionLog* log)
+{
+    OutputSurroundings surroundings;
+    surroundings.screen = []
+    {
+        return terminalSize(STDOUT_FILENO);
+    };
+    surroundings.loudness = options.loudness;
+    surroundings.errors = [&errors](std::string_view text)
+    {
+        errors.write(text);
+    };
+    surroundings.colours = showsColours(STDERR_FILENO);
+    if (log)
+        surroundings.record = [log](std::string_view text)
+        {
+            log->record(text);
+        };
+    if (isConversation(options))
+        surroundings.pager = showInPager;
+    return surroundings;
+}
+
+int runHost(Options options, StandardOutput& output, SessionLog* log)
 {
     if (options.profileFolder.empty())
         options.profileFolder = personalFolder();
     const LastWords lastWords; // before Lisp takes a signal of them
+    StandardOutput errors(STDERR_FILENO);
     Host host({options.profileFolder, layoutFolders(options.layoutFolder), options.safe,
-               [&output](std::string_view text)
-               {
-                   output.write(text);
-               }});
+               [&output](std::string_view text) { output.write(text); },
+               surroundingsFor(options, errors, log)});
     const InterruptKey interruptKey(host); // applications that load at start may run away too
     const EndSignals endSignals(host);
     if (!options.modrig && !answersPrograms(options))
@@ -153,6 +184,25 @@ int runHost(Options options, StandardOutput& output)
     host.end();
     return EndSignals::received() == 0 ? status : kEndedBySignal + EndSignals::received();
 }
+
+// The sentences may repeat what anybody has made up.
+int complain(const std::wstring& sentence, int status)
+{
+    std::fputs((toUtf8(forTerminal(sentence)) + "\n").c_str(), stderr);
+    return status == kAllWell ? kSomethingFailed : status;
+}
+
+int runHost(const Options& options, StandardOutput& output)
+{
+    if (options.log.empty())
+        return runHost(options, output, nullptr);
+    auto log = SessionLog::open(options.log);
+    if (!log)
+        return complain(log.sentence(), kSomethingFailed);
+    const int status = runHost(options, output, &*log);
+    const auto written = log->finish();
+    return written ? status : complain(written.sentence(), status);
+}
 } // namespace
 
 int runProgram(int count, const char* const* arguments)
@@ -162,7 +212,7 @@ int runProgram(int count, const char* const* arguments)
     surviveFailingWrites();
     takeStandardDescriptors();
     const auto parsed = parseOptions(count, arguments);
-    StandardOutput output;
+    StandardOutput output(STDOUT_FILENO);
     if (!parsed) // it repeats arguments that anybody may have made up
         std::fputs(toUtf8(forTerminal(parsed.sentence())).c_str(), stderr);
     int status = parsed.code();

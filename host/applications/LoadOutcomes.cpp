@@ -15,6 +15,8 @@ void LoadOutcomes::note(const std::wstring& path, const Result<>& loaded, Clock:
         mOutcomes.push_back({path, loaded, took});
     else
         mOutcomes[known->second] = {path, loaded, took};
+    if (mTell)
+        mTell(mOutcomes[known->second]);
 }
 
 bool LoadOutcomes::willBeTold(int failureCode) const

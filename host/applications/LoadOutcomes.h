@@ -3,8 +3,10 @@
 
 #include <chrono>
 #include <cstddef>
+#include <functional>
 #include <string>
 #include <unordered_map>
+#include <utility>
 #include <vector>
 
 #include "host/text/Result.h"
@@ -31,6 +33,9 @@ public:
     void expectSummary(bool isToCome) { mExpectsSummary = isToCome; }
     bool willBeTold(int failureCode) const;
 
+    // Is told of each outcome that is noted.
+    void tellBy(std::function<void(const LoadOutcome&)> tell) { mTell = std::move(tell); }
+
     // Null for a path of which nothing was noted.
     const LoadOutcome* of(const std::wstring& path) const;
 
@@ -41,5 +46,6 @@ private:
     std::vector<LoadOutcome> mOutcomes;
     std::unordered_map<std::wstring, std::size_t> mIndexes;
     bool mExpectsSummary = false;
+    std::function<void(const LoadOutcome&)> mTell;
 };
 } // namespace tessel

@@ -18,8 +18,8 @@ public:
     std::wstring owner; // the path of the application that registered it; empty for the host's own
     TsEdCommandHandler handler = nullptr;
     std::wstring summary; // one line, or empty
-
-    std::wstring usage; // its arguments; empty where it takes none
+    std::wstring usage;   // as in `CommandText`
+    std::wstring example; // the whole line, or empty
 
     // The host's own commands have this instead of a handler.
     using BuiltIn = std::function<tessel::Result<>(const std::vector<std::wstring>& arguments)>;

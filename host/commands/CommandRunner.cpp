@@ -5,7 +5,9 @@
 
 #include "host/commands/CallingApplication.h"
 #include "host/commands/Command.h"
+#include "host/commands/CommandTexts.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Nearest.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -17,11 +19,6 @@ constexpr wchar_t kForPrograms[] = L"--json";
 bool isBlank(wchar_t character)
 {
     return character == L' ' || character == L'\t' || character == L'\r' || character == L'\n';
-}
-
-std::wstring usageOf(const TsEdCommand& command)
-{
-    return L"Usage: " + command.localName + (command.usage.empty() ? L"" : L" ") + command.usage;
 }
 
 Failure failed(const std::wstring& name, const std::wstring& reason)
@@ -38,7 +35,7 @@ Result<> callHandler(const TsEdCommand& command, const CommandStack::Arguments& 
     command.handler();
     if (!typed.failure)
         return {};
-    return Failure{typed.failure->empty() ? usageOf(command) : *typed.failure};
+    return Failure{typed.failure->empty() ? usageText(command.localName, command.usage) : *typed.failure};
 }
 
 // What runs here may come from anybody's application: whatever it throws ends with the command.
@@ -66,9 +63,9 @@ Result<> call(const TsEdCommand& command, const CommandStack::Arguments& argumen
 } // namespace
 
 CommandRunner::CommandRunner(const CommandStack& commands, CommandLine& commandLine,
-                             CallingApplication& calls, Loader loader, AfterLine afterLine)
+                             CallingApplication& calls, Loader loader, AfterLine afterLine, Names names)
     : mCommands(commands), mCommandLine(commandLine), mCalls(calls), mLoader(std::move(loader)),
-      mAfterLine(std::move(afterLine))
+      mAfterLine(std::move(afterLine)), mNames(std::move(names))
 {
 }
 
@@ -87,7 +84,16 @@ Result<> CommandRunner::runParts(const CommandStack::Arguments& parts) const
     // Kept alive here: the handler may unload the application and so remove its own command.
     if (const CommandStack::Command command = findOrLoad(parts.front()))
         return call(*command, CommandStack::Arguments(parts.begin() + 1, parts.end()), mCalls);
-    return Failure{L"Unknown command \"" + parts.front() + L"\". Type HELP for the list of commands."};
+    return unknown(parts.front());
+}
+
+Failure CommandRunner::unknown(const std::wstring& typedName) const
+{
+    const auto meant = nearest(typedName, mNames ? mNames() : mCommands.names());
+    if (!meant)
+        return {L"Unknown command \"" + typedName + L"\". Type HELP for the list of commands."};
+    return {L"Unknown command \"" + typedName + L"\". Did you mean " + *meant +
+            L"? Type HELP for the list of commands."};
 }
 
 CommandStack::Command CommandRunner::findOrLoad(const std::wstring& typedName) const

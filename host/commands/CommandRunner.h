@@ -23,10 +23,13 @@ public:
     // Called at the end of every line that ran, whatever came of it; false makes the line one that failed.
     using AfterLine = std::function<bool()>;
 
+    // What can be typed, to find what was meant by a name that is unknown.
+    using Names = std::function<std::vector<std::wstring>()>;
+
     // Says on the command line what became of a line, and tells `calls` whose command runs. Without a loader
     // there are the commands of the stack and no more.
     CommandRunner(const CommandStack& commands, CommandLine& commandLine, CallingApplication& calls,
-                  Loader loader = {}, AfterLine afterLine = {});
+                  Loader loader = {}, AfterLine afterLine = {}, Names names = {});
 
     // Runs one line: a command's name and its arguments (see `splitLine`). A blank line does nothing. False
     // when the command is unknown or failed, which has been told by then. Nothing that a handler throws comes
@@ -35,6 +38,7 @@ public:
 
 private:
     CommandStack::Command findOrLoad(const std::wstring& typedName) const;
+    Failure unknown(const std::wstring& typedName) const;
     Result<> runParts(const CommandStack::Arguments& parts) const;
 
     const CommandStack& mCommands;
@@ -42,6 +46,7 @@ private:
     CallingApplication& mCalls;
     Loader mLoader;
     AfterLine mAfterLine;
+    Names mNames;
 };
 
 // The parts of a line: split at blanks; double quotes keep blanks together and are taken away. Within them a

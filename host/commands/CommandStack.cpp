@@ -5,6 +5,7 @@
 
 #include "host/commands/CallingApplication.h"
 #include "host/commands/Command.h"
+#include "host/commands/CommandTexts.h"
 #include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
@@ -41,12 +42,6 @@ bool isOneLine(std::wstring_view text)
            std::ranges::none_of(text, [](wchar_t c) { return std::iswcntrl(static_cast<wint_t>(c)); });
 }
 
-// What comes with the host was there before commands could be described.
-std::wstring summaryFromTheBeginning(std::wstring_view globalName)
-{
-    return globalName == L"MODRIG" ? L"Loads and unloads applications, in a dialog" : L"";
-}
-
 bool isIn(const TsEdCommand& command, const wchar_t* group)
 {
     return group && equalIgnoringCase(command.group, group);
@@ -65,6 +60,11 @@ bool isOwn(const TsEdCommand& command)
 {
     return static_cast<bool>(command.builtIn);
 }
+
+CommandStack::Description descriptionOf(const TsEdCommand& command)
+{
+    return {command.group, command.localName, command.usage, command.summary, command.example};
+}
 } // namespace
 
 CommandStack::CommandStack(const CallingApplication& calls) : mCalls(calls)
@@ -80,6 +80,7 @@ void CommandStack::addBuiltIn(const Description& description, BuiltIn handler)
     command->globalName = command->localName = description.name;
     command->usage = description.usage;
     command->summary = description.summary;
+    command->example = description.example;
     command->builtIn = std::move(handler);
     mCommands.push_back(std::move(command));
 }
@@ -98,7 +99,12 @@ int CommandStack::addCommand(const wchar_t* group, const wchar_t* globalName, co
     added->group = group;
     added->globalName = globalName;
     added->localName = localName;
-    added->summary = summaryFromTheBeginning(added->globalName);
+    if (const CommandText* text = find(globalName) ? nullptr : findCommandText(globalName)) // Modrig's
+    {
+        added->summary = text->summary;
+        added->usage = text->usage;
+        added->example = text->example;
+    }
     added->owner = mCalls.path();
     added->handler = handler;
     if (command)
@@ -173,6 +179,15 @@ CommandStack::Command CommandStack::find(std::wstring_view typedName) const
     return found == mCommands.end() ? nullptr : *found;
 }
 
+std::optional<CommandStack::Description> CommandStack::description(std::wstring_view typedName) const
+{
+    if (const Command found = find(typedName))
+        return descriptionOf(*found);
+    const auto announced = std::ranges::find_if(mAnnounced, [&](const Description& other)
+                                                { return equalIgnoringCase(other.name, typedName); });
+    return announced == mAnnounced.end() ? std::nullopt : std::optional(*announced);
+}
+
 std::vector<CommandStack::Names> CommandStack::commandsOf(const std::wstring& applicationPath) const
 {
     std::vector<Names> result;
@@ -203,7 +218,7 @@ std::vector<CommandStack::Description> CommandStack::descriptions() const
 {
     std::vector<Description> result;
     for (const auto& command : mCommands)
-        insertIntoGroup(result, {command->group, command->localName, command->usage, command->summary});
+        insertIntoGroup(result, descriptionOf(*command));
     for (const auto& announced : mAnnounced)
         if (!find(announced.name))
             insertIntoGroup(result, announced);

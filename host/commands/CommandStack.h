@@ -3,6 +3,7 @@
 
 #include <functional>
 #include <memory>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <utility>
@@ -27,8 +28,9 @@ public:
     {
         std::wstring group;
         std::wstring name;    // what a person types
-        std::wstring usage;   // the arguments
+        std::wstring usage;   // the arguments, as in `CommandText`
         std::wstring summary; // one line; empty where an application has given none
+        std::wstring example = {};
     };
 
     // Shared: a handler may remove the command that runs it.
@@ -64,6 +66,9 @@ public:
     // The command that a person types so, or null. Where several share a name, it is the one that was
     // registered first, so that nobody can take the host's own away.
     Command find(std::wstring_view typedName) const;
+
+    // The same command, or one that is announced, as a person is told of it.
+    std::optional<Description> description(std::wstring_view typedName) const;
 
     // The commands that the application at that path has registered, in the order of registration.
     std::vector<Names> commandsOf(const std::wstring& applicationPath) const;

@@ -1,6 +1,8 @@
-// What the Tab key makes of the beginning of a command's name.
+// What the Tab key makes of what is typed before the cursor.
 #pragma once
 
+#include <cstddef>
+#include <functional>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -10,11 +12,35 @@ namespace tessel
 {
 struct Completion
 {
-    std::wstring text;                    // what now stands in place of the typed beginning
+    std::size_t replaced = 0; // so many characters before the cursor give way to the text
+    std::wstring text;
     std::vector<std::wstring> candidates; // the names to choose from when there are several
 };
 
-// Names compare without regard to case. One name that fits is completed whole, with a blank after it; of
-// several, as far as they agree. Nothing when no name fits, or when the line holds more than one word.
-std::optional<Completion> completeCommand(std::wstring_view line, const std::vector<std::wstring>& names);
+// A file in a folder, or a key in another.
+struct Branch
+{
+    std::wstring name;
+    bool goesOn = false; // a path may go on below it
+};
+
+// What there is to complete with, asked when it is needed. What is missing completes nothing.
+struct CompletionSources
+{
+    using Names = std::vector<std::wstring>;
+
+    std::function<Names()> commands = {};
+    // How the arguments of a command are typed, as in `CommandText`.
+    std::function<std::wstring(const std::wstring& command)> usage = {};
+    std::function<Names()> variables = {};
+    std::function<std::vector<Branch>(const std::wstring& folder)> files = {}; // may begin with ~
+    std::function<std::vector<Branch>(const std::wstring& key)> keys = {};
+    std::function<Names(const std::wstring& beginning)> lispSymbols = {};
+};
+
+// Names compare without regard to case, files with it. What alone fits is completed whole, with a blank after
+// it unless a path goes on there; of several, as far as they agree. A file with a blank in its name gets
+// quotes. `lispBefore`: the lines of a Lisp expression that this one goes on. Nothing when nothing fits.
+std::optional<Completion> complete(std::wstring_view line, const CompletionSources& sources,
+                                   std::wstring_view lispBefore = {});
 } // namespace tessel

@@ -10,6 +10,7 @@
 #include "host/console/TypedHistory.h"
 #include "host/messages/Questions.h"
 #include "host/platform/OrdinaryFile.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -61,6 +62,8 @@ private:
     CommandLine& mCommandLine;
 };
 
+} // namespace
+
 class FollowingLines : public Answerer
 {
 public:
@@ -73,19 +76,28 @@ public:
     {
         startLine(mCommandLine);
         mCommandLine.print(prompt);
-        const auto line = mRunner.isEnding() ? std::nullopt : nextLine(mLines);
+        const auto line = mRunner.isEnding() ? std::nullopt : next();
         mCommandLine.print(line.value_or(L"") + L"\n");
         return line;
     }
 
     bool isPerson() const override { return false; }
 
+    std::optional<std::wstring> next()
+    {
+        auto line = nextLine(mLines);
+        mTaken += line ? 1 : 0;
+        return line;
+    }
+    // How many lines have been, those of answers among them.
+    std::size_t taken() const { return mTaken; }
+
 private:
     std::istream& mLines;
     CommandLine& mCommandLine;
     const LineRunner& mRunner;
+    std::size_t mTaken = 0;
 };
-} // namespace
 
 Console::Console(CommandLine& commandLine, Questions& questions, LineRunner& runner)
     : mCommandLine(commandLine), mQuestions(questions), mRunner(runner)
@@ -103,9 +115,10 @@ void Console::converse(LineEditor& editor, TypedHistory& history)
         makeRoomForPrompt(prompt(input));
         editor.forgetInterrupts();
         mRunner.lineBegins();
-        auto outcome = editor.read(prompt(input), line);
+        auto outcome = editor.read(prompt(input), line, input.begun());
         if (outcome == LineEditor::Outcome::kLine)
         {
+            mCommandLine.noteTyped(prompt(input) + line + L"\n");
             mCommandLine.tell(history.add(line));
             if (mRunner.isLineInterrupted()) // nobody wants what they have stopped before it ran
                 outcome = LineEditor::Outcome::kInterrupted;
@@ -124,34 +137,46 @@ void Console::converse(LineEditor& editor, TypedHistory& history)
     }
 }
 
-bool Console::runLines(std::istream& lines)
+bool Console::runLines(std::istream& lines, const std::wstring& file)
 {
     FollowingLines following(lines, mCommandLine, mRunner);
     const Questions::Asked asked(mQuestions, following);
-    return runEach(lines);
+    return runEach(following, file);
 }
 
-bool Console::runEach(std::istream& lines)
+bool Console::runEach(FollowingLines& lines, const std::wstring& file)
 {
     bool allWell = true;
     InputAssembler input;
+    std::size_t begun = 1; // the line in which the input begins
     while (!mRunner.isEnding())
     {
-        const auto line = nextLine(lines);
+        begun = input.isOpen() ? begun : lines.taken() + 1;
+        const auto line = lines.next();
         if (!line)
             break;
         if (!isForPrograms(*line))
             echo(input, *line);
         if (const auto whole = input.add(*line))
-            allWell = mRunner.run(*whole) && allWell;
+            allWell = runAt(file, begun, *whole) && allWell;
     }
-    return !tellIfUnfinished(input) && allWell;
+    return tellIfUnfinished(file, begun, input) && allWell;
+}
+
+// What goes wrong is told with its place, if the lines are those of a file.
+bool Console::runAt(const std::wstring& file, std::size_t line, const std::wstring& input)
+{
+    if (file.empty())
+        return mRunner.run(input);
+    const CommandLine::Place place(mCommandLine, file + L":" + std::to_wstring(line));
+    return mRunner.run(input);
 }
 
 bool Console::runLine(std::string_view line)
 {
     std::istringstream lines{std::string(line)};
-    return runEach(lines);
+    FollowingLines nobody(lines, mCommandLine, mRunner);
+    return runEach(nobody, {});
 }
 
 Result<> Console::runScript(const std::filesystem::path& script)
@@ -161,7 +186,7 @@ Result<> Console::runScript(const std::filesystem::path& script)
         return Failure{L"The script " + toWide(script.string()) + L" cannot be read: " + text.sentence() +
                        L"."};
     std::istringstream lines(*std::move(text));
-    return runLines(lines) ? Result<>() : Failure{};
+    return runLines(lines, toWide(script.string())) ? Result<>() : Failure{};
 }
 
 const wchar_t* Console::prompt(const InputAssembler& input) const
@@ -179,8 +204,11 @@ void Console::makeRoomForPrompt(const wchar_t* prompt)
         startLine(mCommandLine);
 }
 
+// Nobody has asked for what they have written themselves.
 void Console::echo(const InputAssembler& input, const std::wstring& line)
 {
+    if (mCommandLine.isQuiet())
+        return;
     if (mCommandLine.openLine() != prompt(input))
     {
         makeRoomForPrompt(prompt(input));
@@ -189,10 +217,16 @@ void Console::echo(const InputAssembler& input, const std::wstring& line)
     mCommandLine.print(line + L"\n");
 }
 
-bool Console::tellIfUnfinished(const InputAssembler& input)
+// True when nothing is left open.
+bool Console::tellIfUnfinished(const std::wstring& file, std::size_t line, const InputAssembler& input)
 {
-    if (input.isOpen())
-        mCommandLine.say(L"The Lisp expression is not finished: the input ends inside of it.");
-    return input.isOpen();
+    if (!input.isOpen())
+        return true;
+    const Result<> unfinished =
+        Failure{translated(L"The Lisp expression is not finished: the input ends inside of it.")};
+    if (file.empty())
+        return mCommandLine.tell(unfinished);
+    const CommandLine::Place place(mCommandLine, file + L":" + std::to_wstring(line));
+    return mCommandLine.tell(unfinished);
 }
 } // namespace tessel

@@ -13,6 +13,7 @@
 
 namespace tessel
 {
+class FollowingLines;
 class LineEditor;
 class Questions;
 class TypedHistory;
@@ -33,21 +34,23 @@ public:
     void converse(LineEditor& editor, TypedHistory& history);
 
     // Runs lines as if typed; each is printed after the prompt, so that the output is a transcript. A line
-    // that fails does not keep the following ones from running. True when none failed.
-    bool runLines(std::istream& lines);
+    // that fails does not keep the following ones from running. True when none failed. `file`: whose lines
+    // they are, for what is told of them; often empty.
+    bool runLines(std::istream& lines, const std::wstring& file = {});
     // The same with a line that nobody goes on after: there is no answer to what it asks.
     bool runLine(std::string_view line);
 
-    // The same with an ordinary file of commands. Fails when it cannot be read, and without a sentence when
-    // one of its lines did: each has been told.
+    // The same with an ordinary file of commands; what goes wrong is told with file and line. Fails when it
+    // cannot be read, and without a sentence when one of its lines did: each has been told.
     Result<> runScript(const std::filesystem::path& script);
 
 private:
-    bool runEach(std::istream& lines);
+    bool runEach(FollowingLines& lines, const std::wstring& file);
+    bool runAt(const std::wstring& file, std::size_t line, const std::wstring& input);
     const wchar_t* prompt(const InputAssembler& input) const;
     void makeRoomForPrompt(const wchar_t* prompt);
     void echo(const InputAssembler& input, const std::wstring& line);
-    bool tellIfUnfinished(const InputAssembler& input);
+    bool tellIfUnfinished(const std::wstring& file, std::size_t line, const InputAssembler& input);
 
     CommandLine& mCommandLine;
     Questions& mQuestions;

@@ -21,6 +21,8 @@ public:
 
     // Whether Lisp has begun that is not complete yet.
     bool isOpen() const { return !mText.empty(); }
+    // The lines of it so far; otherwise empty.
+    const std::wstring& begun() const { return mText; }
 
     void discard();
 

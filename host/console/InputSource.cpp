@@ -20,16 +20,25 @@ InputSource InputSource::from(int input) const
     return other;
 }
 
+InputSource InputSource::wokenBy(int descriptor) const
+{
+    InputSource other = *this;
+    other.mWake = descriptor;
+    return other;
+}
+
 InputSource::Outcome InputSource::wait() const
 {
-    std::array<pollfd, 3> sources = {
-        {{mInput, POLLIN, 0}, {mInterruptKey, POLLIN, 0}, {mEndRequest, POLLIN, 0}}};
+    std::array<pollfd, 4> sources = {
+        {{mInput, POLLIN, 0}, {mInterruptKey, POLLIN, 0}, {mEndRequest, POLLIN, 0}, {mWake, POLLIN, 0}}};
     while (poll(sources.data(), sources.size(), -1) < 0)
         if (errno != EINTR)
             return Outcome::kEnd;
     if (sources[2].revents != 0)
         return Outcome::kEnd;
-    return sources[1].revents != 0 ? Outcome::kInterrupted : Outcome::kBytes;
+    if (sources[1].revents != 0)
+        return Outcome::kInterrupted;
+    return sources[3].revents != 0 ? Outcome::kWoken : Outcome::kBytes;
 }
 
 // A terminal that forgets what was typed, as it does at Ctrl-C, takes away what there was to read.

@@ -12,7 +12,8 @@ public:
     {
         kBytes,
         kInterrupted,
-        kEnd // of the input, or of the session
+        kWoken, // by what was given to `wokenBy`
+        kEnd    // of the input, or of the session
     };
 
     // Descriptors, -1 for none. `interruptKey` does not block, and can be read from when the key was pressed;
@@ -21,6 +22,9 @@ public:
 
     // The same from another descriptor than standard input, which may be one that does not block.
     InputSource from(int input) const;
+
+    // The same that comes back when this descriptor can be read from, too; -1 for none.
+    InputSource wokenBy(int descriptor) const;
 
     // Waits for bytes, and takes at most `size` of them; `count` is set for kBytes only, and not 0 then.
     Outcome read(char* bytes, std::size_t size, std::size_t& count) const;
@@ -34,5 +38,6 @@ private:
     int mInput;
     int mInterruptKey;
     int mEndRequest;
+    int mWake = -1;
 };
 } // namespace tessel

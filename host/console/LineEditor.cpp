@@ -2,13 +2,16 @@
 
 #include <cerrno>
 #include <cstdio>
+#include <optional>
 
 #include <histedit.h>
 
-#include "host/console/Completion.h"
 #include "host/console/TerminalInput.h"
+#include "host/console/TerminalSignals.h"
+#include "host/console/TerminalSize.h"
 #include "host/console/TypedHistory.h"
 #include "host/text/Credentials.h"
+#include "host/text/DisplayWidth.h"
 #include "host/text/TerminalText.h"
 #include "host/text/Unicode.h"
 
@@ -20,17 +23,20 @@ constexpr wchar_t kCompletionFunction[] = L"tessel-complete";
 
 void showCandidates(const std::vector<std::wstring>& candidates)
 {
-    std::fputc('\n', stdout);
+    std::wstring all;
     for (const auto& candidate : candidates)
-        std::fprintf(stdout, "%s  ", toUtf8(forTerminal(candidate)).c_str());
+        all += (all.empty() ? L"" : L"  ") + forTerminal(candidate);
+    const auto screen = terminalSize(STDOUT_FILENO);
     std::fputc('\n', stdout);
+    for (const auto& line : wrapped(all, screen ? screen->columns : all.size()))
+        std::fprintf(stdout, "%s\n", toUtf8(line).c_str());
     std::fflush(stdout);
 }
 } // namespace
 
 struct LineEditor::Terminal
 {
-    Terminal(const std::vector<std::wstring>& earlier, Names names, InputSource source);
+    Terminal(const std::vector<std::wstring>& earlier, CompletionSources given, InputSource source);
     ~Terminal();
     Terminal(const Terminal&) = delete;
     Terminal& operator=(const Terminal&) = delete;
@@ -44,21 +50,25 @@ struct LineEditor::Terminal
     static wchar_t* prompt(EditLine* editor) { return of(editor).promptText.data(); }
     static unsigned char complete(EditLine* editor, int);
     static int readCharacter(EditLine* editor, wchar_t* character);
+    void obeySignals();
 
     void remember(const wchar_t* line);
     Outcome read(const std::wstring& prompt, std::wstring& line);
 
     bool readsCommand = true;
-    Names commandNames;
+    CompletionSources sources;
+    std::wstring lispBefore;
     TerminalInput input;
+    std::optional<TerminalSignals> signals; // while a line is read
     std::wstring promptText;
     EditLine* editLine;
     HistoryW* history;
     HistEventW event{};
 };
 
-LineEditor::Terminal::Terminal(const std::vector<std::wstring>& earlier, Names names, InputSource source)
-    : commandNames(std::move(names)), input(source), editLine(el_init("Tessel", stdin, stdout, stderr)),
+LineEditor::Terminal::Terminal(const std::vector<std::wstring>& earlier, CompletionSources given,
+                               InputSource source)
+    : sources(std::move(given)), input(source), editLine(el_init("Tessel", stdin, stdout, stderr)),
       history(history_winit())
 {
     history_w(history, &event, H_SETSIZE, static_cast<int>(kMostHistoryLines));
@@ -70,7 +80,7 @@ LineEditor::Terminal::Terminal(const std::vector<std::wstring>& earlier, Names n
     el_wset(editLine, EL_HIST, history_w, history);
     el_wset(editLine, EL_GETCFN, &Terminal::readCharacter);
     el_wset(editLine, EL_EDITOR, L"emacs");
-    el_wset(editLine, EL_ADDFN, kCompletionFunction, L"Complete the name of a command", &Terminal::complete);
+    el_wset(editLine, EL_ADDFN, kCompletionFunction, L"Complete what is typed", &Terminal::complete);
     el_wset(editLine, EL_BIND, L"^I", kCompletionFunction, nullptr);
 }
 
@@ -86,26 +96,52 @@ unsigned char LineEditor::Terminal::complete(EditLine* editor, int)
         return CC_REFRESH_BEEP;
     const LineInfoW* line = el_wline(editor);
     const std::wstring typed(line->buffer, line->cursor);
-    const auto completion = completeCommand(typed, of(editor).commandNames());
+    const auto completion = tessel::complete(typed, of(editor).sources, of(editor).lispBefore);
     if (!completion)
         return CC_REFRESH_BEEP;
-    if (!completion->candidates.empty() && completion->text.size() == typed.size())
+    if (!completion->candidates.empty() && completion->text.size() == completion->replaced)
     {
         showCandidates(completion->candidates);
         return CC_REDISPLAY;
     }
-    el_wdeletestr(editor, static_cast<int>(typed.size()));
+    el_wdeletestr(editor, static_cast<int>(completion->replaced));
     el_winsertstr(editor, completion->text.c_str());
     return CC_REFRESH;
+}
+
+// Whoever uses the terminal meanwhile finds it as usual, and leaves it as they like; the prompt comes back
+// with what was typed.
+void LineEditor::Terminal::obeySignals()
+{
+    const auto came = signals->take();
+    if (came.stop)
+    {
+        el_wset(editLine, EL_PREP_TERM, 0);
+        std::fputc('\n', stdout);
+        std::fflush(stdout);
+        signals->stop();
+        static_cast<void>(signals->take()); // that it goes on
+    }
+    if (came.resize)
+        el_resize(editLine);
+    if (came.stop || came.resume)
+        el_wset(editLine, EL_PREP_TERM, 1);
+    std::fputc('\r', stdout); // over what may still stand there
+    std::fflush(stdout);
+    el_wset(editLine, EL_REFRESH);
 }
 
 // The editor's own reading would miss a Ctrl-C that comes between the prompt and the waiting.
 int LineEditor::Terminal::readCharacter(EditLine* editor, wchar_t* character)
 {
-    switch (of(editor).input.read(*character))
+    TerminalInput::Outcome outcome{};
+    while ((outcome = of(editor).input.read(*character)) == TerminalInput::Outcome::kWoken)
+        of(editor).obeySignals();
+    switch (outcome)
     {
     case TerminalInput::Outcome::kCharacter:
         return 1;
+    case TerminalInput::Outcome::kWoken:
     case TerminalInput::Outcome::kInterrupted:
         errno = EINTR;
         return -1;
@@ -122,16 +158,19 @@ void LineEditor::Terminal::remember(const wchar_t* line)
         history_w(history, &event, H_ENTER, kept.c_str());
 }
 
-LineEditor::LineEditor(const std::vector<std::wstring>& earlier, Names names, InputSource source)
-    : mTerminal(std::make_unique<Terminal>(earlier, std::move(names), source))
+LineEditor::LineEditor(const std::vector<std::wstring>& earlier, CompletionSources sources,
+                       InputSource source)
+    : mTerminal(std::make_unique<Terminal>(earlier, std::move(sources), source))
 {
 }
 
 LineEditor::~LineEditor() = default;
 
-LineEditor::Outcome LineEditor::read(const std::wstring& prompt, std::wstring& line)
+LineEditor::Outcome LineEditor::read(const std::wstring& prompt, std::wstring& line,
+                                     const std::wstring& lispBefore)
 {
     mTerminal->readsCommand = true;
+    mTerminal->lispBefore = lispBefore;
     const Outcome outcome = mTerminal->read(prompt, line);
     if (outcome == Outcome::kLine)
         mTerminal->remember((line + L"\n").c_str());
@@ -152,10 +191,15 @@ LineEditor::Outcome LineEditor::Terminal::read(const std::wstring& prompt, std::
     // lost.
     el_wset(editLine, EL_PREP_TERM, 1);
     int length = 0;
+    signals.emplace();
+    input.wakeBy(signals->wakeUp());
     errno = 0;
     const wchar_t* typed = el_wgets(editLine, &length);
+    const int error = errno;
+    input.wakeBy(-1);
+    signals.reset();
     if (!typed || length <= 0)
-        return errno == EINTR ? Outcome::kInterrupted : Outcome::kEnd;
+        return error == EINTR ? Outcome::kInterrupted : Outcome::kEnd;
     line.assign(typed, static_cast<std::size_t>(length));
     while (!line.empty() && (line.back() == L'\n' || line.back() == L'\r'))
         line.pop_back();

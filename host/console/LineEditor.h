@@ -1,11 +1,11 @@
 // A line typed at a terminal: editing, history and completion by libedit.
 #pragma once
 
-#include <functional>
 #include <memory>
 #include <string>
 #include <vector>
 
+#include "host/console/Completion.h"
 #include "host/console/InputSource.h"
 
 namespace tessel
@@ -13,11 +13,9 @@ namespace tessel
 class LineEditor
 {
 public:
-    using Names = std::function<std::vector<std::wstring>()>;
-
     // Reads standard input and writes standard output. `earlier`: lines that the arrow keys bring back, the
-    // oldest first. `names`: what the Tab key completes.
-    LineEditor(const std::vector<std::wstring>& earlier, Names names, InputSource source);
+    // oldest first. `sources`: of what the Tab key completes.
+    LineEditor(const std::vector<std::wstring>& earlier, CompletionSources sources, InputSource source);
     ~LineEditor();
     LineEditor(const LineEditor&) = delete;
     LineEditor& operator=(const LineEditor&) = delete;
@@ -32,8 +30,9 @@ public:
     // Forgets what of Ctrl-C was pressed before now.
     void forgetInterrupts() const;
 
-    // Waits for a line; `line` is set for kLine only, without its line break.
-    Outcome read(const std::wstring& prompt, std::wstring& line);
+    // Waits for a line; `line` is set for kLine only, without its line break. `lispBefore`: the lines of a
+    // Lisp expression that it goes on.
+    Outcome read(const std::wstring& prompt, std::wstring& line, const std::wstring& lispBefore = {});
     // The same for a line that is no command: nothing is completed, and the arrow keys do not bring it back.
     Outcome readAnswer(const std::wstring& prompt, std::wstring& line);
 

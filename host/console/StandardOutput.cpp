@@ -14,18 +14,18 @@ namespace tessel
 namespace
 {
 // Another program may have set the terminal, which they share, so that it does not wait.
-bool canGoOn(int error)
+bool canGoOn(int descriptor, int error)
 {
-    pollfd output{STDOUT_FILENO, POLLOUT, 0};
+    pollfd output{descriptor, POLLOUT, 0};
     return error == EINTR || (error == EAGAIN && (poll(&output, 1, -1) > 0 || errno == EINTR));
 }
 
-Result<> writeAll(std::string_view text)
+Result<> writeAll(int descriptor, std::string_view text)
 {
     while (!text.empty())
     {
-        const ssize_t count = ::write(STDOUT_FILENO, text.data(), text.size());
-        if (count < 0 && !canGoOn(errno))
+        const ssize_t count = ::write(descriptor, text.data(), text.size());
+        if (count < 0 && !canGoOn(descriptor, errno))
             return systemFailure(errno);
         text.remove_prefix(count > 0 ? static_cast<std::size_t>(count) : 0);
     }
@@ -36,7 +36,7 @@ Result<> writeAll(std::string_view text)
 void StandardOutput::write(std::string_view text)
 {
     std::fflush(stdout); // what an application has printed by itself comes before it
-    auto written = writeAll(text);
+    auto written = writeAll(mDescriptor, text);
     if (mWritten)
         mWritten = std::move(written);
 }

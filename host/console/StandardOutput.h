@@ -1,4 +1,4 @@
-// The program's standard output, and whether all of it has arrived.
+// The program's standard output, or where its errors go, and whether all of it has arrived.
 #pragma once
 
 #include <string_view>
@@ -10,6 +10,8 @@ namespace tessel
 class StandardOutput
 {
 public:
+    explicit StandardOutput(int descriptor) : mDescriptor(descriptor) {}
+
     // Waits until the text is written, whatever signals come meanwhile. After a failure the next text is
     // tried again: a full disk may have room again.
     void write(std::string_view text);
@@ -18,6 +20,7 @@ public:
     const Result<>& written() const { return mWritten; }
 
 private:
+    int mDescriptor;
     Result<> mWritten;
 };
 } // namespace tessel

@@ -28,6 +28,8 @@ TerminalInput::Outcome outcomeOf(InputSource::Outcome outcome)
         return TerminalInput::Outcome::kCharacter;
     case InputSource::Outcome::kInterrupted:
         return TerminalInput::Outcome::kInterrupted;
+    case InputSource::Outcome::kWoken:
+        return TerminalInput::Outcome::kWoken;
     case InputSource::Outcome::kEnd:
         break;
     }

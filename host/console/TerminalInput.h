@@ -13,10 +13,14 @@ public:
     {
         kCharacter,
         kInterrupted,
-        kEnd // of the input, or of the session
+        kWoken, // by a signal that is noted
+        kEnd    // of the input, or of the session
     };
 
     explicit TerminalInput(const InputSource& source);
+
+    // From now on waiting ends when that descriptor can be read from, too; -1: no longer.
+    void wakeBy(int descriptor) { mSource = mSource.wokenBy(descriptor); }
 
     // Waits for a character in the encoding of the locale; what is no character becomes U+FFFD.
     Outcome read(wchar_t& character);

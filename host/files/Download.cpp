@@ -2,6 +2,7 @@
 
 #include <curl/curl.h>
 
+#include <chrono>
 #include <cstdlib>
 #include <memory>
 
@@ -19,18 +20,24 @@ namespace
 {
 constexpr const char* kProtocols = "http,https"; // for redirections too: a server must not name local files
 constexpr long kMostRedirections = 5;
-constexpr long kWholeFile = 200; // of the other answers none brings the file that was asked for
+constexpr std::chrono::seconds kPatience{2}; // without a word
+constexpr long kWholeFile = 200;             // of the other answers none brings the file that was asked for
 
 struct Sink
 {
-    Sink(PartFile& part, std::uint64_t most, const Interruption& interruption)
-        : file(part), limit(most), interrupted(interruption)
+    using Clock = std::chrono::steady_clock;
+
+    Sink(PartFile& part, std::uint64_t most, const Interruption& interruption,
+         const std::function<void(std::uint64_t)>& tellBytes)
+        : file(part), limit(most), interrupted(interruption), tell(tellBytes)
     {
     }
 
     PartFile& file;
     std::uint64_t limit;
     Interruption::Wish interrupted;
+    const std::function<void(std::uint64_t)>& tell;
+    Clock::time_point told = Clock::now();
     Sha256 sha256{};
     std::uint64_t received = 0;
     bool written = true;
@@ -58,6 +65,11 @@ int onProgress(void* context, curl_off_t, curl_off_t, curl_off_t, curl_off_t)
 {
     auto& sink = *static_cast<Sink*>(context);
     sink.stopped = sink.interrupted.isThere();
+    if (const auto now = Sink::Clock::now(); now - sink.told >= kPatience)
+    {
+        sink.told = now;
+        sink.tell(sink.received);
+    }
     return sink.stopped ? 1 : 0;
 }
 
@@ -144,13 +156,13 @@ Result<> outcomeOf(CURLcode status, const Sink& sink, const char* words)
 } // namespace
 
 Result<std::string> download(const RemoteAddress& address, PartFile& file, const RemoteFiles::Limits& limits,
-                             Interruption& interruption)
+                             Interruption& interruption, const std::function<void(std::uint64_t)>& tell)
 {
     const Transfer transfer(curl_easy_init());
     if (!transfer)
         return Failure{translated(L"the network library cannot be started")};
     char words[CURL_ERROR_SIZE] = "";
-    Sink sink(file, limits.bytes, interruption);
+    Sink sink(file, limits.bytes, interruption, tell);
     sink.transfer = transfer.get();
     configureAddress(transfer.get(), address);
     configureTrust(transfer.get());

@@ -112,8 +112,9 @@ Result<> store(PartFile& part, const std::filesystem::path& copy, const std::str
 }
 } // namespace
 
-RemoteFiles::RemoteFiles(std::filesystem::path cacheFolder, Limits limits, Interruption& interruption)
-    : mCacheFolder(std::move(cacheFolder)), mLimits(limits), mInterruption(interruption)
+RemoteFiles::RemoteFiles(std::filesystem::path cacheFolder, Limits limits, Interruption& interruption,
+                         Say say)
+    : mCacheFolder(std::move(cacheFolder)), mLimits(limits), mInterruption(interruption), mSay(std::move(say))
 {
     PartFile::clearLeftOvers(mCacheFolder);
 }
@@ -165,7 +166,14 @@ Result<> RemoteFiles::fetchInto(const std::filesystem::path& copy, const RemoteA
     PartFile part(mCacheFolder);
     if (!part.made())
         return about(kNoCopy, copy, part.made());
-    const auto sha256 = download(address, part, mLimits, mInterruption);
+    const auto tell = [&](std::uint64_t bytes)
+    {
+        constexpr std::uint64_t kThousand = 1024;
+        if (mSay)
+            mSay(translated(L"Of {} {} kB have come so far. Ctrl-C stops it.", toWide(address.url),
+                            bytes / kThousand));
+    };
+    const auto sha256 = download(address, part, mLimits, mInterruption, tell);
     if (!sha256)
         return sha256.failure();
     if (const auto checked = checkContent(*sha256, address); !checked)

@@ -6,6 +6,7 @@
 #include <chrono>
 #include <cstdint>
 #include <filesystem>
+#include <functional>
 #include <string>
 
 #include "host/text/Result.h"
@@ -18,6 +19,8 @@ struct RemoteAddress;
 class RemoteFiles : public CProxyInet
 {
 public:
+    using Say = std::function<void(const std::wstring& sentence)>;
+
     struct Limits
     {
         std::uint64_t bytes = 64u << 20;
@@ -32,7 +35,8 @@ public:
     };
 
     // The cache folder is made with the first copy; what a killed download has left in it goes now.
-    RemoteFiles(std::filesystem::path cacheFolder, Limits limits, Interruption& interruption);
+    // `say` tells a person who waits how far a download has come.
+    RemoteFiles(std::filesystem::path cacheFolder, Limits limits, Interruption& interruption, Say say = {});
 
     // Makes a local copy, or, unless `ignoreCache`, takes an earlier one that nobody else could have written.
     // The address may carry a name and a password, which are sent to its server, and neither stored nor told:
@@ -52,5 +56,6 @@ private:
     std::filesystem::path mCacheFolder;
     Limits mLimits;
     Interruption& mInterruption;
+    Say mSay;
 };
 } // namespace tessel

@@ -1,5 +1,6 @@
 #include "host/lisp/LispInterpreter.h"
 
+#include <sstream>
 #include <utility>
 
 #include "host/applications/Admission.h"
@@ -136,6 +137,17 @@ Result<TsResultBuffer*> LispInterpreter::invoke(const TsResultBuffer* call)
 {
     const auto machine = this->machine();
     return machine ? (*machine)->call(call) : machine.failure();
+}
+
+std::vector<std::wstring> LispInterpreter::symbolsBeginning(std::wstring_view beginning)
+{
+    std::vector<std::wstring> symbols;
+    const auto machine = this->machine();
+    const auto found = machine ? (*machine)->symbolsBeginning(beginning) : machine.failure();
+    std::wistringstream lines(found ? *found : L"");
+    for (std::wstring line; std::getline(lines, line);)
+        symbols.push_back(line);
+    return symbols;
 }
 
 void LispInterpreter::interrupt() noexcept

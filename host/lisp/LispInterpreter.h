@@ -7,6 +7,7 @@
 #include <memory>
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "host/commands/Interruption.h"
 #include "host/commands/RunningMarker.h"
@@ -70,6 +71,10 @@ public:
     // of these is the string that Lisp would print. The values are the caller's to free, null for nil. What
     // is said of a failure is one line of error text.
     Result<TsResultBuffer*> invoke(const TsResultBuffer* call);
+
+    // The symbols that can be typed in the user's package and name something, in small letters; sorted. None
+    // when Lisp fails.
+    std::vector<std::wstring> symbolsBeginning(std::wstring_view beginning);
 
     // Stops the evaluation that runs; without one, nothing. Safe in a signal handler and on any thread.
     void interrupt() noexcept;

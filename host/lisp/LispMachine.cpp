@@ -212,6 +212,11 @@ Result<std::wstring> LispMachine::evaluate(std::wstring_view forms, const Interr
     return mSession->runForText({.function = lispFunctions().evaluate, .text = forms, .wish = wish});
 }
 
+Result<std::wstring> LispMachine::symbolsBeginning(std::wstring_view beginning)
+{
+    return mSession->runForText({.function = lispFunctions().symbolsBeginning, .text = beginning});
+}
+
 Result<std::wstring> LispMachine::compile(const std::wstring& name, std::wstring_view text)
 {
     return mSession->runForText({.function = lispFunctions().compileText, .text = text, .name = name});

@@ -67,6 +67,9 @@ public:
     // for nil.
     Result<TsResultBuffer*> call(const TsResultBuffer* call);
 
+    // The symbols of the user's package that begin so and name something, a line each.
+    Result<std::wstring> symbolsBeginning(std::wstring_view beginning);
+
     // Byte code of a source text, to be packed; `name` is what errors call the text.
     Result<std::wstring> compile(const std::wstring& name, std::wstring_view text);
 

@@ -106,9 +106,10 @@ Result<LispFunctions> boot()
     cl_object fault = startPrelude(toWide(lispPrelude()));
     if (fault != ECL_NIL)
         return Failure{translated(L"Lisp did not start: {}", fromLisp(fault))};
-    return LispFunctions{functionNamed("BEGIN-SESSION"), functionNamed("EVALUATE"),
-                         functionNamed("INVOKE"),        functionNamed("COMPILE-TEXT"),
-                         functionNamed("INTERRUPTED"),   functionNamed("MAKE-USER-SYMBOL")};
+    return LispFunctions{functionNamed("BEGIN-SESSION"),   functionNamed("EVALUATE"),
+                         functionNamed("INVOKE"),          functionNamed("SYMBOLS-BEGINNING"),
+                         functionNamed("COMPILE-TEXT"),    functionNamed("INTERRUPTED"),
+                         functionNamed("MAKE-USER-SYMBOL")};
 }
 
 // The garbage collector knows the thread and the function by other ways.

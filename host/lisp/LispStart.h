@@ -20,6 +20,7 @@ struct LispFunctions
     cl_object beginSession;
     cl_object evaluate;
     cl_object invoke;
+    cl_object symbolsBeginning;
     cl_object compileText;
     cl_object interrupted;
     cl_object makeSymbol;

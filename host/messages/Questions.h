@@ -68,6 +68,9 @@ public:
     // Takes an answer, or tells in a sentence why it does not fit.
     using Taker = std::function<Result<>(const std::wstring& answer)>;
 
+    // Whether there is a person who would be asked.
+    bool asksPerson() const { return !mAnswerers.empty() && mAnswerers.back()->isPerson(); }
+
     // Whether the question was answered.
     bool ask(const Question& question, const Taker& take);
 

@@ -91,7 +91,7 @@ protected:
     std::map<std::string, HttpServer::Answer> answers = {
         {"/tool.lsp", {httpAnswer("200 OK", kTool), "", {}}},
         {"/endless.lsp",
-         {"HTTP/1.1 200 OK\r\nContent-Length: 1000\r\n\r\n(begun", "", HttpServer::Then::kStall}}};
+         {"HTTP/1.1 200 OK\r\nContent-Length: 10000\r\n\r\n(begun", "", HttpServer::Then::kStall}}};
     HttpServer server{[this](const std::string& target)
                       {
                           return answers.contains(target)
@@ -135,6 +135,18 @@ TEST_F(Addresses, LeaveFilesThatOnlyThePersonCanRead)
     EXPECT_EQ(paths.size(), 3u) << "its folder, the copy and the note of where it came from";
     for (const fs::path& path : paths)
         EXPECT_EQ(fs::status(path).permissions() & fs::perms(0077), fs::perms::none) << path;
+}
+
+TEST_F(LongDownload, TellsHowFarItHasCome)
+{
+    answers["/endless.lsp"].bytes += std::string(5 << 10, ' ');
+    HostTerminal terminal(session);
+    begin(terminal);
+    const std::string words = "\nOf " + url("/endless.lsp") + " 5 kB have come so far. Ctrl-C stops it.\r\n";
+    EXPECT_TRUE(terminal.showsWithin(words, std::chrono::seconds(10))) << terminal.screen();
+    EXPECT_TRUE(terminal.showsWithin(words, std::chrono::seconds(10))) << "again and again";
+    terminal.type(kControlC);
+    EXPECT_TRUE(terminal.shows(" could not be fetched: it was interrupted.")) << terminal.screen();
 }
 
 TEST_F(LongDownload, IsStoppedByControlC)

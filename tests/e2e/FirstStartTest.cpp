@@ -35,8 +35,9 @@ TEST(FirstStart, KnowsTheCommandWhichSaysThatThereIsNoDisplay)
     const HostSession session;
     const auto result = session.run({"HELP MODRIG", "modrig"});
     EXPECT_EQ(result.exitStatus, 0);
-    EXPECT_EQ(result.output, kBanner + std::string("Command: HELP MODRIG\n  MODRIG") + std::string(44, ' ') +
-                                 "Loads and unloads applications, in a dialog\nCommand: modrig\n"
+    EXPECT_EQ(result.output, kBanner + std::string("Command: HELP MODRIG\n") +
+                                 "MODRIG: Loads and unloads applications, in a dialog\nUsage: MODRIG\n"
+                                 "Command: modrig\n"
                                  "Tessel cannot open a window: there is no display.\n");
 }
 

@@ -105,6 +105,8 @@ HostSession::HostSession()
     set("HOME", (mFolder / "home").string());
     set("TERM", "xterm");
     set("LC_ALL", "C.UTF-8");
+    set("NO_COLOR", "1");
+    set("PAGER", "");
     set("XDG_DATA_HOME", "");
     set("DISPLAY", "");
     set("WAYLAND_DISPLAY", "");

@@ -5,6 +5,7 @@
 
 #include <poll.h>
 #include <pty.h>
+#include <sys/ioctl.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -14,16 +15,20 @@ namespace
 {
 using Clock = std::chrono::steady_clock;
 
-constexpr winsize kWindow{24, 200, 0, 0}; // wide: nothing a test looks for is broken over two lines
+winsize windowOf(HostTerminal::Size size)
+{
+    return {size.rows, size.columns, 0, 0};
+}
 } // namespace
 
-HostTerminal::HostTerminal(const HostSession& session, const std::vector<std::string>& arguments)
+HostTerminal::HostTerminal(const HostSession& session, const std::vector<std::string>& arguments, Size size)
 {
+    const winsize window = windowOf(size);
     auto commandLine = session.commandLine(arguments);
     auto environment = session.environment();
     const auto argumentPointers = pointersTo(commandLine);
     const auto environmentPointers = pointersTo(environment);
-    mProcess = forkpty(&mTerminal, nullptr, nullptr, &kWindow);
+    mProcess = forkpty(&mTerminal, nullptr, nullptr, &window);
     if (mProcess < 0)
         throw std::runtime_error("no terminal");
     if (mProcess == 0)
@@ -47,6 +52,13 @@ void HostTerminal::type(std::string_view keys) const
 {
     if (write(mTerminal, keys.data(), keys.size()) != static_cast<ssize_t>(keys.size()))
         throw std::runtime_error("the terminal takes no keys");
+}
+
+void HostTerminal::resize(Size size) const
+{
+    const winsize window = windowOf(size);
+    if (ioctl(mTerminal, TIOCSWINSZ, &window) != 0)
+        throw std::runtime_error("the terminal keeps its size");
 }
 
 bool HostTerminal::readMore(Clock::time_point deadline)

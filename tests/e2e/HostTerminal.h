@@ -14,14 +14,25 @@
 class HostTerminal
 {
 public:
-    // Starts the host of the session with these arguments on a terminal of its own.
-    explicit HostTerminal(const HostSession& session, const std::vector<std::string>& arguments = {});
+    struct Size
+    {
+        unsigned short columns;
+        unsigned short rows;
+    };
+
+    // Starts the host of the session with these arguments on a terminal of its own. It is wide, unless told
+    // otherwise: nothing a test looks for is broken over two lines.
+    explicit HostTerminal(const HostSession& session, const std::vector<std::string>& arguments = {},
+                          Size size = {200, 24});
     ~HostTerminal(); // kills a host that still runs
     HostTerminal(const HostTerminal&) = delete;
     HostTerminal& operator=(const HostTerminal&) = delete;
 
     // Keys as the terminal sends them: "\t" completes, "\r" is Return, kControlC and kControlD.
     void type(std::string_view keys) const;
+
+    // As if the window were drawn larger or smaller.
+    void resize(Size size) const;
 
     // Waits until the text appears after what was waited for before. False when the time is over.
     bool shows(std::string_view text) { return showsWithin(text, kHostTimeLimit); }

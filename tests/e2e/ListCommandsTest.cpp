@@ -210,8 +210,8 @@ TEST_F(ListCommands, AddToAListOfManyEntries)
 
 TEST_F(ListCommands, TellWhenTheyAreTypedWrongly)
 {
-    const std::string usage =
-        "Usage: SUITE LIST | ADD file... | REMOVE file... | MOVE file place | CLEAR [--json]\n";
+    const std::string usage = "Usage: SUITE LIST\n       SUITE ADD file...\n       SUITE REMOVE file...\n"
+                              "       SUITE MOVE file place\n       SUITE CLEAR [--json]\n";
     const std::vector<std::string> wrong = {
         "SUITE",        "SUITE GROW",      "SUITE LIST " + first, "SUITE ADD",
         "SUITE REMOVE", "SUITE CLEAR all", "SUITE MOVE " + first};

@@ -63,7 +63,7 @@ TEST_F(Listings, OfCommandsKnowThoseThatAreNotLoadedYet)
         return json();
     };
     EXPECT_EQ(named("REGISTRY")["group"], "Settings");
-    EXPECT_THAT(std::string(named("REGISTRY")["usage"]), HasSubstr("LIST|GET|SET|DELETE"));
+    EXPECT_THAT(std::string(named("REGISTRY")["usage"]), HasSubstr("LIST [key] [--json] | GET key"));
     EXPECT_EQ(named("SUITE")["summary"],
               "Shows and changes the Startup Suite, what Modrig loads at each start");
     EXPECT_EQ(named("NOTHING"), json());

@@ -138,5 +138,5 @@ TEST_F(RegistryTransfer, IsToldItsUsageWhenSomethingIsMissing)
 {
     for (const std::string command :
          {"REGISTRY EXPORT My", "REGISTRY EXPORT My x.reg UTF32", "REGISTRY IMPORT"})
-        expectRefused(command, "EXPORT key file [UTF8] | IMPORT file");
+        expectRefused(command, "EXPORT key file [UTF8]\n       REGISTRY IMPORT file");
 }

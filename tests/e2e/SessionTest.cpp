@@ -44,19 +44,77 @@ TEST(Session, ListsItsCommandsByGroup)
     const auto result = session.run({"HELP", "help load"});
     EXPECT_EQ(result.exitStatus, 0);
     for (const char* name : {"HELP", "QUIT", "EXIT", "SETVAR", "LOAD", "UNLOAD", "APPS", "REGISTRY",
-                             "PROFILE", "VERSION", "CD", "SCRIPT"})
+                             "PROFILE", "VERSION", "CD", "SCRIPT", "?", "DISABLE", "ENABLE", "BISECT"})
         EXPECT_THAT(result.output, HasSubstr(std::string("\n  ") + name)) << name;
     EXPECT_THAT(result.output, HasSubstr(std::string("Command: HELP\n") + kVersionLine));
-    EXPECT_THAT(result.output, HasSubstr("Session\n  HELP [name]"));
-    EXPECT_THAT(result.output, HasSubstr("Command: help load\n  LOAD"));
+    EXPECT_THAT(result.output, HasSubstr("Session\n  HELP         Lists the commands, or tells how"));
+    EXPECT_THAT(result.output,
+                HasSubstr("\nHELP and a name, such as HELP LOAD, tells how a command is typed.\n"
+                          "Command: help load\nLOAD: Loads"));
 }
 
-TEST(Session, PartsALongUsageFromItsSummary)
+TEST(Session, TellsOfACommandHowItIsTypedWithAnExample)
 {
     const HostSession session;
-    EXPECT_THAT(
-        session.run({"HELP REGISTRY"}).output,
-        HasSubstr(" | RESTORE | RESET\n" + std::string(52, ' ') + "Shows and changes what is stored"));
+    EXPECT_THAT(session.run({"HELP disable"}).output,
+                EndsWith("Command: HELP disable\n"
+                         "DISABLE: Keeps an application out at starts; it stays in every list\n"
+                         "Usage: DISABLE file\nExample: DISABLE moon.bundle\n"));
+    EXPECT_THAT(session.run({"HELP CD"}).output, EndsWith("\nExample: CD \"~/My drawings\"\n"));
+    EXPECT_THAT(session.run({"HELP VERSION"}).output,
+                EndsWith("VERSION: Shows the version\nUsage: VERSION\n"));
+}
+
+TEST(Session, ListsEachWayOfTypingACommandOnALine)
+{
+    const HostSession session;
+    const std::string ways = "Usage: REGISTRY LIST [key] [--json]\n"
+                             "       REGISTRY GET key [name] [--json]\n"
+                             "       REGISTRY SET key [name data]\n"
+                             "       REGISTRY DELETE key [name]\n"
+                             "       REGISTRY EXPORT key file [UTF8]\n"
+                             "       REGISTRY IMPORT file\n"
+                             "       REGISTRY RESTORE\n"
+                             "       REGISTRY RESET\n";
+    EXPECT_THAT(session.run({"HELP REGISTRY"}).output, HasSubstr("damaged registry\n" + ways + "Example: "));
+    EXPECT_THAT(session.run({"REGISTRY MEND"}).output, EndsWith("Command: REGISTRY MEND\n" + ways));
+}
+
+TEST(Session, TakesAQuestionMarkForHelp)
+{
+    const HostSession session;
+    const auto result = session.run({"? unload", "?"});
+    EXPECT_EQ(result.exitStatus, 0);
+    EXPECT_THAT(result.output, HasSubstr("Command: ? unload\nUNLOAD: Unloads a compiled module\n"));
+    EXPECT_THAT(result.output, HasSubstr(std::string("Command: ?\n") + kVersionLine + "Session\n  HELP "));
+    EXPECT_EQ(session.run({"? nothing"}).exitStatus, 1);
+}
+
+TEST(Session, TellsOfACommandThatIsLoadedWhenItIsTyped)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"});
+    const std::string key = R"(REGISTRY SET Software\Tessel\R21\Applications\Later)";
+    const auto result =
+        session.run({key + " Module /opt/later.zmb", key + " LoadReasons 4", key + R"(\Commands LATER LATER)",
+                     key + R"(\Commands MODRIG MODRIG)", "HELP later", "HELP modrig"});
+    EXPECT_EQ(result.exitStatus, 0);
+    EXPECT_THAT(result.output, HasSubstr("Command: HELP later\nThe application /opt/later.zmb is loaded when "
+                                         "LATER is typed, and HELP tells more about it then.\n"));
+    EXPECT_THAT(result.output, EndsWith("Command: HELP modrig\nMODRIG: Loads and unloads applications, in a "
+                                        "dialog\nUsage: MODRIG\n"));
+}
+
+TEST(Session, AnswersAMistypedCommandWithTheNearestOne)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"});
+    const auto result = session.run({"laod x.lsp", "HELP registy", "HELP HLEP"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output, HasSubstr("\nUnknown command \"laod\". Did you mean LOAD? Type HELP for the "
+                                         "list of commands.\n"));
+    EXPECT_THAT(result.output, HasSubstr("\nThere is no help on \"registy\". Did you mean REGISTRY?\n"));
+    EXPECT_THAT(result.output, EndsWith("\nThere is no help on \"HLEP\". Did you mean HELP?\n"));
 }
 
 TEST(Session, LoadsFromHttpAndHttpsAddressesOnly)
@@ -67,6 +125,50 @@ TEST(Session, LoadsFromHttpAndHttpsAddressesOnly)
     EXPECT_THAT(result.output, HasSubstr("a.lsp\nThe address ftp://nowhere.invalid/a.lsp cannot be loaded: "
                                          "only http and https addresses can be fetched.\n"));
     EXPECT_THAT(result.output, HasSubstr("Cannot load \"")) << "what is no address is a file";
+}
+
+TEST(Session, SaysToQuoteANameWithBlanks)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"});
+    const auto result = session.run(
+        {"LOAD my lisp/one two.lsp", "CD a b", "SCRIPT a b", "UNLOAD a b", "DISABLE a b", "ENABLE a b"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output,
+                HasSubstr("\nUsage: LOAD file\n       LOAD address\nA name with blanks in it is "
+                          "typed in quotes: LOAD \"my lisp/one two.lsp\"\n"));
+    for (const std::string command : {"CD", "SCRIPT", "UNLOAD", "DISABLE", "ENABLE"})
+        EXPECT_THAT(result.output, HasSubstr(" is typed in quotes: " + command + " \"a b\"\n"));
+    EXPECT_THAT(session.run({"LOAD"}).output,
+                EndsWith("Command: LOAD\nUsage: LOAD file\n       LOAD address\n"));
+}
+
+TEST(Session, FindsHomeFoldersByATilde)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"});
+    const std::string home = (session.folder() / "home").string();
+    const std::string lisp = session.folder().write("home/my lisp/one.lsp", "(princ \"one\")\n").string();
+    session.folder().write("home/two.scr", "VERSION\n");
+    const auto result = session.run({"LOAD \"~/my lisp/one.lsp\"", "CD ~", "SCRIPT ~/two.scr",
+                                     "REGISTRY EXPORT Software ~/all.reg UTF8", "REGISTRY IMPORT ~/all.reg",
+                                     "CD ~root", "CD ~nobody-at-all/x", "DISABLE \"~/my lisp/one.lsp\""});
+    EXPECT_THAT(result.output, HasSubstr("one\n" + lisp + " is loaded.\nCommand: CD ~\n" + home + "\n"));
+    EXPECT_THAT(result.output, HasSubstr(std::string("Command: VERSION\n") + kVersionLine));
+    EXPECT_THAT(result.output, HasSubstr("Command: CD ~root\n/root\n"));
+    EXPECT_THAT(result.output, HasSubstr("The folder ~nobody-at-all/x cannot be entered: No such file"));
+    EXPECT_THAT(result.output, HasSubstr(lisp + " is kept out at starts from now on"));
+    EXPECT_TRUE(std::filesystem::exists(session.folder() / "home/all.reg"));
+    EXPECT_EQ(result.exitStatus, 1) << "nobody has that home";
+}
+
+TEST(Session, TakesATildeForWhatItIsWhereAFileIsCalledSo)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"});
+    session.folder().write("~/one.lsp", "(princ \"literal\")\n");
+    const auto result = session.run({"CD " + session.folder().path().string(), "LOAD ~/one.lsp"});
+    EXPECT_THAT(result.output, HasSubstr("\nliteral\n"));
 }
 
 TEST(Session, ShowsTheHelpBookWithoutABrowser)

@@ -69,8 +69,8 @@ TEST_F(StartupSuite, HasEffectsThatTheUserSees)
     EXPECT_EQ(result.output, std::string(kBanner) + kPrimes + kHilbert + kLispReady + kCalendar + kLispReady +
                                  "Command: (hilbert 2)\n" + kHilbertOfOrder2 +
                                  "Command: (calendar 2027 2)\n" + kFebruary2027 +
-                                 "Command: HELP PRIMES\n  PRIMES" + std::string(44, ' ') +
-                                 "Shows the primes on a spiral\n");
+                                 "Command: HELP PRIMES\nPRIMES: Shows the primes on a spiral\n"
+                                 "Usage: PRIMES\n");
 }
 
 TEST_F(StartupSuite, EndsAtTheFirstGapInTheNumbering)

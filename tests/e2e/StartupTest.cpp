@@ -14,7 +14,7 @@ TEST(Startup, LoadsModrigWhichRegistersItsCommand)
     const auto result = session.run({"APPS", "HELP MODRIG"});
     EXPECT_EQ(result.exitStatus, 0) << result.output;
     EXPECT_THAT(result.output,
-                AllOf(HasSubstr("\n  Modrig.bundle "), HasSubstr("Command: HELP MODRIG\n  MODRIG")));
+                AllOf(HasSubstr("\n  Modrig.bundle "), HasSubstr("Command: HELP MODRIG\nMODRIG: ")));
 }
 
 TEST(Startup, LoadsNothingInSafeMode)

@@ -1,6 +1,8 @@
 // A person at a terminal.
 #include <gtest/gtest.h>
 
+#include <csignal>
+
 #include "tests/e2e/HostTerminal.h"
 
 TEST(Terminal, EndsWithControlD)
@@ -103,4 +105,52 @@ TEST(Terminal, RemembersWhatWasTypedInEarlierSessions)
     ASSERT_TRUE(terminal.awaitPrompt());
     terminal.type("\x1b[A"); // the up arrow
     EXPECT_TRUE(terminal.shows("(list 'übung 17)")) << terminal.screen();
+}
+
+// As under a shell: a person presses Ctrl-Z, does something else, and goes on.
+TEST(Terminal, ShowsThePromptAndWhatWasTypedAfterItWasStopped)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"});
+    session.startBy(
+        "set -m; \"$0\" \"$@\"; stty -a | tr ' ' '\\n' | grep -x -e -icanon -e icanon; echo away; fg");
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.awaitPrompt());
+    terminal.type("(* 6 7");
+    ASSERT_TRUE(terminal.shows("(* 6 7")) << terminal.screen();
+    terminal.type("\x1a");
+    ASSERT_TRUE(terminal.showsWithin("\nicanon", std::chrono::seconds(10))) << terminal.screen();
+    ASSERT_TRUE(terminal.showsWithin("away", std::chrono::seconds(10))) << terminal.screen();
+    EXPECT_TRUE(terminal.showsWithin("\rCommand: (* 6 7", std::chrono::seconds(10))) << terminal.screen();
+    terminal.type(")\x1b[D\r"); // the keys of a terminal that is edited on
+    EXPECT_TRUE(terminal.showsWithin("\n42\r\n", std::chrono::seconds(10))) << terminal.screen();
+    EXPECT_EQ(terminal.quit(), 0);
+}
+
+// Nobody can refuse to be stopped so, and whoever was in between may have set the terminal otherwise.
+TEST(Terminal, ShowsThePromptAndWhatWasTypedAfterItWasStoppedFromOutside)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"});
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.awaitPrompt());
+    terminal.type("(* 6 7");
+    ASSERT_TRUE(terminal.shows("(* 6 7")) << terminal.screen();
+    kill(terminal.process(), SIGSTOP);
+    kill(terminal.process(), SIGCONT);
+    EXPECT_TRUE(terminal.showsWithin("Command: (* 6 7", std::chrono::seconds(10))) << terminal.screen();
+    terminal.type(")\r");
+    EXPECT_TRUE(terminal.showsWithin("\n42\r\n", std::chrono::seconds(10))) << terminal.screen();
+}
+
+TEST(Terminal, DrawsWhatIsTypedAgainWhenTheWindowChanges)
+{
+    HostSession session;
+    session.alwaysWith({"--safe"});
+    HostTerminal terminal(session);
+    ASSERT_TRUE(terminal.awaitPrompt());
+    terminal.type("(* 6 7");
+    ASSERT_TRUE(terminal.shows("(* 6 7")) << terminal.screen();
+    terminal.resize({40, 10});
+    EXPECT_TRUE(terminal.showsWithin("\rCommand: (* 6 7", std::chrono::seconds(10))) << terminal.screen();
 }

@@ -46,8 +46,7 @@ void runCommand(const std::wstring& line)
     const bool isBlank = tessel::splitLine(line).empty();
     said.clear();
     require(runner.run(line) == isBlank); // there are no commands
-    require(said.empty() == isBlank &&
-            (isBlank || said.ends_with(". Type HELP for the list of commands.\n")));
+    require(said.empty() == isBlank && (isBlank || said.ends_with(" Type HELP for the list of commands.\n")));
 }
 
 void check(const std::wstring& input)

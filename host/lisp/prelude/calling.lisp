@@ -44,3 +44,24 @@
        (if (or (null value) (eq value *nothing*))
            '()
            (plain-values value))))))
+
+(defun names-something-p (symbol)
+  (or (fboundp symbol) (boundp symbol) (special-operator-p symbol)))
+
+(defun typed-plainly (symbol)
+  "Its name as it is typed without bars, or nil."
+  (let ((name (symbol-name symbol)))
+    (and (notany #'lower-case-p name)
+         (notany (lambda (character) (find character " ()\"'`,;|\\")) name)
+         (string-downcase name))))
+
+(defun symbols-beginning (beginning)
+  "What the Tab key offers: a line for each symbol that can be typed and names something."
+  (call-guarded
+   (lambda ()
+     (let ((names '()) (length (length beginning)))
+       (do-symbols (symbol *user-package*)
+         (let ((name (and (names-something-p symbol) (typed-plainly symbol))))
+           (when (and name (<= length (length name)) (string-equal beginning name :end2 length))
+             (pushnew name names :test #'string=))))
+       (format nil "~{~A~%~}" (sort names #'string<))))))

@@ -95,7 +95,7 @@ TEST_F(HostInProcess, KnowsWhatCanBeCompleted)
 {
     tessel::Host host(options());
     ASSERT_TRUE(host.start()) << output;
-    EXPECT_THAT(host.commandNames(), IsSupersetOf({L"HELP", L"LOAD", L"SETVAR"}));
+    EXPECT_THAT(host.completionSources().commands(), IsSupersetOf({L"HELP", L"LOAD", L"SETVAR"}));
 }
 
 TEST_F(HostInProcess, ReadsTheLispSettingBeforeAnythingElse)

@@ -16,7 +16,7 @@ using testing::StartsWith;
 
 namespace
 {
-// Keeps what it is given; "BAD" fails and "QUIT" ends.
+// Keeps what it is given; "BAD" fails, which is told, and "QUIT" ends.
 class RecordingRunner : public tessel::LineRunner
 {
 public:
@@ -36,7 +36,8 @@ public:
         if (input == L"ASK")
             answered =
                 mQuestions.ask({L"Why", {}, L"so"}, [this](const std::wstring& text) { return take(text); });
-        return input != L"BAD";
+        return mCommandLine.tell(input == L"BAD" ? tessel::Result<>(tessel::Failure{L"That is bad."})
+                                                 : tessel::Result<>());
     }
 
     // "NO" does not fit.
@@ -164,6 +165,19 @@ TEST_F(Console, RunsAScriptFromAFile)
     const TemporaryFolder folder;
     EXPECT_TRUE(console.runScript(folder.write("größe 100%s.script", "; comment\nHELP\n")));
     EXPECT_THAT(runner.inputs, ElementsAre(L"HELP"));
+}
+
+TEST_F(Console, TellsWhichLineOfAScriptFailed)
+{
+    const TemporaryFolder folder;
+    const auto script = folder.write("a.scr", "HELP\nASK\nso\n\nBAD\n(list\n");
+    EXPECT_FALSE(console.runScript(script));
+    EXPECT_THAT(output.text(), HasSubstr("\n" + script.string() + ":5: That is bad.\n"))
+        << "an answer is a line";
+    EXPECT_THAT(output.text(), HasSubstr("\n" + script.string() + ":6: The Lisp expression is not finished"));
+    output.clear();
+    EXPECT_FALSE(runLines("BAD\n"));
+    EXPECT_EQ(output.text(), "Command: BAD\nThat is bad.\n") << "no file";
 }
 
 TEST_F(Console, SaysWhyAScriptCannotBeRead)
