@@ -5,14 +5,22 @@
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
 #include "host/commands/CommandTexts.h"
+#include "host/platform/SystemFailure.h"
 #include "host/text/Nearest.h"
 #include "host/text/Table.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
 namespace
 {
 constexpr std::size_t kCommandColumn = 12;
+
+// What the host says of its own commands is known to translators; what others say of theirs stays.
+std::wstring asSaid(const std::wstring& text)
+{
+    return translateAndFill(text.c_str(), {});
+}
 
 Result<> listCommands(Parts& parts)
 {
@@ -22,11 +30,11 @@ Result<> listCommands(Parts& parts)
     for (const auto& command : parts.commands->descriptions())
     {
         if (!equalIgnoringCase(command.group, group))
-            table.addHeading(command.group);
+            table.addHeading(asSaid(command.group));
         group = command.group;
-        table.add({command.name, command.summary});
+        table.add({command.name, asSaid(command.summary)});
     }
-    table.addHeading(L"HELP and a name, such as HELP LOAD, tells how a command is typed.");
+    table.addHeading(translated(L"HELP and a name, such as HELP LOAD, tells how a command is typed."));
     parts.commandLine->show(table);
     return {};
 }
@@ -35,11 +43,11 @@ void describeCommand(Parts& parts, const CommandStack::Description& command)
 {
     Table table({});
     if (!command.summary.empty())
-        table.addHeading(command.name + L": " + command.summary);
+        table.addHeading(command.name + L": " + asSaid(command.summary));
     for (const auto& line : usageLines(command.name, command.usage))
         table.addHeading(line);
     if (!command.example.empty())
-        table.addHeading(L"Example: " + command.example);
+        table.addHeading(translated(L"Example: {}", command.example));
     parts.commandLine->show(table);
 }
 
@@ -47,10 +55,13 @@ void describeCommand(Parts& parts, const CommandStack::Description& command)
 void describeCommandToCome(Parts& parts, const std::wstring& name, const std::wstring& module)
 {
     if (const CommandText* text = findCommandText(name))
-        describeCommand(parts, {text->group, text->name, text->usage, text->summary, text->example});
+        describeCommand(parts, {text->group.english, text->name, text->usage.english, text->summary.english,
+                                text->example});
     else
-        sayLine(parts, L"The application " + module + L" is loaded when " + name +
-                           L" is typed, and HELP tells more about it then.");
+        sayLine(
+            parts,
+            translated(L"The application {} is loaded when {} is typed, and HELP tells more about it then.",
+                       module, name));
 }
 
 // False when no application is loaded by that name.
@@ -71,7 +82,7 @@ Failure noHelp(Parts& parts, const std::wstring& name, const Failure& noTopic)
     const auto meant = nearest(name, parts.commandNames());
     if (!meant)
         return noTopic;
-    return {L"There is no help on \"" + name + L"\". Did you mean " + *meant + L"?"};
+    return {translated(L"There is no help on \"{}\". Did you mean {}?", name, *meant)};
 }
 
 // A name is that of a command, or else a topic of the help book.
@@ -99,10 +110,11 @@ Result<> changeFolder(Parts& parts, const CommandStack::Arguments& arguments)
     if (!typed->empty())
         std::filesystem::current_path(typedPath(*typed), error);
     if (error)
-        return Failure{L"The folder " + *typed + L" cannot be entered: " + toWide(error.message()) + L"."};
+        return Failure{translated(L"The folder {} cannot be entered: {}.", *typed,
+                                  systemFailure(error.value()).sentence)};
     const auto folder = std::filesystem::current_path(error);
     if (error)
-        return Failure{L"The current folder is gone."};
+        return Failure{translated(L"The current folder is gone.")};
     return succeed(parts, toText(folder));
 }
 

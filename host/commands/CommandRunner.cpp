@@ -8,6 +8,7 @@
 #include "host/commands/CommandTexts.h"
 #include "host/text/CommandLine.h"
 #include "host/text/Nearest.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -23,7 +24,7 @@ bool isBlank(wchar_t character)
 
 Failure failed(const std::wstring& name, const std::wstring& reason)
 {
-    return {L"The command \"" + name + L"\" failed: " + reason};
+    return {translated(L"The command \"{}\" failed: {}", name, reason)};
 }
 
 Result<> callHandler(const TsEdCommand& command, const CommandStack::Arguments& arguments,
@@ -48,7 +49,7 @@ Result<> call(const TsEdCommand& command, const CommandStack::Arguments& argumen
         if (command.builtIn)
             return command.builtIn(arguments);
         if (!arguments.empty() && command.usage.empty())
-            return failed(command.localName, L"it takes no arguments.");
+            return failed(command.localName, translated(L"it takes no arguments."));
         return callHandler(command, arguments, calls);
     }
     catch (const std::exception& error)
@@ -57,7 +58,8 @@ Result<> call(const TsEdCommand& command, const CommandStack::Arguments& argumen
     }
     catch (...)
     {
-        return failed(command.localName, L"it threw something that is not an error of the standard library.");
+        return failed(command.localName,
+                      translated(L"it threw something that is not an error of the standard library."));
     }
 }
 } // namespace
@@ -91,9 +93,9 @@ Failure CommandRunner::unknown(const std::wstring& typedName) const
 {
     const auto meant = nearest(typedName, mNames ? mNames() : mCommands.names());
     if (!meant)
-        return {L"Unknown command \"" + typedName + L"\". Type HELP for the list of commands."};
-    return {L"Unknown command \"" + typedName + L"\". Did you mean " + *meant +
-            L"? Type HELP for the list of commands."};
+        return {translated(L"Unknown command \"{}\". Type HELP for the list of commands.", typedName)};
+    return {translated(L"Unknown command \"{}\". Did you mean {}? Type HELP for the list of commands.",
+                       typedName, *meant)};
 }
 
 CommandStack::Command CommandRunner::findOrLoad(const std::wstring& typedName) const
