@@ -7,6 +7,7 @@
 #include "host/commands/CommandTexts.h"
 #include "host/text/Nearest.h"
 #include "host/text/Table.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -26,7 +27,7 @@ Result<> listCommands(Parts& parts)
         group = command.group;
         table.add({command.name, command.summary});
     }
-    table.addHeading(L"HELP and a name, such as HELP LOAD, tells how a command is typed.");
+    table.addHeading(translated(L"HELP and a name, such as HELP LOAD, tells how a command is typed."));
     parts.commandLine->show(table);
     return {};
 }
@@ -39,7 +40,7 @@ void describeCommand(Parts& parts, const CommandStack::Description& command)
     for (const auto& line : usageLines(command.name, command.usage))
         table.addHeading(line);
     if (!command.example.empty())
-        table.addHeading(L"Example: " + command.example);
+        table.addHeading(translated(L"Example: {}", command.example));
     parts.commandLine->show(table);
 }
 
@@ -49,8 +50,10 @@ void describeCommandToCome(Parts& parts, const std::wstring& name, const std::ws
     if (const CommandText* text = findCommandText(name))
         describeCommand(parts, {text->group, text->name, text->usage, text->summary, text->example});
     else
-        sayLine(parts, L"The application " + module + L" is loaded when " + name +
-                           L" is typed, and HELP tells more about it then.");
+        sayLine(
+            parts,
+            translated(L"The application {} is loaded when {} is typed, and HELP tells more about it then.",
+                       module, name));
 }
 
 // False when no application is loaded by that name.
@@ -71,7 +74,7 @@ Failure noHelp(Parts& parts, const std::wstring& name, const Failure& noTopic)
     const auto meant = nearest(name, parts.commandNames());
     if (!meant)
         return noTopic;
-    return {L"There is no help on \"" + name + L"\". Did you mean " + *meant + L"?"};
+    return {translated(L"There is no help on \"{}\". Did you mean {}?", name, *meant)};
 }
 
 // A name is that of a command, or else a topic of the help book.

@@ -8,6 +8,7 @@
 #include "host/commands/CommandTexts.h"
 #include "host/text/CommandLine.h"
 #include "host/text/Nearest.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -91,9 +92,9 @@ Failure CommandRunner::unknown(const std::wstring& typedName) const
 {
     const auto meant = nearest(typedName, mNames ? mNames() : mCommands.names());
     if (!meant)
-        return {L"Unknown command \"" + typedName + L"\". Type HELP for the list of commands."};
-    return {L"Unknown command \"" + typedName + L"\". Did you mean " + *meant +
-            L"? Type HELP for the list of commands."};
+        return {translated(L"Unknown command \"{}\". Type HELP for the list of commands.", typedName)};
+    return {translated(L"Unknown command \"{}\". Did you mean {}? Type HELP for the list of commands.",
+                       typedName, *meant)};
 }
 
 CommandStack::Command CommandRunner::findOrLoad(const std::wstring& typedName) const
