@@ -4,6 +4,7 @@
 
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
+#include "host/applications/KeptOutWords.h"
 #include "host/text/Json.h"
 #include "host/text/Translation.h"
 

@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <optional>
-#include <ranges>
 #include <utility>
 
 #include "host/resources/ByteReader.h"
@@ -251,14 +250,19 @@ private:
     std::size_t mEntries = 0;
 };
 
+std::size_t beginningOf(const std::map<unsigned, std::size_t>& blocks)
+{
+    return std::ranges::min_element(blocks, {}, [](const auto& block) { return block.second; })->second;
+}
+
 std::vector<LanguageNumber> inOrderOfTheFile(const TextTables::Blocks& blocks)
 {
-    std::vector<std::pair<std::size_t, LanguageNumber>> beginnings;
-    for (const auto& [language, ofIt] : blocks)
-        beginnings.emplace_back(std::ranges::min(ofIt | std::views::values), language);
-    std::ranges::sort(beginnings);
-    const auto languages = beginnings | std::views::values;
-    return {languages.begin(), languages.end()};
+    std::vector<LanguageNumber> languages;
+    for (const auto& ofALanguage : blocks)
+        languages.push_back(ofALanguage.first);
+    std::ranges::stable_sort(languages, {},
+                             [&](LanguageNumber language) { return beginningOf(blocks.at(language)); });
+    return languages;
 }
 
 std::wstring decode(const ByteReader& units)

@@ -13,7 +13,7 @@ namespace tessel
 {
 namespace
 {
-constexpr wchar_t kSeparator = L'/';
+constexpr wchar_t kBetweenFolders = L'/';
 constexpr std::uint64_t kLargestModule = std::uint64_t{64} << 20;
 // Handles rise from here; smaller values could be taken for the ids of texts.
 constexpr std::uintptr_t kHandlesBegin = 0x10000;
@@ -21,7 +21,7 @@ constexpr std::uintptr_t kHandlesBegin = 0x10000;
 std::wstring withOneKindOfSeparator(const wchar_t* name)
 {
     std::wstring result = name ? name : L"";
-    std::ranges::replace(result, L'\\', kSeparator);
+    std::ranges::replace(result, L'\\', kBetweenFolders);
     return result;
 }
 
@@ -29,7 +29,7 @@ std::wstring withOneKindOfSeparator(const wchar_t* name)
 std::wstring resourcesOf(const std::wstring& application)
 {
     if (!isBundlePath(toUtf8(application)))
-        return application.substr(0, application.rfind(kSeparator) + 1);
+        return application.substr(0, application.rfind(kBetweenFolders) + 1);
     for (const wchar_t* folder : {L"/Resources", L"/Contents/Resources"})
     {
         std::error_code failed; // what cannot be reached holds nothing that we could open
@@ -62,15 +62,15 @@ ResourceModules::ResourceModules(std::wstring hostFolder, const CallingApplicati
 
 std::vector<std::wstring> ResourceModules::placesOf(const std::wstring& name) const
 {
-    if (name.starts_with(kSeparator))
+    if (name.starts_with(kBetweenFolders))
         return {name};
     std::vector<std::wstring> places;
     for (std::wstring place : {resourcesOf(mCalls.path()), mHostFolder})
     {
         if (place.empty())
             continue;
-        if (!place.ends_with(kSeparator))
-            place += kSeparator;
+        if (!place.ends_with(kBetweenFolders))
+            place += kBetweenFolders;
         places.push_back(place += name);
     }
     return places;

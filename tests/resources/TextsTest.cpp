@@ -93,7 +93,7 @@ Placeholders placeholdersOf(const std::wstring& text)
     return found;
 }
 
-constexpr unsigned kEnglish = 0x0409, kGerman = 0x0007;
+constexpr unsigned kModrigInEnglish = 0x0409, kModrigInGerman = 0x0007;
 
 const std::vector<ResourceTexts>& allTexts()
 {
@@ -120,11 +120,11 @@ TEST(LanguagesOfTexts, BeginWithTheOneThatIsTakenWhereNoneSuitsThePerson)
     std::vector<unsigned> languages;
     for (const ResourceTexts& texts : allTexts())
         languages.push_back(texts.language);
-    EXPECT_EQ(languages, std::vector({kEnglish, kGerman}));
+    EXPECT_EQ(languages, std::vector({kModrigInEnglish, kModrigInGerman}));
 }
 
-INSTANTIATE_TEST_SUITE_P(InEnglish, Texts, testing::Values(kEnglish));
-INSTANTIATE_TEST_SUITE_P(InGerman, Texts, testing::Values(kGerman));
+INSTANTIATE_TEST_SUITE_P(InEnglish, Texts, testing::Values(kModrigInEnglish));
+INSTANTIATE_TEST_SUITE_P(InGerman, Texts, testing::Values(kModrigInGerman));
 
 TEST_P(Texts, ArePlacedInTheTableOfPlaceholdersForEveryIdOfTheHeader)
 {

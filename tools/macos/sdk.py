@@ -23,7 +23,19 @@ OTHERS = ("sqlite3", "icuuc", "icudata", "icui18n", "curl", "edit", "ecl", "gc",
 # Below /usr/include or its folder for this machine: what belongs to those libraries, and nothing else.
 OTHER_HEADERS = ("sqlite3.h", "sqlite3ext.h", "unicode", "curl", "editline", "histedit.h", "ecl", "gc", "gc.h", "gmp.h", "CLI",
                  "atomic_ops", "atomic_ops.h",
-                 "openssl", "zlib.h", "zconf.h")
+                 "openssl", "zlib.h", "zconf.h", "boost")
+CLI11 = """add_library(CLI11::CLI11 INTERFACE IMPORTED)
+target_include_directories(CLI11::CLI11 INTERFACE "${CMAKE_CURRENT_LIST_DIR}/../../../include")
+"""
+BOOST = """set(Boost_locale_FOUND TRUE)
+add_library(Boost::headers INTERFACE IMPORTED)
+target_include_directories(Boost::headers INTERFACE "${CMAKE_CURRENT_LIST_DIR}/../../../include")
+# This machine's Boost is older than a Mac's, and makes use of what newer C++ libraries have left out.
+target_compile_definitions(Boost::headers INTERFACE _LIBCPP_ENABLE_CXX17_REMOVED_UNARY_BINARY_FUNCTION)
+add_library(Boost::locale UNKNOWN IMPORTED)
+set_target_properties(Boost::locale PROPERTIES INTERFACE_LINK_LIBRARIES Boost::headers
+  IMPORTED_LOCATION "${CMAKE_CURRENT_LIST_DIR}/../../../lib/libboost_locale.tbd")
+"""
 PACKAGES = {"sqlite3": "-lsqlite3", "icu-uc": "-licuuc -licudata", "libedit": "-ledit"}
 
 
@@ -56,7 +68,7 @@ def link_all(path, sources):
     there = [source for source in sources if source.exists()]
     if not there:
         raise SystemExit(f"{path.name} is not on this machine; tools/setup installs what the build needs.")
-    if there[0].is_file():
+    if len(there) == 1:
         link(path, there[0])
         return
     for source in there:
@@ -115,9 +127,9 @@ def put_libraries(sdk, folder, tables, listings):
     for name in OTHERS:
         symbols = stubs.exported_on_linux(found_here(f"lib{name}.so", places))
         write(sdk / f"usr/local/lib/lib{name}.tbd", stubs.stub(f"/usr/local/lib/lib{name}.dylib", symbols))
-    write(sdk / "usr/local/share/cmake/CLI11/CLI11Config.cmake",
-          "add_library(CLI11::CLI11 INTERFACE IMPORTED)\ntarget_include_directories(CLI11::CLI11 INTERFACE "
-          '"${CMAKE_CURRENT_LIST_DIR}/../../../include")\n')
+    write(sdk / "usr/local/lib/libboost_locale.tbd", stubs.stub("/usr/local/lib/libboost_locale.dylib", stubs.BOOST_LOCALE))
+    for name, text in (("CLI11", CLI11), ("Boost", BOOST)):
+        write(sdk / f"usr/local/share/cmake/{name}/{name}Config.cmake", text)
     for name, libraries in PACKAGES.items():
         write(sdk / f"usr/local/lib/pkgconfig/{name}.pc",
               f"prefix=${{pcfiledir}}/../..\nName: {name}\nDescription: {name}\nVersion: 1\nLibs: -L${{prefix}}/lib {libraries}\n"

@@ -12,6 +12,8 @@ _objc_opt_respondsToSelector _objc_setProperty_nonatomic _objc_setProperty_atomi
 _objc_setProperty_atomic_copy _objc_setProperty _objc_getProperty _objc_copyStruct _objc_enumerationMutation
 _objc_sync_enter _objc_sync_exit _objc_autoreleasePoolPush _objc_autoreleasePoolPop _objc_retainAutoreleasedReturnValue
 _objc_autoreleaseReturnValue _objc_storeStrong""".split()
+# Of libraries in C++ the symbols here are spelt otherwise, after another C++ library: those that we call.
+BOOST_LOCALE = []
 CORE_FOUNDATION = ["___CFConstantStringClassReference"]
 
 

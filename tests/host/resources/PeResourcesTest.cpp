@@ -226,9 +226,9 @@ TEST(PeResources, RefusesALanguageThatStandsThereTwice)
     Bytes damaged = texts();
     const Bytes german = {0x07, 0x04, 0, 0};
     const Bytes english = {0x09, 0x04, 0, 0};
-    const auto found = std::ranges::search(damaged, german);
-    ASSERT_FALSE(found.empty());
-    std::ranges::copy(english, found.begin());
+    const auto found = std::search(damaged.begin(), damaged.end(), german.begin(), german.end());
+    ASSERT_NE(found, damaged.end());
+    std::copy(english.begin(), english.end(), found);
     EXPECT_EQ(whyNot(damaged), L"its resources are damaged");
 }
 
