@@ -12,6 +12,7 @@
 #include "host/console/Console.h"
 #include "host/platform/AutoreleasePool.h"
 #include "host/platform/PrivateFolder.h"
+#include "host/platform/ProductFolders.h"
 #include "host/platform/ToolkitPlaces.h"
 
 namespace tessel
@@ -21,7 +22,9 @@ namespace
 constexpr int kDeepestScript = 16;
 } // namespace
 
-Host::Host(HostOptions options) : mOptions(std::move(options)), mCommandLine(mOptions.output)
+Host::Host(HostOptions options)
+    : mOptions(std::move(options)), mCommandLine(mOptions.output),
+      mWindowQuestions(runningProductFolders().binaries)
 {
 }
 
