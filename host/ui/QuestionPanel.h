@@ -8,6 +8,6 @@
 // Whether a window waits for the person; another can then be opened over it.
 extern "C" TESSEL_API bool tsuiHasOpenWindow();
 
-// Asks over that window, until an answer is taken or the person cancels; whether one was taken. Nothing is asked
-// when the session is to end.
+// Asks over that window, until an answer is taken or the person cancels; whether one was taken. Nothing is
+// asked when the session is to end.
 extern "C" TESSEL_API bool tsuiAskInWindow(const tessel::QuestionWindows::Asked& asked);

@@ -16,7 +16,7 @@
 #include "host/ui/Words.h"
 #include "host/ui/platform/Windowing.h"
 
-using namespace tessel::asking;
+namespace asking = tessel::asking;
 using tessel::Questions;
 using tessel::word;
 
@@ -30,22 +30,22 @@ constexpr CGFloat kScrollerRoom = 20;
 constexpr CGFloat kNarrowestButton = 88;
 constexpr CGFloat kButtonRoom = 32; // beside its title
 constexpr CGFloat kButtonGap = 8;
-constexpr NSTimeInterval kBetweenLooks = 0.1;
-NSString* const kReturn = @"\r";
-NSString* const kEscape = @"\033";
+constexpr NSTimeInterval kBetweenKeyLooks = 0.1;
+NSString* const kDefaultKey = @"\r";
+NSString* const kCancelKey = @"\033";
 
 NSString* readableString(const std::wstring& text)
 {
     return wcharToNSString(tessel::withReadableBytes(text).c_str());
 }
 
-NSTextField* makeText(NSString* text, CGFloat width)
+NSTextField* makeWrappedText(NSString* text, CGFloat width)
 {
     NSTextField* field = tessel::windowing::makeLabel(text, NSZeroRect);
     [[field cell] setWraps:YES];
-    const NSRect needed = [[field attributedStringValue]
-        boundingRectWithSize:NSMakeSize(width - kTextPadding, kAnyHeight)
-                     options:NSStringDrawingUsesLineFragmentOrigin];
+    const NSRect needed =
+        [[field attributedStringValue] boundingRectWithSize:NSMakeSize(width - kTextPadding, kAnyHeight)
+                                                    options:NSStringDrawingUsesLineFragmentOrigin];
     [field setFrameSize:NSMakeSize(width, NSHeight(needed) + kTextPadding)];
     return field;
 }
@@ -63,20 +63,22 @@ NSView* scrolled(NSTextField* text, NSSize size)
 }
 
 // The text at this width, or as much of it as the height holds and a scroller beside that.
-NSView* makeWords(NSString* text, CGFloat width, Band place)
+NSView* makeWords(NSString* text, CGFloat width, asking::Band place)
 {
-    NSTextField* whole = makeText(text, width);
+    NSTextField* whole = makeWrappedText(text, width);
     const bool fits = NSHeight([whole frame]) <= place.height;
     NSView* words =
-        fits ? whole : scrolled(makeText(text, width - kScrollerRoom), NSMakeSize(width, place.height));
-    [words setFrameOrigin:NSMakePoint(kMargin, place.bottom)];
+        fits ? whole
+             : scrolled(makeWrappedText(text, width - kScrollerRoom), NSMakeSize(width, place.height));
+    [words setFrameOrigin:NSMakePoint(asking::kMargin, place.bottom)];
     return words;
 }
 
 CGFloat widthOfLine(NSString* text)
 {
     NSFont* font = [NSFont systemFontOfSize:tessel::windowing::kControlFontSize];
-    return [text sizeWithAttributes:[NSDictionary dictionaryWithObject:font forKey:NSFontAttributeName]].width;
+    return
+        [text sizeWithAttributes:[NSDictionary dictionaryWithObject:font forKey:NSFontAttributeName]].width;
 }
 
 NSButton* makeAnswerButton(NSString* title, id target, SEL action)
@@ -86,7 +88,7 @@ NSButton* makeAnswerButton(NSString* title, id target, SEL action)
     [button setFont:[NSFont systemFontOfSize:tessel::windowing::kControlFontSize]];
     [button setBezelStyle:NSRoundedBezelStyle];
     [button setFrameSize:NSMakeSize(std::max(kNarrowestButton, widthOfLine(title) + kButtonRoom),
-                                    kButtonHeight)];
+                                    asking::kButtonHeight)];
     [button setTarget:target];
     [button setAction:action];
     return button;
@@ -132,7 +134,7 @@ void moveMiddleOver(NSWindow* window, NSWindow* owner)
     NSButton* button = makeAnswerButton(title, self, action);
     [button setTag:static_cast<NSInteger>([mAnswers count])];
     if (isDefault)
-        [button setKeyEquivalent:kReturn];
+        [button setKeyEquivalent:kDefaultKey];
     if (isDefault || !mFirst)
         mFirst = button;
     [mAnswers addObject:button];
@@ -149,7 +151,7 @@ void moveMiddleOver(NSWindow* window, NSWindow* owner)
     if ([mAnswers count] == 0)
         [self addAnswer:word(@"OK") action:@selector(onOK:) isDefault:YES];
     [self addAnswer:word(@"CANCEL") action:@selector(onCancel:) isDefault:NO];
-    [[mAnswers lastObject] setKeyEquivalent:kEscape];
+    [[mAnswers lastObject] setKeyEquivalent:kCancelKey];
     for (NSButton* button : tsuiEach<NSButton*>([[mAnswers reverseObjectEnumerator] allObjects]))
         [[self contentView] addSubview:button];
 }
@@ -180,7 +182,7 @@ void moveMiddleOver(NSWindow* window, NSWindow* owner)
 
 - (void)placeAnswersAt:(CGFloat)bottom
 {
-    CGFloat right = kMargin + mInside;
+    CGFloat right = asking::kMargin + mInside;
     for (NSButton* button : tsuiEach<NSButton*>(mAnswers))
     {
         right -= NSWidth([button frame]);
@@ -195,10 +197,10 @@ void moveMiddleOver(NSWindow* window, NSWindow* owner)
     if (mChoose)
     {
         width -= NSWidth([mChoose frame]) + kButtonGap;
-        [mChoose setFrameOrigin:NSMakePoint(kMargin + width + kButtonGap,
-                                            bottom - (kButtonHeight - kFieldHeight) / 2)];
+        [mChoose setFrameOrigin:NSMakePoint(asking::kMargin + width + kButtonGap,
+                                            bottom - (asking::kButtonHeight - asking::kFieldHeight) / 2)];
     }
-    [mField setFrame:NSMakeRect(kMargin, bottom, width, kFieldHeight)];
+    [mField setFrame:NSMakeRect(asking::kMargin, bottom, width, asking::kFieldHeight)];
 }
 
 - (NSView*)replace:(NSView*)view by:(NSView*)words
@@ -212,20 +214,20 @@ void moveMiddleOver(NSWindow* window, NSWindow* owner)
 - (void)growTo:(CGFloat)height
 {
     const NSRect frame = [self frame];
-    NSRect wanted = [self frameRectForContentRect:NSMakeRect(0, 0, mInside + 2 * kMargin, height)];
+    NSRect wanted = [self frameRectForContentRect:NSMakeRect(0, 0, mInside + 2 * asking::kMargin, height)];
     wanted.origin.x = NSMinX(frame);
-    wanted.origin.y =
-        std::max(NSMinY([[self screen] visibleFrame]), NSMaxY(frame) - NSHeight(wanted));
+    wanted.origin.y = std::max(NSMinY([[self screen] visibleFrame]), NSMaxY(frame) - NSHeight(wanted));
     [self setFrame:wanted display:NO];
 }
 
 - (void)placeParts
 {
     NSString* text = readableString([self question].text);
-    const Wanted wanted{NSHeight([makeText(text, mInside) frame]),
-                        [mReason length] ? NSHeight([makeText(mReason, mInside) frame]) : 0, mField != nil};
+    const asking::Wanted wanted{NSHeight([makeWrappedText(text, mInside) frame]),
+                                [mReason length] ? NSHeight([makeWrappedText(mReason, mInside) frame]) : 0,
+                                mField != nil};
     const NSRect highest = [self contentRectForFrameRect:[[NSScreen mainScreen] visibleFrame]];
-    const QuestionLayout layout = layoutOf(wanted, NSHeight(highest));
+    const asking::QuestionLayout layout = asking::layoutOf(wanted, NSHeight(highest));
     [self growTo:layout.height];
     mText = [self replace:mText by:makeWords(text, mInside, layout.text)];
     if ([mReason length])
@@ -237,7 +239,7 @@ void moveMiddleOver(NSWindow* window, NSWindow* owner)
 
 - (id)initWithQuestion:(const tessel::QuestionWindows::Asked&)asked
 {
-    self = [super initWithContentRect:NSMakeRect(0, 0, kWidestQuestion, kButtonHeight)
+    self = [super initWithContentRect:NSMakeRect(0, 0, kWidestQuestion, asking::kButtonHeight)
                             styleMask:NSTitledWindowMask | NSClosableWindowMask
                               backing:NSBackingStoreBuffered
                                 defer:NO];
@@ -315,8 +317,8 @@ void moveMiddleOver(NSWindow* window, NSWindow* owner)
     BOOL isFolder = NO;
     [[NSFileManager defaultManager] fileExistsAtPath:whole isDirectory:&isFolder];
     NSString* chosen = tessel::windowing::chooseFile(
-        isFolder ? whole : [whole stringByDeletingLastPathComponent], isFolder ? @"" : [whole lastPathComponent],
-        [self question].file == Questions::File::kThereOrNew);
+        isFolder ? whole : [whole stringByDeletingLastPathComponent],
+        isFolder ? @"" : [whole lastPathComponent], [self question].file == Questions::File::kThereOrNew);
     if (chosen)
         [self type:chosen];
 }
@@ -336,7 +338,7 @@ void moveMiddleOver(NSWindow* window, NSWindow* owner)
 
 - (BOOL)run
 {
-    NSTimer* looks = [NSTimer timerWithTimeInterval:kBetweenLooks
+    NSTimer* looks = [NSTimer timerWithTimeInterval:kBetweenKeyLooks
                                              target:self
                                            selector:@selector(look:)
                                            userInfo:nil

@@ -4,6 +4,9 @@
 
 #include <tesselui/tsuieach.h>
 
+#include <unistd.h>
+
+#include "host/platform/Pipe.h"
 #include "host/ui/QuestionPanel.h"
 #include "host/ui/platform/Windowing.h"
 
@@ -24,6 +27,15 @@ template <class View> std::vector<View*> viewsIn(NSView* view)
     return found;
 }
 
+// The first step. Without a window manager the keyboard goes nowhere when the last window of the test before
+// has closed.
+bool hasKeyboard()
+{
+    [NSApp activateIgnoringOtherApps:YES];
+    [[NSApp modalWindow] makeKeyWindow];
+    return [NSApp modalWindow] && [NSApp keyWindow] == [NSApp modalWindow];
+}
+
 class QuestionPanel : public DialogTest
 {
 protected:
@@ -38,14 +50,12 @@ protected:
                 return {};
             return tessel::Failure{L"Not \"" + answer + L"\"."};
         };
-        asked.isInterrupted = []
-        {
-            return false;
-        };
+        asked.isInterrupted = [] { return false; };
     }
 
     bool ask(std::vector<ModalStep> steps)
     {
+        steps.insert(steps.begin(), ModalStep(hasKeyboard));
         const ModalSteps running(std::move(steps));
         return tsuiAskInWindow(asked);
     }
@@ -179,11 +189,7 @@ TEST_F(QuestionPanel, SaysWhyAnAnswerDoesNotFitAndLosesNothing)
 
 TEST_F(QuestionPanel, GoesBackToItsFieldWhenAButtonHasTheKeyboard)
 {
-    EXPECT_FALSE(ask({[]
-                      {
-                          type(@"x");
-                      },
-                      [] { return typed() == L"x"; },
+    EXPECT_FALSE(ask({[] { type(@"x"); }, [] { return typed() == L"x"; },
                       []
                       {
                           [window() makeFirstResponder:button(L"OK")];
@@ -235,12 +241,21 @@ TEST_F(QuestionPanel, IsCancelledByItsButtonItsFrameAndFromOutside)
     EXPECT_FALSE(ask({[] { [button(L"Cancel") performClick:nil]; }}));
     EXPECT_FALSE(ask({[] { [window() performClose:nil]; }}));
     bool isInterrupted = false;
-    asked.isInterrupted = [&]
-    {
-        return isInterrupted;
-    };
+    asked.isInterrupted = [&] { return isInterrupted; };
     EXPECT_FALSE(ask({[&] { isInterrupted = true; }}));
     EXPECT_THAT(answers, IsEmpty());
+}
+
+TEST_F(QuestionPanel, IsNotOpenedOnceTheSessionIsToEnd)
+{
+    const auto request = tessel::openPipe();
+    ASSERT_TRUE(request);
+    ASSERT_EQ(1, write(request->input.number(), "", 1));
+    host().session.endRequest = request->output.number();
+    bool isOpened = false;
+    asked.isInterrupted = [&] { return isOpened = true; };
+    EXPECT_FALSE(tsuiAskInWindow(asked));
+    EXPECT_FALSE(isOpened);
 }
 
 TEST_F(QuestionPanel, StandsInTheMiddleOfTheWindowThatItIsOver)
@@ -375,10 +390,7 @@ TEST_F(FileQuestion, KeepsWhatWasTypedWhenThePanelIsCancelled)
 TEST_F(FileQuestion, IsCancelledTogetherWithItsPanel)
 {
     bool isInterrupted = false;
-    asked.isInterrupted = [&]
-    {
-        return isInterrupted;
-    };
+    asked.isInterrupted = [&] { return isInterrupted; };
     EXPECT_FALSE(ask({[&]
                       {
                           mQuestion = window();
@@ -391,8 +403,8 @@ TEST_F(FileQuestion, BeginsInTheFolderOfWhatIsTyped)
 {
     file("sub/inner.txt");
     asked.question.byDefault = file("sub/missing.txt").substr(0, file("sub/inner.txt").rfind(L'/')) + L"/new";
-    auto steps = inPanel({[&] { EXPECT_EQ(L"sub", wide([[panel() directory] lastPathComponent])); },
-                          [] { pressEscape(); }});
+    auto steps = inPanel(
+        {[&] { EXPECT_EQ(L"sub", wide([[panel() directory] lastPathComponent])); }, [] { pressEscape(); }});
     steps.push_back(ModalStep([] { pressEscape(); }));
     EXPECT_FALSE(ask(steps));
 }
@@ -408,8 +420,8 @@ protected:
     // steps.
     std::wstring choose(NSString* typedName, bool mayBeNew, std::vector<ModalStep> steps = {})
     {
-        steps.insert(steps.begin(),
-                     {[=] { typeNameInto(running(), typedName); }, [] { pressKey(running(), @"\r"); }});
+        steps.insert(steps.begin(), {hasKeyboard, [=] { typeNameInto(running(), typedName); },
+                                     [] { pressKey(running(), @"\r"); }});
         const ModalSteps choosing(steps);
         return wide(tessel::windowing::chooseFile(in(""), @"usual.txt", mayBeNew));
     }
@@ -433,7 +445,7 @@ TEST_F(FileChoice, MayBeThatOfANewFileWhoseNameIsTheBeginningOfAnother)
 
 TEST_F(FileChoice, BeginsInTheNameFieldForANewName)
 {
-    const ModalSteps steps({[]
+    const ModalSteps steps({hasKeyboard, []
                             {
                                 EXPECT_EQ(L"usual.txt", wide([[nameField(running()) currentEditor] string]));
                                 pressKey(running(), @"\r");

@@ -32,7 +32,8 @@ TEST(QuestionLayout, StacksWhatThereIsFromTheButtonsUp)
 TEST(QuestionLayout, LeavesNoRoomForWhatThereIsNot)
 {
     const double whole = layoutOf({.text = kLine, .explanation = kLine, .hasField = true}, kPlenty).height;
-    const QuestionLayout withoutField = layoutOf({.text = kLine, .explanation = kLine, .hasField = false}, kPlenty);
+    const QuestionLayout withoutField =
+        layoutOf({.text = kLine, .explanation = kLine, .hasField = false}, kPlenty);
     EXPECT_LT(withoutField.height, whole - kFieldHeight);
     EXPECT_LT(layoutOf({.text = kLine, .explanation = 0, .hasField = true}, kPlenty).height, whole - kLine);
     const QuestionLayout least = layoutOf({.text = kLine, .explanation = 0, .hasField = false}, kPlenty);
@@ -42,7 +43,8 @@ TEST(QuestionLayout, LeavesNoRoomForWhatThereIsNot)
 TEST(QuestionLayout, GrowsWithItsText)
 {
     const double one = layoutOf({.text = kLine, .explanation = 0, .hasField = true}, kPlenty).height;
-    EXPECT_EQ(layoutOf({.text = 5 * kLine, .explanation = 0, .hasField = true}, kPlenty).height, one + 4 * kLine);
+    EXPECT_EQ(layoutOf({.text = 5 * kLine, .explanation = 0, .hasField = true}, kPlenty).height,
+              one + 4 * kLine);
 }
 
 TEST(QuestionLayout, IsNoHigherThanTheScreenWhateverTheText)
