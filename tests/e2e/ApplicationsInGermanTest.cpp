@@ -21,7 +21,10 @@ protected:
         mSession.set("LANG", "de_DE.UTF-8");
     }
 
-    std::string reads(const std::vector<std::string>& commands) const { return mSession.run(commands).output; }
+    std::string reads(const std::vector<std::string>& commands) const
+    {
+        return mSession.run(commands).output;
+    }
 
     HostSession mSession;
 };
@@ -29,15 +32,17 @@ protected:
 TEST_F(GermanPerson, ReadsWhyAnApplicationWasNotLoadedAndHowManyAtTheStart)
 {
     const std::string other = mSession.folder().write("other.zmb", "not a library").string();
-    const std::string cut = mSession.folder().write("cut.zmb", "\x7F" "ELF").string();
+    const std::string cut = mSession.folder()
+                                .write("cut.zmb", "\x7F"
+                                                  "ELF")
+                                .string();
     EXPECT_THAT(reads({"LOAD " + other}), HasSubstr("\nDie Anwendung „" + other +
                                                     "“ wurde nicht geladen: keine dynamische Bibliothek.\n"));
     storeSuite(mSession, {other});
     EXPECT_THAT(reads({}), HasSubstr("1 Anwendung konnte nicht geladen werden:\n  " + other + ": "));
     storeSuite(mSession, {other, cut});
-    EXPECT_THAT(reads({}),
-                AllOf(HasSubstr("2 Anwendungen konnten nicht geladen werden:\n  " + other + ": "),
-                      HasSubstr("\n  " + cut + ": die Datei ist unvollständig.\n")));
+    EXPECT_THAT(reads({}), AllOf(HasSubstr("2 Anwendungen konnten nicht geladen werden:\n  " + other + ": "),
+                                 HasSubstr("\n  " + cut + ": die Datei ist unvollständig.\n")));
 }
 
 TEST_F(GermanPerson, ReadsWhyAnApplicationStays)
@@ -71,11 +76,13 @@ TEST_F(GermanPerson, ReadsHowTheSearchForACulpritGoes)
         return mSession.folder().write(name, "()").string();
     };
     storeSuite(mSession, {write("a.lsp"), write("b.lsp"), write("c.lsp")});
-    EXPECT_THAT(reads({"BISECT START"}), HasSubstr("BISECT sucht unter 3 Anwendungen; höchstens 3 Starts sind "
-                                                   "noch nötig. Starten Sie Tessel erneut.\n"));
+    EXPECT_THAT(reads({"BISECT START"}),
+                HasSubstr("BISECT sucht unter 3 Anwendungen; höchstens 3 Starts sind "
+                          "noch nötig. Starten Sie Tessel erneut.\n"));
     EXPECT_THAT(reads({}), HasSubstr("BISECT hält bei diesem Start 2 von 3 Verdächtigen fern:\n"));
-    EXPECT_THAT(reads({"BISECT BAD"}), HasSubstr("1 Anwendung ist noch verdächtig; höchstens 1 Start ist noch "
-                                                 "nötig. Starten Sie Tessel erneut.\n"));
+    EXPECT_THAT(reads({"BISECT BAD"}),
+                HasSubstr("1 Anwendung ist noch verdächtig; höchstens 1 Start ist noch "
+                          "nötig. Starten Sie Tessel erneut.\n"));
 }
 
 TEST_F(GermanPerson, ReadsWhatIsWrongInTheHostsWordsAndInThoseOfLisp)
@@ -95,10 +102,11 @@ TEST_F(GermanPerson, ReadsTheHelpOfTheCompilerAndWhatItRefuses)
 {
     const auto compiler = std::filesystem::path(TESSEL_PROGRAM).parent_path() / "tesselc";
     mSession.startBy("'" + compiler.string() + "' --help; '" + compiler.string() + "' .");
-    EXPECT_THAT(reads({}),
-                AllOf(HasSubstr("Übersetzt eine Lisp-Datei für Tessel in Bytecode.\nAufruf: tesselc [OPTIONEN] "
-                                "FILE\n\nArgumente:\n  FILE TEXT ERFORDERLICH "),
-                      HasSubstr("\nOptionen:\n  -h,--help                   Zeigt diese Hilfe und endet\n"),
-                      HasSubstr("\ntesselc: „.“ kann nicht geladen werden: ein Ordner.\n")));
+    EXPECT_THAT(
+        reads({}),
+        AllOf(HasSubstr("Übersetzt eine Lisp-Datei für Tessel in Bytecode.\nAufruf: tesselc [OPTIONEN] "
+                        "FILE\n\nArgumente:\n  FILE TEXT ERFORDERLICH "),
+              HasSubstr("\nOptionen:\n  -h,--help                   Zeigt diese Hilfe und endet\n"),
+              HasSubstr("\ntesselc: „.“ kann nicht geladen werden: ein Ordner.\n")));
 }
 } // namespace

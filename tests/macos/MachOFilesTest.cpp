@@ -62,9 +62,10 @@ Bytes cutTo(const Bytes& bytes, std::size_t size)
 
 TEST(MachOFiles, AModuleAndALibraryForThisProcessorAreAccepted)
 {
-    for (const char* file : {"samples/primes.zmb", "samples/gears.omp", "samples/moon.bundle/Contents/MacOS/moon",
-                             "Tessel.app/Contents/MacOS/libtessel.dylib",
-                             "Tessel.app/Contents/PlugIns/Modrig.bundle/Contents/MacOS/Modrig"})
+    for (const char* file :
+         {"samples/primes.zmb", "samples/gears.omp", "samples/moon.bundle/Contents/MacOS/moon",
+          "Tessel.app/Contents/MacOS/libtessel.dylib",
+          "Tessel.app/Contents/PlugIns/Modrig.bundle/Contents/MacOS/Modrig"})
         EXPECT_EQ(refusal(bytesOf(kBuild / "x86_64" / file)), L"") << file;
 }
 
@@ -77,7 +78,8 @@ TEST(MachOFiles, OfAUniversalFileThisProcessorsHalfIsTaken)
 
 TEST(MachOFiles, AModuleForAnotherProcessorIsRefused)
 {
-    EXPECT_EQ(refusal(bytesOf(kBuild / "arm64/samples/primes.zmb")), L"it is built for another kind of processor");
+    EXPECT_EQ(refusal(bytesOf(kBuild / "arm64/samples/primes.zmb")),
+              L"it is built for another kind of processor");
 }
 
 TEST(MachOFiles, AProgramAndACompiledSourceAreNoLibraries)
