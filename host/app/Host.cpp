@@ -13,6 +13,7 @@
 #include "host/console/FolderContent.h"
 #include "host/platform/AutoreleasePool.h"
 #include "host/platform/PrivateFolder.h"
+#include "host/platform/ProductFolders.h"
 #include "host/platform/SystemFailure.h"
 #include "host/platform/ToolkitPlaces.h"
 #include "host/text/Duration.h"
@@ -55,7 +56,8 @@ std::vector<Branch> keysBelow(LayeredRegistry& registry, std::wstring path)
 } // namespace
 
 Host::Host(HostOptions options)
-    : mOptions(std::move(options)), mCommandLine(mOptions.output, withPagerForPersons(mOptions.outputTo))
+    : mOptions(std::move(options)), mCommandLine(mOptions.output, withPagerForPersons(mOptions.outputTo)),
+      mWindowQuestions(runningProductFolders().binaries)
 {
 }
 

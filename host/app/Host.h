@@ -22,6 +22,7 @@
 #include <vector>
 
 #include "host/app/Export.h"
+#include "host/app/WindowQuestions.h"
 #include "host/commands/EndRequest.h"
 #include "host/commands/Interruption.h"
 #include "host/console/Completion.h"
@@ -114,7 +115,8 @@ private:
     std::atomic<RunningMarker*> mMarker = nullptr;
     EndRequest mEndRequest;
     Interruption mInterruption{mEndRequest};
-    Questions mQuestions{mCommandLine, mInterruption};
+    WindowQuestions mWindowQuestions;
+    Questions mQuestions{mCommandLine, mInterruption, &mWindowQuestions};
     std::optional<Interruption::Wish> mTypedLine; // that it is not run; until it is
     int mScriptDepth = 0;
 };

@@ -21,8 +21,9 @@ std::wstring textAt(const RegistryTree& tree, const std::wstring& key, const std
 std::wstring spokenText(const RegistryTree& tree, const std::wstring& key, const std::wstring& name,
                         const Languages& languages)
 {
+    const std::wstring below = key + L"\\";
     for (const std::string& language : languages)
-        if (const auto* value = tree.value(key + L"\\" + toWide(language), name))
+        if (const auto* value = tree.value(below + toWide(language), name))
             return value->data;
     return textAt(tree, key, name);
 }

@@ -93,7 +93,7 @@ int tsaskYesOrNo(const wchar_t* question, const bool* byDefault, bool* answer)
     const std::wstring yesInWords = translated(L"Yes");
     const std::wstring noInWords = translated(L"No");
     const auto shownDefault = byDefault ? std::optional(*byDefault ? yesInWords : noInWords) : std::nullopt;
-    return ask({question, yesInWords + L"/" + noInWords, shownDefault},
+    return ask({question, {yesInWords, noInWords}, shownDefault},
                [&](const std::wstring& text) -> Result<>
                {
                    const auto yes = yesOrNo(text);
@@ -109,7 +109,8 @@ int tsaskFile(const wchar_t* question, const wchar_t* byDefault, bool mustExist,
 {
     if (!question || !path || capacity == 0)
         return TSASK_INVALID;
-    return ask({question, {}, orNothing(byDefault)},
+    const auto which = mustExist ? Questions::File::kThere : Questions::File::kThereOrNew;
+    return ask({question, {}, orNothing(byDefault), which},
                [&](const std::wstring& text) -> Result<>
                {
                    const auto file = fileAt(tessel::pathIn(text), mustExist);

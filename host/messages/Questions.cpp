@@ -1,10 +1,11 @@
 #include "host/messages/Questions.h"
 
 #include <algorithm>
+#include <utility>
 
+#include <tessel/tsed.h>
 #include <tessel/tssession.h>
 
-#include "host/commands/Interruption.h"
 #include "host/messages/Answers.h"
 #include "host/text/CommandLine.h"
 #include "host/text/TerminalText.h"
@@ -13,6 +14,8 @@ namespace tessel
 {
 namespace
 {
+constexpr wchar_t kHostName[] = L"Tessel";
+
 // On one line, and nothing that a terminal would take for an order.
 std::wstring shown(const std::wstring& text)
 {
@@ -22,11 +25,26 @@ std::wstring shown(const std::wstring& text)
     return line;
 }
 
+std::wstring joined(const std::vector<std::wstring>& choices)
+{
+    std::wstring text;
+    for (const auto& choice : choices)
+        text += (text.empty() ? L"" : L"/") + choice;
+    return text;
+}
+
+// What an application is called where there is no room for its folder.
+std::wstring nameOfAsking()
+{
+    const std::wstring path = tsedGetAppName();
+    return path.empty() ? kHostName : shown(path.substr(path.rfind(L'/') + 1));
+}
+
 std::wstring promptOf(const Questions::Question& question)
 {
     std::wstring prompt = shown(question.text);
     if (!question.choices.empty())
-        prompt += L" [" + question.choices + L"]";
+        prompt += L" [" + joined(question.choices) + L"]";
     if (question.byDefault)
         prompt += L" <" + shown(*question.byDefault) + L">";
     return prompt + L": ";
@@ -35,6 +53,8 @@ std::wstring promptOf(const Questions::Question& question)
 
 bool Questions::ask(const Question& question, const Taker& take)
 {
+    if (mWindows && mWindows->areOpen())
+        return askInWindow(question, take);
     if (mAnswerers.empty())
         return askNobody(question, take);
     Answerer& asked = *mAnswerers.back();
@@ -48,6 +68,23 @@ bool Questions::ask(const Question& question, const Taker& take)
             return false;
     }
     return false;
+}
+
+// The key is meant for the question in front: one around it begins to wait for another press.
+bool Questions::askInWindow(const Question& question, const Taker& take)
+{
+    Question inWindow = question;
+    inWindow.text = shown(question.text);
+    mInterruption.settle();
+    mWish.emplace(mInterruption);
+    const bool answered = mWindows->ask({nameOfAsking(), std::move(inWindow), take,
+                                         [this]
+                                         {
+                                             return mWish->isThere();
+                                         }});
+    mWish.emplace(mInterruption);
+    mInterruption.settle();
+    return answered;
 }
 
 std::optional<std::wstring> Questions::answerOf(Answerer& asked, const Question& question)

@@ -77,12 +77,7 @@ NSEvent* releaseOfTheMouse()
 
 - (void)closeFrontWindow:(NSTimer*)timer
 {
-    if (![NSApp modalWindow])
-        return;
-    [NSApp stopModalWithCode:NSCancelButton];
-    const bool tracking =
-        [[[NSRunLoop currentRunLoop] currentMode] isEqualToString:NSEventTrackingRunLoopMode];
-    [NSApp postEvent:tracking ? releaseOfTheMouse() : wakeUp() atStart:YES];
+    tessel::cancelFrontWindow();
 }
 
 @end
@@ -92,6 +87,16 @@ void tessel::closeWindowsWhenTheSessionEnds()
     const int descriptor = tsrxEndRequest();
     if (descriptor >= 0)
         [[[TsUISessionEnd alloc] init] watch:descriptor];
+}
+
+void tessel::cancelFrontWindow()
+{
+    if (![NSApp modalWindow])
+        return;
+    [NSApp stopModalWithCode:NSCancelButton];
+    const bool tracking =
+        [[[NSRunLoop currentRunLoop] currentMode] isEqualToString:NSEventTrackingRunLoopMode];
+    [NSApp postEvent:tracking ? releaseOfTheMouse() : wakeUp() atStart:YES];
 }
 
 bool tessel::sessionIsToEnd()

@@ -1,11 +1,15 @@
-// Asking the person for something. At a terminal the question stands on the command line and waits; in a
-// script or a pipe the next line is the answer, and it is shown like a line that was typed. Where there is
-// neither (while the host starts, in a command of `-c`, behind the dialog of `--modrig`) the default is taken
-// at once, and a question without one counts as cancelled.
+// Asking the person for something. While a window of the host's is open (Modrig's dialog loads the file that
+// asks) the question comes in a window over it, with the application's name as its title. Otherwise, at a
+// terminal, it stands on the command line and waits; in a script or a pipe the next line is the answer, and
+// it is shown like a line that was typed. Where there is none of these (while the host starts, in a command
+// of
+// `-c`, among the files that come with `--modrig`) the default is taken at once, and a question without one
+// counts as cancelled.
 //
-// Ctrl-C, the end of the input and the end of the session cancel a question. An empty line takes the default.
-// An answer that does not fit is explained in a sentence, and the person is asked again; a script is not: its
-// question is cancelled then.
+// Ctrl-C, the end of the input, the end of the session and closing its window cancel a question. An empty
+// line takes the default; in a window that stands in the field, to be changed or taken. An answer that does
+// not fit is explained in a sentence, and the person is asked again; a script is not: its question is
+// cancelled then.
 //
 // All of these answer one of the codes below. `question` is one line, without a colon at its end. What is
 // stored before the wait is told by `tsrxBeforeWaiting(false)`, which these call. For the thread of the host.

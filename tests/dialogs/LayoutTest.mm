@@ -4,8 +4,10 @@
 #include "tests/dialogs/support/LayoutCheck.h"
 
 #import <tesselui/TsOCOpenFileDialog.h>
+#include <tesselui/tsuieach.h>
 
 #include "host/ui/MessageBoxAlert.h"
+#include "host/ui/QuestionPanel.h"
 
 #import "modrig/dialogs/ModrigStartupSuitController.h"
 #import "modrig/dialogs/TsOCModrigUtil.h"
@@ -229,4 +231,107 @@ TEST_F(Layout, OfAMessageBoxHasRoomForEverything)
                                 return true;
                             }});
     [NSApp runModalForWindow:mPanel];
+}
+
+namespace
+{
+// A question that none of its answers fits.
+tessel::QuestionWindows::Asked unanswerable(const std::wstring& text)
+{
+    tessel::QuestionWindows::Asked asked;
+    asked.title = L"moon.bundle";
+    asked.question.text = text;
+    asked.take = [](const std::wstring&)
+    {
+        return tessel::Failure{L"There is no file /a/folder/with/a/long/name/and/another/one/drawing.txt in "
+                               L"any of the folders where drawings are looked for."};
+    };
+    asked.isInterrupted = [] { return false; };
+    return asked;
+}
+
+void pressDefault()
+{
+    pressKey([NSApp modalWindow], @"\r");
+}
+
+class LayoutOfQuestions : public Layout
+{
+protected:
+    // As it opens, and with the reason why an answer does not fit.
+    static void measureQuestion(const tessel::QuestionWindows::Asked& asked)
+    {
+        const auto expectNoFaults = []
+        { EXPECT_THAT(layoutFaults([[NSApp modalWindow] contentView]), IsEmpty()); };
+        const ModalSteps steps({expectNoFaults, pressDefault, expectNoFaults,
+                                []
+                                {
+                                    const NSRect screen = [[NSScreen mainScreen] visibleFrame];
+                                    EXPECT_TRUE(NSContainsRect(screen, [[NSApp modalWindow] frame]));
+                                    [NSApp stopModal];
+                                }});
+        EXPECT_FALSE(tsuiAskInWindow(asked));
+    }
+};
+
+const wchar_t* const kQuestionTexts[] = {
+    L"Size", L"How large are the gears to be that are drawn around the one in the middle, and how many teeth "
+             L"does each of these have if nothing else is said?"};
+} // namespace
+
+TEST_F(LayoutOfQuestions, ForATextHasRoomForEverything)
+{
+    for (const wchar_t* text : kQuestionTexts)
+        measureQuestion(unanswerable(text));
+}
+
+TEST_F(LayoutOfQuestions, ForAFileHasRoomForEverything)
+{
+    for (const wchar_t* text : kQuestionTexts)
+    {
+        auto asked = unanswerable(text);
+        asked.question.file = tessel::Questions::File::kThere;
+        measureQuestion(asked);
+    }
+}
+
+TEST_F(LayoutOfQuestions, ForAChoiceHasRoomForEverything)
+{
+    for (const wchar_t* text : kQuestionTexts)
+    {
+        auto asked = unanswerable(text);
+        asked.question.choices = {L"Yes", L"No", L"Neither of the two"};
+        asked.question.byDefault = L"Yes";
+        measureQuestion(asked);
+    }
+}
+
+TEST_F(LayoutOfQuestions, LetsATextScrollThatIsHigherThanTheScreen)
+{
+    std::wstring text;
+    for (int word = 0; word < 3000; ++word)
+        text += L"words ";
+    const auto asked = unanswerable(text);
+    const ModalSteps steps(
+        {[]
+         { EXPECT_TRUE(NSContainsRect([[NSScreen mainScreen] visibleFrame], [[NSApp modalWindow] frame])); },
+         pressDefault,
+         []
+         {
+             NSWindow* window = [NSApp modalWindow];
+             EXPECT_TRUE(NSContainsRect([[NSScreen mainScreen] visibleFrame], [window frame]));
+             EXPECT_THAT(layoutFaults([window contentView]), IsEmpty());
+             [NSApp stopModal];
+             NSScrollView* frame = nil;
+             for (NSView* part : tsuiEach<NSView*>([[window contentView] subviews]))
+                 if ([part isKindOfClass:[NSScrollView class]])
+                     frame = (NSScrollView*)part;
+             ASSERT_TRUE(frame);
+             NSView* words = [frame documentView];
+             const NSRect shown = [frame documentVisibleRect];
+             EXPECT_LE(NSWidth([words frame]), NSWidth(shown));
+             EXPECT_NEAR([words isFlipped] ? NSMinY(shown) : NSHeight([words frame]) - NSMaxY(shown), 0, 1)
+                 << "the beginning shows";
+         }});
+    EXPECT_FALSE(tsuiAskInWindow(asked));
 }

@@ -5,6 +5,7 @@
 
 #import <tesselui/TsOCOpenFileDialog.h>
 
+#include "host/ui/QuestionPanel.h"
 #include "host/ui/platform/Windowing.h"
 
 #import "modrig/dialogs/ModrigStartupSuitController.h"
@@ -119,4 +120,27 @@ TEST_F(TabOrder, OfAMessageBoxIsThatOfReading)
                             }});
     tessel::windowing::runMessage(@"It failed.", @"There is no such file.", true);
     EXPECT_THAT(stops, ElementsAre(L"OK", L"field"));
+}
+
+TEST_F(TabOrder, OfAQuestionIsThatOfReading)
+{
+    std::vector<std::wstring> stops;
+    const auto stopsOf = [&](const tessel::Questions::Question& question)
+    {
+        const ModalSteps steps({[&]
+                                {
+                                    NSWindow* window = [NSApp modalWindow];
+                                    [window
+                                        makeFirstResponder:nil]; // a field that is typed into is passed over
+                                    stops = stopsFrom((NSView*)[window initialFirstResponder]);
+                                    [NSApp stopModal];
+                                }});
+        tsuiAskInWindow({L"moon.bundle", question, {}, [] { return false; }});
+        return stops;
+    };
+    EXPECT_THAT(stopsOf({L"Size"}), ElementsAre(L"field", L"Cancel", L"OK"));
+    EXPECT_THAT(stopsOf({L"Which", {}, std::nullopt, tessel::Questions::File::kThereOrNew}),
+                ElementsAre(L"field", L"Choose…", L"Cancel", L"OK"));
+    EXPECT_THAT(stopsOf({L"Really?", {L"Yes", L"No"}, L"No"}), ElementsAre(L"No", L"Yes", L"Cancel"));
+    EXPECT_THAT(stopsOf({L"Really?", {L"Yes", L"No"}}), ElementsAre(L"Yes", L"Cancel", L"No"));
 }

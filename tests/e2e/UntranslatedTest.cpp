@@ -35,7 +35,8 @@ std::string withoutTranslated(std::string text)
 // What was typed, and what applications say.
 bool isOfOthers(const std::string& line)
 {
-    return std::regex_search(line, std::regex("^Command: |^  (SUITE|HISTORY) |^[A-Za-z0-9]+\\.zmb: message "));
+    return std::regex_search(line,
+                             std::regex("^Command: |^  (SUITE|HISTORY) |^[A-Za-z0-9]+\\.zmb: message "));
 }
 
 // Names stay: of files, programs, options and profiles.
@@ -92,10 +93,30 @@ TEST_F(Untranslated, IsFoundWhereThereIsSuch)
 TEST_F(Untranslated, IsNothingOfHelpAndSettings)
 {
     mSession.alwaysWith({"--safe"});
-    EXPECT_THAT(plainLinesOf({"HELP", "? LOAD", "HELP REGISTRY", "HELP NOSUCH", "HELP LOD", "HELP MODRIG", "VERSION",
-                              "CD", "CD /nowhere/at/all", "CD a b", "LOD", "QQQQQQQQ", "SETVAR", "SETVAR NONE",
-                              "SETVAR NONE 1", "SETVAR LISPENABLED 7", "SETVAR TESSELVERSION R1", "SETVAR a b c",
-                              "PROFILE", "PROFILE a\\b", "PROFILE a b", "SCRIPT /none.scr", "SCRIPT", "QUIT"}),
+    EXPECT_THAT(plainLinesOf({"HELP",
+                              "? LOAD",
+                              "HELP REGISTRY",
+                              "HELP NOSUCH",
+                              "HELP LOD",
+                              "HELP MODRIG",
+                              "VERSION",
+                              "CD",
+                              "CD /nowhere/at/all",
+                              "CD a b",
+                              "LOD",
+                              "QQQQQQQQ",
+                              "SETVAR",
+                              "SETVAR NONE",
+                              "SETVAR NONE 1",
+                              "SETVAR LISPENABLED 7",
+                              "SETVAR TESSELVERSION R1",
+                              "SETVAR a b c",
+                              "PROFILE",
+                              "PROFILE a\\b",
+                              "PROFILE a b",
+                              "SCRIPT /none.scr",
+                              "SCRIPT",
+                              "QUIT"}),
                 IsEmpty());
     EXPECT_THAT(plainLinesIn(mSession.start({"--help"}).output), IsEmpty());
     EXPECT_THAT(plainLinesIn(mSession.start({"--verbose", "-c", "VERSION"}).output), IsEmpty());
@@ -124,11 +145,13 @@ TEST_F(Untranslated, IsNothingOfTheRegistry)
                       "REGISTRY RESTORE",
                       "REGISTRY RESET"};
     int number = 0;
-    for (const std::string& wrong : {std::string("text"), head + "[HKCU", head + "[HKLM\\A]", head + "[-HKCU]",
-                                     head + "\"a\"=\"b\"", head + "[HKCU\\A]\n\"a\"=1", head + "[HKCU\\A]\n\"a",
-                                     head + "[HKCU\\A]\n\"a\"=\"b", head + "[HKCU\\A]\n\"a\" \"b\"",
-                                     head + "[HKCU\\A]\n\"a\"=\"b\" c", head + "[HKCU\\A]\nabc",
-                                     head + "[HKCU\\A]\n\"a\\b\"=\"b\"", std::string("\xFF\xFE" "a")})
+    for (const std::string& wrong :
+         {std::string("text"), head + "[HKCU", head + "[HKLM\\A]", head + "[-HKCU]", head + "\"a\"=\"b\"",
+          head + "[HKCU\\A]\n\"a\"=1", head + "[HKCU\\A]\n\"a", head + "[HKCU\\A]\n\"a\"=\"b",
+          head + "[HKCU\\A]\n\"a\" \"b\"", head + "[HKCU\\A]\n\"a\"=\"b\" c", head + "[HKCU\\A]\nabc",
+          head + "[HKCU\\A]\n\"a\\b\"=\"b\"",
+          std::string("\xFF\xFE"
+                      "a")})
         commands.push_back("REGISTRY IMPORT " + write(std::to_string(++number) + ".reg", wrong));
     EXPECT_THAT(plainLinesOf(commands), IsEmpty());
 }
@@ -138,7 +161,8 @@ TEST_F(Untranslated, IsNothingOfADamagedRegistry)
     mSession.alwaysWith({"--safe"});
     EXPECT_THAT(plainLinesOf({"REGISTRY SET Here NAME DATA"}), IsEmpty());
     write("profile/registry.db", "no registry at all, but long enough to be looked at as one");
-    EXPECT_THAT(plainLinesOf({"REGISTRY SET Here NAME DATA", "REGISTRY GET Here NAME", "REGISTRY RESET"}), IsEmpty());
+    EXPECT_THAT(plainLinesOf({"REGISTRY SET Here NAME DATA", "REGISTRY GET Here NAME", "REGISTRY RESET"}),
+                IsEmpty());
     EXPECT_THAT(plainLinesOf({"REGISTRY RESTORE", "REGISTRY RESET"}), IsEmpty());
 }
 
@@ -147,15 +171,38 @@ TEST_F(Untranslated, IsNothingOfApplications)
     mSession.alwaysWith({"--safe"});
     const std::string lisp = write("good.lsp", "(+ 1 1)");
     const std::string folder = write("folder.zmb/file", "");
-    Lines commands = {"LOAD", "LOAD a b", "LOAD /none.zmb", "LOAD ftp://host/file", "LOAD http://[/file",
-                      "LOAD " + write("text.zmb", "text"), "LOAD " + write("cut.zmb", "\x7F" "ELF"),
-                      "LOAD " + lisp, "LOAD /none.lsp", "LOAD " + write("open.lsp", "\n(car"),
-                      "LOAD " + write("text.qbc", "text"), "LOAD " + write("file.bundle", ""), "UNLOAD /none.zmb",
-                      "UNLOAD " + lisp, "APPS", "DISABLE /none.zmb", "DISABLE /", "DISABLE " + write("a.txt", ""),
-                      "DISABLE " + lisp, "DISABLE " + folder, "APPS", "ENABLE /none.zmb", "ENABLE " + lisp, "BISECT",
-                      "BISECT GOOD", "BISECT START", "BISECT STOP", "BISECT SO"};
-    for (const char* name : {"Good.zmb", "NoEntry.zmb", "Answers3.zmb", "LocksItself.zmb", "RefusesToUnload.zmb",
-                             "Throws.zmb", "ThrowsNumber.zmb", "ThrowsInMapping.zmb", "ThrowsAtUnload.zmb"})
+    Lines commands = {"LOAD",
+                      "LOAD a b",
+                      "LOAD /none.zmb",
+                      "LOAD ftp://host/file",
+                      "LOAD http://[/file",
+                      "LOAD " + write("text.zmb", "text"),
+                      "LOAD " + write("cut.zmb", "\x7F"
+                                                 "ELF"),
+                      "LOAD " + lisp,
+                      "LOAD /none.lsp",
+                      "LOAD " + write("open.lsp", "\n(car"),
+                      "LOAD " + write("text.qbc", "text"),
+                      "LOAD " + write("file.bundle", ""),
+                      "UNLOAD /none.zmb",
+                      "UNLOAD " + lisp,
+                      "APPS",
+                      "DISABLE /none.zmb",
+                      "DISABLE /",
+                      "DISABLE " + write("a.txt", ""),
+                      "DISABLE " + lisp,
+                      "DISABLE " + folder,
+                      "APPS",
+                      "ENABLE /none.zmb",
+                      "ENABLE " + lisp,
+                      "BISECT",
+                      "BISECT GOOD",
+                      "BISECT START",
+                      "BISECT STOP",
+                      "BISECT SO"};
+    for (const char* name :
+         {"Good.zmb", "NoEntry.zmb", "Answers3.zmb", "LocksItself.zmb", "RefusesToUnload.zmb", "Throws.zmb",
+          "ThrowsNumber.zmb", "ThrowsInMapping.zmb", "ThrowsAtUnload.zmb"})
     {
         commands.push_back("LOAD " + inQuotes(fixtureModule(name)));
         commands.push_back("UNLOAD " + inQuotes(fixtureModule(name)));

@@ -26,6 +26,10 @@ void callBeforeEachWait(void (*call)());
 // `detail` (or an empty text) says why, in smaller type that can be selected and copied.
 void runMessage(NSString* text, NSString* detail, bool warning);
 
+// Lets a person choose a file in a panel that opens in the folder with the name in it, which may be empty.
+// nil when they cancel. `mayBeNew`: the file need not be there.
+NSString* chooseFile(NSString* folder, NSString* name, bool mayBeNew);
+
 // Carries out what the screen still has to show.
 void flushScreen();
 } // namespace tessel::windowing

@@ -45,6 +45,15 @@ void runMessage(NSString* text, NSString* detail, bool warning)
     [alert runModal];
 }
 
+// The system asks by itself before a file that is there is to be replaced.
+NSString* chooseFile(NSString* folder, NSString* name, bool mayBeNew)
+{
+    NSSavePanel* panel = mayBeNew ? [NSSavePanel savePanel] : [NSOpenPanel openPanel];
+    [panel setDirectoryURL:[NSURL fileURLWithPath:folder]];
+    [panel setNameFieldStringValue:name];
+    return [panel runModal] == NSOKButton ? [[panel URL] path] : nil;
+}
+
 void flushScreen()
 {
 }

@@ -1,4 +1,5 @@
 #include <algorithm>
+#include <filesystem>
 
 #include <sys/stat.h>
 
@@ -90,11 +91,17 @@ bool isHost(NSString* path)
     return paths;
 }
 
+- (BOOL)isMissing:(const std::string&)path
+{
+    return !fileExists(path) &&
+           !(mTakesNewNames && isFolder(std::filesystem::path(path).parent_path().string()));
+}
+
 - (std::vector<std::string>)pathsOfTyping
 {
     std::vector<std::string> paths = [self typedPaths];
-    std::erase_if(paths,
-                  [&](const std::string& path) { return !fileExists(path) || [self isWalkedThrough:path]; });
+    std::erase_if(paths, [&](const std::string& path)
+                  { return [self isMissing:path] || [self isWalkedThrough:path]; });
     return paths;
 }
 
@@ -205,7 +212,8 @@ bool isHost(NSString* path)
 {
     if ([notification object] != mName)
         return;
-    [self completeIn:[mName currentEditor]];
+    if (!mTakesNewNames) // a new name may be the beginning of one that is there
+        [self completeIn:[mName currentEditor]];
     [self chooseTyped];
 }
 
@@ -250,7 +258,7 @@ bool isHost(NSString* path)
         return NO;
     for (const std::string& path : [self typedPaths])
     {
-        if (fileExists(path))
+        if (![self isMissing:path])
             continue;
         NSString* text = wordWith(@"NO_SUCH_FILE", string(path));
         VqHostMessageBox::simple()->show(NSStringToWstring(text).c_str(), MB_ICONEXCLAMATION, nullptr);

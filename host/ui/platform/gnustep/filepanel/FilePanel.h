@@ -35,7 +35,13 @@ struct PanelState;
     BOOL mIsFitting; // columns are made wider and narrower by the panel itself
     BOOL mChoosesFolders;
     BOOL mChoosesSeveral;
+    BOOL mTakesNewNames;
 }
+
+// Whether a typed name may be that of a file that is not there yet, in a folder that is. Off unless switched
+// on.
+- (void)setTakesNewNames:(BOOL)takes;
+
 @end
 
 // FilePanel+Parts.mm

@@ -179,6 +179,11 @@ template <class Function> Function windowMethod(SEL selector)
     return mChoosesFolders;
 }
 
+- (void)setTakesNewNames:(BOOL)takes
+{
+    mTakesNewNames = takes;
+}
+
 - (void)setTreatsFilePackagesAsDirectories:(BOOL)treats
 {
     _treatsFilePackagesAsDirectories = treats;
@@ -210,7 +215,7 @@ template <class Function> Function windowMethod(SEL selector)
     [self showRecentFolders];
     [self fitOnScreen];
     [self recalculateKeyViewLoop];
-    [self makeFirstResponder:mTable];
+    [self makeFirstResponder:mTakesNewNames ? (NSView*)mName : mTable];
     [self startWatching];
     @try
     {
