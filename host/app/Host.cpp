@@ -89,7 +89,8 @@ bool Host::start()
     if (!mOptions.safe)
     {
         mParts->sayRecordsTakenAlong();
-        mParts->demandLoading.loadAtStart();
+        mParts->demandLoading.loadAtStart(mParts->registryNews.isThere());
+        mParts->registryNews.noteRead();
     }
     finishLine();
     tellOfStart();

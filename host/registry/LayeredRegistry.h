@@ -46,6 +46,9 @@ public:
     // About what is laid out and does not count.
     const std::vector<std::wstring>& sentences() const { return mLayers.sentences; }
 
+    // Tells what is laid out today from what was laid out another day.
+    std::uint32_t markOfLayers() const { return mLayers.mark; }
+
     // All as in Registry.
     Key find(std::wstring_view path, Key from = Registry::kRoot);
     Result<Key> create(std::wstring_view path, Key from);

@@ -5,6 +5,8 @@
 #include <system_error>
 #include <utility>
 
+#include <zlib.h>
+
 #include "host/platform/OrdinaryFile.h"
 #include "host/registry/KeyPath.h"
 #include "host/text/Translation.h"
@@ -31,15 +33,24 @@ std::vector<fs::path> registryFilesIn(const fs::path& folder)
     return files;
 }
 
-void take(const fs::path& file, RegistryTree& tree, std::vector<std::wstring>& sentences)
+std::uint32_t markAfter(std::uint32_t mark, std::string_view bytes)
+{
+    return static_cast<std::uint32_t>(
+        crc32_z(mark, reinterpret_cast<const unsigned char*>(bytes.data()), bytes.size()));
+}
+
+void take(const fs::path& file, RegistryTree& tree, RegistryLayers& layers)
 {
     const auto bytes = readOrdinaryFile(file, kMostLayerBytes);
     const auto changes = bytes ? readRegistryText(*bytes) : bytes.failure();
-    if (changes)
-        tree.apply(*changes, file);
-    else
-        sentences.push_back(
+    if (!changes)
+    {
+        layers.sentences.push_back(
             translated(L"The values for everybody in {} do not count: {}.", file, changes.sentence()));
+        return;
+    }
+    tree.apply(*changes, file);
+    layers.mark = markAfter(markAfter(layers.mark, &tree == &layers.policy ? "policy" : "default"), *bytes);
 }
 } // namespace
 
@@ -166,9 +177,9 @@ RegistryLayers readRegistryLayers(const std::vector<fs::path>& folders)
     for (const fs::path& folder : folders)
     {
         for (const fs::path& file : registryFilesIn(folder))
-            take(file, layers.defaults, layers.sentences);
+            take(file, layers.defaults, layers);
         for (const fs::path& file : registryFilesIn(folder / "policy"))
-            take(file, layers.policy, layers.sentences);
+            take(file, layers.policy, layers);
     }
     return layers;
 }

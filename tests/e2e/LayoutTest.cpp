@@ -73,6 +73,31 @@ TEST_F(Layout, ThatIsPolicyCannotBeTakenOutAndThePersonIsTold)
                          "    (from " + file + ")\n"));
 }
 
+TEST_F(Layout, OfASuiteIsLoadedAgainAfterItWasOutOfReach)
+{
+    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
+    const auto layout = session.folder() / "layout";
+    const auto away = session.folder() / "away";
+    std::filesystem::rename(layout, away);
+    EXPECT_THAT(apps(), EndsWith("Command: APPS\n" + listed(modrigBundle())));
+    EXPECT_THAT(apps(), EndsWith("Command: APPS\nNo application is loaded.\n"));
+    std::filesystem::rename(away, layout);
+    EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
+    EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp"))) << "and at the start after that";
+}
+
+TEST_F(Layout, ThatIsPolicyReachesWhoHasEmptiedTheirSuite)
+{
+    storeSuite(session, {sample("calendar.qbc")});
+    apps();
+    storeSuite(session, {});
+    apps();
+    EXPECT_THAT(apps(), EndsWith("Command: APPS\nNo application is loaded.\n"));
+    layOutSuite("policy/suite.reg", sample("hilbert.lsp"));
+    EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
+}
+
 // In a safe session nothing of it was loaded; only the layout knows the whole path.
 TEST_F(Layout, OfASuiteIsKnownToDisableByItsNames)
 {

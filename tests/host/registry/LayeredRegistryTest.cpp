@@ -104,6 +104,25 @@ TEST_F(Layers, PutsLaterFoldersAndFilesBeforeEarlierOnes)
     EXPECT_EQ(said(), "");
 }
 
+TEST_F(Layers, HaveAnotherMarkAsSoonAsTheySayAnythingElse)
+{
+    start();
+    EXPECT_EQ(host.layered().markOfLayers(), 0u);
+    const auto markOf = [this](const std::string& data)
+    {
+        layOut("near/a.reg", "[HKCU\\K]\n\"a\"=\"" + data + "\"\n");
+        return host.layered().markOfLayers();
+    };
+    const auto first = markOf("1");
+    EXPECT_NE(first, 0u);
+    EXPECT_NE(markOf("2"), first);
+    EXPECT_EQ(markOf("1"), first);
+    std::filesystem::create_directories(host.folder() / "near/policy");
+    std::filesystem::rename(host.folder() / "near/a.reg", host.folder() / "near/policy/a.reg");
+    start();
+    EXPECT_NE(host.layered().markOfLayers(), first) << "policy is something else";
+}
+
 TEST_F(Layers, ListsTheKeysOfEveryLayerOnce)
 {
     layOut("near/a.reg", "[HKCU\\K\\One]\n[HKCU\\K\\two]\n[HKCU\\K\\Three\\Deep]\n");
