@@ -122,6 +122,22 @@ TEST_F(RegistryTransfer, DoesNotReplaceAFileOfAnotherKind)
                       ": there is no such key.\n");
 }
 
+TEST_F(RegistryTransfer, TakesNoKeyThatLiesTooDeepToBeRemovedAgain)
+{
+    const auto importBelow = [this](int depth)
+    {
+        std::string key = "[HKCU\\Deep";
+        for (int level = 1; level < depth; ++level)
+            key += "\\a";
+        session.folder().write(file.filename(), kBegin + key + "]\n\"a\"=\"b\"\n");
+        return "REGISTRY IMPORT " + quotedFile;
+    };
+    expectRefused(importBelow(513), "is not imported: in line 3 a key lies below more than 511 others.\n");
+    expectWell(session.run({importBelow(512)}));
+    expectWell(session.run({"REGISTRY DELETE Deep"}));
+    EXPECT_THAT(answer("REGISTRY LIST"), Not(HasSubstr("Deep")));
+}
+
 // What is laid out for everybody is to be read by everybody.
 TEST_F(RegistryTransfer, WritesAFileThatOthersMayReadAsTheyMayAllThatThePersonWrites)
 {
