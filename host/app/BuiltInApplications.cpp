@@ -10,6 +10,7 @@
 #include "host/text/Quotes.h"
 #include "host/text/Table.h"
 #include "host/text/TerminalText.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -27,7 +28,7 @@ bool isLispFile(const std::wstring& path)
 Result<> loadLisp(Parts& parts, const std::wstring& path)
 {
     const auto value = parts.lisp->evaluate(L"(load " + inQuotes(path) + L")");
-    return value ? confirm(parts, path + L" is loaded.") : value.failure();
+    return value ? confirm(parts, translated(L"{} is loaded.", path)) : value.failure();
 }
 
 // "ftp://host/file". A file may be called so all the same.
@@ -42,8 +43,8 @@ Result<std::wstring> localFile(Parts& parts, const std::wstring& typed)
 {
     const bool canBeFetched = parts.information->isUrl(typed.c_str());
     if (!canBeFetched && seemsAnAddress(typed) && !parts.files->find(toPath(typed)))
-        return Failure{L"The address " + typed +
-                       L" cannot be loaded: only http and https addresses can be fetched."};
+        return Failure{translated(
+            L"The address {} cannot be loaded: only http and https addresses can be fetched.", typed)};
     if (!canBeFetched)
         return fullPath(parts, typed);
     const auto copy = parts.remote->fetch(typed, kAnyLength, false);
@@ -60,7 +61,7 @@ Result<> load(Parts& parts, const CommandStack::Arguments& arguments)
     if (isLispFile(path))
         return loadLisp(parts, path);
     auto loaded = parts.linker->load(path, kResolveNow);
-    return loaded ? confirm(parts, path + L" is loaded.") : loaded;
+    return loaded ? confirm(parts, translated(L"{} is loaded.", path)) : loaded;
 }
 
 Result<> unload(Parts& parts, const CommandStack::Arguments& arguments)
@@ -70,7 +71,7 @@ Result<> unload(Parts& parts, const CommandStack::Arguments& arguments)
         return typed.failure();
     const std::wstring path = fullPath(parts, *typed);
     if (isLispFile(path))
-        return Failure{path + L" cannot be unloaded: Lisp stays until the session ends."};
+        return Failure{translated(L"{} cannot be unloaded: Lisp stays until the session ends.", path)};
     // The name alone is enough for what is loaded.
     const std::wstring loaded = parts.linker->pathOfModule(*typed);
     const std::wstring module = loaded.empty() ? path : loaded;
@@ -79,7 +80,7 @@ Result<> unload(Parts& parts, const CommandStack::Arguments& arguments)
         return unloaded.failure();
     if (!unloaded->empty())
         sayLine(parts, *unloaded);
-    return confirm(parts, module + L" is unloaded.");
+    return confirm(parts, translated(L"{} is unloaded.", module));
 }
 
 void addApplication(Table& table, const std::wstring& path, const std::wstring& state)
@@ -95,7 +96,8 @@ void addApplication(Table& table, const std::wstring& path, const std::wstring& 
 std::wstring withTime(const Parts& parts, const std::wstring& path, const std::wstring& state)
 {
     const LoadOutcome* outcome = parts.loadOutcomes.of(path);
-    return outcome && outcome->loaded ? state + L", loaded in " + durationInWords(outcome->took) : state;
+    return outcome && outcome->loaded ? translated(L"{}, loaded in {}", state, durationInWords(outcome->took))
+                                      : state;
 }
 
 // What kept it out at the start may do so no longer.
@@ -103,7 +105,7 @@ std::wstring whyNotLoaded(const Parts& parts, const LoadOutcome& outcome)
 {
     const bool wasKeptOut = Admission::isKeptOut(outcome.loaded.code());
     if (wasKeptOut && !parts.admission.keptOutAtStart(outcome.path))
-        return L"was kept out of this start and is let in by now";
+        return translated(L"was kept out of this start and is let in by now");
     return outcome.loaded.sentence();
 }
 
@@ -111,7 +113,7 @@ void addNotLoaded(const Parts& parts, Table& table)
 {
     const auto failed = parts.loadOutcomes.failed();
     if (!failed.empty())
-        table.addHeading(L"Not loaded in this session:");
+        table.addHeading(translated(L"Not loaded in this session:"));
     for (const LoadOutcome& outcome : failed)
         addApplication(table, outcome.path, whyNotLoaded(parts, outcome));
 }
@@ -134,7 +136,8 @@ Result<> listApplications(Parts& parts, const CommandStack::Arguments&)
     const auto modules = parts.linker->loadedModules();
     for (const auto& module : modules)
         addApplication(table, module.path,
-                       withTime(parts, module.path, module.locked ? L"locked" : L"may be unloaded"));
+                       withTime(parts, module.path,
+                                module.locked ? translated(L"locked") : translated(L"may be unloaded")));
     const int lispFiles = parts.document->loadedApplicationCount();
     for (int index = 0; index < lispFiles; ++index)
     {
@@ -142,7 +145,7 @@ Result<> listApplications(Parts& parts, const CommandStack::Arguments&)
         addApplication(table, path, withTime(parts, path, L"Lisp"));
     }
     if (modules.empty() && lispFiles == 0)
-        table.addHeading(L"No application is loaded.");
+        table.addHeading(translated(L"No application is loaded."));
     addKeptOut(parts, table);
     addNotLoaded(parts, table);
     parts.commandLine->show(table);

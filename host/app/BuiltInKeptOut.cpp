@@ -6,6 +6,7 @@
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
 #include "host/applications/ApplicationFiles.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -81,7 +82,7 @@ Result<std::wstring> onlyOneOf(const Texts& paths, const std::wstring& typed)
     if (different.size() < 2)
         return different.front();
     std::wstring sentence =
-        L"Several applications are called \"" + typed + L"\"; type the whole path of one:";
+        translated(L"Several applications are called \"{}\"; type the whole path of one:", typed);
     for (const std::wstring& path : different)
         sentence += L"\n  " + path;
     return Failure{sentence};
@@ -120,7 +121,8 @@ Result<> disable(Parts& parts, const CommandStack::Arguments& arguments)
         return path.failure();
     if (auto kept = parts.keptOut.keepOut(toUtf8(*path)); !kept)
         return kept;
-    return confirm(parts, *path + L" is kept out at starts from now on; ENABLE lets it in again.");
+    return confirm(parts,
+                   translated(L"{} is kept out at starts from now on; ENABLE lets it in again.", *path));
 }
 
 Result<> enable(Parts& parts, const CommandStack::Arguments& arguments)
@@ -129,15 +131,17 @@ Result<> enable(Parts& parts, const CommandStack::Arguments& arguments)
     const auto path = typed ? pathToLetIn(parts, *typed) : typed;
     if (!path)
         return path.failure();
-    const std::wstring bisect = parts.bisecting.keepsOut(toUtf8(*path))
-                                    ? L"BISECT keeps it out at this start; BISECT STOP ends the search."
-                                    : L"";
+    const std::wstring bisect =
+        parts.bisecting.keepsOut(toUtf8(*path))
+            ? translated(L"BISECT keeps it out at this start; BISECT STOP ends the search.")
+            : std::wstring();
     if (!bisect.empty() && !parts.keptOut.find(toUtf8(*path)))
-        return Failure{L"\"" + *path + L"\" is not let in by ENABLE: " + bisect};
+        return Failure{translated(L"\"{}\" is not let in by ENABLE: {}", *path, bisect)};
     if (auto let = parts.keptOut.letIn(toUtf8(*path)); !let)
         return let;
-    return confirm(parts, *path + L" is not kept out at starts any more." +
-                              (bisect.empty() ? L"" : L" But " + bisect));
+    return confirm(parts, bisect.empty()
+                              ? translated(L"{} is not kept out at starts any more.", *path)
+                              : translated(L"{} is not kept out at starts any more. But {}", *path, bisect));
 }
 
 Result<std::wstring> runBisect(Parts& parts, const std::wstring& word)

@@ -11,6 +11,7 @@
 #include "host/app/Parts.h"
 #include "host/app/RegistryTransfer.h"
 #include "host/text/Json.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -27,30 +28,41 @@ std::wstring at(const Arguments& arguments, std::size_t index)
     return index < arguments.size() ? arguments[index] : L"";
 }
 
-Failure failureAt(const std::wstring& path, const std::wstring& reason)
-{
-    return {L"The registry key \"" + path + L"\" " + reason + L"."};
-}
-
 // With what the store has to say: of what failed in this command, which is over, or why nothing can be read
 // or stored at all.
-Failure storeFailureAt(Registry& registry, const std::wstring& path, const std::wstring& what)
+Failure withReason(Registry& registry, const std::wstring& whatFailed)
 {
     const auto told = registry.endOfCommand();
     const std::wstring reason = told ? registry.canStore().sentence() : told.sentence();
-    return {failureAt(path, what).sentence + (reason.empty() ? L"" : L" " + reason)};
+    return {whatFailed + (reason.empty() ? L"" : L" " + reason)};
 }
 
 Failure notWritten(Registry& registry, const std::wstring& path)
 {
-    return storeFailureAt(registry, path, L"cannot be written");
+    return withReason(registry, translated(L"The registry key \"{}\" cannot be written.", path));
 }
 
 // What was not found may only not have been readable.
-Failure notFound(Registry& registry, const std::wstring& path, const std::wstring& what)
+Failure notFound(Registry& registry, const std::wstring& path, const std::wstring& sentence)
 {
-    return registry.mayHaveMissed() ? storeFailureAt(registry, path, L"cannot be read")
-                                    : failureAt(path, what);
+    return registry.mayHaveMissed()
+               ? withReason(registry, translated(L"The registry key \"{}\" cannot be read.", path))
+               : Failure{sentence};
+}
+
+Failure notReadToItsEnd(Registry& registry, const std::wstring& path)
+{
+    return withReason(registry, translated(L"The registry key \"{}\" cannot be read to its end.", path));
+}
+
+std::wstring doesNotExist(const std::wstring& path)
+{
+    return translated(L"The registry key \"{}\" does not exist.", path);
+}
+
+std::wstring hasNoValue(const std::wstring& path, const std::wstring& name)
+{
+    return translated(L"The registry key \"{}\" has no value \"{}\".", path, name);
 }
 
 Result<> list(Parts& parts, const std::wstring& path)
@@ -58,16 +70,16 @@ Result<> list(Parts& parts, const std::wstring& path)
     LayeredRegistry& registry = *parts.layered;
     const auto key = registry.find(path);
     if (key == Registry::kNoKey)
-        return notFound(registry.own(), path, L"does not exist");
+        return notFound(registry.own(), path, doesNotExist(path));
     std::vector<std::wstring> lines;
     for (const auto& name : registry.subKeys(key))
         lines.push_back(L"[" + name + L"]");
     for (const auto& value : registry.values(key))
-        lines.push_back((value.name.empty() ? L"(unnamed)" : value.name) + L" = " + value.data +
-                        (value.file.empty() ? L"" : L"    (from " + toText(value.file) + L")"));
+        lines.push_back((value.name.empty() ? translated(L"(unnamed)") : value.name) + L" = " + value.data +
+                        (value.file.empty() ? L"" : L"    " + translated(L"(from {})", value.file)));
     parts.commandLine->show(lines);
     if (registry.own().readFailed())
-        return storeFailureAt(registry.own(), path, L"cannot be read to its end");
+        return notReadToItsEnd(registry.own(), path);
     return {};
 }
 
@@ -75,7 +87,7 @@ Result<> get(Parts& parts, const std::wstring& path, const std::wstring& name)
 {
     const auto data = parts.layered->read(path, name);
     if (!data)
-        return notFound(*parts.registry, path, L"has no value \"" + name + L"\"");
+        return notFound(*parts.registry, path, hasNoValue(path, name));
     sayLine(parts, *data);
     return {};
 }
@@ -85,7 +97,7 @@ Result<> listForPrograms(Parts& parts, const std::wstring& path)
     LayeredRegistry& registry = *parts.layered;
     const auto key = registry.find(path);
     if (key == Registry::kNoKey)
-        return notFound(registry.own(), path, L"does not exist");
+        return notFound(registry.own(), path, doesNotExist(path));
     std::vector<std::wstring> values;
     for (const auto& value : registry.values(key))
         values.push_back(
@@ -94,7 +106,7 @@ Result<> listForPrograms(Parts& parts, const std::wstring& path)
                           {L"file", value.file.empty() ? L"null" : json::text(toText(value.file))}}));
     const auto keys = registry.subKeys(key);
     if (registry.own().readFailed())
-        return storeFailureAt(registry.own(), path, L"cannot be read to its end");
+        return notReadToItsEnd(registry.own(), path);
     return succeed(parts, json::object({{L"key", json::text(path)},
                                         {L"keys", json::listOfTexts(keys)},
                                         {L"values", json::list(values)}}));
@@ -104,7 +116,7 @@ Result<> getForPrograms(Parts& parts, const std::wstring& path, const std::wstri
 {
     const auto data = parts.layered->read(path, name);
     if (!data)
-        return notFound(*parts.registry, path, L"has no value \"" + name + L"\"");
+        return notFound(*parts.registry, path, hasNoValue(path, name));
     return succeed(
         parts, json::object(
                    {{L"key", json::text(path)}, {L"name", json::text(name)}, {L"data", json::text(*data)}}));
@@ -127,9 +139,12 @@ std::wstring whyMissing(Parts& parts, const std::wstring& path, const std::optio
     const bool isLaidOut =
         name ? parts.layered->read(path, *name).has_value() : parts.layered->find(path) != Registry::kNoKey;
     if (isLaidOut)
-        return name ? L"has the value \"" + *name + L"\" from the administrator, which stays"
-                    : L"is laid out by the administrator and stays";
-    return name ? L"has no value \"" + *name + L"\"" : L"does not exist";
+        return name
+                   ? translated(
+                         L"The registry key \"{}\" has the value \"{}\" from the administrator, which stays.",
+                         path, *name)
+                   : translated(L"The registry key \"{}\" is laid out by the administrator and stays.", path);
+    return name ? hasNoValue(path, *name) : doesNotExist(path);
 }
 
 // A key alone goes with everything below it; with a name, only the value.

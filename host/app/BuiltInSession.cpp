@@ -5,6 +5,7 @@
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
 #include "host/commands/CommandTexts.h"
+#include "host/platform/SystemFailure.h"
 #include "host/text/Nearest.h"
 #include "host/text/Table.h"
 #include "host/text/Translation.h"
@@ -15,6 +16,12 @@ namespace
 {
 constexpr std::size_t kCommandColumn = 12;
 
+// What the host says of its own commands is known to translators; what others say of theirs stays.
+std::wstring asSaid(const std::wstring& text)
+{
+    return translateAndFill(text.c_str(), {});
+}
+
 Result<> listCommands(Parts& parts)
 {
     Table table({kCommandColumn});
@@ -23,9 +30,9 @@ Result<> listCommands(Parts& parts)
     for (const auto& command : parts.commands->descriptions())
     {
         if (!equalIgnoringCase(command.group, group))
-            table.addHeading(command.group);
+            table.addHeading(asSaid(command.group));
         group = command.group;
-        table.add({command.name, command.summary});
+        table.add({command.name, asSaid(command.summary)});
     }
     table.addHeading(translated(L"HELP and a name, such as HELP LOAD, tells how a command is typed."));
     parts.commandLine->show(table);
@@ -36,7 +43,7 @@ void describeCommand(Parts& parts, const CommandStack::Description& command)
 {
     Table table({});
     if (!command.summary.empty())
-        table.addHeading(command.name + L": " + command.summary);
+        table.addHeading(command.name + L": " + asSaid(command.summary));
     for (const auto& line : usageLines(command.name, command.usage))
         table.addHeading(line);
     if (!command.example.empty())
@@ -48,7 +55,8 @@ void describeCommand(Parts& parts, const CommandStack::Description& command)
 void describeCommandToCome(Parts& parts, const std::wstring& name, const std::wstring& module)
 {
     if (const CommandText* text = findCommandText(name))
-        describeCommand(parts, {text->group, text->name, text->usage, text->summary, text->example});
+        describeCommand(parts, {text->group.english, text->name, text->usage.english, text->summary.english,
+                                text->example});
     else
         sayLine(
             parts,
@@ -102,10 +110,11 @@ Result<> changeFolder(Parts& parts, const CommandStack::Arguments& arguments)
     if (!typed->empty())
         std::filesystem::current_path(typedPath(*typed), error);
     if (error)
-        return Failure{L"The folder " + *typed + L" cannot be entered: " + toWide(error.message()) + L"."};
+        return Failure{translated(L"The folder {} cannot be entered: {}.", *typed,
+                                  systemFailure(error.value()).sentence)};
     const auto folder = std::filesystem::current_path(error);
     if (error)
-        return Failure{L"The current folder is gone."};
+        return Failure{translated(L"The current folder is gone.")};
     return succeed(parts, toText(folder));
 }
 

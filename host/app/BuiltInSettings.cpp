@@ -3,6 +3,7 @@
 #include "host/app/BuiltInSupport.h"
 #include "host/app/Parts.h"
 #include "host/text/Table.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -19,7 +20,7 @@ Result<> listVariables(Parts& parts)
 {
     Table table({kVariableColumn});
     for (const auto& variable : parts.variables->all())
-        table.add({assignment(variable), variable.purpose});
+        table.add({assignment(variable), translated(variable.purpose)});
     parts.commandLine->show(table);
     return {};
 }
@@ -28,7 +29,7 @@ Result<> showVariable(Parts& parts, const std::wstring& name)
 {
     const auto* variable = parts.variables->find(name);
     if (!variable)
-        return Failure{L"There is no variable called \"" + name + L"\"."};
+        return Failure{translated(L"There is no variable called \"{}\".", name)};
     sayLine(parts, assignment(*variable));
     return {};
 }

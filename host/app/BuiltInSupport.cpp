@@ -13,8 +13,9 @@ namespace tessel
 void addBuiltIn(Parts& parts, const std::wstring& name, CommandStack::BuiltIn command)
 {
     const CommandText& text = *findCommandText(name);
-    parts.commands->addBuiltIn({text.group, text.name, text.usage, text.summary, text.example},
-                               std::move(command));
+    parts.commands->addBuiltIn(
+        {text.group.english, text.name, text.usage.english, text.summary.english, text.example},
+        std::move(command));
 }
 
 void addBuiltIn(Parts& parts, const std::wstring& name, BuiltInCommand* command)

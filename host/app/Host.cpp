@@ -14,6 +14,7 @@
 #include "host/platform/AutoreleasePool.h"
 #include "host/platform/PrivateFolder.h"
 #include "host/platform/ProductFolders.h"
+#include "host/platform/SystemFailure.h"
 #include "host/platform/ToolkitPlaces.h"
 #include "host/text/Duration.h"
 #include "host/text/Languages.h"
@@ -143,10 +144,9 @@ void Host::tellOfApplicationsFolder()
         mCommandLine.tell(mParts->marker->outlivesProcess());
     else
         mCommandLine.warn(
-            L"The folder " + toText(folder) +
-            L" cannot be entered: what ends Tessel cannot be remembered, and nothing is kept out "
-            L"in this session. This puts it right: chmod 700 " +
-            toText(folder));
+            translated(L"The folder {1} cannot be entered: what ends Tessel cannot be remembered, and "
+                       L"nothing is kept out in this session. This puts it right: chmod 700 {1}",
+                       folder));
 }
 
 void Host::tellOfStart()
@@ -161,7 +161,7 @@ void Host::tellOfStart()
 Result<> Host::makeParts()
 {
     if (running<CommandLine>())
-        return Failure{L"Another session runs in this process already."};
+        return Failure{translated(L"Another session runs in this process already.")};
     if (auto prepared = prepareProfileFolder(); !prepared)
         return prepared;
     tellWhoElseWritesTheProfile();
@@ -201,18 +201,18 @@ void Host::tellOfRegistry()
 Result<> Host::prepareProfileFolder()
 {
     if (mOptions.profileFolder.empty())
-        return Failure{
-            L"Tessel does not know where to keep its profile: HOME is not set, and no folder was given."};
+        return Failure{translated(
+            L"Tessel does not know where to keep its profile: HOME is not set, and no folder was given.")};
     const auto failed = [this](const std::wstring& reason)
     {
-        return Failure{L"The profile folder " + toText(mOptions.profileFolder) + L" cannot be made: " +
-                       reason + L"."};
+        return Failure{
+            translated(L"The profile folder {} cannot be made: {}.", mOptions.profileFolder, reason)};
     };
     if (const auto made = makePrivateFolder(mOptions.profileFolder); !made)
         return failed(made.sentence());
     std::error_code error;
     mOptions.profileFolder = std::filesystem::canonical(mOptions.profileFolder, error);
-    return error ? failed(toWide(error.message())) : Result<>();
+    return error ? failed(systemFailure(error.value()).sentence) : Result<>();
 }
 
 // What stands in the profile decides which programs run. Nobody else reaches what is in a folder of the
@@ -221,26 +221,29 @@ void Host::tellWhoElseWritesTheProfile()
 {
     const auto& profile = mOptions.profileFolder;
     const auto applications = profile / kApplicationsFolder;
-    if (!tellWhoElseWrites(L"profile folder", profile) || !othersMayEnter(profile))
+    if (!tellWhoElseWrites(Sentence<1>(L"The profile folder {}"), profile) || !othersMayEnter(profile))
         return;
-    tellWhoElseWrites(L"registry", profile / kRegistryFile);
-    if (tellWhoElseWrites(L"folder", applications))
-        tellWhoElseWrites(L"file", applications / KeptOut::kFileName);
+    tellWhoElseWrites(Sentence<1>(L"The registry {}"), profile / kRegistryFile);
+    if (tellWhoElseWrites(Sentence<1>(L"The folder {}"), applications))
+        tellWhoElseWrites(Sentence<1>(L"The file {}"), applications / KeptOut::kFileName);
 }
 
 // True when there was nothing to tell. What is not there yet will be the person's own.
-bool Host::tellWhoElseWrites(const std::wstring& kind, const std::filesystem::path& path)
+bool Host::tellWhoElseWrites(Sentence<1> kind, const std::filesystem::path& path)
 {
     std::error_code unreachable;
     const auto checked = checkNobodyElseWrites(path);
     if (checked || !std::filesystem::exists(path, unreachable))
         return true;
     const bool isFolder = std::filesystem::is_directory(path, unreachable);
-    mCommandLine.warn(L"The " + kind + L" " + toText(path) + L" is not safe: " + checked.sentence() +
-                      (checked.code() == kBelongsToAnother
-                           ? std::wstring(L", who could change what Tessel loads.")
-                           : L" and so decide what Tessel loads. This puts it right: chmod " +
-                                 std::wstring(isFolder ? L"700 " : L"600 ") + toText(path)));
+    const std::wstring what = translated(kind, path);
+    mCommandLine.warn(
+        checked.code() == kBelongsToAnother
+            ? translated(L"{} is not safe: it belongs to another user, who could change what Tessel loads.",
+                         what)
+            : translated(L"{} is not safe: other users may write to it and so decide what Tessel loads. This "
+                         L"puts it right: chmod {} {}",
+                         what, isFolder ? L"700" : L"600", path));
     return false;
 }
 
@@ -301,8 +304,8 @@ bool Host::finishLine()
 Result<> Host::runScript(const std::filesystem::path& script)
 {
     if (mScriptDepth == kDeepestScript)
-        return Failure{L"The script " + toText(script) +
-                       L" is not run: it seems to be a script that runs itself."};
+        return Failure{
+            translated(L"The script {} is not run: it seems to be a script that runs itself.", script)};
     ++mScriptDepth;
     auto done = Console(mCommandLine, mQuestions, *this).runScript(script);
     --mScriptDepth;

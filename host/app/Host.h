@@ -30,6 +30,7 @@
 #include "host/files/RemoteFiles.h"
 #include "host/messages/Questions.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -96,7 +97,7 @@ private:
     void judgeEarlierSessions();
     void tellOfApplicationsFolder();
     void tellWhoElseWritesTheProfile();
-    bool tellWhoElseWrites(const std::wstring& kind, const std::filesystem::path& path);
+    bool tellWhoElseWrites(Sentence<1> kind, const std::filesystem::path& path);
     void tellOfStart();
     void explainPlaces();
     void explainLoad(const LoadOutcome& outcome);

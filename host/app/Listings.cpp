@@ -6,6 +6,7 @@
 #include "host/app/Parts.h"
 #include "host/applications/KeptOutWords.h"
 #include "host/text/Json.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -102,9 +103,9 @@ Result<> variableList(Parts& parts, const Arguments& arguments)
         if (arguments.empty() || equalIgnoringCase(variable.name, arguments.front()))
             variables.push_back(json::object({{L"name", json::text(variable.name)},
                                               {L"value", valueOf(variable)},
-                                              {L"purpose", json::text(variable.purpose)}}));
+                                              {L"purpose", json::text(variable.purpose.english)}}));
     if (variables.empty())
-        return Failure{L"There is no variable called \"" + arguments.front() + L"\"."};
+        return Failure{translated(L"There is no variable called \"{}\".", arguments.front())};
     return sayDocument(parts, {{L"variables", json::list(variables)}});
 }
 } // namespace

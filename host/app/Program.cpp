@@ -31,6 +31,7 @@
 #include "host/console/TypedHistory.h"
 #include "host/platform/ProductFolders.h"
 #include "host/text/TerminalText.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 #include "host/text/Version.h"
 
@@ -71,7 +72,8 @@ void takeStandardDescriptors()
 
 void greet(CommandLine& commandLine)
 {
-    commandLine.confirm(toWide(kProgramLine) + L". Type HELP for the list of commands, QUIT to leave.");
+    commandLine.confirm(
+        translated(L"{}. Type HELP for the list of commands, QUIT to leave.", toWide(kProgramLine)));
 }
 
 // Nothing but documents is to be printed then.
@@ -222,8 +224,8 @@ int runProgram(int count, const char* const* arguments)
         output.write(parsed->text);
     if (output.written())
         return status;
-    std::fprintf(stderr, "Tessel: some of the output could not be written: %s.\n",
-                 toUtf8(output.written().sentence()).c_str());
-    return status == kAllWell ? kSomethingFailed : status;
+    return complain(
+        translated(L"Tessel: some of the output could not be written: {}.", output.written().sentence()),
+        status);
 }
 } // namespace tessel

@@ -7,7 +7,7 @@
 #include "host/platform/OrdinaryFile.h"
 #include "host/platform/PartFile.h"
 #include "host/registry/Registry.h"
-#include "host/text/Unicode.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -19,13 +19,12 @@ using Change = RegistryChange;
 
 Failure notExported(const std::wstring& key, const std::filesystem::path& file, const std::wstring& reason)
 {
-    return {L"The registry key \"" + key + L"\" is not exported to " + toWide(file.native()) + L": " +
-            reason + L"."};
+    return {translated(L"The registry key \"{}\" is not exported to {}: {}.", key, file, reason)};
 }
 
 Failure notImported(const std::filesystem::path& file, const std::wstring& reason)
 {
-    return {L"The file " + toWide(file.native()) + L" is not imported: " + reason + L"."};
+    return {translated(L"The file {} is not imported: {}.", file, reason)};
 }
 
 // What the store says of a command that failed in it, for the end of a sentence.
@@ -63,16 +62,22 @@ Result<> checkMayReplace(const std::filesystem::path& file)
     const auto there = readOrdinaryFile(file, kMostBytes);
     if (!there)
         return there.code() == kNothingThere ? Result<>() : there.failure();
-    return readRegistryText(*there) ? Result<>()
-                                    : Failure{L"another file stands there, which is no registry file"};
+    return readRegistryText(*there)
+               ? Result<>()
+               : Failure{translated(L"another file stands there, which is no registry file")};
 }
 
-std::wstring counted(const std::vector<Change>& changes)
+std::wstring countedKeys(const std::vector<Change>& changes)
 {
     const auto keys = std::ranges::count(changes, Change::Kind::kMakeKey, &Change::kind);
+    return translatedByCount(static_cast<std::size_t>(keys), L"{} key", L"{} keys");
+}
+
+// After "with".
+std::wstring countedValues(const std::vector<Change>& changes)
+{
     const auto values = std::ranges::count(changes, Change::Kind::kSetValue, &Change::kind);
-    return std::to_wstring(keys) + (keys == 1 ? L" key" : L" keys") + L" with " + std::to_wstring(values) +
-           (values == 1 ? L" value" : L" values");
+    return translatedByCount(static_cast<std::size_t>(values), L"{} value", L"{} values");
 }
 
 // What is to go and is not there has gone.
@@ -101,7 +106,7 @@ Result<std::wstring> exportRegistry(Registry& registry, const std::wstring& key,
     if (registry.find(key) == Registry::kNoKey)
         return notExported(key, file,
                            registry.mayHaveMissed() ? wordsOf(registry, registry.endOfCommand())
-                                                    : L"there is no such key");
+                                                    : translated(L"there is no such key"));
     const auto changes = changesThatMake(registry, key);
     if (registry.readFailed())
         return notExported(key, file, wordsOf(registry, registry.endOfCommand()));
@@ -112,7 +117,7 @@ Result<std::wstring> exportRegistry(Registry& registry, const std::wstring& key,
         return notExported(key, file, may.sentence());
     if (const auto written = replacePersonsFile(file, *text); !written)
         return notExported(key, file, written.sentence());
-    return L"Exported to " + toWide(file.native()) + L": " + counted(changes) + L".";
+    return translated(L"Exported to {}: {} with {}.", file, countedKeys(changes), countedValues(changes));
 }
 
 Result<std::wstring> importRegistry(Registry& registry, const std::filesystem::path& file)
@@ -129,6 +134,6 @@ Result<std::wstring> importRegistry(Registry& registry, const std::filesystem::p
             return notImported(file, wordsOf(registry, registry.endOfCommand()));
     if (const auto stored = registry.endOfCommand(); !stored)
         return notImported(file, wordsOf(registry, stored));
-    return L"Imported from " + toWide(file.native()) + L": " + counted(*changes) + L".";
+    return translated(L"Imported from {}: {} with {}.", file, countedKeys(*changes), countedValues(*changes));
 }
 } // namespace tessel

@@ -24,7 +24,7 @@ bool isBlank(wchar_t character)
 
 Failure failed(const std::wstring& name, const std::wstring& reason)
 {
-    return {L"The command \"" + name + L"\" failed: " + reason};
+    return {translated(L"The command \"{}\" failed: {}", name, reason)};
 }
 
 Result<> callHandler(const TsEdCommand& command, const CommandStack::Arguments& arguments,
@@ -49,7 +49,7 @@ Result<> call(const TsEdCommand& command, const CommandStack::Arguments& argumen
         if (command.builtIn)
             return command.builtIn(arguments);
         if (!arguments.empty() && command.usage.empty())
-            return failed(command.localName, L"it takes no arguments.");
+            return failed(command.localName, translated(L"it takes no arguments."));
         return callHandler(command, arguments, calls);
     }
     catch (const std::exception& error)
@@ -58,7 +58,8 @@ Result<> call(const TsEdCommand& command, const CommandStack::Arguments& argumen
     }
     catch (...)
     {
-        return failed(command.localName, L"it threw something that is not an error of the standard library.");
+        return failed(command.localName,
+                      translated(L"it threw something that is not an error of the standard library."));
     }
 }
 } // namespace

@@ -101,8 +101,8 @@ int CommandStack::addCommand(const wchar_t* group, const wchar_t* globalName, co
     added->localName = localName;
     if (const CommandText* text = find(globalName) ? nullptr : findCommandText(globalName)) // Modrig's
     {
-        added->summary = text->summary;
-        added->usage = text->usage;
+        added->summary = text->summary.english;
+        added->usage = text->usage.english;
         added->example = text->example;
     }
     added->owner = mCalls.path();

@@ -10,43 +10,50 @@ namespace tessel
 {
 namespace
 {
-constexpr wchar_t kSession[] = L"Session";
-constexpr wchar_t kApplications[] = L"Applications";
-constexpr wchar_t kSettings[] = L"Settings";
+constexpr auto kSession = Sentence(L"Session");
+constexpr auto kApplications = Sentence(L"Applications");
+constexpr auto kSettings = Sentence(L"Settings");
+constexpr auto kNothing = Sentence<>(L"");
 constexpr std::wstring_view kBetweenWays = L" | ";
 } // namespace
 
 const std::vector<CommandText>& commandTexts()
 {
     static const std::vector<CommandText> texts = {
-        {kSession, L"HELP", L"[command] | topic | --json",
-         L"Lists the commands, or tells how one is typed, or opens a help topic", L"HELP LOAD"},
-        {kSession, L"?", L"[command] | topic", L"The same as HELP", L"? LOAD"},
-        {kSession, L"QUIT", L"", L"Ends the session", L""},
-        {kSession, L"EXIT", L"", L"Ends the session", L""},
-        {kSession, L"SCRIPT", L"file", L"Runs the commands in a file", L"SCRIPT ~/morning.scr"},
-        {kSession, L"CD", L"[folder]", L"Shows or changes the current folder", L"CD \"~/My drawings\""},
-        {kSession, L"VERSION", L"", L"Shows the version", L""},
-        {kApplications, L"LOAD", L"file | address",
-         L"Loads a compiled module or a Lisp file, also from an address on the net",
+        {kSession, L"HELP", Sentence(L"[command] | topic | --json"),
+         Sentence(L"Lists the commands, or tells how one is typed, or opens a help topic"), L"HELP LOAD"},
+        {kSession, L"?", Sentence(L"[command] | topic"), Sentence(L"The same as HELP"), L"? LOAD"},
+        {kSession, L"QUIT", kNothing, Sentence(L"Ends the session"), L""},
+        {kSession, L"EXIT", kNothing, Sentence(L"Ends the session"), L""},
+        {kSession, L"SCRIPT", Sentence(L"file"), Sentence(L"Runs the commands in a file"),
+         L"SCRIPT ~/morning.scr"},
+        {kSession, L"CD", Sentence(L"[folder]"), Sentence(L"Shows or changes the current folder"),
+         L"CD \"~/My drawings\""},
+        {kSession, L"VERSION", kNothing, Sentence(L"Shows the version"), L""},
+        {kApplications, L"LOAD", Sentence(L"file | address"),
+         Sentence(L"Loads a compiled module or a Lisp file, also from an address on the net"),
          L"LOAD \"~/my lisp/hilbert.lsp\""},
-        {kApplications, L"UNLOAD", L"file", L"Unloads a compiled module", L"UNLOAD moon.bundle"},
-        {kApplications, L"APPS", L"[--json]", L"Lists what is loaded, and what could not be", L""},
-        {kApplications, L"DISABLE", L"file", L"Keeps an application out at starts; it stays in every list",
-         L"DISABLE moon.bundle"},
-        {kApplications, L"ENABLE", L"file",
-         L"Lets an application in again that was disabled or that ended Tessel", L"ENABLE moon.bundle"},
-        {kApplications, L"BISECT", L"[START|GOOD|BAD|STOP]",
-         L"Finds the application that makes trouble, in a few starts", L"BISECT START"},
-        {kApplications, L"MODRIG", L"", L"Loads and unloads applications, in a dialog", L""},
-        {kSettings, L"SETVAR", L"[variable [value]] | --json", L"Shows or sets system variables",
-         L"SETVAR LISPENABLED 0"},
-        {kSettings, L"PROFILE", L"[name] | --json", L"Shows or changes the current profile",
-         L"PROFILE Drafting"},
+        {kApplications, L"UNLOAD", Sentence(L"file"), Sentence(L"Unloads a compiled module"),
+         L"UNLOAD moon.bundle"},
+        {kApplications, L"APPS", Sentence(L"[--json]"),
+         Sentence(L"Lists what is loaded, and what could not be"), L""},
+        {kApplications, L"DISABLE", Sentence(L"file"),
+         Sentence(L"Keeps an application out at starts; it stays in every list"), L"DISABLE moon.bundle"},
+        {kApplications, L"ENABLE", Sentence(L"file"),
+         Sentence(L"Lets an application in again that was disabled or that ended Tessel"),
+         L"ENABLE moon.bundle"},
+        {kApplications, L"BISECT", Sentence(L"[START|GOOD|BAD|STOP]"),
+         Sentence(L"Finds the application that makes trouble, in a few starts"), L"BISECT START"},
+        {kApplications, L"MODRIG", kNothing, Sentence(L"Loads and unloads applications, in a dialog"), L""},
+        {kSettings, L"SETVAR", Sentence(L"[variable [value]] | --json"),
+         Sentence(L"Shows or sets system variables"), L"SETVAR LISPENABLED 0"},
+        {kSettings, L"PROFILE", Sentence(L"[name] | --json"),
+         Sentence(L"Shows or changes the current profile"), L"PROFILE Drafting"},
         {kSettings, L"REGISTRY",
-         L"LIST [key] [--json] | GET key [name] [--json] | SET key [name data] | DELETE key [name] | "
-         L"EXPORT key file [UTF8] | IMPORT file | RESTORE | RESET",
-         L"Shows and changes what is stored, takes it to files and back, mends a damaged registry",
+         Sentence(
+             L"LIST [key] [--json] | GET key [name] [--json] | SET key [name data] | DELETE key [name] | "
+             L"EXPORT key file [UTF8] | IMPORT file | RESTORE | RESET"),
+         Sentence(L"Shows and changes what is stored, takes it to files and back, mends a damaged registry"),
          L"REGISTRY EXPORT Software\\Tessel ~/tessel.reg UTF8"},
     };
     return texts;
@@ -68,7 +75,7 @@ std::vector<std::wstring> usageLines(const std::wstring& name, std::wstring_view
 {
     const std::wstring label = translated(L"Usage: ");
     std::vector<std::wstring> lines;
-    for (const auto& way : waysOfTyping(usage))
+    for (const auto& way : waysOfTyping(translateAndFill(std::wstring(usage).c_str(), {})))
         lines.push_back((lines.empty() ? label : std::wstring(displayWidth(label), L' ')) + name +
                         (way.empty() ? L"" : L" ") + way);
     return lines;

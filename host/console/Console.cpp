@@ -183,8 +183,7 @@ Result<> Console::runScript(const std::filesystem::path& script)
 {
     auto text = readOrdinaryFile(script, kLargestScript);
     if (!text)
-        return Failure{L"The script " + toWide(script.string()) + L" cannot be read: " + text.sentence() +
-                       L"."};
+        return Failure{translated(L"The script {} cannot be read: {}.", script, text.sentence())};
     std::istringstream lines(*std::move(text));
     return runLines(lines, toWide(script.string())) ? Result<>() : Failure{};
 }

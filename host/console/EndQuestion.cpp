@@ -1,6 +1,7 @@
 #include "host/console/EndQuestion.h"
 
 #include <cerrno>
+#include <string>
 #include <string_view>
 
 #include <fcntl.h>
@@ -8,14 +9,27 @@
 #include <unistd.h>
 
 #include "host/platform/Descriptor.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
 namespace
 {
-constexpr std::string_view kNo = "Tessel waits on.\n";
-constexpr std::string_view kQuestion =
-    "\nWhat is running does not come back. End Tessel? What is not stored yet is lost. [y/N] ";
+// In UTF-8. A signal's handler asks, which translates nothing.
+struct Words
+{
+    std::string question;
+    std::string no;
+    char yes = 'y';
+};
+Words theQuestion;
+
+bool isYes(char answer)
+{
+    constexpr char kToSmall = 'a' - 'A';
+    const char small = answer >= 'A' && answer <= 'Z' ? static_cast<char>(answer + kToSmall) : answer;
+    return small == 'y' || small == theQuestion.yes; // scripts know the English word
+}
 
 // A terminal that gives whole lines and shows what is typed, for the time of a question.
 class LineMode
@@ -66,17 +80,28 @@ char readAnswer(int terminal)
 }
 } // namespace
 
+void prepareEndQuestion()
+{
+    theQuestion.question =
+        "\n" +
+        toUtf8(translated(
+            L"What is running does not come back. End Tessel? What is not stored yet is lost. [y/N]")) +
+        " ";
+    theQuestion.no = toUtf8(translated(L"Tessel waits on.")) + "\n";
+    theQuestion.yes = toUtf8(foldCase(translated(L"Yes"))).front();
+}
+
 EndAnswer askWhetherToEnd() noexcept
 {
     const Descriptor terminal(open("/dev/tty", O_RDWR | O_CLOEXEC | O_NOCTTY));
     if (!terminal || tcgetpgrp(terminal.number()) != getpgrp())
         return EndAnswer::kNobodyToAsk;
     const LineMode lines(terminal.number());
-    show(terminal.number(), kQuestion);
+    show(terminal.number(), theQuestion.question);
     const char answer = readAnswer(terminal.number());
-    if (answer == 'y' || answer == 'Y')
+    if (isYes(answer))
         return EndAnswer::kEnd;
-    show(terminal.number(), kNo);
+    show(terminal.number(), theQuestion.no);
     return EndAnswer::kWaitOn;
 }
 } // namespace tessel

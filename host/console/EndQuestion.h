@@ -10,6 +10,9 @@ enum class EndAnswer
     kNobodyToAsk // there is no terminal whose foreground the program has
 };
 
+// Finds the words to ask in, in the person's language; once, before anything is asked.
+void prepareEndQuestion();
+
 // Asks the person at the terminal and waits for the answer; safe in a signal handler, which is the only place
 // left to ask from.
 EndAnswer askWhetherToEnd() noexcept;

@@ -1,7 +1,7 @@
 #include "host/console/InterruptKey.h"
 
 #include <cerrno>
-#include <string_view>
+#include <string>
 #include <utility>
 
 #include <fcntl.h>
@@ -9,6 +9,7 @@
 
 #include "host/commands/LastWords.h"
 #include "host/console/EndQuestion.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -19,7 +20,7 @@ LineRunner* theKeysRunner = nullptr;
 volatile std::sig_atomic_t theWriteEnd = -1;
 
 constexpr int kEndedByKey = 128 + SIGINT; // as shells have it
-constexpr std::string_view kNobodysFault = "Tessel ends: what is running does not come back.\n";
+std::string theLastLine;                  // made while there is still time to translate it
 
 // Who has sent the signal for the third time means it: there is no other way to tell an application that does
 // not come back.
@@ -27,7 +28,7 @@ void sayWhyItEnds()
 {
     if (sayLastWords(SIGINT))
         return;
-    [[maybe_unused]] const auto written = write(STDERR_FILENO, kNobodysFault.data(), kNobodysFault.size());
+    [[maybe_unused]] const auto written = write(STDERR_FILENO, theLastLine.data(), theLastLine.size());
 }
 
 // What runs would have to come back for a better end.
@@ -61,6 +62,8 @@ void onKey(int)
 InterruptKey::InterruptKey(LineRunner& runner)
 {
     theKeysRunner = &runner;
+    prepareEndQuestion();
+    theLastLine = toUtf8(translated(L"Tessel ends: what is running does not come back.")) + "\n";
     if (auto opened = openPipe())
         mPipe = *std::move(opened);
     for (const Descriptor* end : {&mPipe.output, &mPipe.input})

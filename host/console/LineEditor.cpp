@@ -80,7 +80,7 @@ LineEditor::Terminal::Terminal(const std::vector<std::wstring>& earlier, Complet
     el_wset(editLine, EL_HIST, history_w, history);
     el_wset(editLine, EL_GETCFN, &Terminal::readCharacter);
     el_wset(editLine, EL_EDITOR, L"emacs");
-    el_wset(editLine, EL_ADDFN, kCompletionFunction, L"Complete what is typed", &Terminal::complete);
+    el_wset(editLine, EL_ADDFN, kCompletionFunction, L"completion", &Terminal::complete);
     el_wset(editLine, EL_BIND, L"^I", kCompletionFunction, nullptr);
 }
 

@@ -16,6 +16,7 @@
 #include "host/platform/PrivateFolder.h"
 #include "host/platform/SystemFailure.h"
 #include "host/text/Credentials.h"
+#include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
 // The file is that of the line editor's library: a first line that names the format, then a line each, in
@@ -24,6 +25,8 @@ namespace tessel
 {
 namespace
 {
+constexpr auto kNotUsed = Sentence<2>(L"The history of typed lines, {}, is not used: {}.");
+constexpr auto kNotWritten = Sentence<2>(L"The history of typed lines, {}, cannot be written: {}.");
 constexpr std::string_view kFormat = "_HiStOrY_V2_";
 constexpr std::uintmax_t kLargestHistory = std::uintmax_t{16} << 20;
 // Shortened not at each start, but when half of it is of no use.
@@ -147,18 +150,17 @@ void shorten(const std::filesystem::path& path)
 }
 } // namespace
 
-Failure TypedHistory::giveUp(const std::wstring& whatFailed, const std::wstring& reason)
+Failure TypedHistory::giveUp(Sentence<2> whatFailed, const std::wstring& reason)
 {
     mGivenUp = true;
-    return {L"The history of typed lines, " + toWide(mFile.string()) + L", " + whatFailed + L": " + reason +
-            L"."};
+    return {translated(whatFailed, mFile, reason)};
 }
 
 Result<std::vector<std::wstring>> TypedHistory::read()
 {
     const auto content = readOrdinaryFile(mFile, kLargestHistory);
     if (!content && content.code() != kNothingThere)
-        return giveUp(L"is not used", content.sentence());
+        return giveUp(kNotUsed, content.sentence());
     std::vector<std::wstring> lines;
     if (!content)
         return lines;
@@ -179,12 +181,12 @@ Result<> TypedHistory::add(const std::wstring& line)
         return {};
     Descriptor file = openAlone(mFile);
     if (!file)
-        return giveUp(L"cannot be written", systemFailure(errno).sentence);
+        return giveUp(kNotWritten, systemFailure(errno).sentence);
     if (const auto ordinary = checkOpened(file); !ordinary)
-        return giveUp(L"is not used", ordinary.sentence());
+        return giveUp(kNotUsed, ordinary.sentence());
     auto written = file.write(beginning(file.number()) + encoded(kept) + "\n");
     if (written)
         written = file.close();
-    return written ? written : giveUp(L"cannot be written", written.sentence());
+    return written ? written : giveUp(kNotWritten, written.sentence());
 }
 } // namespace tessel

@@ -7,6 +7,7 @@
 #include <vector>
 
 #include "host/text/Result.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -29,7 +30,7 @@ public:
     Result<> add(const std::wstring& line);
 
 private:
-    Failure giveUp(const std::wstring& whatFailed, const std::wstring& reason);
+    Failure giveUp(Sentence<2> whatFailed, const std::wstring& reason);
 
     std::filesystem::path mFile;
     bool mGivenUp = false;

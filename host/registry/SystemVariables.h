@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "host/text/Result.h"
+#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -32,7 +33,7 @@ public:
         std::int16_t smallest = 0; // of a number
         std::int16_t largest = 0;
         Storage storage = Storage::kSession;
-        std::wstring purpose; // one line
+        Sentence<> purpose = Sentence(L""); // one line
     };
 
     // The host's own variables, stored ones as the registry has them below the product's root. A stored value

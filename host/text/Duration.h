@@ -6,6 +6,8 @@
 #include <sstream>
 #include <string>
 
+#include "host/text/Translation.h"
+
 namespace tessel
 {
 // "0.4 ms", "37 ms", "2.1 s".
@@ -21,6 +23,9 @@ inline std::wstring durationInWords(std::chrono::microseconds time)
         text << milliseconds.count() << L" ms";
     else
         text << milliseconds / kSecond << L" s";
-    return text.str();
+    std::wstring words = text.str();
+    if (const auto mark = words.find(L'.'); mark != words.npos)
+        words.replace(mark, 1, translated(L".")); // between whole numbers and tenths
+    return words;
 }
 } // namespace tessel

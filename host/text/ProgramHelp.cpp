@@ -17,7 +17,11 @@ void translateHelp(CLI::App& app)
     words.label("Positionals", toUtf8(translated(L"Positionals")));
     words.label("REQUIRED", toUtf8(translated(L"REQUIRED")));
     words.label("TEXT", toUtf8(translated(L"TEXT")));
-    app.get_help_ptr()->description(toUtf8(translated(L"Print this help message and exit")));
+    words.label("Excludes", toUtf8(translated(L"Excludes")));
+    constexpr auto kHelp =
+        Sentence(L"Print this help message and exit"); // unless the program has its own words
+    if (toWide(app.get_help_ptr()->get_description()) == kHelp.english)
+        app.get_help_ptr()->description(toUtf8(translated(kHelp)));
     for (CLI::Option* option : app.get_options())
         if (option->get_group() == "Options")
             option->group(toUtf8(translated(L"Options")));

@@ -11,6 +11,7 @@
 #include "host/ui/KeptSignals.h"
 #include "host/ui/SessionEnd.h"
 #include "host/ui/Waiting.h"
+#include "host/ui/Words.h"
 #include "host/ui/platform/Scripts.h"
 #include "host/ui/platform/TextKeys.h"
 #include "host/ui/platform/Windowing.h"
@@ -65,7 +66,7 @@ bool tsuiPrepareWindows()
 {
     if (!tsuiHasDisplay())
     {
-        tsutPrintf(L"Tessel cannot open a window: there is no display.\n");
+        tsutPrintf(L"%s\n", NSStringToWstring(tessel::word(@"NO_DISPLAY")).c_str());
         return false;
     }
     if (!gPrepared)

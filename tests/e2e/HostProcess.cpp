@@ -105,6 +105,7 @@ HostSession::HostSession()
     set("HOME", (mFolder / "home").string());
     set("TERM", "xterm");
     set("LC_ALL", "C.UTF-8");
+    set("LANGUAGE", "");
     set("NO_COLOR", "1");
     set("PAGER", "");
     set("XDG_DATA_HOME", "");
