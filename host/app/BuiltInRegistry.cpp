@@ -181,6 +181,14 @@ Result<> exportTo(Parts& parts, const std::wstring& path, const Arguments& argum
                                form));
 }
 
+Result<> importFrom(Parts& parts, const std::wstring& file)
+{
+    const auto imported = importRegistry(*parts.registry, toPath(fullPath(parts, file)));
+    if (imported)
+        parts.registryNews.noteChange();
+    return tell(parts, imported);
+}
+
 // What is damaged gives way to the copy of what it held.
 Result<> restore(Parts& parts)
 {
@@ -209,7 +217,7 @@ Result<> registryCommand(Parts& parts, const Arguments& arguments)
         (arguments.size() == 3 || (arguments.size() == 4 && isUtf8(at(arguments, 3)))))
         return exportTo(parts, path, arguments);
     if (equalIgnoringCase(action, L"IMPORT") && arguments.size() == 2)
-        return tell(parts, importRegistry(*parts.registry, toPath(fullPath(parts, path))));
+        return importFrom(parts, path);
     if (equalIgnoringCase(action, L"RESTORE") && arguments.size() == 1)
         return restore(parts);
     if (equalIgnoringCase(action, L"RESET") && arguments.size() == 1)

@@ -92,7 +92,8 @@ bool Host::start()
     if (!mOptions.safe)
     {
         mParts->sayRecordsTakenAlong();
-        mParts->demandLoading.loadAtStart();
+        mParts->demandLoading.loadAtStart(mParts->registryNews.isThere());
+        mParts->registryNews.noteRead();
     }
     finishLine();
     tellOfStart();
@@ -295,9 +296,9 @@ bool Host::runLisp(const std::wstring& input, const Interruption::Wish& wish)
 bool Host::finishLine()
 {
     // What the line wrote is stored before the queue runs: queued Lisp may take its time, or never end.
-    const bool stored = mCommandLine.tell(mParts->registry->endOfCommand());
+    const bool stored = mCommandLine.tell(mParts->layered->endOfCommand());
     mParts->lisp->runQueue();
-    return mCommandLine.tell(mParts->registry->endOfCommand()) && stored;
+    return mCommandLine.tell(mParts->layered->endOfCommand()) && stored;
 }
 
 Result<> Host::runScript(const std::filesystem::path& script)
@@ -322,7 +323,7 @@ void Host::end()
         mCommandLine.print(L"\n");
     mParts->linker->unloadAll();
     mParts->keptOut.noteGoodEnd();
-    mCommandLine.tell(mParts->registry->endOfCommand());
+    mCommandLine.tell(mParts->layered->endOfCommand());
     mCommandLine.tell(mParts->registry->keepCopy());
     mInterruptible = nullptr;
     mInterruptibleRegistry = nullptr;

@@ -1,6 +1,8 @@
 #include "host/app/Options.h"
 
+#include <filesystem>
 #include <sstream>
+#include <system_error>
 
 #include <CLI/CLI.hpp>
 
@@ -35,6 +37,15 @@ std::string isNamedFile(const std::string& file)
     return file.empty() ? words(Sentence(L"a file is wanted, and nothing is named")) : std::string();
 }
 
+// A layout that is to be tried and is not there would not be missed.
+std::string isThere(const std::string& folder)
+{
+    std::error_code unreachable;
+    return std::filesystem::is_directory(folder, unreachable)
+               ? ""
+               : toUtf8(translated(L"{} is no folder", toWide(folder)));
+}
+
 void declare(CLI::App& app, Options& options)
 {
     app.footer(words(kAfterword));
@@ -47,7 +58,8 @@ void declare(CLI::App& app, Options& options)
     app.add_option("--layout-dir", options.layoutFolder,
                    words(Sentence(L"Take the values for everybody in this folder, too, to try them")))
         ->type_name("DIR")
-        ->check(isNamed);
+        ->check(isNamed)
+        ->check(isThere);
     auto* script = app.add_option("--script", options.script, words(Sentence(L"Run the commands in a file")))
                        ->type_name("SCRIPT");
     // One argument each, so that a command may begin with a dash and a file name may follow.

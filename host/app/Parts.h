@@ -37,6 +37,7 @@
 #include "host/registry/LayeredRegistry.h"
 #include "host/registry/Profiles.h"
 #include "host/registry/Registry.h"
+#include "host/registry/RegistryNews.h"
 #include "host/registry/SystemVariables.h"
 #include "host/resources/ResourceModules.h"
 #include "host/text/CommandLine.h"
@@ -88,6 +89,7 @@ struct Parts
                                        foundations.commandLine.warn(sentence);
                                    }};
     Profiles profiles{*layered, kProductRegistryRoot};
+    RegistryNews registryNews{*layered, kProductRegistryRoot};
     Owned<SystemVariables> variables{&*layered, kProductRegistryRoot};
     Owned<RunningMarker> marker{foundations.profileFolder / kApplicationsFolder};
     KeptOut keptOut{foundations.profileFolder / kApplicationsFolder};

@@ -115,7 +115,7 @@ Result<std::wstring> exportRegistry(Registry& registry, const std::wstring& key,
         return notExported(key, file, text.sentence());
     if (const auto may = checkMayReplace(file); !may)
         return notExported(key, file, may.sentence());
-    if (const auto written = replaceFile(file, *text); !written)
+    if (const auto written = replacePersonsFile(file, *text); !written)
         return notExported(key, file, written.sentence());
     return translated(L"Exported to {}: {} with {}.", file, countedKeys(changes), countedValues(changes));
 }

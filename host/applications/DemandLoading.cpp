@@ -46,15 +46,24 @@ DemandLoading::DemandLoading(std::filesystem::path plugInsFolder, ApplicationRec
 {
 }
 
-void DemandLoading::loadAtStart() const
+void DemandLoading::loadAtStart(bool withNews) const
 {
     // Asked before anything is loaded: what is loaded may write a record of its own.
     const auto plugIns = unrecordedPlugIns();
     for (const auto& record : mRecords.all())
-        if ((record.loadReasons & TSRX_LOAD_AT_HOST_START) != 0 && isWorthTrying(record))
+        if (isDueAtStart(record, withNews) && isWorthTrying(record))
             mLoad(record.module);
     for (const auto& plugIn : plugIns)
         mLoad(toWide(plugIn.native()));
+}
+
+bool DemandLoading::isDueAtStart(const ApplicationRecord& record, bool withNews) const
+{
+    if ((record.loadReasons & TSRX_LOAD_AT_HOST_START) != 0)
+        return true;
+    // A record that comes with Tessel is nothing that the application has decided.
+    return withNews && (record.loadReasons & TSRX_LOAD_ON_COMMAND) != 0 && mRecords.read(record.name) &&
+           realPath(std::filesystem::path(toUtf8(record.module)).parent_path()) == realPath(mPlugInsFolder);
 }
 
 bool DemandLoading::standsInAnotherHost(const std::wstring& module) const

@@ -34,7 +34,10 @@ public:
     // What cannot be loaded does not keep the start from going on.
     //
     // Of a record whose file is gone it is told once, and not at every start.
-    void loadAtStart() const;
+    //
+    // With news in the registry, what stands in the PlugIns folder is loaded even if its record has it wait
+    // for a command: what it found there made it content with that, and it may find something else now.
+    void loadAtStart(bool withNews) const;
 
     // Loads the application that has such a command, by its local or its global name, in any case of letters,
     // and that wants to be loaded for it. A "_" in front means the global name alone. False when nothing was
@@ -49,6 +52,7 @@ private:
     std::vector<std::filesystem::path> plugIns() const;
     std::vector<std::filesystem::path> unrecordedPlugIns() const;
     bool loadNamesake(std::wstring_view command) const;
+    bool isDueAtStart(const ApplicationRecord& record, bool withNews) const;
     bool standsInAnotherHost(const std::wstring& module) const;
     std::wstring takeAlong(ApplicationRecord record, const std::wstring& plugIn) const;
     bool isWorthTrying(ApplicationRecord record) const;

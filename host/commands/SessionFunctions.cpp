@@ -3,7 +3,7 @@
 
 #include "host/commands/EndRequest.h"
 #include "host/commands/RunningMarker.h"
-#include "host/registry/Registry.h"
+#include "host/registry/LayeredRegistry.h"
 #include "host/text/CommandLine.h"
 #include "host/text/Running.h"
 
@@ -28,13 +28,13 @@ void tsrxBeforeWaiting(bool actionIsOver)
 {
     if (auto* marker = running<tessel::RunningMarker>())
         marker->noteWaiting();
-    auto* registry = running<tessel::Registry>();
+    auto* registry = running<tessel::LayeredRegistry>();
     if (!registry)
         return;
     if (actionIsOver)
         tellOf(registry->endOfCommand());
     else
-        registry->storeSoFar();
+        registry->own().storeSoFar();
 }
 
 bool tsrxOtherSessionRuns()

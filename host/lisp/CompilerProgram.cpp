@@ -63,16 +63,7 @@ Failure notWritten(const fs::path& output, const std::wstring& reason)
 // Whole or not at all: a build that is stopped midway must not leave a file that looks finished.
 Result<> writeWhole(const fs::path& output, const std::string& bytes)
 {
-    const fs::path folder = output.has_parent_path() ? output.parent_path() : ".";
-    PartFile::clearLeftOvers(folder);
-    PartFile part(folder);
-    if (!part.made())
-        return notWritten(output, part.made().sentence());
-    Result<> done = part.write(bytes);
-    if (done)
-        done = part.letOthersRead();
-    if (done)
-        done = part.moveTo(output);
+    auto done = replacePersonsFile(output, bytes);
     return done ? done : notWritten(output, done.sentence());
 }
 

@@ -16,8 +16,9 @@ namespace tessel
 {
 namespace
 {
-constexpr std::string_view kPrefix = ".part-";
+constexpr std::string_view kPrefix = ".tessel-part-"; // what others leave there is not cleared away
 constexpr mode_t kForAll = 0666;
+constexpr mode_t kRights = 0777;
 
 // Where the system cannot say, it has: to make another file would not help.
 bool hasName(int file)
@@ -74,11 +75,14 @@ Result<> PartFile::write(std::string_view bytes)
     return mFile.write(bytes);
 }
 
-Result<> PartFile::letOthersRead()
+Result<> PartFile::letOthersRead(const std::filesystem::path& place)
 {
     const mode_t taken = umask(0);
     umask(taken);
-    return fchmod(mFile.number(), kForAll & ~taken) == 0 ? Result<>() : systemFailure(errno);
+    struct stat there = {};
+    const bool standsThere = lstat(place.c_str(), &there) == 0 && S_ISREG(there.st_mode);
+    const mode_t rights = standsThere ? there.st_mode & kRights : kForAll & ~taken;
+    return fchmod(mFile.number(), rights) == 0 ? Result<>() : systemFailure(errno);
 }
 
 Result<> PartFile::moveTo(const std::filesystem::path& place)
@@ -121,5 +125,18 @@ Result<> replaceFile(const std::filesystem::path& place, std::string_view bytes)
         return part.made();
     const auto written = part.write(bytes);
     return written ? part.moveTo(place) : written;
+}
+
+Result<> replacePersonsFile(const std::filesystem::path& place, std::string_view bytes)
+{
+    const auto folder = place.has_parent_path() ? place.parent_path() : ".";
+    PartFile::clearLeftOvers(folder);
+    PartFile part(folder);
+    if (!part.made())
+        return part.made();
+    auto done = part.write(bytes);
+    if (done)
+        done = part.letOthersRead(place);
+    return done ? part.moveTo(place) : done;
 }
 } // namespace tessel

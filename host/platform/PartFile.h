@@ -26,8 +26,9 @@ public:
 
     // Both fail with the system's words.
     Result<> write(std::string_view bytes);
-    // Gives others the right to read it, as is usual for the person's new files.
-    Result<> letOthersRead();
+    // Gives others the rights that they have to the file at the place, or, where none stands, those that are
+    // usual for the person's new files.
+    Result<> letOthersRead(const std::filesystem::path& place);
 
     // Puts it in place of what stands there: from then on all of it is on the disk, by that name. Fails with
     // the system's words.
@@ -51,4 +52,8 @@ private:
 // The file at that place holds these bytes, or what it held before, whatever happens meanwhile; the person
 // alone can read it. Clears left-overs away. Fails with the system's words.
 Result<> replaceFile(const std::filesystem::path& place, std::string_view bytes);
+
+// The same for a file that the person has named: others may read it as they could read what stood there, or
+// as is usual for new files.
+Result<> replacePersonsFile(const std::filesystem::path& place, std::string_view bytes);
 } // namespace tessel

@@ -12,6 +12,19 @@ namespace
 {
 // Unlike every handle that the person's own registry gives.
 constexpr std::uintptr_t kFirstLayeredHandle = 0x40000001;
+
+std::map<std::wstring, std::wstring> byFoldedNames(const auto& values)
+{
+    std::map<std::wstring, std::wstring> result;
+    for (const auto& value : values)
+        result.emplace(foldCase(value.name), value.data);
+    return result;
+}
+
+bool areAlike(const auto& some, const auto& others)
+{
+    return byFoldedNames(some) == byFoldedNames(others);
+}
 } // namespace
 
 LayeredRegistry::LayeredRegistry(Registry& own, RegistryLayers layers, Say say)
@@ -182,6 +195,39 @@ std::optional<std::filesystem::path> LayeredRegistry::laidDownIn(Key key, std::w
 {
     const auto* laidDown = isPlain() ? nullptr : mLayers.policy.value(pathOf(key), name);
     return laidDown ? std::optional(laidDown->file) : std::nullopt;
+}
+
+void LayeredRegistry::expectReplacement(Key key)
+{
+    if (isPlain() || mBefore.contains(key))
+        return;
+    const std::wstring& path = pathOf(key);
+    if (mLayers.policy.values(path).empty() && mLayers.defaults.values(path).empty())
+        return;
+    const Key own = ownKey(key);
+    mBefore.emplace(key,
+                    Before{key, own == Registry::kNoKey ? std::vector<Registry::Value>() : mOwn.values(own),
+                           values(key)});
+}
+
+Result<> LayeredRegistry::endOfCommand()
+{
+    for (const auto& [key, before] : std::exchange(mBefore, {}))
+        putBackIfNothingChanged(before);
+    return mOwn.endOfCommand();
+}
+
+// What fails here fails in all of the command, which is then undone and told.
+void LayeredRegistry::putBackIfNothingChanged(const Before& before)
+{
+    const Key own = ownKey(before.key);
+    const auto now = own == Registry::kNoKey ? std::vector<Registry::Value>() : mOwn.values(own);
+    if (!areAlike(now, before.counting) || areAlike(now, before.own))
+        return;
+    for (const auto& value : now)
+        static_cast<void>(mOwn.removeValue(own, value.name));
+    for (const auto& value : before.own)
+        static_cast<void>(mOwn.writeValue(own, value.name, value.data));
 }
 
 HKEY LayeredRegistry::openHandle(Key key)

@@ -46,6 +46,9 @@ public:
     // About what is laid out and does not count.
     const std::vector<std::wstring>& sentences() const { return mLayers.sentences; }
 
+    // Tells what is laid out today from what was laid out another day.
+    std::uint32_t markOfLayers() const { return mLayers.mark; }
+
     // All as in Registry.
     Key find(std::wstring_view path, Key from = Registry::kRoot);
     Result<Key> create(std::wstring_view path, Key from);
@@ -60,6 +63,12 @@ public:
 
     // The file in which the administrator has laid the value down, if one has: it stands before the person's.
     std::optional<std::filesystem::path> laidDownIn(Key key, std::wstring_view name) const;
+
+    // Who replaces all values of a key calls it before the first change, and `endOfCommand` in place of the
+    // own registry's: where what is the person's own is what counted before, it becomes again what it was
+    // then. A list that was stored as it had been read is no wish of the person's.
+    void expectReplacement(Key key);
+    Result<> endOfCommand();
 
     HKEY openHandle(Key key);
     std::optional<Key> keyOf(HKEY handle) const;
@@ -76,6 +85,13 @@ private:
     Key keyFor(const std::wstring& path);
     bool isThere(const std::wstring& path);
     Key ownKey(Key key);
+    struct Before
+    {
+        Key key;
+        std::vector<Registry::Value> own;
+        std::vector<Value> counting;
+    };
+    void putBackIfNothingChanged(const Before& before);
     void tellLaidDown(const std::wstring& path, const RegistryTree::Value& value);
 
     Registry& mOwn;
@@ -84,6 +100,7 @@ private:
     std::vector<std::wstring> mPaths;  // by key, from 1
     std::map<std::wstring, Key> mKeys; // by folded paths
     std::set<std::wstring> mTold;      // folded paths of keys
+    std::map<Key, Before> mBefore;     // of keys with values that are laid out
     std::unordered_map<HKEY, Key> mHandles;
     std::uintptr_t mNextHandle;
 };

@@ -101,7 +101,10 @@ LONG RegEnumValueW(HKEY key, DWORD index, wchar_t* name, DWORD* nameLength, DWOR
 LONG RegDeleteValueW(HKEY key, const wchar_t* name)
 {
     const Target target = targetOf(key);
-    return target ? target.registry->removeValue(target.key, orEmpty(name)).code() : ERROR_INVALID_HANDLE;
+    if (!target)
+        return ERROR_INVALID_HANDLE;
+    target.registry->expectReplacement(target.key);
+    return target.registry->removeValue(target.key, orEmpty(name)).code();
 }
 
 LONG RegCloseKey(HKEY key)
@@ -128,8 +131,10 @@ LONG tsRegGetValue(HKEY key, const wchar_t* name, DWORD, DWORD* type, void* data
 LONG tsudRegSetString(HKEY key, const wchar_t* name, const wchar_t* data)
 {
     const Target target = targetOf(key);
-    return target ? target.registry->writeValue(target.key, orEmpty(name), orEmpty(data)).code()
-                  : ERROR_INVALID_HANDLE;
+    if (!target)
+        return ERROR_INVALID_HANDLE;
+    target.registry->expectReplacement(target.key);
+    return target.registry->writeValue(target.key, orEmpty(name), orEmpty(data)).code();
 }
 
 bool tsRegIsLaidDown(HKEY key, const wchar_t* name, wchar_t* place, std::size_t capacity)

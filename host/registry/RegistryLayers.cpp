@@ -5,6 +5,8 @@
 #include <system_error>
 #include <utility>
 
+#include <zlib.h>
+
 #include "host/platform/OrdinaryFile.h"
 #include "host/registry/KeyPath.h"
 #include "host/text/Translation.h"
@@ -19,27 +21,55 @@ namespace
 constexpr std::uintmax_t kMostLayerBytes = std::uintmax_t{64} << 20;
 constexpr wchar_t kKeySeparator = L'\\';
 
-std::vector<fs::path> registryFilesIn(const fs::path& folder)
+std::wstring doesNotCount(const fs::path& place, const std::wstring& reason)
+{
+    return translated(L"The values for everybody in {} do not count: {}.", place, reason);
+}
+
+// None where there is no such folder. Fails with the system's words.
+Result<std::vector<fs::path>> registryFilesIn(const fs::path& folder)
 {
     std::vector<fs::path> files;
-    std::error_code none;
-    for (auto entry = fs::directory_iterator(folder, none); !none && entry != fs::directory_iterator();
-         entry.increment(none))
+    std::error_code failed;
+    for (auto entry = fs::directory_iterator(folder, failed); !failed && entry != fs::directory_iterator();
+         entry.increment(failed))
         if (equalIgnoringCase(toWide(entry->path().extension().native()), L".reg"))
             files.push_back(entry->path());
+    if (failed && failed != std::errc::no_such_file_or_directory)
+        return Failure{toWide(failed.message())};
     std::ranges::sort(files);
     return files;
 }
 
-void take(const fs::path& file, RegistryTree& tree, std::vector<std::wstring>& sentences)
+std::uint32_t markAfter(std::uint32_t mark, std::string_view bytes)
+{
+    return static_cast<std::uint32_t>(
+        crc32_z(mark, reinterpret_cast<const unsigned char*>(bytes.data()), bytes.size()));
+}
+
+void take(const fs::path& file, RegistryTree& tree, RegistryLayers& layers)
 {
     const auto bytes = readOrdinaryFile(file, kMostLayerBytes);
     const auto changes = bytes ? readRegistryText(*bytes) : bytes.failure();
-    if (changes)
-        tree.apply(*changes, file);
+    if (!changes)
+    {
+        layers.sentences.push_back(doesNotCount(file, changes.sentence()));
+        return;
+    }
+    tree.apply(*changes, file);
+    layers.mark = markAfter(markAfter(layers.mark, &tree == &layers.policy ? "policy" : "default"), *bytes);
+}
+
+// False where the folder cannot be read: nothing in it counts then, not a part of it.
+bool takeAll(const fs::path& folder, RegistryTree& tree, RegistryLayers& layers)
+{
+    const auto files = registryFilesIn(folder);
+    if (!files)
+        layers.sentences.push_back(doesNotCount(folder, files.sentence()));
     else
-        sentences.push_back(
-            translated(L"The values for everybody in {} do not count: {}.", file, changes.sentence()));
+        for (const fs::path& file : *files)
+            take(file, tree, layers);
+    return static_cast<bool>(files);
 }
 } // namespace
 
@@ -164,12 +194,8 @@ RegistryLayers readRegistryLayers(const std::vector<fs::path>& folders)
 {
     RegistryLayers layers;
     for (const fs::path& folder : folders)
-    {
-        for (const fs::path& file : registryFilesIn(folder))
-            take(file, layers.defaults, layers.sentences);
-        for (const fs::path& file : registryFilesIn(folder / "policy"))
-            take(file, layers.policy, layers.sentences);
-    }
+        if (takeAll(folder, layers.defaults, layers)) // otherwise all in it has been told of
+            takeAll(folder / "policy", layers.policy, layers);
     return layers;
 }
 } // namespace tessel

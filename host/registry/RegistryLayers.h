@@ -5,6 +5,7 @@
 // their names. `*.reg` in it are defaults, `policy/*.reg` are policy.
 #pragma once
 
+#include <cstdint>
 #include <filesystem>
 #include <map>
 #include <memory>
@@ -61,12 +62,13 @@ struct RegistryLayers
 {
     RegistryTree defaults;
     RegistryTree policy;
-    std::vector<std::wstring> sentences; // about files that could not be read or understood, and do not count
+    std::vector<std::wstring> sentences; // about what could not be read or understood, and does not count
+    std::uint32_t mark = 0;              // of the files that count: others have another one, none have 0
 
     bool isEmpty() const { return defaults.isEmpty() && policy.isEmpty(); }
 };
 
-// Folders that are not there count for nothing.
+// Folders that are not there count for nothing, and nothing is said of them.
 RegistryLayers readRegistryLayers(const std::vector<std::filesystem::path>& folders);
 
 // The parts of a key path, empty ones passed over.

@@ -26,6 +26,7 @@ constexpr std::size_t kUnitBytes = 2;
 constexpr int kDigitBits = 4;
 constexpr std::size_t kDigitsOfByte = 2;
 constexpr std::size_t kBytesInLine = 24;
+constexpr std::size_t kMostKeysInPath = 512; // the registry cannot remove what is much deeper
 constexpr auto kNoCharacter =
     Sentence<1>(L"in line {} a character of the number 0 stands, which no text has");
 
@@ -152,12 +153,23 @@ private:
         auto key = belowRoot(path.substr(goes ? 1 : 0));
         if (!key)
             return Failure{translated(L"in line {} a key stands that is not below HKEY_CURRENT_USER", here)};
+        if (isTooDeep(*key))
+            return Failure{
+                translated(L"in line {} a key lies below more than {} others", here, kMostKeysInPath - 1)};
         if (goes && key->empty())
             return Failure{translated(L"in line {} all of HKEY_CURRENT_USER would go", here)};
         using Kind = RegistryChange::Kind;
         mChanges.push_back({goes ? Kind::kRemoveKey : Kind::kMakeKey, *key, L"", L"", here});
         mKey = goes ? std::nullopt : std::move(key);
         return {};
+    }
+
+    static bool isTooDeep(std::wstring_view path)
+    {
+        std::size_t depth = 0;
+        while (!path.empty() && depth <= kMostKeysInPath)
+            depth += takeKeyPart(path).empty() ? 0 : 1;
+        return depth > kMostKeysInPath;
     }
 
     static std::optional<std::wstring> belowRoot(std::wstring_view path)

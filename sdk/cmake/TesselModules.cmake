@@ -12,11 +12,19 @@
 #   A test of ctest: Tessel loads the module in a profile of the test's own, the commands are typed, and every text has
 #   to be in what is shown then. A command that fails makes the test fail.
 #
-# Modules are built in the current build folder unless a FOLDER is given. Each is a target of CMake's of that NAME. One
+# Modules are built in the current build folder, or in a FOLDER, which may be given from there. Each is a target of CMake's of that NAME. One
 # of C++ links with all of the host's services, exports its entry point alone and tells the version of the SDK.
 include_guard(GLOBAL)
 include("${CMAKE_CURRENT_LIST_DIR}/TesselResources.cmake")
 set(TESSEL_MODULES_FOLDER "${CMAKE_CURRENT_LIST_DIR}" CACHE INTERNAL "Where the files of these functions stand")
+
+# Makes the folder in that variable a whole path, that of the build folder where none is given.
+macro(tessel_take_folder folder)
+  if(NOT ${folder})
+    set(${folder} "${CMAKE_CURRENT_BINARY_DIR}")
+  endif()
+  cmake_path(ABSOLUTE_PATH ${folder} BASE_DIRECTORY "${CMAKE_CURRENT_BINARY_DIR}" NORMALIZE)
+endmacro()
 
 function(tessel_add_module name)
   cmake_parse_arguments(PARSE_ARGV 1 MODULE "" "KIND;FOLDER" "")
@@ -26,18 +34,14 @@ function(tessel_add_module name)
   if(NOT MODULE_KIND MATCHES "^(zmb|omp)$")
     message(FATAL_ERROR "tessel_add_module(${name}): KIND is zmb or omp, and not ${MODULE_KIND}")
   endif()
-  if(NOT MODULE_FOLDER)
-    set(MODULE_FOLDER "${CMAKE_CURRENT_BINARY_DIR}")
-  endif()
+  tessel_take_folder(MODULE_FOLDER)
   tessel_add_library(${name} ${name}.${MODULE_KIND} "${MODULE_FOLDER}" ${MODULE_UNPARSED_ARGUMENTS})
   set_target_properties(${name} PROPERTIES TESSEL_PATH "${MODULE_FOLDER}/${name}.${MODULE_KIND}")
 endfunction()
 
 function(tessel_add_bundle name)
   cmake_parse_arguments(PARSE_ARGV 1 BUNDLE "" "IDENTIFIER;TEXTS;RESOURCES;FOLDER" "")
-  if(NOT BUNDLE_FOLDER)
-    set(BUNDLE_FOLDER "${CMAKE_CURRENT_BINARY_DIR}")
-  endif()
+  tessel_take_folder(BUNDLE_FOLDER)
   if(NOT BUNDLE_IDENTIFIER)
     set(BUNDLE_IDENTIFIER "org.example.${name}")
   endif()
@@ -77,11 +81,10 @@ function(tessel_add_lisp name)
   if(NOT count EQUAL 1)
     message(FATAL_ERROR "tessel_add_lisp(${name}) takes one source file")
   endif()
-  if(NOT LISP_FOLDER)
-    set(LISP_FOLDER "${CMAKE_CURRENT_BINARY_DIR}")
-  endif()
+  tessel_take_folder(LISP_FOLDER)
   cmake_path(ABSOLUTE_PATH LISP_UNPARSED_ARGUMENTS OUTPUT_VARIABLE source)
   set(compiled "${LISP_FOLDER}/${name}.qbc")
+  file(MAKE_DIRECTORY "${LISP_FOLDER}")
   add_custom_command(OUTPUT "${compiled}"
     COMMAND Tessel::compiler "${source}" -o "${compiled}"
     DEPENDS "${source}" Tessel::compiler
@@ -110,9 +113,11 @@ function(tessel_add_library name file folder)
   endif()
   add_library(${name} MODULE ${ARGN} "${TESSEL_MODULES_FOLDER}/TesselSdkVersion.cpp")
   target_link_libraries(${name} PRIVATE Tessel::host)
+  # Neither the place nor the name is the configuration's: a file is found by its name, and a bundle's in the bundle.
   set_target_properties(${name} PROPERTIES
     PREFIX "" SUFFIX "" OUTPUT_NAME "${file}"
-    LIBRARY_OUTPUT_DIRECTORY "${folder}"
+    DEBUG_POSTFIX "" RELEASE_POSTFIX "" RELWITHDEBINFO_POSTFIX "" MINSIZEREL_POSTFIX ""
+    LIBRARY_OUTPUT_DIRECTORY "$<1:${folder}>"
     CXX_VISIBILITY_PRESET hidden VISIBILITY_INLINES_HIDDEN ON
     LINK_DEPENDS "${TESSEL_MODULES_FOLDER}/exports.map")
   if(APPLE)

@@ -320,7 +320,7 @@ TEST_F(KeptOutByHand, FailsWithAWordWhereNothingCanBeStored)
 
 TEST_F(KeptOutByHand, LeavesNothingOfAKilledSessionBeside)
 {
-    const auto part = session.folder().write("profile/applications/.part-AbCdEf", "half of it");
+    const auto part = session.folder().write("profile/applications/.tessel-part-AbCdEf", "half of it");
     session.run({"DISABLE " + good});
     EXPECT_FALSE(std::filesystem::exists(part));
     const auto file = session.profile() / "applications" / "kept-out";

@@ -1,6 +1,8 @@
 // What an administrator lays out for everybody who starts Tessel on a machine.
 #include <gmock/gmock.h>
 
+#include <unistd.h>
+
 #include "tests/e2e/Applications.h"
 
 using testing::EndsWith;
@@ -12,7 +14,11 @@ namespace
 class Layout : public testing::Test
 {
 protected:
-    Layout() { session.alwaysWith({"--layout-dir", (session.folder() / "layout").string()}); }
+    Layout()
+    {
+        session.alwaysWith({"--layout-dir", (session.folder() / "layout").string()});
+        std::filesystem::create_directories(session.folder() / "layout");
+    }
 
     // A Startup Suite of one application.
     void layOutSuite(const std::string& file, const std::string& application)
@@ -73,6 +79,33 @@ TEST_F(Layout, ThatIsPolicyCannotBeTakenOutAndThePersonIsTold)
                          "    (from " + file + ")\n"));
 }
 
+TEST_F(Layout, OfASuiteIsLoadedAgainAfterItWasOutOfReach)
+{
+    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
+    const auto layout = session.folder() / "layout";
+    const auto away = session.folder() / "away";
+    std::filesystem::rename(layout, away);
+    std::filesystem::create_directories(layout);
+    EXPECT_THAT(apps(), EndsWith("Command: APPS\n" + listed(modrigBundle())));
+    EXPECT_THAT(apps(), EndsWith("Command: APPS\nNo application is loaded.\n"));
+    std::filesystem::remove(layout);
+    std::filesystem::rename(away, layout);
+    EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
+    EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp"))) << "and at the start after that";
+}
+
+TEST_F(Layout, ThatIsPolicyReachesWhoHasEmptiedTheirSuite)
+{
+    storeSuite(session, {sample("calendar.qbc")});
+    apps();
+    storeSuite(session, {});
+    apps();
+    EXPECT_THAT(apps(), EndsWith("Command: APPS\nNo application is loaded.\n"));
+    layOutSuite("policy/suite.reg", sample("hilbert.lsp"));
+    EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
+}
+
 // In a safe session nothing of it was loaded; only the layout knows the whole path.
 TEST_F(Layout, OfASuiteIsKnownToDisableByItsNames)
 {
@@ -90,6 +123,45 @@ TEST_F(Layout, ThatIsDamagedIsToldAtEveryStartAndDoesNotCount)
     EXPECT_THAT(apps(),
                 HasSubstr("\nThe values for everybody in " + file.string() + " do not count: in line 1 "));
     EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
+}
+
+TEST_F(Layout, ThatIsABottomlessKeyDoesNotCountAndHarmsNothing)
+{
+    std::string key = "[HKCU\\Deep";
+    for (int level = 0; level < 200000; ++level)
+        key += "\\a";
+    session.folder().write("layout/deep.reg", "Windows Registry Editor Version 5.00\n\n" + key + "]\n");
+    const auto result = session.run({"VERSION"});
+    EXPECT_EQ(result.exitStatus, 0);
+    EXPECT_THAT(result.output, HasSubstr("deep.reg do not count: in line 3 a key lies below more than"));
+}
+
+TEST_F(Layout, InAFolderThatCannotBeReadIsToldAndDoesNotCount)
+{
+    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    const auto layout = session.folder() / "layout";
+    if (geteuid() == 0)
+        session.startBy("exec setpriv --bounding-set=-dac_override,-dac_read_search -- \"$0\" \"$@\"");
+    for (const auto& folder : {layout / "policy", layout})
+    {
+        std::filesystem::create_directories(folder);
+        std::filesystem::permissions(folder, std::filesystem::perms::none);
+        EXPECT_THAT(apps(), HasSubstr("\nThe values for everybody in " + folder.string() +
+                                      " do not count: Permission denied.\n"));
+        std::filesystem::permissions(folder, std::filesystem::perms::owner_all);
+    }
+}
+
+TEST(LayoutFolder, ThatIsToBeTriedHasToBeThere)
+{
+    const HostSession session;
+    const auto file = session.folder().write("a.reg", "").string();
+    for (const std::string& folder : {file, (session.folder() / "none").string()})
+    {
+        const auto refused = session.start({"--layout-dir", folder, "-c", "VERSION"});
+        EXPECT_EQ(refused.exitStatus, 2) << folder;
+        EXPECT_THAT(refused.output, HasSubstr("--layout-dir: " + folder + " is no folder\n"));
+    }
 }
 
 TEST_F(Layout, IsNotPartOfWhatAPersonExports)

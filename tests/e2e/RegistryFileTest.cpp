@@ -135,7 +135,7 @@ TEST(RegistryFile, WithADamagedRowIsToldOnceAtAStart)
 TEST(RegistryFile, LosesWhatAKilledSessionHasLeftOfItsCopy)
 {
     const HostSession session;
-    const auto part = session.folder().write("profile/.part-AbCdEf", "half a copy");
+    const auto part = session.folder().write("profile/.tessel-part-AbCdEf", "half a copy");
     ASSERT_EQ(session.run({kSet}).exitStatus, 0);
     EXPECT_FALSE(std::filesystem::exists(part));
     const auto copy = session.profile() / "registry.db.sound";

@@ -3,7 +3,7 @@
 
 #include <unistd.h>
 
-#include "tests/e2e/HostProcess.h"
+#include "tests/e2e/Applications.h"
 #include "tests/support/Content.h"
 
 namespace fs = std::filesystem;
@@ -81,6 +81,18 @@ TEST_F(RegistryTransfer, ChangesAndRemovesWhatTheFileNames)
     EXPECT_EQ(answer("REGISTRY LIST My"), "A = new\nkept = 1\n");
 }
 
+TEST_F(RegistryTransfer, OfAStartupSuiteIsLoadedAtTheNextStartWhateverModrigWasContentWith)
+{
+    const std::string command = "REGISTRY EXPORT " + std::string(kSuiteKey) + " " + quotedFile;
+    storeSuite(session, {sample("hilbert.lsp")});
+    expectWell(session.run({command}));
+    storeSuite(session, {});
+    expectWell(session.run({"APPS"}));
+    expectWell(session.run({"APPS"}), "No application is loaded.\n");
+    expectWell(session.run({"REGISTRY IMPORT " + quotedFile}));
+    expectWell(session.run({"APPS"}), listed(sample("hilbert.lsp"), "Lisp"));
+}
+
 TEST_F(RegistryTransfer, ChangesNothingFromAFileThatIsDamaged)
 {
     session.folder().write(file.filename(), kBegin + "[HKCU\\My]\n\"a\"=\"new\"\n\"b\"=dword:1\n");
@@ -108,6 +120,44 @@ TEST_F(RegistryTransfer, DoesNotReplaceAFileOfAnotherKind)
     expectRefused("REGISTRY EXPORT No\\Such " + quotedFile,
                   "The registry key \"No\\Such\" is not exported to " + file.string() +
                       ": there is no such key.\n");
+}
+
+TEST_F(RegistryTransfer, TakesNoKeyThatLiesTooDeepToBeRemovedAgain)
+{
+    const auto importBelow = [this](int depth)
+    {
+        std::string key = "[HKCU\\Deep";
+        for (int level = 1; level < depth; ++level)
+            key += "\\a";
+        session.folder().write(file.filename(), kBegin + key + "]\n\"a\"=\"b\"\n");
+        return "REGISTRY IMPORT " + quotedFile;
+    };
+    expectRefused(importBelow(513), "is not imported: in line 3 a key lies below more than 511 others.\n");
+    expectWell(session.run({importBelow(512)}));
+    expectWell(session.run({"REGISTRY DELETE Deep"}));
+    EXPECT_THAT(answer("REGISTRY LIST"), Not(HasSubstr("Deep")));
+}
+
+// What is laid out for everybody is to be read by everybody.
+TEST_F(RegistryTransfer, WritesAFileThatOthersMayReadAsTheyMayAllThatThePersonWrites)
+{
+    const auto rightsAfterExportWith = [this](const std::string& mask)
+    {
+        session.startBy("umask " + mask + " && exec \"$0\" \"$@\"");
+        expectWell(session.run({"REGISTRY SET My a b", "REGISTRY EXPORT My " + quotedFile}));
+        return static_cast<unsigned>(fs::status(file).permissions());
+    };
+    EXPECT_EQ(rightsAfterExportWith("022"), 0644u);
+    EXPECT_EQ(rightsAfterExportWith("077"), 0644u) << "as the file that stood there";
+    fs::remove(file);
+    EXPECT_EQ(rightsAfterExportWith("077"), 0600u);
+}
+
+TEST_F(RegistryTransfer, LeavesTheFilesOfOthersInTheFolderAlone)
+{
+    const auto others = session.folder().write(".part-1 of a download", "somebody's");
+    expectWell(session.run({"REGISTRY SET My a b", "REGISTRY EXPORT My " + quotedFile}));
+    EXPECT_TRUE(fs::exists(others));
 }
 
 TEST_F(RegistryTransfer, StoresNothingInARegistryThatMayOnlyBeRead)

@@ -23,6 +23,27 @@ TEST_F(DialogAlone, OpensByItselfSaysNothingAndEndsTessel)
     EXPECT_EQ(mHost->output(), "");
 }
 
+// Who looks at the list has not made it theirs.
+TEST_F(DialogAlone, LeavesASuiteThatIsLaidOutForEverybodyToTheAdministrator)
+{
+    const auto layOut = [this](const std::string& file)
+    {
+        mSession.folder().write("layout/suite.reg",
+                                "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
+                                    std::string(kDialogsKey) +
+                                    "\\Startup]\n\"NumStartup\"=\"1\"\n\"1Startup\"=\"" + file + "\"\n");
+    };
+    mSession.alwaysWith({"--layout-dir", (mSession.folder() / "layout").string()});
+    layOut(writeLisp("first.lsp"));
+    openAlone({"--modrig"});
+    press("Escape");
+    EXPECT_THAT(mHost->waitForEnd(), Optional(0));
+    layOut(writeLisp("second.lsp"));
+    const auto next = mSession.run({"APPS"});
+    EXPECT_THAT(next.output, testing::HasSubstr("second.lsp runs"));
+    EXPECT_THAT(next.output, testing::Not(testing::HasSubstr("first.lsp")));
+}
+
 TEST_F(DialogAlone, OpensAfterTheFilesThatWereNamedAreLoaded)
 {
     const std::string file = copySample("primes.zmb");

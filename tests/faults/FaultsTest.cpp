@@ -130,7 +130,7 @@ protected:
         EXPECT_TRUE(keptCopy() != before) << "the old copy stands there";
         EXPECT_EQ(storedWriting(), 3);
         for (const auto& entry : std::filesystem::directory_iterator(mSession.profile()))
-            EXPECT_THAT(entry.path().filename().string(), Not(HasSubstr(".part-")));
+            EXPECT_THAT(entry.path().filename().string(), Not(HasSubstr(".tessel-part-")));
     }
 };
 
@@ -160,7 +160,7 @@ TEST_F(FailingLocks, EndTheSessionsReadingSoon)
 
 TEST_F(FailingParts, AreNotMadeForEverWhereTheSystemCannotSayWhatTheyAre)
 {
-    expectCopyAfter("MODRIG_FAULT_OF", "/.part-", "fstat 1 ever");
+    expectCopyAfter("MODRIG_FAULT_OF", "/.tessel-part-", "fstat 1 ever");
 }
 
 TEST_F(FailingParts, AreMadeAgainWhenSomebodyHasTakenThemForLeftOvers)

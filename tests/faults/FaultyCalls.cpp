@@ -4,7 +4,7 @@
 //     MODRIG_FAULT="pwrite 3 once"     the third call fails; "ever": that one and all after it; a number
 //     after
 //                                      that is the error, in place of the usual one
-//     MODRIG_FAULT_OF=/.part-          only calls on files whose path holds this fail
+//     MODRIG_FAULT_OF=/.tessel-part-   only calls on files whose path holds this fail
 //     MODRIG_FAULT_TAKEN=1             the first file of a name of its own is removed before it is locked
 //     MODRIG_FAULT_COUNTS=file         tells at the end how many calls of each kind there were
 //     MODRIG_FAULT_NETWORK=1           every folder lies on another machine
@@ -37,7 +37,7 @@
 namespace
 {
 constexpr std::string_view kFile = "/registry.db";
-constexpr std::string_view kPartOfIt = "/.part-"; // what takes its place
+constexpr std::string_view kPartOfIt = "/.tessel-part-"; // what takes its place
 constexpr long kNfs = 0x6969;
 constexpr std::size_t kLongestPath = 4096;
 

@@ -93,6 +93,31 @@ TEST_F(Sdk, IsFoundByCMakeWhichBuildsModulesOfEveryKindThatLoad)
     }
 }
 
+TEST_F(Sdk, PutsModulesWhereTheyAreLookedForWhateverTheProjectIsSetTo)
+{
+    session.folder().write(
+        "project/CMakeLists.txt",
+        "cmake_minimum_required(VERSION 3.25)\nproject(p LANGUAGES CXX)\n"
+        "find_package(Tessel REQUIRED)\nenable_testing()\n"
+        "tessel_add_module(hello FOLDER here hello.cpp)\n"
+        "tessel_add_bundle(packed FOLDER here TEXTS packed.rc hello.cpp)\n"
+        "tessel_add_lisp(lisp FOLDER here lisp.lsp)\n"
+        "foreach(module hello packed)\n"
+        "tessel_add_test(${module} MODULE ${module} TYPES HELLO SHOWS Hello.)\nendforeach()\n"
+        "tessel_add_test(lisp MODULE lisp SHOWS compiled)\n");
+    session.folder().write("project/hello.cpp",
+                           firstCode(contentOf(root / "usr/share/doc/tessel-dev/host-guide.md"), "cpp"));
+    session.folder().write("project/packed.rc", "LANGUAGE 9, 1\nSTRINGTABLE\nBEGIN\n 1 \"one\"\nEND\n");
+    session.folder().write("project/lisp.lsp", "(write-line \"compiled\")\n");
+    did("cmake -S project -B built -G 'Ninja Multi-Config' -DCMAKE_DEBUG_POSTFIX=d");
+    did("cmake --build built --config Debug");
+    EXPECT_THAT(did("ctest --test-dir built -C Debug"),
+                HasSubstr("100% tests passed, 0 tests failed out of 3"));
+    EXPECT_EQ(did("ls -A built/here built/here/packed.bundle"),
+              "built/here:\nhello.zmb\nlisp.qbc\npacked.bundle\n\n"
+              "built/here/packed.bundle:\nResources\npacked\n");
+}
+
 TEST_F(Sdk, RunsTheTestsOfAProject)
 {
     fs::copy(OUTSIDE_PROJECT, inFolder("project"), fs::copy_options::recursive);
@@ -198,6 +223,13 @@ TEST_F(Sdk, RefusesNamesThatNoProjectCanHave)
         EXPECT_THAT(refused.output,
                     testing::ContainsRegex("^tessel-new-module: (the name|there is no option)"));
     }
+    EXPECT_EQ(
+        run("tessel-new-module quit zmb").output,
+        "tessel-new-module: the name \"quit\" cannot be taken: Tessel has a command QUIT of its own.\n");
+    EXPECT_EQ(run("tessel-new-module Apps bundle").status, 2);
+    EXPECT_EQ(run("tessel-new-module List lsp").output,
+              "tessel-new-module: the name \"List\" cannot be taken: Lisp has a List of its own.\n");
+    EXPECT_EQ(run("tessel-new-module quit lsp").status, 2);
     EXPECT_EQ(run("tessel-new-module hello xyz").output,
               "tessel-new-module: the kind is bundle, zmb, omp or lsp, and not \"xyz\".\n");
     EXPECT_EQ(run("tessel-new-module hello").status, 2);

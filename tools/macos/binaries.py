@@ -1,7 +1,10 @@
 """Checks what has been linked for macOS: processors, what is exported, and from which version of the system on it runs."""
 import re
 import shutil
+import struct
 import subprocess
+
+MAGIC, BUNDLE = 0xFEEDFACF, 8  # of a file for one processor of 64 bits
 
 
 def program(name):
@@ -14,6 +17,21 @@ def program(name):
 
 def run(name, *words):
     return subprocess.run([program(name), *(str(word) for word in words)], capture_output=True, text=True, check=True).stdout
+
+
+def header(file):
+    """The beginning of a file as numbers, or nothing where it has none."""
+    data = file.open("rb").read(16) if file.is_file() and not file.is_symlink() else b""
+    return struct.unpack("<4I", data) if len(data) == 16 else ()
+
+
+def is_linked(file):
+    return header(file)[:1] == (MAGIC,)
+
+
+def is_module(file):
+    """Whether it is mapped by a program that calls its entry point."""
+    return header(file)[3:] == (BUNDLE,)
 
 
 def join(parts, whole):

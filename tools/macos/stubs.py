@@ -13,7 +13,10 @@ _objc_setProperty_atomic_copy _objc_setProperty _objc_getProperty _objc_copyStru
 _objc_sync_enter _objc_sync_exit _objc_autoreleasePoolPush _objc_autoreleasePoolPop _objc_retainAutoreleasedReturnValue
 _objc_autoreleaseReturnValue _objc_storeStrong""".split()
 # Of libraries in C++ the symbols here are spelt otherwise, after another C++ library: those that we call.
-BOOST_LOCALE = []
+BOOST_LOCALE = [
+    "__ZN5boost6locale11gnu_gettext21create_messages_facetIwEEPNS0_14message_formatIT_EERKNS1_13messages_infoE",
+    "__ZN5boost6locale19base_message_formatIwE2idE",
+]
 CORE_FOUNDATION = ["___CFConstantStringClassReference"]
 
 

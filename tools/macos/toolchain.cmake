@@ -19,6 +19,9 @@ foreach(tool AR RANLIB NM STRIP OTOOL INSTALL_NAME_TOOL)
   find_program(CMAKE_${tool} NAMES llvm-${name} llvm-${name}-14 REQUIRED)
 endforeach()
 
+# What comes with Apple's developer tools and is called by name.
+list(PREPEND CMAKE_PROGRAM_PATH "${CMAKE_CURRENT_LIST_DIR}/bin")
+
 # Libraries and headers are found in the SDK alone, programs on this machine.
 set(CMAKE_FIND_ROOT_PATH "${MACOS_SDK}")
 set(CMAKE_FIND_ROOT_PATH_MODE_PROGRAM NEVER)

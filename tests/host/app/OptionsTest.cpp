@@ -37,10 +37,10 @@ TEST(Options, TakeCommandsInTheirOrderAndOneArgumentEach)
 TEST(Options, TakeAProfileFolderAndAScript)
 {
     const auto parsed =
-        parse({"--profile-dir", "/tmp/größe 1", "--script=tour.script", "--layout-dir", "/tmp/all"});
+        parse({"--profile-dir", "/tmp/größe 1", "--script=tour.script", "--layout-dir", "/tmp"});
     ASSERT_TRUE(parsed && parsed->options);
     EXPECT_EQ(parsed->options->profileFolder, "/tmp/größe 1");
-    EXPECT_EQ(parsed->options->layoutFolder, "/tmp/all");
+    EXPECT_EQ(parsed->options->layoutFolder, "/tmp");
     EXPECT_EQ(parsed->options->script, "tour.script");
     EXPECT_TRUE(parsed->options->isBatch());
 }

@@ -45,15 +45,29 @@ TEST_F(Demand, LoadsAtTheStartWhatItsRecordsAskFor)
     record(L"Second", fixture("Good.omp"), 6);
     record(L"First", fixture("Good.zmb"), 2);
     record(L"OnCommandOnly", fixture("Command.zmb"), 4);
-    mDemand.loadAtStart();
+    mDemand.loadAtStart(false);
     EXPECT_EQ(output(), "Good.omp: message 1\nGood.zmb: message 1\n");
+}
+
+TEST_F(Demand, LoadsWithNewsWhatWaitsForACommandInThePlugInsFolderAlone)
+{
+    record(L"Plug-in", fixture("Good.zmb", "PlugIns/Good.zmb"), 4);
+    record(L"Elsewhere", fixture("Good.omp"), 4);
+    record(L"Switched off", fixture("Command.zmb", "PlugIns/Command.zmb"), 0);
+    tessel::ApplicationRecord shipped;
+    shipped.name = L"Comes with Tessel";
+    shipped.module = toWide(fixture("Good.omp", "PlugIns/Good.omp").native());
+    shipped.loadReasons = 4;
+    mRecords->add(shipped);
+    mDemand.loadAtStart(true);
+    EXPECT_EQ(output(), "Good.zmb: message 1\n");
 }
 
 TEST_F(Demand, GoesOnAfterARecordWhoseFileIsMissing)
 {
     record(L"Gone", mFolder / "gone.zmb", 2);
     record(L"There", fixture("Good.zmb"), 2);
-    mDemand.loadAtStart();
+    mDemand.loadAtStart(false);
     EXPECT_EQ(output(),
               notLoaded(mFolder / "gone.zmb", "No such file or directory") + "Good.zmb: message 1\n");
 }
@@ -64,17 +78,17 @@ TEST_F(Demand, TellsOnceThatTheFileOfARecordIsGone)
     record(L"Comes and goes", path, 2);
     const std::string gone = notLoaded(path, "No such file or directory");
     std::filesystem::rename(path, mFolder / "away.zmb");
-    mDemand.loadAtStart();
+    mDemand.loadAtStart(false);
     EXPECT_EQ(output(), gone);
-    mDemand.loadAtStart();
+    mDemand.loadAtStart(false);
     EXPECT_EQ(output(), "") << "told at the start before";
     std::filesystem::rename(mFolder / "away.zmb", path);
-    mDemand.loadAtStart();
+    mDemand.loadAtStart(false);
     EXPECT_EQ(output(), "Good.zmb: message 1\n");
     unload(path);
     std::filesystem::remove(path);
     output();
-    mDemand.loadAtStart();
+    mDemand.loadAtStart(false);
     EXPECT_EQ(output(), gone) << "it was there in between";
 }
 
@@ -83,7 +97,7 @@ TEST_F(Demand, TakesARecordAlongToThePlugInsOfAHostThatWasMoved)
     const auto plugIn = fixture("Good.zmb", "PlugIns/Good.zmb");
     record(L"Good", mFolder / "before/PlugIns/Good.zmb", 6);
     takeRecordsAlong();
-    mDemand.loadAtStart();
+    mDemand.loadAtStart(false);
     EXPECT_EQ(output(), "The application \"Good\" is " + plugIn.native() + " now; " +
                             (mFolder / "before/PlugIns/Good.zmb").native() +
                             " is not there any more.\nGood.zmb: message 1\n");
@@ -94,7 +108,7 @@ TEST_F(Demand, TakesARecordAlongToThePlugInsOfAHostThatWasMoved)
     unload(plugIn);
     output();
     takeRecordsAlong();
-    mDemand.loadAtStart();
+    mDemand.loadAtStart(false);
     EXPECT_EQ(output(), "Good.zmb: message 1\n") << "told once";
 }
 
@@ -119,7 +133,7 @@ TEST_F(Demand, TakesOverTheRecordOfAPlugInOfAnotherCopyOfTheHostWithoutAWord)
     const auto own = fixture("Good.zmb", "PlugIns/Good.zmb");
     record(L"Good", fixture("Good.zmb", "other/PlugIns/Good.zmb"), 2);
     takeRecordsAlong();
-    mDemand.loadAtStart();
+    mDemand.loadAtStart(false);
     EXPECT_EQ(output(), "Good.zmb: message 1\n") << "one of the two";
     EXPECT_EQ(mRecords->read(L"Good")->module, toWide(own.native()));
     EXPECT_TRUE(mLinker.isModuleLoaded(own.wstring().c_str()));
@@ -132,7 +146,7 @@ TEST_F(Demand, LeavesARecordWhoseFileIsThereToThatFile)
     std::filesystem::create_directories(mFolder / "PlugIns");
     mFolder.write("PlugIns/Good.zmb", "no module");
     takeRecordsAlong();
-    mDemand.loadAtStart();
+    mDemand.loadAtStart(false);
     EXPECT_EQ(mRecords->read(L"Good")->module, toWide(elsewhere.native()));
     EXPECT_EQ(output(), "Good.zmb: message 1\n" +
                             notLoaded(mFolder / "PlugIns/Good.zmb", "it is not a shared library"));
@@ -144,7 +158,7 @@ TEST_F(Demand, LoadsPlugInsWithoutARecordInTheOrderOfTheirNames)
     fixture("Good.omp", "PlugIns/c.OMP");
     fixture("Good.bundle", "PlugIns/Good.bundle");
     mFolder.write("PlugIns/notes.txt", "no application");
-    mDemand.loadAtStart();
+    mDemand.loadAtStart(false);
     EXPECT_EQ(output(), "Good.bundle: message 1\nb.zmb: message 1\nc.OMP: message 1\n");
 }
 
@@ -154,13 +168,13 @@ TEST_F(Demand, LeavesPlugInsWithARecordToTheirRecord)
     fixture("Good.omp", "PlugIns/New.omp");
     std::filesystem::create_symlink(mFolder / "PlugIns", mFolder / "link");
     record(L"OnCommand", mFolder / "link" / "OnCommand.zmb", 4);
-    mDemand.loadAtStart();
+    mDemand.loadAtStart(false);
     EXPECT_EQ(output(), "New.omp: message 1\n");
 }
 
 TEST_F(Demand, StartsWithoutAPlugInsFolder)
 {
-    mDemand.loadAtStart();
+    mDemand.loadAtStart(false);
     EXPECT_EQ(output(), "");
 }
 

@@ -104,6 +104,25 @@ TEST_F(Layers, PutsLaterFoldersAndFilesBeforeEarlierOnes)
     EXPECT_EQ(said(), "");
 }
 
+TEST_F(Layers, HaveAnotherMarkAsSoonAsTheySayAnythingElse)
+{
+    start();
+    EXPECT_EQ(host.layered().markOfLayers(), 0u);
+    const auto markOf = [this](const std::string& data)
+    {
+        layOut("near/a.reg", "[HKCU\\K]\n\"a\"=\"" + data + "\"\n");
+        return host.layered().markOfLayers();
+    };
+    const auto first = markOf("1");
+    EXPECT_NE(first, 0u);
+    EXPECT_NE(markOf("2"), first);
+    EXPECT_EQ(markOf("1"), first);
+    std::filesystem::create_directories(host.folder() / "near/policy");
+    std::filesystem::rename(host.folder() / "near/a.reg", host.folder() / "near/policy/a.reg");
+    start();
+    EXPECT_NE(host.layered().markOfLayers(), first) << "policy is something else";
+}
+
 TEST_F(Layers, ListsTheKeysOfEveryLayerOnce)
 {
     layOut("near/a.reg", "[HKCU\\K\\One]\n[HKCU\\K\\two]\n[HKCU\\K\\Three\\Deep]\n");
@@ -200,6 +219,40 @@ TEST_F(Layers, TellsApplicationsWhatIsLaidDownAndWhere)
 }
 
 // Who replaces all values removes them one by one: those that cannot go would never end.
+// As an application stores a list: all that it had goes, and all that it holds is written.
+TEST_F(Layers, LeaveThePersonsOwnAsItWasWhereAnApplicationWritesWhatCountedBefore)
+{
+    const auto rewrite = [this](std::vector<std::pair<const wchar_t*, const wchar_t*>> values)
+    {
+        HKEY key = nullptr;
+        EXPECT_EQ(RegCreateKeyEx(HKEY_CURRENT_USER, L"K", 0, nullptr, 0, KEY_WRITE, nullptr, &key, nullptr),
+                  ERROR_SUCCESS);
+        wchar_t name[20] = {};
+        for (DWORD length = 20;
+             RegEnumValueW(key, 0, name, &length, nullptr, nullptr, nullptr, nullptr) == ERROR_SUCCESS;
+             length = 20)
+            EXPECT_EQ(RegDeleteValueW(key, name), ERROR_SUCCESS);
+        for (const auto& [valueName, data] : values)
+            EXPECT_EQ(tsudRegSetString(key, valueName, data), ERROR_SUCCESS);
+        EXPECT_EQ(RegCloseKey(key), ERROR_SUCCESS);
+        EXPECT_TRUE(host.layered().endOfCommand());
+    };
+    layOut("near/a.reg", "[HKCU\\K]\n\"n\"=\"1\"\n\"a\"=\"default\"\n");
+    rewrite({{L"a", L"default"}, {L"N", L"1"}});
+    EXPECT_EQ(own(L"K", L"a") + own(L"K", L"n"), "(none)(none)");
+    rewrite({{L"n", L"1"}, {L"a", L"mine"}});
+    EXPECT_EQ(own(L"K", L"a") + own(L"K", L"n"), "mine1");
+    rewrite({{L"n", L"1"}, {L"a", L"default"}});
+    EXPECT_EQ(own(L"K", L"a") + own(L"K", L"n"), "default1") << "that was somebody's wish";
+    rewrite({{L"n", L"1"}});
+    EXPECT_EQ(own(L"K", L"a") + own(L"K", L"n"), "(none)1");
+    rewrite({{L"n", L"1"}, {L"a", L"mine"}});
+    layOut("near/policy/a.reg", "[HKCU\\K]\n\"n\"=\"1\"\n\"a\"=\"policy\"\n");
+    rewrite({{L"n", L"1"}, {L"a", L"policy"}});
+    EXPECT_EQ(own(L"K", L"a") + own(L"K", L"n"), "mine1");
+    EXPECT_EQ(said(), "");
+}
+
 TEST_F(Layers, IsGoneThroughByIndexInThePersonsOwnValues)
 {
     layOut("near/a.reg", "[HKCU\\K]\n\"a\"=\"default\"\n");
