@@ -83,18 +83,18 @@ private:
 constexpr std::size_t kDeeds = static_cast<std::size_t>(RunningMarker::Deed::kLispFile) + 1;
 
 // What can be said, in UTF-8, made while there is still time: a handler translates nothing.
-struct Words
+struct PreparedWords
 {
     std::string sentence;                  // with numbered places for these
     std::array<std::string, kDeeds> deeds; // with a place for the name of a command
     std::array<std::string, NSIG> endings; // by signal
     std::string calledExit;
 };
-Words theWords;
+PreparedWords theWords;
 
-Words wordsInPersonsLanguage()
+PreparedWords wordsInPersonsLanguage()
 {
-    Words words;
+    PreparedWords words;
     words.sentence =
         toUtf8(translated(L"The application \"{}\" has ended Tessel {}: {}.", L"{1}", L"{2}", L"{3}"));
     for (std::size_t deed = 0; deed < words.deeds.size(); ++deed)

@@ -16,13 +16,13 @@ namespace tessel
 namespace
 {
 // In UTF-8. A signal's handler asks, which translates nothing.
-struct Words
+struct QuestionWords
 {
     std::string question;
     std::string no;
     char yes = 'y';
 };
-Words theQuestion;
+QuestionWords theQuestion;
 
 bool isYes(char answer)
 {
