@@ -41,7 +41,9 @@ std::string isNamedFile(const std::string& file)
 std::string isThere(const std::string& folder)
 {
     std::error_code unreachable;
-    return std::filesystem::is_directory(folder, unreachable) ? "" : toUtf8(translated(L"{} is no folder", toWide(folder)));
+    return std::filesystem::is_directory(folder, unreachable)
+               ? ""
+               : toUtf8(translated(L"{} is no folder", toWide(folder)));
 }
 
 void declare(CLI::App& app, Options& options)
