@@ -16,12 +16,6 @@ namespace
 {
 constexpr std::size_t kCommandColumn = 12;
 
-// What the host says of its own commands is known to translators; what others say of theirs stays.
-std::wstring asSaid(const std::wstring& text)
-{
-    return translateAndFill(text.c_str(), {});
-}
-
 Result<> listCommands(Parts& parts)
 {
     Table table({kCommandColumn});
@@ -30,9 +24,9 @@ Result<> listCommands(Parts& parts)
     for (const auto& command : parts.commands->descriptions())
     {
         if (!equalIgnoringCase(command.group, group))
-            table.addHeading(asSaid(command.group));
+            table.addHeading(inPersonsLanguage(command.group));
         group = command.group;
-        table.add({command.name, asSaid(command.summary)});
+        table.add({command.name, inPersonsLanguage(command.summary)});
     }
     table.addHeading(translated(L"HELP and a name, such as HELP LOAD, tells how a command is typed."));
     parts.commandLine->show(table);
@@ -43,7 +37,7 @@ void describeCommand(Parts& parts, const CommandStack::Description& command)
 {
     Table table({});
     if (!command.summary.empty())
-        table.addHeading(command.name + L": " + asSaid(command.summary));
+        table.addHeading(command.name + L": " + inPersonsLanguage(command.summary));
     for (const auto& line : usageLines(command.name, command.usage))
         table.addHeading(line);
     if (!command.example.empty())

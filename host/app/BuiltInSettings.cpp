@@ -20,7 +20,7 @@ Result<> listVariables(Parts& parts)
 {
     Table table({kVariableColumn});
     for (const auto& variable : parts.variables->all())
-        table.add({assignment(variable), translated(variable.purpose)});
+        table.add({assignment(variable), inPersonsLanguage(variable.purpose)});
     parts.commandLine->show(table);
     return {};
 }

@@ -23,6 +23,11 @@ void addBuiltIn(Parts& parts, const std::wstring& name, BuiltInCommand* command)
     addBuiltIn(parts, name, CommandStack::BuiltIn(std::bind_front(command, std::ref(parts))));
 }
 
+std::wstring inPersonsLanguage(const std::wstring& english)
+{
+    return translateAndFill(english.c_str(), {});
+}
+
 void sayLine(Parts& parts, const std::wstring& sentence)
 {
     parts.commandLine->say(sentence);

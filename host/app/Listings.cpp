@@ -103,7 +103,7 @@ Result<> variableList(Parts& parts, const Arguments& arguments)
         if (arguments.empty() || equalIgnoringCase(variable.name, arguments.front()))
             variables.push_back(json::object({{L"name", json::text(variable.name)},
                                               {L"value", valueOf(variable)},
-                                              {L"purpose", json::text(variable.purpose.english)}}));
+                                              {L"purpose", json::text(variable.purpose)}}));
     if (variables.empty())
         return Failure{translated(L"There is no variable called \"{}\".", arguments.front())};
     return sayDocument(parts, {{L"variables", json::list(variables)}});

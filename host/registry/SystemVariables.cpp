@@ -21,13 +21,13 @@ std::vector<SystemVariables::Variable> hostVariables()
     using Storage = SystemVariables::Storage;
     return {
         {kLispEnabled, std::int16_t{1}, 0, 1, Storage::kSession,
-         Sentence(L"1: applications may load Lisp files; 0: not")},
+         Sentence(L"1: applications may load Lisp files; 0: not").english},
         {kRemovingTsLisp, std::int16_t{1}, 0, 1, Storage::kStored,
-         Sentence(L"1: compiled and packaged Lisp can be loaded (read at the next start)")},
+         Sentence(L"1: compiled and packaged Lisp can be loaded (read at the next start)").english},
         {kSearchPath, std::wstring(), 0, 0, Storage::kStored,
-         Sentence(L"Folders to look for files in, separated by ;")},
+         Sentence(L"Folders to look for files in, separated by ;").english},
         {kTesselVersion, std::wstring(L"R21"), 0, 0, Storage::kReadOnly,
-         Sentence(L"The release of this host")},
+         Sentence(L"The release of this host").english},
     };
 }
 

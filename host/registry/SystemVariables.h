@@ -8,7 +8,6 @@
 #include <vector>
 
 #include "host/text/Result.h"
-#include "host/text/Translation.h"
 
 namespace tessel
 {
@@ -33,7 +32,7 @@ public:
         std::int16_t smallest = 0; // of a number
         std::int16_t largest = 0;
         Storage storage = Storage::kSession;
-        Sentence<> purpose = Sentence(L""); // one line
+        std::wstring purpose; // one line of English, which translators know
     };
 
     // The host's own variables, stored ones as the registry has them below the product's root. A stored value
