@@ -20,20 +20,20 @@ namespace tessel
 {
 namespace
 {
-using Words = std::vector<std::string>;
+using PagerArguments = std::vector<std::string>;
 
 constexpr int kStatusOfInterrupt = 128 + SIGINT; // as shells have it
 
-std::optional<Words> pagerWords()
+std::optional<PagerArguments> pagerWords()
 {
     const char* pager = std::getenv("PAGER");
     const char* terminal = std::getenv("TERM");
     const std::string_view kind = terminal ? terminal : "";
     if (pager)
-        return *pager ? std::optional(Words{"/bin/sh", "-c", pager}) : std::nullopt;
+        return *pager ? std::optional(PagerArguments{"/bin/sh", "-c", pager}) : std::nullopt;
     if (kind.empty() || kind == "dumb")
         return std::nullopt;
-    return Words{"less", "-FRX"};
+    return PagerArguments{"less", "-FRX"};
 }
 
 // What is pressed is for the pager, which is told by the terminal itself.
@@ -70,7 +70,7 @@ sigset_t signalsOfAUsualProgram()
 }
 
 // With the signals that the host does without as they usually are. Nothing when there is no such program.
-std::optional<pid_t> start(Words words, int input)
+std::optional<pid_t> start(PagerArguments words, int input)
 {
     posix_spawn_file_actions_t files;
     posix_spawn_file_actions_init(&files);

@@ -7,6 +7,7 @@
 
 #include "host/ui/Label.h"
 #include "host/ui/Words.h"
+#include "host/ui/platform/Windowing.h"
 
 namespace
 {
@@ -87,6 +88,12 @@ const NSRect kFilterChoice = {{104, 10}, {308, 26}};
     return [self isWalkedThrough:path];
 }
 
+// The system's panel on macOS asks this instead.
+- (BOOL)panel:(id)sender shouldEnableURL:(NSURL*)url
+{
+    return [self panel:sender shouldShowFilename:[url path]];
+}
+
 @end
 
 @implementation TsOCOpenFileDialog
@@ -135,7 +142,7 @@ const NSRect kFilterChoice = {{104, 10}, {308, 26}};
     [panel setAllowsMultipleSelection:mAllowsMultipleSelection];
     [panel setCanChooseDirectories:NO];
     if (mInitialPath)
-        [panel setDirectory:mInitialPath];
+        tessel::windowing::showFolder(panel, mInitialPath);
 }
 
 - (NSInteger)runModal
@@ -146,7 +153,7 @@ const NSRect kFilterChoice = {{104, 10}, {308, 26}};
                                                                        filters:mFileFilters] autorelease];
     [panel setDelegate:(id)chooser];
     if ([mFileFilters count])
-        [panel setAccessoryView:[chooser view]];
+        tessel::windowing::showAccessoryView(panel, [chooser view]);
     const bool chosen = [panel runModal] == NSOKButton;
     [mSelectedPathes release];
     mSelectedPathes = [(chosen ? [[panel URLs] valueForKey:@"path"] : [NSArray array]) copy];

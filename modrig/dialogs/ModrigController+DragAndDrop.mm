@@ -5,13 +5,14 @@
 #include "modrig/dialogs/Paths.h"
 #include "modrig/dialogs/model/Drop.h"
 #include "modrig/dialogs/model/RowInsertion.h"
+#include "modrig/dialogs/platform/Dragging.h"
 #include "modrig/lists/FileIntake.h"
 
 namespace
 {
 NSArray* draggedPaths(id<NSDraggingInfo> info)
 {
-    return [[info draggingPasteboard] propertyListForType:NSFilenamesPboardType];
+    return ModrigPlatform::PathsOn([info draggingPasteboard]);
 }
 
 ModrigUtils::DraggedFiles filesIn(NSArray* paths)
@@ -74,7 +75,8 @@ ModrigUtils::DraggedFiles filesIn(NSArray* paths)
 
 - (BOOL)performDragOperationToStartupSuite:(id<NSDraggingInfo>)info
 {
-    if ([[[info draggingPasteboard] types] containsObject:NSFilenamesPboardType])
+    NSArray* types = [[info draggingPasteboard] types];
+    if ([types firstObjectCommonWithArray:ModrigPlatform::DraggedFileTypes()])
         [self dropFiles:draggedPaths(info) atRow:ModrigUtils::kAppendRow addToStartupList:YES];
     return YES;
 }

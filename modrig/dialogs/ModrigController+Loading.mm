@@ -15,6 +15,7 @@
 #include "modrig/dialogs/model/LoadSteps.h"
 #include "modrig/dialogs/model/RowInsertion.h"
 #include "modrig/dialogs/model/ShownTab.h"
+#include "modrig/dialogs/platform/Platform.h"
 #include "modrig/loader/LoadBatch.h"
 #include "modrig/messages/Messages.h"
 
@@ -40,7 +41,7 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
 // selected.
 - (void)chooseWhatIsStillSelected
 {
-    const bool panelHasSelection = [[mOpenPanel URLs] count] > 0;
+    const bool panelHasSelection = [[self filesChosenIn:mOpenPanel] count] > 0;
     const bool historyHasSelection = [[historyList selectedObjects] count] > 0;
     switch (ModrigUtils::SourceWithoutChoice(panelHasSelection, historyHasSelection))
     {
@@ -59,7 +60,7 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
 {
     [[self uiPersistentStore] putControlString:kSettingsGroup
                                        control:kInitialPathSetting
-                                         value:[mOpenPanel directory]];
+                                         value:[ModrigPlatform::FolderOf(mOpenPanel, self.shownFolder) path]];
 }
 
 - (IBAction)onLoad:(id)sender
@@ -138,7 +139,7 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
 {
     if (!ModrigUtils::IsHostFolderOnly([self batchFilesOf:mSelectedFiles]))
         return NO;
-    [mOpenPanel setDirectory:[[mSelectedFiles objectAtIndex:0] filePathName]];
+    [self showFolder:[[mSelectedFiles objectAtIndex:0] filePathName]];
     return YES;
 }
 

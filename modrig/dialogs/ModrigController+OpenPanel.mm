@@ -3,6 +3,7 @@
 #import <tesselui/TsOCFileFilter.h>
 #include <tesselui/tsuieach.h>
 
+#import "modrig/dialogs/ModrigDialogView.h"
 #import "modrig/dialogs/ModrigFilePath.h"
 #import "modrig/dialogs/NSSavePanel+ModrigRuntime.h"
 #import "modrig/dialogs/NSString+ModrigPaths.h"
@@ -21,17 +22,21 @@
 // The panel stays open when files are loaded: its default button is out of sight, and loads.
 - (void)setupButtonsOf:(NSOpenPanel*)panel
 {
+    [[panel cancelButton] setTitle:[TsOCModrigUtil modrigLoadString:@"IDS_MODRIG_CLOSE_BUTTON"]];
     NSButton* ok = [panel okButton];
+    if (!ok || ![panel cancelButton])
+        return [self setupPanelWithoutButtons:panel];
     [ok setHidden:YES];
     [ok setTarget:self];
     [ok setAction:@selector(openPanelOK:)];
     [[panel cancelButton] setFrame:[ok frame]];
-    [[panel cancelButton] setTitle:[TsOCModrigUtil modrigLoadString:@"IDS_MODRIG_CLOSE_BUTTON"]];
 }
 
 - (void)placeHelpButtonIn:(NSOpenPanel*)panel
 {
     NSButton* spare = [panel hideExtensionButton];
+    if (!spare || ![panel okButton])
+        return [(ModrigDialogView*)[self view] keepHelpButton:helpButton];
     // Before the button that stands to its right, for the order of the Tab key.
     [[spare superview] addSubview:helpButton positioned:NSWindowBelow relativeTo:[panel cancelButton]];
     [helpButton setFrameOrigin:NSMakePoint(NSMinX([spare frame]), NSMinY([[panel okButton] frame]))];
@@ -49,12 +54,12 @@
     [panel setDelegate:(id)self];
     [panel setAllowsMultipleSelection:YES];
     [self setupButtonsOf:panel];
-    [panel setAccessoryView:[self view]];
+    ModrigPlatform::ShowAccessoryView(panel, [self view]);
     [self placeHelpButtonIn:panel];
     ModrigPlatform::FitAccessoryView([self view]);
     const CStdStr title = CStdStr::OfId(ModrigMessages::kOpenPanelTitle);
     [panel setTitle:ModrigUtils::StringFromPath(title)];
-    [panel setDirectory:[self initialFolder]];
+    [self showFolder:[self initialFolder]];
     ModrigPlatform::ShowRows(loadedAppsTableView, loadedApps);
     ModrigPlatform::ShowRows(historyListTableView, historyList);
     [self populateFileTypes];
@@ -95,7 +100,7 @@
 - (void)filterPanelAgain
 {
     [mOpenPanel validateVisibleColumns];
-    NSURL* folder = [[[mOpenPanel directoryURL] retain] autorelease];
+    NSURL* folder = [[ModrigPlatform::FolderOf(mOpenPanel, self.shownFolder) retain] autorelease];
     [mOpenPanel setDirectoryURL:[[NSBundle bundleForClass:[self class]] bundleURL]];
     [mOpenPanel setDirectoryURL:folder];
 }
@@ -133,16 +138,40 @@
                                        ModrigUtils::PathsFromStrings([filter fileExtensions]));
 }
 
+// A package is a file to a person, and so is the host's, which can be gone into.
+- (BOOL)isOnTheWay:(NSString*)path
+{
+    return ModrigPlatform::FileKindAt(path) == ModrigPlatform::FileKind::kFolder &&
+           !ModrigPlatform::IsFilePackage(path) && ![self isTesselFolder:path];
+}
+
+- (NSArray*)filesChosenIn:(id)panel
+{
+    NSMutableArray* files = [NSMutableArray array];
+    for (NSURL* url : tsuiEach<NSURL*>([panel URLs]))
+        if (![self isOnTheWay:[url path]])
+            [files addObject:[url path]];
+    return files;
+}
+
 - (void)panelSelectionDidChange:(id)panel
 {
     [mSelectedFiles removeAllObjects];
-    NSArray* paths = [[panel URLs] valueForKey:@"path"];
-    [mSelectedFiles addObjectsFromArray:ModrigUtils::RowsFromPaths(ModrigUtils::PathsFromStrings(paths))];
+    const auto paths = ModrigUtils::PathsFromStrings([self filesChosenIn:panel]);
+    [mSelectedFiles addObjectsFromArray:ModrigUtils::RowsFromPaths(paths)];
 }
 
 - (void)openPanelOK:(id)sender
 {
     [self onLoad:sender];
+}
+
+// The path may be that of a row, which goes when the panel moves.
+- (void)showFolder:(NSString*)path
+{
+    NSString* folder = [[path copy] autorelease];
+    self.shownFolder = folder;
+    ModrigPlatform::ShowFolder(mOpenPanel, folder);
 }
 
 - (BOOL)isTesselFolder:(NSString*)path

@@ -29,6 +29,7 @@
     BOOL canUnloadApp;
     BOOL canRemoveHistory;
     NSString* message;
+    NSString* shownFolder;
 }
 
 // What Load will load: `ModrigFilePath`s, from the panel's selection or the History's.
@@ -40,6 +41,8 @@
 @property (nonatomic, assign) BOOL canRemoveHistory;
 // The message line.
 @property (nonatomic, retain) NSString* message;
+// The path of the folder that the panel was sent to or has told of last; it may still be on its way there.
+@property (nonatomic, copy) NSString* shownFolder;
 
 - (id)init;
 
@@ -112,10 +115,26 @@
 
 - (BOOL)panel:(id)panel shouldShowFilename:(NSString*)name;
 - (void)panelSelectionDidChange:(id)panel;
+// The paths of the files that are chosen in the panel. A folder on the way to files is none of them.
+- (NSArray*)filesChosenIn:(id)panel;
 // The action of the panel's default button.
 - (void)openPanelOK:(id)sender;
 
 - (BOOL)isTesselFolder:(NSString*)path;
+- (void)showFolder:(NSString*)path;
+
+@end
+
+// ModrigController+SystemPanel.mm: what a panel needs and asks that keeps its buttons to itself, as the
+// system's on macOS does: it has one that ends it, which loads instead.
+@interface ModrigController (SystemPanel)
+
+- (void)setupPanelWithoutButtons:(NSOpenPanel*)panel;
+
+- (BOOL)panel:(id)panel shouldEnableURL:(NSURL*)url;
+// Loads what the panel has chosen, and answers NO: the panel stays.
+- (BOOL)panel:(id)panel validateURL:(NSURL*)url error:(NSError**)error;
+- (void)panel:(id)panel didChangeToDirectoryURL:(NSURL*)url;
 
 @end
 

@@ -1,5 +1,6 @@
 #import "modrig/dialogs/ModrigController.h"
 
+#include <tesselui/tsuierrors.h>
 #include <tesselui/tsuifilepanel.h>
 
 #import "modrig/dialogs/ModrigStartupSuiteBox.h"
@@ -10,10 +11,26 @@
 #include "modrig/dialogs/Layout.h"
 #include "modrig/dialogs/Settings.h"
 #include "modrig/dialogs/model/RowInsertion.h"
+#include "modrig/dialogs/platform/Dragging.h"
 #include "modrig/lists/History.h"
 #include "modrig/loader/LoadedApplications.h"
 #include "modrig/loader/StartupSuite.h"
 #include "modrig/module/EntryPoint.h"
+
+namespace
+{
+struct ClosingDialog
+{
+    ModrigController* controller;
+    NSOpenPanel* panel;
+};
+
+void cleanPanelOf(void* closing)
+{
+    const auto* dialog = static_cast<ClosingDialog*>(closing);
+    [dialog->controller cleanOpenPanel:dialog->panel];
+}
+} // namespace
 
 @implementation ModrigController
 
@@ -23,6 +40,7 @@
 @synthesize canUnloadApp;
 @synthesize canRemoveHistory;
 @synthesize message;
+@synthesize shownFolder;
 
 - (id)init
 {
@@ -40,6 +58,7 @@
     [mpUIPersistentStore release];
     self.selectedFiles = nil;
     self.message = nil;
+    self.shownFolder = nil;
     [super dealloc];
 }
 
@@ -63,24 +82,36 @@
     self.tabViewSelectedIndex = [settings getControlInt:kSettingsGroup control:kLastTabSetting];
 }
 
+// Only a panel that keeps its own button can end with it, and the files that were chosen are meant then.
+- (void)runPanel:(NSOpenPanel*)panel
+{
+    [self setupOpenPanel:panel];
+    if ([panel runModal] == NSOKButton)
+        [self openPanelOK:panel];
+}
+
 - (void)showModrigDialog
 {
     // At once, and not only when all else is set up: closing stores them, after a failure too.
     [self readSettings];
     ModrigUtils::PopulateLoadedApps();
     NSOpenPanel* panel = tsuiMakeFilePanel();
+    NSString* cleaningFailure = nil;
     @try
     {
-        [self setupOpenPanel:panel];
-        [panel runModal];
+        [self runPanel:panel];
     }
     @finally
     {
-        [self cleanOpenPanel:panel];
+        // What fails here must not keep the lists from being stored.
+        ClosingDialog closing = {self, panel};
+        cleaningFailure = tsuiErrorOf(cleanPanelOf, &closing);
         ModrigUtils::WriteStartupFilesToRegistry();
         ModrigUtils::WriteHistoryFilesToRegistry();
         ModrigUtils::updateRegistry();
     }
+    if (cleaningFailure)
+        [NSException raise:NSGenericException format:@"%@", cleaningFailure];
 }
 
 - (void)restoreLayout
@@ -104,7 +135,7 @@
     [self readSettings];
     [TsOCModrigUtil setModrigController:self];
     [helpButton setKeyEquivalent:ModrigUtils::HelpKey()];
-    NSArray* files = [NSArray arrayWithObject:NSFilenamesPboardType];
+    NSArray* files = ModrigPlatform::DraggedFileTypes();
     [loadedAppsTableView registerForDraggedTypes:files];
     [startupSuiteBox registerForDraggedTypes:files];
     [loadedAppsTableView setDataSource:self];

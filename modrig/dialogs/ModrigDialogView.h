@@ -1,5 +1,5 @@
-// The view of the Load/Unload dialog. Command-1 and Command-2 (Alt on a PC) go to its tabs, which no other
-// key reaches on every platform.
+// The view of the Load/Unload dialog. Alt-1 and Alt-2 (Option-Command on macOS) go to its tabs, which no
+// other key reaches on every platform.
 #pragma once
 
 #import <AppKit/AppKit.h>
@@ -10,6 +10,11 @@
 {
     IBOutlet NSTextField* fileTypesLabel;
     IBOutlet NSPopUpButton* fileTypesChoice;
+    IBOutlet NSTextField* messageLine;
 }
+
+// The Help button stays in the view, at the end of the line of the message, where a panel has no place for
+// it.
+- (void)keepHelpButton:(NSButton*)button;
 
 @end

@@ -8,17 +8,19 @@
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
 #include "modrig/dialogs/model/ShownTab.h"
+#include "modrig/dialogs/platform/Desktop.h"
 
 namespace
 {
 constexpr CGFloat kSmallestHeight = 280; // a table of four rows, and the whole text of the Startup Suite box
 constexpr CGFloat kGap = 6;
+constexpr CGFloat kRightMargin = 14;
 constexpr CGFloat kChoicePlace = 104; // in line with the panel's name field
 
 std::optional<long> tabOf(NSEvent* event)
 {
     NSString* characters = [event charactersIgnoringModifiers];
-    if (!([event modifierFlags] & NSCommandKeyMask) || [characters length] != 1)
+    if (!ModrigPlatform::IsForTabs(event) || [characters length] != 1)
         return std::nullopt;
     return ModrigUtils::TabForKey([characters characterAtIndex:0]);
 }
@@ -54,6 +56,17 @@ std::optional<long> tabOf(NSEvent* event)
 {
     [super resizeSubviewsWithOldSize:size];
     [self placeFileTypes];
+}
+
+- (void)keepHelpButton:(NSButton*)button
+{
+    NSRect help = [button frame];
+    NSRect line = [messageLine frame];
+    help.origin.x = NSMaxX([self bounds]) - kRightMargin - NSWidth(help);
+    line.size.width = NSMinX(help) - kGap - NSMinX(line);
+    [button setFrame:help];
+    [button setAutoresizingMask:NSViewMinXMargin | NSViewMaxYMargin];
+    [messageLine setFrame:line];
 }
 
 - (BOOL)performKeyEquivalent:(NSEvent*)event

@@ -20,7 +20,8 @@ inline constexpr NSInteger kTsUIFilePanelSpareButton = 102;
 
 // A new file panel, autoreleased, which disturbs no other one that is open. `URLs` holds the chosen files, of
 // rows or of typed names; a folder on the way is none. Its delegate decides what is listed
-// (`panel:shouldShowFilename:`) and hears of every choice (`panelSelectionDidChange:`).
+// (`panel:shouldShowFilename:`) and hears of every choice (`panelSelectionDidChange:`); the default button
+// ends the panel unless the delegate refuses one of the files (`panel:validateURL:error:`).
 // `validateVisibleColumns` asks it again, and keeps folder, selection and place. `runModal` ends with
 // NSOKButton unless the default button has been given another target.
 TESSEL_API NSOpenPanel* tsuiMakeFilePanel();

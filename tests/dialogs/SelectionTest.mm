@@ -196,3 +196,17 @@ TEST_F(Selection, OfNewRowsIsOnAgainWhenTheTablesAreFilled)
     EXPECT_TRUE([loadedApps() selectsInsertedObjects]);
     EXPECT_TRUE([historyList() selectsInsertedObjects]);
 }
+
+TEST_F(Selection, IsMadeByNobodyButThePersonWhenTheDialogOpens)
+{
+    gLoadedAppList.AddTail(loadedModule("one.zmb"));
+    gHistoryList.AddTail(CStdStr(file("old.zmb")));
+    open();
+    for (NSArrayController* rows : {loadedApps(), historyList(), fileTypes()})
+        EXPECT_FALSE([rows avoidsEmptySelection]);
+    EXPECT_THAT(selectionOf(loadedApps()), IsEmpty());
+    EXPECT_THAT(selectionOf(historyList()), IsEmpty());
+    EXPECT_THAT(selectedFiles(), IsEmpty());
+    EXPECT_FALSE([mController canUnloadApp]);
+    EXPECT_FALSE([mController canRemoveHistory]);
+}

@@ -49,6 +49,11 @@ class Compiler(unittest.TestCase):
         self.refuses("[view setAutoresizingMask:NSViewWidthSizeable];", "NSViewWidthSizeable")
         self.refuses("[anything isEqual:NSFilenamesPboardTypes];", "NSFilenamesPboardTypes")
 
+    def test_members_of_enumerations_have_the_systems_names(self):
+        for name in ("NSBackingStoreBuffered", "NSEventModifierFlagCommand", "NSTextAlignmentRight", "NSOrderedSame",
+                     "NSLineBreakByWordWrapping", "NSStringDrawingUsesLineFragmentOrigin", "NSTableViewDropAbove"):
+            self.accepts(f"(void){name};")
+
     def test_a_class_that_is_not_there_is_found(self):
         self.refuses("[NSOpenPanels openPanel];", "NSOpenPanels")
 

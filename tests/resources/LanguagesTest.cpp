@@ -42,7 +42,7 @@ bool isRead(const std::string& text)
 Keys keysOfLayout(const std::string& layout)
 {
     Keys keys;
-    std::string column;
+    std::string column, last;
     const std::regex anyElement("<([A-Za-z]+) [^<>]*>");
     for (std::sregex_iterator match(layout.begin(), layout.end(), anyElement), end; match != end; ++match)
     {
@@ -56,6 +56,9 @@ Keys keysOfLayout(const std::string& layout)
                 keys.insert(owner + "." + text);
         if (isRead(attribute(element, "toolTip")))
             keys.insert(id + ".ibShadowedToolTip");
+        if (kind == "accessibility" && isRead(attribute(element, "description")))
+            keys.insert(last + ".ibExternalAccessibilityDescription");
+        last = id.empty() ? last : id;
     }
     return keys;
 }
@@ -125,8 +128,8 @@ TEST(Languages, AreEnglishAndTheOthers)
 TEST(Languages, HaveEveryTextOfTheModulesWindows)
 {
     EXPECT_EQ(whatLanguagesLack(sourceRoot() / "modrig/resources"), "");
-    EXPECT_GE(keysOfLayout(readFile(sourceRoot() / "modrig/resources/Modrig.xib")).size(), 27U);
-    EXPECT_GE(keysOfLayout(readFile(sourceRoot() / "modrig/resources/ModrigStartupSuit.xib")).size(), 8U);
+    EXPECT_GE(keysOfLayout(readFile(sourceRoot() / "modrig/resources/Modrig.xib")).size(), 30U);
+    EXPECT_GE(keysOfLayout(readFile(sourceRoot() / "modrig/resources/ModrigStartupSuit.xib")).size(), 9U);
 }
 
 TEST(Languages, HaveEveryTextOfTheHostsWindows)
@@ -153,11 +156,12 @@ TEST(Languages, AreMissedWhereTheyLackAText)
     const TemporaryFolder resources;
     resources.write("en.lproj/Words.strings", "\"ONE\" = \"one\";\n\"TWO\" = \"two\";\n");
     resources.write("de.lproj/Words.strings", "\"ONE\" = \"eins\";\n\"DREI\" = \"drei\";\n");
-    resources.write("Window.xib",
-                    "<button id=\"b\" toolTip=\"A tip\"><buttonCell title=\"A title\" id=\"c\" />\n"
-                    "<tableColumn id=\"t\">\n<tableHeaderCell key=\"x\" title=\"File\">\n"
-                    "<segment label=\"+\" /><textFieldCell title=\"Text Cell\" id=\"d\">");
+    resources.write("Window.xib", "<button id=\"b\" toolTip=\"A tip\"><accessibility description=\"A name\" "
+                                  "/><buttonCell title=\"A title\" id=\"c\" />\n"
+                                  "<tableColumn id=\"t\">\n<tableHeaderCell key=\"x\" title=\"File\">\n"
+                                  "<segment label=\"+\" /><textFieldCell title=\"Text Cell\" id=\"d\">");
     resources.write("de.lproj/Window.strings", "\"c.title\" = \"Ein Titel\";\n");
     EXPECT_EQ(whatLanguagesLack(resources.path()),
-              "lacks TWO\nhas DREI in vain\nlacks b.ibShadowedToolTip\nlacks t.headerCell.title\n");
+              "lacks TWO\nhas DREI in vain\nlacks b.ibExternalAccessibilityDescription\nlacks "
+              "b.ibShadowedToolTip\nlacks t.headerCell.title\n");
 }

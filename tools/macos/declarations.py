@@ -18,12 +18,12 @@ PLAIN = {
     Kind.CLASS: "Class", Kind.SELECTOR: "SEL", Kind.BOOLEAN: "BOOL",
 }
 NUMBERS = (Kind.LONG, Kind.UNSIGNED_LONG)
-# Members are called like their enumeration, but for these.
+# The tables leave out how the names of an enumeration's members begin: like its own, without an ending that says what it
+# is, or as here.
+ENDING = re.compile(r"(Behavior|Flags|Format|Mask|Mode|Operation|Options?|Order|Policy|Position|State|Style|Types?|Value)$")
 MEMBERS_BEGIN = {
-    "NSAutoresizingMaskOptions": "NSView", "NSComparisonResult": "NSOrdered", "NSTableViewDropOperation": "NSTableViewDrop",
-    "NSURLBookmarkResolutionOptions": "NSURLBookmarkResolution", "NSWindowOrderingMode": "NSWindow",
-    "NSPropertyListMutabilityOptions": "NSPropertyList", "NSEventModifierFlags": "NSEventModifierFlag",
-    "NSWindowOcclusionState": "NSWindowOcclusionState",
+    "NSAutoresizingMaskOptions": "NSView", "NSComparisonResult": "NSOrdered", "NSLineBreakMode": "NSLineBreakBy",
+    "NSPropertyListMutabilityOptions": "NSPropertyList", "NSWindowOrderingMode": "NSWindow",
 }
 # Values that can be combined are whole numbers in C++; all others are of a type of their own.
 COMBINED = re.compile(r"(Options|Mask|Flags|Traits|Actions)$|^NSDragOperation$")
@@ -45,6 +45,7 @@ class Headers:
     def __init__(self, tables, listings, frameworks):
         self._tables, self._listings, self._frameworks = tables, listings, frameworks
         self._classes_named, self._protocols_named, self._structs_named, self._enums_named = set(), set(), set(), set()
+        self._members_named = self._listed("const")
 
     def text(self):
         classes, protocols = self._members()
@@ -183,13 +184,23 @@ class Headers:
         return f"struct {name}"
 
     def _enum(self, name):
-        combined = COMBINED.search(name)
-        begin = MEMBERS_BEGIN.get(name, name)
-        members = ", ".join(f"{member if member.startswith('NS') else begin + member} = {self._value(value)}"
-                            for member, value in self._tables.enums[name].items())
-        if combined:
-            return f"typedef NSUInteger {name};\nenum : NSUInteger {{ {members} }};"
-        return f"typedef enum {name} : NSInteger {{ {members} }} {name};"
+        members = {}
+        for begin in self._begins(name):
+            for member, value in self._tables.enums[name].items():
+                full = member if member.startswith("NS") else begin + member
+                if full not in self._members_named:  # two enumerations may have one word
+                    self._members_named.add(full)
+                    members[full] = value
+        text = ", ".join(f"{member} = {self._value(value)}" for member, value in members.items())
+        if COMBINED.search(name):
+            return f"typedef NSUInteger {name};\nenum : NSUInteger {{ {text} }};"
+        return f"typedef enum {name} : NSInteger {{ {text} }} {name};"
+
+    @staticmethod
+    def _begins(name):
+        if name in MEMBERS_BEGIN:
+            return [MEMBERS_BEGIN[name]]
+        return dict.fromkeys([name, name.removesuffix("s"), ENDING.sub("", name)])
 
     @staticmethod
     def _value(value):

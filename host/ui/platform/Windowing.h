@@ -30,6 +30,12 @@ void runMessage(NSString* text, NSString* detail, bool warning);
 // nil when they cancel. `mayBeNew`: the file need not be there.
 NSString* chooseFile(NSString* folder, NSString* name, bool mayBeNew);
 
+// Puts the view into the panel, in sight.
+void showAccessoryView(NSOpenPanel* panel, NSView* view);
+
+// Sends the panel into the folder. It may get there later.
+void showFolder(NSOpenPanel* panel, NSString* folder);
+
 // Carries out what the screen still has to show.
 void flushScreen();
 } // namespace tessel::windowing

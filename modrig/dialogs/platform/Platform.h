@@ -10,6 +10,14 @@ namespace ModrigPlatform
 // Makes the panel's accessory view as wide as the panel, at any size of it.
 void FitAccessoryView(NSView* view);
 
+// Puts the view into the panel, in sight.
+void ShowAccessoryView(NSOpenPanel* panel, NSView* view);
+
+// Sends the panel into the folder. It may get there later.
+void ShowFolder(NSOpenPanel* panel, NSString* folder);
+// The folder that the panel shows, or is on its way to. `known` (or nil): where it was sent or was last.
+NSURL* FolderOf(NSOpenPanel* panel, NSString* known);
+
 // Lets Tab walk through everything that the window shows now.
 void UpdateKeyViews(NSWindow* window);
 

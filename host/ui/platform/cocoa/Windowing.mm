@@ -54,6 +54,19 @@ NSString* chooseFile(NSString* folder, NSString* name, bool mayBeNew)
     return [panel runModal] == NSOKButton ? [[panel URL] path] : nil;
 }
 
+// The panel hides it behind a button of its own unless it is told not to.
+void showAccessoryView(NSOpenPanel* panel, NSView* view)
+{
+    [panel setAccessoryView:view];
+    [panel setAccessoryViewDisclosed:YES];
+}
+
+void showFolder(NSOpenPanel* panel, NSString* folder)
+{
+    [panel setDirectory:folder];
+    [panel setDirectoryURL:[NSURL fileURLWithPath:folder isDirectory:YES]];
+}
+
 void flushScreen()
 {
 }

@@ -99,6 +99,16 @@ void completeLook()
     suggestSettings(choice);
 }
 
+void showAccessoryView(NSOpenPanel* panel, NSView* view)
+{
+    [panel setAccessoryView:view];
+}
+
+void showFolder(NSOpenPanel* panel, NSString* folder)
+{
+    [panel setDirectory:folder];
+}
+
 void flushScreen()
 {
     completeRequests([GSCurrentServer() serverDevice]);

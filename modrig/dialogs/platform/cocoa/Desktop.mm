@@ -12,6 +12,12 @@ bool IsAlternate(NSEvent* event)
     return [event modifierFlags] & NSAlternateKeyMask;
 }
 
+// Command alone with a number is the panel's: icons, list, columns.
+bool IsForTabs(NSEvent* event)
+{
+    return IsCommand(event) && IsAlternate(event);
+}
+
 NSEvent* ClickOnTable(NSEvent* event)
 {
     return event;

@@ -4,21 +4,38 @@
 
 #include "modrig/dialogs/platform/Platform.h"
 
+namespace
+{
+// A panel that another process draws has none of them, and raises for a name that it does not know.
+NSButton* partNamed(NSSavePanel* panel, NSString* name)
+{
+    @try
+    {
+        id part = [panel valueForKey:name];
+        return [part isKindOfClass:[NSButton class]] ? part : nil;
+    }
+    @catch (id)
+    {
+        return nil;
+    }
+}
+} // namespace
+
 @implementation NSSavePanel (ModrigRuntime)
 
 - (NSButton*)okButton
 {
-    return [self valueForKey:@"_okButton"];
+    return partNamed(self, @"_okButton");
 }
 
 - (NSButton*)cancelButton
 {
-    return [self valueForKey:@"_cancelButton"];
+    return partNamed(self, @"_cancelButton");
 }
 
 - (NSButton*)hideExtensionButton
 {
-    return [self valueForKey:@"_hideExtensionButton"];
+    return partNamed(self, @"_hideExtensionButton");
 }
 
 @end
@@ -33,6 +50,25 @@ void FitAccessoryView(NSView* view)
     [frame setAutoresizesSubviews:YES];
     [view setFrameOrigin:NSZeroPoint];
     [frame resizeSubviewsWithOldSize:[view frame].size];
+}
+
+// The panel hides it behind a button of its own unless it is told not to.
+void ShowAccessoryView(NSOpenPanel* panel, NSView* view)
+{
+    [panel setAccessoryView:view];
+    [panel setAccessoryViewDisclosed:YES];
+}
+
+void ShowFolder(NSOpenPanel* panel, NSString* folder)
+{
+    [panel setDirectory:folder];
+    [panel setDirectoryURL:[NSURL fileURLWithPath:folder isDirectory:YES]];
+}
+
+// The panel is on its way for a while, and answers until then where it was before.
+NSURL* FolderOf(NSOpenPanel* panel, NSString* known)
+{
+    return known ? [NSURL fileURLWithPath:known isDirectory:YES] : [panel directoryURL];
 }
 
 // The platform does so by itself when another tab shows.

@@ -23,6 +23,11 @@ bool IsAlternate(NSEvent* event)
     return [event modifierFlags] & (NSAlternateKeyMask | NSCommandKeyMask);
 }
 
+bool IsForTabs(NSEvent* event)
+{
+    return [event modifierFlags] & NSCommandKeyMask;
+}
+
 // Its tables take a range with Control and single rows with Shift: the other way round.
 NSEvent* ClickOnTable(NSEvent* event)
 {

@@ -36,6 +36,22 @@ void FitAccessoryView(NSView* view)
     [view setAutoresizingMask:[view autoresizingMask] | NSViewWidthSizable];
 }
 
+void ShowAccessoryView(NSOpenPanel* panel, NSView* view)
+{
+    [panel setAccessoryView:view];
+}
+
+void ShowFolder(NSOpenPanel* panel, NSString* folder)
+{
+    [panel setDirectory:folder];
+}
+
+// It is there at once, and nobody tells where it goes.
+NSURL* FolderOf(NSOpenPanel* panel, NSString*)
+{
+    return [panel directoryURL];
+}
+
 // The toolkit works it out once, and not again when another tab shows.
 void UpdateKeyViews(NSWindow* window)
 {

@@ -231,10 +231,21 @@ template <class Function> Function windowMethod(SEL selector)
     }
 }
 
+- (BOOL)delegateTakesChoice
+{
+    if (![[self delegate] respondsToSelector:@selector(panel:validateURL:error:)])
+        return YES;
+    for (NSURL* url : tsuiEach<NSURL*>([self URLs]))
+        if (![[self delegate] panel:self validateURL:url error:nullptr])
+            return NO;
+    return YES;
+}
+
 - (void)ok:(id)sender
 {
     [self bringUpToDate];
-    if ([self goIntoFolder] || [self tellOfMissingFile] || mState->chosen.empty())
+    if ([self goIntoFolder] || [self tellOfMissingFile] || mState->chosen.empty() ||
+        ![self delegateTakesChoice])
         return;
     [NSApp stopModalWithCode:NSOKButton];
 }

@@ -1,0 +1,40 @@
+#import "modrig/dialogs/ModrigController.h"
+
+#import "modrig/dialogs/TsOCModrigUtil.h"
+
+#include "modrig/dialogs/Paths.h"
+
+@implementation ModrigController (SystemPanel)
+
+- (void)setupPanelWithoutButtons:(NSOpenPanel*)panel
+{
+    [panel setPrompt:[TsOCModrigUtil modrigLoadString:@"IDS_MODRIG_MENU_LOAD"]];
+}
+
+- (BOOL)panel:(id)panel shouldEnableURL:(NSURL*)url
+{
+    return [self panel:panel shouldShowFilename:[url path]];
+}
+
+// Whatever was chosen in the History before: who presses the panel's own button means the panel's files.
+- (BOOL)panel:(id)panel validateURL:(NSURL*)url error:(NSError**)error
+{
+    [self panelSelectionDidChange:panel];
+    if ([mSelectedFiles count] == 0)
+        [mSelectedFiles setArray:ModrigUtils::RowsFromPaths({ModrigUtils::PathFromString([url path])})];
+    [self onLoad:panel];
+    // The system shows every error but this one, and what there is to tell has been told.
+    if (error)
+        *error = [NSError errorWithDomain:NSCocoaErrorDomain code:NSUserCancelledError userInfo:nil];
+    return NO;
+}
+
+// To be sent into the module's own bundle is only the way to be asked again.
+- (void)panel:(id)panel didChangeToDirectoryURL:(NSURL*)url
+{
+    NSString* folder = [url path];
+    if (![folder isEqual:[[NSBundle bundleForClass:[self class]] bundlePath]])
+        self.shownFolder = folder;
+}
+
+@end
