@@ -59,6 +59,13 @@ class Linker(unittest.TestCase):
         faults = self.joined(self.link("arm64"), self.link("x86_64", system="13.0"))
         self.assertEqual(faults, ["whole runs from macOS 13.0 on, for x86_64, and not 12.0"])
 
+    def test_modules_are_told_from_other_files(self):
+        module, text = self.link("arm64"), self.folder / "text"
+        text.write_text("it is long enough to have a beginning")
+        library = self.link("x86_64", "-Wl,-dylib")
+        self.assertEqual([binaries.is_linked(file) for file in (module, library, text, self.folder)], [True, True, False, False])
+        self.assertEqual([binaries.is_module(file) for file in (module, library)], [True, False])
+
     def test_functions_and_classes_that_the_system_has_not_got_are_found(self):
         taken, said = clang(MISSING, *LINKED, "-o", self.folder / "half")
         self.assertFalse(taken)

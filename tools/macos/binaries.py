@@ -21,7 +21,10 @@ def run(name, *words):
 
 def header(file):
     """The beginning of a file as numbers, or nothing where it has none."""
-    data = file.open("rb").read(16) if file.is_file() and not file.is_symlink() else b""
+    if file.is_symlink() or not file.is_file():
+        return ()
+    with file.open("rb") as stream:
+        data = stream.read(16)
     return struct.unpack("<4I", data) if len(data) == 16 else ()
 
 

@@ -107,7 +107,7 @@ TEST_F(QuestionsInWindows, BringAllThatIsAskedOnOneLine)
 
 TEST_F(QuestionsInWindows, AreNamedByWhoAsks)
 {
-    tessel::Owned<tessel::CallingApplication> calls;
+    tessel::Owned<tessel::CallingApplication> callers;
     std::vector<std::wstring> titles;
     windows.answer = [&](const tessel::QuestionWindows::Asked& question)
     {
@@ -115,7 +115,7 @@ TEST_F(QuestionsInWindows, AreNamedByWhoAsks)
         return true;
     };
     EXPECT_TRUE(ask({L"Why"}));
-    const tessel::CallingApplication::Scope calling(*calls, L"/a folder/moon.bundle");
+    const tessel::CallingApplication::Scope calling(*callers, L"/a folder/moon.bundle");
     EXPECT_TRUE(ask({L"Why"}));
     EXPECT_THAT(titles, ElementsAre(L"Tessel", L"moon.bundle"));
 }
