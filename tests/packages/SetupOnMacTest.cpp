@@ -1,4 +1,5 @@
-// What is said before anything is built, on a Mac that lacks some of it. Programs stand in the place of those that a Mac has.
+// What is said before anything is built, on a Mac that lacks some of it. Programs stand in the place of those
+// that a Mac has.
 #include <filesystem>
 
 #include <gmock/gmock.h>
@@ -14,8 +15,9 @@ using testing::Not;
 
 namespace
 {
-const char kAllForBuilding[] = "cmake ninja pkgconf ecl bdw-gc sqlite icu4c@77 openssl@3 libedit cli11 gettext "
-                               "boost llvm lld librsvg ";
+const char kAllForBuilding[] =
+    "cmake ninja pkgconf ecl bdw-gc sqlite icu4c@77 openssl@3 libedit cli11 gettext "
+    "boost llvm lld librsvg ";
 
 class SetupOnMac : public testing::Test
 {
@@ -46,7 +48,8 @@ protected:
 
     CommandOutcome setup(const std::string& option = "") const
     {
-        return runCommand("PATH='" + (folder / "bin").string() + "':/usr/bin:/bin " SETUP " " + option + " 2>&1");
+        return runCommand("PATH='" + (folder / "bin").string() + "':/usr/bin:/bin " SETUP " " + option +
+                          " 2>&1");
     }
 
     TemporaryFolder folder;
@@ -65,8 +68,9 @@ TEST_F(SetupOnMac, SaysWhatIsMissingAndTheCommandThatBringsItAndInstallsNothing)
     has("cmake ninja ecl icu4c@77 lldb");
     const auto outcome = setup();
     EXPECT_EQ(outcome.status, 1);
-    EXPECT_THAT(outcome.output, HasSubstr("brew install pkgconf bdw-gc sqlite openssl@3 libedit cli11 gettext "
-                                          "boost llvm lld librsvg googletest nlohmann-json lief ansible doxygen\n"));
+    EXPECT_THAT(outcome.output,
+                HasSubstr("brew install pkgconf bdw-gc sqlite openssl@3 libedit cli11 gettext "
+                          "boost llvm lld librsvg googletest nlohmann-json lief ansible doxygen\n"));
     EXPECT_THAT(outcome.output, Not(HasSubstr("Asked to install")));
 }
 
@@ -83,8 +87,9 @@ TEST_F(SetupOnMac, AsksForTheDeveloperTools)
     program("bin/xcode-select", "echo 'unable to get active developer directory' >&2; exit 2");
     const auto outcome = setup();
     EXPECT_EQ(outcome.status, 1);
-    EXPECT_THAT(outcome.output, AllOf(HasSubstr("Apple's developer tools are missing."), HasSubstr("xcode-select --switch"),
-                                      Not(HasSubstr("brew install")), Not(HasSubstr("unable"))));
+    EXPECT_THAT(outcome.output,
+                AllOf(HasSubstr("Apple's developer tools are missing."), HasSubstr("xcode-select --switch"),
+                      Not(HasSubstr("brew install")), Not(HasSubstr("unable"))));
 }
 
 TEST_F(SetupOnMac, IsNotContentWithToolsThatCannotCompileLayouts)

@@ -7,6 +7,7 @@
 
 namespace tessel
 {
-// What opens a window of it with the program running in it. None: desktops do it for programs that ask for it.
+// What opens a window of it with the program running in it. None: desktops do it for programs that ask for
+// it.
 ProgramWords programInTerminal(const std::filesystem::path& program);
 } // namespace tessel

@@ -28,7 +28,8 @@ protected:
 
     ProgramWords words() const
     {
-        const auto opener = mFolder.write("open", "#!/bin/sh\nprintf '%s' \"$*\" >'" + mNote.string() + "'\n");
+        const auto opener =
+            mFolder.write("open", "#!/bin/sh\nprintf '%s' \"$*\" >'" + mNote.string() + "'\n");
         std::filesystem::permissions(opener, std::filesystem::perms::owner_all);
         return {opener.string(), "/Applications/Tessel"};
     }
