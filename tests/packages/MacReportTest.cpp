@@ -22,8 +22,8 @@ protected:
     {
         fs::create_directories(folder / "tools");
         fs::copy_file(MACOS_REPORT, folder / "tools/macos_report");
-        for (const char* tool : {"sw_vers", "uname", "xcodebuild", "brew", "cmake", "git", "ctest", "codesign",
-                                 "lipo", "otool", "nm", "plutil"})
+        for (const char* tool : {"sw_vers", "uname", "xcodebuild", "brew", "cmake", "git", "ctest",
+                                 "codesign", "lipo", "otool", "nm", "plutil"})
             tells(std::string("bin/") + tool);
         program("bin/screencapture", "echo picture >\"$2\"");
         tells("tools/setup");
