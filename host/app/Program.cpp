@@ -15,7 +15,9 @@
 #include "host/app/Host.h"
 #include "host/app/Options.h"
 #include "host/app/PersonalFolders.h"
+#include "host/app/TerminalWindow.h"
 #include "host/app/WindowBox.h"
+#include "host/app/platform/Terminal.h"
 #include "host/commands/CommandRunner.h"
 #include "host/commands/LastWords.h"
 #include "host/console/Colours.h"
@@ -43,6 +45,7 @@ constexpr int kAllWell = 0;
 constexpr int kSomethingFailed = 1;
 constexpr int kEndedBySignal = 128; // and the signal's number, as shells have it
 
+constexpr char kProgram[] = "Tessel";
 constexpr char kHistoryFile[] = "history";
 constexpr wchar_t kDialogCommand[] = L"_MODRIG"; // by the name that is the same in every language
 
@@ -213,6 +216,9 @@ int runProgram(int count, const char* const* arguments)
     usePersonsLanguage();
     surviveFailingWrites();
     takeStandardDescriptors();
+    const auto program = runningProductFolders().binaries / kProgram;
+    if (goesOnInTerminal(startOfProgram(count), programInTerminal(program)))
+        return kAllWell;
     const auto parsed = parseOptions(count, arguments);
     StandardOutput output(STDOUT_FILENO);
     if (!parsed) // it repeats arguments that anybody may have made up

@@ -12,6 +12,9 @@
 #   A test of ctest: Tessel loads the module in a profile of the test's own, the commands are typed, and every text has
 #   to be in what is shown then. A command that fails makes the test fail.
 #
+# A bundle has the version of the project that it is built in, 1.0 where that has none. On macOS it says from which
+# system on it runs, where CMAKE_OSX_DEPLOYMENT_TARGET does.
+#
 # Modules are built in the current build folder, or in a FOLDER, which may be given from there. Each is a target of CMake's of that NAME. One
 # of C++ links with all of the host's services, exports its entry point alone and tells the version of the SDK.
 include_guard(GLOBAL)
@@ -58,6 +61,15 @@ function(tessel_add_bundle name)
   tessel_add_library(${name} ${name} "${binaries}" ${BUNDLE_UNPARSED_ARGUMENTS})
   set_target_properties(${name} PROPERTIES TESSEL_PATH "${bundle}")
   set(BUNDLE_NAME ${name})
+  set(BUNDLE_VERSION "${PROJECT_VERSION}")
+  if(NOT BUNDLE_VERSION)
+    set(BUNDLE_VERSION 1.0)
+  endif()
+  set(BUNDLE_OLDEST_SYSTEM "")
+  if(CMAKE_OSX_DEPLOYMENT_TARGET)
+    string(CONCAT BUNDLE_OLDEST_SYSTEM "    <key>LSMinimumSystemVersion</key>\n"
+      "    <string>${CMAKE_OSX_DEPLOYMENT_TARGET}</string>\n")
+  endif()
   cmake_path(GET info FILENAME description)
   configure_file("${TESSEL_MODULES_FOLDER}/${description}.in" "${info}" @ONLY)
   if(BUNDLE_TEXTS)

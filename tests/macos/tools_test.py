@@ -1,4 +1,5 @@
 """What stands for Apple's developer tools takes what those take, and nothing else."""
+import struct
 import subprocess
 import tempfile
 import unittest
@@ -6,6 +7,7 @@ from pathlib import Path
 
 from support import ROOT
 
+ICONUTIL = ROOT / "tools/macos/bin/iconutil"
 IBTOOL = ROOT / "tools/macos/bin/ibtool"
 LAYOUT = '<document type="com.apple.InterfaceBuilder3.Cocoa.XIB"><objects/></document>'
 
@@ -27,6 +29,32 @@ class LayoutCompiler(unittest.TestCase):
 
     def test_a_misspelt_word_is_refused(self):
         self.assertEqual(self.compiled(LAYOUT, "--errorz"), (2, False))
+
+
+class IconMaker(unittest.TestCase):
+    def made(self, pictures):
+        """name -> width: what the program answers, and the file."""
+        with tempfile.TemporaryDirectory() as folder:
+            result = Path(folder) / "App.icns"
+            (Path(folder) / "App.iconset").mkdir()
+            for name, pixels in pictures.items():
+                head = b"\x89PNG\r\n\x1a\n" + struct.pack(">I", 13) + b"IHDR" + struct.pack(">II", pixels, pixels)
+                (Path(folder) / "App.iconset" / name).write_bytes(head)
+            words = [ICONUTIL, "--convert", "icns", "--output", result, Path(folder) / "App.iconset"]
+            done = subprocess.run(words, capture_output=True, text=True, check=False)
+            return done.returncode, result.read_bytes() if result.exists() else b""
+
+    def test_pictures_become_one_file(self):
+        status, data = self.made({"icon_16x16.png": 16, "icon_16x16@2x.png": 32})
+        self.assertEqual((status, data[:4], struct.unpack(">I", data[4:8])), (0, b"icns", (len(data),)))
+        self.assertIn(b"icp4", data)
+        self.assertIn(b"ic11", data)
+
+    def test_a_picture_of_another_size_than_its_name_says_is_refused(self):
+        self.assertEqual(self.made({"icon_16x16@2x.png": 16}), (1, b""))
+
+    def test_a_picture_of_an_unknown_name_is_refused(self):
+        self.assertEqual(self.made({"icon_48x48.png": 48}), (1, b""))
 
 
 if __name__ == "__main__":

@@ -74,6 +74,15 @@ TEST_F(Run, PlaysTheTourWhereThereIsNoTerminal)
                       Not(HasSubstr("Tessel --profile-dir"))));
 }
 
+TEST_F(Run, StartsTesselOnAMacWhichHasNoDisplayForATour)
+{
+    program("bin/uname", "echo Darwin");
+    program("build/release/Tessel.app/Contents/MacOS/Tessel", "echo \"${0##*/} $*.\"");
+    const auto outcome = run("");
+    EXPECT_EQ(outcome.status, 0) << outcome.output;
+    EXPECT_THAT(outcome.output, AllOf(HasSubstr("Tessel --profile-dir"), Not(HasSubstr("tour"))));
+}
+
 TEST_F(Run, HandsItsArgumentsToTessel)
 {
     const auto outcome = run("-- -c 'LOAD \"a b.lsp\"' c.zmb");

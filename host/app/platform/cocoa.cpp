@@ -1,4 +1,5 @@
 #include "host/app/platform/DataHome.h"
+#include "host/app/platform/Terminal.h"
 
 #include <cstdlib>
 
@@ -14,5 +15,11 @@ std::filesystem::path personalDataHome()
 std::vector<std::filesystem::path> machineFolders()
 {
     return {"/Library/Application Support/Tessel"};
+}
+
+// The Finder gives no program a terminal.
+ProgramWords programInTerminal(const std::filesystem::path& program)
+{
+    return {"open", "-b", "com.apple.Terminal", program.string()};
 }
 } // namespace tessel

@@ -1,4 +1,5 @@
 #include "host/app/platform/DataHome.h"
+#include "host/app/platform/Terminal.h"
 
 #include <algorithm>
 #include <cstdlib>
@@ -29,5 +30,10 @@ std::vector<std::filesystem::path> machineFolders()
     std::ranges::reverse(folders);
     folders.emplace_back("/etc/tessel");
     return folders;
+}
+
+ProgramWords programInTerminal(const std::filesystem::path&)
+{
+    return {};
 }
 } // namespace tessel
