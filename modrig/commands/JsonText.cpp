@@ -5,8 +5,8 @@ namespace ModrigUtils
 namespace
 {
 constexpr wchar_t kFirstPrivateByte = 0x10FE00;
-constexpr wchar_t kDelete = 0x7F;
-constexpr wchar_t kLastControl = 0x9F;
+constexpr wchar_t kDeleteCharacter = 0x7F;
+constexpr wchar_t kLastControlCharacter = 0x9F;
 constexpr unsigned kBeyondFirstPlane = 0x10000;
 constexpr unsigned kHighHalf = 0xD800;
 constexpr unsigned kLowHalf = 0xDC00;
@@ -32,7 +32,7 @@ std::wstring EscapeCharacter(unsigned character)
 
 bool StandsForItself(wchar_t character)
 {
-    return character >= L' ' && (character < kDelete || character > kLastControl) &&
+    return character >= L' ' && (character < kDeleteCharacter || character > kLastControlCharacter) &&
            character < kFirstPrivateByte;
 }
 } // namespace

@@ -13,15 +13,15 @@ namespace
 {
 constexpr const wchar_t* kModule = L"Modrig.bundle";
 constexpr const wchar_t* kRecordOfModrig = L"TesselModrig";
-constexpr std::size_t kPathSize = 1024;
+constexpr std::size_t kLongestPath = 1024;
 constexpr bool kQuietly = false;
 constexpr bool kTellWhyNot = true;
 constexpr bool kResolveAllNow = true;
 
 CStdStr PathOfModrig()
 {
-    wchar_t path[kPathSize] = {};
-    return tsedGetModuleFileName(kModule, path, kPathSize) == 0 ? CStdStr(std::wstring(path)) : CStdStr();
+    wchar_t path[kLongestPath] = {};
+    return tsedGetModuleFileName(kModule, path, kLongestPath) == 0 ? CStdStr(std::wstring(path)) : CStdStr();
 }
 
 bool IsLoadedByItsCommand()

@@ -9,7 +9,7 @@ namespace
 {
 constexpr char kDragWindow[] = "Files to drag";
 
-std::string inQuotes(const std::string& text)
+std::string asOnePart(const std::string& text)
 {
     return "\"" + text + "\"";
 }
@@ -20,7 +20,7 @@ std::vector<std::string> listCommands(const std::string& list, const std::string
     const std::string set = std::string("REGISTRY SET ") + kDialogsKey + "\\" + list + " ";
     std::vector<std::string> commands = {set + count + " " + std::to_string(paths.size())};
     for (std::size_t index = 0; index < paths.size(); ++index)
-        commands.push_back(set + std::to_string(index + 1) + list + " " + inQuotes(paths[index]));
+        commands.push_back(set + std::to_string(index + 1) + list + " " + asOnePart(paths[index]));
     return commands;
 }
 
@@ -78,7 +78,7 @@ std::string DialogTest::runQuietly(const std::vector<std::string>& commands) con
 
 void DialogTest::setSetting(const std::string& name, const std::string& value) const
 {
-    runQuietly({std::string("REGISTRY SET ") + kSettingsKey + " " + name + " " + inQuotes(value)});
+    runQuietly({std::string("REGISTRY SET ") + kSettingsKey + " " + name + " " + asOnePart(value)});
 }
 
 void DialogTest::setToolkitSetting(const std::string& name, const std::string& value) const
