@@ -13,15 +13,16 @@ namespace
 {
 constexpr const wchar_t* kModule = L"Modrig.bundle";
 constexpr const wchar_t* kRecordOfModrig = L"TesselModrig";
-constexpr std::size_t kLongestPath = 1024;
+constexpr std::size_t kLongestNameOfModule = 1024;
 constexpr bool kQuietly = false;
 constexpr bool kTellWhyNot = true;
 constexpr bool kResolveAllNow = true;
 
 CStdStr PathOfModrig()
 {
-    wchar_t path[kLongestPath] = {};
-    return tsedGetModuleFileName(kModule, path, kLongestPath) == 0 ? CStdStr(std::wstring(path)) : CStdStr();
+    wchar_t path[kLongestNameOfModule] = {};
+    return tsedGetModuleFileName(kModule, path, kLongestNameOfModule) == 0 ? CStdStr(std::wstring(path))
+                                                                           : CStdStr();
 }
 
 bool IsLoadedByItsCommand()

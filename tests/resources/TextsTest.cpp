@@ -24,11 +24,11 @@ struct Message
     Placeholders placeholders;
 };
 
-const Placeholders kNone;
+const Placeholders kNoPlaceholders;
 const Placeholders kOneText = {L"%s"}; // a path, a file name, or a number in decimal
 
 const std::vector<Message> kMessages = {
-    {"kOpenPanelTitle", kOpenPanelTitle, kNone},
+    {"kOpenPanelTitle", kOpenPanelTitle, kNoPlaceholders},
     {"kCannotLoadFile", kCannotLoadFile, kOneText},
     {"kModuleLocked", kModuleLocked, kOneText},
     {"kOneLoaded", kOneLoaded, kOneText},
@@ -39,24 +39,24 @@ const std::vector<Message> kMessages = {
     {"kManyUnloaded", kManyUnloaded, kOneText},
     {"kOneRemovedFromHistory", kOneRemovedFromHistory, kOneText},
     {"kManyRemovedFromHistory", kManyRemovedFromHistory, kOneText},
-    {"kStartupSuitePanelTitle", kStartupSuitePanelTitle, kNone},
-    {"kLispPrompt", kLispPrompt, kNone},
-    {"kCommandGroup", kCommandGroup, kNone},
-    {"kCommandGlobalName", kCommandGlobalName, kNone},
-    {"kCommandLocalName", kCommandLocalName, kNone},
-    {"kListNotStored", kListNotStored, kNone},
-    {"kFilterNotStored", kFilterNotStored, kNone},
+    {"kStartupSuitePanelTitle", kStartupSuitePanelTitle, kNoPlaceholders},
+    {"kLispPrompt", kLispPrompt, kNoPlaceholders},
+    {"kCommandGroup", kCommandGroup, kNoPlaceholders},
+    {"kCommandGlobalName", kCommandGlobalName, kNoPlaceholders},
+    {"kCommandLocalName", kCommandLocalName, kNoPlaceholders},
+    {"kListNotStored", kListNotStored, kNoPlaceholders},
+    {"kFilterNotStored", kFilterNotStored, kNoPlaceholders},
     {"kAllApplicationsFilter", kAllApplicationsFilter, {L"%d", L"%s"}},
-    {"kBundleFilter", kBundleFilter, kNone},
-    {"kCoreModuleFilter", kCoreModuleFilter, kNone},
-    {"kLispSourceFilter", kLispSourceFilter, kNone},
-    {"kObjectModuleFilter", kObjectModuleFilter, kNone},
-    {"kCompiledLispFilter", kCompiledLispFilter, kNone},
-    {"kPackagedLispFilter", kPackagedLispFilter, kNone},
-    {"kMacroProjectFilter", kMacroProjectFilter, kNone},
+    {"kBundleFilter", kBundleFilter, kNoPlaceholders},
+    {"kCoreModuleFilter", kCoreModuleFilter, kNoPlaceholders},
+    {"kLispSourceFilter", kLispSourceFilter, kNoPlaceholders},
+    {"kObjectModuleFilter", kObjectModuleFilter, kNoPlaceholders},
+    {"kCompiledLispFilter", kCompiledLispFilter, kNoPlaceholders},
+    {"kPackagedLispFilter", kPackagedLispFilter, kNoPlaceholders},
+    {"kMacroProjectFilter", kMacroProjectFilter, kNoPlaceholders},
     {"kTooManyFiles", kTooManyFiles, kOneText},
     {"kLoadFailed", kLoadFailed, kOneText},
-    {"kUrlNotFetched", kUrlNotFetched, kNone},
+    {"kUrlNotFetched", kUrlNotFetched, kNoPlaceholders},
     {"kTemporaryInternetFile", kTemporaryInternetFile, kOneText},
     {"kAlreadyLoaded", ModrigMessages::kAlreadyLoaded, kOneText},
     {"kDialogFailed", kDialogFailed, kOneText},
