@@ -112,8 +112,8 @@ NSButton* noButton(id, SEL)
     return nil;
 }
 
-// As long as it lives no panel has handles of its buttons. The methods are taken over by the class that panels
-// have: the toolkit's runtime does not tell a class in use of what its parents get.
+// As long as it lives no panel has handles of its buttons. The methods are taken over by the class that
+// panels have: the toolkit's runtime does not tell a class in use of what its parents get.
 class PanelsWithoutHandles
 {
 public:
@@ -201,9 +201,10 @@ TEST_F(SystemPanel, LoadsWithItsOwnButtonAndStays)
 {
     file("one.zmb");
     const PanelsWithoutHandles panels;
-    runIn(mFolder.path(), {[this] { selectFilesIn(mPanel, {L"one.zmb"}); }, [this] { pressKey(mPanel, @"\r"); },
-                           [this] { return host().linker.isLoaded(file("one.zmb")); },
-                           [this] { EXPECT_TRUE([mPanel isVisible]); }});
+    runIn(mFolder.path(),
+          {[this] { selectFilesIn(mPanel, {L"one.zmb"}); }, [this] { pressKey(mPanel, @"\r"); },
+           [this] { return host().linker.isLoaded(file("one.zmb")); },
+           [this] { EXPECT_TRUE([mPanel isVisible]); }});
     EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"one.zmb")));
 }
 
@@ -284,7 +285,8 @@ TEST_F(SystemPanel, IsKnownToBeWhereItWasSentAndWhereItTells)
     EXPECT_EQ(L"/", shownFolder());
     selectFiles({});
     [[mController selectedFiles]
-        addObject:[[[ModrigFilePath alloc] initWithFilePathName:[[NSBundle mainBundle] bundlePath]] autorelease]];
+        addObject:[[[ModrigFilePath alloc] initWithFilePathName:[[NSBundle mainBundle] bundlePath]]
+                      autorelease]];
     [mController onLoad:nil];
     EXPECT_EQ(wide([[NSBundle mainBundle] bundlePath]), shownFolder());
 }
