@@ -35,6 +35,7 @@ std::wstring durationSince(LoadOutcomes::Clock::time_point begun)
 std::vector<std::wstring> namesOf(const std::vector<SystemVariables::Variable>& variables)
 {
     std::vector<std::wstring> names;
+    names.reserve(variables.size());
     for (const auto& variable : variables)
         names.push_back(variable.name);
     return names;
@@ -48,6 +49,7 @@ std::vector<Branch> keysBelow(LayeredRegistry& registry, std::wstring path)
     std::vector<Branch> keys;
     const auto key = registry.find(path);
     const auto names = key == Registry::kNoKey ? std::vector<std::wstring>() : registry.subKeys(key);
+    keys.reserve(names.size());
     for (const std::wstring& name : names)
         keys.push_back({name, !registry.subKeys(registry.find(name, key)).empty()});
     registry.own().storeSoFar();

@@ -76,8 +76,13 @@ std::vector<std::wstring> usageLines(const std::wstring& name, std::wstring_view
     const std::wstring label = translated(L"Usage: ");
     std::vector<std::wstring> lines;
     for (const auto& way : waysOfTyping(translateAndFill(std::wstring(usage).c_str(), {})))
-        lines.push_back((lines.empty() ? label : std::wstring(displayWidth(label), L' ')) + name +
-                        (way.empty() ? L"" : L" ") + way);
+    {
+        std::wstring& line =
+            lines.emplace_back(lines.empty() ? label : std::wstring(displayWidth(label), L' '));
+        line += name;
+        line += way.empty() ? L"" : L" ";
+        line += way;
+    }
     return lines;
 }
 

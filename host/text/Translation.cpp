@@ -12,7 +12,8 @@ namespace tessel
 namespace
 {
 namespace catalogues = boost::locale::gnu_gettext;
-using Catalogue = boost::locale::message_format<wchar_t>;
+// Of bytes: a wide one would convert every sentence when it is read.
+using Catalogue = boost::locale::message_format<char>;
 
 constexpr char kCatalogue[] = "tessel";
 constexpr int kOnlyDomain = 0;
@@ -40,11 +41,12 @@ std::optional<std::locale> readCatalogue(const std::filesystem::path& folder, co
 {
     catalogues::messages_info wanted;
     wanted.language = language;
+    wanted.encoding = "UTF-8";
     wanted.paths = {folder.string()};
     wanted.domains = {catalogues::messages_info::domain(kCatalogue)};
     try
     {
-        return std::locale(std::locale::classic(), catalogues::create_messages_facet<wchar_t>(wanted));
+        return std::locale(std::locale::classic(), catalogues::create_messages_facet<char>(wanted));
     }
     catch (const std::exception&) // a damaged one is as good as none
     {
@@ -73,10 +75,11 @@ std::wstring fill(std::wstring_view text, std::initializer_list<std::wstring> th
     return filled;
 }
 
-std::wstring fillEither(const wchar_t* translation, const wchar_t* english,
+std::wstring fillEither(const char* translation, const wchar_t* english,
                         std::initializer_list<std::wstring> things)
 {
-    return fill(translation && hasPlacesFor(things.size(), translation) ? translation : english, things);
+    const std::wstring translated = toWide(translation ? translation : "");
+    return fill(translation && hasPlacesFor(things.size(), translated) ? translated : english, things);
 }
 } // namespace
 
@@ -96,16 +99,19 @@ void useTranslations(const std::filesystem::path& folder, const std::vector<std:
 
 std::wstring translateAndFill(const wchar_t* english, std::initializer_list<std::wstring> things)
 {
-    const Catalogue* catalogue = catalogueInUse();
-    return fillEither(catalogue ? catalogue->get(kOnlyDomain, nullptr, english) : nullptr, english, things);
+    // Of an empty text a catalogue has its own head.
+    const Catalogue* catalogue = *english == L'\0' ? nullptr : catalogueInUse();
+    return fillEither(catalogue ? catalogue->get(kOnlyDomain, nullptr, toUtf8(english).c_str()) : nullptr,
+                      english, things);
 }
 
 std::wstring translateAndFill(const wchar_t* one, const wchar_t* several, std::size_t count,
                               std::initializer_list<std::wstring> things)
 {
     const Catalogue* catalogue = catalogueInUse();
-    const wchar_t* translation =
-        catalogue ? catalogue->get(kOnlyDomain, nullptr, one, static_cast<int>(count)) : nullptr;
+    const char* translation =
+        catalogue ? catalogue->get(kOnlyDomain, nullptr, toUtf8(one).c_str(), static_cast<int>(count))
+                  : nullptr;
     return fillEither(translation, count == 1 ? one : several, things);
 }
 } // namespace tessel

@@ -96,6 +96,7 @@ TEST_F(Untranslated, IsNothingOfHelpAndSettings)
     EXPECT_THAT(plainLinesOf({"HELP",
                               "? LOAD",
                               "HELP REGISTRY",
+                              "HELP QUIT",
                               "HELP NOSUCH",
                               "HELP LOD",
                               "HELP MODRIG",

@@ -105,6 +105,13 @@ TEST_F(Translation, CountsAsMissingWhenItsPlacesDoNotFit)
     EXPECT_EQ(translated(L"{} or {}", 1, 2), L"1 or 2");
 }
 
+TEST_F(Translation, OfNothingIsNothing)
+{
+    addCatalogue("de", "msgid \"Good morning\"\nmsgstr \"Guten Morgen\"\n");
+    use({"de"});
+    EXPECT_EQ(translated(L""), L"");
+}
+
 TEST_F(Translation, GoesOnToTheNextLanguageAfterADamagedCatalogue)
 {
     addCatalogue("fr", "msgid \"Good morning\"\nmsgstr \"Bonjour\"\n");
