@@ -3,6 +3,15 @@
 add_library(platform_foundation INTERFACE)
 add_library(platform_toolkit INTERFACE)
 
+# CMake knows these of C++ and not of Objective-C++: without them a library gets no name of its own and
+# finds no neighbours.
+foreach(flag SHARED_LIBRARY_SONAME_%_FLAG SHARED_LIBRARY_RUNTIME_%_FLAG SHARED_LIBRARY_RUNTIME_%_FLAG_SEP
+             EXECUTABLE_RUNTIME_%_FLAG EXECUTABLE_RUNTIME_%_FLAG_SEP)
+  string(REPLACE % OBJCXX objcxx_flag CMAKE_${flag})
+  string(REPLACE % CXX cxx_flag CMAKE_${flag})
+  set(${objcxx_flag} "${${cxx_flag}}")
+endforeach()
+
 if(APPLE)
   # Some calls that the system's headers count as out of use are made on purpose, on either system.
   target_compile_options(platform_foundation INTERFACE
@@ -11,15 +20,6 @@ if(APPLE)
   target_link_libraries(platform_toolkit INTERFACE platform_foundation "-framework Cocoa" "-framework CoreServices")
   return()
 endif()
-
-# CMake knows these of C++ on Linux and not of Objective-C++: without them a library gets no name of its own and
-# finds no neighbours.
-foreach(flag SHARED_LIBRARY_SONAME_%_FLAG SHARED_LIBRARY_RUNTIME_%_FLAG SHARED_LIBRARY_RUNTIME_%_FLAG_SEP
-             EXECUTABLE_RUNTIME_%_FLAG EXECUTABLE_RUNTIME_%_FLAG_SEP)
-  string(REPLACE % OBJCXX objcxx_flag CMAKE_${flag})
-  string(REPLACE % CXX cxx_flag CMAKE_${flag})
-  set(${objcxx_flag} "${${cxx_flag}}")
-endforeach()
 
 find_program(GNUSTEP_CONFIG gnustep-config REQUIRED)
 function(gnustep_config option result)

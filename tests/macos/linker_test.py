@@ -45,6 +45,10 @@ class Linker(unittest.TestCase):
         binaries.join(halves, whole)
         return list(binaries.faults(whole, {"_tsrxEntryPoint"}, "12.0"))
 
+    def test_a_module_that_looks_in_a_place_of_the_machine_it_was_built_on_is_found(self):
+        halves = self.link("arm64", "-Wl,-rpath,/work/place"), self.link("x86_64", "-Wl,-rpath,@loader_path/..")
+        self.assertEqual(self.joined(*halves), ["whole cannot be moved, for arm64: /work/place"])
+
     def test_a_module_with_its_entry_point_alone_passes(self):
         self.assertEqual(self.joined(self.link("arm64"), self.link("x86_64")), [])
 

@@ -52,8 +52,18 @@ def exported(file, processor):
     return {word for word in listed.split() if word.startswith("_") and word not in ("__mh_bundle_header", "__mh_execute_header")}
 
 
+def load_commands(file, processor):
+    return run("llvm-objdump", "--macho", f"--arch={processor}", "--private-headers", file)
+
+
+def places(file, processor):
+    """Where the file looks for libraries, and what it calls itself: places of the system, or from where it stands."""
+    named = re.findall(r"cmd LC_(?:RPATH|LOAD_DYLIB|ID_DYLIB)\n.*\n\s*(?:path|name) (\S+)", load_commands(file, processor))
+    return [place for place in named if not place.startswith(("@rpath/", "@loader_path", "/usr/", "/System/"))]
+
+
 def oldest_system(file, processor):
-    commands = run("llvm-objdump", "--macho", f"--arch={processor}", "--private-headers", file)
+    commands = load_commands(file, processor)
     found = re.search(r"cmd LC_BUILD_VERSION\n(?:.*\n)*?\s*minos (\S+)", commands)
     return found.group(1) if found else "none"
 
@@ -67,5 +77,6 @@ def faults(file, wanted, system):
         symbols = exported(file, processor)
         if wanted is not None and symbols != wanted:
             yield f"{file.name} exports, for {processor}: {', '.join(sorted(symbols)) or 'nothing'}"
+        yield from (f"{file.name} cannot be moved, for {processor}: {place}" for place in places(file, processor))
         if oldest_system(file, processor) != system:
             yield f"{file.name} runs from macOS {oldest_system(file, processor)} on, for {processor}, and not {system}"

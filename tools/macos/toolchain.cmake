@@ -21,6 +21,7 @@ endforeach()
 
 # What comes with Apple's developer tools and is called by name.
 list(PREPEND CMAKE_PROGRAM_PATH "${CMAKE_CURRENT_LIST_DIR}/bin")
+set(ENV{PATH} "${CMAKE_CURRENT_LIST_DIR}/bin:$ENV{PATH}") # CMake itself asks one which system this is
 
 # Libraries and headers are found in the SDK alone, programs on this machine.
 set(CMAKE_FIND_ROOT_PATH "${MACOS_SDK}")
