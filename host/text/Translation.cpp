@@ -79,7 +79,9 @@ std::wstring fillEither(const char* translation, const wchar_t* english,
                         std::initializer_list<std::wstring> things)
 {
     const std::wstring translated = toWide(translation ? translation : "");
-    return fill(translation && hasPlacesFor(things.size(), translated) ? translated : english, things);
+    if (translation && hasPlacesFor(things.size(), translated))
+        return fill(translated, things);
+    return hasPlacesFor(things.size(), english) ? fill(english, things) : english;
 }
 } // namespace
 

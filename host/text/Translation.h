@@ -86,6 +86,8 @@ std::wstring asWords(const Thing& thing)
         return std::wstring(thing);
 }
 
+// Of a text that the compiler has not seen, such as an application's: where its places are not as many as the
+// things it stays as it is.
 std::wstring translateAndFill(const wchar_t* english, std::initializer_list<std::wstring> things);
 std::wstring translateAndFill(const wchar_t* one, const wchar_t* several, std::size_t count,
                               std::initializer_list<std::wstring> things);

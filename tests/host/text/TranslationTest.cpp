@@ -105,6 +105,12 @@ TEST_F(Translation, CountsAsMissingWhenItsPlacesDoNotFit)
     EXPECT_EQ(translated(L"{} or {}", 1, 2), L"1 or 2");
 }
 
+TEST_F(Translation, LeavesATextOfSomebodyElsesAsItIs)
+{
+    EXPECT_EQ(tessel::translateAndFill(L"SET {} {} | CLEAR {2}", {}), L"SET {} {} | CLEAR {2}");
+    EXPECT_EQ(tessel::translateAndFill(L"SET {}", {L"one", L"two"}), L"SET {}");
+}
+
 TEST_F(Translation, OfNothingIsNothing)
 {
     addCatalogue("de", "msgid \"Good morning\"\nmsgstr \"Guten Morgen\"\n");
