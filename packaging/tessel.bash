@@ -1,6 +1,12 @@
 # Completion of bash for tessel.
 _tessel() {
   local word=${COMP_WORDS[COMP_CWORD]} before=${COMP_WORDS[COMP_CWORD - 1]}
+  # bash takes the sign in --profile-dir=FOLDER for a word of its own.
+  if [[ $word == = ]]; then
+    word=
+  elif [[ $before == = ]]; then
+    before=${COMP_WORDS[COMP_CWORD - 2]}
+  fi
   case $before in
     --profile-dir | --layout-dir)
       mapfile -t COMPREPLY < <(compgen -d -- "$word")

@@ -98,18 +98,17 @@ Result<> listForPrograms(Parts& parts, const std::wstring& path)
     const auto key = registry.find(path);
     if (key == Registry::kNoKey)
         return notFound(registry.own(), path, doesNotExist(path));
-    std::vector<std::wstring> values;
+    Json values = Json::array();
     for (const auto& value : registry.values(key))
-        values.push_back(
-            json::object({{L"name", json::text(value.name)},
-                          {L"data", json::text(value.data)},
-                          {L"file", value.file.empty() ? L"null" : json::text(toText(value.file))}}));
+        values.push_back({{"name", json::text(value.name)},
+                          {"data", json::text(value.data)},
+                          {"file", value.file.empty() ? Json() : json::text(toText(value.file))}});
     const auto keys = registry.subKeys(key);
     if (registry.own().readFailed())
         return notReadToItsEnd(registry.own(), path);
-    return succeed(parts, json::object({{L"key", json::text(path)},
-                                        {L"keys", json::listOfTexts(keys)},
-                                        {L"values", json::list(values)}}));
+    return succeed(
+        parts,
+        json::written({{"key", json::text(path)}, {"keys", json::listOfTexts(keys)}, {"values", values}}));
 }
 
 Result<> getForPrograms(Parts& parts, const std::wstring& path, const std::wstring& name)
@@ -118,8 +117,8 @@ Result<> getForPrograms(Parts& parts, const std::wstring& path, const std::wstri
     if (!data)
         return notFound(*parts.registry, path, hasNoValue(path, name));
     return succeed(
-        parts, json::object(
-                   {{L"key", json::text(path)}, {L"name", json::text(name)}, {L"data", json::text(*data)}}));
+        parts,
+        json::written({{"key", json::text(path)}, {"name", json::text(name)}, {"data", json::text(*data)}}));
 }
 
 // A key alone is made; with a name, the value is stored.

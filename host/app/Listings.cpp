@@ -13,69 +13,67 @@ namespace tessel
 namespace
 {
 using Arguments = CommandStack::Arguments;
-using Texts = std::vector<std::wstring>;
 
-Result<> sayDocument(Parts& parts, const json::Fields& fields)
+Result<> sayDocument(Parts& parts, const Json& document)
 {
-    return succeed(parts, json::object(fields));
+    return succeed(parts, json::written(document));
 }
 
-std::wstring timeOf(const Parts& parts, const std::wstring& path)
+Json timeOf(const Parts& parts, const std::wstring& path)
 {
     const LoadOutcome* outcome = parts.loadOutcomes.of(path);
-    return outcome && outcome->loaded ? std::to_wstring(outcome->took.count()) : L"null";
+    return outcome && outcome->loaded ? Json(outcome->took.count()) : Json();
 }
 
-std::wstring loadedApplication(const Parts& parts, const std::wstring& path, const wchar_t* kind, bool locked)
+Json loadedApplication(const Parts& parts, const std::wstring& path, const char* kind, bool locked)
 {
-    return json::object({{L"path", json::text(path)},
-                         {L"kind", json::text(kind)},
-                         {L"isLocked", json::truth(locked)},
-                         {L"loadedInMicroseconds", timeOf(parts, path)}});
+    return {{"path", json::text(path)},
+            {"kind", kind},
+            {"isLocked", locked},
+            {"loadedInMicroseconds", timeOf(parts, path)}};
 }
 
-std::wstring loadedApplications(const Parts& parts)
+Json loadedApplications(const Parts& parts)
 {
-    Texts all;
+    Json all = Json::array();
     for (const auto& module : parts.linker->loadedModules())
-        all.push_back(loadedApplication(parts, module.path, L"compiled", module.locked));
+        all.push_back(loadedApplication(parts, module.path, "compiled", module.locked));
     for (int index = 0; index < parts.document->loadedApplicationCount(); ++index)
-        all.push_back(loadedApplication(parts, parts.document->loadedApplicationName(index), L"lisp", true));
-    return json::list(all);
+        all.push_back(loadedApplication(parts, parts.document->loadedApplicationName(index), "lisp", true));
+    return all;
 }
 
-std::wstring withReason(const std::wstring& path, const std::wstring& reason)
+Json withReason(const std::wstring& path, const std::wstring& reason)
 {
-    return json::object({{L"path", json::text(path)}, {L"reason", json::text(reason)}});
+    return {{"path", json::text(path)}, {"reason", json::text(reason)}};
 }
 
 Result<> applications(Parts& parts, const Arguments& arguments)
 {
     if (!arguments.empty())
         return wrongUsage(parts, L"APPS");
-    Texts keptOut;
+    Json keptOut = Json::array();
     for (const auto& application : parts.keptOut.all())
         if (application.isOut())
             keptOut.push_back(withReason(toWide(application.path), reasonOf(application)));
-    Texts failed;
+    Json failed = Json::array();
     for (const LoadOutcome& outcome : parts.loadOutcomes.failed())
         failed.push_back(withReason(outcome.path, outcome.loaded.sentence()));
-    return sayDocument(parts, {{L"loaded", loadedApplications(parts)},
-                               {L"keptOut", json::list(keptOut)},
-                               {L"notLoaded", json::list(failed)}});
+    return sayDocument(parts,
+                       {{"loaded", loadedApplications(parts)}, {"keptOut", keptOut}, {"notLoaded", failed}});
 }
 
 Result<> commandList(Parts& parts, const Arguments& arguments)
 {
     if (!arguments.empty())
         return wrongUsage(parts, L"HELP");
-    Texts commands;
+    Json commands = Json::array();
     for (const auto& command : parts.commands->descriptions())
-        commands.push_back(json::object({{L"name", json::text(command.name)},
-                                         {L"group", json::text(command.group)},
-                                         {L"usage", json::text(command.usage)},
-                                         {L"summary", json::text(command.summary)}}));
-    return sayDocument(parts, {{L"commands", json::list(commands)}});
+        commands.push_back({{"name", json::text(command.name)},
+                            {"group", json::text(command.group)},
+                            {"usage", json::text(command.usage)},
+                            {"summary", json::text(command.summary)}});
+    return sayDocument(parts, {{"commands", commands}});
 }
 
 Result<> profileList(Parts& parts, const Arguments& arguments)
@@ -83,30 +81,30 @@ Result<> profileList(Parts& parts, const Arguments& arguments)
     if (!arguments.empty())
         return wrongUsage(parts, L"PROFILE");
     const auto key = parts.layered->find(std::wstring(kProductRegistryRoot) + L"\\Profiles");
-    const Texts names = key == Registry::kNoKey ? Texts() : parts.layered->subKeys(key);
+    const auto names = key == Registry::kNoKey ? std::vector<std::wstring>() : parts.layered->subKeys(key);
     return sayDocument(
-        parts, {{L"current", json::text(parts.profiles.current())}, {L"profiles", json::listOfTexts(names)}});
+        parts, {{"current", json::text(parts.profiles.current())}, {"profiles", json::listOfTexts(names)}});
 }
 
-std::wstring valueOf(const SystemVariables::Variable& variable)
+Json valueOf(const SystemVariables::Variable& variable)
 {
-    const bool isNumber = std::holds_alternative<std::int16_t>(variable.value);
-    return isNumber ? toText(variable.value) : json::text(toText(variable.value));
+    const auto* number = std::get_if<std::int16_t>(&variable.value);
+    return number ? Json(*number) : json::text(toText(variable.value));
 }
 
 Result<> variableList(Parts& parts, const Arguments& arguments)
 {
     if (arguments.size() > 1)
         return wrongUsage(parts, L"SETVAR");
-    Texts variables;
+    Json variables = Json::array();
     for (const auto& variable : parts.variables->all())
         if (arguments.empty() || equalIgnoringCase(variable.name, arguments.front()))
-            variables.push_back(json::object({{L"name", json::text(variable.name)},
-                                              {L"value", valueOf(variable)},
-                                              {L"purpose", json::text(variable.purpose)}}));
+            variables.push_back({{"name", json::text(variable.name)},
+                                 {"value", valueOf(variable)},
+                                 {"purpose", json::text(variable.purpose)}});
     if (variables.empty())
         return Failure{translated(L"There is no variable called \"{}\".", arguments.front())};
-    return sayDocument(parts, {{L"variables", json::list(variables)}});
+    return sayDocument(parts, {{"variables", variables}});
 }
 } // namespace
 

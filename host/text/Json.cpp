@@ -1,84 +1,61 @@
 #include "host/text/Json.h"
 
-#include <algorithm>
+#include <boost/locale/encoding_utf.hpp>
+
+#include "host/text/Unicode.h"
 
 namespace tessel::json
 {
 namespace
 {
+using boost::locale::conv::utf_to_utf;
+
 constexpr wchar_t kDelete = 0x7F;
 constexpr wchar_t kLastControl = 0x9F;
 constexpr wchar_t kFirstPrivateByte = 0x10FE00;
-constexpr unsigned kBeyondFirstPlane = 0x10000;
+constexpr int kOnOneLine = -1;
+constexpr bool kInAscii = true;
 
 bool standsForItself(wchar_t character)
 {
-    return character >= L' ' && (character < kDelete || character > kLastControl) &&
-           character < kFirstPrivateByte;
+    return character < kDelete || (character > kLastControl && character < kFirstPrivateByte);
 }
 
-std::wstring escapedUnit(unsigned unit)
+// With a private character as its four bytes, and not as the byte that it stands for, which would be no
+// UTF-8.
+std::string utf8Of(std::wstring_view content)
 {
-    constexpr wchar_t kDigits[] = L"0123456789abcdef";
-    std::wstring escape = L"\\u";
-    for (int shift = 12; shift >= 0; shift -= 4)
-        escape += kDigits[(unit >> shift) & 0xF];
-    return escape;
+    return utf_to_utf<char>(toUtf16(content));
 }
 
-// As one unit of UTF-16, or as two.
-std::wstring escaped(unsigned character)
+std::wstring escaped(wchar_t character)
 {
-    if (character < kBeyondFirstPlane)
-        return escapedUnit(character);
-    const unsigned rest = character - kBeyondFirstPlane;
-    return escapedUnit(0xD800 + (rest >> 10)) + escapedUnit(0xDC00 + (rest & 0x3FF));
-}
-
-std::wstring joined(const std::vector<std::wstring>& values)
-{
-    std::wstring all;
-    for (const std::wstring& value : values)
-        all += (all.empty() ? L"" : L", ") + value;
-    return all;
+    const std::string quoted = Json(utf8Of({&character, 1})).dump(kOnOneLine, ' ', kInAscii);
+    return std::wstring(quoted.begin() + 1, quoted.end() - 1);
 }
 } // namespace
 
-std::wstring text(std::wstring_view content)
+Json text(std::wstring_view content)
 {
-    std::wstring quoted = L"\"";
-    for (const wchar_t character : content)
-        if (character == L'"' || character == L'\\')
-            quoted += {L'\\', character};
-        else if (standsForItself(character))
-            quoted += character;
+    return utf8Of(content);
+}
+
+Json listOfTexts(const std::vector<std::wstring>& contents)
+{
+    Json values = Json::array();
+    for (const std::wstring& content : contents)
+        values.push_back(text(content));
+    return values;
+}
+
+std::wstring written(const Json& document)
+{
+    std::wstring line;
+    for (const wchar_t character : utf_to_utf<wchar_t>(document.dump()))
+        if (standsForItself(character))
+            line += character;
         else
-            quoted += escaped(static_cast<unsigned>(character));
-    return quoted + L"\"";
-}
-
-std::wstring truth(bool value)
-{
-    return value ? L"true" : L"false";
-}
-
-std::wstring list(const std::vector<std::wstring>& values)
-{
-    return L"[" + joined(values) + L"]";
-}
-
-std::wstring listOfTexts(const std::vector<std::wstring>& contents)
-{
-    std::vector<std::wstring> values(contents.size());
-    std::ranges::transform(contents, values.begin(), text);
-    return list(values);
-}
-
-std::wstring object(const Fields& fields)
-{
-    std::vector<std::wstring> members;
-    for (const auto& [name, value] : fields)
-        members.push_back(text(name) + L": " + value);
-    return L"{" + joined(members) + L"}";
+            line += escaped(character);
+    return line;
 }
 } // namespace tessel::json

@@ -14,7 +14,9 @@ function(add_resource_module output)
   cmake_path(GET output STEM stem)
   # Compiler and linker take a path that begins with a slash for an option when its first letters are those of one
   # (/check/... is read as /c), so that they are given names relative to the folder they work in.
-  set(scratch "${CMAKE_CURRENT_BINARY_DIR}/${stem}.resources")
+  # Each output has a folder of its own: others of its name are made at the same time.
+  string(MD5 place "${output}")
+  set(scratch "${CMAKE_CURRENT_BINARY_DIR}/${stem}.${place}.resources")
   file(MAKE_DIRECTORY "${scratch}")
   file(RELATIVE_PATH relative_output "${scratch}" "${output}")
   foreach(source IN LISTS ARGN)

@@ -23,9 +23,12 @@ OTHERS = ("sqlite3", "icuuc", "icudata", "icui18n", "curl", "edit", "ecl", "gc",
 # Below /usr/include or its folder for this machine: what belongs to those libraries, and nothing else.
 OTHER_HEADERS = ("sqlite3.h", "sqlite3ext.h", "unicode", "curl", "editline", "histedit.h", "ecl", "gc", "gc.h", "gmp.h", "CLI",
                  "atomic_ops", "atomic_ops.h",
-                 "openssl", "zlib.h", "zconf.h", "boost")
+                 "openssl", "zlib.h", "zconf.h", "boost", "nlohmann")
 CLI11 = """add_library(CLI11::CLI11 INTERFACE IMPORTED)
 target_include_directories(CLI11::CLI11 INTERFACE "${CMAKE_CURRENT_LIST_DIR}/../../../include")
+"""
+NLOHMANN_JSON = """add_library(nlohmann_json::nlohmann_json INTERFACE IMPORTED)
+target_include_directories(nlohmann_json::nlohmann_json INTERFACE "${CMAKE_CURRENT_LIST_DIR}/../../../include")
 """
 BOOST = """set(Boost_locale_FOUND TRUE)
 add_library(Boost::headers INTERFACE IMPORTED)
@@ -128,7 +131,7 @@ def put_libraries(sdk, folder, tables, listings):
         symbols = stubs.exported_on_linux(found_here(f"lib{name}.so", places))
         write(sdk / f"usr/local/lib/lib{name}.tbd", stubs.stub(f"/usr/local/lib/lib{name}.dylib", symbols))
     write(sdk / "usr/local/lib/libboost_locale.tbd", stubs.stub("/usr/local/lib/libboost_locale.dylib", stubs.BOOST_LOCALE))
-    for name, text in (("CLI11", CLI11), ("Boost", BOOST)):
+    for name, text in (("CLI11", CLI11), ("Boost", BOOST), ("nlohmann_json", NLOHMANN_JSON)):
         write(sdk / f"usr/local/share/cmake/{name}/{name}Config.cmake", text)
     for name, libraries in PACKAGES.items():
         write(sdk / f"usr/local/lib/pkgconfig/{name}.pc",

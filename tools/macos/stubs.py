@@ -14,8 +14,8 @@ _objc_sync_enter _objc_sync_exit _objc_autoreleasePoolPush _objc_autoreleasePool
 _objc_autoreleaseReturnValue _objc_storeStrong""".split()
 # Of libraries in C++ the symbols here are spelt otherwise, after another C++ library: those that we call.
 BOOST_LOCALE = [
-    "__ZN5boost6locale11gnu_gettext21create_messages_facetIwEEPNS0_14message_formatIT_EERKNS1_13messages_infoE",
-    "__ZN5boost6locale19base_message_formatIwE2idE",
+    "__ZN5boost6locale11gnu_gettext21create_messages_facetIcEEPNS0_14message_formatIT_EERKNS1_13messages_infoE",
+    "__ZN5boost6locale19base_message_formatIcE2idE",
 ]
 CORE_FOUNDATION = ["___CFConstantStringClassReference"]
 
