@@ -29,9 +29,9 @@ protected:
                 .output;
         const std::string before = "Given: <";
         const auto start = shown.rfind(before);
-        return start == shown.npos ? shown
-                                   : shown.substr(start + before.size(),
-                                                  shown.find('>', start) - start - before.size());
+        return start == shown.npos
+                   ? shown
+                   : shown.substr(start + before.size(), shown.find('>', start) - start - before.size());
     }
 
     TemporaryFolder folder;
