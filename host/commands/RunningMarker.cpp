@@ -25,7 +25,7 @@ namespace
 constexpr std::array<char, 16> kMagic = {'t', 'e', 's', 's', 'e', 'l', ' ', 'r',
                                          'u', 'n', 'n', 'i', 'n', 'g', ' ', '1'};
 constexpr char kFilePrefix[] = "running.";
-constexpr char kLockName[] = "lock";
+constexpr char kMarkerLock[] = "lock";
 constexpr std::size_t kDeepest = 128;
 constexpr std::size_t kTextBytes = 56000;
 
@@ -112,7 +112,7 @@ Result<> RunningMarker::keepIn(const std::filesystem::path& folder)
             translated(L"the folder {} cannot be made: {}", folder, systemFailure(failed.value()).sentence)};
     // Held while we look for what others have left and make our own file: one that has no lock yet would be
     // taken for one of the dead.
-    const FileLock locked(folder / kLockName);
+    const FileLock locked(folder / kMarkerLock);
     if (!locked.held())
         return locked.held();
     collect(folder);

@@ -12,7 +12,7 @@ namespace
 {
 constexpr std::size_t kShortestBeginning = 3;
 constexpr std::size_t kLongName = 6;
-constexpr std::size_t kLongestName = 64; // nobody means a name by more
+constexpr std::size_t kLongestTyped = 64; // nobody means a name by more
 
 using Row = std::vector<std::size_t>;
 
@@ -60,7 +60,7 @@ std::optional<std::wstring> onlyOneThatBegins(std::wstring_view folded,
 
 std::optional<std::wstring> nearest(std::wstring_view typed, const std::vector<std::wstring>& names)
 {
-    if (typed.size() < 2 || typed.size() > kLongestName)
+    if (typed.size() < 2 || typed.size() > kLongestTyped)
         return std::nullopt;
     const std::wstring folded = foldCase(typed);
     std::size_t best = typed.size() < kLongName ? 2 : 3;
