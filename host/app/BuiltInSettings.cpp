@@ -4,6 +4,7 @@
 #include "host/app/Parts.h"
 #include "host/text/Table.h"
 #include "host/text/Translation.h"
+#include "host/text/Unicode.h"
 
 namespace tessel
 {
@@ -45,12 +46,22 @@ Result<> setVariable(Parts& parts, const CommandStack::Arguments& arguments)
     return parts.variables->set(arguments[0], arguments[1]);
 }
 
+// The Startup Suite belongs to the profile.
+Result<> changeProfile(Parts& parts, const std::wstring& name)
+{
+    const bool isAnother = !equalIgnoringCase(name, parts.profiles.current());
+    const auto changed = parts.profiles.setCurrent(name);
+    if (changed && isAnother)
+        parts.registryNews.noteChange();
+    return changed;
+}
+
 Result<> profile(Parts& parts, const CommandStack::Arguments& arguments)
 {
     if (arguments.size() > 1)
         return wrongUsage(parts, L"PROFILE");
     if (arguments.size() == 1)
-        return parts.profiles.setCurrent(arguments.front());
+        return changeProfile(parts, arguments.front());
     sayLine(parts, parts.profiles.current());
     return {};
 }

@@ -1,6 +1,6 @@
 // Whether the registry holds, since the last start, what applications cannot know of: an administrator lays
-// out something else, or a registry file was taken in. What waits for a command may want to be loaded at the
-// start by now.
+// out something else, a registry file was taken in, or another profile is the current one. What waits for a
+// command may want to be loaded at the start by now.
 #pragma once
 
 #include <string>

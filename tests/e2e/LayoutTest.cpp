@@ -106,6 +106,27 @@ TEST_F(Layout, ThatIsPolicyReachesWhoHasEmptiedTheirSuite)
     EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
 }
 
+TEST_F(Layout, OfASuiteIsLoadedOnceItsProfileIsTheCurrentOne)
+{
+    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    for (int start = 0; start < 2; ++start)
+        session.run({"PROFILE empty"});
+    ASSERT_THAT(apps(), EndsWith("Command: APPS\nNo application is loaded.\n"));
+    session.run({"PROFILE Default"});
+    EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
+}
+
+TEST_F(Layout, IsNotLookedAtForAProfileThatIsTheCurrentOneAlready)
+{
+    storeSuite(session, {sample("calendar.qbc")});
+    apps();
+    storeSuite(session, {});
+    apps();
+    ASSERT_THAT(apps(), EndsWith("Command: APPS\nNo application is loaded.\n"));
+    session.run({"PROFILE DEFAULT"});
+    EXPECT_THAT(apps(), EndsWith("Command: APPS\nNo application is loaded.\n"));
+}
+
 // In a safe session nothing of it was loaded; only the layout knows the whole path.
 TEST_F(Layout, OfASuiteIsKnownToDisableByItsNames)
 {
