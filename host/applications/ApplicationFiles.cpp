@@ -16,6 +16,8 @@ namespace
 {
 constexpr std::array<std::wstring_view, 3> kModules = {L".bundle", L".zmb", L".omp"};
 constexpr std::array<std::wstring_view, 2> kLisp = {L".lsp", L".qbc"};
+constexpr std::array<std::wstring_view, 1> kPackagedLisp = {L".rpk"};
+constexpr std::array<std::wstring_view, 1> kMacroProjects = {L".mcp"};
 
 template <std::size_t count>
 bool hasOneOf(const std::array<std::wstring_view, count>& extensions, const std::filesystem::path& path)
@@ -42,6 +44,16 @@ bool isCalledAsModule(const std::filesystem::path& path)
 bool isCalledAsLisp(const std::filesystem::path& path)
 {
     return hasOneOf(kLisp, path);
+}
+
+Result<> checkKindIsLoaded(const std::filesystem::path& path)
+{
+    if (hasOneOf(kPackagedLisp, path))
+        return Failure{translated(L"it is a packaged Lisp application, a kind that Tessel does not load; "
+                                  L"Lisp files (.lsp, .qbc) can be loaded")};
+    if (hasOneOf(kMacroProjects, path))
+        return Failure{translated(L"it is a macro project, a kind that Tessel does not load")};
+    return {};
 }
 
 Result<> checkIsApplication(const std::filesystem::path& path)

@@ -6,6 +6,7 @@
 #include <utility>
 
 #include "host/applications/Admission.h"
+#include "host/applications/ApplicationFiles.h"
 #include "host/applications/ExceptionGuard.h"
 #include "host/applications/ImageCheck.h"
 #include "host/applications/LoadOutcomes.h"
@@ -72,6 +73,15 @@ Failure ofProgram(const ModuleFile& file, const Result<>& loadable)
     return {
         translated(L"its program \"{}\" cannot be used, since {}", toWide(file.program), loadable.sentence()),
         loadable.code()};
+}
+
+// Of a file that is no library, its name may say what it is.
+Result<> whyNotLoadable(const ModuleFile& file, const RegularFile& program, const Result<>& loadable)
+{
+    if (file.isBundle)
+        return ofProgram(file, loadable);
+    const auto kind = checkKindIsLoaded(file.path);
+    return program.opened() && !kind ? kind : loadable;
 }
 
 // What a person is told of an attempt.
@@ -165,7 +175,7 @@ Result<> DynamicLinker::loadNew(const std::wstring& path, bool resolveNow)
     if (!file)
         return file.failure();
     if (auto loadable = checkLoadable(program); !loadable)
-        return file->program == toUtf8(path) ? loadable : ofProgram(*file, loadable);
+        return whyNotLoadable(*file, program, loadable);
     if (mHalfMapped.contains(program.identity()))
         return Failure{translated(L"it threw an exception before while it was being mapped, and what is in "
                                   L"memory of it since cannot be used")};

@@ -28,6 +28,31 @@ TEST(FilesAsArguments, ThatCannotBeLoadedKeepTheOthersFromNothingAndTheStatusTel
                                  kVersionLine);
 }
 
+TEST(FilesAsArguments, OfAKindThatIsKnownAndNotLoadedAreToldSo)
+{
+    const HostSession session;
+    const auto macros = session.folder().write("MACROS.MCP", "macros\n").string();
+    const auto result = session.start({sample("survey.rpk"), macros, "/nowhere/gone.rpk"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_EQ(result.output,
+              kBanner +
+                  linkerRefuses(sample("survey.rpk"),
+                                "it is a packaged Lisp application, a kind that Tessel does not load; "
+                                "Lisp files (.lsp, .qbc) can be loaded") +
+                  linkerRefuses(macros, "it is a macro project, a kind that Tessel does not load") +
+                  linkerRefuses("/nowhere/gone.rpk", "No such file or directory"));
+}
+
+TEST(FilesAsArguments, ThatAreLibrariesAreLoadedWhateverTheirName)
+{
+    const HostSession session;
+    const auto named = session.folder() / "primes.rpk";
+    std::filesystem::copy(sample("primes.zmb"), named);
+    const auto result = session.start({named.string()});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, EndsWith(named.string() + " is loaded.\n"));
+}
+
 TEST(FilesAsArguments, AreFoundFromTheCurrentFolder)
 {
     HostSession session;
