@@ -29,9 +29,14 @@ std::optional<std::wstring> orNothing(const wchar_t* text)
     return text ? std::optional<std::wstring>(text) : std::nullopt;
 }
 
+bool hasRoom(const std::wstring& text, std::size_t capacity)
+{
+    return text.size() < capacity;
+}
+
 Result<> copyInto(const std::wstring& text, wchar_t* buffer, std::size_t capacity)
 {
-    if (text.size() >= capacity)
+    if (!hasRoom(text, capacity))
         return Failure{translatedByCount(capacity - 1,
                                          L"This is too long: at most {} character can be taken.",
                                          L"This is too long: at most {} characters can be taken.")};
@@ -53,18 +58,27 @@ Result<std::wstring> fileAt(const std::wstring& typed, bool mustExist)
     if (path.empty())
         return Failure{translated(L"This is no name of a file.")};
     std::error_code failed;
+    if (mustExist && std::filesystem::is_directory(path, failed))
+        return Failure{translated(L"\"{}\" is a folder and no file.", typed)};
     if (mustExist && !std::filesystem::is_regular_file(path, failed))
-        return Failure{translated(L"There is no file {}.", typed)};
+        return Failure{translated(L"There is no file \"{}\".", typed)};
     const auto full = std::filesystem::absolute(path, failed);
     if (failed)
         return Failure{translated(L"The current folder is gone: name the whole path.")};
     return tessel::toWide(full.lexically_normal().native());
 }
+
+// A default that has no room is refused each time that it is taken: the person is not bothered with it.
+bool pathHasRoom(const std::wstring& byDefault, std::size_t capacity)
+{
+    const auto file = fileAt(tessel::pathIn(byDefault), false);
+    return !file || hasRoom(*file, capacity);
+}
 } // namespace
 
 int tsaskText(const wchar_t* question, const wchar_t* byDefault, wchar_t* answer, std::size_t capacity)
 {
-    if (!question || !answer || capacity == 0)
+    if (!question || !answer || capacity == 0 || (byDefault && !hasRoom(byDefault, capacity)))
         return TSASK_INVALID;
     return ask({question, {}, orNothing(byDefault)},
                [&](const std::wstring& text) { return copyInto(text, answer, capacity); });
@@ -107,7 +121,7 @@ int tsaskYesOrNo(const wchar_t* question, const bool* byDefault, bool* answer)
 int tsaskFile(const wchar_t* question, const wchar_t* byDefault, bool mustExist, wchar_t* path,
               std::size_t capacity)
 {
-    if (!question || !path || capacity == 0)
+    if (!question || !path || capacity == 0 || (byDefault && !pathHasRoom(byDefault, capacity)))
         return TSASK_INVALID;
     const auto which = mustExist ? Questions::File::kThere : Questions::File::kThereOrNew;
     return ask({question, {}, orNothing(byDefault), which},

@@ -19,7 +19,8 @@
 
 inline constexpr int TSASK_ANSWERED = 0;
 inline constexpr int TSASK_CANCELLED = 1; // what was to receive the answer is not touched
-inline constexpr int TSASK_INVALID = 2;   // no question, or nothing to receive the answer; nobody was asked
+// No question, nothing to receive the answer, or a default that has no room in there; nobody was asked.
+inline constexpr int TSASK_INVALID = 2;
 
 // A text, as it was typed. `byDefault` may be null: then an empty line is an empty text. `answer` has room
 // for `capacity` characters, the terminator included; longer answers do not fit.
@@ -34,6 +35,7 @@ TESSEL_API int tsaskYesOrNo(const wchar_t* question, const bool* byDefault, bool
 
 // A file: its full path, from the current folder where it was typed without one, from the person's own after
 // "~/"; quotes around it are left out. `mustExist`: the name of something else than an ordinary file that is
-// there does not fit. `byDefault` may be null; `path` and `capacity` are as for a text.
+// there does not fit. `byDefault` may be null; `path` and `capacity` are as for a text: the full path of the
+// default, too, is to have room.
 TESSEL_API int tsaskFile(const wchar_t* question, const wchar_t* byDefault, bool mustExist, wchar_t* path,
                          std::size_t capacity);

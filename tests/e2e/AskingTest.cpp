@@ -69,10 +69,30 @@ TEST_F(AskingAtTheTerminal, AsksAgainForWhatDoesNotFit)
     terminal.type("3\rmaybe\r");
     ASSERT_TRUE(terminal.shows("This is neither yes nor no: \"maybe\".\r\nKeep it?")) << terminal.screen();
     terminal.type("n\rnothing.txt\r");
-    ASSERT_TRUE(terminal.shows("There is no file nothing.txt.\r\nFile: ")) << terminal.screen();
+    ASSERT_TRUE(terminal.shows("There is no file \"nothing.txt\".\r\nFile: ")) << terminal.screen();
+    terminal.type(".\r");
+    ASSERT_TRUE(terminal.shows("\".\" is a folder and no file.\r\nFile: ")) << terminal.screen();
     terminal.type(kControlC);
     EXPECT_TRUE(terminal.shows("size 3, not kept, file , cancelled 1")) << terminal.screen();
     EXPECT_EQ(terminal.quit(), 0);
+}
+
+TEST_F(Asking, IsNotDoneWhereTheDefaultHasNoRoomForItsAnswer)
+{
+    HostTerminal terminal(session);
+    EXPECT_TRUE(terminal.awaitPrompt());
+    terminal.type(load + "\r");
+    EXPECT_TRUE(terminal.awaitPrompt());
+    terminal.type("ASKSINNOROOM\r");
+    EXPECT_TRUE(terminal.shows("text 2, file 2\r\n")) << terminal.screen();
+    EXPECT_TRUE(terminal.awaitPrompt());
+    EXPECT_EQ(terminal.quit(), 0);
+}
+
+TEST_F(Asking, TakesADefaultThatJustHasRoomForItsAnswer)
+{
+    const auto result = session.run({load, "ASKSINJUSTROOM"});
+    EXPECT_THAT(result.output, HasSubstr("text 0 abc, file 0 /ab\n"));
 }
 
 TEST_F(AskingAtTheTerminal, CancelsWithControlCHoweverOftenAndGoesOn)
