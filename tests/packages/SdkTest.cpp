@@ -93,6 +93,22 @@ TEST_F(Sdk, IsFoundByCMakeWhichBuildsModulesOfEveryKindThatLoad)
     }
 }
 
+TEST_F(Sdk, MakesTextsOfOneNameApartFromEachOther)
+{
+    const std::string code = firstCode(contentOf(root / "usr/share/doc/tessel-dev/host-guide.md"), "cpp");
+    session.folder().write("project/hello.cpp", code);
+    session.folder().write("project/CMakeLists.txt",
+                           "cmake_minimum_required(VERSION 3.25)\n"
+                           "project(p LANGUAGES CXX)\nfind_package(Tessel REQUIRED)\n"
+                           "tessel_add_bundle(one TEXTS one/Texts.rc hello.cpp)\n"
+                           "tessel_add_bundle(two TEXTS two/Texts.rc hello.cpp)\n");
+    for (const std::string name : {"one", "two"})
+        session.folder().write("project/" + name + "/Texts.rc",
+                               "LANGUAGE 9, 1\nSTRINGTABLE\nBEGIN\n 1 \"" + name + "\"\nEND\n");
+    did("cmake -S project -B built -G Ninja && cmake --build built");
+    EXPECT_EQ(did("find built -name Texts.res | wc -l"), "2\n") << "both are made at the same time";
+}
+
 TEST_F(Sdk, PutsModulesWhereTheyAreLookedForWhateverTheProjectIsSetTo)
 {
     session.folder().write(
