@@ -36,11 +36,6 @@ constexpr auto kCompilerAfterword =
              L"read or written; 2: wrong\n"
              L"arguments.");
 
-std::string inUtf8(Sentence<> sentence)
-{
-    return toUtf8(translated(sentence));
-}
-
 LispSurroundings terminal()
 {
     LispSurroundings surroundings;
@@ -100,15 +95,15 @@ Result<> compileGuarded(const fs::path& input, const fs::path& output)
 int runCompilerProgram(int count, const char* const* arguments)
 {
     usePersonsLanguage();
-    CLI::App app(inUtf8(Sentence(L"Compiles a Lisp file for Tessel to byte code.")), "tesselc");
-    app.footer(inUtf8(kCompilerAfterword));
+    CLI::App app(translatedInUtf8(Sentence(L"Compiles a Lisp file for Tessel to byte code.")), "tesselc");
+    app.footer(translatedInUtf8(kCompilerAfterword));
     app.set_version_flag("--version", versionLine("tesselc, the Lisp compiler of Tessel R21"),
-                         inUtf8(Sentence(L"Show the version and end")));
+                         translatedInUtf8(Sentence(L"Show the version and end")));
     std::string input;
     std::string output;
-    app.add_option("FILE", input, inUtf8(Sentence(L"The Lisp file (.lsp)")))->required();
+    app.add_option("FILE", input, translatedInUtf8(Sentence(L"The Lisp file (.lsp)")))->required();
     app.add_option("-o,--output", output,
-                   inUtf8(Sentence(L"The compiled file; otherwise FILE with the extension .qbc")));
+                   translatedInUtf8(Sentence(L"The compiled file; otherwise FILE with the extension .qbc")));
     translateHelp(app);
     try
     {

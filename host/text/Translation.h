@@ -98,6 +98,11 @@ std::wstring translated(Sentence<sizeof...(Things)> sentence, const Things&... t
     return translateAndFill(sentence.english, {asWords(things)...});
 }
 
+inline std::string translatedInUtf8(Sentence<> sentence)
+{
+    return toUtf8(translated(sentence));
+}
+
 // The count is what is put in first, into either sentence.
 template <class... Things>
 std::wstring translatedByCount(std::size_t count, Sentence<sizeof...(Things) + 1> one,

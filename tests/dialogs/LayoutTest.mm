@@ -6,7 +6,6 @@
 #import <tesselui/TsOCOpenFileDialog.h>
 #include <tesselui/tsuieach.h>
 
-#include "host/ui/MessageBoxAlert.h"
 #include "host/ui/QuestionPanel.h"
 
 #import "modrig/dialogs/ModrigStartupSuitController.h"
@@ -215,22 +214,7 @@ TEST_F(Layout, OfAMessageBoxHasRoomForEverything)
     const wchar_t* detail =
         L"/a/folder/module.bundle: a library that it needs, libhorizon.so.4, is not on this "
         L"computer, or none of the folders where libraries are looked for holds it.";
-    const ModalSteps steps({[=] { tsuiShowMessageBox(text, detail, 0, nullptr); },
-                            [this]
-                            {
-                                EXPECT_NE(mPanel, [NSApp modalWindow]);
-                                EXPECT_THAT(layoutFaults([[NSApp modalWindow] contentView]), IsEmpty());
-                                [NSApp stopModal];
-                            },
-                            // The box's run has to be over before its window's can end.
-                            [this]
-                            {
-                                if ([NSApp modalWindow] != mPanel)
-                                    return false;
-                                [NSApp stopModal];
-                                return true;
-                            }});
-    [NSApp runModalForWindow:mPanel];
+    lookAtMessageBox(text, detail, [](NSView* box) { EXPECT_THAT(layoutFaults(box), IsEmpty()); });
 }
 
 namespace

@@ -10,8 +10,6 @@
 #include <tesselui/tsuieach.h>
 #include <tesselui/tsuitexts.h>
 
-#include "host/ui/MessageBoxAlert.h"
-
 #import "modrig/dialogs/ModrigStartupSuitController.h"
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
@@ -140,20 +138,7 @@ TEST_F(Translation, CoversMessageBoxes)
     const LanguageOfKeys language;
     open();
     TextsOfAWindow texts;
-    const ModalSteps steps({[] { tsuiShowMessageBox(L"1", L"2", 0, nullptr); },
-                            [&]
-                            {
-                                texts = textsIn([[NSApp modalWindow] contentView]);
-                                [NSApp stopModal];
-                            },
-                            [this]
-                            {
-                                if ([NSApp modalWindow] != mPanel)
-                                    return false;
-                                [NSApp stopModal];
-                                return true;
-                            }});
-    [NSApp runModalForWindow:mPanel];
+    lookAtMessageBox(L"1", L"2", [&](NSView* box) { texts = textsIn(box); });
     EXPECT_THAT(texts, testing::ElementsAre(L"1", L"2", L"<OK>"));
 }
 

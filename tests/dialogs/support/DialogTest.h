@@ -94,6 +94,9 @@ protected:
     void load(std::initializer_list<std::string> names);
     // In the list of file types, at this place.
     void chooseFileType(NSUInteger place);
+
+    // Shows a message box over the dialog, which is over when what it consists of was looked at.
+    void lookAtMessageBox(const wchar_t* text, const wchar_t* detail, std::function<void(NSView* box)> look);
 };
 
 // The paths of the rows of a table.

@@ -10,6 +10,7 @@
 #include <iostream>
 
 #include "host/text/Unicode.h"
+#include "host/ui/MessageBoxAlert.h"
 #include "modrig/module/DialogBridge.h"
 #include "tests/dialogs/support/Events.h"
 
@@ -214,6 +215,27 @@ void OpenDialogTest::chooseFileType(NSUInteger place)
 {
     [fileTypes() setSelectionIndex:place];
     [mController onFileTypesChanged:fileTypes()];
+}
+
+void OpenDialogTest::lookAtMessageBox(const wchar_t* text, const wchar_t* detail,
+                                      std::function<void(NSView* box)> look)
+{
+    const ModalSteps steps({[=] { tsuiShowMessageBox(text, detail, 0, nullptr); },
+                            [=, this]
+                            {
+                                EXPECT_NE(mPanel, [NSApp modalWindow]);
+                                look([[NSApp modalWindow] contentView]);
+                                [NSApp stopModal];
+                            },
+                            // The box's run has to be over before its window's can end.
+                            [this]
+                            {
+                                if ([NSApp modalWindow] != mPanel)
+                                    return false;
+                                [NSApp stopModal];
+                                return true;
+                            }});
+    [NSApp runModalForWindow:mPanel];
 }
 
 @interface StepRunner : NSObject
