@@ -172,4 +172,15 @@ TEST_F(QuestionsContract, AsksNobodyWithoutAQuestionOrRoomForTheAnswer)
     EXPECT_EQ(tsaskFile(nullptr, nullptr, false, path, kPathSize), TSASK_INVALID);
     EXPECT_EQ(tsaskFile(L"File", nullptr, false, path, 0), TSASK_INVALID);
 }
+
+TEST_F(QuestionsContract, AsksNobodyWhereTheDefaultHasNoRoomForItsAnswer)
+{
+    EXPECT_EQ(askedText(L"fives", {L"four"}, 5), TSASK_INVALID);
+    EXPECT_STREQ(text, L"before");
+    EXPECT_EQ(askedText(L"four", {L""}, 5), TSASK_ANSWERED);
+    EXPECT_STREQ(text, L"four");
+    EXPECT_EQ(tsaskFile(L"File", L"/a/b", false, path, 4), TSASK_INVALID);
+    EXPECT_EQ(tsaskFile(L"File", L"b", false, path, 2), TSASK_INVALID) << "the full path counts";
+    EXPECT_STREQ(path, L"before");
+}
 } // namespace

@@ -19,6 +19,11 @@ std::wstring fullPathOf(const std::wstring& path)
     return path.starts_with(L'/') ? path : recordingHost().files.currentFolderNow() + L"/" + path;
 }
 
+bool pathHasRoom(const wchar_t* byDefault, std::size_t capacity)
+{
+    return !byDefault || fullPathOf(tessel::pathIn(byDefault)).size() < capacity;
+}
+
 bool isFile(const std::wstring& path)
 {
     const DWORD attributes = recordingHost().files.attributes(path);
@@ -47,7 +52,7 @@ std::optional<std::wstring> RecordingQuestions::nextAnswer(const std::optional<s
 
 int tsaskText(const wchar_t* question, const wchar_t* byDefault, wchar_t* answer, std::size_t capacity)
 {
-    if (!question || !answer || capacity == 0)
+    if (!question || !answer || capacity == 0 || defaultText(byDefault).value_or(L"").size() >= capacity)
         return TSASK_INVALID;
     return recordingHost().questions.ask(question, defaultText(byDefault),
                                          [&](const std::wstring& text)
@@ -85,7 +90,7 @@ int tsaskYesOrNo(const wchar_t* question, const bool* byDefault, bool* answer)
 int tsaskFile(const wchar_t* question, const wchar_t* byDefault, bool mustExist, wchar_t* path,
               std::size_t capacity)
 {
-    if (!question || !path || capacity == 0)
+    if (!question || !path || capacity == 0 || !pathHasRoom(byDefault, capacity))
         return TSASK_INVALID;
     return recordingHost().questions.ask(question, defaultText(byDefault),
                                          [&](const std::wstring& text)
