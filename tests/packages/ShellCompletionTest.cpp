@@ -24,8 +24,8 @@ protected:
                                                  "tessel " +
                                                      typed + "\t\nexit\n");
         const std::string shown =
-            runCommand("cd '" + folder.path().string() + "' && script -qec 'bash --norc -i' /dev/null <'" +
-                       lines.string() + "'")
+            runCommand("cd '" + folder.path().string() +
+                       "' && HISTFILE= script -qec 'bash --norc -i' /dev/null <'" + lines.string() + "'")
                 .output;
         const std::string before = "Given: <";
         const auto start = shown.rfind(before);
