@@ -275,6 +275,12 @@ void Host::addCommands()
     addListings(*mParts);
 }
 
+void Host::showWhatWasNotTaken()
+{
+    for (const std::wstring& sentence : mParts->notTaken)
+        static_cast<void>(mParts->messageBox->show(sentence.c_str(), MB_OK | MB_ICONEXCLAMATION, nullptr));
+}
+
 bool Host::run(const std::wstring& input)
 {
     const AutoreleasePool pool;

@@ -66,6 +66,9 @@ public:
     // the registry is stored, and the queued Lisp is evaluated; a store that fails makes the line fail.
     bool run(const std::wstring& input) override;
 
+    // Shows in windows which changes were not taken so far. For whoever has no command line to read it on.
+    void showWhatWasNotTaken();
+
     // Runs a file of lines as if typed. Scripts may run scripts, to a sensible depth. Fails without a
     // sentence when a line of it did: each has been told.
     Result<> runScript(const std::filesystem::path& script);

@@ -83,10 +83,12 @@ struct Parts
                              {
                                  return wish.isThere();
                              }};
+    std::vector<std::wstring> notTaken; // which changes do not count, and why
     Owned<LayeredRegistry> layered{*registry, readRegistryLayers(foundations.layoutFolders),
                                    [this](const std::wstring& sentence)
                                    {
                                        foundations.commandLine.warn(sentence);
+                                       notTaken.push_back(sentence);
                                    }};
     Profiles profiles{*layered, kProductRegistryRoot};
     RegistryNews registryNews{*layered, kProductRegistryRoot};

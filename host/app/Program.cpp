@@ -99,8 +99,11 @@ bool loadFiles(Host& host, const std::vector<std::string>& files)
 // Without a display the command says so, which is no failure of a command, but all that was asked for here.
 int showDialog(Host& host)
 {
-    return host.run(kDialogCommand) && canShowWindows(runningProductFolders().binaries) ? kAllWell
-                                                                                        : kSomethingFailed;
+    const auto windows = runningProductFolders().binaries;
+    expectSomebodyAtTheDisplay(windows);
+    const bool ran = host.run(kDialogCommand);
+    host.showWhatWasNotTaken();
+    return ran && canShowWindows(windows) ? kAllWell : kSomethingFailed;
 }
 
 int runBatch(Host& host, const Options& options)

@@ -12,9 +12,11 @@ namespace
 {
 constexpr char kShowBox[] = "tsuiShowMessageBox";
 constexpr char kCanShowWindows[] = "tsuiCanShowWindows";
+constexpr char kExpectSomebody[] = "tsuiExpectSomebody";
 
 using ShowBox = int (*)(const wchar_t* text, const wchar_t* detail, unsigned style, void* parent);
 using CanShowWindows = bool (*)();
+using ExpectSomebody = void (*)();
 } // namespace
 
 bool canShowWindows(const std::filesystem::path& libraryFolder)
@@ -22,6 +24,13 @@ bool canShowWindows(const std::filesystem::path& libraryFolder)
     const auto ask =
         hasDisplay() ? findWindowsFunction<CanShowWindows>(libraryFolder, kCanShowWindows) : nullptr;
     return ask && ask();
+}
+
+void expectSomebodyAtTheDisplay(const std::filesystem::path& libraryFolder)
+{
+    if (const auto expect =
+            hasDisplay() ? findWindowsFunction<ExpectSomebody>(libraryFolder, kExpectSomebody) : nullptr)
+        expect();
 }
 
 MessageBox::Presenter windowBoxes(const std::filesystem::path& libraryFolder)

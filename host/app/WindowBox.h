@@ -12,6 +12,10 @@ class Admission;
 // Whether there is a display, and it answers. Asked of that library too.
 bool canShowWindows(const std::filesystem::path& libraryFolder);
 
+// Boxes are windows from now on, also without a terminal that would tell of somebody. `libraryFolder`: as
+// above.
+void expectSomebodyAtTheDisplay(const std::filesystem::path& libraryFolder);
+
 // Loads the library that stands in that folder when the first box is to be shown and there is a display: a
 // session that shows none does not carry the toolkit.
 MessageBox::Presenter windowBoxes(const std::filesystem::path& libraryFolder);

@@ -9,5 +9,8 @@
 extern "C" TESSEL_API int tsuiShowMessageBox(const wchar_t* text, const wchar_t* detail, unsigned style,
                                              void* parent);
 
+// Somebody looks at the display, though there is no terminal to tell so: from now on boxes are shown there.
+extern "C" TESSEL_API void tsuiExpectSomebody();
+
 // `tsuiHasDisplay`, by a name that the host's library finds without linking to this one.
 extern "C" TESSEL_API bool tsuiCanShowWindows();

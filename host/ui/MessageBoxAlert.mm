@@ -16,10 +16,11 @@
 namespace
 {
 constexpr int kNotShown = 0;
+bool gExpectsSomebody = false;
 
 bool somebodyIsThere()
 {
-    return [NSApp modalWindow] != nil || isatty(STDIN_FILENO);
+    return gExpectsSomebody || [NSApp modalWindow] != nil || isatty(STDIN_FILENO);
 }
 
 NSString* readable(const wchar_t* text)
@@ -44,6 +45,11 @@ int tsuiShowMessageBox(const wchar_t* text, const wchar_t* detail, unsigned styl
     }
     [pool drain];
     return answer;
+}
+
+void tsuiExpectSomebody()
+{
+    gExpectsSomebody = true;
 }
 
 bool tsuiCanShowWindows()

@@ -6,6 +6,16 @@ using testing::Optional;
 class DialogAlone : public DialogTest
 {
 protected:
+    // As the Startup Suite of everybody; `place`: below the folder of what is laid out.
+    void layOutSuite(const std::string& place, const std::string& file)
+    {
+        mSession.folder().write("layout/" + place,
+                                "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
+                                    std::string(kDialogsKey) +
+                                    "\\Startup]\n\"NumStartup\"=\"1\"\n\"1Startup\"=\"" + file + "\"\n");
+        mSession.alwaysWith({"--layout-dir", (mSession.folder() / "layout").string()});
+    }
+
     void openAlone(const std::vector<std::string>& arguments)
     {
         mHost = std::make_unique<Program>(mSession.commandLine(arguments), mSession.environment(),
@@ -26,22 +36,34 @@ TEST_F(DialogAlone, OpensByItselfSaysNothingAndEndsTessel)
 // Who looks at the list has not made it theirs.
 TEST_F(DialogAlone, LeavesASuiteThatIsLaidOutForEverybodyToTheAdministrator)
 {
-    const auto layOut = [this](const std::string& file)
-    {
-        mSession.folder().write("layout/suite.reg",
-                                "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
-                                    std::string(kDialogsKey) +
-                                    "\\Startup]\n\"NumStartup\"=\"1\"\n\"1Startup\"=\"" + file + "\"\n");
-    };
-    mSession.alwaysWith({"--layout-dir", (mSession.folder() / "layout").string()});
-    layOut(writeLisp("first.lsp"));
+    layOutSuite("suite.reg", writeLisp("first.lsp"));
     openAlone({"--modrig"});
     press("Escape");
     EXPECT_THAT(mHost->waitForEnd(), Optional(0));
-    layOut(writeLisp("second.lsp"));
+    layOutSuite("suite.reg", writeLisp("second.lsp"));
     const auto next = mSession.run({"APPS"});
     EXPECT_THAT(next.output, testing::HasSubstr("second.lsp runs"));
     EXPECT_THAT(next.output, testing::Not(testing::HasSubstr("first.lsp")));
+}
+
+// Nobody reads a command line there.
+TEST_F(DialogAlone, SaysInAWindowThatWhatIsPolicyStays)
+{
+    layOutSuite("policy/suite.reg", writeLisp("first.lsp"));
+    openAlone({"--modrig"});
+    click(places::kContents);
+    ASSERT_FALSE(mScreen.waitForActive(kSuiteDialog).empty());
+    press("Down");
+    press("Delete");
+    press("Escape");
+    ASSERT_TRUE(mScreen.waitUntilGone(kSuiteDialog));
+    ASSERT_TRUE(mScreen.waitUntilActive(mDialog));
+    press("Escape");
+    ASSERT_FALSE(mScreen.waitForActive(kMessageBox).empty()) << mHost->output();
+    shoot("told");
+    press("Return");
+    EXPECT_THAT(mHost->waitForEnd(), Optional(0));
+    EXPECT_THAT(mHost->output(), testing::HasSubstr("are laid down by the administrator"));
 }
 
 TEST_F(DialogAlone, OpensAfterTheFilesThatWereNamedAreLoaded)
