@@ -80,7 +80,7 @@ std::wstring fullPath(const Parts& parts, const std::wstring& typed)
     if (const auto found = parts.files->find(meant))
     {
         if (*found != meant)
-            parts.commandLine->explain(translated(L"{} is the file {}.", typed, *found));
+            parts.commandLine->explain([&] { return translated(L"{} is the file {}.", typed, *found); });
         return toText(*found);
     }
     std::error_code currentFolderIsGone;

@@ -99,27 +99,30 @@ bool Host::start()
     }
     finishLine();
     tellOfStart();
-    mCommandLine.explain(translated(L"The start took {}.", durationSince(begun)));
+    mCommandLine.explain([&] { return translated(L"The start took {}.", durationSince(begun)); });
     return true;
 }
 
 void Host::explainPlaces()
 {
-    if (!mCommandLine.isTalkative())
-        return;
-    mCommandLine.explain(translated(L"The profile is kept in {}.", mOptions.profileFolder));
+    mCommandLine.explain([this]
+                         { return translated(L"The profile is kept in {}.", mOptions.profileFolder); });
     for (const auto& folder : mOptions.layoutFolders)
-        mCommandLine.explain(translated(L"Values for everybody are looked for in {}.", folder));
-    mCommandLine.explain(translated(L"Applications are looked for in {}.", mParts->folders.plugIns));
+        mCommandLine.explain([&]
+                             { return translated(L"Values for everybody are looked for in {}.", folder); });
+    mCommandLine.explain(
+        [this] { return translated(L"Applications are looked for in {}.", mParts->folders.plugIns); });
 }
 
 void Host::explainLoad(const LoadOutcome& outcome)
 {
-    const std::wstring time = durationInWords(outcome.took);
-    if (outcome.loaded)
-        mCommandLine.explain(translated(L"{} was loaded in {}.", outcome.path, time));
-    else
-        mCommandLine.explain(translated(L"{} was not loaded, which took {}.", outcome.path, time));
+    mCommandLine.explain(
+        [&]
+        {
+            const std::wstring time = durationInWords(outcome.took);
+            return outcome.loaded ? translated(L"{} was loaded in {}.", outcome.path, time)
+                                  : translated(L"{} was not loaded, which took {}.", outcome.path, time);
+        });
 }
 
 void Host::judgeEarlierSessions()
@@ -289,7 +292,7 @@ bool Host::run(const std::wstring& input)
         std::exchange(mTypedLine, std::nullopt).value_or(Interruption::Wish(mInterruption));
     const auto begun = LoadOutcomes::Clock::now();
     const bool done = isLisp(input) ? runLisp(input, wish) : mParts->commandRunner.run(input);
-    mCommandLine.explain(translated(L"That took {}.", durationSince(begun)));
+    mCommandLine.explain([&] { return translated(L"That took {}.", durationSince(begun)); });
     return done;
 }
 

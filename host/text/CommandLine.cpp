@@ -82,10 +82,10 @@ void CommandLine::confirm(std::wstring_view sentence)
         say(sentence);
 }
 
-void CommandLine::explain(std::wstring_view sentence)
+void CommandLine::explain(const std::function<std::wstring()>& sentence)
 {
-    if (isTalkative())
-        sayAside(sentence, Aside::kPlain);
+    if (mSurroundings.loudness == Loudness::kTalkative)
+        sayAside(sentence(), Aside::kPlain);
 }
 
 void CommandLine::show(const Table& table)

@@ -69,9 +69,8 @@ public:
     // Says what nobody has asked for, but should know: about the profile, about what is not loaded.
     void warn(std::wstring_view sentence);
 
-    // Says what is being done, where a person wants to know.
-    void explain(std::wstring_view sentence);
-    bool isTalkative() const { return mSurroundings.loudness == Loudness::kTalkative; }
+    // Says what is being done, where a person wants to know: only there are the words looked for.
+    void explain(const std::function<std::wstring()>& sentence);
     bool isQuiet() const { return mSurroundings.loudness == Loudness::kQuiet; }
 
     // Says a table that was asked for, as wide as the screen; without a screen a row is a line. What does not
