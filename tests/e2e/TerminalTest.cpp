@@ -2,6 +2,7 @@
 #include <gtest/gtest.h>
 
 #include <csignal>
+#include <optional>
 
 #include "tests/e2e/HostTerminal.h"
 
@@ -127,30 +128,41 @@ TEST(Terminal, ShowsThePromptAndWhatWasTypedAfterItWasStopped)
     EXPECT_EQ(terminal.quit(), 0);
 }
 
-// Nobody can refuse to be stopped so, and whoever was in between may have set the terminal otherwise.
-TEST(Terminal, ShowsThePromptAndWhatWasTypedAfterItWasStoppedFromOutside)
+namespace
 {
-    HostSession session;
-    session.alwaysWith({"--safe"});
-    HostTerminal terminal(session);
-    ASSERT_TRUE(terminal.awaitPrompt());
-    terminal.type("(* 6 7");
-    ASSERT_TRUE(terminal.shows("(* 6 7")) << terminal.screen();
-    kill(terminal.process(), SIGSTOP);
-    kill(terminal.process(), SIGCONT);
-    EXPECT_TRUE(terminal.showsWithin("Command: (* 6 7", std::chrono::seconds(10))) << terminal.screen();
-    terminal.type(")\r");
-    EXPECT_TRUE(terminal.showsWithin("\n42\r\n", std::chrono::seconds(10))) << terminal.screen();
+// An expression is begun at the prompt.
+class TerminalAtWhichOneTypes : public testing::Test
+{
+protected:
+    TerminalAtWhichOneTypes()
+    {
+        mSession.alwaysWith({"--safe"});
+        mTerminal.emplace(mSession);
+    }
+    void SetUp() override
+    {
+        ASSERT_TRUE(mTerminal->awaitPrompt());
+        mTerminal->type("(* 6 7");
+        ASSERT_TRUE(mTerminal->shows("(* 6 7")) << mTerminal->screen();
+    }
+
+    HostSession mSession;
+    std::optional<HostTerminal> mTerminal;
+};
+} // namespace
+
+// Nobody can refuse to be stopped so, and whoever was in between may have set the terminal otherwise.
+TEST_F(TerminalAtWhichOneTypes, ShowsThePromptAndWhatWasTypedAfterItWasStoppedFromOutside)
+{
+    kill(mTerminal->process(), SIGSTOP);
+    kill(mTerminal->process(), SIGCONT);
+    EXPECT_TRUE(mTerminal->showsWithin("Command: (* 6 7", std::chrono::seconds(10))) << mTerminal->screen();
+    mTerminal->type(")\r");
+    EXPECT_TRUE(mTerminal->showsWithin("\n42\r\n", std::chrono::seconds(10))) << mTerminal->screen();
 }
 
-TEST(Terminal, DrawsWhatIsTypedAgainWhenTheWindowChanges)
+TEST_F(TerminalAtWhichOneTypes, DrawsItAgainWhenTheWindowChanges)
 {
-    HostSession session;
-    session.alwaysWith({"--safe"});
-    HostTerminal terminal(session);
-    ASSERT_TRUE(terminal.awaitPrompt());
-    terminal.type("(* 6 7");
-    ASSERT_TRUE(terminal.shows("(* 6 7")) << terminal.screen();
-    terminal.resize({40, 10});
-    EXPECT_TRUE(terminal.showsWithin("\rCommand: (* 6 7", std::chrono::seconds(10))) << terminal.screen();
+    mTerminal->resize({40, 10});
+    EXPECT_TRUE(mTerminal->showsWithin("\rCommand: (* 6 7", std::chrono::seconds(10))) << mTerminal->screen();
 }
