@@ -45,38 +45,46 @@ std::wstring endingOf(const KeptOutApplication& application)
 {
     return wordsForEnding(application.ending);
 }
+
+// One place of a sentence, for either reason.
+struct Wording
+{
+    Sentence<1> byPerson; // since when
+    Sentence<4> afterEnd; // when it ended Tessel, at what, who wanted it, how
+};
+
+std::wstring said(const KeptOutApplication& application, const Wording& wording)
+{
+    if (isByPerson(application))
+        return translated(wording.byPerson, dayOf(application));
+    return translated(wording.afterEnd, dayOf(application), deedOf(application), wishOf(application),
+                      endingOf(application));
+}
 } // namespace
 
 std::wstring reasonOf(const KeptOutApplication& application)
 {
-    if (isByPerson(application))
-        return translated(L"kept out at starts by DISABLE since {}", dayOf(application));
-    return translated(L"kept out because it ended Tessel on {} {} ({}): {}", dayOf(application),
-                      deedOf(application), wishOf(application), endingOf(application));
+    return said(application, {Sentence<1>(L"kept out at starts by DISABLE since {}"),
+                              Sentence<4>(L"kept out because it ended Tessel on {} {} ({}): {}")});
 }
 
 std::wstring clauseOfReason(const KeptOutApplication& application)
 {
-    if (isByPerson(application))
-        return translated(L"it is kept out at starts by DISABLE since {}", dayOf(application));
-    return translated(L"it is kept out because it ended Tessel on {} {} ({}): {}", dayOf(application),
-                      deedOf(application), wishOf(application), endingOf(application));
+    return said(application, {Sentence<1>(L"it is kept out at starts by DISABLE since {}"),
+                              Sentence<4>(L"it is kept out because it ended Tessel on {} {} ({}): {}")});
 }
 
 std::wstring predicateOfReason(const KeptOutApplication& application)
 {
-    if (isByPerson(application))
-        return translated(L"is kept out at starts by DISABLE since {}", dayOf(application));
-    return translated(L"is kept out because it ended Tessel on {} {} ({}): {}", dayOf(application),
-                      deedOf(application), wishOf(application), endingOf(application));
+    return said(application, {Sentence<1>(L"is kept out at starts by DISABLE since {}"),
+                              Sentence<4>(L"is kept out because it ended Tessel on {} {} ({}): {}")});
 }
 
 std::wstring sentenceOfReason(const KeptOutApplication& application)
 {
-    if (isByPerson(application))
-        return translated(L"This application is kept out at starts by DISABLE since {}.", dayOf(application));
-    return translated(L"This application is kept out because it ended Tessel on {} {} ({}): {}.",
-                      dayOf(application), deedOf(application), wishOf(application), endingOf(application));
+    return said(application,
+                {Sentence<1>(L"This application is kept out at starts by DISABLE since {}."),
+                 Sentence<4>(L"This application is kept out because it ended Tessel on {} {} ({}): {}.")});
 }
 
 std::wstring whatItDid(const KeptOutApplication& application, std::size_t sessions)
