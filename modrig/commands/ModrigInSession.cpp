@@ -6,13 +6,13 @@
 #include <tessel/tssession.h>
 
 #include "modrig/commands/CommandTexts.h"
+#include "modrig/profile/ModrigRecord.h"
 
 namespace ModrigUtils
 {
 namespace
 {
 constexpr const wchar_t* kModule = L"Modrig.bundle";
-constexpr const wchar_t* kRecordOfModrig = L"TesselModrig";
 constexpr std::size_t kLongestNameOfModule = 1024;
 constexpr bool kQuietly = false;
 constexpr bool kTellWhyNot = true;
@@ -28,7 +28,7 @@ CStdStr PathOfModrig()
 bool IsLoadedByItsCommand()
 {
     TesselAppInfo record;
-    record.setAppName(kRecordOfModrig);
+    record.setAppName(kRecordName);
     return record.readFromRegistry() == TSRX_APPINFO_OK && (record.loadReason() & TSRX_LOAD_ON_COMMAND) != 0;
 }
 
@@ -66,14 +66,10 @@ CStdStr WhyNobodyCanChange(const KeptList& list)
 void UpdateRecordOfModrig(bool hasStartup)
 {
     TesselAppInfo record;
-    record.setAppName(kRecordOfModrig);
+    record.setAppName(kRecordName);
     if (record.readFromRegistry() != TSRX_APPINFO_OK)
         return;
-    const unsigned reasons = record.loadReason();
-    const unsigned wanted =
-        hasStartup ? reasons | TSRX_LOAD_AT_HOST_START : reasons & ~TSRX_LOAD_AT_HOST_START;
-    record.setLoadReason(wanted);
-    if (wanted != reasons)
+    if (SetLoadedAtStart(record, hasStartup))
         record.writeToRegistry(false, false); // the commands in it are Modrig's
 }
 } // namespace ModrigUtils

@@ -11,11 +11,11 @@
 #include "modrig/messages/MessageIds.h"
 #include "modrig/messages/ResourceOverride.h"
 #include "modrig/module/DialogBridge.h"
+#include "modrig/profile/ModrigRecord.h"
 
 namespace
 {
 constexpr const wchar_t* kResourceModule = L"ModrigRes.dll";
-constexpr const wchar_t* kRecordName = L"TesselModrig";
 constexpr long kNoLanguage = 0;
 constexpr int kPlainCommand = 0;
 constexpr int kNoFunctionCode = -1;
@@ -66,21 +66,8 @@ void WriteRecord(TesselAppInfo& record)
 void CreateRecord(TesselAppInfo& record)
 {
     record.setModuleName(tsedGetAppName());
-    record.setDescription((CStdStr(kRecordName) + CStdStr(kpszCmdModule)).c_str());
+    record.setDescription((CStdStr(ModrigUtils::kRecordName) + CStdStr(kpszCmdModule)).c_str());
     record.setLoadReason(TSRX_LOAD_AT_HOST_START | TSRX_LOAD_ON_COMMAND);
-    WriteRecord(record);
-}
-
-// Only the one bit is the module's to manage: name, description and the other reasons may have been changed
-// by the host or by its user.
-void UpdateRecord(TesselAppInfo& record, bool loadAtStart)
-{
-    const unsigned reasons = record.loadReason();
-    const unsigned wanted =
-        loadAtStart ? reasons | TSRX_LOAD_AT_HOST_START : reasons & ~TSRX_LOAD_AT_HOST_START;
-    if (wanted == reasons)
-        return;
-    record.setLoadReason(wanted);
     WriteRecord(record);
 }
 } // namespace
@@ -125,9 +112,12 @@ void updateRegistry()
     TesselAppInfo record;
     record.setAppName(kRecordName);
     const bool hasStartup = !gStartupList.IsEmpty();
-    if (record.readFromRegistry() == TSRX_APPINFO_OK)
-        UpdateRecord(record, hasStartup);
-    else if (hasStartup)
-        CreateRecord(record);
+    if (record.readFromRegistry() != TSRX_APPINFO_OK)
+    {
+        if (hasStartup)
+            CreateRecord(record);
+    }
+    else if (SetLoadedAtStart(record, hasStartup))
+        WriteRecord(record);
 }
 } // namespace ModrigUtils
