@@ -12,7 +12,9 @@ inline constexpr unsigned kHistorySummary = 132;
 
 inline constexpr unsigned kStartupSuiteName = 133; // as it stands within a sentence
 inline constexpr unsigned kHistoryName = 134;
-inline constexpr unsigned kListIsEmpty = 135; // name of the list
+inline constexpr unsigned kListIsEmpty = 135;   // name of the list
+inline constexpr unsigned kEntryNotThere = 136; // after an entry, as the next one
+inline constexpr unsigned kEntryLaidDown = 137;
 
 inline constexpr unsigned kFileNotThere = 144;      // full path
 inline constexpr unsigned kPathTooLong = 145;       // full path

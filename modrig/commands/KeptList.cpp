@@ -2,9 +2,7 @@
 
 #include <wincompat/winfile.h>
 
-#include <charconv>
-#include <cwctype>
-#include <filesystem>
+#include <algorithm>
 #include <string>
 
 #include "modrig/base/SplitPath.h"
@@ -45,12 +43,10 @@ CStdStr WholePath(const CStdStr& typed)
 {
     if (typed.Text().starts_with(L'/'))
         return typed;
-    wchar_t folder[kPlaceSize] = {};
-    GetCurrentDirectory(kPlaceSize, folder); // a folder that does not fit leaves the text empty
     std::wstring rest = typed.Text();
     while (rest.starts_with(L"./"))
         rest.erase(0, 2);
-    return CStdStr(std::wstring(folder)) + CStdStr(L"/") + CStdStr(rest);
+    return CurrentFolder() + CStdStr(L"/") + CStdStr(rest);
 }
 
 // Why a file cannot join a list; otherwise the path becomes the one that it is found at.
@@ -86,18 +82,6 @@ CStdStr NotInList(const KeptList& list, const CStdStr& typed)
 {
     return CStdStr::Formatted(ModrigMessages::kNotInList, WholePath(typed).c_str(),
                               CStdStr::OfId(list.nameText).c_str());
-}
-
-CStdStr KeyOf(const KeptList& list)
-{
-    return GetModrigProfileRegKey() + CStdStr(L"\\") + CStdStr(list.names.subKey);
-}
-
-CStdStr NameOfEntry(const KeptList& list, std::size_t place)
-{
-    CStdStr name;
-    name.Fmt(list.names.entryFormat, place);
-    return name;
 }
 
 // The place of what counts instead of the data; empty when the data would count.
@@ -213,16 +197,17 @@ Change MoveFile(const CStdStr& typed, const CStdStr& place)
 
 CStdStr LaidDownInstead(const KeptList& list)
 {
-    const CStdStr key = KeyOf(list);
+    const CStdStr key = SubKeyOf(list.names);
     CStdStr place = LaidDownInstead(key, CStdStr(list.names.count), Decimal(list.files.GetCount()));
-    std::size_t number = 0;
+    long number = 0;
     for (auto entry = list.files.begin(); place.IsEmpty() && entry != list.files.end(); ++entry)
-        place = LaidDownInstead(key, NameOfEntry(list, ++number), *entry);
+        place = LaidDownInstead(key, EntryName(list.names, ++number), *entry);
     return place;
 }
 
 bool IsEntryLaidDown(const KeptList& list, std::size_t place)
 {
-    return !LaidDownInstead(KeyOf(list), NameOfEntry(list, place), CStdStr()).IsEmpty();
+    return !LaidDownInstead(SubKeyOf(list.names), EntryName(list.names, static_cast<long>(place)), CStdStr())
+                .IsEmpty();
 }
 } // namespace ModrigUtils

@@ -49,8 +49,12 @@ void PrintAsText(const KeptList& list)
     for (const CStdStr& path : list.files)
     {
         ++place;
-        Print(std::to_wstring(place) + L"  " + path.Text() + (IsThere(path) ? L"" : L"  (not there)") +
-              (IsEntryLaidDown(list, place) ? L"  (laid down by the administrator)" : L""));
+        CStdStr line = CStdStr(std::to_wstring(place)) + CStdStr(L"  ") + path;
+        if (!IsThere(path))
+            line = line + CStdStr::OfId(ModrigMessages::kEntryNotThere);
+        if (IsEntryLaidDown(list, place))
+            line = line + CStdStr::OfId(ModrigMessages::kEntryLaidDown);
+        Print(line.Text());
     }
     if (list.files.IsEmpty())
         Print(CStdStr::Formatted(ModrigMessages::kListIsEmpty, CStdStr::OfId(list.nameText).c_str()).Text());

@@ -9,8 +9,6 @@
 
 namespace ModrigUtils
 {
-namespace
-{
 CStdStr SubKeyOf(const StoredListNames& names)
 {
     return GetModrigProfileRegKey() + CStdStr(L"\\") + CStdStr(names.subKey);
@@ -23,6 +21,8 @@ CStdStr EntryName(const StoredListNames& names, long index)
     return name;
 }
 
+namespace
+{
 // Reads the numbered values one after the other, in as many passes as the list's count says. The number moves
 // on only after a value that was read: a pass that fails is spent, and the next asks for the same value. So a
 // list ends at its first gap, numbers after the gap, left over from a longer list, never come back, and a

@@ -19,6 +19,10 @@ struct StoredListNames
 inline constexpr StoredListNames kStoredHistory = {L"History", L"NumHistory", L"%dHistory"};
 inline constexpr StoredListNames kStoredStartupSuite = {L"Startup", L"NumStartup", L"%dStartup"};
 
+// The key of a list in the profile that is the current one, and the value of an entry, from 1.
+[[nodiscard]] CStdStr SubKeyOf(const StoredListNames& names);
+[[nodiscard]] CStdStr EntryName(const StoredListNames& names, long index);
+
 // Replaces the list with what is stored. Duplicates are skipped. The list ends at the first gap in the
 // numbering. The count is of attempts: each that fails, where a later one succeeds, costs an entry at the
 // end. `appended` is called after every entry that has joined the list.

@@ -7,7 +7,7 @@ namespace ModrigUtils
 {
 inline constexpr const wchar_t* kRecordName = L"TesselModrig";
 
-// Only this one reason is Modrig's to manage: name, description and the other reasons may have been changed by
-// the host or by its user. Answers whether the record, which is not written here, is another one now.
+// Only this one reason is Modrig's to manage: name, description and the other reasons may have been changed
+// by the host or by its user. Answers whether the record, which is not written here, is another one now.
 [[nodiscard]] bool SetLoadedAtStart(TesselAppInfo& record, bool loadedAtStart);
 } // namespace ModrigUtils
