@@ -8,6 +8,7 @@
 #include <zlib.h>
 
 #include "host/platform/OrdinaryFile.h"
+#include "host/platform/SystemFailure.h"
 #include "host/registry/KeyPath.h"
 #include "host/text/Translation.h"
 #include "host/text/Unicode.h"
@@ -36,7 +37,7 @@ Result<std::vector<fs::path>> registryFilesIn(const fs::path& folder)
         if (equalIgnoringCase(toWide(entry->path().extension().native()), L".reg"))
             files.push_back(entry->path());
     if (failed && failed != std::errc::no_such_file_or_directory)
-        return Failure{toWide(failed.message())};
+        return systemFailure(failed.value());
     std::ranges::sort(files);
     return files;
 }

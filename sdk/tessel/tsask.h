@@ -2,9 +2,8 @@
 // asks) the question comes in a window over it, with the application's name as its title. Otherwise, at a
 // terminal, it stands on the command line and waits; in a script or a pipe the next line is the answer, and
 // it is shown like a line that was typed. Where there is none of these (while the host starts, in a command
-// of
-// `-c`, among the files that come with `--modrig`) the default is taken at once, and a question without one
-// counts as cancelled.
+// of `-c`, among the files that come with `--modrig`) the default is taken at once, and a question without
+// one counts as cancelled.
 //
 // Ctrl-C, the end of the input, the end of the session and closing its window cancel a question. An empty
 // line takes the default; in a window that stands in the field, to be changed or taken. An answer that does
