@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cstddef>
 #include <numeric>
+#include <utility>
 
 #include "host/text/Unicode.h"
 
@@ -63,14 +64,19 @@ std::optional<std::wstring> nearest(std::wstring_view typed, const std::vector<s
     if (typed.size() < 2 || typed.size() > kLongestTyped)
         return std::nullopt;
     const std::wstring folded = foldCase(typed);
-    std::size_t best = typed.size() < kLongName ? 2 : 3;
+    // Of those that are as near the one that begins so: QUIT is not what SUIT was to be.
+    std::pair best{std::size_t{typed.size() < kLongName ? 2u : 3u}, false};
     std::optional<std::wstring> result;
     for (const std::wstring& name : names)
-        if (const std::size_t count = slips(folded, foldCase(name)); count < best && name.size() > count)
+    {
+        const std::wstring candidate = foldCase(name);
+        const std::pair distance{slips(folded, candidate), !candidate.starts_with(folded)};
+        if (distance < best && name.size() > distance.first)
         {
-            best = count;
+            best = distance;
             result = name;
         }
+    }
     if (!result && typed.size() >= kShortestBeginning)
         result = onlyOneThatBegins(folded, names);
     return result;

@@ -33,6 +33,8 @@ TEST(Nearest, TakesTheNearestOfSeveral)
 {
     EXPECT_THAT(nearest(L"UNLOAT", kTypable), Optional(Eq(L"UNLOAD")));
     EXPECT_THAT(nearest(L"LOADD", kTypable), Optional(Eq(L"LOAD")));
+    EXPECT_THAT(nearest(L"suit", {L"QUIT", L"SUITE"}), Optional(Eq(L"SUITE"))) << "begins so";
+    EXPECT_THAT(nearest(L"suit", {L"SUITE", L"QUIT"}), Optional(Eq(L"SUITE")));
 }
 
 TEST(Nearest, TakesTheBeginningOfASingleName)
