@@ -25,7 +25,7 @@
 - (id)initWithFilePathName:(NSString*)path;
 
 // The same for a path that has no symbolic links in it, which is then not looked at on the disk.
-- (id)initWithResolvedPath:(NSString*)path;
+- (id)initWithResolvedPath:(const CStdStr&)path;
 
 // `filePathName` as the module's logic takes it.
 - (CStdStr)path;

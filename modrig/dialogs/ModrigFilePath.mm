@@ -15,8 +15,10 @@
 
 - (id)initWithFilePathName:(NSString*)path
 {
-    if (!(self = [self initWithResolvedPath:path]) || !path)
-        return self;
+    if (!path)
+        return [super init];
+    if (!(self = [self initWithResolvedPath:ModrigUtils::PathFromString(path)]))
+        return nil;
     mFileName = [[path lastPathComponent] copy];
     mFilePath = [[path stringByDeletingLastPathComponent] copy];
     [mFilePathName release];
@@ -24,12 +26,12 @@
     return self;
 }
 
-- (id)initWithResolvedPath:(NSString*)path
+- (id)initWithResolvedPath:(const CStdStr&)path
 {
-    if (!(self = [super init]) || !path)
-        return self;
-    mFilePathName = [path copy];
-    mUnloadable = ModrigUtils::IsAppUnloadAble(CStdStr(NSStringToWstring(path)));
+    if (!(self = [super init]))
+        return nil;
+    mFilePathName = [ModrigUtils::StringFromPath(path) retain];
+    mUnloadable = ModrigUtils::IsAppUnloadAble(path);
     return self;
 }
 

@@ -1,0 +1,179 @@
+#include "tests/dialogs/support/DialogTest.h"
+
+#include <filesystem>
+
+#import "modrig/dialogs/ModrigArrayController.h"
+
+#include "modrig/dialogs/TableRows.h"
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+namespace
+{
+// Paths of every kind in one folder, and what the toolkit makes of each.
+class ResolvedLinks : public DialogTest
+{
+protected:
+    void SetUp() override
+    {
+        DialogTest::SetUp();
+        for (const char* name : {"tool.lsp", "real/tool.lsp", "real/d\u00E9j\u00E0/tool.lsp", "r\xE9" "al/tool.lsp",
+                                 "real/s\u00E9parateur.lsp", "real/odd\xFF.lsp"})
+            file(name);
+        std::filesystem::create_directory(mFolder / "links");
+        link("links/folder", "real");
+        link("links/accents", "real/d\u00E9j\u00E0");
+        link("links/bytes", "r\xE9" "al");
+        link("links/file.lsp", "tool.lsp");
+        link("real/link.lsp", "tool.lsp");
+        link("links/nothing.lsp", "gone.lsp");
+        link("links/gone", "gone");
+        link("links/round", "links/round");
+    }
+
+    void link(const std::string& name, const std::string& target)
+    {
+        std::filesystem::create_symlink(mFolder / target, mFolder / name);
+    }
+
+    std::wstring in(const std::wstring& rest) { return mFolder.path().wstring() + rest; }
+
+    // In one resolver, which remembers; each twice, and all of them in both orders.
+    void expectTheToolkitsAnswers(const std::vector<std::wstring>& paths)
+    {
+        std::vector<std::wstring> all(paths);
+        all.insert(all.end(), paths.rbegin(), paths.rend());
+        const ModrigPlatform::LinkResolver resolve = ModrigPlatform::MakeLinkResolver();
+        for (const std::wstring& path : all)
+            EXPECT_EQ(wide([text(path) stringByResolvingSymlinksInPath]), resolve(CStdStr(path)).Text())
+                << wide([text(path) stringByResolvingSymlinksInPath]) << L" of " << path;
+    }
+};
+
+class JoiningRows : public DialogTest
+{
+protected:
+    void SetUp() override
+    {
+        DialogTest::SetUp();
+        mTable = [[[ModrigArrayController alloc] initWithContent:[NSMutableArray array]] autorelease];
+        [mTable setSelectionIndexes:[NSIndexSet indexSet]]; // as one that comes from a window file
+    }
+
+    void add(const std::vector<CStdStr>& paths) { ModrigUtils::AddRows(mTable, paths); }
+
+    ModrigArrayController* mTable = nil;
+};
+} // namespace
+
+TEST_F(ResolvedLinks, LeaveAPathAsItIsThatHasNone)
+{
+    expectTheToolkitsAnswers({in(L"/tool.lsp"), in(L"/real/tool.lsp"), in(L"/real"), L"/"});
+}
+
+TEST_F(ResolvedLinks, AreFollowedInTheFolderAndInTheFile)
+{
+    expectTheToolkitsAnswers({in(L"/links/folder/tool.lsp"), in(L"/links/folder/link.lsp"),
+                              in(L"/links/file.lsp"), in(L"/links/folder"), in(L"/real/link.lsp")});
+    const ModrigPlatform::LinkResolver resolve = ModrigPlatform::MakeLinkResolver();
+    EXPECT_EQ(in(L"/real/tool.lsp"), resolve(CStdStr(in(L"/links/folder/tool.lsp"))).Text());
+    EXPECT_EQ(in(L"/tool.lsp"), resolve(CStdStr(in(L"/links/folder/link.lsp"))).Text());
+}
+
+TEST_F(ResolvedLinks, LeaveAPathAsItIsThatLeadsNowhere)
+{
+    expectTheToolkitsAnswers({in(L"/gone.lsp"), in(L"/gone/tool.lsp"), in(L"/links/nothing.lsp"),
+                              in(L"/links/gone/tool.lsp"), in(L"/links/folder/gone.lsp"),
+                              in(L"/links/round"), in(L"/links/round/tool.lsp"), in(L"/tool.lsp/tool.lsp"),
+                              in(L"/" + std::wstring(300, L'x') + L"/tool.lsp"),
+                              in(L"/real/" + std::wstring(300, L'x'))});
+}
+
+TEST_F(ResolvedLinks, AreFollowedInPathsThatAreWrittenInOtherWays)
+{
+    expectTheToolkitsAnswers({in(L"//real//tool.lsp"), in(L"/real/./tool.lsp"), in(L"/links/../tool.lsp"),
+                              in(L"/links/folder/../tool.lsp"), in(L"/real/"), in(L"/real/."),
+                              in(L"/links/folder/.."), in(L"/links/folder/"), in(L"/links/folder//"),
+                              in(L"//links/folder//tool.lsp"), L"/etc", L"//etc", L"/..", L"/gone.lsp"});
+}
+
+TEST_F(ResolvedLinks, AreFollowedFromWhereTheProgramIs)
+{
+    const auto before = std::filesystem::current_path();
+    std::filesystem::current_path(mFolder.path());
+    expectTheToolkitsAnswers({L"tool.lsp", L"links/folder/tool.lsp", L"gone.lsp", L"", L".", L"~", L"~/x"});
+    std::filesystem::current_path(before);
+}
+
+TEST_F(ResolvedLinks, AreFollowedWhateverTheNamesAre)
+{
+    expectTheToolkitsAnswers({in(L"/real/d\u00E9j\u00E0/tool.lsp"), in(L"/links/accents/tool.lsp"),
+                              in(L"/real/s\u00E9parateur.lsp"), in(L"/links/folder/s\u00E9parateur.lsp"),
+                              in(L"/real/odd\U0010FEFF.lsp"), in(L"/links/folder/odd\U0010FEFF.lsp"),
+                              in(L"/r\U0010FEE9al/tool.lsp"), in(L"/links/bytes/tool.lsp")});
+    const ModrigPlatform::LinkResolver resolve = ModrigPlatform::MakeLinkResolver();
+    EXPECT_EQ(in(L"/r\U0010FEE9al/tool.lsp"), resolve(CStdStr(in(L"/links/bytes/tool.lsp"))).Text());
+}
+
+TEST_F(JoiningRows, AreOneForEachFile)
+{
+    file("real.lsp");
+    std::filesystem::create_directory(mFolder / "links");
+    std::filesystem::create_symlink(mFolder / "real.lsp", mFolder / "links/link.lsp");
+    std::filesystem::create_symlink(mFolder.path(), mFolder / "links/folder");
+    add({CStdStr(file("links/link.lsp")), CStdStr(file("real.lsp")), CStdStr(file("links/folder/real.lsp"))});
+    EXPECT_THAT(rowsOf(mTable), ElementsAre(file("real.lsp")));
+}
+
+TEST_F(JoiningRows, AreMadeFromTheResolvedPath)
+{
+    std::filesystem::create_symlink(mFolder / "real.zmb", mFolder / "link.zmb");
+    host().linker.setLocked(file("real.zmb"));
+    add({CStdStr(file("link.zmb"))});
+    ModrigFilePath* row = [[mTable arrangedObjects] objectAtIndex:0];
+    EXPECT_EQ(L"real.zmb", wide([row fileName]));
+    EXPECT_EQ(file("real.zmb"), [row path].Text());
+    EXPECT_FALSE([row unloadable]);
+}
+
+TEST_F(JoiningRows, StandAfterThoseThatAreThereInTheirOrder)
+{
+    add({CStdStr(L"/none/b.lsp")});
+    add({CStdStr(L"/none/c.lsp"), CStdStr(L"/NONE/B.LSP"), CStdStr(L"/none/a.lsp"), CStdStr(L"/none/C.lsp")});
+    EXPECT_THAT(rowsOf(mTable), ElementsAre(L"/none/b.lsp", L"/none/c.lsp", L"/none/a.lsp"));
+}
+
+TEST_F(JoiningRows, ComeSelectedUnlessTheTableIsFilled)
+{
+    const std::vector<CStdStr> paths = {CStdStr(L"/none/a.lsp"), CStdStr(L"/none/b.lsp")};
+    ModrigUtils::FillTable(mTable, paths);
+    EXPECT_THAT(selectionOf(mTable), IsEmpty());
+    add({CStdStr(L"/none/c.lsp"), CStdStr(L"/none/d.lsp")});
+    EXPECT_THAT(selectionOf(mTable), ElementsAre(L"/none/c.lsp", L"/none/d.lsp"));
+}
+
+TEST_F(JoiningRows, LeaveSelectedWhatIs)
+{
+    const std::vector<CStdStr> paths = {CStdStr(L"/none/a.lsp"), CStdStr(L"/none/b.lsp")};
+    ModrigUtils::FillTable(mTable, paths);
+    [mTable setSelectionIndexes:[NSIndexSet indexSetWithIndex:1]];
+    [mTable setSelectsInsertedObjects:NO];
+    add({CStdStr(L"/none/c.lsp")});
+    EXPECT_THAT(selectionOf(mTable), ElementsAre(L"/none/b.lsp"));
+}
+
+TEST_F(JoiningRows, ChangeNothingWhereNoneIsNew)
+{
+    add({CStdStr(L"/none/a.lsp"), CStdStr(L"/none/b.lsp")});
+    [mTable setSelectionIndexes:[NSIndexSet indexSetWithIndex:0]];
+    add({CStdStr(L"/none/B.lsp")});
+    EXPECT_THAT(selectionOf(mTable), ElementsAre(L"/none/a.lsp"));
+}
+
+TEST_F(JoiningRows, AreMadeForAFileWithoutADotToo)
+{
+    add({CStdStr(L"/none/tool")});
+    EXPECT_THAT(rowsOf(mTable), ElementsAre(L"/none/tool"));
+    EXPECT_EQ(1u, boxes().size());
+}
