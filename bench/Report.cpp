@@ -16,7 +16,7 @@ constexpr double kMillion = 1e6;
 std::string number(double value)
 {
     char text[32];
-    std::snprintf(text, sizeof text, "%.3g", value);
+    std::snprintf(text, sizeof text, "%.4g", value);
     return text;
 }
 
