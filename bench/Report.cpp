@@ -13,16 +13,23 @@ namespace
 {
 constexpr double kMillion = 1e6;
 
-std::string number(double value)
+std::string number(const char* format, double value)
 {
     char text[32];
-    std::snprintf(text, sizeof text, "%.4g", value);
+    std::snprintf(text, sizeof text, format, value);
     return text;
 }
 
+std::string limit(double most)
+{
+    return most > 0 ? number("%g", most) : "-";
+}
+
+// What is close to 1 is told to the thousandth.
 std::string shown(const Measured& measured, const std::string& unit)
 {
-    return measured.value > 0 ? number(measured.value) + " " + unit : "";
+    const bool isCloseToOne = measured.value >= 0.1 && measured.value < 10;
+    return measured.value > 0 ? number(isCloseToOne ? "%.3f" : "%.4g", measured.value) + " " + unit : "";
 }
 
 std::string shownWobble(const Measured& measured)
@@ -48,7 +55,7 @@ void printFigure(const Figure& figure, bool judged)
     const Measured& counted = isJudgedByTime ? figure.instructions : figure.measured;
     std::printf("%-66s %10s %7s %12s %7s %7s  %s\n", figure.what.c_str(), shown(time, figure.unit).c_str(),
                 shownWobble(time).c_str(), shown(counted, figure.unit).c_str(), shownWobble(counted).c_str(),
-                figure.most > 0 ? number(figure.most).c_str() : "-", verdict(figure, judged).c_str());
+                limit(figure.most).c_str(), verdict(figure, judged).c_str());
 }
 
 nlohmann::json asJson(const Measured& measured)
@@ -94,8 +101,8 @@ void printMedians(const SamplesByName& samples)
         const Measured seconds = measuredOf(all.seconds);
         const double instructions = median(all.instructions) / kMillion;
         std::printf("%-66s %12.3f %7s %12s %6zu\n", name.c_str(), seconds.value * 1e3,
-                    shownWobble(seconds).c_str(), instructions > 0 ? number(instructions).c_str() : "",
-                    all.seconds.size());
+                    shownWobble(seconds).c_str(),
+                    instructions > 0 ? number("%.4g", instructions).c_str() : "", all.seconds.size());
     }
 }
 

@@ -62,7 +62,7 @@ class Page(unittest.TestCase):
 class WhatIsShown(Page):
     def test_is_the_figure_with_wobble_limit_and_machine(self):
         self.assertTrue(self.take(figure()))
-        self.assertIn("\n| ours / bare | 1.25 x | ± 4.0 % | 1.5 | 1 |\n", self.text())
+        self.assertIn("\n| ours / bare | 1.250 x | ± 4.0 % | 1.5 | 1 |\n", self.text())
         self.assertIn(f"\n1. {checker.machine()}\n", self.text())
 
     def test_stands_between_the_marks_and_leaves_the_rest_alone(self):
@@ -73,7 +73,7 @@ class WhatIsShown(Page):
 
     def test_says_which_limits_are_missed(self):
         self.take(figure(value=2.0, missed=True))
-        self.assertIn("| 2 x | ± 2.5 % | 1.5, **missed** | 1 |", self.text())
+        self.assertIn("| 2.000 x | ± 2.5 % | 1.5, **missed** | 1 |", self.text())
 
     def test_says_what_was_not_measured(self):
         self.take(figure(value=0, missed=True, measured=benchmark("ours", runs=0, seconds=0)))
@@ -83,13 +83,13 @@ class WhatIsShown(Page):
     def test_is_how_it_was_measured_too(self):
         self.take(figure(how="A sentence.", by="instructions",
                          measured=benchmark("ours", instructions=2.5e6, runs=9, units=10)))
-        self.assertIn("- **ours / bare**: *ours* took 2 ms and 2.5 million instructions, for 10 units; *bare* took 1.6 ms. "
+        self.assertIn("- **ours / bare**: *ours* took 2 ms and 2.500 million instructions, for 10 units; *bare* took 1.6 ms. "
                       "Medians of 7 and 9 runs, judged by instructions. A sentence.", " ".join(self.text().split()))
 
     def test_has_no_limit_nor_wobble_where_there_is_none(self):
         self.take({"what": "memory", "value": 3.5, "wobble": 0, "unit": "MB", "most": 0, "missed": False, "by": "time",
                    "how": "", "source": "bench/Some.cpp"})
-        self.assertIn("| memory | 3.5 MB | - | - | 1 |", self.text())
+        self.assertIn("| memory | 3.500 MB | - | - | 1 |", self.text())
 
     def test_keeps_the_groups_that_were_not_run(self):
         names = ("some", "others")
@@ -119,7 +119,7 @@ class TheCheck(Page):
         self.assertEqual(self.faults(), [])
 
     def test_tells_of_another_page(self):
-        self.page.write_text(self.text().replace("1.25 x", "1.15 x"))
+        self.page.write_text(self.text().replace("1.250 x", "1.150 x"))
         self.assert_told("docs/performance.md shows something else")
 
     def test_tells_of_other_results(self):
@@ -182,8 +182,8 @@ class ASummary(unittest.TestCase):
         self.assertEqual(self.summary(one={"whyNothingCounts": "", "figures": [figure()]}), (0, "", ""))
 
     def test_refuses_a_run_without_figures(self):
-        status, _, err = self.summary(one={"whyNothingCounts": "", "figures": []})
-        self.assertEqual(status, 2)
+        status, out, err = self.summary(one={"whyNothingCounts": "No such file", "figures": []})
+        self.assertEqual((status, out), (2, ""))
         self.assertIn("No figure has been measured", err)
 
 

@@ -70,15 +70,15 @@ TEST_F(Setup, InstallsForTheTourADisplayToo)
 
 TEST_F(Setup, InstallsForTheBenchmarksWhatTheyCountAndCompareWith)
 {
-    EXPECT_THAT(setup("--bench"),
-                AllOf(HasSubstr(" g++ "), HasSubstr(" xvfb "), HasSubstr(" valgrind "), HasSubstr(" libltdl-dev "),
-                      Not(HasSubstr(" libgtest-dev "))));
+    EXPECT_THAT(setup("--bench"), AllOf(HasSubstr(" g++ "), HasSubstr(" xvfb "), HasSubstr(" valgrind "),
+                                        HasSubstr(" libltdl-dev "), Not(HasSubstr(" libgtest-dev "))));
 }
 
 TEST_F(Setup, InstallsForTheTestsAllThereIs)
 {
-    EXPECT_THAT(setup(""), AllOf(HasSubstr(" g++ "), HasSubstr(" xvfb "), HasSubstr(" dpkg-dev "),
-                                 HasSubstr(" libgtest-dev "), HasSubstr(" lintian "), HasSubstr(" valgrind ")));
+    EXPECT_THAT(setup(""),
+                AllOf(HasSubstr(" g++ "), HasSubstr(" xvfb "), HasSubstr(" dpkg-dev "),
+                      HasSubstr(" libgtest-dev "), HasSubstr(" lintian "), HasSubstr(" valgrind ")));
 }
 
 TEST_F(Setup, TakesTheHighestVersionThatANameCanHave)
