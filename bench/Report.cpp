@@ -20,6 +20,15 @@ std::string number(const char* format, double value)
     return text;
 }
 
+std::string duration(double seconds)
+{
+    if (seconds >= 1)
+        return number("%.3f s", seconds);
+    if (seconds >= 1e-3)
+        return number("%.3f ms", seconds * 1e3);
+    return seconds >= 1e-6 ? number("%.3f us", seconds * 1e6) : number("%.1f ns", seconds * 1e9);
+}
+
 std::string limit(double most)
 {
     return most > 0 ? number("%g", most) : "-";
@@ -95,12 +104,12 @@ nlohmann::json asJson(const Figure& figure, const SamplesByName& samples)
 
 void printMedians(const SamplesByName& samples)
 {
-    std::printf("\n%-66s %12s %7s %12s %6s\n", "benchmark", "median ms", "+-", "instr. 10^6", "runs");
+    std::printf("\n%-66s %12s %7s %12s %6s\n", "benchmark", "median", "+-", "instr. 10^6", "runs");
     for (const auto& [name, all] : samples)
     {
         const Measured seconds = measuredOf(all.seconds);
         const double instructions = median(all.instructions) / kMillion;
-        std::printf("%-66s %12.3f %7s %12s %6zu\n", name.c_str(), seconds.value * 1e3,
+        std::printf("%-66s %12s %7s %12s %6zu\n", name.c_str(), duration(seconds.value).c_str(),
                     shownWobble(seconds).c_str(),
                     instructions > 0 ? number("%.4g", instructions).c_str() : "", all.seconds.size());
     }

@@ -62,34 +62,37 @@ class Page(unittest.TestCase):
 class WhatIsShown(Page):
     def test_is_the_figure_with_wobble_limit_and_machine(self):
         self.assertTrue(self.take(figure()))
-        self.assertIn("\n| ours / bare | 1.250 x | ± 4.0 % | 1.5 | 1 |\n", self.text())
+        self.assertIn("\n| ours / bare | 1.250 x | ± 4.0 % | 1.5 | 2 ms / 1.6 ms | 7 / 7 | 1 |\n", self.text())
         self.assertIn(f"\n1. {checker.machine()}\n", self.text())
 
     def test_stands_between_the_marks_and_leaves_the_rest_alone(self):
         self.take(figure())
         self.take(figure())
         self.assertTrue(self.text().startswith(f"Before.\n\n{checker.BEGIN}\n\nMachines:\n"))
-        self.assertTrue(self.text().endswith(f" runs.\n\n{checker.END}\n\nAfter.\n"))
+        self.assertTrue(self.text().endswith(f" | 1 |\n\n{checker.END}\n\nAfter.\n"), self.text())
 
     def test_says_which_limits_are_missed(self):
         self.take(figure(value=2.0, missed=True))
-        self.assertIn("| 2.000 x | ± 2.5 % | 1.5, **missed** | 1 |", self.text())
+        self.assertIn("| 2.000 x | ± 2.5 % | 1.5, **missed** |", self.text())
 
     def test_says_what_was_not_measured(self):
         self.take(figure(value=0, missed=True, measured=benchmark("ours", runs=0, seconds=0)))
-        self.assertIn("| not measured | - | 1.5, **missed** |", self.text())
-        self.assertIn("*ours* took nothing that was measured;", self.text())
+        self.assertIn("| not measured | - | 1.5, **missed** | nothing / 1.6 ms | 0 / 7 |", self.text())
 
-    def test_is_how_it_was_measured_too(self):
-        self.take(figure(how="A sentence.", by="instructions",
-                         measured=benchmark("ours", instructions=2.5e6, runs=9, units=10)))
-        self.assertIn("- **ours / bare**: *ours* took 2 ms and 2.500 million instructions, for 10 units; *bare* took 1.6 ms. "
-                      "Medians of 7 and 9 runs, judged by instructions. A sentence.", " ".join(self.text().split()))
+    def test_is_how_it_was_measured_where_the_names_do_not_say_it(self):
+        self.take(figure(how="A sentence."), figure(what="plain"))
+        self.assertIn("| 1 |\n\n- *ours / bare*: A sentence.\n\n<!--", self.text())
+
+    def test_counts_instructions_and_units(self):
+        self.take(figure(by="instructions", measured=benchmark("ours", instructions=2.5e6, runs=9, units=10),
+                         base=benchmark("bare", instructions=2e6, units=5)))
+        self.assertIn("| 1.250 x by instructions | ± 4.0 % | 1.5 | 2 ms / 2 ms; 2.500 / 2.000 million instructions "
+                      "for 10 / 5 | 9 / 7 |", self.text())
 
     def test_has_no_limit_nor_wobble_where_there_is_none(self):
         self.take({"what": "memory", "value": 3.5, "wobble": 0, "unit": "MB", "most": 0, "missed": False, "by": "time",
                    "how": "", "source": "bench/Some.cpp"})
-        self.assertIn("| memory | 3.500 MB | - | - | 1 |", self.text())
+        self.assertIn("| memory | 3.500 MB | - | - | - | - | 1 |", self.text())
 
     def test_keeps_the_groups_that_were_not_run(self):
         names = ("some", "others")
