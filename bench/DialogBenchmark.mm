@@ -184,7 +184,7 @@ try
     if (argc == 5) // -part PART -entries COUNT: the toolkit takes plain words for documents to open
         return runHistoryPart(argv[2], std::strtoul(argv[4], nullptr, 10));
     addBenchmarks();
-    addHistoryDialogBenchmarks();
+    addHistoryDialogBenchmarks(display ? display->server() : 0);
     const int missed = bench::runAll();
     [pool drain];
     return missed == 0 ? EXIT_SUCCESS : EXIT_FAILURE;

@@ -1,10 +1,14 @@
 // The dialog with a long History: opening its table, its window on the screen, and what it takes in memory.
 #pragma once
 
+#include <cstddef>
 #include <string>
 
-void addHistoryDialogBenchmarks();
+#include <sys/types.h>
 
-// What the program does when it starts itself again: one measurement, whose figure it prints. Answers what
-// the program ends with.
+// `display`: the process of the display, 0 when that is not ours.
+void addHistoryDialogBenchmarks(pid_t display);
+
+// What the program does when it starts itself again: it counts its memory with the dialog open, "resident" or
+// "allocated", and tells the bytes. Answers what it ends with.
 int runHistoryPart(const std::string& part, std::size_t entries);

@@ -3,7 +3,6 @@
 
 #include <cstddef>
 #include <string>
-#include <vector>
 
 namespace bench
 {
@@ -13,9 +12,12 @@ enum class Files
     kGone // of which not even the folders are left
 };
 
-// The paths of so many; those that are to be there are made, once in a run.
-std::vector<std::string> historyFiles(std::size_t count, Files files);
+// Makes so many, once in a run, unless they are to be gone.
+void makeHistoryFiles(std::size_t count, Files files);
 
-// Replaces the module's History with the paths.
-void setHistory(const std::vector<std::string>& paths);
+// The path of one of them.
+std::string historyFile(std::size_t number, Files files);
+
+// Replaces the module's History with so many.
+void setHistory(std::size_t count, Files files);
 } // namespace bench

@@ -5,6 +5,7 @@
 #include <tesselui/tsuifilepanel.h>
 
 #include "bench/Child.h"
+#include "bench/Ratios.h"
 
 namespace bench
 {
@@ -43,7 +44,7 @@ NSUInteger OpenDialog::rows(NSString* table) const
     return [[[mController valueForKey:table] arrangedObjects] count];
 }
 
-void measure(const std::string& name, int repetitions, std::function<double()> once)
+void measure(const std::string& name, int usual, std::function<double()> once)
 {
     const auto run = [once = std::move(once), name](benchmark::State& state)
     {
@@ -61,7 +62,7 @@ void measure(const std::string& name, int repetitions, std::function<double()> o
     benchmark::RegisterBenchmark(name.c_str(), run)
         ->UseManualTime()
         ->Iterations(1)
-        ->Repetitions(repetitions);
+        ->Repetitions(bench::repetitions(usual));
 }
 
 double secondsInPool(const std::function<void()>& work)

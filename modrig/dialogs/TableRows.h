@@ -20,6 +20,8 @@ public:
     JoiningRows(const JoiningRows&) = delete;
     JoiningRows& operator=(const JoiningRows&) = delete;
 
+    // Says which paths will be added, before any is.
+    void Expect(const CStdStr& path);
     void Add(const CStdStr& path);
     // Gives them to the table, in one change; they are the table's alone then.
     void Join();
@@ -29,13 +31,15 @@ private:
 
     NSArrayController* mTable;
     NSMutableArray* mRows;
-    ModrigPlatform::LinkResolver mResolve;
+    std::unique_ptr<ModrigPlatform::LinkResolver> mLinks;
     HashIndex<ModrigFilePath*> mKnown;
 };
 
 template <typename Paths> void AddRows(NSArrayController* table, const Paths& paths)
 {
     JoiningRows rows(table);
+    for (const CStdStr& path : paths)
+        rows.Expect(path);
     for (const CStdStr& path : paths)
         rows.Add(path);
     rows.Join();

@@ -8,7 +8,7 @@ namespace ModrigUtils
 {
 JoiningRows::JoiningRows(NSArrayController* table)
     : mTable([table retain]), mRows([[NSMutableArray alloc] init]),
-      mResolve(ModrigPlatform::MakeLinkResolver())
+      mLinks(ModrigPlatform::MakeLinkResolver())
 {
     for (ModrigFilePath* row : tsuiEach<ModrigFilePath*>([table arrangedObjects]))
         mKnown.Add([row hash], row);
@@ -29,10 +29,15 @@ bool JoiningRows::Know(ModrigFilePath* row, std::size_t hash)
     return false;
 }
 
+void JoiningRows::Expect(const CStdStr& path)
+{
+    mLinks->Expect(path);
+}
+
 void JoiningRows::Add(const CStdStr& path)
 {
-    const CStdStr& resolved = mResolve(path);
-    ModrigFilePath* row = [[ModrigFilePath alloc] initWithResolvedPath:resolved];
+    const CStdStr& resolved = mLinks->Resolve(path);
+    ModrigFilePath* row = [ModrigFilePath newWithResolvedPath:resolved];
     if (!Know(row, HashOfPath(resolved.Text())))
         [mRows addObject:row];
     [row release];

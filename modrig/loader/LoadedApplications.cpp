@@ -125,7 +125,7 @@ bool ApplicationIsLoaded(CStdStr path)
     return false;
 }
 
-bool IsAppUnloadAble(CStdStr path)
+bool IsAppUnloadAble(const CStdStr& path)
 {
     // True, where `ApplicationIsLoaded` answers false: a row that nobody can place must not stay for ever.
     if (RefuseFileWithoutDot(path))

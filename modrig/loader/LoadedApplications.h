@@ -23,7 +23,7 @@ void PopulateLoadedApps();
 
 // Whether the compiled module may be unloaded. False for files of every other kind. A path without a dot:
 // kCannotLoadFile and true.
-[[nodiscard]] bool IsAppUnloadAble(CStdStr path);
+[[nodiscard]] bool IsAppUnloadAble(const CStdStr& path);
 
 // An application that the user wants unloaded, and whether it could be unloaded when it was listed.
 struct UnloadCandidate

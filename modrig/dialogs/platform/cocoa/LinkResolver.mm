@@ -6,14 +6,27 @@
 
 namespace ModrigPlatform
 {
-LinkResolver MakeLinkResolver()
+namespace
 {
-    CStdStr resolved;
-    return [resolved](const CStdStr& path) mutable -> const CStdStr&
+class PathByPath : public LinkResolver
+{
+public:
+    void Expect(const CStdStr&) override {}
+
+    const CStdStr& Resolve(const CStdStr& path) override
     {
         NSString* text = ModrigUtils::StringFromPath(path);
-        resolved = ModrigUtils::PathFromString([text stringByResolvingSymlinksInPath]);
-        return resolved;
-    };
+        mResolved = ModrigUtils::PathFromString([text stringByResolvingSymlinksInPath]);
+        return mResolved;
+    }
+
+private:
+    CStdStr mResolved;
+};
+} // namespace
+
+std::unique_ptr<LinkResolver> MakeLinkResolver()
+{
+    return std::make_unique<PathByPath>();
 }
 } // namespace ModrigPlatform
