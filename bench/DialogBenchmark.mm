@@ -181,8 +181,9 @@ try
     bench::startHost();
     if (!tsuiPrepareWindows())
         return EXIT_FAILURE;
-    if (argc == 5) // -part PART -entries COUNT: the toolkit takes plain words for documents to open
-        return runHistoryPart(argv[2], std::strtoul(argv[4], nullptr, 10));
+    // -part PART -entries COUNT -server PROCESS: the toolkit takes plain words for documents to open.
+    if (argc == 7)
+        return runHistoryPart(argv[2], std::strtoul(argv[4], nullptr, 10), std::stoi(argv[6]));
     addBenchmarks();
     addHistoryDialogBenchmarks(display ? display->server() : 0);
     const int missed = bench::runAll();

@@ -9,6 +9,6 @@
 // `display`: the process of the display, 0 when that is not ours.
 void addHistoryDialogBenchmarks(pid_t display);
 
-// What the program does when it starts itself again: it counts its memory with the dialog open, "resident" or
-// "allocated", and tells the bytes. Answers what it ends with.
-int runHistoryPart(const std::string& part, std::size_t entries);
+// What the program does when it starts itself again: one part of it, whose figure it tells. Answers what it
+// ends with.
+int runHistoryPart(const std::string& part, std::size_t entries, pid_t display);

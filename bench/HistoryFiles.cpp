@@ -1,6 +1,6 @@
 #include "bench/HistoryFiles.h"
 
-#include <algorithm>
+#include <cstdlib>
 #include <filesystem>
 #include <fstream>
 
@@ -12,6 +12,16 @@ namespace bench
 namespace
 {
 constexpr std::size_t kInEachFolder = 100;
+// A process that is started for one measurement takes the files of the one that starts it.
+constexpr char kGivenFolder[] = "MODRIG_BENCH_HISTORY_FILES";
+
+std::filesystem::path folderOf(Files files)
+{
+    if (files == Files::kGone)
+        return "/home/user/Applications";
+    const char* given = std::getenv(kGivenFolder);
+    return given ? std::filesystem::path(given) : workFolder() / "Applications";
+}
 
 std::filesystem::path pathOf(const std::filesystem::path& folder, std::size_t number)
 {
@@ -32,16 +42,18 @@ void makeFiles(const std::filesystem::path& folder, std::size_t count)
 }
 } // namespace
 
-std::string historyFile(std::size_t number, Files files)
-{
-    return pathOf(files == Files::kThere ? workFolder() / "Applications" : "/home/user/Applications", number)
-        .string();
-}
-
 void makeHistoryFiles(std::size_t count, Files files)
 {
-    if (files == Files::kThere)
-        makeFiles(workFolder() / "Applications", count);
+    if (files == Files::kGone)
+        return;
+    const std::filesystem::path folder = folderOf(files);
+    makeFiles(folder, count);
+    setenv(kGivenFolder, folder.c_str(), 1);
+}
+
+std::string historyFile(std::size_t number, Files files)
+{
+    return pathOf(folderOf(files), number).string();
 }
 
 void setHistory(std::size_t count, Files files)

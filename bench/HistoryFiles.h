@@ -12,7 +12,7 @@ enum class Files
     kGone // of which not even the folders are left
 };
 
-// Makes so many, once in a run, unless they are to be gone.
+// Makes so many, once in a run, unless they are to be gone. Programs that this one starts find them too.
 void makeHistoryFiles(std::size_t count, Files files);
 
 // The path of one of them.
