@@ -2,8 +2,6 @@
 
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
-#include "modrig/dialogs/Paths.h"
-
 @implementation ModrigController (SystemPanel)
 
 - (void)setupPanelWithoutButtons:(NSOpenPanel*)panel
@@ -19,9 +17,8 @@
 // Whatever was chosen in the History before: who presses the panel's own button means the panel's files.
 - (BOOL)panel:(id)panel validateURL:(NSURL*)url error:(NSError**)error
 {
-    [self panelSelectionDidChange:panel];
-    if ([mSelectedFiles count] == 0)
-        [mSelectedFiles setArray:ModrigUtils::RowsFromPaths({ModrigUtils::PathFromString([url path])})];
+    NSArray* chosen = [panel URLs];
+    [self choose:[self isAnyFileIn:chosen] ? chosen : [NSArray arrayWithObject:url]];
     [self onLoad:panel];
     // The system shows every error but this one, and what there is to tell has been told.
     if (error)

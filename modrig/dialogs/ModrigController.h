@@ -114,9 +114,13 @@
 - (IBAction)onFileTypesChanged:(id)sender;
 
 - (BOOL)panel:(id)panel shouldShowFilename:(NSString*)name;
+// Makes what is chosen in the panel what Load will load, folders too; no folder is when it does.
 - (void)panelSelectionDidChange:(id)panel;
-// The paths of the files that are chosen in the panel. A folder on the way to files is none of them.
-- (NSArray*)filesChosenIn:(id)panel;
+- (void)choose:(NSArray*)urls;
+// Whether there is anything among the URLs but folders on the way to files.
+- (BOOL)isAnyFileIn:(NSArray*)urls;
+// What Load loads of that which is chosen.
+- (NSArray*)chosenFiles;
 // The action of the panel's default button.
 - (void)openPanelOK:(id)sender;
 
