@@ -14,12 +14,16 @@
     return [self panel:panel shouldShowFilename:[url path]];
 }
 
-// Whatever was chosen in the History before: who presses the panel's own button means the panel's files.
+- (void)load:(NSArray*)urls
+{
+    [self choose:urls];
+    [self openPanelOK:mOpenPanel];
+}
+
 - (BOOL)panel:(id)panel validateURL:(NSURL*)url error:(NSError**)error
 {
     NSArray* chosen = [panel URLs];
-    [self choose:[self isAnyFileIn:chosen] ? chosen : [NSArray arrayWithObject:url]];
-    [self onLoad:panel];
+    [self load:[self isAnyFileIn:chosen] ? chosen : [NSArray arrayWithObject:url]];
     // The system shows every error but this one, and what there is to tell has been told.
     if (error)
         *error = [NSError errorWithDomain:NSCocoaErrorDomain code:NSUserCancelledError userInfo:nil];

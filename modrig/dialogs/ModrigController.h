@@ -136,6 +136,9 @@
 - (void)setupPanelWithoutButtons:(NSOpenPanel*)panel;
 
 - (BOOL)panel:(id)panel shouldEnableURL:(NSURL*)url;
+// Loads these, whatever was chosen in the History before: who presses the panel's own button means the
+// panel's files.
+- (void)load:(NSArray*)urls;
 // Loads what the panel has chosen, and answers NO: the panel stays.
 - (BOOL)panel:(id)panel validateURL:(NSURL*)url error:(NSError**)error;
 - (void)panel:(id)panel didChangeToDirectoryURL:(NSURL*)url;

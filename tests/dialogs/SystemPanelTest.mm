@@ -290,16 +290,23 @@ TEST_F(SystemPanel, LoadsTheFileThatItAsksAboutWhenItTellsOfNone)
     EXPECT_TRUE(host().linker.isLoaded(file("one.zmb")));
 }
 
-TEST_F(SystemPanel, LoadsWhatWasChosenWhenItEndsWithIt)
+TEST_F(SystemPanel, LoadsWhatWasChosenWhenItEndsWithItWhateverIsChosenInTheHistory)
 {
+    gHistoryList.AddTail(CStdStr(file("old.zmb")));
     file("one.zmb");
     host().registry.setValue(kSettingsOfPanel, L"InitialPath", mFolder.path().wstring());
     {
         const ModalSteps steps({[] { selectFilesIn(runningPanel(), {L"one.zmb"}); },
-                                [] { [NSApp stopModalWithCode:NSOKButton]; }});
+                                [this]
+                                {
+                                    ModrigController* dialog = [TsOCModrigUtil getModrigController];
+                                    select([dialog valueForKey : @"historyListTableView"], { 0 });
+                                },
+                                [] { [NSApp stopModalWithCode:NSModalResponseOK]; }});
         ModrigUtils::RunModrigDialog();
     }
     EXPECT_TRUE(host().linker.isLoaded(file("one.zmb")));
+    EXPECT_FALSE(host().linker.isLoaded(file("old.zmb")));
 }
 
 TEST_F(SystemPanel, LoadsNothingWhenItIsCancelled)
