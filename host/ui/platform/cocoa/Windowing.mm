@@ -40,7 +40,7 @@ void runMessage(NSString* text, NSString* detail, bool warning)
     // The system sets the second text in smaller type, and lets it be selected.
     [alert setMessageText:[detail length] ? text : @"Tessel"];
     [alert setInformativeText:[detail length] ? detail : text];
-    [alert setAlertStyle:warning ? NSWarningAlertStyle : NSInformationalAlertStyle];
+    [alert setAlertStyle:warning ? NSAlertStyleWarning : NSAlertStyleInformational];
     [alert addButtonWithTitle:@"OK"];
     [alert runModal];
 }
@@ -51,7 +51,7 @@ NSString* chooseFile(NSString* folder, NSString* name, bool mayBeNew)
     NSSavePanel* panel = mayBeNew ? [NSSavePanel savePanel] : [NSOpenPanel openPanel];
     [panel setDirectoryURL:[NSURL fileURLWithPath:folder]];
     [panel setNameFieldStringValue:name];
-    return [panel runModal] == NSOKButton ? [[panel URL] path] : nil;
+    return [panel runModal] == NSModalResponseOK ? [[panel URL] path] : nil;
 }
 
 // The panel hides it behind a button of its own unless it is told not to.
