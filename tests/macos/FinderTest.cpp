@@ -1,5 +1,5 @@
-// Tessel started from the Finder: the host's code for macOS, with a program in the place of the one that opens
-// things there.
+// Tessel started from the Finder: the host's code for macOS, with a program in the place of the one that
+// opens things there.
 #include <gmock/gmock.h>
 
 #include <cstdlib>
