@@ -19,7 +19,8 @@ protected:
     TestOnMac()
     {
         fs::copy_file(TEST_EVERYTHING, folder / "test");
-        for (const char* name : {"tools/setup", "tools/static_checks", "bin/cmake", "bin/ctest"})
+        for (const char* name :
+             {"tools/setup", "tools/static_checks", "tools/check_macos", "bin/cmake", "bin/ctest"})
             program(name, "echo \"${0##*/} $*.\"");
         system("Darwin");
         folder.write("build/debug/build.ninja", "");
@@ -47,12 +48,13 @@ TEST_F(TestOnMac, BuildsAndTestsAndLeavesTheChecksOfSourcesToLinux)
 {
     const auto outcome = test("-R Startup");
     EXPECT_EQ(outcome.status, 0) << outcome.output;
-    EXPECT_THAT(outcome.output,
-                AllOf(HasSubstr("setup .\ncmake --build --preset debug -j"), HasSubstr("ctest --preset debug -j"),
-                      HasSubstr(" -R Startup.\n"), Not(HasSubstr("static_checks"))));
+    EXPECT_THAT(outcome.output, AllOf(HasSubstr("setup .\ncmake --build --preset debug -j"),
+                                      HasSubstr("ctest --preset debug -j"), HasSubstr(" -R Startup.\n"),
+                                      Not(HasSubstr("static_checks"))));
     const auto deep = test("--deep");
     EXPECT_EQ(deep.status, 0) << deep.output;
-    EXPECT_THAT(deep.output, AllOf(HasSubstr("ctest --preset asan"), Not(HasSubstr("static_checks"))));
+    EXPECT_THAT(deep.output, AllOf(HasSubstr("ctest --preset asan"), Not(HasSubstr("static_checks")),
+                                   Not(HasSubstr("check_macos"))));
 }
 
 TEST_F(TestOnMac, TellsOfATestThatFails)
@@ -65,7 +67,8 @@ TEST_F(TestOnMac, IsOnLinuxWithTheChecksOfSources)
 {
     system("Linux");
     EXPECT_THAT(test("--deep").output,
-                AllOf(HasSubstr("static_checks build/debug."), HasSubstr("static_checks --deep build/debug.")));
+                AllOf(HasSubstr("static_checks build/debug."), HasSubstr("static_checks --deep build/debug."),
+                      HasSubstr("check_macos sdk tests.")));
     program("tools/static_checks", "exit 1");
     const auto outcome = test();
     EXPECT_EQ(outcome.status, 1);
