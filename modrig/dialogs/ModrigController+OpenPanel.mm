@@ -153,16 +153,18 @@
     return NO;
 }
 
+- (ModrigFilePath*)rowFor:(NSString*)path
+{
+    if ([self isOnTheWay:path])
+        return [[[ModrigFolderPath alloc] initWithFilePathName:path] autorelease];
+    return [[[ModrigFilePath alloc] initWithFilePathName:path] autorelease];
+}
+
 - (void)choose:(NSArray*)urls
 {
     [mSelectedFiles removeAllObjects];
     for (NSURL* url : tsuiEach<NSURL*>(urls))
-    {
-        Class kind = [self isOnTheWay:[url path]] ? [ModrigFolderPath class] : [ModrigFilePath class];
-        ModrigFilePath* row = [[kind alloc] initWithFilePathName:[url path]];
-        [mSelectedFiles addObject:row];
-        [row release];
-    }
+        [mSelectedFiles addObject:[self rowFor:[url path]]];
 }
 
 - (void)panelSelectionDidChange:(id)panel
