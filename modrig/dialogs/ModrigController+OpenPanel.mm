@@ -169,6 +169,7 @@
 
 - (void)panelSelectionDidChange:(id)panel
 {
+    self.furtherQuestions = nil;
     [self choose:[panel URLs]];
 }
 

@@ -20,10 +20,22 @@
     [self openPanelOK:mOpenPanel];
 }
 
+// A press of the button may lead to a question about each file that is chosen, or to one, since that is
+// refused.
+- (BOOL)isFirstQuestion:(NSURL*)url of:(NSArray*)chosen
+{
+    const BOOL isFirst = [chosen count] < 2 || ![self.furtherQuestions containsObject:url];
+    NSMutableArray* further = [[(isFirst ? chosen : self.furtherQuestions) mutableCopy] autorelease];
+    [further removeObject:url];
+    self.furtherQuestions = further;
+    return isFirst;
+}
+
 - (BOOL)panel:(id)panel validateURL:(NSURL*)url error:(NSError**)error
 {
     NSArray* chosen = [panel URLs];
-    [self load:[self isAnyFileIn:chosen] ? chosen : [NSArray arrayWithObject:url]];
+    if ([self isFirstQuestion:url of:chosen])
+        [self load:[self isAnyFileIn:chosen] ? chosen : [NSArray arrayWithObject:url]];
     // The system shows every error but this one, and what there is to tell has been told.
     if (error)
         *error = [NSError errorWithDomain:NSCocoaErrorDomain code:NSUserCancelledError userInfo:nil];

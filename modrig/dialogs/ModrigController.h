@@ -30,6 +30,7 @@
     BOOL canRemoveHistory;
     NSString* message;
     NSString* shownFolder;
+    NSArray* furtherQuestions;
 }
 
 // What Load will load: `ModrigFilePath`s, from the panel's selection or the History's.
@@ -43,6 +44,8 @@
 @property (nonatomic, retain) NSString* message;
 // The path of the folder that the panel was sent to or has told of last; it may still be on its way there.
 @property (nonatomic, copy) NSString* shownFolder;
+// The URLs of the files that have been loaded, and that the panel may still ask about.
+@property (nonatomic, copy) NSArray* furtherQuestions;
 
 - (id)init;
 
@@ -139,7 +142,7 @@
 // Loads these, whatever was chosen in the History before: who presses the panel's own button means the
 // panel's files.
 - (void)load:(NSArray*)urls;
-// Loads what the panel has chosen, and answers NO: the panel stays.
+// Loads all that the panel has chosen at the first of its questions, and answers NO: the panel stays.
 - (BOOL)panel:(id)panel validateURL:(NSURL*)url error:(NSError**)error;
 - (void)panel:(id)panel didChangeToDirectoryURL:(NSURL*)url;
 

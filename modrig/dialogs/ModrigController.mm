@@ -41,6 +41,7 @@ void cleanPanelOf(void* closing)
 @synthesize canRemoveHistory;
 @synthesize message;
 @synthesize shownFolder;
+@synthesize furtherQuestions;
 
 - (id)init
 {
@@ -59,6 +60,7 @@ void cleanPanelOf(void* closing)
     self.selectedFiles = nil;
     self.message = nil;
     self.shownFolder = nil;
+    self.furtherQuestions = nil;
     [super dealloc];
 }
 

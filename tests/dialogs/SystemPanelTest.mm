@@ -197,6 +197,11 @@ protected:
     {
         object_setIvar(mController, class_getInstanceVariable([ModrigController class], "mOpenPanel"), panel);
     }
+    // Asks about one of its files, as when its button is pressed.
+    BOOL asks(id panel, const char* name)
+    {
+        return [mController panel:panel validateURL:[NSURL fileURLWithPath:path(name)] error:nullptr];
+    }
     // As the panel tells it.
     void choose(std::initializer_list<std::string> names)
     {
@@ -265,6 +270,46 @@ TEST_F(SystemPanel, IsRefusedEveryFileOnceThatIsLoaded)
     EXPECT_TRUE(host().linker.isLoaded(file("one.zmb")));
     EXPECT_EQ(wide(NSCocoaErrorDomain), wide([error domain]));
     EXPECT_EQ(NSUserCancelledError, [error code]);
+}
+
+TEST_F(SystemPanel, LoadsAllThatIsChosenAtTheFirstOfItsQuestionsAndNothingAtTheOthers)
+{
+    open();
+    id panel = panelWithSelected(paths({"a.lsp", "b.lsp", "c.lsp"}));
+    const auto press = [=, this]
+    {
+        for (const char* name : {"a.lsp", "b.lsp", "c.lsp"})
+            EXPECT_FALSE(asks(panel, name));
+    };
+    for (const char* name : {"a.lsp", "b.lsp", "c.lsp"})
+        file(name);
+    press();
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"3")));
+    press();
+    EXPECT_EQ(2u, lines().size());
+}
+
+TEST_F(SystemPanel, LoadsAtEveryPressThoughItAsksNoMoreOnceItIsRefused)
+{
+    for (const char* name : {"a.lsp", "b.lsp"})
+        file(name);
+    open();
+    asks(panelWithSelected(paths({"a.lsp", "b.lsp"})), "a.lsp");
+    asks(panelWithSelected(paths({"a.lsp", "b.lsp"})), "a.lsp");
+    EXPECT_EQ(2u, lines().size());
+    asks(panelWithSelected(paths({"b.lsp"})), "b.lsp"); // though it has been waited for
+    EXPECT_EQ(3u, lines().size());
+}
+
+TEST_F(SystemPanel, LoadsWhatIsChosenAnewThoughItHasNotAskedAboutItBefore)
+{
+    for (const char* name : {"a.lsp", "b.lsp", "c.lsp"})
+        file(name);
+    open();
+    asks(panelWithSelected(paths({"a.lsp", "b.lsp"})), "a.lsp");
+    choose({"b.lsp", "c.lsp"});
+    asks(panelWithSelected(paths({"b.lsp", "c.lsp"})), "b.lsp");
+    EXPECT_EQ(2u, lines().size());
 }
 
 TEST_F(SystemPanel, LoadsItsOwnFilesWhateverIsChosenInTheHistory)
