@@ -67,8 +67,28 @@ void showFolder(NSOpenPanel* panel, NSString* folder)
     [panel setDirectoryURL:[NSURL fileURLWithPath:folder isDirectory:YES]];
 }
 
-void flushScreen()
+namespace
 {
+// Who was in front when windows opened: the terminal that Tessel runs in.
+NSRunningApplication* gBefore = nil;
+} // namespace
+
+void comeToFront()
+{
+    NSRunningApplication* front = [[NSWorkspace sharedWorkspace] frontmostApplication];
+    if (front && ![front isEqual:[NSRunningApplication currentApplication]])
+    {
+        [gBefore release];
+        gBefore = [front retain];
+    }
+    [NSApp activateIgnoringOtherApps:YES];
+}
+
+// The program would stay in front without a window, and keys would go nowhere.
+void leaveScreen()
+{
+    if ([NSApp isActive])
+        [gBefore activateWithOptions:0];
 }
 
 namespace
