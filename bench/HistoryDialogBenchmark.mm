@@ -98,10 +98,10 @@ void addOpening(std::size_t entries, Files files, double most)
     const std::string bare = "bare: " + measured;
     bench::measure(measured, kRepetitions, [=] { return openTable(entries, files); });
     bench::measure(bare, kRepetitions, [=] { return resolveAndGive(entries, files); });
-    bench::addRatio({measured + " / realpath and a bare controller", measured, bare, most, 1, 1,
-                     bench::kProcessorTime,
-                     "The bare work is `realpath` for each path, and as many ready rows in one call to an array "
-                     "controller that nothing shows."});
+    bench::addRatio(
+        {measured + " / realpath and a bare controller", measured, bare, most, 1, 1, bench::kProcessorTime,
+         "The bare work is `realpath` for each path, and as many ready rows in one call to an array "
+         "controller that nothing shows."});
 }
 
 void addOpenings()
@@ -155,10 +155,11 @@ void addWindow(const std::string& part, double most, pid_t display)
 {
     addShowing(part, 0, display);
     addShowing(part, kMany, display);
-    bench::addRatio({showing(part, kMany) + " / of 0", showing(part, kMany), showing(part, 0), most, 1, 1,
-                     bench::kProcessorTime,
-                     "From the command to the window that is mapped and drawn, the time of the display's process "
-                     "included. It is the second window of its process."});
+    bench::addRatio(
+        {showing(part, kMany) + " / of 0", showing(part, kMany), showing(part, 0), most, 1, 1,
+         bench::kProcessorTime,
+         "From the command to the window that is mapped and drawn, the time of the display's process "
+         "included. It is the second window of its process."});
 }
 
 // Their paths, one to a line.
@@ -191,9 +192,10 @@ void addPeer(const std::string& name, const std::string& program, double most, p
                                                program + "' '" + fileOfPaths(kMany) + "' " +
                                                std::to_string(display));
                    });
-    bench::addRatio({own + " / " + peer, own, peer, most, 1, 1, bench::kProcessorTime,
-                     "Each in a window of the same size, rows of one height, until it is mapped and drawn. The table "
-                     "alone looks at the disk, for links, and leaves out what comes twice."});
+    bench::addRatio(
+        {own + " / " + peer, own, peer, most, 1, 1, bench::kProcessorTime,
+         "Each in a window of the same size, rows of one height, until it is mapped and drawn. The table "
+         "alone looks at the disk, for links, and leaves out what comes twice."});
 }
 
 void addPeers(pid_t display)
@@ -245,10 +247,11 @@ void addMemory()
         growth(kResident) / (characters * sizeof(wchar_t)), "x", 2.5,
         "What the system counts as resident, the list itself included, less that with an empty History. The "
         "bytes of a path are those in which module and host hand it around, 4 for each character.");
-    bench::addFigure("what the dialog allocates for 100000 of History / bytes of the paths in UTF-8",
-                     growth(kAllocated) / characters, "x", 3.2,
-                     "By the allocator's count, from before the dialog is opened until it shows, less that with an "
-                     "empty History.");
+    bench::addFigure(
+        "what the dialog allocates for 100000 of History / bytes of the paths in UTF-8",
+        growth(kAllocated) / characters, "x", 3.2,
+        "By the allocator's count, from before the dialog is opened until it shows, less that with an "
+        "empty History.");
 }
 } // namespace
 

@@ -1,4 +1,5 @@
-// Files for a History: so many Lisp files, a hundred in each folder, as on a disk that has been used for long.
+// Files for a History: so many Lisp files, a hundred in each folder, as on a disk that has been used for
+// long.
 #pragma once
 
 #include <cstddef>

@@ -28,8 +28,8 @@ private:
     NSOpenPanel* mPanel;
 };
 
-// Registers a benchmark that usually runs `once` so many times; it answers the seconds of what it measures, negative
-// when that went wrong.
+// Registers a benchmark that usually runs `once` so many times; it answers the seconds of what it measures,
+// negative when that went wrong.
 void measure(const std::string& name, int usual, std::function<double()> once);
 
 // Processor time, in a pool of its own: giving back what the work has left behind is part of its cost.

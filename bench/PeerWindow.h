@@ -1,5 +1,6 @@
-// What the programs that show a list by another toolkit have in common: bench_qt_list and bench_gtk_list, each
-// run as PROGRAM FILE DISPLAY, with a file of paths, one to a line, and the process of the display, or 0.
+// What the programs that show a list by another toolkit have in common: bench_qt_list and bench_gtk_list,
+// each run as PROGRAM FILE DISPLAY, with a file of paths, one to a line, and the process of the display, or
+// 0.
 #pragma once
 
 #include <cstdio>

@@ -1,6 +1,5 @@
 #include "bench/ShownWindow.h"
 
-
 #import <AppKit/AppKit.h>
 #import <GNUstepGUI/GSDisplayServer.h>
 
@@ -101,8 +100,7 @@ NSWindow* windowWith(NSView* view)
                                                       backing:NSBackingStoreBuffered
                                                         defer:YES] autorelease];
     [window setReleasedWhenClosed:NO];
-    NSScrollView* scrolled =
-        [[[NSScrollView alloc] initWithFrame:[[window contentView] bounds]] autorelease];
+    NSScrollView* scrolled = [[[NSScrollView alloc] initWithFrame:[[window contentView] bounds]] autorelease];
     [scrolled setHasVerticalScroller:YES];
     [scrolled setDocumentView:view];
     [[window contentView] addSubview:scrolled];

@@ -29,6 +29,9 @@
 // at. Few of many rows ever show, so its strings are made when they are first asked for.
 + (ModrigFilePath*)newWithResolvedPath:(const CStdStr&)path;
 
+// What `unloadable` becomes for the path; asked once, when the row is made.
+- (BOOL)findUnloadable:(const CStdStr&)path;
+
 // `filePathName` as the module's logic takes it.
 - (CStdStr)path;
 

@@ -39,7 +39,7 @@ char* charactersAfter(ModrigFilePath* row)
     mFilePathName = [[path stringByResolvingSymlinksInPath] copy];
     mFileName = [[path lastPathComponent] copy];
     mFilePath = [[path stringByDeletingLastPathComponent] copy];
-    mUnloadable = ModrigUtils::IsAppUnloadAble(ModrigUtils::PathFromString(path));
+    mUnloadable = [self findUnloadable:ModrigUtils::PathFromString(path)];
     return self;
 }
 
@@ -53,8 +53,13 @@ char* charactersAfter(ModrigFilePath* row)
         std::copy(text.begin(), text.end(), charactersAfter(row));
     else
         row->mFilePathName = [ModrigUtils::StringFromPath(path) retain];
-    row->mUnloadable = ModrigUtils::IsAppUnloadAble(path);
+    row->mUnloadable = [row findUnloadable:path];
     return row;
+}
+
+- (BOOL)findUnloadable:(const CStdStr&)path
+{
+    return ModrigUtils::IsAppUnloadAble(path);
 }
 
 - (void)dealloc

@@ -7,8 +7,7 @@
 namespace ModrigUtils
 {
 JoiningRows::JoiningRows(NSArrayController* table)
-    : mTable([table retain]), mRows([[NSMutableArray alloc] init]),
-      mLinks(ModrigPlatform::MakeLinkResolver())
+    : mTable([table retain]), mRows([[NSMutableArray alloc] init]), mLinks(ModrigPlatform::MakeLinkResolver())
 {
     for (ModrigFilePath* row : tsuiEach<ModrigFilePath*>([table arrangedObjects]))
         mKnown.Add([row hash], row);

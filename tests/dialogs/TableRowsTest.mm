@@ -18,13 +18,16 @@ protected:
     void SetUp() override
     {
         DialogTest::SetUp();
-        for (const char* name : {"tool.lsp", "real/tool.lsp", "real/d\u00E9j\u00E0/tool.lsp", "r\xE9" "al/tool.lsp",
+        for (const char* name : {"tool.lsp", "real/tool.lsp", "real/d\u00E9j\u00E0/tool.lsp",
+                                 "r\xE9"
+                                 "al/tool.lsp",
                                  "real/s\u00E9parateur.lsp", "real/odd\xFF.lsp"})
             file(name);
         std::filesystem::create_directory(mFolder / "links");
         link("links/folder", "real");
         link("links/accents", "real/d\u00E9j\u00E0");
-        link("links/bytes", "r\xE9" "al");
+        link("links/bytes", "r\xE9"
+                            "al");
         link("links/file.lsp", "tool.lsp");
         link("real/link.lsp", "tool.lsp");
         link("links/nothing.lsp", "gone.lsp");
@@ -94,8 +97,8 @@ TEST_F(ResolvedLinks, AreFollowedInTheFolderAndInTheFile)
 TEST_F(ResolvedLinks, LeaveAPathAsItIsThatLeadsNowhere)
 {
     expectTheToolkitsAnswers({in(L"/gone.lsp"), in(L"/gone/tool.lsp"), in(L"/links/nothing.lsp"),
-                              in(L"/links/gone/tool.lsp"), in(L"/links/folder/gone.lsp"),
-                              in(L"/links/round"), in(L"/links/round/tool.lsp"), in(L"/tool.lsp/tool.lsp"),
+                              in(L"/links/gone/tool.lsp"), in(L"/links/folder/gone.lsp"), in(L"/links/round"),
+                              in(L"/links/round/tool.lsp"), in(L"/tool.lsp/tool.lsp"),
                               in(L"/" + std::wstring(300, L'x') + L"/tool.lsp"),
                               in(L"/real/" + std::wstring(300, L'x'))});
 }
@@ -144,6 +147,23 @@ TEST_F(JoiningRows, AreMadeFromTheResolvedPath)
     EXPECT_EQ(L"real.zmb", wide([row fileName]));
     EXPECT_EQ(file("real.zmb"), [row path].Text());
     EXPECT_FALSE([row unloadable]);
+}
+
+TEST_F(JoiningRows, KeepTheirPathsWhateverTheCharacters)
+{
+    for (const wchar_t* name : {L"tool.lsp", L"\u00FC \u4E2D \U0001F600.lsp", L"odd\U0010FEFF.lsp"})
+    {
+        const std::wstring path = std::wstring(L"/none/") + name;
+        add({CStdStr(path)});
+        ModrigFilePath* row = [[mTable arrangedObjects] lastObject];
+        ModrigFilePath* twin = [[[ModrigFilePath alloc] initWithFilePathName:text(path)] autorelease];
+        EXPECT_EQ(path, [row path].Text());
+        EXPECT_EQ([twin hash], [row hash]);
+        EXPECT_TRUE([twin isEqual:row]);
+        EXPECT_EQ(path, wide([row filePathName]));
+        EXPECT_EQ(name, wide([row fileName]));
+        EXPECT_EQ(L"/none", wide([row filePath]));
+    }
 }
 
 TEST_F(JoiningRows, StandAfterThoseThatAreThereInTheirOrder)
