@@ -19,15 +19,12 @@ protected:
     {
         DialogTest::SetUp();
         for (const char* name : {"tool.lsp", "real/tool.lsp", "real/d\u00E9j\u00E0/tool.lsp",
-                                 "r\xE9"
-                                 "al/tool.lsp",
-                                 "real/s\u00E9parateur.lsp", "real/odd\xFF.lsp"})
+                                 "r\351al/tool.lsp", "real/s\u00E9parateur.lsp", "real/odd\xFF.lsp"})
             file(name);
         std::filesystem::create_directory(mFolder / "links");
         link("links/folder", "real");
         link("links/accents", "real/d\u00E9j\u00E0");
-        link("links/bytes", "r\xE9"
-                            "al");
+        link("links/bytes", "r\351al");
         link("links/file.lsp", "tool.lsp");
         link("real/link.lsp", "tool.lsp");
         link("links/nothing.lsp", "gone.lsp");
