@@ -4,11 +4,12 @@ import unittest
 
 from support import tables, write_files
 from macos import delegates
-from macos.sources import Sources, selector_of
+from macos.sources import Sources, messages, selector_of
 
-HEADER = """@interface Owner : NSObject <NSTableViewDelegate>
+HEADER = """@interface Owner : NSView <NSTableViewDelegate>
 - (IBAction)onRemove:(id)sender;
 - (void)forget;
++ (Owner*)newOwner;
 @end
 """
 SOURCE = """@implementation Owner
@@ -43,6 +44,23 @@ SOURCE = """@implementation Owner
 {
     return 1;
 }
+- (void)scrollWheel:(NSEvent*)event /* of
+two lines */
+{
+    [super scrollWheel:event];
+    [self isKept:1 of:[@"a[" length] ? nil : [self view]];
+}
+- (NSString*)view:(NSView*)view stringForToolTip:(NSToolTipTag)tag point:(NSPoint)place userData:(void*)data
+{
+    return nil;
+}
++ (void)initialize
+{
+}
++ (Owner*)newOwner
+{
+    return nil;
+}
 @end
 """
 LAYOUT = '<action selector="onRemove:" target="-2" id="1"/>'
@@ -59,22 +77,39 @@ class Delegates(unittest.TestCase):
     def test_methods_that_the_system_or_we_call_pass(self):
         self.assertEqual(self.faults(), [])
 
+    def finds(self, old, new, line, fault):
+        self.assertEqual(self.faults(old, new), [f"Owner.mm:{line}: Owner has {fault}"])
+
     def test_a_misspelt_delegates_method_is_found(self):
-        self.assertEqual(self.faults("shouldSelectRow:", "shouldSelectTheRow:"),
-                         ["Owner.mm: Owner has tableView:shouldSelectTheRow:, which nothing in the system sends"])
+        self.finds("shouldSelectRow:", "shouldSelectTheRow:", 2,
+                   "tableView:shouldSelectTheRow:, which nothing in the system sends")
 
     def test_a_misspelt_method_of_a_data_source_is_found(self):
-        self.assertEqual(self.faults("numberOfRowsInTableView:", "numberOfRowsInTable:"),
-                         ["Owner.mm: Owner has numberOfRowsInTable:, which nobody calls"])
+        self.finds("numberOfRowsInTableView:", "numberOfRowsInTable:", 7, "numberOfRowsInTable:, which nobody calls")
 
     def test_a_misspelt_override_is_found(self):
-        self.assertEqual(self.faults("hash", "hashed"), ["Owner.mm: Owner has hashed, which nobody calls"])
+        self.finds("hash", "hashed", 29, "hashed, which nobody calls")
+
+    def test_any_word_of_a_method_may_be_the_misspelt_one(self):
+        self.finds("userData:", "userDates:", 39, "view:stringForToolTip:point:userDates:, which nobody calls")
+        self.finds("isKept:(NSInteger)row of:", "isKept:(NSInteger)row off:", 11, "isKept:off:, which nobody calls")
+
+    def test_to_send_the_right_one_on_does_not_hide_the_misspelt_one(self):
+        self.finds("scrollWheel:(NSEvent*)event ", "scrollWheel:(NSEvent*)event more:(BOOL)more ", 33,
+                   "scrollWheel:more:, which nobody calls")
+
+    def test_a_misspelt_method_of_the_class_is_found(self):
+        self.finds("+ (void)initialize", "+ (void)initialise", 43, "the class's method initialise, which nobody calls")
 
     def test_a_method_that_only_a_comment_calls_is_found(self):
-        self.assertEqual(self.faults("- (void)forget\n", "- (void)unused\n"), ["Owner.mm: Owner has unused, which nobody calls"])
+        self.finds("- (void)forget\n", "- (void)unused\n", 15, "unused, which nobody calls")
 
     def test_an_action_that_no_layout_sends_is_found(self):
-        self.assertEqual(self.faults(layout=""), ["Owner.mm: Owner has onRemove:, which nobody calls"])
+        self.assertEqual(self.faults(layout=""), ["Owner.mm:22: Owner has onRemove:, which nobody calls"])
+
+    def test_messages_are_read_however_they_stand_in_each_other(self):
+        text = "[[a b] c:[d[1] e] d:NS::kOne ? x : y]; f([=] { return [g h]; }); \"[i j]\"; '['"
+        self.assertEqual(sorted(messages(text)), [("()", "c:d:"), ("1", "1"), ("=", "="), ("a", "b"), ("d", "e"), ("g", "h")])
 
     def test_selectors_are_read_from_declarations(self):
         self.assertEqual(selector_of(" (void)show"), "show")

@@ -15,11 +15,18 @@ def faults(sources, tables):
     for entry in sources.classes.values():
         ours, system = sources.lineage(entry.name)
         contracts = set().union(*(one.protocols for one in ours)) if ours else entry.protocols
-        for selector, file in entry.implemented.items():
-            known = selector in KNOWN or (system in tables.classes and tables.answers(system, selector, False))
-            if known or selector in sent or any(selector in sources.protocols.get(name, ()) for name in contracts):
+        sent_to_it = sent.union(*(sources.protocols.get(name, ()) for name in contracts), KNOWN)
+        for selector, place in entry.implemented.items():
+            if selector in sent_to_it or answers(tables, system, selector, False):
                 continue
             if SENDERS.match(selector):
-                yield f"{file.name}: {entry.name} has {selector}, which nothing in the system sends"
-            elif selector.split(":")[0] not in sources.called and selector not in sources.called:
-                yield f"{file.name}: {entry.name} has {selector}, which nobody calls"
+                yield f"{place}: {entry.name} has {selector}, which nothing in the system sends"
+            elif selector not in sources.called:
+                yield f"{place}: {entry.name} has {selector}, which nobody calls"
+        for selector, place in entry.of_class.items():
+            if selector not in entry.offered | sources.called and not answers(tables, system, selector, True):
+                yield f"{place}: {entry.name} has the class's method {selector}, which nobody calls"
+
+
+def answers(tables, name, selector, of_class):
+    return name in tables.classes and tables.answers(name, selector, of_class)
