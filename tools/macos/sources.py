@@ -148,9 +148,11 @@ class Sources:
 
     def _read_implementation(self, file, line, name, body):
         entry = self._class(name)
-        for sign, selector, _, start in methods_in(body, "{"):
+        for sign, selector, result, start in methods_in(body, "{"):
             where = f"{named(file)}:{line + body[:start].count(chr(10))}"
             (entry.implemented if sign == "-" else entry.of_class)[selector] = where
+            if sign == "-":
+                entry.declared.setdefault(selector, result)
 
     def lineage(self, name):
         """Our classes from this one upward, and the first that is the system's."""
