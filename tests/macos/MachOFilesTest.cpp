@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <cstddef>
 #include <cstring>
 #include <filesystem>
 #include <fstream>
@@ -102,7 +103,32 @@ TEST(MachOFiles, AFileThatEndsInItsHeadersIsRefused)
     const std::size_t headers = sizeof(mach_header_64) + headerOf(whole).sizeofcmds;
     for (std::size_t size = 0; size < headers; ++size)
         ASSERT_NE(refusal(cutTo(whole, size)), L"") << size;
-    EXPECT_EQ(refusal(cutTo(whole, headers)), L"");
+    EXPECT_EQ(refusal(cutTo(whole, headers)), L"the file is cut short");
+}
+
+TEST(MachOFiles, AFileThatHasLostAnythingOfItsEndIsRefused)
+{
+    const Bytes whole = bytesOf(kBuild / "x86_64/samples/primes.zmb");
+    for (const std::size_t lost : {std::size_t{1}, whole.size() / 3, whole.size() / 2})
+        EXPECT_EQ(refusal(cutTo(whole, whole.size() - lost)), L"the file is cut short") << lost;
+}
+
+TEST(MachOFiles, HeadersThatContradictThemselvesAreRefused)
+{
+    const Bytes whole = bytesOf(kBuild / "x86_64/samples/primes.zmb");
+    // The first command is a segment's: it may not end before itself, nor after all commands.
+    for (const std::uint32_t size : {0U, 7U, 8U, 71U, headerOf(whole).sizeofcmds + 1})
+    {
+        Bytes changed = whole;
+        std::memcpy(changed.data() + sizeof(mach_header_64) + offsetof(load_command, cmdsize), &size,
+                    sizeof size);
+        EXPECT_EQ(refusal(changed), L"its program headers are damaged") << size;
+    }
+    Bytes more = whole;
+    mach_header_64 header = headerOf(whole);
+    ++header.ncmds;
+    std::memcpy(more.data(), &header, sizeof header);
+    EXPECT_EQ(refusal(more), L"its program headers are damaged");
 }
 
 TEST(MachOFiles, AUniversalFileThatEndsBeforeItsHalvesDoIsRefused)
