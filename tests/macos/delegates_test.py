@@ -67,9 +67,9 @@ LAYOUT = '<action selector="onRemove:" target="-2" id="1"/>'
 
 
 class Delegates(unittest.TestCase):
-    def faults(self, old="", new="", layout=LAYOUT):
+    def faults(self, old="", new="", layout=LAYOUT, header=HEADER):
         self.assertIn(old, SOURCE)
-        texts = {"Owner.h": HEADER, "Owner.mm": SOURCE.replace(old, new, 1) if old else SOURCE, "Owner.xib": layout}
+        texts = {"Owner.h": header, "Owner.mm": SOURCE.replace(old, new, 1) if old else SOURCE, "Owner.xib": layout}
         with tempfile.TemporaryDirectory() as folder:
             header, source, xib = write_files(folder, texts)
             return list(delegates.faults(Sources([header, source], layouts=[xib]), tables()))
@@ -101,8 +101,17 @@ class Delegates(unittest.TestCase):
     def test_a_misspelt_method_of_the_class_is_found(self):
         self.finds("+ (void)initialize", "+ (void)initialise", 43, "the class's method initialise, which nobody calls")
 
+    def test_a_method_that_no_source_for_this_system_has_is_found(self):
+        promise = "- (void)forget;\n"
+        header = HEADER.replace(promise, promise + "- (BOOL)isKept:(NSInteger)row;\n+ (void)loadAll;\n") + \
+            "@interface NSObject (Rows)\n- (BOOL)isKept:(NSInteger)row of:(NSTableView*)table;\n- (void)sortRows;\n@end\n"
+        self.assertEqual(self.faults(header=header),
+                         ["Owner.h:4: Owner promises isKept:, which no source for macOS has",
+                          "Owner.h:5: Owner promises loadAll, which no source for macOS has",
+                          "Owner.h:10: NSObject promises sortRows, which no source for macOS has"])
+
     def test_a_method_that_only_a_comment_calls_is_found(self):
-        self.finds("- (void)forget\n", "- (void)unused\n", 15, "unused, which nobody calls")
+        self.finds("[self forget]", "// [self forget]", 15, "forget, which nobody calls")
 
     def test_an_action_that_no_layout_sends_is_found(self):
         self.assertEqual(self.faults(layout=""), ["Owner.mm:22: Owner has onRemove:, which nobody calls"])

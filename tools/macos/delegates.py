@@ -24,8 +24,20 @@ def faults(sources, tables):
             elif selector not in sources.called:
                 yield f"{place}: {entry.name} has {selector}, which nobody calls"
         for selector, place in entry.of_class.items():
-            if selector not in entry.offered | sources.called and not answers(tables, system, selector, True):
+            known = ("+", selector) in entry.promised or selector in sources.called
+            if not known and not answers(tables, system, selector, True):
                 yield f"{place}: {entry.name} has the class's method {selector}, which nobody calls"
+        # What any object may be asked is for those to answer that do.
+        keepers = sources.classes.values() if entry.name in tables.classes else (entry, *ours)
+        yield from broken_promises(entry, keepers, system, tables)
+
+
+def broken_promises(entry, keepers, system, tables):
+    """What an interface says and no source for this system does: a compiler looks only at interfaces of what it compiles."""
+    for (sign, selector), place in entry.promised.items():
+        done = any(selector in (one.implemented if sign == "-" else one.of_class) for one in keepers)
+        if not done and not answers(tables, system, selector, sign == "+"):
+            yield f"{place}: {entry.name} promises {selector}, which no source for macOS has"
 
 
 def answers(tables, name, selector, of_class):

@@ -27,8 +27,8 @@ class OurClass:
     outlets: dict = field(default_factory=dict)  # name -> class
     declared: dict = field(default_factory=dict)  # selector of a method -> type of what it answers
     implemented: dict = field(default_factory=dict)  # selector -> file and line
-    offered: set = field(default_factory=set)  # selectors of the class's own methods in its interface
-    of_class: dict = field(default_factory=dict)  # selector of one of those -> file and line
+    of_class: dict = field(default_factory=dict)  # selector of one of the class's own methods -> file and line
+    promised: dict = field(default_factory=dict)  # (sign, selector) of a method in an interface -> file and line
     actions: set = field(default_factory=set)
 
 
@@ -107,7 +107,7 @@ class Sources:
             for found in PROTOCOL.finditer(text):
                 self.protocols[found.group(1)] = {selector for _, selector, _, _ in methods_in(found.group(3), ";")}
             for found in INTERFACE.finditer(text):
-                self._read_interface(*found.group(1, 3, 4, 5))
+                self._read_interface(file, text[:found.start(5)].count("\n") + 1, *found.group(1, 3, 4, 5))
             for found in IMPLEMENTATION.finditer(text):
                 self._read_implementation(file, text[:found.start(2)].count("\n") + 1, *found.groups())
         for file in (*files, *others):
@@ -129,16 +129,15 @@ class Sources:
         self.called |= {selector for _, selector in sent}
         self._call(*(name for groups in SPOKEN_OF.findall(text) for name in groups))
 
-    def _read_interface(self, name, parent, protocols, body):
+    def _read_interface(self, file, line, name, parent, protocols, body):
         entry = self._class(name)
         entry.parent = entry.parent or parent or ""
         entry.protocols |= {word.strip() for word in (protocols or "").split(",") if word.strip()}
         entry.outlets |= {outlet: kind for kind, outlet in OUTLET.findall(body)}
-        for sign, selector, result, _ in methods_in(body, ";"):
+        for sign, selector, result, start in methods_in(body, ";"):
+            entry.promised.setdefault((sign, selector), f"{named(file)}:{line + body[:start].count(chr(10))}")
             if sign == "-":
                 entry.declared[selector] = result
-            else:
-                entry.offered.add(selector)
             if result == "IBAction":
                 entry.actions.add(selector)
         for attributes, kind, prop in PROPERTY.findall(body):
