@@ -3,8 +3,8 @@ import tempfile
 import unittest
 
 from support import tables, write_files
-from macos import delegates
-from macos.sources import Sources, messages, selector_of
+from macos import delegates, ways
+from macos.sources import Sources, messages, selector_of, types_in
 
 HEADER = """@interface Owner : NSView <NSTableViewDelegate>
 - (IBAction)onRemove:(id)sender;
@@ -97,6 +97,20 @@ class Delegates(unittest.TestCase):
     def test_to_send_the_right_one_on_does_not_hide_the_misspelt_one(self):
         self.finds("scrollWheel:(NSEvent*)event ", "scrollWheel:(NSEvent*)event more:(BOOL)more ", 33,
                    "scrollWheel:more:, which nobody calls")
+
+    def test_other_types_than_the_system_expects_are_found(self):
+        self.finds("- (BOOL)tableView:", "- (NSInteger)tableView:", 2,
+                   "tableView:shouldSelectRow: with other types than the system's")
+        self.finds("shouldSelectRow:(NSInteger)row", "shouldSelectRow:(NSNumber*)row", 2,
+                   "tableView:shouldSelectRow: with other types than the system's")
+        self.finds("point:(NSPoint)place", "point:(NSPoint*)place", 39,
+                   "view:stringForToolTip:point:userData: with other types than the system's")
+        self.finds("- (NSUInteger)hash", "- (NSString*)hash", 29, "hash with other types than the system's")
+
+    def test_types_are_read_from_declarations(self):
+        self.assertEqual(types_in(" (void)do:(void (^)(int a, id b))it with:(id<Some>)other"), ["void", "void (^)(int a, id b)", "id<Some>"])
+        self.assertEqual(ways.of_written(["void", "void (^)(int a)", "id<Some>", "const NSRect", "NSTableViewDropOperation", "CGFloat"]),
+                         ["void", "address", "address", "structure", "number", "floating"])
 
     def test_a_misspelt_method_of_the_class_is_found(self):
         self.finds("+ (void)initialize", "+ (void)initialise", 43, "the class's method initialise, which nobody calls")

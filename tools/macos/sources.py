@@ -27,6 +27,7 @@ class OurClass:
     outlets: dict = field(default_factory=dict)  # name -> class
     declared: dict = field(default_factory=dict)  # selector of a method -> type of what it answers
     implemented: dict = field(default_factory=dict)  # selector -> file and line
+    types: dict = field(default_factory=dict)  # selector of a method -> types of what it answers and is given
     of_class: dict = field(default_factory=dict)  # selector of one of the class's own methods -> file and line
     promised: dict = field(default_factory=dict)  # (sign, selector) of a method in an interface -> file and line
     actions: set = field(default_factory=set)
@@ -85,11 +86,24 @@ def selector_of(declaration):
     return "".join(f"{part}:" for part in parts) if parts else words.split()[0]
 
 
+def types_in(declaration):
+    """What stands in parentheses: the type of what a method answers, and of what it is given."""
+    depth, types = 0, []
+    for letter in declaration:
+        depth -= letter == ")"
+        if depth > 0:
+            types[-1] += letter
+        elif letter == "(":
+            types.append("")
+        depth += letter == "("
+    return [kind.strip() for kind in types]
+
+
 def methods_in(text, end):
-    """(sign, selector, type of what it answers, where) of each method in a class. `end`: what a method's head ends with."""
+    """(sign, selector, types, where) of each method in a class. `end`: what a method's head ends with."""
     for start in METHOD.finditer(text):
         head = text[start.start() + 1:text.index(end, start.end())]
-        yield start.group(1), selector_of(head), head[head.index("(") + 1:head.index(")")].strip(), start.start()
+        yield start.group(1), selector_of(head), types_in(head), start.start()
 
 
 def setter(name):
@@ -134,7 +148,7 @@ class Sources:
         entry.parent = entry.parent or parent or ""
         entry.protocols |= {word.strip() for word in (protocols or "").split(",") if word.strip()}
         entry.outlets |= {outlet: kind for kind, outlet in OUTLET.findall(body)}
-        for sign, selector, result, start in methods_in(body, ";"):
+        for sign, selector, (result, *_), start in methods_in(body, ";"):
             entry.promised.setdefault((sign, selector), f"{named(file)}:{line + body[:start].count(chr(10))}")
             if sign == "-":
                 entry.declared[selector] = result
@@ -147,11 +161,12 @@ class Sources:
 
     def _read_implementation(self, file, line, name, body):
         entry = self._class(name)
-        for sign, selector, result, start in methods_in(body, "{"):
+        for sign, selector, types, start in methods_in(body, "{"):
             where = f"{named(file)}:{line + body[:start].count(chr(10))}"
             (entry.implemented if sign == "-" else entry.of_class)[selector] = where
             if sign == "-":
-                entry.declared.setdefault(selector, result)
+                entry.declared.setdefault(selector, types[0])
+                entry.types[selector] = types
 
     def lineage(self, name):
         """Our classes from this one upward, and the first that is the system's."""
