@@ -107,6 +107,10 @@ class Delegates(unittest.TestCase):
                    "view:stringForToolTip:point:userData: with other types than the system's")
         self.finds("- (NSUInteger)hash", "- (NSString*)hash", 29, "hash with other types than the system's")
 
+    def test_a_method_of_ours_may_be_called_like_one_of_a_protocol(self):
+        self.assertIn("load:", {method.selector for method in tables().protocols["CIPlugInRegistration"].methods})
+        self.assertEqual(self.faults("- (void)forget\n", "- (void)load:(id)what\n{\n    [self load:what];\n}\n- (void)forget\n"), [])
+
     def test_types_are_read_from_declarations(self):
         self.assertEqual(types_in(" (void)do:(void (^)(int a, id b))it with:(id<Some>)other"), ["void", "void (^)(int a, id b)", "id<Some>"])
         self.assertEqual(ways.of_written(["void", "void (^)(int a)", "id<Some>", "const NSRect", "NSTableViewDropOperation", "CGFloat"]),

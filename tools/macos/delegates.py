@@ -44,7 +44,10 @@ class Delegates:
 
     def _types(self, entry, system):
         for selector, place in entry.implemented.items():
-            known = [*self._sent.get(selector, ()), *self._known_to(system).get(selector, ())]
+            # What we send ourselves may only happen to be called like something in a protocol.
+            known = [*self._known_to(system).get(selector, ())]
+            if SENDERS.match(selector) or selector not in self._sources.called:
+                known += self._sent.get(selector, ())
             if known and ways.of_written(entry.types[selector]) not in map(ways.of_signature, known):
                 yield f"{place}: {entry.name} has {selector} with other types than the system's"
 
