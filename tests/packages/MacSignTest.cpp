@@ -16,15 +16,15 @@ class MacSign : public testing::Test
 protected:
     MacSign()
     {
-        for (const char* file :
-             {"MacOS/Tessel", "MacOS/libtessel.dylib", "MacOS/tesselc", "PlugIns/A.bundle/Contents/MacOS/A",
-              "PlugIns/A.reg", "Resources/icon"})
+        for (const char* file : {"MacOS/Tessel", "MacOS/libtessel.dylib", "MacOS/tesselc",
+                                 "PlugIns/A.bundle/Contents/MacOS/A", "PlugIns/A.reg", "Resources/icon"})
         {
             fs::create_directories((app() / file).parent_path());
             folder.write("Tessel.app/Contents/" + std::string(file), "");
         }
         fs::create_directories(folder / "bin");
-        codesign("echo \"$@\" | sed -e 's|" + folder.path().string() + "/||' -e 's|/[^ ]*/packaging/tessel.entitlements |entitled |'");
+        codesign("echo \"$@\" | sed -e 's|" + folder.path().string() +
+                 "/||' -e 's|/[^ ]*/packaging/tessel.entitlements |entitled |'");
     }
 
     fs::path app() const { return folder / "Tessel.app/Contents"; }
@@ -55,9 +55,10 @@ TEST_F(MacSign, WithAnIdentityProgramsMayLoadWhatOthersHaveSigned)
 {
     const std::string by = "--force --sign Some One --timestamp --options runtime ";
     EXPECT_EQ(sign("Tessel.app 'Some One'").output,
-              by + "Tessel.app/Contents/PlugIns/A.bundle\n" + by + "Tessel.app/Contents/PlugIns/A.reg\n" + by +
-                  "Tessel.app/Contents/MacOS/libtessel.dylib\n" + by +
-                  "--entitlements entitled Tessel.app/Contents/MacOS/tesselc\n" + by + "--entitlements entitled Tessel.app\n");
+              by + "Tessel.app/Contents/PlugIns/A.bundle\n" + by + "Tessel.app/Contents/PlugIns/A.reg\n" +
+                  by + "Tessel.app/Contents/MacOS/libtessel.dylib\n" + by +
+                  "--entitlements entitled Tessel.app/Contents/MacOS/tesselc\n" + by +
+                  "--entitlements entitled Tessel.app\n");
 }
 
 TEST_F(MacSign, EndsWithTheFirstThatCannotBeSigned)
@@ -73,5 +74,6 @@ TEST_F(MacSign, SaysWhatItCannotSign)
 {
     EXPECT_EQ(sign("bin").output, "bin is no application and no bundle for macOS.\n");
     fs::remove(folder / "bin/codesign");
-    EXPECT_EQ(sign("Tessel.app").output, "There is no codesign here: it comes with Apple's developer tools.\n");
+    EXPECT_EQ(sign("Tessel.app").output,
+              "There is no codesign here: it comes with Apple's developer tools.\n");
 }
