@@ -7,6 +7,7 @@
 #include <cstring>
 #include <filesystem>
 #include <fstream>
+#include <initializer_list>
 #include <iterator>
 #include <string>
 #include <vector>
@@ -138,6 +139,51 @@ TEST(MachOFiles, AUniversalFileThatEndsBeforeItsHalvesDoIsRefused)
     EXPECT_EQ(refusal(cutTo(whole, 0)), L"it is not a shared library");
     EXPECT_EQ(refusal(cutTo(whole, 6)), L"the file is cut short");
     EXPECT_EQ(refusal(cutTo(whole, half / 2)), L"the file is cut short");
+}
+
+TEST(MachOFiles, AUniversalFileIsWhatItsHalfForThisProcessorIs)
+{
+    const Bytes whole = bytesOf(kBuild / "universal/samples/primes.zmb");
+    // The table of the halves, most significant byte first: a processor, what kind of it, a place, a size.
+    constexpr std::size_t kCount = 4;
+    constexpr std::size_t kTable = 8;
+    constexpr std::size_t kEntry = 20;
+    const auto with = [&](std::size_t place, std::initializer_list<int> bytes)
+    {
+        Bytes changed = whole;
+        std::transform(bytes.begin(), bytes.end(), changed.begin() + static_cast<std::ptrdiff_t>(place),
+                       [](int byte) { return static_cast<char>(byte); });
+        return changed;
+    };
+    // Which of the two is ours is the linker's to choose: both are given another processor, then each
+    // other's.
+    Bytes foreign = with(kTable, {0, 0, 0, 18});
+    std::copy_n(foreign.begin() + kTable, 4, foreign.begin() + kTable + kEntry);
+    EXPECT_EQ(refusal(foreign), L"it is built for another kind of processor");
+    Bytes exchanged = whole;
+    std::swap_ranges(exchanged.begin() + kTable, exchanged.begin() + kTable + 4,
+                     exchanged.begin() + kTable + kEntry);
+    EXPECT_EQ(refusal(exchanged), L"it is built for another kind of processor");
+    EXPECT_EQ(refusal(with(kCount, {0, 0, 0, 0})), L"it is built for another kind of processor");
+    EXPECT_EQ(refusal(with(kCount, {0, 0, 0, 33})), L"it is not a shared library");
+}
+
+TEST(MachOFiles, AFileOfAnotherKindIsRefused)
+{
+    const Bytes whole = bytesOf(kBuild / "x86_64/samples/primes.zmb");
+    constexpr std::uint32_t kCore = 4;
+    constexpr std::uint32_t kDebuggingSymbols = 10;
+    for (const std::uint32_t kind : {0U, 1U, kCore, kDebuggingSymbols, 0xFFFFFFFFU})
+    {
+        mach_header_64 header = headerOf(whole);
+        header.filetype = kind;
+        Bytes changed = whole;
+        std::memcpy(changed.data(), &header, sizeof header);
+        EXPECT_EQ(refusal(changed), L"it is not a shared library") << kind;
+    }
+    Bytes old = whole;
+    old[0] = '\xCE'; // a file for processors of 32 bits
+    EXPECT_EQ(refusal(old), L"it is not a shared library");
 }
 
 TEST(MachOFiles, TheVersionOfTheSdkIsReadFromEitherKindOfFile)
