@@ -12,6 +12,7 @@ from support import BUILD, ROOT
 
 ICONUTIL = ROOT / "tools/macos/bin/iconutil"
 IBTOOL = ROOT / "tools/macos/bin/ibtool"
+RUNS_PROGRAM = ROOT / "tools/macos/bin/runs_program"
 LAYOUT = '<document type="com.apple.InterfaceBuilder3.Cocoa.XIB"><objects/></document>'
 
 
@@ -84,6 +85,24 @@ class WithoutABuild(unittest.TestCase):
         for part in ("binaries", "descriptions"):
             self.assertEqual(self.said(part), (1, "Nothing has been built for macOS yet: tools/check_macos build-arm64 build-x86_64 "
                                                "does it.\n"))
+
+
+class RunsProgram(unittest.TestCase):
+    def run_program(self, program, *words):
+        with tempfile.TemporaryDirectory() as folder:
+            source, result = Path(folder) / "a.lsp", Path(folder) / "a.qbc"
+            source.write_text("(+ 1 2)", encoding="utf-8")
+            done = subprocess.run([RUNS_PROGRAM, program, source, *words, "-o", result], capture_output=True, text=True, check=False)
+            return done.returncode, result.exists()
+
+    def test_the_compiler_of_lisp_makes_a_file(self):
+        self.assertEqual(self.run_program("/build/Tessel.app/Contents/MacOS/tesselc"), (0, True))
+
+    def test_another_program_is_not_run(self):
+        self.assertEqual(self.run_program("/build/tests/unit_tests"), (1, False))
+
+    def test_a_word_that_the_compiler_does_not_take_is_refused(self):
+        self.assertEqual(self.run_program("/build/tesselc", "--fast"), (2, False))
 
 
 if __name__ == "__main__":
