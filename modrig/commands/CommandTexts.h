@@ -30,4 +30,5 @@ inline constexpr unsigned kLaidDown = 160;         // name of the list, file
 inline constexpr unsigned kOtherSessionRuns = 161; // name of the list
 inline constexpr unsigned kModrigStays = 162;      // name of the list
 inline constexpr unsigned kModrigIsOut = 163;
+inline constexpr unsigned kListNotRead = 164; // name of the list, the host's sentences
 } // namespace ModrigMessages

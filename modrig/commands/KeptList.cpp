@@ -3,6 +3,7 @@
 #include <wincompat/winfile.h>
 
 #include <algorithm>
+#include <cwchar>
 #include <string>
 
 #include "modrig/base/SplitPath.h"
@@ -21,6 +22,7 @@ namespace
 {
 constexpr std::size_t kLongestPath = 1023; // what can be read back
 constexpr std::size_t kPlaceSize = 1024;
+constexpr std::size_t kReasonSize = 8192;
 
 CStdStr Decimal(std::size_t number)
 {
@@ -97,6 +99,29 @@ CStdStr LaidDownInstead(const CStdStr& key, const CStdStr& name, const CStdStr& 
     const bool isTheSame = ReadModrigRegString(HKEY_CURRENT_USER, key, name, counts) && counts == data;
     return laidDown && !isTheSame ? CStdStr(std::wstring(place)) : CStdStr();
 }
+// What the host says of a value that it may have missed; empty when it is what was read.
+CStdStr WhyMissed(const CStdStr& key, const CStdStr& name)
+{
+    wchar_t reason[kReasonSize] = {};
+    const bool mayBeMissed = tsRegMayHaveMissed(key.c_str(), name.c_str(), reason, kReasonSize);
+    return mayBeMissed ? CStdStr(std::wstring(reason)) : CStdStr();
+}
+
+// A list ends at its first gap, and what cannot be read looks like one.
+CStdStr WhyMissed(const StoredListNames& names)
+{
+    const CStdStr key = SubKeyOf(names);
+    CStdStr value;
+    CStdStr missed = WhyMissed(key, CStdStr(names.count));
+    bool isThere = ReadModrigRegString(HKEY_CURRENT_USER, key, CStdStr(names.count), value);
+    const long count = std::wcstol(value.c_str(), nullptr, 10);
+    for (long number = 1; missed.IsEmpty() && isThere && number <= count; ++number)
+    {
+        missed = WhyMissed(key, EntryName(names, number));
+        isThere = ReadModrigRegString(HKEY_CURRENT_USER, key, EntryName(names, number), value);
+    }
+    return missed;
+}
 } // namespace
 
 const KeptList& KeptStartupSuite()
@@ -129,9 +154,13 @@ const KeptList& KeptHistory()
     return list;
 }
 
-void ReadKept(const KeptList& list)
+CStdStr ReadKept(const KeptList& list)
 {
     ReadStoredList(list.names, list.files, [](const CStdStr&) {});
+    const CStdStr missed = WhyMissed(list.names);
+    return missed.IsEmpty() ? missed
+                            : CStdStr::Formatted(ModrigMessages::kListNotRead,
+                                                 CStdStr::OfId(list.nameText).c_str(), missed.c_str());
 }
 
 Change AddFiles(const KeptList& list, const std::vector<CStdStr>& typed)

@@ -146,11 +146,13 @@ void Run(const KeptList& list)
 {
     const CTemporaryResourceOverride texts(CTemporaryResourceOverride::m_hInstanceDefault);
     const Request request = RequestOf(TypedArguments());
-    ReadKept(list);
+    const CStdStr unread = ReadKept(list);
     const Texts before(list.files.begin(), list.files.end());
     const auto change = Apply(list, request);
     if (!change)
         return tsedFailCommand(nullptr);
+    if (!unread.IsEmpty())
+        return tsedFailCommand(unread.c_str());
     if (!change->refused.IsEmpty())
         return tsedFailCommand(change->refused.c_str());
     bool modrigWaits = false;

@@ -38,6 +38,7 @@ protected:
         ModuleTest::SetUp();
         host().resources.addModule(kTexts, {{ModrigMessages::kHistoryName, L"the History"},
                                             {ModrigMessages::kStartupSuiteName, L"the Suite"},
+                                            {ModrigMessages::kListNotRead, L"unread: %s. %s"},
                                             {ModrigMessages::kListNotStored, L"not stored"},
                                             {ModrigMessages::kManyRemovedFromHistory, L"%s removed"},
                                             {ModrigMessages::kManyRemovedFromSuite, L"%s taken out"},
@@ -161,4 +162,17 @@ TEST_F(ListCommandsWithoutHost, WriteNoRecordThatIsAsItShouldBe)
     RecordModrig(kAtStart | kOnCommand);
     EXPECT_TRUE(host().commands.type(L"SUITE REMOVE /a.lsp"));
     EXPECT_THAT(host().applicationRecords.writes, IsEmpty());
+}
+
+TEST_F(ListCommandsWithoutHost, DisturbNobodyAndStoreNothingWhereTheListCannotBeRead)
+{
+    RecordModrig(kAtStart | kOnCommand);
+    host().linker.setLoaded(kModrig);
+    host().registry.whyUnreadable = L"It is torn.";
+    EXPECT_FALSE(host().commands.type(L"SUITE CLEAR"));
+    EXPECT_THAT(host().commands.failure, Optional(std::wstring(L"unread: the Suite. It is torn.")));
+    EXPECT_THAT(Stored(kStoredStartupSuite), ElementsAre(L"/a.lsp", L"/b.lsp"));
+    EXPECT_THAT(host().linker.calls, IsEmpty());
+    EXPECT_EQ(Recorded(), kAtStart | kOnCommand);
+    EXPECT_THAT(lines(), IsEmpty());
 }
