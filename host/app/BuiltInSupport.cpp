@@ -5,7 +5,7 @@
 
 #include "host/app/Parts.h"
 #include "host/commands/CommandTexts.h"
-#include "host/platform/HomeFolder.h"
+#include "host/files/TypedPath.h"
 #include "host/text/Translation.h"
 
 namespace tessel
@@ -52,10 +52,7 @@ Failure wrongUsage(const Parts& parts, const std::wstring& command)
 
 std::filesystem::path typedPath(const std::wstring& typed)
 {
-    std::error_code unreachable;
-    const std::filesystem::path path = toPath(typed);
-    return std::filesystem::exists(path, unreachable) ? path
-                                                      : std::filesystem::path(withHomeFolder(path.native()));
+    return withTilde(toPath(typed));
 }
 
 Result<std::wstring> onlyFile(const Parts& parts, const std::wstring& command,

@@ -39,6 +39,16 @@ Result<> callHandler(const TsEdCommand& command, const CommandStack::Arguments& 
     return Failure{typed.failure->empty() ? usageText(command.localName, command.usage) : *typed.failure};
 }
 
+CommandStack::Arguments takeTexts(TsResultBuffer* list)
+{
+    CommandStack::Arguments texts;
+    for (const TsResultBuffer* value = list; value; value = value->next)
+        if (value->type == TS_STRING && value->value.string)
+            texts.emplace_back(value->value.string);
+    tsutRelRb(list);
+    return texts;
+}
+
 // What runs here may come from anybody's application: whatever it throws ends with the command.
 Result<> call(const TsEdCommand& command, const CommandStack::Arguments& arguments, CallingApplication& calls)
 {
@@ -87,6 +97,25 @@ Result<> CommandRunner::runParts(const CommandStack::Arguments& parts) const
     if (const CommandStack::Command command = findOrLoad(parts.front()))
         return call(*command, CommandStack::Arguments(parts.begin() + 1, parts.end()), mCalls);
     return unknown(parts.front());
+}
+
+CommandStack::Arguments CommandRunner::entries(const CommandStack::Arguments& parts) const
+{
+    const CommandStack::Command command = findOrLoad(parts.front());
+    if (!command || !command->entries)
+        return {};
+    const CommandStack::Arguments arguments(parts.begin() + 1, parts.end());
+    CommandCall typed{arguments};
+    const CallingApplication::Scope calling(mCalls, command->owner, RunningMarker::Deed::kCommand,
+                                            command->localName, &typed);
+    try
+    {
+        return takeTexts(command->entries());
+    }
+    catch (...) // nobody asked for more than a help with typing
+    {
+        return {};
+    }
 }
 
 Failure CommandRunner::unknown(const std::wstring& typedName) const

@@ -36,6 +36,10 @@ public:
     // out of here.
     bool run(std::wstring_view line);
 
+    // What there is to name as an argument of the command in the first part, after the others: what its
+    // application offers (`tsedOfferEntries`), which is loaded for that.
+    CommandStack::Arguments entries(const CommandStack::Arguments& parts) const;
+
 private:
     CommandStack::Command findOrLoad(const std::wstring& typedName) const;
     Failure unknown(const std::wstring& typedName) const;

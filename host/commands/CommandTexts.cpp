@@ -15,6 +15,35 @@ constexpr auto kApplications = Sentence(L"Applications");
 constexpr auto kSettings = Sentence(L"Settings");
 constexpr auto kNothing = Sentence<>(L"");
 constexpr std::wstring_view kBetweenWays = L" | ";
+
+// What stands for something in the usage of an application, too.
+constexpr Sentence<> kThings[] = {Sentence(L"command"), Sentence(L"entry"), Sentence(L"file"),
+                                  Sentence(L"folder"),  Sentence(L"key"),   Sentence(L"place"),
+                                  Sentence(L"variable")};
+
+std::wstring wordInPersonsLanguage(const std::wstring& word)
+{
+    const auto* known = std::ranges::find(kThings, word, &Sentence<>::english);
+    return known == std::end(kThings) ? word : translated(*known);
+}
+
+// Translators know the host's own ones whole.
+std::wstring usageInPersonsLanguage(const std::wstring& usage)
+{
+    const std::wstring whole = translateAndFill(usage.c_str(), {});
+    if (whole != usage)
+        return whole;
+    std::wstring result;
+    for (std::size_t at = 0; at < usage.size();)
+    {
+        const std::size_t end = usage.find_first_not_of(L"abcdefghijklmnopqrstuvwxyz", at);
+        result += wordInPersonsLanguage(usage.substr(at, end - at));
+        at = std::min(end, usage.size());
+        if (at < usage.size())
+            result += usage[at++];
+    }
+    return result;
+}
 } // namespace
 
 const std::vector<CommandText>& commandTexts()
@@ -75,7 +104,7 @@ std::vector<std::wstring> usageLines(const std::wstring& name, std::wstring_view
 {
     const std::wstring label = translated(L"Usage: ");
     std::vector<std::wstring> lines;
-    for (const auto& way : waysOfTyping(translateAndFill(std::wstring(usage).c_str(), {})))
+    for (const auto& way : waysOfTyping(usageInPersonsLanguage(std::wstring(usage))))
     {
         std::wstring& line =
             lines.emplace_back(lines.empty() ? label : std::wstring(displayWidth(label), L' '));

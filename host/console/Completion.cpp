@@ -165,6 +165,35 @@ std::optional<Completion> completePath(const OpenPart& typed, const Notation& no
     return result;
 }
 
+std::wstring_view nameOfFile(std::wstring_view path)
+{
+    return path.substr(path.rfind(L'/') + 1);
+}
+
+// Entries are whole paths. Who types no folder may mean a file by its name; then several have nothing in
+// common that could take the place of what is typed.
+std::optional<Completion> completeEntry(const OpenPart& typed, Names entries)
+{
+    const bool byName = typed.text.find(L'/') == typed.text.npos;
+    std::erase_if(entries,
+                  [&](const std::wstring& entry)
+                  {
+                      return !beginsWith(entry, typed.text, false) &&
+                             !(byName && beginsWith(std::wstring(nameOfFile(entry)), typed.text, false));
+                  });
+    if (entries.empty())
+        return std::nullopt;
+    Completion result;
+    result.replaced = typed.typed.size();
+    const bool isWhole = entries.size() == 1;
+    const std::wstring shared = sharedBeginning(entries, true);
+    const bool goesOn = shared.size() > typed.text.size() && beginsWith(shared, typed.text, false);
+    result.text = isWhole || goesOn ? written(shared, typed, {}, isWhole) : std::wstring(typed.typed);
+    if (!isWhole)
+        result.candidates = std::move(entries);
+    return result;
+}
+
 bool isKind(const std::wstring& word)
 {
     return word.front() >= L'a' && word.front() <= L'z';
@@ -243,6 +272,8 @@ std::optional<Completion> completeArgument(const SplitBeginning& split, const Co
                                     std::erase_if(files, [](const Branch& file) { return !file.goesOn; });
                                 return files;
                             });
+    if (expected.has(L"entry") && sources.entries)
+        return completeEntry(split.last, sources.entries(split.parts));
     if (expected.has(L"key"))
         return completePath(split.last, {L'\\', false}, sources.keys);
     if (expected.has(L"command"))

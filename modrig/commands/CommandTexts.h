@@ -24,7 +24,8 @@ inline constexpr unsigned kOneAddedToHistory = 148; // file name
 inline constexpr unsigned kManyAddedToHistory = 149;
 inline constexpr unsigned kOneRemovedFromSuite = 150; // file name
 inline constexpr unsigned kManyRemovedFromSuite = 151;
-inline constexpr unsigned kMoved = 152; // file name, its place
+inline constexpr unsigned kMoved = 152;         // file name, its place
+inline constexpr unsigned kPlaceIsNoFile = 153; // what was typed, name of the list
 
 inline constexpr unsigned kLaidDown = 160;         // name of the list, file
 inline constexpr unsigned kOtherSessionRuns = 161; // name of the list

@@ -1,5 +1,6 @@
 #include "modrig/commands/KeptList.h"
 
+#include <tessel/tsed.h>
 #include <wincompat/winfile.h>
 
 #include <algorithm>
@@ -23,6 +24,7 @@ namespace
 constexpr std::size_t kLongestPath = 1023; // what can be read back
 constexpr std::size_t kPlaceSize = 1024;
 constexpr std::size_t kReasonSize = 8192;
+constexpr std::size_t kLongestTyped = 8192;
 
 CStdStr Decimal(std::size_t number)
 {
@@ -40,15 +42,19 @@ CStdStr Summary(unsigned oneText, unsigned manyText, const std::vector<CStdStr>&
                              : CStdStr::Formatted(manyText, Decimal(paths.size()).c_str());
 }
 
-// From the root of the file system on; what is typed with a path counts from the current folder.
+// In the one way in which the lists have it. What no path is known for is looked for as it was typed.
 CStdStr WholePath(const CStdStr& typed)
 {
-    if (typed.Text().starts_with(L'/'))
-        return typed;
-    std::wstring rest = typed.Text();
-    while (rest.starts_with(L"./"))
-        rest.erase(0, 2);
-    return CurrentFolder() + CStdStr(L"/") + CStdStr(rest);
+    wchar_t path[kLongestTyped] = {};
+    return tsedTypedPath(typed.c_str(), path, kLongestTyped) == TS_NORMAL ? CStdStr(std::wstring(path))
+                                                                          : typed;
+}
+
+bool IsNumber(const CStdStr& typed)
+{
+    const std::wstring& text = typed.Text();
+    return !text.empty() && std::all_of(text.begin(), text.end(),
+                                        [](wchar_t digit) { return digit >= L'0' && digit <= L'9'; });
 }
 
 // Why a file cannot join a list; otherwise the path becomes the one that it is found at.
@@ -82,6 +88,9 @@ CStdStr EntryFor(const KeptList& list, const CStdStr& typed)
 
 CStdStr NotInList(const KeptList& list, const CStdStr& typed)
 {
+    if (IsNumber(typed))
+        return CStdStr::Formatted(ModrigMessages::kPlaceIsNoFile, typed.c_str(),
+                                  CStdStr::OfId(list.nameText).c_str());
     return CStdStr::Formatted(ModrigMessages::kNotInList, WholePath(typed).c_str(),
                               CStdStr::OfId(list.nameText).c_str());
 }
@@ -210,11 +219,8 @@ Change MoveFile(const CStdStr& typed, const CStdStr& place)
     const CStdStr path = EntryFor(suite, typed);
     if (path.IsEmpty())
         return {NotInList(suite, typed)};
-    const std::wstring& digits = place.Text();
-    const bool isNumber = !digits.empty() && digits.size() < 10 && // fits into the number
-                          std::all_of(digits.begin(), digits.end(),
-                                      [](wchar_t digit) { return digit >= L'0' && digit <= L'9'; });
-    const std::size_t number = isNumber ? std::stoul(digits) : 0;
+    const bool fits = place.Text().size() < 10; // into the number
+    const std::size_t number = fits && IsNumber(place) ? std::stoul(place.Text()) : 0;
     const std::vector<CStdStr> entries(suite.files.begin(), suite.files.end());
     if (number < 1 || number > entries.size())
         return {

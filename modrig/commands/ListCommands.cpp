@@ -161,6 +161,19 @@ void Run(const KeptList& list)
         return tsedFailCommand(reason.c_str());
     Tell(list, request, *change, modrigWaits);
 }
+// What cannot be read is told by the command.
+TsResultBuffer* Entries(const KeptList& list)
+{
+    static_cast<void>(ReadKept(list));
+    TsResultBuffer* entries = nullptr;
+    TsResultBuffer** end = &entries;
+    for (const CStdStr& path : list.files)
+    {
+        *end = tsutBuildList({TsRbValue::String(path.c_str())});
+        end = &(*end)->next;
+    }
+    return entries;
+}
 } // namespace
 
 void RunSuite()
@@ -171,5 +184,15 @@ void RunSuite()
 void RunHistory()
 {
     Run(KeptHistory());
+}
+
+TsResultBuffer* SuiteEntries()
+{
+    return Entries(KeptStartupSuite());
+}
+
+TsResultBuffer* HistoryEntries()
+{
+    return Entries(KeptHistory());
 }
 } // namespace ModrigUtils

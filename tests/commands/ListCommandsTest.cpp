@@ -54,6 +54,8 @@ protected:
                 TSED_COMMAND_OK);
             ASSERT_EQ(tsedTakeArguments(L"LISTS", name, L"..."), TSED_COMMAND_OK);
         }
+        ASSERT_EQ(tsedOfferEntries(L"LISTS", L"SUITE", SuiteEntries), TSED_COMMAND_OK);
+        ASSERT_EQ(tsedOfferEntries(L"LISTS", L"HISTORY", HistoryEntries), TSED_COMMAND_OK);
         Store(kStoredHistory);
         Store(kStoredStartupSuite);
     }
@@ -174,5 +176,15 @@ TEST_F(ListCommandsWithoutHost, DisturbNobodyAndStoreNothingWhereTheListCannotBe
     EXPECT_THAT(Stored(kStoredStartupSuite), ElementsAre(L"/a.lsp", L"/b.lsp"));
     EXPECT_THAT(host().linker.calls, IsEmpty());
     EXPECT_EQ(Recorded(), kAtStart | kOnCommand);
+    EXPECT_THAT(lines(), IsEmpty());
+}
+
+TEST_F(ListCommandsWithoutHost, OfferWhatIsStored)
+{
+    CStringList one;
+    Fill(one, {L"/one.lsp"});
+    ASSERT_TRUE(StoreList(kStoredHistory, one));
+    EXPECT_THAT(host().commands.offered(L"SUITE", {L"REMOVE"}), ElementsAre(L"/a.lsp", L"/b.lsp"));
+    EXPECT_THAT(host().commands.offered(L"HISTORY", {L"REMOVE"}), ElementsAre(L"/one.lsp"));
     EXPECT_THAT(lines(), IsEmpty());
 }

@@ -86,8 +86,7 @@ protected:
     HostSession session;
     const std::string application = sample("primes.zmb");
     const std::vector<std::string> allActions = {
-        "LIST",  "LIST --json",       "ADD " + application, "REMOVE " + application,
-        "CLEAR", "CLEAR --json"};
+        "LIST", "LIST --json", "ADD " + application, "REMOVE " + application, "CLEAR", "CLEAR --json"};
 
 private:
     sqlite3* mHolder = nullptr;
