@@ -36,8 +36,9 @@ std::filesystem::path tidied(const std::filesystem::path& fromRoot)
 std::filesystem::path withTilde(const std::filesystem::path& typed)
 {
     std::error_code unreachable;
-    return std::filesystem::exists(typed, unreachable) ? typed
-                                                       : std::filesystem::path(withHomeFolder(typed.native()));
+    return std::filesystem::exists(typed, unreachable)
+               ? typed
+               : std::filesystem::path(withHomeFolder(typed.native()));
 }
 
 std::optional<std::filesystem::path> wholePath(const std::filesystem::path& typed)
