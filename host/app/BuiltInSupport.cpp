@@ -5,6 +5,7 @@
 
 #include "host/app/Parts.h"
 #include "host/commands/CommandTexts.h"
+#include "host/commands/TypedLine.h"
 #include "host/files/TypedPath.h"
 #include "host/text/Translation.h"
 

@@ -20,6 +20,7 @@
 #include "host/app/platform/Terminal.h"
 #include "host/commands/CommandRunner.h"
 #include "host/commands/LastWords.h"
+#include "host/commands/TypedLine.h"
 #include "host/console/Colours.h"
 #include "host/console/Console.h"
 #include "host/console/EndSignals.h"

@@ -6,6 +6,7 @@
 #include "host/commands/CallingApplication.h"
 #include "host/commands/Command.h"
 #include "host/commands/CommandTexts.h"
+#include "host/commands/TypedLine.h"
 #include "host/text/CommandLine.h"
 #include "host/text/Nearest.h"
 #include "host/text/Translation.h"
@@ -15,13 +16,6 @@ namespace tessel
 {
 namespace
 {
-constexpr wchar_t kForPrograms[] = L"--json";
-
-bool isBlank(wchar_t character)
-{
-    return character == L' ' || character == L'\t' || character == L'\r' || character == L'\n';
-}
-
 Failure failed(const std::wstring& name, const std::wstring& reason)
 {
     return {translated(L"The command \"{}\" failed: {}", name, reason)};
@@ -133,40 +127,5 @@ CommandStack::Command CommandRunner::findOrLoad(const std::wstring& typedName) c
     if (!command && mLoader && mLoader(typedName))
         command = mCommands.find(typedName);
     return command;
-}
-
-CommandStack::Arguments splitLine(std::wstring_view line)
-{
-    CommandStack::Arguments parts;
-    bool quoted = false;
-    bool inPart = false; // also true for a pair of quotes with nothing between them
-    for (std::size_t at = 0; at < line.size(); ++at)
-    {
-        const bool separates = !quoted && isBlank(line[at]);
-        if (!separates && !inPart)
-            parts.emplace_back();
-        inPart = !separates;
-        const bool doubled = quoted && line.substr(at).starts_with(L"\"\"");
-        if (line[at] == L'"' && !doubled)
-            quoted = !quoted;
-        else if (!separates)
-            parts.back() += line[at];
-        at += doubled ? 1 : 0;
-    }
-    return parts;
-}
-
-bool isForPrograms(std::wstring_view line)
-{
-    const CommandStack::Arguments parts = splitLine(line);
-    return parts.size() > 1 && parts.back() == kForPrograms;
-}
-
-std::wstring asPart(std::wstring_view text)
-{
-    std::wstring part = L"\"";
-    for (const wchar_t character : text)
-        part += character == L'"' ? std::wstring(L"\"\"") : std::wstring(1, character);
-    return part + L"\"";
 }
 } // namespace tessel
