@@ -80,6 +80,10 @@ bool CommandRunner::run(std::wstring_view line)
     const CommandStack::Arguments parts = splitLine(line);
     if (parts.empty())
         return true;
+    if (const TypedLine typed = takeApart(line); typed.last.isInQuotes)
+        mCommandLine.warn(
+            translated(L"The last quote in the line is not closed. What follows it was taken as {}.",
+                       asPart(typed.last.text)));
     const bool done = mCommandLine.tell(runParts(parts));
     const bool finished = !mAfterLine || mAfterLine();
     return done && finished;

@@ -79,6 +79,12 @@ std::wstring written(const std::wstring& path, const OpenPart& typed, const Nota
     return isWhole ? asPart(path) + L" " : asOpenPart(path);
 }
 
+// A line ends where a name would go on.
+bool fitsIntoALine(const std::wstring& name)
+{
+    return name.find_first_of(L"\n\r") == name.npos;
+}
+
 std::vector<Branch> fitting(std::vector<Branch> all, const std::wstring& beginning, const Notation& notation)
 {
     const bool showsHidden = beginning.starts_with(L'.') || notation.separator != L'/';
@@ -86,7 +92,7 @@ std::vector<Branch> fitting(std::vector<Branch> all, const std::wstring& beginni
                   [&](const Branch& branch)
                   {
                       const bool isHidden = branch.name.starts_with(L'.');
-                      return (isHidden && !showsHidden) ||
+                      return (isHidden && !showsHidden) || !fitsIntoALine(branch.name) ||
                              !beginsWith(branch.name, beginning, notation.caseMatters);
                   });
     return all;
@@ -127,8 +133,10 @@ std::optional<Completion> completeEntry(const OpenPart& typed, Names entries)
     std::erase_if(entries,
                   [&](const std::wstring& entry)
                   {
-                      return !beginsWith(entry, typed.text, false) &&
-                             !(byName && beginsWith(std::wstring(nameOfFile(entry)), typed.text, false));
+                      const bool fits =
+                          beginsWith(entry, typed.text, false) ||
+                          (byName && beginsWith(std::wstring(nameOfFile(entry)), typed.text, false));
+                      return !fits || !fitsIntoALine(entry);
                   });
     if (entries.empty())
         return std::nullopt;

@@ -26,6 +26,8 @@ inline constexpr unsigned kOneRemovedFromSuite = 150; // file name
 inline constexpr unsigned kManyRemovedFromSuite = 151;
 inline constexpr unsigned kMoved = 152;         // file name, its place
 inline constexpr unsigned kPlaceIsNoFile = 153; // what was typed, name of the list
+inline constexpr unsigned kQuotesNeeded = 154;  // the name, which gets them
+inline constexpr unsigned kNothingNamed = 155;
 
 inline constexpr unsigned kLaidDown = 160;         // name of the list, file
 inline constexpr unsigned kOtherSessionRuns = 161; // name of the list

@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <cwchar>
+#include <functional>
 #include <string>
 
 #include "modrig/base/SplitPath.h"
@@ -60,6 +61,8 @@ bool IsNumber(const CStdStr& typed)
 // Why a file cannot join a list; otherwise the path becomes the one that it is found at.
 CStdStr WhyRefused(const KeptList& list, CStdStr& path)
 {
+    if (path.IsEmpty())
+        return CStdStr::OfId(ModrigMessages::kNothingNamed);
     if (!FindExtension(path.AfterLastDot()))
         return CStdStr::Formatted(ModrigMessages::kCannotLoadFile, path.c_str());
     if (ValidateFileExists(path) == INVALID_FILE_ATTRIBUTES)
@@ -88,6 +91,8 @@ CStdStr EntryFor(const KeptList& list, const CStdStr& typed)
 
 CStdStr NotInList(const KeptList& list, const CStdStr& typed)
 {
+    if (typed.IsEmpty())
+        return CStdStr::OfId(ModrigMessages::kNothingNamed);
     if (IsNumber(typed))
         return CStdStr::Formatted(ModrigMessages::kPlaceIsNoFile, typed.c_str(),
                                   CStdStr::OfId(list.nameText).c_str());
@@ -108,6 +113,27 @@ CStdStr LaidDownInstead(const CStdStr& key, const CStdStr& name, const CStdStr& 
     const bool isTheSame = ReadModrigRegString(HKEY_CURRENT_USER, key, name, counts) && counts == data;
     return laidDown && !isTheSame ? CStdStr(std::wstring(place)) : CStdStr();
 }
+bool LeadsToAFile(const CStdStr& typed)
+{
+    return GetFileAttributesW(WholePath(typed).c_str()) != INVALID_FILE_ATTRIBUTES;
+}
+
+// Typed without its quotes, a name with blanks comes as several. `isMeant` knows it again.
+CStdStr HintAtQuotes(const std::vector<CStdStr>& typed, const std::function<bool(const CStdStr&)>& isMeant)
+{
+    for (auto first = typed.begin(); first != typed.end(); ++first)
+    {
+        std::wstring name = first->Text();
+        for (auto next = first + 1; next != typed.end() && name.size() <= kLongestPath; ++next)
+        {
+            name += L" " + next->Text();
+            if (isMeant(CStdStr(name)))
+                return CStdStr(L"\n") + CStdStr::Formatted(ModrigMessages::kQuotesNeeded, name.c_str());
+        }
+    }
+    return {};
+}
+
 // What the host says of a value that it may have missed; empty when it is what was read.
 CStdStr WhyMissed(const CStdStr& key, const CStdStr& name)
 {
@@ -180,8 +206,8 @@ Change AddFiles(const KeptList& list, const std::vector<CStdStr>& typed)
     for (const CStdStr& file : typed)
     {
         CStdStr path = WholePath(file);
-        if (CStdStr refused = WhyRefused(list, path); !refused.IsEmpty())
-            return {refused};
+        if (const CStdStr refused = WhyRefused(list, path); !refused.IsEmpty())
+            return {refused + HintAtQuotes(typed, LeadsToAFile)};
         paths.push_back(path);
     }
     for (const CStdStr& path : paths)
@@ -196,7 +222,8 @@ Change RemoveFiles(const KeptList& list, const std::vector<CStdStr>& typed)
     {
         CStdStr path = EntryFor(list, file);
         if (path.IsEmpty())
-            return {NotInList(list, file)};
+            return {NotInList(list, file) + HintAtQuotes(typed, [&list](const CStdStr& name)
+                                                         { return !EntryFor(list, name).IsEmpty(); })};
         paths.push_back(std::move(path));
     }
     for (const CStdStr& path : paths)

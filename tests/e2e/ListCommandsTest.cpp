@@ -215,6 +215,35 @@ TEST_F(ListCommands, SayThatANumberNamesNoEntry)
     EXPECT_THAT(suite(), ElementsAre(first, second));
 }
 
+TEST_F(ListCommands, SayThatANameWithBlanksIsTypedInQuotes)
+{
+    const std::string blanks = write("my gear box.lsp");
+    const auto hint = [](const std::string& path)
+    {
+        return "\nA name with blanks in it is typed in quotes: \"" + path + "\"\n";
+    };
+    const std::string part = blanks.substr(0, blanks.find(" gear"));
+    for (const char* list : {"SUITE", "HISTORY"})
+        EXPECT_EQ(quietly(std::string(list) + " ADD " + first + " " + blanks + " " + second, 1),
+                  notOfAType(part) + hint(blanks));
+    EXPECT_TRUE(suite().empty());
+    quietly("SUITE ADD " + first + " " + inQuotes(blanks));
+    std::filesystem::remove(blanks); // entries need not be there any more
+    EXPECT_EQ(quietly("SUITE REMOVE " + first + " " + blanks, 1),
+              "“" + part + "” is not in the Startup Suite." + hint(blanks));
+    EXPECT_THAT(quietly("SUITE REMOVE " + blanks + "x", 1), Not(HasSubstr("quotes")));
+    EXPECT_THAT(suite(), ElementsAre(first, blanks));
+}
+
+TEST_F(ListCommands, SayThatNoFileWasNamed)
+{
+    quietly("SUITE ADD " + first);
+    for (const char* command :
+         {"SUITE ADD \"\"", "SUITE REMOVE \"\"", "SUITE MOVE \"\" 1", "HISTORY ADD \"\""})
+        EXPECT_EQ(quietly(command, 1), "No file is named: there is nothing between the quotes.\n") << command;
+    EXPECT_THAT(suite(), ElementsAre(first));
+}
+
 // Before and after the application is loaded that has them, in every language.
 TEST_F(ListCommands, OfferTheirEntriesToTheTabKey)
 {

@@ -169,6 +169,22 @@ TEST_F(Completions, LeaveHiddenFilesOutUnlessTheirDotIsTyped)
     EXPECT_EQ(complete(L"load ", sources)->candidates.size(), 6u);
 }
 
+TEST_F(Completions, LeaveOutNamesThatNoLineCanHold)
+{
+    sources.files = [](const std::wstring&)
+    {
+        return std::vector<Branch>{
+            {L"two\nlines.lsp", false}, {L"two\rreturns.lsp", false}, {L"two.lsp", false}};
+    };
+    sources.entries = [](const Names&)
+    {
+        return Names{L"/two\nlines.lsp", L"/two.lsp"};
+    };
+    EXPECT_EQ(after(L"load t"), L"load two.lsp ");
+    EXPECT_EQ(after(L"(load \"t"), L"(load \"two.lsp\"");
+    EXPECT_EQ(after(L"SUI REMOVE /t"), L"SUI REMOVE /two.lsp ");
+}
+
 TEST_F(Completions, OfFoldersLeaveFilesOut)
 {
     EXPECT_EQ(after(L"CD "), L"CD |Moon/|primes one/");
