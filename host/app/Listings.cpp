@@ -7,6 +7,7 @@
 #include "host/applications/KeptOutWords.h"
 #include "host/text/Json.h"
 #include "host/text/Translation.h"
+#include "host/text/Version.h"
 
 namespace tessel
 {
@@ -76,6 +77,13 @@ Result<> commandList(Parts& parts, const Arguments& arguments)
     return sayDocument(parts, {{"commands", commands}});
 }
 
+Result<> versionOfProgram(Parts& parts, const Arguments& arguments)
+{
+    if (!arguments.empty())
+        return wrongUsage(parts, L"VERSION");
+    return sayDocument(parts, {{"program", kProgramName}, {"version", version()}});
+}
+
 Result<> profileList(Parts& parts, const Arguments& arguments)
 {
     if (!arguments.empty())
@@ -116,6 +124,8 @@ void addListings(Parts& parts)
     };
     add(L"APPS", applications);
     add(L"HELP", commandList);
+    add(L"?", commandList);
+    add(L"VERSION", versionOfProgram);
     add(L"PROFILE", profileList);
     add(L"SETVAR", variableList);
 }

@@ -50,26 +50,27 @@ void declare(CLI::App& app, Options& options)
     app.set_version_flag("--version", versionLine(), translatedInUtf8(Sentence(L"Show the version and end")));
     app.add_option("--profile-dir", options.profileFolder,
                    translatedInUtf8(Sentence(L"Keep everything in this folder instead of your own")))
-        ->type_name("DIR")
+        ->type_name(translatedInUtf8(Sentence(L"DIR")))
         ->check(isNamed);
     app.add_option(
            "--layout-dir", options.layoutFolder,
            translatedInUtf8(Sentence(L"Take the values for everybody in this folder, too, to try them")))
-        ->type_name("DIR")
+        ->type_name(translatedInUtf8(Sentence(L"DIR")))
         ->check(isNamed)
         ->check(isThere);
     auto* script =
         app.add_option("--script", options.script, translatedInUtf8(Sentence(L"Run the commands in a file")))
-            ->type_name("SCRIPT");
+            ->type_name(translatedInUtf8(Sentence(L"SCRIPT")));
     // One argument each, so that a command may begin with a dash and a file name may follow.
     auto* command =
         app.add_option("-c,--command", options.commands,
                        translatedInUtf8(Sentence(L"Run a command or a Lisp expression (may be repeated)")))
-            ->type_name("COMMAND")
+            ->type_name(translatedInUtf8(Sentence(L"COMMAND")))
             ->expected(1)
             ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll)
             ->allow_extra_args(false);
-    app.add_option("FILE", options.files, translatedInUtf8(Sentence(L"Load applications, as LOAD does")))
+    app.add_option(translatedInUtf8(Sentence(L"FILE")), options.files,
+                   translatedInUtf8(Sentence(L"Load applications, as LOAD does")))
         ->type_name("");
     auto* quiet = app.add_flag_callback(
         "-q,--quiet", [&options] { options.loudness = Loudness::kQuiet; },
@@ -80,7 +81,7 @@ void declare(CLI::App& app, Options& options)
         ->excludes(quiet);
     app.add_option("--log", options.log,
                    translatedInUtf8(Sentence(L"Add everything that is said to a file, with times")))
-        ->type_name("LOGFILE")
+        ->type_name(translatedInUtf8(Sentence(L"LOGFILE")))
         ->check(isNamedFile);
     app.add_flag("--modrig", options.modrig,
                  translatedInUtf8(Sentence(L"Open Modrig's dialog, and end with it")))

@@ -77,7 +77,7 @@ void takeStandardDescriptors()
 void greet(CommandLine& commandLine)
 {
     commandLine.confirm(
-        translated(L"{}. Type HELP for the list of commands, QUIT to leave.", toWide(kProgramLine)));
+        translated(L"{}. Type HELP for the list of commands, QUIT to leave.", programSentence()));
 }
 
 // Nothing but documents is to be printed then.

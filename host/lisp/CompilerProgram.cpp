@@ -101,7 +101,9 @@ int runCompilerProgram(int count, const char* const* arguments)
                          translatedInUtf8(Sentence(L"Show the version and end")));
     std::string input;
     std::string output;
-    app.add_option("FILE", input, translatedInUtf8(Sentence(L"The Lisp file (.lsp)")))->required();
+    app.add_option(translatedInUtf8(Sentence(L"FILE")), input,
+                   translatedInUtf8(Sentence(L"The Lisp file (.lsp)")))
+        ->required();
     app.add_option("-o,--output", output,
                    translatedInUtf8(Sentence(L"The compiled file; otherwise FILE with the extension .qbc")));
     translateHelp(app);

@@ -9,6 +9,41 @@
 
 namespace tessel
 {
+namespace
+{
+std::wstring before(const std::wstring& words, std::wstring_view mark)
+{
+    return words.substr(0, words.find(mark));
+}
+
+std::wstring after(const std::wstring& words, std::wstring_view mark)
+{
+    const std::size_t at = words.find(mark);
+    return at == words.npos ? words : words.substr(at + mark.size());
+}
+
+// What was wrong is told by what is thrown; only its words name the arguments.
+std::wstring whatIsWrong(const CLI::Error& error)
+{
+    const std::wstring words = toWide(error.what());
+    if (dynamic_cast<const CLI::ExtrasError*>(&error))
+        return words.starts_with(L"The following arguments")
+                   ? translated(L"There are no such arguments: {}", after(words, L": "))
+                   : translated(L"There is no such argument: {}", after(words, L": "));
+    if (dynamic_cast<const CLI::ExcludesError*>(&error))
+        return translated(L"{} and {} cannot be given together.", before(words, L" excludes "),
+                          after(words, L" excludes "));
+    if (dynamic_cast<const CLI::RequiredError*>(&error))
+        return translated(L"{} is missing.", before(words, L" is required"));
+    if (!dynamic_cast<const CLI::ArgumentMismatch*>(&error))
+        return words;
+    return words.ends_with(L" missing")
+               ? translated(L"Something is missing after {}: {}", before(words, L":"),
+                            before(after(words, L" required "), L" missing"))
+               : translated(L"{} takes no value.", before(words, L" was given"));
+}
+} // namespace
+
 void translateHelp(CLI::App& app)
 {
     auto& words = *app.get_formatter();
@@ -25,5 +60,8 @@ void translateHelp(CLI::App& app)
     for (CLI::Option* option : app.get_options())
         if (option->get_group() == "Options")
             option->group(toUtf8(translated(L"Options")));
+    app.failure_message(
+        [](const CLI::App*, const CLI::Error& error)
+        { return toUtf8(whatIsWrong(error) + L"\n" + translated(L"--help tells more.") + L"\n"); });
 }
 } // namespace tessel

@@ -95,9 +95,9 @@ CStdStr NotInList(const KeptList& list, const CStdStr& typed)
         return CStdStr::OfId(ModrigMessages::kNothingNamed);
     if (IsNumber(typed))
         return CStdStr::Formatted(ModrigMessages::kPlaceIsNoFile, typed.c_str(),
-                                  CStdStr::OfId(list.nameText).c_str());
+                                  CStdStr::OfId(list.inText).c_str());
     return CStdStr::Formatted(ModrigMessages::kNotInList, WholePath(typed).c_str(),
-                              CStdStr::OfId(list.nameText).c_str());
+                              CStdStr::OfId(list.inText).c_str());
 }
 
 // The place of what counts instead of the data; empty when the data would count.
@@ -166,6 +166,7 @@ const KeptList& KeptStartupSuite()
                                kStoredStartupSuite,
                                gStartupList,
                                kStartupSuiteName,
+                               kInStartupSuite,
                                kOneAddedToStartupSuite,
                                kManyAddedToStartupSuite,
                                kOneRemovedFromSuite,
@@ -181,6 +182,7 @@ const KeptList& KeptHistory()
                                kStoredHistory,
                                gHistoryList,
                                kHistoryName,
+                               kInHistory,
                                kOneAddedToHistory,
                                kManyAddedToHistory,
                                kOneRemovedFromHistory,
@@ -195,13 +197,14 @@ CStdStr ReadKept(const KeptList& list)
     const CStdStr missed = WhyMissed(list.names);
     return missed.IsEmpty() ? missed
                             : CStdStr::Formatted(ModrigMessages::kListNotRead,
-                                                 CStdStr::OfId(list.nameText).c_str(), missed.c_str());
+                                                 CStdStr::OfId(list.inText).c_str(), missed.c_str());
 }
 
 Change AddFiles(const KeptList& list, const std::vector<CStdStr>& typed)
 {
     if (typed.size() > kMaxFilesAtOnce)
-        return {CStdStr::Formatted(ModrigMessages::kTooManyFiles, Decimal(kMaxFilesAtOnce).c_str())};
+        return {CStdStr::Formatted(ModrigMessages::kTooManyAdded, Decimal(kMaxFilesAtOnce).c_str(),
+                                   Decimal(typed.size()).c_str(), CStdStr::OfId(list.nameText).c_str())};
     std::vector<CStdStr> paths;
     for (const CStdStr& file : typed)
     {
@@ -236,7 +239,7 @@ Change RemoveAllFiles(const KeptList& list)
     const std::vector<CStdStr> paths(list.files.begin(), list.files.end());
     list.files.RemoveAll();
     if (paths.empty())
-        return {{}, CStdStr::Formatted(ModrigMessages::kListIsEmpty, CStdStr::OfId(list.nameText).c_str())};
+        return {{}, CStdStr::Formatted(ModrigMessages::kListIsEmpty, CStdStr::OfId(list.inText).c_str())};
     return {{}, Summary(list.oneRemoved, list.manyRemoved, paths)};
 }
 

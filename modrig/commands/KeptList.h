@@ -16,6 +16,7 @@ struct KeptList
     const StoredListNames& names;
     CStringList& files;
     unsigned nameText; // within a sentence
+    unsigned inText;   // within one about what is in it
     unsigned oneAdded;
     unsigned manyAdded;
     unsigned oneRemoved;

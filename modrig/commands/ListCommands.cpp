@@ -57,7 +57,7 @@ void PrintAsText(const KeptList& list)
         Print(line.Text());
     }
     if (list.files.IsEmpty())
-        Print(CStdStr::Formatted(ModrigMessages::kListIsEmpty, CStdStr::OfId(list.nameText).c_str()).Text());
+        Print(CStdStr::Formatted(ModrigMessages::kListIsEmpty, CStdStr::OfId(list.inText).c_str()).Text());
 }
 
 void PrintAsJson(const KeptList& list)
@@ -100,13 +100,13 @@ struct Request
 Request RequestOf(const Texts& arguments)
 {
     Request request;
-    for (const CStdStr& argument : arguments)
-        if (argument == CStdStr(L"--json"))
-            request.asJson = true;
-        else if (request.action.empty())
-            request.action = argument.Text();
-        else
-            request.files.push_back(argument);
+    if (arguments.empty())
+        return request;
+    request.action = arguments.front().Text();
+    request.files.assign(arguments.begin() + 1, arguments.end());
+    request.asJson = !request.files.empty() && request.files.back() == CStdStr(L"--json");
+    if (request.asJson)
+        request.files.pop_back();
     return request;
 }
 

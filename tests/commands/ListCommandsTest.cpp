@@ -38,6 +38,7 @@ protected:
         ModuleTest::SetUp();
         host().resources.addModule(kTexts, {{ModrigMessages::kHistoryName, L"the History"},
                                             {ModrigMessages::kStartupSuiteName, L"the Suite"},
+                                            {ModrigMessages::kInStartupSuite, L"in the Suite"},
                                             {ModrigMessages::kListNotRead, L"unread: %s. %s"},
                                             {ModrigMessages::kListNotStored, L"not stored"},
                                             {ModrigMessages::kManyRemovedFromHistory, L"%s removed"},
@@ -172,7 +173,7 @@ TEST_F(ListCommandsWithoutHost, DisturbNobodyAndStoreNothingWhereTheListCannotBe
     host().linker.setLoaded(kModrig);
     host().registry.whyUnreadable = L"It is torn.";
     EXPECT_FALSE(host().commands.type(L"SUITE CLEAR"));
-    EXPECT_THAT(host().commands.failure, Optional(std::wstring(L"unread: the Suite. It is torn.")));
+    EXPECT_THAT(host().commands.failure, Optional(std::wstring(L"unread: in the Suite. It is torn.")));
     EXPECT_THAT(Stored(kStoredStartupSuite), ElementsAre(L"/a.lsp", L"/b.lsp"));
     EXPECT_THAT(host().linker.calls, IsEmpty());
     EXPECT_EQ(Recorded(), kAtStart | kOnCommand);

@@ -298,7 +298,7 @@ TEST_F(ListCommands, TakeNoMoreThanFiftyFilesAtOnce)
     for (int count = 0; count < 50; ++count)
         fifty += " " + first;
     EXPECT_EQ(quietly(fifty + " " + second, 1),
-              "No more than 50 files can be taken at once. None of them has been loaded.\n");
+              "No more than 50 files can be taken at once. None of the 51 was added to the Startup Suite.\n");
     EXPECT_TRUE(suite().empty());
     quietly(fifty);
     EXPECT_THAT(suite(), ElementsAre(first));
@@ -327,11 +327,12 @@ TEST_F(ListCommands, AddToAListOfManyEntries)
 
 TEST_F(ListCommands, TellWhenTheyAreTypedWrongly)
 {
-    const std::string usage = "Usage: SUITE LIST\n       SUITE ADD file...\n       SUITE REMOVE entry...\n"
-                              "       SUITE MOVE entry place\n       SUITE CLEAR [--json]\n";
+    const std::string usage = "Usage: SUITE LIST [--json]\n       SUITE ADD file... [--json]\n"
+                              "       SUITE REMOVE entry... [--json]\n"
+                              "       SUITE MOVE entry place [--json]\n       SUITE CLEAR [--json]\n";
     const std::vector<std::string> wrong = {
         "SUITE",        "SUITE GROW",      "SUITE LIST " + first, "SUITE ADD",
-        "SUITE REMOVE", "SUITE CLEAR all", "SUITE MOVE " + first};
+        "SUITE REMOVE", "SUITE CLEAR all", "SUITE MOVE " + first, "SUITE --json LIST"};
     for (const std::string& command : wrong)
         EXPECT_EQ(quietly(command, 1), usage) << command;
 }
@@ -363,9 +364,11 @@ TEST_F(ListCommands, SpeakThePersonsLanguage)
 {
     session.set("LC_ALL", "de_AT.UTF-8");
     EXPECT_THAT(session.start({"--safe", "-c", "SUITE LIST"}).output,
-                HasSubstr("In der Startgruppe steht nichts.\n"));
+                HasSubstr("Es steht nichts in der Startgruppe.\n"));
     const auto refused = session.start({"--safe", "-c", "HISTORY REMOVE " + first});
-    EXPECT_THAT(refused.output, HasSubstr("„" + first + "“ steht nicht in dem Verlauf.\n"));
+    EXPECT_THAT(refused.output, HasSubstr("„" + first + "“ steht nicht im Verlauf.\n"));
+    EXPECT_THAT(session.start({"--safe", "-c", "HISTORY LIST"}).output,
+                HasSubstr("\nEs steht nichts im Verlauf.\n"));
 }
 
 TEST_F(ListCommands, AreNotLoadedBeforeTheyAreTyped)
