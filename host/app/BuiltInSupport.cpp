@@ -7,6 +7,7 @@
 #include "host/commands/CommandTexts.h"
 #include "host/commands/TypedLine.h"
 #include "host/files/TypedPath.h"
+#include "host/text/Joined.h"
 #include "host/text/Translation.h"
 
 namespace tessel
@@ -61,15 +62,12 @@ Result<std::wstring> onlyFile(const Parts& parts, const std::wstring& command,
 {
     if (arguments.size() == 1 && !arguments.front().empty())
         return arguments.front();
-    std::wstring withBlanks;
-    for (const auto& argument : arguments)
-        withBlanks += (withBlanks.empty() ? L"" : L" ") + argument;
     const Failure usage = wrongUsage(parts, command);
     if (arguments.size() < 2)
         return usage;
-    return Failure{
-        usage.sentence + L"\n" +
-        translated(L"A name with blanks in it is typed in quotes: {}", command + L" " + asPart(withBlanks))};
+    return Failure{usage.sentence + L"\n" +
+                   translated(L"A name with blanks in it is typed in quotes: {}",
+                              command + L" " + asPart(joined(arguments, L" ")))};
 }
 
 std::wstring fullPath(const Parts& parts, const std::wstring& typed)

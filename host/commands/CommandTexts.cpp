@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "host/text/DisplayWidth.h"
+#include "host/text/Joined.h"
 #include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
@@ -117,10 +118,7 @@ std::vector<std::wstring> usageLines(const std::wstring& name, std::wstring_view
 
 std::wstring usageText(const std::wstring& name, std::wstring_view usage)
 {
-    std::wstring text;
-    for (const auto& line : usageLines(name, usage))
-        text += (text.empty() ? L"" : L"\n") + line;
-    return text;
+    return joined(usageLines(name, usage), L"\n");
 }
 
 const CommandText* findCommandText(std::wstring_view globalName)
