@@ -47,19 +47,19 @@ std::wstring whatIsWrong(const CLI::Error& error)
 void translateHelp(CLI::App& app)
 {
     auto& words = *app.get_formatter();
-    words.label("Usage", toUtf8(translated(L"Usage")));
-    words.label("OPTIONS", toUtf8(translated(L"OPTIONS")));
-    words.label("Positionals", toUtf8(translated(L"Positionals")));
-    words.label("REQUIRED", toUtf8(translated(L"REQUIRED")));
-    words.label("TEXT", toUtf8(translated(L"TEXT")));
-    words.label("Excludes", toUtf8(translated(L"Excludes")));
+    words.label("Usage", translatedInUtf8(L"Usage"));
+    words.label("OPTIONS", translatedInUtf8(L"OPTIONS"));
+    words.label("Positionals", translatedInUtf8(L"Positionals"));
+    words.label("REQUIRED", translatedInUtf8(L"REQUIRED"));
+    words.label("TEXT", translatedInUtf8(L"TEXT"));
+    words.label("Excludes", translatedInUtf8(L"Excludes"));
     constexpr auto kHelp =
         Sentence(L"Print this help message and exit"); // unless the program has its own words
     if (toWide(app.get_help_ptr()->get_description()) == kHelp.english)
-        app.get_help_ptr()->description(toUtf8(translated(kHelp)));
+        app.get_help_ptr()->description(translatedInUtf8(kHelp));
     for (CLI::Option* option : app.get_options())
         if (option->get_group() == "Options")
-            option->group(toUtf8(translated(L"Options")));
+            option->group(translatedInUtf8(L"Options"));
     app.failure_message(
         [](const CLI::App*, const CLI::Error& error)
         { return toUtf8(whatIsWrong(error) + L"\n" + translated(L"--help tells more.") + L"\n"); });
