@@ -88,10 +88,8 @@ Result<> profileList(Parts& parts, const Arguments& arguments)
 {
     if (!arguments.empty())
         return wrongUsage(parts, L"PROFILE");
-    const auto key = parts.layered->find(std::wstring(kProductRegistryRoot) + L"\\Profiles");
-    const auto names = key == Registry::kNoKey ? std::vector<std::wstring>() : parts.layered->subKeys(key);
-    return sayDocument(
-        parts, {{"current", json::text(parts.profiles.current())}, {"profiles", json::listOfTexts(names)}});
+    return sayDocument(parts, {{"current", json::text(parts.profiles.current())},
+                               {"profiles", json::listOfTexts(parts.profiles.names())}});
 }
 
 Json valueOf(const SystemVariables::Variable& variable)
