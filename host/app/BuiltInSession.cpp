@@ -49,8 +49,7 @@ void describeCommand(Parts& parts, const CommandStack::Description& command)
 void describeCommandToCome(Parts& parts, const std::wstring& name, const std::wstring& module)
 {
     if (const CommandText* text = findCommandText(name))
-        describeCommand(parts, {text->group.english, text->name, text->usage.english, text->summary.english,
-                                text->example});
+        describeCommand(parts, CommandStack::descriptionOf(*text));
     else
         sayLine(
             parts,

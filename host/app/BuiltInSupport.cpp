@@ -14,20 +14,12 @@ namespace tessel
 {
 void addBuiltIn(Parts& parts, const std::wstring& name, CommandStack::BuiltIn command)
 {
-    const CommandText& text = *findCommandText(name);
-    parts.commands->addBuiltIn(
-        {text.group.english, text.name, text.usage.english, text.summary.english, text.example},
-        std::move(command));
+    parts.commands->addBuiltIn(CommandStack::descriptionOf(*findCommandText(name)), std::move(command));
 }
 
 void addBuiltIn(Parts& parts, const std::wstring& name, BuiltInCommand* command)
 {
     addBuiltIn(parts, name, CommandStack::BuiltIn(std::bind_front(command, std::ref(parts))));
-}
-
-std::wstring inPersonsLanguage(const std::wstring& english)
-{
-    return translateAndFill(english.c_str(), {});
 }
 
 void sayLine(Parts& parts, const std::wstring& sentence)

@@ -60,12 +60,17 @@ bool isOwn(const TsEdCommand& command)
 {
     return static_cast<bool>(command.builtIn);
 }
+} // namespace
 
-CommandStack::Description descriptionOf(const TsEdCommand& command)
+CommandStack::Description CommandStack::descriptionOf(const CommandText& text)
+{
+    return {text.group.english, text.name, text.usage.english, text.summary.english, text.example};
+}
+
+CommandStack::Description CommandStack::descriptionOf(const TsEdCommand& command)
 {
     return {command.group, command.localName, command.usage, command.summary, command.example};
 }
-} // namespace
 
 CommandStack::CommandStack(const CallingApplication& calls) : mCalls(calls)
 {

@@ -16,6 +16,7 @@
 namespace tessel
 {
 class CallingApplication;
+struct CommandText;
 
 class CommandStack : public TsEdCommandStack
 {
@@ -32,6 +33,8 @@ public:
         std::wstring summary; // one line; empty where an application has given none
         std::wstring example = {};
     };
+    static Description descriptionOf(const CommandText& text);
+    static Description descriptionOf(const TsEdCommand& command);
 
     // Shared: a handler may remove the command that runs it.
     using Command = std::shared_ptr<const TsEdCommand>;

@@ -31,7 +31,7 @@ std::wstring wordInPersonsLanguage(const std::wstring& word)
 // Translators know the host's own ones whole.
 std::wstring usageInPersonsLanguage(const std::wstring& usage)
 {
-    const std::wstring whole = translateAndFill(usage.c_str(), {});
+    const std::wstring whole = inPersonsLanguage(usage);
     if (whole != usage)
         return whole;
     std::wstring result;
@@ -45,8 +45,8 @@ std::wstring usageInPersonsLanguage(const std::wstring& usage)
     }
     return result;
 }
-} // namespace
 
+// In the order in which HELP lists them.
 const std::vector<CommandText>& commandTexts()
 {
     static const std::vector<CommandText> texts = {
@@ -88,6 +88,7 @@ const std::vector<CommandText>& commandTexts()
     };
     return texts;
 }
+} // namespace
 
 std::vector<std::wstring> waysOfTyping(std::wstring_view usage)
 {

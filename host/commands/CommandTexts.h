@@ -22,9 +22,6 @@ struct CommandText
     const wchar_t* example; // the whole line; empty where the name says it all
 };
 
-// In the order in which HELP lists them.
-const std::vector<CommandText>& commandTexts();
-
 // Each way of typing the arguments.
 std::vector<std::wstring> waysOfTyping(std::wstring_view usage);
 
