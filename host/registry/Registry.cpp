@@ -543,6 +543,12 @@ Result<> Registry::endOfCommand()
     return std::exchange(mCommand, {});
 }
 
+std::wstring Registry::takeReason()
+{
+    const auto told = endOfCommand();
+    return told ? mCanStore.sentence() : told.sentence();
+}
+
 HKEY Registry::openHandle(Key key)
 {
     const HKEY handle = reinterpret_cast<HKEY>(mNextHandle++);

@@ -93,6 +93,10 @@ public:
     bool mayHaveMissed() const { return !mDatabase || mDamaged || mReadFailed; }
     bool readFailed() const { return mReadFailed; }
 
+    // Why something of the running command failed, or why nothing can be read or stored at all, in sentences
+    // for a person. The command's writes are over, and its end does not tell it again.
+    std::wstring takeReason();
+
     // The same by path, for the host's own settings.
     std::optional<std::wstring> read(std::wstring_view path, std::wstring_view name);
     Result<> write(std::wstring_view path, std::wstring_view name, std::wstring_view data);

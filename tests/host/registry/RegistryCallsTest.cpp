@@ -4,6 +4,7 @@
 #include <cstring>
 
 #include "tests/host/support/RegistryHost.h"
+#include "tests/support/Database.h"
 
 using testing::ElementsAre;
 
@@ -280,4 +281,39 @@ TEST_F(RegistryCalls, HaveNoHandlesWhereThereIsNoRegistry)
     EXPECT_EQ(tsudRegSetString(key, L"name", L"1"), ERROR_INVALID_HANDLE);
     HKEY other = nullptr;
     EXPECT_EQ(open(L"A", other), ERROR_INVALID_HANDLE);
+}
+
+// A value or key that is not found is not known not to be there.
+TEST_F(RegistryCalls, TellWhatCannotBeReadFromWhatIsNotThere)
+{
+    host.close();
+    host.folder().write("registry.db", "no registry at all, whatever its name says");
+    host.open();
+    HKEY key = nullptr;
+    DWORD size = 0;
+    EXPECT_EQ(open(L"A", key), ERROR_READ_FAULT);
+    EXPECT_EQ(tsRegGetValue(HKEY_CURRENT_USER, L"name", 0, nullptr, nullptr, &size), ERROR_READ_FAULT);
+    EXPECT_EQ(RegCreateKeyEx(HKEY_CURRENT_USER, L"A", 0, nullptr, 0, KEY_WRITE, nullptr, &key, nullptr),
+              ERROR_ACCESS_DENIED);
+    wchar_t reason[kRoom] = {};
+    EXPECT_TRUE(tsRegMayHaveMissed(L"A", L"name", reason, kRoom));
+    EXPECT_EQ(reason, host.registry().canStore().sentence());
+    EXPECT_TRUE(tsRegMayHaveMissed(L"A", L"name", reason, 4));
+    EXPECT_EQ(reason, host.registry().canStore().sentence().substr(0, 3));
+    EXPECT_TRUE(tsRegMayHaveMissed(nullptr, nullptr, nullptr, 0));
+}
+
+TEST_F(RegistryCalls, TellOnceWhatIsFoundDamagedWhileTheyRead)
+{
+    ASSERT_TRUE(host.registry().write(L"A", L"name", L"1"));
+    ASSERT_TRUE(host.registry().write(L"A", L"other", L"1"));
+    ASSERT_TRUE(host.registry().endOfCommand());
+    ASSERT_EQ(runSql(host.file(), "UPDATE value SET data='2' WHERE name='name'"), "");
+    wchar_t reason[kRoom] = {};
+    EXPECT_FALSE(tsRegMayHaveMissed(L"A", L"other", reason, kRoom)) << "each value on its own account";
+    EXPECT_TRUE(tsRegMayHaveMissed(L"A", L"name", reason, kRoom));
+    EXPECT_NE(std::wstring(reason).find(L"a row of it is not what was stored there"), std::wstring::npos);
+    EXPECT_TRUE(host.registry().endOfCommand());
+    EXPECT_FALSE(tsRegMayHaveMissed(L"A", L"other", reason, kRoom));
+    EXPECT_TRUE(tsRegMayHaveMissed(L"A", L"third", reason, kRoom));
 }
