@@ -100,10 +100,10 @@ private:
     sqlite3_stmt* mValue = nullptr;
 };
 
-// As the host does at a start: with everything resolved. It stays mapped to the end, as there.
-void mapAndCall(const std::string& program)
+// It stays mapped to the end, as in the host.
+void mapAndCall(const std::string& program, int binding)
 {
-    void* const library = dlopen(program.c_str(), RTLD_NOW | RTLD_LOCAL);
+    void* const library = dlopen(program.c_str(), binding | RTLD_LOCAL);
     if (!library)
         stop(dlerror());
     const auto entryPoint = reinterpret_cast<TsRxEntryPoint>(dlsym(library, "tsrxEntryPoint"));
@@ -136,8 +136,9 @@ int main(int argc, char** argv)
         return 2;
     }
     Store store(argv[1]);
-    mapAndCall(argv[2]);
-    readList(store, "startup", std::atol(argv[3]), mapAndCall);
+    mapAndCall(argv[2], RTLD_LAZY); // as the platform does with bundles
+    readList(store, "startup", std::atol(argv[3]),
+             [](const std::string& entry) { mapAndCall(entry, RTLD_NOW); });
     readList(store, "history", std::atol(argv[4]), [](const std::string&) {});
     return 0;
 }

@@ -1,5 +1,5 @@
-// The network's library, mapped when something is fetched for the first time: it brings some twenty others along,
-// which every start would have to wait for.
+// The network's library, mapped when something is fetched for the first time: it brings some twenty others
+// along, which every start would have to wait for.
 #pragma once
 
 namespace tessel

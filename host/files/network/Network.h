@@ -1,5 +1,6 @@
-// What the network's library does for the host: transfers, and the checksums of what they bring. It is a library of
-// its own, with all the libraries that it stands on: most sessions fetch nothing, and do without them.
+// What the network's library does for the host: transfers, and the checksums of what they bring. It is a
+// library of its own, with all the libraries that it stands on: most sessions fetch nothing, and do without
+// them.
 #pragma once
 
 #include <chrono>
