@@ -1,4 +1,5 @@
 // Bundles whose description or program is not what it should be: each is told in one sentence.
+#include "host/applications/platform/ObjectiveCRuntime.h"
 #include "tests/host/support/HostWithModules.h"
 
 #include <fstream>
