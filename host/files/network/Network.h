@@ -27,14 +27,13 @@ public:
 class TransferWatch
 {
 public:
+    virtual ~TransferWatch() = default;
+
     // Before each request, that of a redirection too.
     virtual bool mayAsk(const char* url) = 0;
     virtual bool receive(std::string_view bytes) = 0;
     // Several times a second.
     virtual bool goesOn() = 0;
-
-protected:
-    ~TransferWatch() = default;
 };
 
 struct TransferOrder
@@ -65,10 +64,9 @@ struct TransferResult
 class Network
 {
 public:
+    virtual ~Network() = default;
+
     virtual TransferResult transfer(const TransferOrder& order, TransferWatch& watch) = 0;
     virtual std::unique_ptr<Checksum> checksum() = 0;
-
-protected:
-    ~Network() = default;
 };
 } // namespace tessel
