@@ -6,6 +6,8 @@
 
 #include <cwchar>
 #include <filesystem>
+#include <functional>
+#include <map>
 #include <memory>
 #include <set>
 #include <string>
@@ -13,6 +15,7 @@
 
 #include "bench/BareStore.h"
 #include "bench/Child.h"
+#include "bench/ListPeers.h"
 #include "bench/Ratios.h"
 #include "bench/Session.h"
 #include "modrig/lists/Globals.h"
@@ -23,22 +26,26 @@
 namespace
 {
 constexpr std::size_t kFew = 1'000;
+constexpr std::size_t kTwiceAsFew = 2 * kFew;
 constexpr std::size_t kMany = 100'000;
+constexpr std::size_t kMost = 1'000'000;
 constexpr int kListRepetitions = 7;
+constexpr int kMostRepetitions = 3; // seconds each
 constexpr int kFewRepetitions = 31; // short ones are noisy
 constexpr DWORD kBufferCharacters = 1024;
 
-std::wstring pathOf(std::size_t number)
+// Lists of an even and an odd generation have no path in common.
+std::wstring pathOf(std::size_t number, unsigned generation = 0)
 {
-    return L"/home/user/Applications/library" + std::to_wstring(number / 100) + L"/tool" +
-           std::to_wstring(number) + L".lsp";
+    return L"/home/user/Applications/library" + std::to_wstring(number / 100) +
+           (generation % 2 == 0 ? L"/tool" : L"/task") + std::to_wstring(number) + L".lsp";
 }
 
-void fill(CStringList& list, std::size_t count)
+void fill(CStringList& list, std::size_t count, unsigned generation = 0)
 {
     list.RemoveAll();
     for (std::size_t i = 0; i < count; ++i)
-        list.AddTail(pathOf(i));
+        list.AddTail(pathOf(i, generation));
 }
 
 std::wstring historyKey()
@@ -121,11 +128,11 @@ void bareWriteAll(const std::vector<std::wstring>& paths)
         bareWrite(key, entryName(i + 1), paths[i]);
 }
 
-std::vector<std::wstring> pathsUpTo(std::size_t count)
+std::vector<std::wstring> pathsOf(const CStringList& list)
 {
     std::vector<std::wstring> paths;
-    for (std::size_t i = 0; i < count; ++i)
-        paths.push_back(pathOf(i));
+    for (const CStdStr& path : list)
+        paths.push_back(path.Text());
     return paths;
 }
 
@@ -140,23 +147,18 @@ std::filesystem::path registryFile()
     return bench::workFolder() / "profile" / "registry.db";
 }
 
-std::filesystem::path bareFile(std::size_t count)
-{
-    return bench::workFolder() / ("bare" + std::to_string(count) + ".db");
-}
-
 // Whether the last of so many entries is stored.
-bool isStored(std::size_t count)
+bool isStored(std::size_t count, unsigned generation)
 {
     std::wstring data;
-    return bareRead(historyKey(), entryName(count), data) && data == pathOf(count - 1);
+    return bareRead(historyKey(), entryName(count), data) && data == pathOf(count - 1, generation);
 }
 
-bool storeAll(std::size_t count)
+bool storeAll(std::size_t count, unsigned generation = 0)
 {
     ModrigUtils::WriteHistoryFilesToRegistry();
     bench::endCommand();
-    return isStored(count);
+    return isStored(count, generation);
 }
 
 // Makes a History of that size the stored one: each size has a profile of its own, so that it is written only
@@ -165,60 +167,128 @@ void store(std::size_t count)
 {
     bench::useProfile(L"History" + std::to_wstring(count));
     static std::set<std::size_t> stored;
-    if (gHistoryList.GetCount() != count)
-        fill(gHistoryList, count);
     if (!stored.insert(count).second)
         return;
+    fill(gHistoryList, count);
     ModrigUtils::WriteHistoryFilesToRegistry();
     bench::endCommand();
+}
+
+// The same, and the list in memory is another one in all its paths; answers its generation.
+unsigned prepareOthers(std::size_t count)
+{
+    store(count);
+    static std::map<std::size_t, unsigned> generations;
+    const unsigned generation = ++generations[count];
+    fill(gHistoryList, count, generation);
+    return generation;
+}
+
+// `work` prepares what it needs, and answers the seconds that the rest took; negative when it has not done
+// what it should.
+void measureSeconds(const std::string& name, int repetitions, std::function<double()> work)
+{
+    benchmark::RegisterBenchmark(name.c_str(),
+                                 [work = std::move(work)](benchmark::State& state)
+                                 {
+                                     for (auto iteration : state)
+                                     {
+                                         static_cast<void>(iteration);
+                                         const double seconds = work();
+                                         state.SetIterationTime(seconds);
+                                         if (seconds < 0)
+                                             state.SkipWithError(
+                                                 "the stored list does not hold what it should");
+                                     }
+                                 })
+        ->UseManualTime()
+        ->Iterations(1)
+        ->Repetitions(repetitions);
+}
+
+double secondsIfDone(const std::function<bool()>& work)
+{
+    bool done = false;
+    const double seconds = bench::secondsOf([&] { done = work(); });
+    return done ? seconds : -1;
 }
 
 // `prepare` is not timed; `work` answers whether it has done what it should.
 void measure(const std::string& name, int repetitions, std::function<void()> prepare,
              std::function<bool()> work)
 {
-    benchmark::RegisterBenchmark(
-        name.c_str(),
-        [prepare = std::move(prepare), work = std::move(work)](benchmark::State& state)
-        {
-            for (auto iteration : state)
-            {
-                static_cast<void>(iteration);
-                prepare();
-                bool done = false;
-                state.SetIterationTime(bench::secondsOf([&] { done = work(); }));
-                if (!done)
-                    state.SkipWithError("the stored list does not hold what it should");
-            }
-        })
-        ->UseManualTime()
-        ->Iterations(1)
-        ->Repetitions(repetitions);
+    measureSeconds(name, repetitions,
+                   [prepare = std::move(prepare), work = std::move(work)]
+                   {
+                       prepare();
+                       return secondsIfDone(work);
+                   });
 }
 
+std::string ofHistory(std::size_t count)
+{
+    return " " + std::to_string(count) + " of History";
+}
+
+double secondsToRead(std::size_t count)
+{
+    store(count);
+    return secondsIfDone(
+        [count]
+        {
+            ModrigUtils::InitializeHistoryFiles();
+            return gHistoryList.GetCount() == count;
+        });
+}
+
+double secondsToWriteOthers(std::size_t count)
+{
+    const unsigned generation = prepareOthers(count);
+    return secondsIfDone([=] { return storeAll(count, generation); });
+}
+
+double secondsToWriteOthersBare(std::size_t count)
+{
+    const unsigned generation = prepareOthers(count);
+    const std::vector<std::wstring> paths = pathsOf(gHistoryList);
+    return secondsIfDone(
+        [&]
+        {
+            bareWriteAll(paths);
+            bench::endCommand();
+            return isStored(count, generation);
+        });
+}
+
+// Writing is over as many others: what it costs when every value is another one.
 void addHistory(std::size_t count, int repetitions)
 {
-    const std::string of = " " + std::to_string(count) + " of History";
-    const std::vector<std::wstring> paths = pathsUpTo(count);
-    const auto prepare = [count]
+    const std::string of = ofHistory(count);
+    measureSeconds("read" + of, repetitions, [count] { return secondsToRead(count); });
+    measureSeconds("write" + of, repetitions, [count] { return secondsToWriteOthers(count); });
+}
+
+void addBareCalls()
+{
+    const std::string of = ofHistory(kMany) + ", bare calls";
+    measure(
+        "read" + of, kListRepetitions, [] { store(kMany); }, [] { return bareReadAll(kMany); });
+    measureSeconds("write" + of, kListRepetitions, [] { return secondsToWriteOthersBare(kMany); });
+}
+
+// What a thousand entries cost beside another thousand: free of what any list costs, however short.
+void addSecondThousand()
+{
+    const auto difference = [](double (*seconds)(std::size_t))
     {
-        store(count);
+        const double few = seconds(kFew);
+        const double more = seconds(kTwiceAsFew);
+        return few < 0 || more < 0 ? -1 : more - few;
     };
-    measure("read" + of, repetitions, prepare,
-            [count]
-            {
-                ModrigUtils::InitializeHistoryFiles();
-                return gHistoryList.GetCount() == count;
-            });
-    measure("read" + of + ", bare calls", repetitions, prepare, [count] { return bareReadAll(count); });
-    measure("write" + of, repetitions, prepare, [count] { return storeAll(count); });
-    measure("write" + of + ", bare calls", repetitions, prepare,
-            [paths]
-            {
-                bareWriteAll(paths);
-                bench::endCommand();
-                return isStored(paths.size());
-            });
+    measureSeconds("read a second 1000 of History", kFewRepetitions,
+                   [=] { return difference(secondsToRead); });
+    measureSeconds("write a second 1000 of History", kFewRepetitions,
+                   [=] { return difference(secondsToWriteOthers); });
 }
 
 void emptyTheHistory()
@@ -230,43 +300,124 @@ void emptyTheHistory()
     fill(gHistoryList, kMany);
 }
 
-// What the store needs for the same rows, when nothing stands between them and it.
+void theSameHistory()
+{
+    bench::useProfile(L"SameHistory");
+    fill(gHistoryList, kMany);
+    static const bool stored = storeAll(kMany);
+    static_cast<void>(stored); // what is not there then is stored next, which says so
+}
+
+std::filesystem::path bareFile(const std::string& name)
+{
+    return bench::workFolder() / (name + ".db");
+}
+
+bool readStoreAlone()
+{
+    static bench::BareStore registry(registryFile());
+    return registry.read(kMany);
+}
+
+double secondsToWriteStoreAlone()
+{
+    const auto file = bareFile("as-many-before");
+    static const bool made = bench::makeBare(registryFile(), file);
+    static bench::BareStore bare(file);
+    static const bool filled = made && bare.write(kMany, false, utf8PathOf);
+    return filled ? secondsIfDone([] { return bare.write(kMany, true, utf8PathOf); }) : -1;
+}
+
+double secondsToWriteStoreAloneNoneBefore()
+{
+    const auto file = bareFile("none-before");
+    if (!bench::makeBare(registryFile(), file))
+        return -1;
+    bench::BareStore bare(file);
+    return secondsIfDone([&] { return bare.write(kMany, false, utf8PathOf); });
+}
+
+// What the store needs for the same rows, when nothing stands between them and it: read by one prepared
+// statement in one transaction, and removed one by one and inserted one by one in another.
 void addStoreAlone()
 {
-    const std::string of = " " + std::to_string(kMany) + " of History";
+    const std::string of = ofHistory(kMany);
     measure(
-        "read" + of + ", store alone", kListRepetitions, [] { store(kMany); },
-        [] { return bench::readBare(registryFile(), kMany); });
-    const auto prepare = []
-    {
-        store(kMany);
-        static const bool made = bench::makeBare(registryFile(), bareFile(kMany)) &&
-                                 bench::writeBare(bareFile(kMany), kMany, false, utf8PathOf);
-        static_cast<void>(made); // what is not there cannot be removed: the writing says so
-    };
-    measure("write" + of + ", store alone", kListRepetitions, prepare,
-            [] { return bench::writeBare(bareFile(kMany), kMany, true, utf8PathOf); });
+        "read" + of + ", store alone", kListRepetitions, [] { store(kMany); }, readStoreAlone);
+    measureSeconds("write" + of + ", store alone", kListRepetitions,
+                   []
+                   {
+                       store(kMany);
+                       return secondsToWriteStoreAlone();
+                   });
     measure("write" + of + ", none before", kListRepetitions, emptyTheHistory,
             [] { return storeAll(kMany); });
-    measure(
-        "write" + of + ", none before, store alone", kListRepetitions,
-        [] { static_cast<void>(bench::makeBare(registryFile(), bareFile(0))); },
-        [] { return bench::writeBare(bareFile(0), kMany, false, utf8PathOf); });
+    measureSeconds("write" + of + ", none before, store alone", kListRepetitions,
+                   secondsToWriteStoreAloneNoneBefore);
+    measure("write" + of + ", the same before", kListRepetitions, theSameHistory,
+            [] { return storeAll(kMany); });
 }
 
 void addStoreRatios()
 {
-    const std::string of = " " + std::to_string(kMany) + " of History";
-    for (const std::string& work : {"read" + of, "write" + of, "write" + of + ", none before"})
-        bench::addRatio({work + " / store alone", work, work + ", store alone", 2});
+    const std::string read = "read" + ofHistory(kMany);
+    const std::string write = "write" + ofHistory(kMany);
+    const std::string none = write + ", none before";
+    bench::addRatio({read + " / store alone", read, read + ", store alone", 2});
+    bench::addRatio({write + " over others / store alone", write, write + ", store alone", 2});
+    bench::addRatio({none + " / store alone", none, none + ", store alone", 2});
+    bench::addRatio({write + " over the same / store alone, others", write + ", the same before",
+                     write + ", store alone", 2});
 }
 
 void addHistoryRatios(const std::string& verb)
 {
-    const std::string many = verb + " " + std::to_string(kMany) + " of History";
-    const std::string few = verb + " " + std::to_string(kFew) + " of History";
+    const std::string many = verb + ofHistory(kMany);
+    const std::string most = verb + ofHistory(kMost);
     bench::addRatio({many + " / bare registry calls", many, many + ", bare calls", 2});
-    bench::addRatio({verb + " History, cost per entry at 100000 / at 1000", many, few, 1.5, kMany, kFew});
+    bench::addRatio({verb + " History, cost per entry at 1000000 / at 1000", most, verb + ofHistory(kFew),
+                     1.2, kMost, kFew});
+    bench::addRatio({verb + " History, cost per entry at 1000000 / of a second 1000", most,
+                     verb + " a second 1000 of History", 1.2, kMost, kFew});
+}
+
+// Others read and store a file of their own that is new to this process: they keep in memory what they have
+// seen.
+std::filesystem::path newFile()
+{
+    static int files = 0;
+    return bench::workFolder() / ("peer" + std::to_string(++files));
+}
+
+void addPeer(const std::string& peer,
+             bool (*storeList)(const std::filesystem::path&, std::size_t, bench::PathOf),
+             bool (*readList)(const std::filesystem::path&, std::size_t))
+{
+    const std::string read = "read" + ofHistory(kMany);
+    const std::string write = "write" + ofHistory(kMany);
+    measureSeconds(read + ": " + peer, kListRepetitions,
+                   [=]
+                   {
+                       const auto file = newFile();
+                       const bool stored = storeList(file, kMany, utf8PathOf);
+                       const auto unseen = newFile();
+                       std::filesystem::rename(file, unseen);
+                       return stored ? secondsIfDone([&] { return readList(unseen, kMany); }) : -1;
+                   });
+    measureSeconds(write + ": " + peer, kListRepetitions,
+                   [=]
+                   {
+                       const auto file = newFile();
+                       return secondsIfDone([&] { return storeList(file, kMany, utf8PathOf); });
+                   });
+    bench::addRatio({read + " / " + peer, read, read + ": " + peer, 0});
+    bench::addRatio({write + ", none before / " + peer, write + ", none before", write + ": " + peer, 0});
+}
+
+void addListPeers()
+{
+    addPeer("QSettings (INI)", bench::storeByQSettings, bench::readByQSettings);
+    addPeer("GKeyFile", bench::storeByGKeyFile, bench::readByGKeyFile);
 }
 
 // Looks a thousand paths up; every second time they differ in case from those in the list.
@@ -341,7 +492,11 @@ void addListBenchmarks()
     bench::startHost();
     addHistory(kFew, kFewRepetitions);
     addHistory(kMany, kListRepetitions);
+    addHistory(kMost, kMostRepetitions);
+    addSecondThousand();
+    addBareCalls();
     addStoreAlone();
+    addListPeers();
     addStoreRatios();
     addHistoryRatios("read");
     addHistoryRatios("write");
