@@ -48,8 +48,7 @@ bool storeByQSettings(const std::filesystem::path& file, std::size_t count, Path
     Settings settings(file);
     settings.setValue(QLatin1String(kCountName), QString::number(count));
     for (std::size_t number = 1; number <= count; ++number)
-        settings.setValue(QString::fromStdString(nameOf(number)),
-                          QString::fromStdString(pathOf(number - 1)));
+        settings.setValue(QString::fromStdString(nameOf(number)), QString::fromStdString(pathOf(number - 1)));
     settings.sync();
     return settings.status() == QSettings::NoError;
 }

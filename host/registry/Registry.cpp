@@ -175,6 +175,8 @@ Result<> Registry::removeKey(Key key)
         return writing;
     if (auto sound = checkBeforeRemoval(); !sound)
         return sound;
+    if (auto settled = settle(); !settled)
+        return settled;
     mCursor = {};
     mFollowed = {};
     return finishWrite(mStatements->deleteKey.bind(key).run());
@@ -219,7 +221,21 @@ Result<> Registry::writeValue(Key key, std::wstring_view name, std::wstring_view
 {
     if (auto writing = beginWriting(); !writing)
         return writing;
-    return finishWrite(mStatements->writeValue.bind(key).bind(name).bind(foldCase(name)).bind(data).run());
+    std::string utf8Name = toUtf8(name);
+    std::string fold = toUtf8(foldCase(name));
+    std::string utf8Data = toUtf8(data);
+    if (mStatements->removed.areOf(key))
+    {
+        const int status = mStatements->removed.write(key, utf8Name, fold, utf8Data);
+        if (status != SQLITE_NOTFOUND)
+            return finishWrite(status);
+        if (auto settled = settle(); !settled)
+            return settled;
+    }
+    NewRows& added = mStatements->added;
+    added.add(key, std::move(utf8Name), std::move(fold), std::move(utf8Data));
+    const bool waits = mWrites >= kWritesFlushedAtOnce && !added.isFull();
+    return finishWrite(waits ? SQLITE_DONE : added.store());
 }
 
 Result<> Registry::removeValue(Key key, std::wstring_view name)
@@ -229,7 +245,14 @@ Result<> Registry::removeValue(Key key, std::wstring_view name)
     if (auto sound = checkBeforeRemoval(); !sound)
         return sound;
     mCursor = {};
-    auto removed = finishWrite(mStatements->deleteValue.bind(key).bind(foldCase(name)).run());
+    std::string fold = toUtf8(foldCase(name));
+    if (auto stored = storeAdded(); !stored)
+        return stored;
+    if (mStatements->removed.remove(key, fold))
+        return {};
+    if (auto settled = settle(); !settled)
+        return settled;
+    auto removed = finishWrite(mStatements->deleteValue.bind(key).bindUtf8(std::move(fold)).run());
     if (removed && sqlite3_changes(mDatabase) == 0)
         return noSuchValue();
     return removed;
@@ -346,7 +369,25 @@ void Registry::lookInto(Key key)
 {
     if (!mWriting && mOpenedForWriting.contains(key))
         static_cast<void>(beginWriting());
+    static_cast<void>(settle()); // what fails is told by the next write, or at the command's end
     beginReading();
+}
+
+Result<> Registry::storeAdded()
+{
+    const int status = mStatements->added.store();
+    return status == SQLITE_DONE ? Result<>() : fail(status);
+}
+
+// Everything that was written or removed stands in the file from then on.
+Result<> Registry::settle()
+{
+    if (!mWriting)
+        return {};
+    if (auto stored = storeAdded(); !stored)
+        return stored;
+    const int status = mStatements->removed.settle();
+    return status == SQLITE_DONE ? Result<>() : fail(status);
 }
 
 Result<> Registry::finishWrite(int status)
@@ -487,6 +528,8 @@ void Registry::forgetTransaction()
 void Registry::rollBack()
 {
     forgetTransaction();
+    mStatements->added.forget();
+    mStatements->removed.forget();
     // SQLite may have rolled back by itself already.
     if (!sqlite3_get_autocommit(mDatabase))
         mStatements->rollback.run();
@@ -508,6 +551,8 @@ void Registry::closeHandlesOfLostKeys()
 
 void Registry::commit()
 {
+    static_cast<void>(settle()); // what fails has undone the command, and its end tells it
+    mStatements->removed.forget();
     forgetTransaction();
     if (sqlite3_get_autocommit(mDatabase))
         return;

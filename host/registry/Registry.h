@@ -188,6 +188,8 @@ private:
     void rollBack();
     Result<> checkBeforeRemoval();
     Result<> checkPlace();
+    Result<> storeAdded();
+    Result<> settle();
     Result<> finishWrite(int status);
     int readAhead(Key key, std::string_view fold);
     int step(Statement& statement);
