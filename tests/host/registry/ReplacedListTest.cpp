@@ -147,6 +147,31 @@ TEST_F(ReplacedList, StandsAfterWhatWasNotRemoved)
     EXPECT_THAT(storedAfterTheCommand(), ElementsAre(L"3=a3", L"1=b", L"2=b"));
 }
 
+TEST_F(ReplacedList, StandsAfterWhatTheSameCommandHasWrittenBefore)
+{
+    constexpr int kRemoved = 128;
+    writeNumbered(kLong, L"a");
+    for (int number = 1; number <= kRemoved; ++number)
+        EXPECT_TRUE(registry().removeValue(key(), std::to_wstring(number)));
+    writeNumbered(kRemoved, L"b");
+    const auto now = storedAfterTheCommand();
+    ASSERT_EQ(now.size(), static_cast<std::size_t>(kLong));
+    EXPECT_EQ(now.front(), L"129=a129");
+    EXPECT_EQ(now.back(), L"128=b128");
+}
+
+TEST_F(ReplacedList, StaysInItsRowsAlsoAfterACommandThatRemovedInAnotherOrder)
+{
+    writeNumbered(kLong, L"a");
+    EXPECT_TRUE(registry().endOfCommand());
+    for (const wchar_t* name : {L"150", L"149"})
+        EXPECT_TRUE(registry().removeValue(key(), name));
+    const std::string before = places();
+    removeAll();
+    writeNumbered(kLong - 2, L"b");
+    EXPECT_EQ(places(), before);
+}
+
 TEST_F(ReplacedList, TakesTheSpellingInWhichANameIsWrittenAgain)
 {
     write(L"name", L"data");
