@@ -1,6 +1,6 @@
-// Rows of values that a command has written and that are stored many at a time, by one statement: most of what
-// a row costs is the beginning and the end of the statement that stores it. Used by the Registry's own files
-// alone.
+// Rows of values that a command has written and that are stored many at a time, by one statement: most of
+// what a row costs is the beginning and the end of the statement that stores it. Used by the Registry's own
+// files alone.
 #pragma once
 
 #include <sqlite3.h>

@@ -75,7 +75,7 @@ Registry::~Registry()
 Registry::Key Registry::findChild(Key parent, std::wstring_view name)
 {
     Statement& find = mStatements->findKey;
-    if (step(find.bind(parent).bind(foldCase(name))) != SQLITE_ROW)
+    if (step(find.bind(parent).bindUtf8(foldedUtf8(name))) != SQLITE_ROW)
         return kNoKey;
     const Key key = find.number(0);
     find.reset();
@@ -119,7 +119,7 @@ Result<Registry::Key> Registry::createChild(Key parent, std::wstring_view name)
     // Another process may have made it before the transaction began.
     if (const Key found = findChild(parent, name); found != kNoKey)
         return found;
-    const int status = mStatements->insertKey.bind(parent).bind(name).bind(foldCase(name)).run();
+    const int status = mStatements->insertKey.bind(parent).bind(name).bindUtf8(foldedUtf8(name)).run();
     const Key made = sqlite3_last_insert_rowid(mDatabase);
     const auto written = finishWrite(status);
     return written ? Result<Key>(made) : written.failure();
@@ -188,10 +188,10 @@ Result<std::wstring> Registry::readValue(Key key, std::wstring_view name)
         return noSuchValue();
     lookInto(key);
     mWork.count();
-    std::string fold = toUtf8(foldCase(name));
+    std::string fold = foldedUtf8(name);
     int status = readAhead(key, fold);
     if (status == SQLITE_ROW)
-        return mStatements->followingValues.text(kFourth);
+        return toWide(mReadAhead.data());
     Statement& read = mStatements->readValue;
     if (status == SQLITE_DONE)
         status = step(read.bind(key).bindUtf8(std::move(fold)));
@@ -222,7 +222,7 @@ Result<> Registry::writeValue(Key key, std::wstring_view name, std::wstring_view
     if (auto writing = beginWriting(); !writing)
         return writing;
     std::string utf8Name = toUtf8(name);
-    std::string fold = toUtf8(foldCase(name));
+    std::string fold = foldedUtf8(name);
     std::string utf8Data = toUtf8(data);
     if (mStatements->removed.areOf(key))
     {
@@ -245,7 +245,7 @@ Result<> Registry::removeValue(Key key, std::wstring_view name)
     if (auto sound = checkBeforeRemoval(); !sound)
         return sound;
     mCursor = {};
-    std::string fold = toUtf8(foldCase(name));
+    std::string fold = foldedUtf8(name);
     if (auto stored = storeAdded(); !stored)
         return stored;
     if (mStatements->removed.remove(key, fold))
@@ -539,14 +539,16 @@ void Registry::rollBack()
 // The number of a key that was undone is given away again: a handle must not follow it to another key.
 void Registry::closeHandlesOfLostKeys()
 {
-    std::erase_if(mHandles,
-                  [this](const auto& handle)
-                  {
-                      Statement& find = mStatements->keyExists;
-                      const bool lost = find.bind(handle.second).step() == SQLITE_DONE;
-                      find.reset();
-                      return lost;
-                  });
+    const auto isLost = [this](Key key)
+    {
+        Statement& find = mStatements->keyExists;
+        const bool lost = find.bind(key).step() == SQLITE_DONE;
+        find.reset();
+        return lost;
+    };
+    std::erase_if(mHandles, [&](const auto& handle) { return isLost(handle.second); });
+    if (mNewestHandle.handle && isLost(mNewestHandle.key))
+        mNewestHandle = {};
 }
 
 void Registry::commit()
@@ -588,23 +590,33 @@ Result<> Registry::endOfCommand()
     return std::exchange(mCommand, {});
 }
 
+// Most handles are closed before another one is opened: the newest stands alone, and costs no memory of its
+// own.
 HKEY Registry::openHandle(Key key)
 {
-    const HKEY handle = reinterpret_cast<HKEY>(mNextHandle++);
-    mHandles.emplace(handle, key);
-    return handle;
+    if (mNewestHandle.handle)
+        mHandles.emplace(mNewestHandle.handle, mNewestHandle.key);
+    mNewestHandle = {reinterpret_cast<HKEY>(mNextHandle++), key};
+    return mNewestHandle.handle;
 }
 
 std::optional<Registry::Key> Registry::keyOf(HKEY handle) const
 {
     if (handle == HKEY_CURRENT_USER)
         return kRoot;
+    if (handle && handle == mNewestHandle.handle)
+        return mNewestHandle.key;
     const auto found = mHandles.find(handle);
     return found == mHandles.end() ? std::nullopt : std::optional(found->second);
 }
 
 bool Registry::closeHandle(HKEY handle)
 {
+    if (handle && handle == mNewestHandle.handle)
+    {
+        mNewestHandle = {};
+        return true;
+    }
     return handle == HKEY_CURRENT_USER || mHandles.erase(handle) > 0;
 }
 } // namespace tessel

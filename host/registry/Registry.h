@@ -136,6 +136,11 @@ private:
         std::wstring path;
         Key key = kNoKey;
     };
+    struct Handle
+    {
+        HKEY handle = nullptr;
+        Key key = kNoKey;
+    };
     struct Cursor
     {
         Key key = kNoKey;
@@ -224,7 +229,8 @@ private:
     bool mWriting = false;                     // the running transaction is one that writes
     unsigned mWrites = 0;                      // in it
     std::unordered_set<Key> mOpenedForWriting; // by the running command
-    std::unordered_map<HKEY, Key> mHandles;
+    std::unordered_map<HKEY, Key> mHandles;    // but the newest
+    Handle mNewestHandle;
     std::uintptr_t mNextHandle;
 };
 } // namespace tessel

@@ -1,7 +1,7 @@
-// Who replaces a list removes all of its values, one by one, and writes them one by one, most of them under the
-// names of before. Rows that are removed first to last stay where they are until the next is written: where
-// that is the one that was removed first, the row is changed in its place, or not touched when it says the
-// same. Removing and storing it would cost three times as much.
+// Who replaces a list removes all of its values, one by one, and writes them one by one, most of them under
+// the names of before. Rows that are removed first to last stay where they are until the next is written:
+// where that is the one that was removed first, the row is changed in its place, or not touched when it says
+// the same. Removing and storing it would cost three times as much.
 //
 // What is to be seen of the file is the same as if every row had been removed and stored again at once. So
 // before anything else is asked of the key, `settle` removes what has not come back. Used by the Registry's

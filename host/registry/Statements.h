@@ -24,8 +24,7 @@ struct Registry::Statements
     RemovedRows removed;
 
     // `mark` writes the number of the file, by which its journals are known. A row that is found comes with
-    // whether it is what was stored under what was asked for: an index may lead to another one. What follows
-    // a row is asked of the table alone, which is quicker than an index, and may be another key's.
+    // whether it is what was stored under what was asked for: an index may lead to another one.
     int prepare(sqlite3* database, std::int64_t fileNumber)
     {
         const std::string marking = "PRAGMA application_id=" + std::to_string(fileNumber);
@@ -39,8 +38,7 @@ struct Registry::Statements
                       "ORDER BY id"},
             {readValue,
              "SELECT seq, sum IS row_sum(?1, name, ?2, data), data FROM value WHERE key=?1 AND fold=?2"},
-            {followingValues, "SELECT seq, key=?1 AND sum IS row_sum(?1, name, fold, data), fold, data"
-                              " FROM value WHERE seq>?2 ORDER BY seq"},
+            {followingValues, ReadAhead::kRowsAfter},
             {deleteValue, "DELETE FROM value WHERE key=? AND fold=?"},
             {values, "SELECT seq, sum IS row_sum(?1, name, fold, data), name, data FROM value WHERE key=?1"
                      " ORDER BY seq"},

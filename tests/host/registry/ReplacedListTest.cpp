@@ -239,7 +239,8 @@ public:
     const std::vector<Registry::Value>& values() const { return mValues; }
     std::vector<Registry::Value>::iterator find(const std::wstring& name)
     {
-        return std::find_if(mValues.begin(), mValues.end(), [&](const Registry::Value& value)
+        return std::find_if(mValues.begin(), mValues.end(),
+                            [&](const Registry::Value& value)
                             { return tessel::equalIgnoringCase(value.name, name); });
     }
     bool holds(const std::wstring& name) { return find(name) != mValues.end(); }
@@ -312,7 +313,7 @@ protected:
         case 4:
             return compare(list);
         case 5:
-            {
+        {
             EXPECT_TRUE(registry().endOfCommand());
             return;
         }
