@@ -16,7 +16,7 @@ namespace tessel
 class NewRows
 {
 public:
-    static constexpr std::size_t kAtOnce = 64;
+    static constexpr std::size_t kAtOnce = 128;
 
     int prepare(sqlite3* database);
 
