@@ -140,6 +140,11 @@ private:
         std::wstring path;
         Key key = kNoKey;
     };
+    struct Handle
+    {
+        HKEY handle = nullptr;
+        Key key = kNoKey;
+    };
     struct Cursor
     {
         Key key = kNoKey;
@@ -192,6 +197,8 @@ private:
     void rollBack();
     Result<> checkBeforeRemoval();
     Result<> checkPlace();
+    Result<> storeAdded();
+    Result<> settle();
     Result<> finishWrite(int status);
     int readAhead(Key key, std::string_view fold);
     int step(Statement& statement);
@@ -226,7 +233,8 @@ private:
     bool mWriting = false;                     // the running transaction is one that writes
     unsigned mWrites = 0;                      // in it
     std::unordered_set<Key> mOpenedForWriting; // by the running command
-    std::unordered_map<HKEY, Key> mHandles;
+    std::unordered_map<HKEY, Key> mHandles;    // but the newest
+    Handle mNewestHandle;
     std::uintptr_t mNextHandle;
 };
 } // namespace tessel

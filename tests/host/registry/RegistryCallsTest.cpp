@@ -223,6 +223,26 @@ TEST_F(RegistryCalls, RemoveAValueOnce)
     EXPECT_EQ(RegDeleteValueW(key, nullptr), ERROR_FILE_NOT_FOUND);
 }
 
+TEST_F(RegistryCalls, KeepHandlesApartInWhateverOrderTheyAreClosed)
+{
+    const HKEY keys[] = {create(L"A"), create(L"B"), create(L"C")};
+    const auto write = [&](std::size_t key)
+    {
+        return tsudRegSetString(keys[key], L"name", std::to_wstring(key).c_str());
+    };
+    for (const std::size_t key : {0U, 2U, 1U})
+        EXPECT_EQ(write(key), ERROR_SUCCESS);
+    for (const wchar_t* path : {L"A", L"B", L"C"})
+        EXPECT_EQ(host.registry().read(path, L"name"), std::to_wstring(path[0] - L'A'));
+    EXPECT_EQ(RegCloseKey(keys[1]), ERROR_SUCCESS);
+    EXPECT_EQ(write(1), ERROR_INVALID_HANDLE);
+    EXPECT_EQ(RegCloseKey(keys[2]), ERROR_SUCCESS);
+    EXPECT_EQ(write(2), ERROR_INVALID_HANDLE);
+    EXPECT_EQ(write(0), ERROR_SUCCESS);
+    EXPECT_EQ(RegCloseKey(keys[0]), ERROR_SUCCESS);
+    EXPECT_EQ(write(0), ERROR_INVALID_HANDLE);
+}
+
 TEST_F(RegistryCalls, RefuseHandlesThatAreClosedOrNeverWereOpen)
 {
     HKEY closed = create(L"A");
