@@ -53,7 +53,7 @@ int PerformModrig(CStdStr path, int addToHistory, signed char loadAll, signed ch
     if (LispIsDisabled() && IsRefusedWhileLispIsOff(path))
         return kNotLoaded;
     const bool alreadyLoaded = FoundinLoadedList(path);
-    const bool isLispApp = IsALispAppFoundinList(path);
+    const bool isLispApp = alreadyLoaded && IsALispAppFoundinList(path);
     if (alreadyLoaded && !isLispApp)
         return kAlreadyLoaded;
     const bool isLoaded = LoadApplication(path, kLoad, loadAll);
