@@ -1,155 +1,99 @@
-// Loading 500 compiled modules: the module's loader against the host's linker, the bare system calls, and the
-// module loaders of two toolkits. Every run is a new process, since a library is mapped for the first time
-// once; and a whole one with a host of its own, since a fork would pay for every page of memory that it is
-// the first to write to.
+// Loading and unloading compiled modules. Every run is a new process, since a library is mapped for the first
+// time once; and a whole one with a host of its own, since a fork would pay for every page of memory that it
+// is the first to write to.
 #include <benchmark/benchmark.h>
-#include <dlfcn.h>
-#include <gmodule.h>
-#include <tessel/tsrxlinker.h>
 
-#include <QLibrary>
+#include <algorithm>
 #include <string>
 #include <vector>
 
 #include "bench/Child.h"
+#include "bench/Loaders.h"
 #include "bench/Ratios.h"
 #include "bench/Session.h"
-#include "modrig/lists/Globals.h"
-#include "modrig/loader/ApplicationLoader.h"
 
 namespace
 {
+using namespace bench;
+
 constexpr std::size_t kModules = 500;
-constexpr int kLoadingRepetitions = 15;
-constexpr const char* kEntry = "tsrxEntryPoint";
+constexpr std::size_t kManyModules = 1'000;
+constexpr std::size_t kMostModules = 10'000; // the system allows a process no more than some 13,000
+constexpr int kRepetitions = 15;
+constexpr int kRepetitionsOfMost = 7; // of which each takes seconds
 
-bool callEntry(void* entry)
+constexpr const char* kLoad = "load";
+constexpr const char* kUnload = "unload";
+
+std::string benchmarkOf(const std::string& deed, const std::string& loader, std::size_t count)
 {
-    return entry && reinterpret_cast<TsRxEntryPoint>(entry)(TSRX_MSG_LOAD, nullptr) == TSRX_RET_OK;
+    return deed + " " + std::to_string(count) + ": " + loader;
 }
 
-bool loadBare(const std::string& path)
+void add(const std::string& deed, const std::string& loader, std::size_t count)
 {
-    void* library = dlopen(path.c_str(), RTLD_NOW | RTLD_LOCAL);
-    return library && callEntry(dlsym(library, kEntry));
-}
-
-bool loadByGModule(const std::string& path)
-{
-    GModule* library = g_module_open(path.c_str(), G_MODULE_BIND_LOCAL);
-    gpointer entry = nullptr;
-    return library && g_module_symbol(library, kEntry, &entry) && callEntry(entry);
-}
-
-bool loadByQLibrary(const std::string& path)
-{
-    QLibrary library(QString::fromStdString(path));
-    library.setLoadHints(QLibrary::ResolveAllSymbolsHint);
-    return library.load() && callEntry(reinterpret_cast<void*>(library.resolve(kEntry)));
-}
-
-bool loadByHostLinker(const std::wstring& path)
-{
-    TsRxDynamicLinker* linker = TsRxDynamicLinker::cast(tsrxSysRegistry()->at(TSRX_DYNAMIC_LINKER));
-    return linker && linker->loadModule(path.c_str(), true, true);
-}
-
-bool loadByModrig(const std::wstring& path)
-{
-    return ModrigUtils::PerformModrig(path, 0, 1, 1) == ModrigUtils::kLoaded;
-}
-
-template <class Path>
-double secondsForAll(const std::vector<Path>& paths, bool (*load)(const Path&))
-{
-    bool all = true;
-    const double seconds = bench::secondsOf(
-        [&]
-        {
-            for (const Path& path : paths)
-                all = load(path) && all;
-        });
-    return all ? seconds : -1;
-}
-
-struct Loader
-{
-    const char* name;
-    double (*secondsForAll)(const std::vector<std::string>& paths);
-};
-
-template <bool (*kLoad)(const std::string&)>
-double secondsBy(const std::vector<std::string>& paths)
-{
-    return secondsForAll(paths, kLoad);
-}
-
-template <bool (*kLoad)(const std::wstring&)>
-double secondsBy(const std::vector<std::string>& paths)
-{
-    std::vector<std::wstring> widePaths;
-    widePaths.reserve(paths.size());
-    for (const std::string& path : paths)
-        widePaths.push_back(bench::wide(path));
-    return secondsForAll(widePaths, kLoad);
-}
-
-constexpr Loader kLoaders[] = {{"bare dlopen and entry", secondsBy<loadBare>},
-                               {"GModule", secondsBy<loadByGModule>},
-                               {"QLibrary", secondsBy<loadByQLibrary>},
-                               {"host linker", secondsBy<loadByHostLinker>},
-                               {"PerformModrig", secondsBy<loadByModrig>}};
-
-std::string benchmarkOf(const std::string& loader)
-{
-    return "load 500: " + loader;
-}
-
-void add(const Loader& loader, const std::string& folder)
-{
-    const auto run = [name = std::string(loader.name), folder](benchmark::State& state)
+    const std::string folder = folderOfModules("modules", count).string();
+    const auto run = [=](benchmark::State& state)
     {
         for (auto iteration : state)
         {
             static_cast<void>(iteration);
-            const double seconds = bench::inNewProcess({"load", name, folder});
+            const double seconds = inNewProcess({deed, loader, folder, std::to_string(count)});
             if (seconds < 0)
-                state.SkipWithError("not every module was loaded");
+                state.SkipWithError("not every module was loaded, or unloaded");
             state.SetIterationTime(seconds);
         }
     };
-    benchmark::RegisterBenchmark(benchmarkOf(loader.name).c_str(), run)
+    benchmark::RegisterBenchmark(benchmarkOf(deed, loader, count).c_str(), run)
         ->UseManualTime()
         ->Iterations(1)
-        ->Repetitions(kLoadingRepetitions);
+        ->Repetitions(count == kMostModules ? kRepetitionsOfMost : kRepetitions);
 }
 
-void addLoadingRatio(const std::string& what, const std::string& base, double most = 0)
+void addComparison(const std::string& deed, std::size_t count, const std::string& base, double most)
 {
-    bench::addRatio({what + " / " + base + ", 500 modules", benchmarkOf(what), benchmarkOf(base), most});
+    addRatio({deed + " " + std::to_string(count) + ": " + kPerformModrig + " / " + base,
+              benchmarkOf(deed, kPerformModrig, count), benchmarkOf(deed, base, count), most});
+}
+
+// How much of it is the system's own: its linker walks the list of all libraries for each one.
+void addGrowth(const std::string& loader)
+{
+    addRatio({"load: " + loader + ", per module of 10000 / of 1000", benchmarkOf(kLoad, loader, kMostModules),
+              benchmarkOf(kLoad, loader, kManyModules), 0, kMostModules, kManyModules});
 }
 } // namespace
 
-double secondsToLoad(const std::string& loader, const std::string& folder)
+double secondsOfModules(const std::string& deed, const std::string& loader, const std::string& folder,
+                        std::size_t count)
 {
-    std::vector<std::string> paths;
-    for (std::size_t i = 0; i < kModules; ++i)
-        paths.push_back(bench::moduleIn(folder, i).string());
-    bench::startHost();
-    for (const Loader& known : kLoaders)
-        if (loader == known.name)
-            return known.secondsForAll(paths);
-    return -1;
+    const auto known = std::ranges::find(loaders(), loader, &Loader::name);
+    if (known == loaders().end())
+        return -1;
+    const auto work = deed == kLoad ? known->secondsToLoad : known->secondsToUnload;
+    Paths modules;
+    for (std::size_t i = 0; i < count; ++i)
+        modules.push_back(moduleIn(folder, i).string());
+    startHost();
+    return work ? work(modules) : -1;
 }
 
 void addLoadingBenchmarks()
 {
-    const std::string folder = bench::folderOfModules("modules", kModules).string();
-    for (const Loader& loader : kLoaders)
-        add(loader, folder);
-    addLoadingRatio("PerformModrig", "host linker", 1.05);
-    addLoadingRatio("PerformModrig", "bare dlopen and entry", 1.3);
-    addLoadingRatio("PerformModrig", "QLibrary", 1.0);
-    addLoadingRatio("PerformModrig", "GModule");
-    addLoadingRatio("QLibrary", "bare dlopen and entry");
+    for (const Loader& loader : loaders())
+        add(kLoad, loader.name, kModules);
+    for (const std::size_t count : {kManyModules, kMostModules})
+        for (const char* loader : {kBare, kPerformModrig})
+            add(kLoad, loader, count);
+    for (const char* loader : {kBare, kPerformModrig})
+        add(kUnload, loader, kModules);
+    addComparison(kLoad, kModules, kHostLinker, 1.05);
+    addComparison(kLoad, kModules, kBare, 1.3);
+    addComparison(kLoad, kModules, kGModule, 0);
+    addComparison(kLoad, kModules, kQLibrary, 1.0);
+    addComparison(kLoad, kModules, kLibltdl, 0);
+    addComparison(kLoad, kMostModules, kBare, 1.2);
+    addGrowth(kBare);
+    addGrowth(kPerformModrig);
+    addComparison(kUnload, kModules, kBare, 1.3);
 }
