@@ -156,12 +156,9 @@ public:
 
     bool loadAll()
     {
-        return std::ranges::all_of(mApplications,
-                                   [](const ModrigUtils::UnloadCandidate& application)
-                                   {
-                                       return ModrigUtils::PerformModrig(application.path, 0, 1, 1) ==
-                                              ModrigUtils::kLoaded;
-                                   });
+        return std::ranges::all_of(
+            mApplications, [](const ModrigUtils::UnloadCandidate& application)
+            { return ModrigUtils::PerformModrig(application.path, 0, 1, 1) == ModrigUtils::kLoaded; });
     }
     bool unloadAll()
     {

@@ -1,10 +1,11 @@
 // Runs one group of the benchmarks that need no display: modrig_bench GROUP. Ends non-zero when a limit is
-// missed. For each of its runs the loading group starts it again: modrig_bench load LOADER FOLDER COUNT
-// prints seconds.
+// missed. For each of its runs the loading group starts it again: modrig_bench load|unload LOADER FOLDER
+// COUNT tells seconds. tools/bench and the build system read the groups out of the table below.
 #include <cstdio>
 #include <cstring>
 #include <string>
 
+#include "bench/Child.h"
 #include "bench/Ratios.h"
 
 void addLoadingBenchmarks();
@@ -35,7 +36,7 @@ int main(int argc, char** argv)
     if (argc == 5)
     {
         const double seconds = secondsOfModules(argv[1], argv[2], argv[3], std::stoul(argv[4]));
-        std::printf("%.9f\n", seconds);
+        bench::tellSeconds(seconds);
         return seconds < 0 ? 1 : 0;
     }
     const char* wanted = argc == 2 ? argv[1] : "";

@@ -68,10 +68,17 @@ TEST_F(Setup, InstallsForTheTourADisplayToo)
                                        Not(HasSubstr(" libgtest-dev "))));
 }
 
+TEST_F(Setup, InstallsForTheBenchmarksWhatTheyCountAndCompareWith)
+{
+    EXPECT_THAT(setup("--bench"), AllOf(HasSubstr(" g++ "), HasSubstr(" xvfb "), HasSubstr(" valgrind "),
+                                        HasSubstr(" libltdl-dev "), Not(HasSubstr(" libgtest-dev "))));
+}
+
 TEST_F(Setup, InstallsForTheTestsAllThereIs)
 {
-    EXPECT_THAT(setup(""), AllOf(HasSubstr(" g++ "), HasSubstr(" xvfb "), HasSubstr(" dpkg-dev "),
-                                 HasSubstr(" libgtest-dev "), HasSubstr(" lintian ")));
+    EXPECT_THAT(setup(""),
+                AllOf(HasSubstr(" g++ "), HasSubstr(" xvfb "), HasSubstr(" dpkg-dev "),
+                      HasSubstr(" libgtest-dev "), HasSubstr(" lintian "), HasSubstr(" valgrind ")));
 }
 
 TEST_F(Setup, TakesTheHighestVersionThatANameCanHave)
