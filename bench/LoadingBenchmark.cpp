@@ -16,20 +16,25 @@ namespace
 {
 using namespace bench;
 
-constexpr std::size_t kModules = 500;
-constexpr std::size_t kManyModules = 1'000;
-constexpr std::size_t kMostModules = 10'000; // the system allows a process no more than some 13,000
-constexpr int kRepetitions = 15;
-constexpr int kRepetitionsOfMost = 7; // of which each takes seconds
+constexpr std::size_t kUsual = 500;
+constexpr std::size_t kThousand = 1'000;
+constexpr std::size_t kTenThousand = 10'000; // the system allows a process no more than some 13,000
+constexpr int kUsualRepetitions = 15;
+constexpr int kRepetitionsOfTenThousand = 7; // of which each takes seconds
 
 constexpr const char* kUnlookedAt =
     "It maps a file without a look at it; one that was cut short ends the process.";
 constexpr const char* kLoad = "load";
 constexpr const char* kUnload = "unload";
 
+std::string shown(const std::string& deed, const std::string& loader)
+{
+    return deed == kUnload && loader == kBare ? "bare entry and dlclose" : loader;
+}
+
 std::string benchmarkOf(const std::string& deed, const std::string& loader, std::size_t count)
 {
-    return deed + " " + std::to_string(count) + ": " + loader;
+    return deed + " " + std::to_string(count) + ": " + shown(deed, loader);
 }
 
 void add(const std::string& deed, const std::string& loader, std::size_t count)
@@ -49,7 +54,7 @@ void add(const std::string& deed, const std::string& loader, std::size_t count)
     benchmark::RegisterBenchmark(benchmarkOf(deed, loader, count).c_str(), run)
         ->UseManualTime()
         ->Iterations(1)
-        ->Repetitions(repetitions(count == kMostModules ? kRepetitionsOfMost : kRepetitions));
+        ->Repetitions(repetitions(count == kTenThousand ? kRepetitionsOfTenThousand : kUsualRepetitions));
 }
 
 // Of the module's loader with another.
@@ -66,7 +71,7 @@ struct Comparison
 void addComparison(const Comparison& wanted)
 {
     addRatio({.what = wanted.deed + " " + std::to_string(wanted.count) + " modules: " + kPerformModrig +
-                      " / " + wanted.base,
+                      " / " + shown(wanted.deed, wanted.base),
               .measured = benchmarkOf(wanted.deed, kPerformModrig, wanted.count),
               .base = benchmarkOf(wanted.deed, wanted.base, wanted.count),
               .most = wanted.most,
@@ -77,10 +82,10 @@ void addComparison(const Comparison& wanted)
 void addGrowth(const std::string& loader, const std::string& how = {})
 {
     addRatio({.what = "load: " + loader + ", per module of 10000 / of 1000",
-              .measured = benchmarkOf(kLoad, loader, kMostModules),
-              .base = benchmarkOf(kLoad, loader, kManyModules),
-              .measuredUnits = kMostModules,
-              .baseUnits = kManyModules,
+              .measured = benchmarkOf(kLoad, loader, kTenThousand),
+              .base = benchmarkOf(kLoad, loader, kThousand),
+              .measuredUnits = kTenThousand,
+              .baseUnits = kThousand,
               .how = how});
 }
 } // namespace
@@ -102,26 +107,26 @@ double secondsOfModules(const std::string& deed, const std::string& loader, cons
 void addLoadingBenchmarks()
 {
     for (const Loader& loader : loaders())
-        add(kLoad, loader.name, kModules);
-    for (const std::size_t count : {kManyModules, kMostModules})
+        add(kLoad, loader.name, kUsual);
+    for (const std::size_t count : {kThousand, kTenThousand})
         for (const char* loader : {kBare, kPerformModrig})
             add(kLoad, loader, count);
     for (const char* loader : {kBare, kPerformModrig})
-        add(kUnload, loader, kModules);
-    addComparison({kLoad, kModules, kHostLinker, 1.05, kInstructions});
+        add(kUnload, loader, kUsual);
+    addComparison({kLoad, kUsual, kHostLinker, 1.05, kInstructions});
     addComparison(
-        {kLoad, kModules, kBare, 1.3, kProcessorTime,
+        {kLoad, kUsual, kBare, 1.3, kProcessorTime,
          "The rest is the look at the file before its code is mapped: opening it, reading its headers, "
          "and asking the system afterwards whether it is this file that was mapped."});
-    addComparison({kLoad, kModules, kGModule, 1.2, kProcessorTime, kUnlookedAt});
-    addComparison({kLoad, kModules, kLibltdl, 1.25, kProcessorTime, kUnlookedAt});
-    addComparison({kLoad, kModules, kQLibrary, 1.0});
+    addComparison({kLoad, kUsual, kGModule, 1.2, kProcessorTime, kUnlookedAt});
+    addComparison({kLoad, kUsual, kLibltdl, 1.25, kProcessorTime, kUnlookedAt});
+    addComparison({kLoad, kUsual, kQLibrary, 1.0});
     addComparison(
-        {kLoad, kMostModules, kBare, 1.2, kProcessorTime,
+        {kLoad, kTenThousand, kBare, 1.2, kProcessorTime,
          "For each module the system's linker walks its list of all libraries several times. Where its "
          "entries lie in memory decides whether a step of that takes 5 ns or 15 ns, for either side by "
          "chance: below 1 the base has had bad luck."});
     addGrowth(kBare, "All of it is the system's linker walking its list.");
     addGrowth(kPerformModrig, "What is added to the base does not grow.");
-    addComparison({kUnload, kModules, kBare, 1.25});
+    addComparison({kUnload, kUsual, kBare, 1.25});
 }
