@@ -1,5 +1,6 @@
 #include "host/applications/LoadedModules.h"
 
+#include <algorithm>
 #include <utility>
 
 #include "host/text/Unicode.h"
@@ -43,10 +44,15 @@ void LoadedModules::remove(Module& module)
         std::erase(named->second, &module);
         if (named->second.empty())
             mByName.erase(named);
-        std::erase(mLoaded, &module);
+        // The session's end takes the last away each time, and a person's selection goes from the first on.
+        if (mLoaded.back() == &module)
+            mLoaded.pop_back();
+        else
+            mLoaded.erase(std::ranges::find(mLoaded, &module));
     }
     mByPath.erase(module.path);
-    mByPath.erase(module.otherPath);
+    if (!module.otherPath.empty())
+        mByPath.erase(module.otherPath);
     mByIdentity.erase(module.identity);
     mByHandle.erase(&module);
 }

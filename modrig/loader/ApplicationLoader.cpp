@@ -2,6 +2,8 @@
 
 #include <tessel/tsed.h>
 
+#include <utility>
+
 #include "modrig/base/SplitPath.h"
 #include "modrig/lists/Globals.h"
 #include "modrig/lists/ListMembership.h"
@@ -75,9 +77,9 @@ bool LoadApplication(CStdStr path, signed char load, signed char loadAll)
     switch (FileTypeOfPath(path))
     {
     case kCompiledModule:
-        return LoadQMBFile(path, load);
+        return LoadQMBFile(std::move(path), load);
     case kLispFile:
-        return LoadLispFile(path, load, loadAll);
+        return LoadLispFile(std::move(path), load, loadAll);
     default:
         // Macro projects and packaged Lisp are known kinds, but there is no road to load them by.
         return RefuseFile(path);
