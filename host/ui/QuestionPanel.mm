@@ -306,7 +306,7 @@ void moveMiddleOver(NSWindow* window, NSWindow* owner)
 
 - (void)onCancel:(id)sender
 {
-    [NSApp stopModalWithCode:NSCancelButton];
+    [NSApp stopModalWithCode:NSModalResponseCancel];
 }
 
 - (void)onChoose:(id)sender

@@ -93,7 +93,7 @@ void tessel::cancelFrontWindow()
 {
     if (![NSApp modalWindow])
         return;
-    [NSApp stopModalWithCode:NSCancelButton];
+    [NSApp stopModalWithCode:NSModalResponseCancel];
     const bool tracking =
         [[[NSRunLoop currentRunLoop] currentMode] isEqualToString:NSEventTrackingRunLoopMode];
     [NSApp postEvent:tracking ? releaseOfTheMouse() : wakeUp() atStart:YES];

@@ -154,12 +154,12 @@ const NSRect kFilterChoice = {{104, 10}, {308, 26}};
     [panel setDelegate:(id)chooser];
     if ([mFileFilters count])
         tessel::windowing::showAccessoryView(panel, [chooser view]);
-    const bool chosen = [panel runModal] == NSOKButton;
+    const bool chosen = [panel runModal] == NSModalResponseOK;
     [mSelectedPathes release];
     mSelectedPathes = [(chosen ? [[panel URLs] valueForKey:@"path"] : [NSArray array]) copy];
     [panel setDelegate:nil];
     [panel setAccessoryView:nil];
-    return chosen ? NSOKButton : 0;
+    return chosen ? NSModalResponseOK : 0;
 }
 
 @end

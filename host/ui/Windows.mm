@@ -72,7 +72,7 @@ bool tsuiPrepareWindows()
     if (!gPrepared)
         prepare();
     gPrepared = true;
-    [NSApp activateIgnoringOtherApps:YES];
+    tessel::windowing::comeToFront();
     return true;
 }
 
@@ -84,6 +84,6 @@ void tsuiFinishWindows()
     // The windows are closed and their work is done: what fails now is for the log, not for the command.
     if (NSString* error = tsuiErrorOf(takeEvents, nullptr))
         NSLog(@"%@", error);
-    tessel::windowing::flushScreen();
+    tessel::windowing::leaveScreen();
     [pool drain];
 }

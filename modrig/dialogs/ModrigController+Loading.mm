@@ -41,7 +41,7 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
 // selected.
 - (void)chooseWhatIsStillSelected
 {
-    const bool panelHasSelection = [[self filesChosenIn:mOpenPanel] count] > 0;
+    const bool panelHasSelection = [self isAnyFileIn:[mOpenPanel URLs]];
     const bool historyHasSelection = [[historyList selectedObjects] count] > 0;
     switch (ModrigUtils::SourceWithoutChoice(panelHasSelection, historyHasSelection))
     {
@@ -67,12 +67,11 @@ void scrollToLastRow(NSTableView* table, NSArrayController* rows)
 {
     NSOpenPanel* panel = mOpenPanel;
     ModrigUtils::LoadSteps steps;
-    steps.hasChosenFiles = [=] { return [[self selectedFiles] count] > 0; };
+    steps.hasChosenFiles = [=] { return [[self chosenFiles] count] > 0; };
     steps.tellsOfMissingFile = [=] { return static_cast<bool>(tsuiTellOfMissingFile(panel)); };
     steps.chooseWhatIsStillSelected = [=] { [self chooseWhatIsStillSelected]; };
     steps.goesIntoHostFolder = [=] { return static_cast<bool>([self openTesselFolder]); };
-    steps.loadChosenFiles = [=]
-    { [self loadApps:[self selectedFiles] successedApps:nil addToStartupSuit:NO]; };
+    steps.loadChosenFiles = [=] { [self loadApps:[self chosenFiles] successedApps:nil addToStartupSuit:NO]; };
     steps.rememberFolder = [=] { [self rememberFolder]; };
     ModrigUtils::PressLoad(steps);
 }

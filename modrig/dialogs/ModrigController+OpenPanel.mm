@@ -4,7 +4,7 @@
 #include <tesselui/tsuieach.h>
 
 #import "modrig/dialogs/ModrigDialogView.h"
-#import "modrig/dialogs/ModrigFilePath.h"
+#import "modrig/dialogs/ModrigFolderPath.h"
 #import "modrig/dialogs/NSSavePanel+ModrigRuntime.h"
 #import "modrig/dialogs/NSString+ModrigPaths.h"
 #import "modrig/dialogs/TsOCModrigUtil.h"
@@ -117,7 +117,7 @@
     NSArray* chosen = [[mSelectedFiles copy] autorelease];
     const bool chosenInHistory = [self historyIsChosen];
     [self filterPanelAgain];
-    if (!ModrigUtils::PanelSelectionCountsAfterFileType([mSelectedFiles count] == 0, chosenInHistory))
+    if (!ModrigUtils::PanelSelectionCountsAfterFileType([[self chosenFiles] count] == 0, chosenInHistory))
         [mSelectedFiles setArray:chosen];
 }
 
@@ -145,20 +145,41 @@
            !ModrigPlatform::IsFilePackage(path) && ![self isTesselFolder:path];
 }
 
-- (NSArray*)filesChosenIn:(id)panel
+- (BOOL)isAnyFileIn:(NSArray*)urls
 {
-    NSMutableArray* files = [NSMutableArray array];
-    for (NSURL* url : tsuiEach<NSURL*>([panel URLs]))
+    for (NSURL* url : tsuiEach<NSURL*>(urls))
         if (![self isOnTheWay:[url path]])
-            [files addObject:[url path]];
-    return files;
+            return YES;
+    return NO;
+}
+
+- (ModrigFilePath*)rowFor:(NSString*)path
+{
+    if ([self isOnTheWay:path])
+        return [[[ModrigFolderPath alloc] initWithFilePathName:path] autorelease];
+    return [[[ModrigFilePath alloc] initWithFilePathName:path] autorelease];
+}
+
+- (void)choose:(NSArray*)urls
+{
+    [mSelectedFiles removeAllObjects];
+    for (NSURL* url : tsuiEach<NSURL*>(urls))
+        [mSelectedFiles addObject:[self rowFor:[url path]]];
 }
 
 - (void)panelSelectionDidChange:(id)panel
 {
-    [mSelectedFiles removeAllObjects];
-    const auto paths = ModrigUtils::PathsFromStrings([self filesChosenIn:panel]);
-    [mSelectedFiles addObjectsFromArray:ModrigUtils::RowsFromPaths(paths)];
+    self.furtherQuestions = nil;
+    [self choose:[panel URLs]];
+}
+
+- (NSArray*)chosenFiles
+{
+    NSMutableArray* files = [NSMutableArray array];
+    for (ModrigFilePath* row : tsuiEach<ModrigFilePath*>(mSelectedFiles))
+        if (![row isKindOfClass:[ModrigFolderPath class]])
+            [files addObject:row];
+    return files;
 }
 
 - (void)openPanelOK:(id)sender

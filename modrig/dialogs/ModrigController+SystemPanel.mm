@@ -2,8 +2,6 @@
 
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
-#include "modrig/dialogs/Paths.h"
-
 @implementation ModrigController (SystemPanel)
 
 - (void)setupPanelWithoutButtons:(NSOpenPanel*)panel
@@ -16,13 +14,28 @@
     return [self panel:panel shouldShowFilename:[url path]];
 }
 
-// Whatever was chosen in the History before: who presses the panel's own button means the panel's files.
+- (void)load:(NSArray*)urls
+{
+    [self choose:urls];
+    [self openPanelOK:mOpenPanel];
+}
+
+// A press of the button may lead to a question about each file that is chosen, or to one, since that is
+// refused.
+- (BOOL)isFirstQuestion:(NSURL*)url of:(NSArray*)chosen
+{
+    const BOOL isFirst = [chosen count] < 2 || ![self.furtherQuestions containsObject:url];
+    NSMutableArray* further = [[(isFirst ? chosen : self.furtherQuestions) mutableCopy] autorelease];
+    [further removeObject:url];
+    self.furtherQuestions = further;
+    return isFirst;
+}
+
 - (BOOL)panel:(id)panel validateURL:(NSURL*)url error:(NSError**)error
 {
-    [self panelSelectionDidChange:panel];
-    if ([mSelectedFiles count] == 0)
-        [mSelectedFiles setArray:ModrigUtils::RowsFromPaths({ModrigUtils::PathFromString([url path])})];
-    [self onLoad:panel];
+    NSArray* chosen = [panel URLs];
+    if ([self isFirstQuestion:url of:chosen])
+        [self load:[self isAnyFileIn:chosen] ? chosen : [NSArray arrayWithObject:url]];
     // The system shows every error but this one, and what there is to tell has been told.
     if (error)
         *error = [NSError errorWithDomain:NSCocoaErrorDomain code:NSUserCancelledError userInfo:nil];

@@ -30,6 +30,7 @@
     BOOL canRemoveHistory;
     NSString* message;
     NSString* shownFolder;
+    NSArray* furtherQuestions;
 }
 
 // What Load will load: `ModrigFilePath`s, from the panel's selection or the History's.
@@ -43,6 +44,8 @@
 @property (nonatomic, retain) NSString* message;
 // The path of the folder that the panel was sent to or has told of last; it may still be on its way there.
 @property (nonatomic, copy) NSString* shownFolder;
+// The URLs of the files that have been loaded, and that the panel may still ask about.
+@property (nonatomic, copy) NSArray* furtherQuestions;
 
 - (id)init;
 
@@ -114,9 +117,13 @@
 - (IBAction)onFileTypesChanged:(id)sender;
 
 - (BOOL)panel:(id)panel shouldShowFilename:(NSString*)name;
+// Makes what is chosen in the panel what Load will load, folders too; no folder is when it does.
 - (void)panelSelectionDidChange:(id)panel;
-// The paths of the files that are chosen in the panel. A folder on the way to files is none of them.
-- (NSArray*)filesChosenIn:(id)panel;
+- (void)choose:(NSArray*)urls;
+// Whether there is anything among the URLs but folders on the way to files.
+- (BOOL)isAnyFileIn:(NSArray*)urls;
+// What Load loads of that which is chosen.
+- (NSArray*)chosenFiles;
 // The action of the panel's default button.
 - (void)openPanelOK:(id)sender;
 
@@ -132,7 +139,10 @@
 - (void)setupPanelWithoutButtons:(NSOpenPanel*)panel;
 
 - (BOOL)panel:(id)panel shouldEnableURL:(NSURL*)url;
-// Loads what the panel has chosen, and answers NO: the panel stays.
+// Loads these, whatever was chosen in the History before: who presses the panel's own button means the
+// panel's files.
+- (void)load:(NSArray*)urls;
+// Loads all that the panel has chosen at the first of its questions, and answers NO: the panel stays.
 - (BOOL)panel:(id)panel validateURL:(NSURL*)url error:(NSError**)error;
 - (void)panel:(id)panel didChangeToDirectoryURL:(NSURL*)url;
 

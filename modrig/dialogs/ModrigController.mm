@@ -41,6 +41,7 @@ void cleanPanelOf(void* closing)
 @synthesize canRemoveHistory;
 @synthesize message;
 @synthesize shownFolder;
+@synthesize furtherQuestions;
 
 - (id)init
 {
@@ -59,6 +60,7 @@ void cleanPanelOf(void* closing)
     self.selectedFiles = nil;
     self.message = nil;
     self.shownFolder = nil;
+    self.furtherQuestions = nil;
     [super dealloc];
 }
 
@@ -82,12 +84,12 @@ void cleanPanelOf(void* closing)
     self.tabViewSelectedIndex = [settings getControlInt:kSettingsGroup control:kLastTabSetting];
 }
 
-// Only a panel that keeps its own button can end with it, and the files that were chosen are meant then.
+// Only a panel that keeps its own button can end with it.
 - (void)runPanel:(NSOpenPanel*)panel
 {
     [self setupOpenPanel:panel];
-    if ([panel runModal] == NSOKButton)
-        [self openPanelOK:panel];
+    if ([panel runModal] == NSModalResponseOK)
+        [self load:[panel URLs]];
 }
 
 - (void)showModrigDialog

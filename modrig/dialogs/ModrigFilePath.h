@@ -27,6 +27,9 @@
 // The same for a path that has no symbolic links in it, which is then not looked at on the disk.
 - (id)initWithResolvedPath:(NSString*)path;
 
+// What `unloadable` becomes for the path; asked once, when the row is made.
+- (BOOL)findUnloadable:(const CStdStr&)path;
+
 // `filePathName` as the module's logic takes it.
 - (CStdStr)path;
 

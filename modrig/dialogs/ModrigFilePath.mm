@@ -29,8 +29,13 @@
     if (!(self = [super init]) || !path)
         return self;
     mFilePathName = [path copy];
-    mUnloadable = ModrigUtils::IsAppUnloadAble(CStdStr(NSStringToWstring(path)));
+    mUnloadable = [self findUnloadable:CStdStr(NSStringToWstring(path))];
     return self;
+}
+
+- (BOOL)findUnloadable:(const CStdStr&)path
+{
+    return ModrigUtils::IsAppUnloadAble(path);
 }
 
 - (void)dealloc

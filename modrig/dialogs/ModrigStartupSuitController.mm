@@ -98,7 +98,7 @@ constexpr NSInteger kRemoveSegment = 1;
     NSMutableArray* filters = [NSMutableArray array];
     [TsOCModrigUtil populateModrigFileFilter:filters];
     [dialog setFileFilters:filters];
-    if ([dialog runModal] == NSOKButton)
+    if ([dialog runModal] == NSModalResponseOK)
         [self addFiles:[dialog selectedPathes]];
     [pool drain];
 }

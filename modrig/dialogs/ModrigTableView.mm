@@ -61,8 +61,8 @@ CStdStr textOfKey(const char* key)
 void copyToPasteboard(NSString* text)
 {
     NSPasteboard* pasteboard = [NSPasteboard generalPasteboard];
-    [pasteboard declareTypes:[NSArray arrayWithObject:NSStringPboardType] owner:nil];
-    [pasteboard setString:text forType:NSStringPboardType];
+    [pasteboard declareTypes:[NSArray arrayWithObject:NSPasteboardTypeString] owner:nil];
+    [pasteboard setString:text forType:NSPasteboardTypeString];
 }
 } // namespace
 

@@ -127,8 +127,13 @@ bool ApplicationIsLoaded(CStdStr path)
 
 bool IsAppUnloadAble(CStdStr path)
 {
+    return RefuseFileWithoutDot(path) || CouldBeUnloaded(path);
+}
+
+bool CouldBeUnloaded(const CStdStr& path)
+{
     // True, where `ApplicationIsLoaded` answers false: a row that nobody can place must not stay for ever.
-    if (RefuseFileWithoutDot(path))
+    if (!path.HasDot())
         return true;
     return FileTypeOfPath(path) == kCompiledModule && !IsModuleLocked(path);
 }

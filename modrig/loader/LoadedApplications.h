@@ -25,6 +25,9 @@ void PopulateLoadedApps();
 // kCannotLoadFile and true.
 [[nodiscard]] bool IsAppUnloadAble(CStdStr path);
 
+// The same answer without a word.
+[[nodiscard]] bool CouldBeUnloaded(const CStdStr& path);
+
 // An application that the user wants unloaded, and whether it could be unloaded when it was listed.
 struct UnloadCandidate
 {

@@ -23,7 +23,7 @@
 // The choices of file types, `TsOCFileFilter`s; the first is chosen. Without any, every file is shown.
 - (void)setFileFilters:(NSArray*)filters;
 
-// 1 (NSOKButton) when the user has chosen, otherwise 0.
+// 1 (NSModalResponseOK) when the user has chosen, otherwise 0.
 - (NSInteger)runModal;
 
 // The full paths chosen by the last run, as strings; empty after a cancelled one.

@@ -23,7 +23,7 @@ inline constexpr NSInteger kTsUIFilePanelSpareButton = 102;
 // (`panel:shouldShowFilename:`) and hears of every choice (`panelSelectionDidChange:`); the default button
 // ends the panel unless the delegate refuses one of the files (`panel:validateURL:error:`).
 // `validateVisibleColumns` asks it again, and keeps folder, selection and place. `runModal` ends with
-// NSOKButton unless the default button has been given another target.
+// NSModalResponseOK unless the default button has been given another target.
 TESSEL_API NSOpenPanel* tsuiMakeFilePanel();
 
 // Tells the person in a message box when what stands in the name field names no file; answers whether it did.

@@ -77,8 +77,8 @@ TEST_F(FilePanelNames, EnableTheDefaultButton)
 
 TEST_F(FilePanelNames, AreTakenWithReturn)
 {
-    EXPECT_EQ(NSOKButton, run({[this] { typeNameInto(mPanel, in("sub/inner.lsp")); },
-                               [this] { pressKey(mPanel, @"\r"); }}));
+    EXPECT_EQ(NSModalResponseOK, run({[this] { typeNameInto(mPanel, in("sub/inner.lsp")); },
+                                      [this] { pressKey(mPanel, @"\r"); }}));
     EXPECT_THAT(chosen(), ElementsAre(file("sub/inner.lsp")));
 }
 

@@ -140,8 +140,9 @@ TEST_F(FilePanelList, TakesRangesWithShiftAndArrowsAndEverythingWithControlA)
 TEST_F(FilePanelList, EndsWithTheFileThatIsDoubleClicked)
 {
     writeFiles({"a.lsp", "b.lsp"});
-    EXPECT_EQ(NSOKButton, run({[this] { clickRow(table(), 1); }, [this] { return chosen().size() == 1; },
-                               [this] { clickRow(table(), 1, 0, 2); }}));
+    EXPECT_EQ(NSModalResponseOK,
+              run({[this] { clickRow(table(), 1); }, [this] { return chosen().size() == 1; },
+                   [this] { clickRow(table(), 1, 0, 2); }}));
     EXPECT_THAT(chosen(), ElementsAre(file("b.lsp")));
 }
 
@@ -353,8 +354,8 @@ TEST_F(FilePanelList, GoesIntoTheHostsOwnPackage)
 TEST_F(FilePanelList, TakesAnyOtherPackageForAFile)
 {
     writeFiles({"tool.bundle/tool"});
-    EXPECT_EQ(NSOKButton, run({[this] { selectFilesIn(mPanel, {L"tool.bundle"}); },
-                               [this] { pressKey(mPanel, @"\r"); }}));
+    EXPECT_EQ(NSModalResponseOK, run({[this] { selectFilesIn(mPanel, {L"tool.bundle"}); },
+                                      [this] { pressKey(mPanel, @"\r"); }}));
     EXPECT_THAT(chosen(), ElementsAre((mFolder / "tool.bundle").wstring()));
 }
 

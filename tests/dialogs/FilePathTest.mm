@@ -1,11 +1,14 @@
 #include "tests/dialogs/support/DialogTest.h"
 
 #import "modrig/dialogs/ModrigFilePath.h"
+#import "modrig/dialogs/ModrigFolderPath.h"
 
 #include <wincompat/winstring.h>
 
 #include <filesystem>
 #include <set>
+
+#include "modrig/messages/MessageIds.h"
 
 @interface SpecialFilePath : ModrigFilePath
 @end
@@ -119,6 +122,20 @@ TEST_F(FilePath, AsksAboutThePathAsItWasGiven)
     host().linker.setLocked((mFolder / "link.zmb").wstring());
     EXPECT_FALSE([make(path("link.zmb")) unloadable]);
     EXPECT_THAT(boxes(), IsEmpty());
+}
+
+TEST_F(FilePath, OfAFolderIsMadeWithoutAWord)
+{
+    host().linker.setLocked((mFolder / "locked.zmb").wstring());
+    const auto unloadable = [this](const char* name) -> bool
+    { return [[[[ModrigFolderPath alloc] initWithFilePathName:path(name)] autorelease] unloadable]; };
+    EXPECT_TRUE(unloadable("folder"));
+    EXPECT_TRUE(unloadable("free.zmb"));
+    EXPECT_FALSE(unloadable("locked.zmb"));
+    EXPECT_FALSE(unloadable("folder.d"));
+    EXPECT_THAT(boxes(), IsEmpty());
+    make(@"/none/folder");
+    EXPECT_THAT(boxes(), ElementsAre(Message(ModrigMessages::kCannotLoadFile, L"/none/folder")));
 }
 
 TEST_F(FilePath, EqualsAPathInOtherLetterCase)

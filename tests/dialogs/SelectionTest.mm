@@ -182,6 +182,28 @@ TEST_F(Selection, OfTheHistoryIsLoadedWhenThePanelLeavesNothingChosen)
     EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"old.zmb")));
 }
 
+TEST_F(Selection, OfTheHistoryIsLoadedWhenThePanelHasAFolderChosen)
+{
+    gHistoryList.AddTail(file("old.zmb"));
+    mFolder.write("folder/inside.txt", "");
+    open();
+    select(historyTable(), {0});
+    [mController panelSelectionDidChange:panelWith({"folder"})];
+    [mController onLoad:nil];
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"old.zmb")));
+    EXPECT_THAT(boxes(), IsEmpty());
+}
+
+TEST_F(Selection, OfTheHistoryTakesInWhatIsAFolderNow)
+{
+    mFolder.write("old.zmb/inside.txt", "");
+    gHistoryList.AddTail(CStdStr((mFolder / "old.zmb").wstring()));
+    open();
+    select(historyTable(), {0});
+    [mController onLoad:nil];
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kOneLoaded, L"old.zmb")));
+}
+
 TEST_F(Selection, OfNothingIsAnsweredInTheMessageLine)
 {
     open();

@@ -62,10 +62,6 @@ int gHeldPaths = 0;
 
 @end
 
-@interface ModrigController (Choosing)
-- (void)chooseWhatIsStillSelected;
-@end
-
 // Tells of a new selection at once when it moves.
 @interface HastyPanel : NSObject
 {
@@ -87,6 +83,38 @@ int gHeldPaths = 0;
     [controller panelSelectionDidChange:self];
     [controller panel:self didChangeToDirectoryURL:[NSURL fileURLWithPath:@"/"]];
     heldWhenMoved = gHeldPaths;
+}
+
+@end
+
+// Tells of what is chosen in it whenever it filters again.
+@interface PanelThatTells : NSObject
+{
+@public
+    ModrigController* controller;
+    id chosen;
+}
+@end
+
+@implementation PanelThatTells
+
+- (NSArray*)URLs
+{
+    return [chosen URLs];
+}
+
+- (void)validateVisibleColumns
+{
+    [controller panelSelectionDidChange:self];
+}
+
+- (NSURL*)directoryURL
+{
+    return [NSURL fileURLWithPath:@"/"];
+}
+
+- (void)setDirectoryURL:(NSURL*)folder
+{
 }
 
 @end
@@ -164,6 +192,30 @@ protected:
         return [mController panel:mPanel shouldEnableURL:[NSURL fileURLWithPath:text(path.wstring())]];
     }
     std::wstring shownFolder() { return wide([mController shownFolder]); }
+    // The dialog asks that one, and not its own.
+    void usePanel(id panel)
+    {
+        object_setIvar(mController, class_getInstanceVariable([ModrigController class], "mOpenPanel"), panel);
+    }
+    // Asks about one of its files, as when its button is pressed.
+    BOOL asks(id panel, const char* name)
+    {
+        return [mController panel:panel validateURL:[NSURL fileURLWithPath:path(name)] error:nullptr];
+    }
+    // As the panel tells it.
+    void choose(std::initializer_list<std::string> names)
+    {
+        [mController panelSelectionDidChange:panelWithSelected(paths(names))];
+    }
+    // The same, in a panel that goes on answering so until the dialog has its own again.
+    void chooseForLong(std::initializer_list<std::string> names)
+    {
+        PanelThatTells* panel = [[[PanelThatTells alloc] init] autorelease];
+        panel->controller = mController;
+        panel->chosen = panelWithSelected(paths(names));
+        usePanel(panel);
+        choose(names);
+    }
     void tellOfFolder(NSString* path)
     {
         [mController panel:mPanel didChangeToDirectoryURL:[NSURL fileURLWithPath:path]];
@@ -220,6 +272,46 @@ TEST_F(SystemPanel, IsRefusedEveryFileOnceThatIsLoaded)
     EXPECT_EQ(NSUserCancelledError, [error code]);
 }
 
+TEST_F(SystemPanel, LoadsAllThatIsChosenAtTheFirstOfItsQuestionsAndNothingAtTheOthers)
+{
+    open();
+    id panel = panelWithSelected(paths({"a.lsp", "b.lsp", "c.lsp"}));
+    const auto press = [=, this]
+    {
+        for (const char* name : {"a.lsp", "b.lsp", "c.lsp"})
+            EXPECT_FALSE(asks(panel, name));
+    };
+    for (const char* name : {"a.lsp", "b.lsp", "c.lsp"})
+        file(name);
+    press();
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"3")));
+    press();
+    EXPECT_EQ(2u, lines().size());
+}
+
+TEST_F(SystemPanel, LoadsAtEveryPressThoughItAsksNoMoreOnceItIsRefused)
+{
+    for (const char* name : {"a.lsp", "b.lsp"})
+        file(name);
+    open();
+    asks(panelWithSelected(paths({"a.lsp", "b.lsp"})), "a.lsp");
+    asks(panelWithSelected(paths({"a.lsp", "b.lsp"})), "a.lsp");
+    EXPECT_EQ(2u, lines().size());
+    asks(panelWithSelected(paths({"b.lsp"})), "b.lsp"); // though it has been waited for
+    EXPECT_EQ(3u, lines().size());
+}
+
+TEST_F(SystemPanel, LoadsWhatIsChosenAnewThoughItHasNotAskedAboutItBefore)
+{
+    for (const char* name : {"a.lsp", "b.lsp", "c.lsp"})
+        file(name);
+    open();
+    asks(panelWithSelected(paths({"a.lsp", "b.lsp"})), "a.lsp");
+    choose({"b.lsp", "c.lsp"});
+    asks(panelWithSelected(paths({"b.lsp", "c.lsp"})), "b.lsp");
+    EXPECT_EQ(2u, lines().size());
+}
+
 TEST_F(SystemPanel, LoadsItsOwnFilesWhateverIsChosenInTheHistory)
 {
     gHistoryList.AddTail(CStdStr(file("old.zmb")));
@@ -243,16 +335,23 @@ TEST_F(SystemPanel, LoadsTheFileThatItAsksAboutWhenItTellsOfNone)
     EXPECT_TRUE(host().linker.isLoaded(file("one.zmb")));
 }
 
-TEST_F(SystemPanel, LoadsWhatWasChosenWhenItEndsWithIt)
+TEST_F(SystemPanel, LoadsWhatWasChosenWhenItEndsWithItWhateverIsChosenInTheHistory)
 {
+    gHistoryList.AddTail(CStdStr(file("old.zmb")));
     file("one.zmb");
     host().registry.setValue(kSettingsOfPanel, L"InitialPath", mFolder.path().wstring());
     {
         const ModalSteps steps({[] { selectFilesIn(runningPanel(), {L"one.zmb"}); },
-                                [] { [NSApp stopModalWithCode:NSOKButton]; }});
+                                [this]
+                                {
+                                    ModrigController* dialog = [TsOCModrigUtil getModrigController];
+                                    select([dialog valueForKey : @"historyListTableView"], { 0 });
+                                },
+                                [] { [NSApp stopModalWithCode:NSModalResponseOK]; }});
         ModrigUtils::RunModrigDialog();
     }
     EXPECT_TRUE(host().linker.isLoaded(file("one.zmb")));
+    EXPECT_FALSE(host().linker.isLoaded(file("old.zmb")));
 }
 
 TEST_F(SystemPanel, LoadsNothingWhenItIsCancelled)
@@ -312,24 +411,36 @@ TEST_F(SystemPanel, GetsAPathThatOutlivesTheRowItComesFrom)
     [[mController selectedFiles] setArray:[NSArray arrayWithObject:row]];
     [row release];
     [pool drain];
-    Ivar slot = class_getInstanceVariable([ModrigController class], "mOpenPanel");
-    object_setIvar(mController, slot, panel);
+    usePanel(panel);
     pool = [[NSAutoreleasePool alloc] init];
     const BOOL opened = [mController openTesselFolder];
     [pool drain];
-    object_setIvar(mController, slot, mPanel);
+    usePanel(mPanel);
     EXPECT_TRUE(opened);
     EXPECT_THAT(selectedFiles(), IsEmpty());
     EXPECT_EQ(1, panel->heldWhenMoved);
 }
 
-TEST_F(SystemPanel, HasFoldersThatAreNoFilesToLoad)
+TEST_F(SystemPanel, HasARowForEachThatIsChosenForFoldersToo)
 {
     mFolder.write("folder/inside.txt", "");
     mFolder.write("tool.bundle/tool", "");
     open();
-    [mController panelSelectionDidChange:panelWithSelected(paths({"folder", "one.zmb", "tool.bundle"}))];
-    EXPECT_THAT(selectedFiles(), ElementsAre(file("one.zmb"), file("tool.bundle")));
+    choose({"folder", "one.zmb", "tool.bundle"});
+    EXPECT_THAT(selectedFiles(), ElementsAre(file("folder"), file("one.zmb"), file("tool.bundle")));
+    EXPECT_THAT(boxes(), IsEmpty());
+}
+
+TEST_F(SystemPanel, HasFoldersThatAreLeftOutOfALoad)
+{
+    mFolder.write("folder/inside.txt", "");
+    mFolder.write("tool.bundle/tool", "");
+    file("one.zmb");
+    open();
+    choose({"folder", "one.zmb", "tool.bundle"});
+    [mController onLoad:nil];
+    EXPECT_THAT(lines(), ElementsAre(Message(ModrigMessages::kManyLoaded, L"2")));
+    EXPECT_THAT(rowsOf(loadedApps()), ElementsAre(file("one.zmb"), file("tool.bundle")));
     EXPECT_THAT(boxes(), IsEmpty());
 }
 
@@ -337,13 +448,62 @@ TEST_F(SystemPanel, SaysThatNothingIsChosenWhenAFolderIsAllThatIs)
 {
     mFolder.write("folder/inside.txt", "");
     open();
-    Ivar slot = class_getInstanceVariable([ModrigController class], "mOpenPanel");
-    object_setIvar(mController, slot, panelWithSelected(paths({"folder"})));
-    [mController chooseWhatIsStillSelected];
-    object_setIvar(mController, slot, mPanel);
+    chooseForLong({"folder"});
+    [mController onLoad:nil];
+    usePanel(mPanel);
     EXPECT_EQ(wide([TsOCModrigUtil modrigLoadString:@"IDS_MODRIG_NOTHING_CHOSEN"]), message());
     EXPECT_THAT(boxes(), IsEmpty());
     EXPECT_THAT(lines(), IsEmpty());
+}
+
+TEST_F(SystemPanel, StillHasItsFilesBesideAFolderAfterARemovalFromTheHistory)
+{
+    gHistoryList.AddTail(CStdStr(file("old.zmb")));
+    mFolder.write("folder/inside.txt", "");
+    file("one.zmb");
+    open();
+    select(historyTable(), {0});
+    [mController onRemove:nil];
+    chooseForLong({"folder", "one.zmb"});
+    [[mController selectedFiles] removeAllObjects];
+    [mController onLoad:nil];
+    usePanel(mPanel);
+    EXPECT_TRUE(host().linker.isLoaded(file("one.zmb")));
+    EXPECT_THAT(boxes(), IsEmpty());
+}
+
+TEST_F(SystemPanel, HasNoFolderThatTakesThePlaceOfTheHistoryAfterAnotherFileType)
+{
+    gHistoryList.AddTail(CStdStr(file("old.zmb")));
+    mFolder.write("folder/inside.txt", "");
+    open();
+    chooseForLong({"folder"});
+    select(historyTable(), {0});
+    chooseFileType(kLispFileType);
+    usePanel(mPanel);
+    EXPECT_THAT(selectedFiles(), ElementsAre(file("old.zmb")));
+}
+
+TEST_F(SystemPanel, LoadsTheFileThatItAsksAboutWhenItTellsOfAFolder)
+{
+    mFolder.write("folder/inside.txt", "");
+    file("one.zmb");
+    open();
+    [mController panel:panelWithSelected(paths({"folder"}))
+           validateURL:[NSURL fileURLWithPath:path("one.zmb")]
+                 error:nullptr];
+    EXPECT_TRUE(host().linker.isLoaded(file("one.zmb")));
+}
+
+TEST_F(SystemPanel, LoadsNothingWhenItAsksAboutAFolder)
+{
+    mFolder.write("folder/inside.txt", "");
+    open();
+    [mController panel:panelWithSelected([NSArray array])
+           validateURL:[NSURL fileURLWithPath:path("folder")]
+                 error:nullptr];
+    EXPECT_THAT(lines(), IsEmpty());
+    EXPECT_THAT(boxes(), IsEmpty());
 }
 
 TEST_F(SystemPanel, IsClosedWithTheListsStoredAlsoWhenThatFails)

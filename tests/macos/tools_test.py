@@ -9,6 +9,7 @@ from support import ROOT
 
 ICONUTIL = ROOT / "tools/macos/bin/iconutil"
 IBTOOL = ROOT / "tools/macos/bin/ibtool"
+RUNS_PROGRAM = ROOT / "tools/macos/bin/runs_program"
 LAYOUT = '<document type="com.apple.InterfaceBuilder3.Cocoa.XIB"><objects/></document>'
 
 
@@ -55,6 +56,24 @@ class IconMaker(unittest.TestCase):
 
     def test_a_picture_of_an_unknown_name_is_refused(self):
         self.assertEqual(self.made({"icon_48x48.png": 48}), (1, b""))
+
+
+class RunsProgram(unittest.TestCase):
+    def run_program(self, program, *words):
+        with tempfile.TemporaryDirectory() as folder:
+            source, result = Path(folder) / "a.lsp", Path(folder) / "a.qbc"
+            source.write_text("(+ 1 2)", encoding="utf-8")
+            done = subprocess.run([RUNS_PROGRAM, program, source, *words, "-o", result], capture_output=True, text=True, check=False)
+            return done.returncode, result.exists()
+
+    def test_the_compiler_of_lisp_makes_a_file(self):
+        self.assertEqual(self.run_program("/build/Tessel.app/Contents/MacOS/tesselc"), (0, True))
+
+    def test_another_program_is_not_run(self):
+        self.assertEqual(self.run_program("/build/tests/unit_tests"), (1, False))
+
+    def test_a_word_that_the_compiler_does_not_take_is_refused(self):
+        self.assertEqual(self.run_program("/build/tesselc", "--fast"), (2, False))
 
 
 if __name__ == "__main__":

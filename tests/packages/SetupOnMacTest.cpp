@@ -27,7 +27,7 @@ protected:
         program("bin/uname", "echo Darwin");
         program("bin/xcode-select", "[ \"$1\" = -p ] && echo '" + (folder / "Xcode").string() + "'");
         program("Xcode/usr/bin/ibtool", "");
-        has(std::string(kAllForBuilding) + "googletest lief ansible doxygen");
+        has(std::string(kAllForBuilding) + "googletest doxygen");
         for (const char* installer : {"bin/apt-get", "bin/sudo"})
             program(installer, "echo \"Asked to install: $*\"");
     }
@@ -70,7 +70,7 @@ TEST_F(SetupOnMac, SaysWhatIsMissingAndTheCommandThatBringsItAndInstallsNothing)
     EXPECT_EQ(outcome.status, 1);
     EXPECT_THAT(outcome.output,
                 HasSubstr("brew install pkgconf bdw-gc sqlite openssl@3 libedit cli11 nlohmann-json gettext "
-                          "boost llvm lld librsvg googletest lief ansible doxygen\n"));
+                          "boost llvm lld librsvg googletest doxygen\n"));
     EXPECT_THAT(outcome.output, Not(HasSubstr("Asked to install")));
 }
 
@@ -79,7 +79,7 @@ TEST_F(SetupOnMac, WantsForRunningNothingThatOnlyTheTestsNeed)
     has(kAllForBuilding);
     EXPECT_EQ(setup("--run").status, 0);
     EXPECT_EQ(setup("--build").status, 0);
-    EXPECT_THAT(setup().output, HasSubstr("brew install googletest lief ansible doxygen\n"));
+    EXPECT_THAT(setup().output, HasSubstr("brew install googletest doxygen\n"));
 }
 
 TEST_F(SetupOnMac, AsksForTheDeveloperTools)

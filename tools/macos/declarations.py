@@ -32,10 +32,9 @@ BY_HAND = {"NSNotFound", "NSZeroPoint", "NSZeroSize", "NSZeroRect", "NSAppKitVer
 # What we call though the system's headers say, since when, that it should not be called any more.
 OUT_OF_USE = {
     "setDirectory:": "10.6", "directory": "10.6", "filenames": "10.6", "panel:shouldShowFilename:": "10.6",
-    "FSPathMakeRef": "10.8", "NSOKButton": "10.10", "NSCancelButton": "10.10", "NSFilenamesPboardType": "10.14",
-    "NSStringPboardType": "10.14", "NSAlternateKeyMask": "10.12", "NSAnyEventMask": "10.12", "NSApplicationDefined": "10.12",
-    "NSCommandKeyMask": "10.12", "NSControlKeyMask": "10.12", "NSInformationalAlertStyle": "10.12", "NSKeyDown": "10.12",
-    "NSLeftMouseDown": "10.12", "NSLeftMouseUp": "10.12", "NSShiftKeyMask": "10.12", "NSWarningAlertStyle": "10.12",
+    "FSPathMakeRef": "10.8", "NSFilenamesPboardType": "10.14", "NSAnyEventMask": "10.12", "NSApplicationDefined": "10.12",
+    "NSClosableWindowMask": "10.12", "NSKeyDownMask": "10.12", "NSLeftMouseDown": "10.12", "NSLeftMouseUp": "10.12",
+    "NSRoundedBezelStyle": "10.14", "NSShiftKeyMask": "10.12", "NSTitledWindowMask": "10.12",
 }
 
 

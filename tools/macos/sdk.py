@@ -39,6 +39,17 @@ add_library(Boost::locale UNKNOWN IMPORTED)
 set_target_properties(Boost::locale PROPERTIES INTERFACE_LINK_LIBRARIES Boost::headers
   IMPORTED_LOCATION "${CMAKE_CURRENT_LIST_DIR}/../../../lib/libboost_locale.tbd")
 """
+# From its sources, which Debian has; Homebrew's comes with the same names.
+GTEST = """set(sources "/usr/src/googletest")
+add_library(gmock STATIC EXCLUDE_FROM_ALL "${sources}/googletest/src/gtest-all.cc" "${sources}/googlemock/src/gmock-all.cc")
+target_include_directories(gmock SYSTEM PUBLIC "${sources}/googletest/include" "${sources}/googlemock/include"
+  PRIVATE "${sources}/googletest" "${sources}/googlemock")
+target_compile_options(gmock PRIVATE -w)
+add_library(gmock_main STATIC EXCLUDE_FROM_ALL "${sources}/googlemock/src/gmock_main.cc")
+target_link_libraries(gmock_main PUBLIC gmock)
+add_library(GTest::gmock ALIAS gmock)
+add_library(GTest::gmock_main ALIAS gmock_main)
+"""
 PACKAGES = {"sqlite3": "-lsqlite3", "icu-uc": "-licuuc -licudata", "libedit": "-ledit"}
 
 
@@ -126,12 +137,12 @@ def put_libraries(sdk, folder, tables, listings):
     shutil.copy(folder / "libSystem.tbd", sdk / "usr/lib/libSystem.tbd")
     places = (f"/usr/lib/{machine()}", "/usr/lib")
     cpp = set().union(*(stubs.exported_on_linux(found_here(f"lib{name}.so.1", places)) for name in ("c++", "c++abi")))
-    write(sdk / "usr/lib/libc++.tbd", stubs.stub("/usr/lib/libc++.1.dylib", cpp))
+    write(sdk / "usr/lib/libc++.tbd", stubs.stub("/usr/lib/libc++.1.dylib", cpp | set(stubs.CPP_OF_A_MAC)))
     for name in OTHERS:
         symbols = stubs.exported_on_linux(found_here(f"lib{name}.so", places))
         write(sdk / f"usr/local/lib/lib{name}.tbd", stubs.stub(f"/usr/local/lib/lib{name}.dylib", symbols))
     write(sdk / "usr/local/lib/libboost_locale.tbd", stubs.stub("/usr/local/lib/libboost_locale.dylib", stubs.BOOST_LOCALE))
-    for name, text in (("CLI11", CLI11), ("Boost", BOOST), ("nlohmann_json", NLOHMANN_JSON)):
+    for name, text in (("CLI11", CLI11), ("Boost", BOOST), ("nlohmann_json", NLOHMANN_JSON), ("GTest", GTEST)):
         write(sdk / f"usr/local/share/cmake/{name}/{name}Config.cmake", text)
     for name, libraries in PACKAGES.items():
         write(sdk / f"usr/local/lib/pkgconfig/{name}.pc",

@@ -17,6 +17,8 @@ BOOST_LOCALE = [
     "__ZN5boost6locale11gnu_gettext21create_messages_facetIcEEPNS0_14message_formatIT_EERKNS1_13messages_infoE",
     "__ZN5boost6locale19base_message_formatIcE2idE",
 ]
+# What the C++ library of Linux has for another kind of number.
+CPP_OF_A_MAC = ["__ZNSt3__120__libcpp_atomic_waitEPVKvx"]
 CORE_FOUNDATION = ["___CFConstantStringClassReference"]
 
 

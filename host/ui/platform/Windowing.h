@@ -36,6 +36,10 @@ void showAccessoryView(NSOpenPanel* panel, NSView* view);
 // Sends the panel into the folder. It may get there later.
 void showFolder(NSOpenPanel* panel, NSString* folder);
 
-// Carries out what the screen still has to show.
-void flushScreen();
+// Before windows open: the program gets the keyboard.
+void comeToFront();
+
+// After the last has closed: what the screen still has to show is carried out, and the keyboard goes back to
+// whoever had it.
+void leaveScreen();
 } // namespace tessel::windowing

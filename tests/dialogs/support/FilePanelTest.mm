@@ -45,7 +45,7 @@ NSInteger FilePanelTest::run(std::vector<ModalStep> steps, const std::string& in
 void FilePanelTest::use(std::vector<ModalStep> steps, const std::string& inFolder)
 {
     steps.push_back(ModalStep([this] { [mPanel cancel:nil]; }));
-    EXPECT_EQ(NSCancelButton, run(std::move(steps), inFolder));
+    EXPECT_EQ(NSModalResponseCancel, run(std::move(steps), inFolder));
 }
 
 std::vector<std::wstring> FilePanelTest::chosen()

@@ -6,6 +6,17 @@
 
 namespace tessel::windowing
 {
+namespace
+{
+void addMenu(NSMenu* bar, NSMenu* menu)
+{
+    NSMenuItem* item = [[[NSMenuItem alloc] initWithTitle:[menu title] action:nullptr
+                                            keyEquivalent:@""] autorelease];
+    [item setSubmenu:menu];
+    [bar addItem:item];
+}
+} // namespace
+
 // Command with a letter is a matter of the Edit menu here, which a host without a menu bar has not got.
 void takeTextKeys()
 {
@@ -16,11 +27,10 @@ void takeTextKeys()
     [edit addItemWithTitle:word(@"COPY") action:@selector(copy:) keyEquivalent:@"c"];
     [edit addItemWithTitle:word(@"PASTE") action:@selector(paste:) keyEquivalent:@"v"];
     [edit addItemWithTitle:word(@"SELECT_ALL") action:@selector(selectAll:) keyEquivalent:@"a"];
-    NSMenuItem* item = [[[NSMenuItem alloc] initWithTitle:word(@"EDIT") action:nullptr
-                                            keyEquivalent:@""] autorelease];
-    [item setSubmenu:edit];
     NSMenu* bar = [[[NSMenu alloc] initWithTitle:@""] autorelease];
-    [bar addItem:item];
+    // Whichever comes first is taken for the program's own menu, and shows its name.
+    addMenu(bar, [[[NSMenu alloc] initWithTitle:@"Tessel"] autorelease]);
+    addMenu(bar, edit);
     [NSApp setMainMenu:bar];
 }
 } // namespace tessel::windowing

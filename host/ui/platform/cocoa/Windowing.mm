@@ -40,7 +40,7 @@ void runMessage(NSString* text, NSString* detail, bool warning)
     // The system sets the second text in smaller type, and lets it be selected.
     [alert setMessageText:[detail length] ? text : @"Tessel"];
     [alert setInformativeText:[detail length] ? detail : text];
-    [alert setAlertStyle:warning ? NSWarningAlertStyle : NSInformationalAlertStyle];
+    [alert setAlertStyle:warning ? NSAlertStyleWarning : NSAlertStyleInformational];
     [alert addButtonWithTitle:@"OK"];
     [alert runModal];
 }
@@ -51,7 +51,7 @@ NSString* chooseFile(NSString* folder, NSString* name, bool mayBeNew)
     NSSavePanel* panel = mayBeNew ? [NSSavePanel savePanel] : [NSOpenPanel openPanel];
     [panel setDirectoryURL:[NSURL fileURLWithPath:folder]];
     [panel setNameFieldStringValue:name];
-    return [panel runModal] == NSOKButton ? [[panel URL] path] : nil;
+    return [panel runModal] == NSModalResponseOK ? [[panel URL] path] : nil;
 }
 
 // The panel hides it behind a button of its own unless it is told not to.
@@ -67,8 +67,28 @@ void showFolder(NSOpenPanel* panel, NSString* folder)
     [panel setDirectoryURL:[NSURL fileURLWithPath:folder isDirectory:YES]];
 }
 
-void flushScreen()
+namespace
 {
+// Who was in front when windows opened: the terminal that Tessel runs in.
+NSRunningApplication* gBefore = nil;
+} // namespace
+
+void comeToFront()
+{
+    NSRunningApplication* front = [[NSWorkspace sharedWorkspace] frontmostApplication];
+    if (front && ![front isEqual:[NSRunningApplication currentApplication]])
+    {
+        [gBefore release];
+        gBefore = [front retain];
+    }
+    [NSApp activateIgnoringOtherApps:YES];
+}
+
+// The program would stay in front without a window, and keys would go nowhere.
+void leaveScreen()
+{
+    if ([NSApp isActive])
+        [gBefore activateWithOptions:0];
 }
 
 namespace

@@ -15,5 +15,5 @@ NSString* tessel::windowing::chooseFile(NSString* folder, NSString* name, bool m
     static_cast<void>([panel filenames]);
     if ([name length])
         [panel beginTyping:name];
-    return [panel runModal] == NSOKButton ? [panel filename] : nil;
+    return [panel runModal] == NSModalResponseOK ? [panel filename] : nil;
 }

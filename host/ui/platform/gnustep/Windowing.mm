@@ -109,7 +109,13 @@ void showFolder(NSOpenPanel* panel, NSString* folder)
     [panel setDirectory:folder];
 }
 
-void flushScreen()
+void comeToFront()
+{
+    [NSApp activateIgnoringOtherApps:YES];
+}
+
+// The display gives the keyboard on by itself.
+void leaveScreen()
 {
     completeRequests([GSCurrentServer() serverDevice]);
 }

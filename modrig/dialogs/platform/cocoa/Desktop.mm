@@ -4,12 +4,12 @@ namespace ModrigPlatform
 {
 bool IsCommand(NSEvent* event)
 {
-    return [event modifierFlags] & NSCommandKeyMask;
+    return [event modifierFlags] & NSEventModifierFlagCommand;
 }
 
 bool IsAlternate(NSEvent* event)
 {
-    return [event modifierFlags] & NSAlternateKeyMask;
+    return [event modifierFlags] & NSEventModifierFlagOption;
 }
 
 // Command alone with a number is the panel's: icons, list, columns.

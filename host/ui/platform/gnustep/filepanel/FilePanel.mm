@@ -247,14 +247,14 @@ template <class Function> Function windowMethod(SEL selector)
     if ([self goIntoFolder] || [self tellOfMissingFile] || mState->chosen.empty() ||
         ![self delegateTakesChoice])
         return;
-    [NSApp stopModalWithCode:NSOKButton];
+    [NSApp stopModalWithCode:NSModalResponseOK];
 }
 
 // A window over the panel runs a modal session of its own, which is not this panel's to end.
 - (void)cancel:(id)sender
 {
     if ([NSApp modalWindow] == self)
-        [NSApp stopModalWithCode:NSCancelButton];
+        [NSApp stopModalWithCode:NSModalResponseCancel];
 }
 
 // The toolkit asks this of every key before anybody else gets it.
