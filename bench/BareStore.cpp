@@ -128,25 +128,32 @@ bool insertAll(const Store& store, std::size_t count, std::string (*pathOf)(std:
     }
     return all;
 }
+
+bool readAll(Store& store, std::size_t count)
+{
+    if (!store.run("BEGIN"))
+        return false;
+    bool all = true;
+    {
+        const sqlite3_int64 key = historyOf(store, count);
+        Query read(store, "SELECT data FROM value WHERE key=?1 AND fold=?2");
+        for (std::size_t number = 1; number <= count; ++number)
+        {
+            const std::string fold = foldOf(number);
+            read.bind(1, key);
+            read.bind(2, fold);
+            all = read.hasRow() && !read.text().empty() && all;
+            read.reset();
+        }
+    }
+    return store.run("COMMIT") && all;
+}
 } // namespace
 
 bool readBare(const std::filesystem::path& registry, std::size_t count)
 {
     Store store(registry, SQLITE_OPEN_READONLY);
-    if (!store.run("BEGIN"))
-        return false;
-    const sqlite3_int64 key = historyOf(store, count);
-    Query read(store, "SELECT data FROM value WHERE key=?1 AND fold=?2");
-    bool all = true;
-    for (std::size_t number = 1; number <= count; ++number)
-    {
-        const std::string fold = foldOf(number);
-        read.bind(1, key);
-        read.bind(2, fold);
-        all = read.hasRow() && !read.text().empty() && all;
-        read.reset();
-    }
-    return store.run("COMMIT") && all;
+    return readAll(store, count);
 }
 
 bool makeBare(const std::filesystem::path& registry, const std::filesystem::path& file)
@@ -160,14 +167,30 @@ bool makeBare(const std::filesystem::path& registry, const std::filesystem::path
     return made && store.run("INSERT INTO key VALUES(1, 1, 'root', 'root', 0)");
 }
 
-bool writeBare(const std::filesystem::path& file, std::size_t count, bool removeFirst,
-               std::string (*pathOf)(std::size_t))
+class BareStore::Connection : public Store
 {
-    Store store(file, SQLITE_OPEN_READWRITE);
-    bool written = store.run("PRAGMA synchronous=FULL") && store.run("BEGIN IMMEDIATE");
+public:
+    using Store::Store;
+};
+
+BareStore::BareStore(const std::filesystem::path& file)
+    : mConnection(std::make_unique<Connection>(file, SQLITE_OPEN_READWRITE))
+{
+}
+
+BareStore::~BareStore() = default;
+
+bool BareStore::read(std::size_t count)
+{
+    return readAll(*mConnection, count);
+}
+
+bool BareStore::write(std::size_t count, bool removeFirst, std::string (*pathOf)(std::size_t))
+{
+    bool written = mConnection->run("PRAGMA synchronous=FULL") && mConnection->run("BEGIN IMMEDIATE");
     if (removeFirst)
-        written = removeAll(store, count) && written;
-    written = insertAll(store, count, pathOf) && written;
-    return store.run("COMMIT") && written;
+        written = removeAll(*mConnection, count) && written;
+    written = insertAll(*mConnection, count, pathOf) && written;
+    return mConnection->run("COMMIT") && written;
 }
 } // namespace bench

@@ -4,6 +4,7 @@
 
 #include <cstddef>
 #include <filesystem>
+#include <memory>
 #include <string>
 
 namespace bench
@@ -14,8 +15,24 @@ bool readBare(const std::filesystem::path& registry, std::size_t count);
 // Makes an empty file with the same tables and indexes as the registry's.
 bool makeBare(const std::filesystem::path& registry, const std::filesystem::path& file);
 
-// Removes the rows that an earlier run has stored in a file of `makeBare`, one by one, if it is told so, and
-// stores so many. `pathOf` answers the text of each, in UTF-8.
-bool writeBare(const std::filesystem::path& file, std::size_t count, bool removeFirst,
-               std::string (*pathOf)(std::size_t));
+// A file that stays open from one measurement to the next, as the registry's does.
+class BareStore
+{
+public:
+    explicit BareStore(const std::filesystem::path& file);
+    ~BareStore();
+    BareStore(const BareStore&) = delete;
+    BareStore& operator=(const BareStore&) = delete;
+
+    // As `readBare`, of a registry.
+    bool read(std::size_t count);
+
+    // Of a file of `makeBare`: removes the rows that an earlier run has stored, one by one, if it is told so,
+    // and stores so many. `pathOf` answers the text of each, in UTF-8.
+    bool write(std::size_t count, bool removeFirst, std::string (*pathOf)(std::size_t));
+
+private:
+    class Connection;
+    std::unique_ptr<Connection> mConnection;
+};
 } // namespace bench

@@ -4,8 +4,11 @@
 #include <malloc.h>
 #include <wincompat/winreg.h>
 
+#include <algorithm>
 #include <cwchar>
 #include <filesystem>
+#include <functional>
+#include <map>
 #include <memory>
 #include <set>
 #include <string>
@@ -13,6 +16,7 @@
 
 #include "bench/BareStore.h"
 #include "bench/Child.h"
+#include "bench/ListPeers.h"
 #include "bench/Ratios.h"
 #include "bench/Session.h"
 #include "modrig/lists/Globals.h"
@@ -23,22 +27,32 @@
 namespace
 {
 constexpr std::size_t kFew = 1'000;
+constexpr std::size_t kTwiceAsFew = 2 * kFew;
 constexpr std::size_t kMany = 100'000;
+constexpr std::size_t kMost = 1'000'000;
 constexpr int kListRepetitions = 7;
+constexpr int kMostRepetitions = 3; // seconds each
 constexpr int kFewRepetitions = 31; // short ones are noisy
+
+// What was measured and a tenth.
+constexpr double kReadToStore = 1.0;
+constexpr double kWriteToStore = 0.8;
+constexpr double kWriteNewToStore = 0.8;
+constexpr double kWriteSameToStore = 0.45;
 constexpr DWORD kBufferCharacters = 1024;
 
-std::wstring pathOf(std::size_t number)
+// Lists of an even and an odd generation have no path in common.
+std::wstring pathOf(std::size_t number, unsigned generation = 0)
 {
-    return L"/home/user/Applications/library" + std::to_wstring(number / 100) + L"/tool" +
-           std::to_wstring(number) + L".lsp";
+    return L"/home/user/Applications/library" + std::to_wstring(number / 100) +
+           (generation % 2 == 0 ? L"/tool" : L"/task") + std::to_wstring(number) + L".lsp";
 }
 
-void fill(CStringList& list, std::size_t count)
+void fill(CStringList& list, std::size_t count, unsigned generation = 0)
 {
     list.RemoveAll();
     for (std::size_t i = 0; i < count; ++i)
-        list.AddTail(pathOf(i));
+        list.AddTail(pathOf(i, generation));
 }
 
 std::wstring historyKey()
@@ -121,11 +135,11 @@ void bareWriteAll(const std::vector<std::wstring>& paths)
         bareWrite(key, entryName(i + 1), paths[i]);
 }
 
-std::vector<std::wstring> pathsUpTo(std::size_t count)
+std::vector<std::wstring> pathsOf(const CStringList& list)
 {
     std::vector<std::wstring> paths;
-    for (std::size_t i = 0; i < count; ++i)
-        paths.push_back(pathOf(i));
+    for (const CStdStr& path : list)
+        paths.push_back(path.Text());
     return paths;
 }
 
@@ -140,23 +154,18 @@ std::filesystem::path registryFile()
     return bench::workFolder() / "profile" / "registry.db";
 }
 
-std::filesystem::path bareFile(std::size_t count)
-{
-    return bench::workFolder() / ("bare" + std::to_string(count) + ".db");
-}
-
 // Whether the last of so many entries is stored.
-bool isStored(std::size_t count)
+bool isStored(std::size_t count, unsigned generation)
 {
     std::wstring data;
-    return bareRead(historyKey(), entryName(count), data) && data == pathOf(count - 1);
+    return bareRead(historyKey(), entryName(count), data) && data == pathOf(count - 1, generation);
 }
 
-bool storeAll(std::size_t count)
+bool storeAll(std::size_t count, unsigned generation = 0)
 {
     ModrigUtils::WriteHistoryFilesToRegistry();
     bench::endCommand();
-    return isStored(count);
+    return isStored(count, generation);
 }
 
 // Makes a History of that size the stored one: each size has a profile of its own, so that it is written only
@@ -165,60 +174,139 @@ void store(std::size_t count)
 {
     bench::useProfile(L"History" + std::to_wstring(count));
     static std::set<std::size_t> stored;
-    if (gHistoryList.GetCount() != count)
-        fill(gHistoryList, count);
     if (!stored.insert(count).second)
         return;
+    fill(gHistoryList, count);
     ModrigUtils::WriteHistoryFilesToRegistry();
     bench::endCommand();
+}
+
+// The same, and the list in memory is another one in all its paths; answers its generation.
+unsigned prepareOthers(std::size_t count)
+{
+    store(count);
+    static std::map<std::size_t, unsigned> generations;
+    const unsigned generation = ++generations[count];
+    fill(gHistoryList, count, generation);
+    return generation;
+}
+
+// `work` prepares what it needs, and answers the seconds that the rest took; negative when it has not done
+// what it should.
+void measureSeconds(const std::string& name, int repetitions, std::function<double()> work)
+{
+    benchmark::RegisterBenchmark(name.c_str(),
+                                 [work = std::move(work)](benchmark::State& state)
+                                 {
+                                     for (auto iteration : state)
+                                     {
+                                         static_cast<void>(iteration);
+                                         const double seconds = work();
+                                         state.SetIterationTime(seconds);
+                                         if (seconds < 0)
+                                             state.SkipWithError(
+                                                 "the stored list does not hold what it should");
+                                     }
+                                 })
+        ->UseManualTime()
+        ->Iterations(1)
+        ->Repetitions(bench::repetitions(repetitions));
+}
+
+double secondsIfDone(const std::function<bool()>& work)
+{
+    bool done = false;
+    const double seconds = bench::secondsOf([&] { done = work(); });
+    return done ? seconds : -1;
 }
 
 // `prepare` is not timed; `work` answers whether it has done what it should.
 void measure(const std::string& name, int repetitions, std::function<void()> prepare,
              std::function<bool()> work)
 {
-    benchmark::RegisterBenchmark(
-        name.c_str(),
-        [prepare = std::move(prepare), work = std::move(work)](benchmark::State& state)
-        {
-            for (auto iteration : state)
-            {
-                static_cast<void>(iteration);
-                prepare();
-                bool done = false;
-                state.SetIterationTime(bench::secondsOf([&] { done = work(); }));
-                if (!done)
-                    state.SkipWithError("the stored list does not hold what it should");
-            }
-        })
-        ->UseManualTime()
-        ->Iterations(1)
-        ->Repetitions(repetitions);
+    measureSeconds(name, repetitions,
+                   [prepare = std::move(prepare), work = std::move(work)]
+                   {
+                       prepare();
+                       return secondsIfDone(work);
+                   });
 }
 
+std::string ofHistory(std::size_t count)
+{
+    return " " + std::to_string(count) + " of History";
+}
+
+double secondsToRead(std::size_t count)
+{
+    store(count);
+    gHistoryList.RemoveAll(); // a start begins with nothing to remove
+    return secondsIfDone(
+        [count]
+        {
+            ModrigUtils::InitializeHistoryFiles();
+            return gHistoryList.GetCount() == count;
+        });
+}
+
+double secondsToWriteOthers(std::size_t count)
+{
+    const unsigned generation = prepareOthers(count);
+    return secondsIfDone([=] { return storeAll(count, generation); });
+}
+
+double secondsToWriteOthersBare(std::size_t count)
+{
+    const unsigned generation = prepareOthers(count);
+    const std::vector<std::wstring> paths = pathsOf(gHistoryList);
+    return secondsIfDone(
+        [&]
+        {
+            bareWriteAll(paths);
+            bench::endCommand();
+            return isStored(count, generation);
+        });
+}
+
+// Writing is over as many others: what it costs when every value is another one.
 void addHistory(std::size_t count, int repetitions)
 {
-    const std::string of = " " + std::to_string(count) + " of History";
-    const std::vector<std::wstring> paths = pathsUpTo(count);
-    const auto prepare = [count]
+    const std::string of = ofHistory(count);
+    measureSeconds("read" + of, repetitions, [count] { return secondsToRead(count); });
+    measureSeconds("write" + of, repetitions, [count] { return secondsToWriteOthers(count); });
+}
+
+void addBareCalls()
+{
+    const std::string of = ofHistory(kMany) + ", bare calls";
+    measure(
+        "read" + of, kListRepetitions, [] { store(kMany); }, [] { return bareReadAll(kMany); });
+    measureSeconds("write" + of, kListRepetitions, [] { return secondsToWriteOthersBare(kMany); });
+}
+
+// The least of several: what comes between is no part of it, and the two are to be taken from each other.
+double leastSeconds(double (*seconds)(std::size_t), std::size_t count)
+{
+    constexpr int kTimes = 5;
+    double least = seconds(count);
+    for (int time = 1; time < kTimes && least >= 0; ++time)
+        least = std::min(least, seconds(count));
+    return least;
+}
+
+// What a thousand entries cost beside another thousand: free of what any list costs, however short.
+void addSecondThousand()
+{
+    const auto difference = [](double (*seconds)(std::size_t))
     {
-        store(count);
+        const double few = leastSeconds(seconds, kFew);
+        const double more = leastSeconds(seconds, kTwiceAsFew);
+        return few < 0 || more < 0 ? -1 : more - few;
     };
-    measure("read" + of, repetitions, prepare,
-            [count]
-            {
-                ModrigUtils::InitializeHistoryFiles();
-                return gHistoryList.GetCount() == count;
-            });
-    measure("read" + of + ", bare calls", repetitions, prepare, [count] { return bareReadAll(count); });
-    measure("write" + of, repetitions, prepare, [count] { return storeAll(count); });
-    measure("write" + of + ", bare calls", repetitions, prepare,
-            [paths]
-            {
-                bareWriteAll(paths);
-                bench::endCommand();
-                return isStored(paths.size());
-            });
+    measureSeconds("read a second 1000 of History", kFewRepetitions,
+                   [=] { return difference(secondsToRead); });
+    measureSeconds("write a second 1000 of History", kFewRepetitions,
+                   [=] { return difference(secondsToWriteOthers); });
 }
 
 void emptyTheHistory()
@@ -230,43 +318,169 @@ void emptyTheHistory()
     fill(gHistoryList, kMany);
 }
 
-// What the store needs for the same rows, when nothing stands between them and it.
+void theSameHistory()
+{
+    bench::useProfile(L"SameHistory");
+    fill(gHistoryList, kMany);
+    static const bool stored = storeAll(kMany);
+    static_cast<void>(stored); // what is not there then is stored next, which says so
+}
+
+std::filesystem::path bareFile(const std::string& name)
+{
+    return bench::workFolder() / (name + ".db");
+}
+
+bool readStoreAlone()
+{
+    static bench::BareStore registry(registryFile());
+    return registry.read(kMany);
+}
+
+double secondsToWriteStoreAlone()
+{
+    const auto file = bareFile("as-many-before");
+    static const bool made = bench::makeBare(registryFile(), file);
+    static bench::BareStore bare(file);
+    static const bool filled = made && bare.write(kMany, false, utf8PathOf);
+    return filled ? secondsIfDone([] { return bare.write(kMany, true, utf8PathOf); }) : -1;
+}
+
+double secondsToWriteStoreAloneNoneBefore()
+{
+    const auto file = bareFile("none-before");
+    if (!bench::makeBare(registryFile(), file))
+        return -1;
+    bench::BareStore bare(file);
+    return secondsIfDone([&] { return bare.write(kMany, false, utf8PathOf); });
+}
+
+// What the store needs for the same rows, when nothing stands between them and it: read by one prepared
+// statement in one transaction, and removed one by one and inserted one by one in another.
 void addStoreAlone()
 {
-    const std::string of = " " + std::to_string(kMany) + " of History";
+    const std::string of = ofHistory(kMany);
     measure(
-        "read" + of + ", store alone", kListRepetitions, [] { store(kMany); },
-        [] { return bench::readBare(registryFile(), kMany); });
-    const auto prepare = []
-    {
-        store(kMany);
-        static const bool made = bench::makeBare(registryFile(), bareFile(kMany)) &&
-                                 bench::writeBare(bareFile(kMany), kMany, false, utf8PathOf);
-        static_cast<void>(made); // what is not there cannot be removed: the writing says so
-    };
-    measure("write" + of + ", store alone", kListRepetitions, prepare,
-            [] { return bench::writeBare(bareFile(kMany), kMany, true, utf8PathOf); });
+        "read" + of + ", store alone", kListRepetitions, [] { store(kMany); }, readStoreAlone);
+    measureSeconds("write" + of + ", store alone", kListRepetitions,
+                   []
+                   {
+                       store(kMany);
+                       return secondsToWriteStoreAlone();
+                   });
     measure("write" + of + ", none before", kListRepetitions, emptyTheHistory,
             [] { return storeAll(kMany); });
-    measure(
-        "write" + of + ", none before, store alone", kListRepetitions,
-        [] { static_cast<void>(bench::makeBare(registryFile(), bareFile(0))); },
-        [] { return bench::writeBare(bareFile(0), kMany, false, utf8PathOf); });
+    measureSeconds("write" + of + ", none before, store alone", kListRepetitions,
+                   secondsToWriteStoreAloneNoneBefore);
+    measure("write" + of + ", the same before", kListRepetitions, theSameHistory,
+            [] { return storeAll(kMany); });
 }
 
 void addStoreRatios()
 {
-    const std::string of = " " + std::to_string(kMany) + " of History";
-    for (const std::string& work : {"read" + of, "write" + of, "write" + of + ", none before"})
-        bench::addRatio({work + " / store alone", work, work + ", store alone", 2});
+    const std::string read = "read" + ofHistory(kMany);
+    const std::string write = "write" + ofHistory(kMany);
+    const std::string none = write + ", none before";
+    bench::addRatio({.what = read + " / store alone",
+                     .measured = read,
+                     .base = read + ", store alone",
+                     .most = kReadToStore,
+                     .how = "Bare SQLite looks each row up by its name, with one prepared statement in one "
+                            "transaction, in the same file, which is open before. The module's reading also "
+                            "checks the rows' checksums and looks every path up in the list."});
+    bench::addRatio({.what = write + " over others / store alone",
+                     .measured = write,
+                     .base = write + ", store alone",
+                     .most = kWriteToStore,
+                     .how =
+                         "As many other paths were stored before. Bare SQLite deletes their rows one by one "
+                         "and inserts the new ones one by one, in one transaction and with full "
+                         "synchronisation. The module asks for the same, and for the names before; the "
+                         "registry changes the rows in their places."});
+    bench::addRatio({.what = none + " / store alone",
+                     .measured = none,
+                     .base = none + ", store alone",
+                     .most = kWriteNewToStore,
+                     .how =
+                         "Nothing was stored before. Bare SQLite inserts one by one, the registry many rows "
+                         "by one statement."});
+    bench::addRatio({.what = write + " over the same / store alone, others",
+                     .measured = write + ", the same before",
+                     .base = write + ", store alone",
+                     .most = kWriteSameToStore,
+                     .how = "What closing the dialog does when no list has changed. Bare SQLite deletes and "
+                            "inserts all the same."});
 }
 
-void addHistoryRatios(const std::string& verb)
+void addHistoryRatios(const std::string& verb, double mostToCalls, double mostToFew, double mostToSecond)
 {
-    const std::string many = verb + " " + std::to_string(kMany) + " of History";
-    const std::string few = verb + " " + std::to_string(kFew) + " of History";
-    bench::addRatio({many + " / bare registry calls", many, many + ", bare calls", 2});
-    bench::addRatio({verb + " History, cost per entry at 100000 / at 1000", many, few, 1.5, kMany, kFew});
+    const std::string many = verb + ofHistory(kMany);
+    const std::string most = verb + ofHistory(kMost);
+    bench::addRatio({many + " / bare registry calls", many, many + ", bare calls", mostToCalls});
+    bench::addRatio({verb + " History, cost per entry at 1000000 / at 1000", most, verb + ofHistory(kFew),
+                     mostToFew, kMost, kFew});
+    bench::addRatio({.what = verb + " History, cost per entry at 1000000 / of a second 1000",
+                     .measured = most,
+                     .base = verb + " a second 1000 of History",
+                     .most = mostToSecond,
+                     .measuredUnits = kMost,
+                     .baseUnits = kFew,
+                     .how = "A list of 2000 less one of 1000, each the least of five: free of what a list of "
+                            "any length costs, which makes short ones dearer by the entry."});
+}
+
+// Others read and store a file of their own that is new to this process: they keep in memory what they have
+// seen.
+std::filesystem::path newFile()
+{
+    static int files = 0;
+    return bench::workFolder() / ("peer" + std::to_string(++files));
+}
+
+void addPeer(const std::string& peer,
+             bool (*storeList)(const std::filesystem::path&, std::size_t, bench::PathOf),
+             bool (*readList)(const std::filesystem::path&, std::size_t), double most, const std::string& why)
+{
+    const std::string read = "read" + ofHistory(kMany);
+    const std::string write = "write" + ofHistory(kMany);
+    measureSeconds(read + ": " + peer, kListRepetitions,
+                   [=]
+                   {
+                       const auto file = newFile();
+                       const bool stored = storeList(file, kMany, utf8PathOf);
+                       const auto unseen = newFile();
+                       std::filesystem::rename(file, unseen);
+                       return stored ? secondsIfDone([&] { return readList(unseen, kMany); }) : -1;
+                   });
+    measureSeconds(write + ": " + peer, kListRepetitions,
+                   [=]
+                   {
+                       const auto file = newFile();
+                       return secondsIfDone([&] { return storeList(file, kMany, utf8PathOf); });
+                   });
+    bench::addRatio({.what = read + " / " + peer,
+                     .measured = read,
+                     .base = read + ": " + peer,
+                     .most = most,
+                     .how = why});
+    bench::addRatio({.what = write + ", none before / " + peer,
+                     .measured = write + ", none before",
+                     .base = write + ": " + peer,
+                     .most = most,
+                     .how = why});
+}
+
+void addListPeers()
+{
+    addPeer(
+        "QSettings (INI)", bench::storeByQSettings, bench::readByQSettings, 1,
+        "It writes a new file, has it brought to the disk and gives it the old one's name; it reads a file "
+        "that this process has not seen before.");
+    addPeer(
+        "GKeyFile", bench::storeByGKeyFile, bench::readByGKeyFile, 0,
+        "It writes as QSettings does. It is quicker, and has no limit: one text file has no checksums, no "
+        "order of its own beside the names, and no journal, so that one changed value costs as much as all "
+        "of them, and two processes overwrite each other's. Its list looks for no duplicates either.");
 }
 
 // Looks a thousand paths up; every second time they differ in case from those in the list.
@@ -288,7 +502,7 @@ void addLookup(const std::string& name, std::size_t count, std::size_t firstAske
                                              asked[next++ % asked.size()], *list));
                                      }
                                  })
-        ->Repetitions(kListRepetitions)
+        ->Repetitions(bench::repetitions(kListRepetitions))
         ->MinTime(0.05);
 }
 
@@ -332,7 +546,7 @@ void addMemory()
     const struct mallinfo2 after = mallinfo2();
     const auto bytes = static_cast<double>(after.uordblks + after.hblkhd - before.uordblks - before.hblkhd);
     bench::addFigure("memory of a list entry / bytes of its path", bytes / static_cast<double>(pathBytes),
-                     "x", 3);
+                     "x", 1.75);
 }
 } // namespace
 
@@ -341,10 +555,14 @@ void addListBenchmarks()
     bench::startHost();
     addHistory(kFew, kFewRepetitions);
     addHistory(kMany, kListRepetitions);
+    addHistory(kMost, kMostRepetitions);
+    addSecondThousand();
+    addBareCalls();
     addStoreAlone();
+    addListPeers();
     addStoreRatios();
-    addHistoryRatios("read");
-    addHistoryRatios("write");
+    addHistoryRatios("read", 1.45, 1.1, 1.2);
+    addHistoryRatios("write", 1.2, 1.1, 1.15);
     addLookups();
     addMemory();
 }

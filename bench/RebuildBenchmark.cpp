@@ -20,9 +20,12 @@ namespace
 {
 constexpr int kFewModules = 100;
 constexpr int kManyModules = 1'000;
+constexpr int kMostModules = 10'000;
 constexpr int kLispFilesPerModule = 10;
 constexpr int kPaths = 1'000;
 constexpr int kRebuildRepetitions = 9;
+constexpr int kPathRepetitions = 31; // of the file system, which wobbles
+constexpr int kRepetitionsOfMost = 5; // before each of which the modules are loaded for seconds
 
 // Whether all of them were loaded.
 bool loadModules(int count)
@@ -51,9 +54,8 @@ void loadLispFiles(int count)
 }
 
 // Seconds, negative when the list does not hold then what was loaded.
-double rebuild(int modules)
+double rebuild(int modules, int lispFiles)
 {
-    const int lispFiles = modules * kLispFilesPerModule;
     const bool loaded = loadModules(modules);
     loadLispFiles(lispFiles);
     const double seconds = bench::secondsOf(ModrigUtils::PopulateLoadedApps);
@@ -62,16 +64,16 @@ double rebuild(int modules)
 }
 
 // In a child: what is loaded for one size must not be there for the other.
-void addRebuild(const std::string& name, int modules)
+void addRebuild(const std::string& name, int modules, int lispFiles)
 {
     benchmark::RegisterBenchmark(name.c_str(),
-                                 [modules](benchmark::State& state)
+                                 [modules, lispFiles](benchmark::State& state)
                                  {
                                      for (auto iteration : state)
                                      {
                                          static_cast<void>(iteration);
-                                         const double seconds =
-                                             bench::inChild([modules] { return rebuild(modules); });
+                                         const double seconds = bench::inChild(
+                                             [modules, lispFiles] { return rebuild(modules, lispFiles); });
                                          if (seconds < 0)
                                              state.SkipWithError("not everything was loaded and listed");
                                          state.SetIterationTime(seconds);
@@ -79,7 +81,7 @@ void addRebuild(const std::string& name, int modules)
                                  })
         ->UseManualTime()
         ->Iterations(1)
-        ->Repetitions(kRebuildRepetitions);
+        ->Repetitions(bench::repetitions(modules == kMostModules ? kRepetitionsOfMost : kRebuildRepetitions));
 }
 
 const std::vector<CStdStr>& existingPaths()
@@ -117,7 +119,7 @@ void addValidation(const std::string& name, Check check)
                                      if (!all)
                                          state.SkipWithError("a path is not there");
                                  })
-        ->Repetitions(kRebuildRepetitions)
+        ->Repetitions(bench::repetitions(kPathRepetitions))
         ->MinTime(0.05);
 }
 } // namespace
@@ -127,10 +129,16 @@ void addRebuildBenchmarks()
     bench::startHost();
     const std::string few = "rebuild with 100 modules, 1000 applications";
     const std::string many = "rebuild with 1000 modules, 10000 applications";
-    addRebuild(few, kFewModules);
-    addRebuild(many, kManyModules);
+    const std::string manyAlone = "rebuild with 1000 modules";
+    const std::string mostAlone = "rebuild with 10000 modules";
+    addRebuild(few, kFewModules, kFewModules * kLispFilesPerModule);
+    addRebuild(many, kManyModules, kManyModules * kLispFilesPerModule);
+    addRebuild(manyAlone, kManyModules, 0);
+    addRebuild(mostAlone, kMostModules, 0);
     bench::addRatio(
         {"rebuild, cost per application at 11000 / at 1100", many, few, 1.5, kManyModules, kFewModules});
+    bench::addRatio({"rebuild, cost per module at 10000 / at 1000", mostAlone, manyAlone, 1.7, kMostModules,
+                     kManyModules});
 
     const std::string bare = "validate 1000 paths, bare attribute calls";
     const std::string validated = "validate 1000 paths";
@@ -142,5 +150,5 @@ void addRebuildBenchmarks()
                       CStdStr found = path;
                       return ModrigUtils::ValidateFileExists(found);
                   });
-    bench::addRatio({"validating 1000 existing paths / bare attribute calls", validated, bare, 1.5});
+    bench::addRatio({"validating 1000 existing paths / bare attribute calls", validated, bare, 1.15});
 }

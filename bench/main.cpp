@@ -1,6 +1,6 @@
 // Runs one group of the benchmarks that need no display: modrig_bench GROUP. Ends non-zero when a limit is
-// missed. For each of its runs the loading group starts it again: modrig_bench load LOADER FOLDER tells
-// seconds. tools/bench and the build system read the groups out of the table below.
+// missed. For each of its runs the loading group starts it again: modrig_bench load|unload LOADER FOLDER
+// COUNT tells seconds. tools/bench and the build system read the groups out of the table below.
 #include <cstdio>
 #include <cstring>
 #include <string>
@@ -9,7 +9,8 @@
 #include "bench/Ratios.h"
 
 void addLoadingBenchmarks();
-double secondsToLoad(const std::string& loader, const std::string& folder);
+double secondsOfModules(const std::string& deed, const std::string& loader, const std::string& folder,
+                        std::size_t count);
 void addListBenchmarks();
 void addRebuildBenchmarks();
 void addStartBenchmarks();
@@ -32,9 +33,9 @@ constexpr Group kGroups[] = {{"loading", addLoadingBenchmarks},
 
 int main(int argc, char** argv)
 {
-    if (argc == 4 && std::strcmp(argv[1], "load") == 0)
+    if (argc == 5)
     {
-        const double seconds = secondsToLoad(argv[2], argv[3]);
+        const double seconds = secondsOfModules(argv[1], argv[2], argv[3], std::stoul(argv[4]));
         bench::tellSeconds(seconds);
         return seconds < 0 ? 1 : 0;
     }

@@ -32,8 +32,7 @@ std::wstring at(const Arguments& arguments, std::size_t index)
 // or stored at all.
 Failure withReason(Registry& registry, const std::wstring& whatFailed)
 {
-    const auto told = registry.endOfCommand();
-    const std::wstring reason = told ? registry.canStore().sentence() : told.sentence();
+    const std::wstring reason = registry.takeReason();
     return {whatFailed + (reason.empty() ? L"" : L" " + reason)};
 }
 

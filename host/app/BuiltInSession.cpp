@@ -19,7 +19,7 @@ constexpr std::size_t kCommandColumn = 12;
 Result<> listCommands(Parts& parts)
 {
     Table table({kCommandColumn});
-    table.addHeading(toWide(versionLine()));
+    table.addHeading(versionSentence());
     std::wstring group;
     for (const auto& command : parts.commands->descriptions())
     {
@@ -49,8 +49,7 @@ void describeCommand(Parts& parts, const CommandStack::Description& command)
 void describeCommandToCome(Parts& parts, const std::wstring& name, const std::wstring& module)
 {
     if (const CommandText* text = findCommandText(name))
-        describeCommand(parts, {text->group.english, text->name, text->usage.english, text->summary.english,
-                                text->example});
+        describeCommand(parts, CommandStack::descriptionOf(*text));
     else
         sayLine(
             parts,
@@ -112,9 +111,9 @@ Result<> changeFolder(Parts& parts, const CommandStack::Arguments& arguments)
     return succeed(parts, toText(folder));
 }
 
-Result<> tellVersion(Parts& parts, const CommandStack::Arguments&)
+Result<> tellVersion(Parts& parts, const CommandStack::Arguments& arguments)
 {
-    return succeed(parts, toWide(versionLine()));
+    return arguments.empty() ? succeed(parts, versionSentence()) : wrongUsage(parts, L"VERSION");
 }
 } // namespace
 

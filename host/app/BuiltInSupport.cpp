@@ -5,27 +5,21 @@
 
 #include "host/app/Parts.h"
 #include "host/commands/CommandTexts.h"
-#include "host/platform/HomeFolder.h"
+#include "host/commands/TypedLine.h"
+#include "host/files/TypedPath.h"
+#include "host/text/Joined.h"
 #include "host/text/Translation.h"
 
 namespace tessel
 {
 void addBuiltIn(Parts& parts, const std::wstring& name, CommandStack::BuiltIn command)
 {
-    const CommandText& text = *findCommandText(name);
-    parts.commands->addBuiltIn(
-        {text.group.english, text.name, text.usage.english, text.summary.english, text.example},
-        std::move(command));
+    parts.commands->addBuiltIn(CommandStack::descriptionOf(*findCommandText(name)), std::move(command));
 }
 
 void addBuiltIn(Parts& parts, const std::wstring& name, BuiltInCommand* command)
 {
     addBuiltIn(parts, name, CommandStack::BuiltIn(std::bind_front(command, std::ref(parts))));
-}
-
-std::wstring inPersonsLanguage(const std::wstring& english)
-{
-    return translateAndFill(english.c_str(), {});
 }
 
 void sayLine(Parts& parts, const std::wstring& sentence)
@@ -52,10 +46,7 @@ Failure wrongUsage(const Parts& parts, const std::wstring& command)
 
 std::filesystem::path typedPath(const std::wstring& typed)
 {
-    std::error_code unreachable;
-    const std::filesystem::path path = toPath(typed);
-    return std::filesystem::exists(path, unreachable) ? path
-                                                      : std::filesystem::path(withHomeFolder(path.native()));
+    return withTilde(toPath(typed));
 }
 
 Result<std::wstring> onlyFile(const Parts& parts, const std::wstring& command,
@@ -63,15 +54,12 @@ Result<std::wstring> onlyFile(const Parts& parts, const std::wstring& command,
 {
     if (arguments.size() == 1 && !arguments.front().empty())
         return arguments.front();
-    std::wstring withBlanks;
-    for (const auto& argument : arguments)
-        withBlanks += (withBlanks.empty() ? L"" : L" ") + argument;
     const Failure usage = wrongUsage(parts, command);
     if (arguments.size() < 2)
         return usage;
-    return Failure{
-        usage.sentence + L"\n" +
-        translated(L"A name with blanks in it is typed in quotes: {}", command + L" " + asPart(withBlanks))};
+    return Failure{usage.sentence + L"\n" +
+                   translated(L"A name with blanks in it is typed in quotes: {}",
+                              command + L" " + asPart(joined(arguments, L" ")))};
 }
 
 std::wstring fullPath(const Parts& parts, const std::wstring& typed)

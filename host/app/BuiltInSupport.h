@@ -18,10 +18,6 @@ void addBuiltIn(Parts& parts, const std::wstring& name, CommandStack::BuiltIn co
 // The same with one that works on the parts.
 void addBuiltIn(Parts& parts, const std::wstring& name, BuiltInCommand* command);
 
-// A text of the host's own that is kept in English, since programs read it. One that translators do not know,
-// an application's, stays.
-std::wstring inPersonsLanguage(const std::wstring& english);
-
 void sayLine(Parts& parts, const std::wstring& sentence);
 
 // Says that a command has done what it was to do; those who want it quiet know.

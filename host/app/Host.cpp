@@ -391,6 +391,14 @@ CompletionSources Host::completionSources()
         return namesOf(mParts->variables->all());
     };
     sources.files = contentOfFolder;
+    sources.entries = [this](const CompletionSources::Names& parts)
+    {
+        const AutoreleasePool pool;
+        const Interruption::Work work(mInterruption);
+        auto entries = mParts->commandRunner.entries(parts);
+        mParts->registry->storeSoFar(); // a look is no part of a command
+        return entries;
+    };
     sources.keys = [this](const std::wstring& key)
     {
         return keysBelow(*mParts->layered, key);

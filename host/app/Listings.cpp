@@ -7,6 +7,7 @@
 #include "host/applications/KeptOutWords.h"
 #include "host/text/Json.h"
 #include "host/text/Translation.h"
+#include "host/text/Version.h"
 
 namespace tessel
 {
@@ -76,14 +77,19 @@ Result<> commandList(Parts& parts, const Arguments& arguments)
     return sayDocument(parts, {{"commands", commands}});
 }
 
+Result<> versionOfProgram(Parts& parts, const Arguments& arguments)
+{
+    if (!arguments.empty())
+        return wrongUsage(parts, L"VERSION");
+    return sayDocument(parts, {{"program", kProgramName}, {"version", version()}});
+}
+
 Result<> profileList(Parts& parts, const Arguments& arguments)
 {
     if (!arguments.empty())
         return wrongUsage(parts, L"PROFILE");
-    const auto key = parts.layered->find(std::wstring(kProductRegistryRoot) + L"\\Profiles");
-    const auto names = key == Registry::kNoKey ? std::vector<std::wstring>() : parts.layered->subKeys(key);
-    return sayDocument(
-        parts, {{"current", json::text(parts.profiles.current())}, {"profiles", json::listOfTexts(names)}});
+    return sayDocument(parts, {{"current", json::text(parts.profiles.current())},
+                               {"profiles", json::listOfTexts(parts.profiles.names())}});
 }
 
 Json valueOf(const SystemVariables::Variable& variable)
@@ -116,6 +122,8 @@ void addListings(Parts& parts)
     };
     add(L"APPS", applications);
     add(L"HELP", commandList);
+    add(L"?", commandList);
+    add(L"VERSION", versionOfProgram);
     add(L"PROFILE", profileList);
     add(L"SETVAR", variableList);
 }

@@ -20,6 +20,7 @@
 #include "host/app/platform/Terminal.h"
 #include "host/commands/CommandRunner.h"
 #include "host/commands/LastWords.h"
+#include "host/commands/TypedLine.h"
 #include "host/console/Colours.h"
 #include "host/console/Console.h"
 #include "host/console/EndSignals.h"
@@ -76,7 +77,7 @@ void takeStandardDescriptors()
 void greet(CommandLine& commandLine)
 {
     commandLine.confirm(
-        translated(L"{}. Type HELP for the list of commands, QUIT to leave.", toWide(kProgramLine)));
+        translated(L"{}. Type HELP for the list of commands, QUIT to leave.", programSentence()));
 }
 
 // Nothing but documents is to be printed then.

@@ -20,9 +20,6 @@ struct ProgramStart
 // Of this program.
 ProgramStart startOfProgram(int words);
 
-// Whether a desktop did it: its first program is the parent, and there is nothing to read or to show to.
-[[nodiscard]] bool isByDesktop(const ProgramStart& start);
-
 // Lets what these words start go on in a window of a terminal when a desktop did it. No words: this
 // platform's desktops give their programs a terminal themselves. False when the program is to go on by
 // itself.

@@ -39,15 +39,16 @@ Result<> Admission::check(const std::wstring& path)
         return {};
     if (mSafe)
         return refuseInSafety();
-    const KeptOutApplication* known = mKeptOut.find(toUtf8(path));
+    const std::string file = toUtf8(path);
+    const KeptOutApplication* known = mKeptOut.find(file);
     if (known && keepsOut(*known, reason))
         return Failure{clauseOfReason(*known),
                        isOfStart(reason) && mKeptOut.wasTold(*known) ? kAlreadyTold : kKeptOut};
     if (isOfStart(reason))
-        mAskedFor.push_back(toUtf8(path));
-    if (isOfStart(reason) && mBisecting.keepsOut(mAskedFor.back()))
+        mAskedFor.push_back(file);
+    if (isOfStart(reason) && mBisecting.keepsOut(file))
         return Failure{translated(L"it is kept out at this start by BISECT"), kAlreadyTold};
-    sayWhenOnTrial(toUtf8(path));
+    sayWhenOnTrial(file);
     return {};
 }
 
@@ -116,8 +117,9 @@ std::function<std::wstring(const std::string&)> Admission::whyNotAsPlanned() con
 
 void Admission::noteLoaded(const std::wstring& path)
 {
-    if (mBisecting.keepsOut(toUtf8(path)))
-        mLoadedAllTheSame.insert(realPath(toUtf8(path)).native());
-    mKeptOut.noteLoaded(toUtf8(path), mMarker.reason() == Reason::kByHand);
+    const std::string file = toUtf8(path);
+    if (mBisecting.keepsOut(file))
+        mLoadedAllTheSame.insert(realPath(file).native());
+    mKeptOut.noteLoaded(file, mMarker.reason() == Reason::kByHand);
 }
 } // namespace tessel

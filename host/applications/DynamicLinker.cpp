@@ -43,15 +43,30 @@ std::wstring fullPathOf(const wchar_t* path)
     return failed ? full : toWide(folder.native()) + kSeparator + full;
 }
 
-// Where the path leads through all links.
-std::wstring realPathOf(const std::wstring& path)
+// Whether the path comes from the root of the file system with no part that is a detour: empty, "." or "..".
+bool isStraight(std::wstring_view path)
 {
-    return toWide(realPath(toUtf8(path)).native());
+    if (!path.starts_with(kSeparator))
+        return false;
+    while (!path.empty())
+    {
+        path.remove_prefix(1); // the separator
+        const std::wstring_view part = path.substr(0, path.find(kSeparator));
+        if (part.empty() || part == L"." || part == L"..")
+            return false;
+        path.remove_prefix(part.size());
+    }
+    return true;
 }
 
-std::wstring nameIn(const std::wstring& path)
+// Where the full path leads through all links, if that is elsewhere; empty if not. To follow links costs as
+// much as all other looks at the file, and is left out where opening it has shown that there are none.
+std::wstring otherPathOf(const std::wstring& path, const Result<ModuleFile>& file, const RegularFile& program)
 {
-    return path.substr(path.rfind(kSeparator) + 1);
+    if (file && !file->isBundle && program.reachedDirectly() && isStraight(path))
+        return {};
+    auto real = toWide(realPath(toUtf8(path)).native());
+    return real == path ? std::wstring() : real;
 }
 
 Result<> checkLoadable(const RegularFile& program)
@@ -142,9 +157,9 @@ bool DynamicLinker::loadModule(const wchar_t* path, bool sayWhyNot, bool resolve
 
 Result<> DynamicLinker::attempt(const std::wstring& path, bool resolveNow)
 {
-    const bool wasKnown = mModules.withPath(path) != nullptr;
+    const Module* wasKnown = mModules.withPath(path);
     const auto begun = LoadOutcomes::Clock::now();
-    auto loaded = loadAdmitted(path, resolveNow);
+    auto loaded = wasKnown && !mEnding ? answerForKnown(*wasKnown) : loadAdmitted(path, resolveNow);
     // By a link to what is there already nothing is loaded.
     if (!loaded || (!wasKnown && mModules.withPath(path)))
         mOutcomes.note(path, loaded, begun);
@@ -155,8 +170,6 @@ Result<> DynamicLinker::loadAdmitted(const std::wstring& path, bool resolveNow)
 {
     if (mEnding)
         return Failure{translated(L"the host is ending")};
-    if (const Module* known = mModules.withPath(path))
-        return answerForKnown(*known);
     if (auto admitted = mAdmission.check(path); !admitted)
         return admitted;
     auto loaded = loadNew(path, resolveNow);
@@ -169,8 +182,8 @@ Result<> DynamicLinker::loadNew(const std::wstring& path, bool resolveNow)
 {
     const auto file = moduleFileAt(toUtf8(path));
     const RegularFile program = programOf(file);
-    const std::wstring real = realPathOf(path);
-    if (const Module* loaded = known(real, program))
+    std::wstring otherPath = otherPathOf(path, file, program);
+    if (const Module* loaded = known(otherPath, program))
         return answerForKnown(*loaded);
     if (!file)
         return file.failure();
@@ -186,8 +199,7 @@ Result<> DynamicLinker::loadNew(const std::wstring& path, bool resolveNow)
         return opened.failure();
     std::unique_ptr<Module> module = *std::move(opened);
     module->path = path;
-    module->realPath = real;
-    module->name = nameIn(path);
+    module->otherPath = std::move(otherPath);
     module->identity = program.identity();
     return start(mModules.add(std::move(module)));
 }
@@ -301,12 +313,14 @@ Module* DynamicLinker::find(const wchar_t* path) const
     const std::wstring fullPath = fullPathOf(path);
     if (Module* module = mModules.withPath(fullPath))
         return module;
-    return known(realPathOf(fullPath), programOf(moduleFileAt(toUtf8(fullPath))));
+    const auto file = moduleFileAt(toUtf8(fullPath));
+    const RegularFile program = programOf(file);
+    return known(otherPathOf(fullPath, file, program), program);
 }
 
-Module* DynamicLinker::known(const std::wstring& realPath, const RegularFile& program) const
+Module* DynamicLinker::known(const std::wstring& otherPath, const RegularFile& program) const
 {
-    if (Module* module = mModules.withPath(realPath))
+    if (Module* module = otherPath.empty() ? nullptr : mModules.withPath(otherPath))
         return module;
     return program.opened() ? mModules.withIdentity(program.identity()) : nullptr;
 }
@@ -335,8 +349,14 @@ std::vector<DynamicLinker::LoadedModule> DynamicLinker::loadedModules() const
 {
     std::vector<LoadedModule> result;
     for (const Module* module : mModules.loaded())
-        result.push_back({module->path, module->name, module->locked});
+        result.push_back({module->path, std::wstring(module->name()), module->locked});
     return result;
+}
+
+void DynamicLinker::forEachLoaded(const std::function<void(const wchar_t* name)>& tell) const
+{
+    for (const Module* module : mModules.loaded())
+        tell(module->name().data());
 }
 
 std::wstring DynamicLinker::pathOfModule(const std::wstring& name) const

@@ -10,6 +10,7 @@
 // said, and a later load sends message 1 to the library that is still there.
 #pragma once
 
+#include <functional>
 #include <optional>
 #include <set>
 #include <string>
@@ -67,6 +68,8 @@ public:
 
     // What counts as loaded, in the order in which it came to.
     std::vector<LoadedModule> loadedModules() const;
+    // Only their names, one after the other.
+    void forEachLoaded(const std::function<void(const wchar_t* name)>& tell) const;
 
     // The full path of the first loaded application of that name, in any case; empty when there is none.
     std::wstring pathOfModule(const std::wstring& name) const;
@@ -90,7 +93,7 @@ private:
 
     bool takeOut(Module& module);
     Module* find(const wchar_t* path) const;
-    Module* known(const std::wstring& realPath, const RegularFile& program) const;
+    Module* known(const std::wstring& otherPath, const RegularFile& program) const;
 
     CommandLine& mCommandLine;
     CallingApplication& mCalls;

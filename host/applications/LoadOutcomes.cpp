@@ -10,13 +10,17 @@ namespace tessel
 void LoadOutcomes::note(const std::wstring& path, const Result<>& loaded, Clock::time_point begun)
 {
     const auto took = std::chrono::duration_cast<std::chrono::microseconds>(Clock::now() - begun);
-    const auto [known, isNew] = mIndexes.try_emplace(path, mOutcomes.size());
-    if (isNew)
-        mOutcomes.push_back({path, loaded, took});
-    else
-        mOutcomes[known->second] = {path, loaded, took};
+    const auto known = mByPath.find(path);
+    LoadOutcome& outcome = known == mByPath.end() ? mOutcomes.emplace_back() : *known->second;
+    if (known == mByPath.end())
+    {
+        outcome.path = path;
+        mByPath.emplace(outcome.path, &outcome);
+    }
+    outcome.loaded = loaded;
+    outcome.took = took;
     if (mTell)
-        mTell(mOutcomes[known->second]);
+        mTell(outcome);
 }
 
 bool LoadOutcomes::willBeTold(int failureCode) const
@@ -26,8 +30,8 @@ bool LoadOutcomes::willBeTold(int failureCode) const
 
 const LoadOutcome* LoadOutcomes::of(const std::wstring& path) const
 {
-    const auto known = mIndexes.find(path);
-    return known == mIndexes.end() ? nullptr : &mOutcomes[known->second];
+    const auto known = mByPath.find(path);
+    return known == mByPath.end() ? nullptr : known->second;
 }
 
 std::vector<LoadOutcome> LoadOutcomes::failed() const

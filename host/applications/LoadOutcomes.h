@@ -3,8 +3,10 @@
 
 #include <chrono>
 #include <cstddef>
+#include <deque>
 #include <functional>
 #include <string>
+#include <string_view>
 #include <unordered_map>
 #include <utility>
 #include <vector>
@@ -43,8 +45,8 @@ public:
     std::vector<LoadOutcome> failed() const;
 
 private:
-    std::vector<LoadOutcome> mOutcomes;
-    std::unordered_map<std::wstring, std::size_t> mIndexes;
+    std::deque<LoadOutcome> mOutcomes;                           // which stay where they are
+    std::unordered_map<std::wstring_view, LoadOutcome*> mByPath; // the texts are theirs
     bool mExpectsSummary = false;
     std::function<void(const LoadOutcome&)> mTell;
 };

@@ -1,5 +1,6 @@
 #include "host/applications/LoadedModules.h"
 
+#include <algorithm>
 #include <utility>
 
 #include "host/text/Unicode.h"
@@ -20,7 +21,8 @@ Module& LoadedModules::add(std::unique_ptr<Module> module)
     Module& added = *module;
     mByHandle[&added] = std::move(module);
     mByPath[added.path] = &added;
-    mByPath[added.realPath] = &added;
+    if (!added.otherPath.empty())
+        mByPath[added.otherPath] = &added;
     mByIdentity[added.identity] = &added;
     return added;
 }
@@ -31,26 +33,31 @@ void LoadedModules::countAsLoaded(Module& module)
         return;
     module.isLoaded = true;
     mLoaded.push_back(&module);
-    mByName[foldCase(module.name)].push_back(&module);
+    mByName[foldCase(module.name())].push_back(&module);
 }
 
 void LoadedModules::remove(Module& module)
 {
     if (module.isLoaded)
     {
-        const auto named = mByName.find(foldCase(module.name));
+        const auto named = mByName.find(foldCase(module.name()));
         std::erase(named->second, &module);
         if (named->second.empty())
             mByName.erase(named);
-        std::erase(mLoaded, &module);
+        // The session's end takes the last away each time, and a person's selection goes from the first on.
+        if (mLoaded.back() == &module)
+            mLoaded.pop_back();
+        else
+            mLoaded.erase(std::ranges::find(mLoaded, &module));
     }
     mByPath.erase(module.path);
-    mByPath.erase(module.realPath);
+    if (!module.otherPath.empty())
+        mByPath.erase(module.otherPath);
     mByIdentity.erase(module.identity);
     mByHandle.erase(&module);
 }
 
-Module* LoadedModules::withPath(const std::wstring& path) const
+Module* LoadedModules::withPath(std::wstring_view path) const
 {
     return find(mByPath, path);
 }
@@ -65,7 +72,7 @@ Module* LoadedModules::withHandle(const void* handle) const
     return find(mByHandle, handle);
 }
 
-const Module* LoadedModules::named(const std::wstring& name) const
+const Module* LoadedModules::named(std::wstring_view name) const
 {
     const auto found = mByName.find(foldCase(name));
     return found == mByName.end() ? nullptr : found->second.front();

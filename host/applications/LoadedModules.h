@@ -6,6 +6,7 @@
 #include <map>
 #include <memory>
 #include <string>
+#include <string_view>
 #include <unordered_map>
 #include <vector>
 
@@ -19,14 +20,16 @@ namespace tessel
 // One application. Its address is the handle that its entry point receives.
 struct Module
 {
-    std::wstring path;     // full, as it was first asked for
-    std::wstring realPath; // where that led through all links
-    std::wstring name;     // the file name with its extension
+    std::wstring path;      // full, as it was first asked for
+    std::wstring otherPath; // where that led through all links; empty when it led nowhere else
     FileIdentity identity;
     std::unique_ptr<ModuleLibrary> library;
     TsRxEntryPoint entryPoint = nullptr;
     bool isLoaded = false;
     bool locked = false;
+
+    // The file name with its extension: the end of the path.
+    std::wstring_view name() const { return std::wstring_view(path).substr(path.rfind(L'/') + 1); }
 };
 
 class LoadedModules
@@ -40,18 +43,18 @@ public:
     void remove(Module& module);
 
     // Each answers null when there is none. A path is the one asked for or the real one.
-    Module* withPath(const std::wstring& path) const;
+    Module* withPath(std::wstring_view path) const;
     Module* withIdentity(const FileIdentity& identity) const;
     Module* withHandle(const void* handle) const;
     // The first of those loaded that share a name, in any case of letters.
-    const Module* named(const std::wstring& name) const;
+    const Module* named(std::wstring_view name) const;
 
     // In the order in which they came to count as loaded.
     const std::vector<Module*>& loaded() const { return mLoaded; }
 
 private:
     std::unordered_map<const void*, std::unique_ptr<Module>> mByHandle;
-    std::unordered_map<std::wstring, Module*> mByPath;
+    std::unordered_map<std::wstring_view, Module*> mByPath; // the texts are the modules' own
     std::map<FileIdentity, Module*> mByIdentity;
     std::unordered_map<std::wstring, std::vector<Module*>> mByName; // folded; in the order of loading
     std::vector<Module*> mLoaded;

@@ -20,11 +20,12 @@ TsResultBuffer* tsedQmbLoaded()
     const auto* linker = tessel::running<tessel::DynamicLinker>();
     if (!linker)
         return nullptr;
-    for (const auto& module : linker->loadedModules())
-    {
-        *end = tsutBuildList({TsRbValue::String(module.name.c_str())});
-        end = &(*end)->next;
-    }
+    linker->forEachLoaded(
+        [&](const wchar_t* name)
+        {
+            *end = tsutBuildList({TsRbValue::String(name)});
+            end = &(*end)->next;
+        });
     return list;
 }
 

@@ -55,12 +55,6 @@ void* mappedLibrary(const std::string& program)
 {
     return dlopen(program.c_str(), RTLD_NOLOAD | RTLD_LAZY);
 }
-
-bool isMapped(const std::string& program)
-{
-    void* handle = mappedLibrary(program);
-    return handle && dlclose(handle) == 0;
-}
 } // namespace
 
 Result<ModuleFile> moduleFileAt(std::string path)
@@ -116,7 +110,7 @@ Result<std::unique_ptr<ModuleLibrary>> ModuleLibrary::openBundle(const ModuleFil
 
 bool ModuleLibrary::isFrom(const RegularFile& program) const
 {
-    return isMappedFrom(mHandle, program.descriptor()) && program.keepsItsSize();
+    return isMappedFrom(mHandle, program) && program.keepsItsSize();
 }
 
 TsRxEntryPoint ModuleLibrary::entryPoint() const
@@ -129,8 +123,9 @@ bool ModuleLibrary::close()
     const bool released = !mByPlatform || unloadBundle(mFile.path);
     if (!released || mustStayMapped(mHandle))
         return false;
+    const void* address = addressIn(mHandle);
     bool closed = false;
     const auto returned = catchAnything([&] { closed = closeLibrary(mHandle) == 0; });
-    return returned && closed && !isMapped(mFile.program);
+    return returned && closed && !(address && isInLibrary(address));
 }
 } // namespace tessel

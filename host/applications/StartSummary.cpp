@@ -8,6 +8,7 @@
 #include <tessel/tsmessagebox.h>
 
 #include "host/applications/Admission.h"
+#include "host/text/Joined.h"
 #include "host/text/Translation.h"
 
 namespace tessel
@@ -71,14 +72,6 @@ std::wstring lineFor(const Entry& entry)
     if (quotedIn(entry.why) == entry.file) // a sentence of its own
         return entry.why;
     return entry.file + L": " + entry.why + (isEnded ? L"" : L".");
-}
-
-std::wstring joined(const Texts& texts, const std::wstring& between)
-{
-    std::wstring result;
-    for (const std::wstring& text : texts)
-        result += (result.empty() ? L"" : between) + text;
-    return result;
 }
 
 // As many as fit into a box, each on as many lines as fit.

@@ -17,9 +17,10 @@ public:
     std::wstring localName;
     std::wstring owner; // the path of the application that registered it; empty for the host's own
     TsEdCommandHandler handler = nullptr;
-    std::wstring summary; // one line, or empty
-    std::wstring usage;   // as in `CommandText`
-    std::wstring example; // the whole line, or empty
+    TsEdEntries entries = nullptr; // what the Tab key offers for them
+    std::wstring summary;          // one line, or empty
+    std::wstring usage;            // as in `CommandText`
+    std::wstring example;          // the whole line, or empty
 
     // The host's own commands have this instead of a handler.
     using BuiltIn = std::function<tessel::Result<>(const std::vector<std::wstring>& arguments)>;

@@ -31,10 +31,14 @@ public:
     CommandRunner(const CommandStack& commands, CommandLine& commandLine, CallingApplication& calls,
                   Loader loader = {}, AfterLine afterLine = {}, Names names = {});
 
-    // Runs one line: a command's name and its arguments (see `splitLine`). A blank line does nothing. False
+    // Runs one line: a command's name and its arguments (see TypedLine.h). A blank line does nothing. False
     // when the command is unknown or failed, which has been told by then. Nothing that a handler throws comes
     // out of here.
     bool run(std::wstring_view line);
+
+    // What there is to name as an argument of the command in the first part, after the others: what its
+    // application offers (`tsedOfferEntries`), which is loaded for that.
+    CommandStack::Arguments entries(const CommandStack::Arguments& parts) const;
 
 private:
     CommandStack::Command findOrLoad(const std::wstring& typedName) const;
@@ -48,15 +52,4 @@ private:
     AfterLine mAfterLine;
     Names mNames;
 };
-
-// The parts of a line: split at blanks; double quotes keep blanks together and are taken away. Within them a
-// doubled quote stands for one, so that a file with a quote in its name can be named. A quote that is not
-// closed reaches to the end of the line.
-CommandStack::Arguments splitLine(std::wstring_view line);
-
-// Whether the command in the line is asked to answer a program, as one JSON document: by --json at its end.
-bool isForPrograms(std::wstring_view line);
-
-// The text so quoted that in a line it is one part, whatever stands in it.
-std::wstring asPart(std::wstring_view text);
 } // namespace tessel

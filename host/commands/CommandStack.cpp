@@ -60,12 +60,17 @@ bool isOwn(const TsEdCommand& command)
 {
     return static_cast<bool>(command.builtIn);
 }
+} // namespace
 
-CommandStack::Description descriptionOf(const TsEdCommand& command)
+CommandStack::Description CommandStack::descriptionOf(const CommandText& text)
+{
+    return {text.group.english, text.name, text.usage.english, text.summary.english, text.example};
+}
+
+CommandStack::Description CommandStack::descriptionOf(const TsEdCommand& command)
 {
     return {command.group, command.localName, command.usage, command.summary, command.example};
 }
-} // namespace
 
 CommandStack::CommandStack(const CallingApplication& calls) : mCalls(calls)
 {
@@ -135,11 +140,20 @@ int CommandStack::takeArguments(const wchar_t* group, const wchar_t* globalName,
     return setLine(group, globalName, &TsEdCommand::usage, usage);
 }
 
-int CommandStack::setLine(const wchar_t* group, const wchar_t* globalName, std::wstring TsEdCommand::*line,
-                          std::wstring_view text)
+int CommandStack::offerEntries(const wchar_t* group, const wchar_t* globalName, TsEdEntries entries)
 {
-    if (!isOneLine(text))
+    if (!entries)
         return TSED_COMMAND_INVALID;
+    TsEdCommand* command = applications(group, globalName);
+    if (!command)
+        return TSED_COMMAND_UNKNOWN;
+    command->entries = entries;
+    return TSED_COMMAND_OK;
+}
+
+// Null where no application has such a command.
+TsEdCommand* CommandStack::applications(const wchar_t* group, const wchar_t* globalName) const
+{
     const auto found = std::ranges::find_if(mCommands,
                                             [&](const auto& command)
                                             {
@@ -147,9 +161,18 @@ int CommandStack::setLine(const wchar_t* group, const wchar_t* globalName, std::
                                                        isIn(*command, group) &&
                                                        equalIgnoringCase(command->globalName, globalName);
                                             });
-    if (found == mCommands.end())
+    return found == mCommands.end() ? nullptr : found->get();
+}
+
+int CommandStack::setLine(const wchar_t* group, const wchar_t* globalName, std::wstring TsEdCommand::*line,
+                          std::wstring_view text)
+{
+    if (!isOneLine(text))
+        return TSED_COMMAND_INVALID;
+    TsEdCommand* command = applications(group, globalName);
+    if (!command)
         return TSED_COMMAND_UNKNOWN;
-    (**found).*line = text;
+    command->*line = text;
     return TSED_COMMAND_OK;
 }
 
@@ -237,4 +260,10 @@ int tsedTakeArguments(const wchar_t* group, const wchar_t* globalName, const wch
 {
     auto* commands = tessel::running<tessel::CommandStack>();
     return commands ? commands->takeArguments(group, globalName, usage ? usage : L"") : TSED_COMMAND_UNKNOWN;
+}
+
+int tsedOfferEntries(const wchar_t* group, const wchar_t* globalName, TsEdEntries entries)
+{
+    auto* commands = tessel::running<tessel::CommandStack>();
+    return commands ? commands->offerEntries(group, globalName, entries) : TSED_COMMAND_UNKNOWN;
 }

@@ -16,6 +16,7 @@
 namespace tessel
 {
 class CallingApplication;
+struct CommandText;
 
 class CommandStack : public TsEdCommandStack
 {
@@ -32,6 +33,8 @@ public:
         std::wstring summary; // one line; empty where an application has given none
         std::wstring example = {};
     };
+    static Description descriptionOf(const CommandText& text);
+    static Description descriptionOf(const TsEdCommand& command);
 
     // Shared: a handler may remove the command that runs it.
     using Command = std::shared_ptr<const TsEdCommand>;
@@ -63,6 +66,9 @@ public:
     // As `tsedTakeArguments`.
     int takeArguments(const wchar_t* group, const wchar_t* globalName, std::wstring_view usage);
 
+    // As `tsedOfferEntries`.
+    int offerEntries(const wchar_t* group, const wchar_t* globalName, TsEdEntries entries);
+
     // The command that a person types so, or null. Where several share a name, it is the one that was
     // registered first, so that nobody can take the host's own away.
     Command find(std::wstring_view typedName) const;
@@ -83,6 +89,7 @@ public:
     std::vector<Description> descriptions() const;
 
 private:
+    TsEdCommand* applications(const wchar_t* group, const wchar_t* globalName) const;
     int setLine(const wchar_t* group, const wchar_t* globalName, std::wstring TsEdCommand::*line,
                 std::wstring_view text);
     std::size_t removeIf(const std::function<bool(const TsEdCommand&)>& goes);

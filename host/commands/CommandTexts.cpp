@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "host/text/DisplayWidth.h"
+#include "host/text/Joined.h"
 #include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 
@@ -15,21 +16,50 @@ constexpr auto kApplications = Sentence(L"Applications");
 constexpr auto kSettings = Sentence(L"Settings");
 constexpr auto kNothing = Sentence<>(L"");
 constexpr std::wstring_view kBetweenWays = L" | ";
-} // namespace
 
+// What stands for something in the usage of an application, too.
+constexpr Sentence<> kThings[] = {Sentence(L"command"), Sentence(L"entry"), Sentence(L"file"),
+                                  Sentence(L"folder"),  Sentence(L"key"),   Sentence(L"place"),
+                                  Sentence(L"variable")};
+
+std::wstring wordInPersonsLanguage(const std::wstring& word)
+{
+    const auto* known = std::ranges::find(kThings, word, &Sentence<>::english);
+    return known == std::end(kThings) ? word : translated(*known);
+}
+
+// Translators know the host's own ones whole.
+std::wstring usageInPersonsLanguage(const std::wstring& usage)
+{
+    const std::wstring whole = inPersonsLanguage(usage);
+    if (whole != usage)
+        return whole;
+    std::wstring result;
+    for (std::size_t at = 0; at < usage.size();)
+    {
+        const std::size_t end = usage.find_first_not_of(L"abcdefghijklmnopqrstuvwxyz", at);
+        result += wordInPersonsLanguage(usage.substr(at, end - at));
+        at = std::min(end, usage.size());
+        if (at < usage.size())
+            result += usage[at++];
+    }
+    return result;
+}
+
+// In the order in which HELP lists them.
 const std::vector<CommandText>& commandTexts()
 {
     static const std::vector<CommandText> texts = {
         {kSession, L"HELP", Sentence(L"[command] | topic | --json"),
          Sentence(L"Lists the commands, or tells how one is typed, or opens a help topic"), L"HELP LOAD"},
-        {kSession, L"?", Sentence(L"[command] | topic"), Sentence(L"The same as HELP"), L"? LOAD"},
+        {kSession, L"?", Sentence(L"[command] | topic | --json"), Sentence(L"The same as HELP"), L"? LOAD"},
         {kSession, L"QUIT", kNothing, Sentence(L"Ends the session"), L""},
         {kSession, L"EXIT", kNothing, Sentence(L"Ends the session"), L""},
         {kSession, L"SCRIPT", Sentence(L"file"), Sentence(L"Runs the commands in a file"),
          L"SCRIPT ~/morning.scr"},
         {kSession, L"CD", Sentence(L"[folder]"), Sentence(L"Shows or changes the current folder"),
          L"CD \"~/My drawings\""},
-        {kSession, L"VERSION", kNothing, Sentence(L"Shows the version"), L""},
+        {kSession, L"VERSION", Sentence(L"[--json]"), Sentence(L"Shows the version"), L""},
         {kApplications, L"LOAD", Sentence(L"file | address"),
          Sentence(L"Loads a compiled module or a Lisp file, also from an address on the net"),
          L"LOAD \"~/my lisp/hilbert.lsp\""},
@@ -58,6 +88,7 @@ const std::vector<CommandText>& commandTexts()
     };
     return texts;
 }
+} // namespace
 
 std::vector<std::wstring> waysOfTyping(std::wstring_view usage)
 {
@@ -75,7 +106,7 @@ std::vector<std::wstring> usageLines(const std::wstring& name, std::wstring_view
 {
     const std::wstring label = translated(L"Usage: ");
     std::vector<std::wstring> lines;
-    for (const auto& way : waysOfTyping(translateAndFill(std::wstring(usage).c_str(), {})))
+    for (const auto& way : waysOfTyping(usageInPersonsLanguage(std::wstring(usage))))
     {
         std::wstring& line =
             lines.emplace_back(lines.empty() ? label : std::wstring(displayWidth(label), L' '));
@@ -88,10 +119,7 @@ std::vector<std::wstring> usageLines(const std::wstring& name, std::wstring_view
 
 std::wstring usageText(const std::wstring& name, std::wstring_view usage)
 {
-    std::wstring text;
-    for (const auto& line : usageLines(name, usage))
-        text += (text.empty() ? L"" : L"\n") + line;
-    return text;
+    return joined(usageLines(name, usage), L"\n");
 }
 
 const CommandText* findCommandText(std::wstring_view globalName)

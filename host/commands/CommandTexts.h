@@ -15,15 +15,12 @@ struct CommandText
     const wchar_t* name; // the global one
     // How the arguments can be typed; empty: there are none. Between several ways stands " | ". Small letters
     // stand for something, all else is typed as it stands (of several with bars between them, one); what is
-    // in brackets can be left out, and what ends with dots be repeated. The Tab key knows `command`, `file`,
-    // `folder`, `key` and `variable`.
+    // in brackets can be left out, and what ends with dots be repeated. The Tab key knows `command`, `entry`,
+    // `file`, `folder`, `key` and `variable`.
     Sentence<> usage;
     Sentence<> summary;     // one line
     const wchar_t* example; // the whole line; empty where the name says it all
 };
-
-// In the order in which HELP lists them.
-const std::vector<CommandText>& commandTexts();
 
 // Each way of typing the arguments.
 std::vector<std::wstring> waysOfTyping(std::wstring_view usage);

@@ -6,7 +6,9 @@
 #include <utility>
 
 #include "host/commands/CommandTexts.h"
+#include "host/commands/TypedLine.h"
 #include "host/console/InputAssembler.h"
+#include "host/text/Quotes.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -14,11 +16,6 @@ namespace tessel
 namespace
 {
 using Names = CompletionSources::Names;
-
-bool isBlankToSplitAt(wchar_t character)
-{
-    return character == L' ' || character == L'\t';
-}
 
 bool isSame(std::wstring_view left, std::wstring_view right, bool caseMatters)
 {
@@ -56,45 +53,6 @@ std::optional<Completion> completeName(std::wstring_view beginning, const Names&
     return result;
 }
 
-// The last part of a line, which is not ended yet.
-struct OpenPart
-{
-    std::wstring_view typed; // as it stands in the line
-    std::wstring text;       // without its quotes
-};
-
-struct SplitBeginning
-{
-    Names parts; // before the last
-    OpenPart last;
-};
-
-// As a command gets its parts, but for the last one, which may be empty and may be in quotes.
-SplitBeginning splitBeginning(std::wstring_view line)
-{
-    SplitBeginning split;
-    std::size_t start = 0;
-    bool quoted = false;
-    for (std::size_t at = 0; at < line.size(); ++at)
-    {
-        const wchar_t character = line[at];
-        if (!quoted && isBlankToSplitAt(character))
-        {
-            if (start < at)
-                split.parts.push_back(std::exchange(split.last.text, {}));
-            start = at + 1;
-        }
-        else if (character != L'"')
-            split.last.text += character;
-        else if (quoted && line.substr(at).starts_with(L"\"\""))
-            split.last.text += line[at++];
-        else
-            quoted = !quoted;
-    }
-    split.last.typed = line.substr(start);
-    return split;
-}
-
 // How a path is written down: in a command line or in a string of Lisp.
 struct Notation
 {
@@ -108,26 +66,23 @@ bool needsQuotes(const std::wstring& path)
     return path.find_first_of(L" \t\"") != path.npos;
 }
 
-std::wstring withDoubled(const std::wstring& path, std::wstring_view doubled, wchar_t by)
-{
-    std::wstring result;
-    for (const wchar_t character : path)
-    {
-        if (doubled.find(character) != doubled.npos)
-            result += by;
-        result += character;
-    }
-    return result;
-}
-
 // `isWhole`: nothing comes after it.
 std::wstring written(const std::wstring& path, const OpenPart& typed, const Notation& notation, bool isWhole)
 {
     if (notation.isLispString)
-        return withDoubled(path, L"\"\\", L'\\') + (isWhole ? L"\"" : L"");
+    {
+        const std::wstring string = inQuotes(path).substr(1); // the first is typed
+        return isWhole ? string : string.substr(0, string.size() - 1);
+    }
     if (!typed.typed.starts_with(L'"') && !needsQuotes(path))
         return path + (isWhole ? L" " : L"");
-    return L"\"" + withDoubled(path, L"\"", L'"') + (isWhole ? L"\" " : L"");
+    return isWhole ? asPart(path) + L" " : asOpenPart(path);
+}
+
+// A line ends where a name would go on.
+bool fitsIntoALine(const std::wstring& name)
+{
+    return name.find_first_of(L"\n\r") == name.npos;
 }
 
 std::vector<Branch> fitting(std::vector<Branch> all, const std::wstring& beginning, const Notation& notation)
@@ -137,7 +92,7 @@ std::vector<Branch> fitting(std::vector<Branch> all, const std::wstring& beginni
                   [&](const Branch& branch)
                   {
                       const bool isHidden = branch.name.starts_with(L'.');
-                      return (isHidden && !showsHidden) ||
+                      return (isHidden && !showsHidden) || !fitsIntoALine(branch.name) ||
                              !beginsWith(branch.name, beginning, notation.caseMatters);
                   });
     return all;
@@ -162,6 +117,37 @@ std::optional<Completion> completePath(const OpenPart& typed, const Notation& no
         written(folder + sharedBeginning(result.candidates, notation.caseMatters), typed, notation, isWhole);
     if (branches.size() == 1)
         result.candidates.clear();
+    return result;
+}
+
+std::wstring_view nameOfFile(std::wstring_view path)
+{
+    return path.substr(path.rfind(L'/') + 1);
+}
+
+// Entries are whole paths. Who types no folder may mean a file by its name; then several have nothing in
+// common that could take the place of what is typed.
+std::optional<Completion> completeEntry(const OpenPart& typed, Names entries)
+{
+    const bool byName = typed.text.find(L'/') == typed.text.npos;
+    std::erase_if(entries,
+                  [&](const std::wstring& entry)
+                  {
+                      const bool fits =
+                          beginsWith(entry, typed.text, false) ||
+                          (byName && beginsWith(std::wstring(nameOfFile(entry)), typed.text, false));
+                      return !fits || !fitsIntoALine(entry);
+                  });
+    if (entries.empty())
+        return std::nullopt;
+    Completion result;
+    result.replaced = typed.typed.size();
+    const bool isWhole = entries.size() == 1;
+    const std::wstring shared = sharedBeginning(entries, true);
+    const bool goesOn = shared.size() > typed.text.size() && beginsWith(shared, typed.text, false);
+    result.text = isWhole || goesOn ? written(shared, typed, {}, isWhole) : std::wstring(typed.typed);
+    if (!isWhole)
+        result.candidates = std::move(entries);
     return result;
 }
 
@@ -231,7 +217,7 @@ void append(Names& names, const std::function<Names()>& more)
         std::ranges::move(more(), std::back_inserter(names));
 }
 
-std::optional<Completion> completeArgument(const SplitBeginning& split, const CompletionSources& sources)
+std::optional<Completion> completeArgument(const TypedLine& split, const CompletionSources& sources)
 {
     Expected expected = expectedAfter(split.parts, sources);
     if (expected.has(L"file") || expected.has(L"folder"))
@@ -243,6 +229,8 @@ std::optional<Completion> completeArgument(const SplitBeginning& split, const Co
                                     std::erase_if(files, [](const Branch& file) { return !file.goesOn; });
                                 return files;
                             });
+    if (expected.has(L"entry") && sources.entries)
+        return completeEntry(split.last, sources.entries(split.parts));
     if (expected.has(L"key"))
         return completePath(split.last, {L'\\', false}, sources.keys);
     if (expected.has(L"command"))
@@ -298,7 +286,7 @@ std::optional<Completion> complete(std::wstring_view line, const CompletionSourc
     if (!lispBefore.empty() || isLisp(line))
         return completeLisp(std::wstring(lispBefore) + L"\n" + std::wstring(line), lispBefore.size() + 1,
                             sources);
-    const SplitBeginning split = splitBeginning(line);
+    const TypedLine split = takeApart(line);
     if (!split.parts.empty())
         return completeArgument(split, sources);
     return sources.commands && split.last.typed == split.last.text

@@ -35,12 +35,15 @@ struct CompletionSources
     std::function<Names()> variables = {};
     std::function<std::vector<Branch>(const std::wstring& folder)> files = {}; // may begin with ~
     std::function<std::vector<Branch>(const std::wstring& key)> keys = {};
+    // Of an application's list, for the command and its arguments before.
+    std::function<Names(const Names& parts)> entries = {};
     std::function<Names(const std::wstring& beginning)> lispSymbols = {};
 };
 
 // Names compare without regard to case, files with it. What alone fits is completed whole, with a blank after
 // it unless a path goes on there; of several, as far as they agree. A file with a blank in its name gets
-// quotes. `lispBefore`: the lines of a Lisp expression that this one goes on. Nothing when nothing fits.
+// quotes. An entry may also be known by the name of its file. `lispBefore`: the lines of a Lisp expression
+// that this one goes on. Nothing when nothing fits.
 std::optional<Completion> complete(std::wstring_view line, const CompletionSources& sources,
                                    std::wstring_view lispBefore = {});
 } // namespace tessel

@@ -1,4 +1,5 @@
 #include "host/console/Console.h"
+#include "host/commands/TypedLine.h"
 
 #include <cstdint>
 #include <optional>

@@ -84,10 +84,10 @@ void prepareEndQuestion()
 {
     theQuestion.question =
         "\n" +
-        toUtf8(translated(
-            L"What is running does not come back. End Tessel? What is not stored yet is lost. [y/N]")) +
+        translatedInUtf8(
+            L"What is running does not come back. End Tessel? What is not stored yet is lost. [y/N]") +
         " ";
-    theQuestion.no = toUtf8(translated(L"Tessel waits on.")) + "\n";
+    theQuestion.no = translatedInUtf8(L"Tessel waits on.") + "\n";
     theQuestion.yes = toUtf8(foldCase(translated(L"Yes"))).front();
 }
 

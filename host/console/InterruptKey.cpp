@@ -63,7 +63,7 @@ InterruptKey::InterruptKey(LineRunner& runner)
 {
     theKeysRunner = &runner;
     prepareEndQuestion();
-    theLastLine = toUtf8(translated(L"Tessel ends: what is running does not come back.")) + "\n";
+    theLastLine = translatedInUtf8(L"Tessel ends: what is running does not come back.") + "\n";
     if (auto opened = openPipe())
         mPipe = *std::move(opened);
     for (const Descriptor* end : {&mPipe.output, &mPipe.input})

@@ -12,6 +12,7 @@
 #include "host/console/TypedHistory.h"
 #include "host/text/Credentials.h"
 #include "host/text/DisplayWidth.h"
+#include "host/text/Joined.h"
 #include "host/text/TerminalText.h"
 #include "host/text/Unicode.h"
 
@@ -23,9 +24,7 @@ constexpr wchar_t kCompletionFunction[] = L"tessel-complete";
 
 void showCandidates(const std::vector<std::wstring>& candidates)
 {
-    std::wstring all;
-    for (const auto& candidate : candidates)
-        all += (all.empty() ? L"" : L"  ") + forTerminal(candidate);
+    const std::wstring all = forTerminal(joined(candidates, L"  "));
     const auto screen = terminalSize(STDOUT_FILENO);
     std::fputc('\n', stdout);
     for (const auto& line : wrapped(all, screen ? screen->columns : all.size()))

@@ -9,8 +9,9 @@
 #include <system_error>
 
 #include "host/files/Download.h"
+#include "host/files/NetworkLibrary.h"
 #include "host/files/RemoteAddress.h"
-#include "host/files/Sha256.h"
+#include "host/files/network/Network.h"
 #include "host/platform/OrdinaryFile.h"
 #include "host/platform/PartFile.h"
 #include "host/platform/PrivateFolder.h"
@@ -90,9 +91,12 @@ Result<> checkContent(const std::string& sha256, const RemoteAddress& address)
 std::string sha256Of(const std::filesystem::path& file, std::uintmax_t mostBytes)
 {
     const auto content = readOrdinaryFile(file, mostBytes);
-    Sha256 checksum;
-    checksum.add(content ? *content : "");
-    return content ? checksum.finish() : "";
+    Network* const net = network();
+    if (!content || !net)
+        return {};
+    const auto checksum = net->checksum();
+    checksum->add(*content);
+    return checksum->finish();
 }
 
 // Puts the copy into its place, and its origin beside it.

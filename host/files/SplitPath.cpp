@@ -32,6 +32,15 @@ std::wstring_view takeFront(std::wstring_view& text, std::size_t length)
     return front;
 }
 
+// The length up to and with the last separator.
+std::size_t folderLength(std::wstring_view path)
+{
+    std::size_t length = path.size();
+    while (length > 0 && path[length - 1] != L'/' && path[length - 1] != L'\\')
+        --length;
+    return length;
+}
+
 void emptyAll(const Part (&parts)[4])
 {
     for (const Part& part : parts)
@@ -55,9 +64,7 @@ int _wsplitpath_s(const wchar_t* path, wchar_t* drive, std::size_t driveSize, wc
     std::wstring_view rest = path;
     const bool hasDrive = rest.size() >= kDriveLength && rest[1] == L':';
     const std::wstring_view driveText = takeFront(rest, hasDrive ? kDriveLength : 0);
-    const std::size_t separator = rest.find_last_of(L"/\\");
-    const std::wstring_view folderText =
-        takeFront(rest, separator == std::wstring_view::npos ? 0 : separator + 1);
+    const std::wstring_view folderText = takeFront(rest, folderLength(rest));
     const std::wstring_view nameText = takeFront(rest, std::min(rest.rfind(L'.'), rest.size()));
     const std::wstring_view texts[4] = {driveText, folderText, nameText, rest};
     for (std::size_t i = 0; i < std::size(parts); ++i)

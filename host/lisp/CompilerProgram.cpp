@@ -95,15 +95,15 @@ Result<> compileGuarded(const fs::path& input, const fs::path& output)
 int runCompilerProgram(int count, const char* const* arguments)
 {
     usePersonsLanguage();
-    CLI::App app(translatedInUtf8(Sentence(L"Compiles a Lisp file for Tessel to byte code.")), "tesselc");
+    CLI::App app(translatedInUtf8(L"Compiles a Lisp file for Tessel to byte code."), "tesselc");
     app.footer(translatedInUtf8(kCompilerAfterword));
     app.set_version_flag("--version", versionLine("tesselc, the Lisp compiler of Tessel R21"),
-                         translatedInUtf8(Sentence(L"Show the version and end")));
+                         translatedInUtf8(L"Show the version and end"));
     std::string input;
     std::string output;
-    app.add_option("FILE", input, translatedInUtf8(Sentence(L"The Lisp file (.lsp)")))->required();
+    app.add_option(translatedInUtf8(L"FILE"), input, translatedInUtf8(L"The Lisp file (.lsp)"))->required();
     app.add_option("-o,--output", output,
-                   translatedInUtf8(Sentence(L"The compiled file; otherwise FILE with the extension .qbc")));
+                   translatedInUtf8(L"The compiled file; otherwise FILE with the extension .qbc"));
     translateHelp(app);
     try
     {

@@ -131,7 +131,7 @@ std::wstring translate(cl_object english, cl_object first, cl_object second)
     if (!hasPlacesFor(things, sentence))
         return sentence;
     if (things == 0)
-        return translateAndFill(sentence.c_str(), {});
+        return inPersonsLanguage(sentence);
     if (things == 1)
         return translateAndFill(sentence.c_str(), {fromLisp(first)});
     return translateAndFill(sentence.c_str(), {fromLisp(first), fromLisp(second)});

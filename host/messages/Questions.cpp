@@ -8,6 +8,7 @@
 
 #include "host/messages/Answers.h"
 #include "host/text/CommandLine.h"
+#include "host/text/Joined.h"
 #include "host/text/TerminalText.h"
 
 namespace tessel
@@ -25,14 +26,6 @@ std::wstring shown(const std::wstring& text)
     return line;
 }
 
-std::wstring joined(const std::vector<std::wstring>& choices)
-{
-    std::wstring text;
-    for (const auto& choice : choices)
-        text += (text.empty() ? L"" : L"/") + choice;
-    return text;
-}
-
 // What an application is called where there is no room for its folder.
 std::wstring nameOfAsking()
 {
@@ -44,7 +37,7 @@ std::wstring promptOf(const Questions::Question& question)
 {
     std::wstring prompt = shown(question.text);
     if (!question.choices.empty())
-        prompt += L" [" + joined(question.choices) + L"]";
+        prompt += L" [" + joined(question.choices, L"/") + L"]";
     if (question.byDefault)
         prompt += L" <" + shown(*question.byDefault) + L">";
     return prompt + L": ";

@@ -44,13 +44,16 @@ Result<> checkOrdinary(const struct stat& status)
 
 Result<Descriptor> openOrdinaryFile(const std::filesystem::path& path, struct stat& status)
 {
-    // Opening a pipe that nobody writes to would wait for a writer.
-    Descriptor file(open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK | O_NOCTTY));
-    if (!file || fstat(file.number(), &status) != 0)
+    return ordinaryFile(Descriptor(open(path.c_str(), kToReadOrdinary)), status);
+}
+
+Result<Descriptor> ordinaryFile(Descriptor opened, struct stat& status)
+{
+    if (!opened || fstat(opened.number(), &status) != 0)
         return whyUnreadable();
     if (auto ordinary = checkOrdinary(status); !ordinary)
         return ordinary.failure();
-    return file;
+    return opened;
 }
 
 Result<std::string> readOrdinaryFile(const std::filesystem::path& path, std::uintmax_t mostBytes)

@@ -1,10 +1,12 @@
 #include "host/platform/RegularFile.h"
 
 #include <cstring>
+#include <utility>
 
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include "host/platform/DirectOpening.h"
 #include "host/platform/OrdinaryFile.h"
 #include "host/text/Translation.h"
 
@@ -13,7 +15,9 @@ namespace tessel
 RegularFile::RegularFile(const std::string& path)
 {
     struct stat status = {};
-    auto file = openOrdinaryFile(path, status);
+    auto direct = openDirectly(path, kToReadOrdinary);
+    mReachedDirectly = static_cast<bool>(direct);
+    auto file = direct ? ordinaryFile(std::move(direct), status) : openOrdinaryFile(path, status);
     mIdentity = {status.st_dev, status.st_ino};
     mSize = static_cast<std::uint64_t>(status.st_size);
     if (!file)

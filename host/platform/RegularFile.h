@@ -37,6 +37,9 @@ public:
     // Whether that is still so.
     bool keepsItsSize() const;
 
+    // Whether no symbolic link was followed on the way to it; no where the system cannot say.
+    bool reachedDirectly() const { return mReachedDirectly; }
+
     // While the file is open.
     int descriptor() const { return mFile.number(); }
 
@@ -53,6 +56,7 @@ private:
     Result<> mOpened;
     FileIdentity mIdentity;
     std::uint64_t mSize = 0;
+    bool mReachedDirectly = false;
     mutable std::array<unsigned char, kHeadSize> mHead;
     mutable std::size_t mHeadLength = 0; // 0: not read yet
 };

@@ -197,6 +197,15 @@ std::optional<std::filesystem::path> LayeredRegistry::laidDownIn(Key key, std::w
     return laidDown ? std::optional(laidDown->file) : std::nullopt;
 }
 
+bool LayeredRegistry::mayHaveMissed(std::wstring_view path, std::wstring_view name)
+{
+    if (mLayers.policy.value(path, name))
+        return false;
+    const Key own = mOwn.find(path);
+    const bool isFound = own != Registry::kNoKey && mOwn.readValue(own, name);
+    return !isFound && mOwn.mayHaveMissed();
+}
+
 void LayeredRegistry::expectReplacement(Key key)
 {
     if (isPlain() || mBefore.contains(key))

@@ -64,6 +64,10 @@ public:
     // The file in which the administrator has laid the value down, if one has: it stands before the person's.
     std::optional<std::filesystem::path> laidDownIn(Key key, std::wstring_view name) const;
 
+    // Whether what counts under that name may be something else than what is found: the person's own registry
+    // could not be read there, or is damaged. What is laid down counts in any case.
+    bool mayHaveMissed(std::wstring_view path, std::wstring_view name);
+
     // Who replaces all values of a key calls it before the first change, and `endOfCommand` in place of the
     // own registry's: where what is the person's own is what counted before, it becomes again what it was
     // then. A list that was stored as it had been read is no wish of the person's.

@@ -32,6 +32,12 @@ std::wstring Profiles::current() const
     return mRegistry.read(mKey, kCurrentProfileValue).value_or(L"");
 }
 
+std::vector<std::wstring> Profiles::names() const
+{
+    const auto key = mRegistry.find(mKey);
+    return key == Registry::kNoKey ? std::vector<std::wstring>() : mRegistry.subKeys(key);
+}
+
 Result<> Profiles::setCurrent(const std::wstring& name)
 {
     if (!isProfileName(name))

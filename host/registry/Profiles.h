@@ -3,6 +3,7 @@
 #pragma once
 
 #include <string>
+#include <vector>
 
 #include "host/text/Result.h"
 
@@ -21,6 +22,9 @@ public:
 
     // Its key, below which applications keep what is theirs.
     std::wstring currentKey() const { return mKey + L"\\" + current(); }
+
+    // All of them, in the order in which they were made.
+    std::vector<std::wstring> names() const;
 
     // Makes a profile the current one; one that is new begins empty. Fails when the name cannot be that of a
     // key or the registry cannot be written.

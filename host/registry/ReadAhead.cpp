@@ -1,5 +1,6 @@
 #include "host/registry/ReadAhead.h"
 
+#include "host/registry/RowChecksum.h"
 #include "host/registry/Statement.h"
 
 namespace tessel
@@ -7,8 +8,11 @@ namespace tessel
 namespace
 {
 constexpr int kPlace = 0;
-constexpr int kIsWhole = 1;
-constexpr int kFold = 2;
+constexpr int kKey = 1;
+constexpr int kSum = 2;
+constexpr int kName = 3;
+constexpr int kFold = 4;
+constexpr int kData = 5;
 } // namespace
 
 void ReadAhead::noteFound(std::int64_t key, std::int64_t place)
@@ -22,19 +26,26 @@ int ReadAhead::step(Statement& rows, std::int64_t key, std::string_view fold)
 {
     if (!mInOrder || key != mKey)
         return letGo(rows);
-    const int status = rows.isStanding() ? rows.step() : rows.bind(key).bind(mPlace).step();
+    const int status = rows.isStanding() ? rows.step() : rows.bind(mPlace).step();
     if (status != SQLITE_ROW)
     {
         mInOrder = false;
         return status;
     }
-    // Another row, or one that is damaged, may well not be the one that was asked for: the search tells.
-    if (rows.number(kPlace) > mPlace && rows.number(kIsWhole) == 1 && rows.utf8(kFold) == fold)
-    {
-        mPlace = rows.number(kPlace);
-        return SQLITE_ROW;
-    }
-    return letGo(rows);
+    const std::int64_t place = rows.number(kPlace);
+    if (place <= mPlace || !isAskedFor(rows, fold))
+        return letGo(rows);
+    mPlace = place;
+    return SQLITE_ROW;
+}
+
+// Another row, or one that is damaged, may well not be the one that was asked for: the search tells.
+bool ReadAhead::isAskedFor(const Statement& row, std::string_view fold)
+{
+    if (row.number(kKey) != mKey || row.utf8(kFold) != fold)
+        return false;
+    mData = row.utf8(kData);
+    return row.number(kSum) == checksumOfValue(mKey, row.utf8(kName), fold, mData);
 }
 
 void ReadAhead::forget(Statement& rows)

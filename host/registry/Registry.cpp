@@ -75,7 +75,7 @@ Registry::~Registry()
 Registry::Key Registry::findChild(Key parent, std::wstring_view name)
 {
     Statement& find = mStatements->findKey;
-    if (step(find.bind(parent).bind(foldCase(name))) != SQLITE_ROW)
+    if (step(find.bind(parent).bindUtf8(foldedUtf8(name))) != SQLITE_ROW)
         return kNoKey;
     const Key key = find.number(0);
     find.reset();
@@ -119,7 +119,7 @@ Result<Registry::Key> Registry::createChild(Key parent, std::wstring_view name)
     // Another process may have made it before the transaction began.
     if (const Key found = findChild(parent, name); found != kNoKey)
         return found;
-    const int status = mStatements->insertKey.bind(parent).bind(name).bind(foldCase(name)).run();
+    const int status = mStatements->insertKey.bind(parent).bind(name).bindUtf8(foldedUtf8(name)).run();
     const Key made = sqlite3_last_insert_rowid(mDatabase);
     const auto written = finishWrite(status);
     return written ? Result<Key>(made) : written.failure();
@@ -175,6 +175,8 @@ Result<> Registry::removeKey(Key key)
         return writing;
     if (auto sound = checkBeforeRemoval(); !sound)
         return sound;
+    if (auto settled = settle(); !settled)
+        return settled;
     mCursor = {};
     mFollowed = {};
     return finishWrite(mStatements->deleteKey.bind(key).run());
@@ -186,10 +188,10 @@ Result<std::wstring> Registry::readValue(Key key, std::wstring_view name)
         return noSuchValue();
     lookInto(key);
     mWork.count();
-    std::string fold = toUtf8(foldCase(name));
+    std::string fold = foldedUtf8(name);
     int status = readAhead(key, fold);
     if (status == SQLITE_ROW)
-        return mStatements->followingValues.text(kFourth);
+        return toWide(mReadAhead.data());
     Statement& read = mStatements->readValue;
     if (status == SQLITE_DONE)
         status = step(read.bind(key).bindUtf8(std::move(fold)));
@@ -219,7 +221,21 @@ Result<> Registry::writeValue(Key key, std::wstring_view name, std::wstring_view
 {
     if (auto writing = beginWriting(); !writing)
         return writing;
-    return finishWrite(mStatements->writeValue.bind(key).bind(name).bind(foldCase(name)).bind(data).run());
+    std::string utf8Name = toUtf8(name);
+    std::string fold = foldedUtf8(name);
+    std::string utf8Data = toUtf8(data);
+    if (mStatements->removed.areOf(key))
+    {
+        const int status = mStatements->removed.write(key, utf8Name, fold, utf8Data);
+        if (status != SQLITE_NOTFOUND)
+            return finishWrite(status);
+        if (auto settled = settle(); !settled)
+            return settled;
+    }
+    NewRows& added = mStatements->added;
+    added.add(key, std::move(utf8Name), std::move(fold), std::move(utf8Data));
+    const bool waits = mWrites >= kWritesFlushedAtOnce && !added.isFull();
+    return finishWrite(waits ? SQLITE_DONE : added.store());
 }
 
 Result<> Registry::removeValue(Key key, std::wstring_view name)
@@ -229,7 +245,14 @@ Result<> Registry::removeValue(Key key, std::wstring_view name)
     if (auto sound = checkBeforeRemoval(); !sound)
         return sound;
     mCursor = {};
-    auto removed = finishWrite(mStatements->deleteValue.bind(key).bind(foldCase(name)).run());
+    std::string fold = foldedUtf8(name);
+    if (auto stored = storeAdded(); !stored)
+        return stored;
+    if (mStatements->removed.remove(key, fold))
+        return {};
+    if (auto settled = settle(); !settled)
+        return settled;
+    auto removed = finishWrite(mStatements->deleteValue.bind(key).bindUtf8(std::move(fold)).run());
     if (removed && sqlite3_changes(mDatabase) == 0)
         return noSuchValue();
     return removed;
@@ -346,7 +369,25 @@ void Registry::lookInto(Key key)
 {
     if (!mWriting && mOpenedForWriting.contains(key))
         static_cast<void>(beginWriting());
+    static_cast<void>(settle()); // what fails is told by the next write, or at the command's end
     beginReading();
+}
+
+Result<> Registry::storeAdded()
+{
+    const int status = mStatements->added.store();
+    return status == SQLITE_DONE ? Result<>() : fail(status);
+}
+
+// Everything that was written or removed stands in the file from then on.
+Result<> Registry::settle()
+{
+    if (!mWriting)
+        return {};
+    if (auto stored = storeAdded(); !stored)
+        return stored;
+    const int status = mStatements->removed.settle();
+    return status == SQLITE_DONE ? Result<>() : fail(status);
 }
 
 Result<> Registry::finishWrite(int status)
@@ -487,6 +528,8 @@ void Registry::forgetTransaction()
 void Registry::rollBack()
 {
     forgetTransaction();
+    mStatements->added.forget();
+    mStatements->removed.forget();
     // SQLite may have rolled back by itself already.
     if (!sqlite3_get_autocommit(mDatabase))
         mStatements->rollback.run();
@@ -496,18 +539,22 @@ void Registry::rollBack()
 // The number of a key that was undone is given away again: a handle must not follow it to another key.
 void Registry::closeHandlesOfLostKeys()
 {
-    std::erase_if(mHandles,
-                  [this](const auto& handle)
-                  {
-                      Statement& find = mStatements->keyExists;
-                      const bool lost = find.bind(handle.second).step() == SQLITE_DONE;
-                      find.reset();
-                      return lost;
-                  });
+    const auto isLost = [this](Key key)
+    {
+        Statement& find = mStatements->keyExists;
+        const bool lost = find.bind(key).step() == SQLITE_DONE;
+        find.reset();
+        return lost;
+    };
+    std::erase_if(mHandles, [&](const auto& handle) { return isLost(handle.second); });
+    if (mNewestHandle.handle && isLost(mNewestHandle.key))
+        mNewestHandle = {};
 }
 
 void Registry::commit()
 {
+    static_cast<void>(settle()); // what fails has undone the command, and its end tells it
+    mStatements->removed.forget();
     forgetTransaction();
     if (sqlite3_get_autocommit(mDatabase))
         return;
@@ -543,23 +590,39 @@ Result<> Registry::endOfCommand()
     return std::exchange(mCommand, {});
 }
 
+std::wstring Registry::takeReason()
+{
+    const auto told = endOfCommand();
+    return told ? mCanStore.sentence() : told.sentence();
+}
+
+// Most handles are closed before another one is opened: the newest stands alone, and costs no memory of its
+// own.
 HKEY Registry::openHandle(Key key)
 {
-    const HKEY handle = reinterpret_cast<HKEY>(mNextHandle++);
-    mHandles.emplace(handle, key);
-    return handle;
+    if (mNewestHandle.handle)
+        mHandles.emplace(mNewestHandle.handle, mNewestHandle.key);
+    mNewestHandle = {reinterpret_cast<HKEY>(mNextHandle++), key};
+    return mNewestHandle.handle;
 }
 
 std::optional<Registry::Key> Registry::keyOf(HKEY handle) const
 {
     if (handle == HKEY_CURRENT_USER)
         return kRoot;
+    if (handle && handle == mNewestHandle.handle)
+        return mNewestHandle.key;
     const auto found = mHandles.find(handle);
     return found == mHandles.end() ? std::nullopt : std::optional(found->second);
 }
 
 bool Registry::closeHandle(HKEY handle)
 {
+    if (handle && handle == mNewestHandle.handle)
+    {
+        mNewestHandle = {};
+        return true;
+    }
     return handle == HKEY_CURRENT_USER || mHandles.erase(handle) > 0;
 }
 } // namespace tessel

@@ -93,6 +93,10 @@ public:
     bool mayHaveMissed() const { return !mDatabase || mDamaged || mReadFailed; }
     bool readFailed() const { return mReadFailed; }
 
+    // Why something of the running command failed, or why nothing can be read or stored at all, in sentences
+    // for a person. The command's writes are over, and its end does not tell it again.
+    std::wstring takeReason();
+
     // The same by path, for the host's own settings.
     std::optional<std::wstring> read(std::wstring_view path, std::wstring_view name);
     Result<> write(std::wstring_view path, std::wstring_view name, std::wstring_view data);
@@ -134,6 +138,11 @@ private:
     {
         Key from = kNoKey;
         std::wstring path;
+        Key key = kNoKey;
+    };
+    struct Handle
+    {
+        HKEY handle = nullptr;
         Key key = kNoKey;
     };
     struct Cursor
@@ -188,6 +197,8 @@ private:
     void rollBack();
     Result<> checkBeforeRemoval();
     Result<> checkPlace();
+    Result<> storeAdded();
+    Result<> settle();
     Result<> finishWrite(int status);
     int readAhead(Key key, std::string_view fold);
     int step(Statement& statement);
@@ -222,7 +233,8 @@ private:
     bool mWriting = false;                     // the running transaction is one that writes
     unsigned mWrites = 0;                      // in it
     std::unordered_set<Key> mOpenedForWriting; // by the running command
-    std::unordered_map<HKEY, Key> mHandles;
+    std::unordered_map<HKEY, Key> mHandles;    // but the newest
+    Handle mNewestHandle;
     std::uintptr_t mNextHandle;
 };
 } // namespace tessel

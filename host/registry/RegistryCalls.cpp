@@ -34,6 +34,18 @@ const wchar_t* orEmpty(const wchar_t* text)
     return text ? text : L"";
 }
 
+// What is not found may only not have been readable.
+LONG notFound(const LayeredRegistry& registry)
+{
+    return registry.own().mayHaveMissed() ? ERROR_READ_FAULT : ERROR_FILE_NOT_FOUND;
+}
+
+void copyText(const std::wstring& text, wchar_t* buffer, std::size_t capacity)
+{
+    if (buffer && capacity > 0)
+        buffer[text.copy(buffer, capacity - 1)] = L'\0';
+}
+
 LONG copyData(const std::wstring& data, void* buffer, DWORD* size)
 {
     const DWORD capacity = *size;
@@ -56,7 +68,7 @@ LONG RegOpenKeyExW(HKEY root, const wchar_t* subKey, DWORD, DWORD, HKEY* result)
         return ERROR_INVALID_HANDLE;
     const Registry::Key key = target.registry->find(orEmpty(subKey), target.key);
     if (key == Registry::kNoKey)
-        return ERROR_FILE_NOT_FOUND;
+        return notFound(*target.registry);
     *result = target.registry->openHandle(key);
     return ERROR_SUCCESS;
 }
@@ -122,7 +134,7 @@ LONG tsRegGetValue(HKEY key, const wchar_t* name, DWORD, DWORD* type, void* data
         return ERROR_INVALID_HANDLE;
     const auto found = target.registry->readValue(target.key, orEmpty(name));
     if (!found)
-        return found.code();
+        return found.code() == ERROR_FILE_NOT_FOUND ? notFound(*target.registry) : found.code();
     if (type)
         *type = REG_SZ;
     return size ? copyData(*found, data, size) : ERROR_SUCCESS;
@@ -141,7 +153,16 @@ bool tsRegIsLaidDown(HKEY key, const wchar_t* name, wchar_t* place, std::size_t 
 {
     const Target target = targetOf(key);
     const auto file = target ? target.registry->laidDownIn(target.key, orEmpty(name)) : std::nullopt;
-    if (file && place && capacity > 0)
-        place[tessel::toWide(file->native()).copy(place, capacity - 1)] = L'\0';
+    if (file)
+        copyText(tessel::toWide(file->native()), place, capacity);
     return file.has_value();
+}
+
+bool tsRegMayHaveMissed(const wchar_t* path, const wchar_t* name, wchar_t* reason, std::size_t capacity)
+{
+    LayeredRegistry* registry = tessel::running<LayeredRegistry>();
+    if (!registry || !registry->mayHaveMissed(orEmpty(path), orEmpty(name)))
+        return false;
+    copyText(registry->own().takeReason(), reason, capacity);
+    return true;
 }

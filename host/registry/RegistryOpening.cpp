@@ -286,6 +286,7 @@ void Registry::forgetAll()
         rollBack();
     mCursor = {};
     mHandles.clear();
+    mNewestHandle = {};
     mOpenedForWriting.clear();
     mDamaged = false;
     mUnreadable = false;

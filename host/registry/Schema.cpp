@@ -1,13 +1,10 @@
 #include "host/registry/Schema.h"
 
-#include <zlib.h>
-
 #include <array>
-#include <cstring>
 #include <random>
 #include <string_view>
-#include <utility>
 
+#include "host/registry/RowChecksum.h"
 #include "host/registry/Statement.h"
 #include "host/registry/StoreFailure.h"
 #include "host/text/Translation.h"
@@ -68,57 +65,23 @@ constexpr std::array kMakeRoom = {"DROP INDEX value_order", "DROP INDEX key_orde
                                   "ALTER TABLE value RENAME TO old_value",
                                   "ALTER TABLE key RENAME TO old_key"};
 
-// The checksum of bytes that come in pieces. Short pieces are gathered: most of the time would go into the
-// beginnings and ends of the summing.
-class Checksum
-{
-public:
-    void add(const void* bytes, std::size_t count)
-    {
-        if (count > mGathered.size() - mCount)
-            sumUp();
-        if (count > mGathered.size())
-        {
-            mSum = crc32_z(mSum, static_cast<const Bytef*>(bytes), count);
-            return;
-        }
-        std::memcpy(mGathered.data() + mCount, bytes, count);
-        mCount += count;
-    }
-    sqlite3_int64 finish()
-    {
-        sumUp();
-        return static_cast<sqlite3_int64>(mSum);
-    }
-
-private:
-    void sumUp() { mSum = crc32_z(mSum, mGathered.data(), std::exchange(mCount, 0)); }
-
-    std::array<Bytef, 512> mGathered;
-    std::size_t mCount = 0;
-    uLong mSum = crc32_z(0, nullptr, 0);
-};
-
 void rowSum(sqlite3_context* context, int count, sqlite3_value** values)
 {
-    Checksum sum;
+    RowChecksum sum;
     for (int i = 0; i < count; ++i)
     {
         sqlite3_value* const value = values[i];
         if (sqlite3_value_type(value) == SQLITE_INTEGER)
         {
-            const std::int64_t number = sqlite3_value_int64(value);
-            sum.add(&number, sizeof number);
+            sum.add(sqlite3_value_int64(value));
             continue;
         }
         if (sqlite3_value_type(value) == SQLITE_NULL)
             continue;
-        // As bytes, for which the store makes no copy that ends with a zero. The end belongs to it all the
-        // same: what moves from one text to the next is not the same.
-        constexpr Bytef kEnd = 0;
-        if (const void* bytes = sqlite3_value_blob(value))
-            sum.add(bytes, static_cast<std::size_t>(sqlite3_value_bytes(value)));
-        sum.add(&kEnd, sizeof kEnd);
+        // As bytes, for which the store makes no copy that ends with a zero.
+        const auto* bytes = static_cast<const char*>(sqlite3_value_blob(value));
+        const auto size = static_cast<std::size_t>(sqlite3_value_bytes(value));
+        sum.add(bytes ? std::string_view(bytes, size) : std::string_view());
     }
     sqlite3_result_int64(context, sum.finish());
 }

@@ -12,7 +12,7 @@ namespace tessel
 // damaged is the end of a sentence. The codes are the store's.
 Result<> checkSoundness(sqlite3* database, int version);
 
-// How many starts may pass between two looks, so that they cost less than a tenth of the starts' time: 1 for
-// all but huge registries.
+// How many starts may pass between two looks, so that they cost less than a tenth of the starts' time: 1 up
+// to some thousand values.
 unsigned startsBetweenLooks(sqlite3* database);
 } // namespace tessel

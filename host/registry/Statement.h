@@ -40,6 +40,13 @@ public:
         return *this;
     }
 
+    // The caller keeps the text until the statement has been run or reset.
+    Statement& bindKept(std::string_view utf8)
+    {
+        sqlite3_bind_text(mStatement, ++mBound, utf8.data(), static_cast<int>(utf8.size()), SQLITE_STATIC);
+        return *this;
+    }
+
     // SQLITE_ROW: a row stands ready. After anything else, or `reset`, the statement can be bound again.
     int step()
     {
@@ -74,7 +81,7 @@ public:
     }
 
 private:
-    static constexpr std::size_t kMostBound = 4;
+    static constexpr std::size_t kMostBound = 4; // of texts that are kept here
 
     sqlite3_stmt* mStatement = nullptr;
     int mBound = 0;

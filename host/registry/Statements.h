@@ -8,7 +8,9 @@
 #include <string>
 #include <utility>
 
+#include "host/registry/NewRows.h"
 #include "host/registry/Registry.h"
+#include "host/registry/RemovedRows.h"
 #include "host/registry/Statement.h"
 
 namespace tessel
@@ -16,12 +18,13 @@ namespace tessel
 struct Registry::Statements
 {
     Statement findKey, keyExists, insertKey, deleteKey, subKeys;
-    Statement readValue, followingValues, writeValue, deleteValue, values, nextValues, valueAt;
+    Statement readValue, followingValues, deleteValue, values, nextValues, valueAt;
     Statement begin, mark, beginReading, commit, rollback;
+    NewRows added;
+    RemovedRows removed;
 
     // `mark` writes the number of the file, by which its journals are known. A row that is found comes with
-    // whether it is what was stored under what was asked for: an index may lead to another one. What follows
-    // a row is asked of the table alone, which is quicker than an index, and may be another key's.
+    // whether it is what was stored under what was asked for: an index may lead to another one.
     int prepare(sqlite3* database, std::int64_t fileNumber)
     {
         const std::string marking = "PRAGMA application_id=" + std::to_string(fileNumber);
@@ -35,11 +38,7 @@ struct Registry::Statements
                       "ORDER BY id"},
             {readValue,
              "SELECT seq, sum IS row_sum(?1, name, ?2, data), data FROM value WHERE key=?1 AND fold=?2"},
-            {followingValues, "SELECT seq, key=?1 AND sum IS row_sum(?1, name, fold, data), fold, data"
-                              " FROM value WHERE seq>?2 ORDER BY seq"},
-            {writeValue, "INSERT INTO value(key, name, fold, data, sum)"
-                         " VALUES(?1, ?2, ?3, ?4, row_sum(?1, ?2, ?3, ?4)) ON CONFLICT(key, fold)"
-                         " DO UPDATE SET data=?4, sum=row_sum(?1, value.name, ?3, ?4)"},
+            {followingValues, ReadAhead::kRowsAfter},
             {deleteValue, "DELETE FROM value WHERE key=? AND fold=?"},
             {values, "SELECT seq, sum IS row_sum(?1, name, fold, data), name, data FROM value WHERE key=?1"
                      " ORDER BY seq"},
@@ -55,7 +54,8 @@ struct Registry::Statements
         for (const auto& [statement, sql] : all)
             if (const int status = statement.prepare(database, sql); status != SQLITE_OK)
                 return status;
-        return SQLITE_OK;
+        const int status = added.prepare(database);
+        return status == SQLITE_OK ? removed.prepare(database) : status;
     }
 };
 

@@ -22,6 +22,6 @@ inline std::string dayAndTime(std::time_t seconds, const std::string& form = "%Y
 // As the person's language has it.
 inline std::wstring dayAndTimeInWords(std::time_t seconds)
 {
-    return toWide(dayAndTime(seconds, toUtf8(translated(L"%Y-%m-%d %H:%M"))));
+    return toWide(dayAndTime(seconds, translatedInUtf8(L"%Y-%m-%d %H:%M")));
 }
 } // namespace tessel

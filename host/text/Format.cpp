@@ -11,6 +11,7 @@ namespace
 // Numbers are padded no wider than this: a format may come from a file's name, and must not fill the memory.
 constexpr int kWidest = 1000;
 constexpr std::size_t kNumberRoom = 2 * kWidest + 400; // a double may have 309 digits before its point
+constexpr std::size_t kUsualRoom = 64;                 // names of entries are made by the hundred thousand
 // A text is never longer than this many characters, so that a precision beyond it cuts nothing.
 constexpr int kLargestNumber = 100'000'000;
 
@@ -169,12 +170,15 @@ std::wstring formatOne(const Conversion& conversion, const TsFormatArgument& arg
 std::wstring formatAll(const wchar_t* format, const TsFormatArgument* arguments, std::size_t count)
 {
     std::wstring text;
+    text.reserve(kUsualRoom);
     std::size_t next = 0;
     while (*format)
     {
         if (*format != L'%')
         {
-            text += *format++;
+            const std::size_t plain = std::wcscspn(format, L"%");
+            text.append(format, plain);
+            format += plain;
             continue;
         }
         if (format[1] == L'%')

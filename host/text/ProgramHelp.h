@@ -1,4 +1,4 @@
-// The words in a program's help that come from the library which parses its arguments.
+// What the library that parses a program's arguments says of itself, in the person's language.
 #pragma once
 
 namespace CLI
@@ -8,6 +8,6 @@ class App;
 
 namespace tessel
 {
-// Once all options are declared. What the library says of wrong arguments stays as it is.
+// The words in the help, and the sentences about wrong arguments. Once all options are declared.
 void translateHelp(CLI::App& app);
 } // namespace tessel

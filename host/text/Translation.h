@@ -92,6 +92,12 @@ std::wstring translateAndFill(const wchar_t* english, std::initializer_list<std:
 std::wstring translateAndFill(const wchar_t* one, const wchar_t* several, std::size_t count,
                               std::initializer_list<std::wstring> things);
 
+// The same of a text without places, such as those that are kept in English since programs read them.
+inline std::wstring inPersonsLanguage(const std::wstring& english)
+{
+    return translateAndFill(english.c_str(), {});
+}
+
 template <class... Things>
 std::wstring translated(Sentence<sizeof...(Things)> sentence, const Things&... things)
 {

@@ -29,10 +29,21 @@ bool isByte(char32_t code)
 // character's properties.
 constexpr char32_t kFirstBeyondAscii = 0x80;
 
+// Several at once, which processors do in one step.
 template <class Text>
 auto endOfAscii(const Text& text)
 {
-    return std::find_if(text.begin(), text.end(),
+    constexpr std::size_t kAtOnce = 16;
+    std::size_t end = 0;
+    for (; end + kAtOnce <= text.size(); end += kAtOnce)
+    {
+        char32_t all = 0;
+        for (std::size_t i = 0; i < kAtOnce; ++i)
+            all |= std::make_unsigned_t<typename Text::value_type>(text[end + i]);
+        if (all >= kFirstBeyondAscii)
+            break;
+    }
+    return std::find_if(text.begin() + static_cast<std::ptrdiff_t>(end), text.end(),
                         [](auto unit)
                         { return std::make_unsigned_t<decltype(unit)>(unit) >= kFirstBeyondAscii; });
 }
@@ -149,6 +160,20 @@ std::wstring foldCase(std::wstring_view text)
 {
     std::wstring folded(text);
     std::transform(folded.begin(), folded.end(), folded.begin(), foldOne);
+    return folded;
+}
+
+std::string foldedUtf8(std::wstring_view text)
+{
+    if (endOfAscii(text) != text.end())
+        return toUtf8(foldCase(text));
+    std::string folded(text.size(), '\0');
+    std::transform(text.begin(), text.end(), folded.begin(),
+                   [](wchar_t character)
+                   {
+                       const bool isCapital = character >= L'A' && character <= L'Z';
+                       return static_cast<char>(isCapital ? character + (L'a' - L'A') : character);
+                   });
     return folded;
 }
 

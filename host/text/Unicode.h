@@ -30,5 +30,8 @@ std::wstring withReadableBytes(std::wstring_view text);
 // Unicode, independent of the locale).
 std::wstring foldCase(std::wstring_view text);
 
+// The same in UTF-8.
+std::string foldedUtf8(std::wstring_view text);
+
 bool equalIgnoringCase(std::wstring_view left, std::wstring_view right);
 } // namespace tessel

@@ -4,6 +4,7 @@
 
 namespace tessel
 {
+inline constexpr char kProgramName[] = "Tessel R21";
 inline constexpr char kProgramLine[] = "Tessel R21, reference host for Modrig";
 
 // The registry key below which the host and its applications keep what they store.
@@ -14,4 +15,8 @@ std::string version();
 
 // What was asked for its version says, and which it is.
 std::string versionLine(const std::string& program = kProgramLine);
+
+// The same and its beginning as a person is told in a session.
+std::wstring programSentence();
+std::wstring versionSentence();
 } // namespace tessel

@@ -1,7 +1,8 @@
 // Values by their hashes, of which several may be equal.
 //
-// All of it lies in two blocks of memory: a hundred thousand entries, each in a block of its own, would cost
-// a start more than reading them from the disk.
+// All of it lies in few blocks of memory: a hundred thousand entries, each in a block of its own, would cost
+// a start more than reading them from the disk. A look mostly touches one line of memory: where nothing
+// stands under a hash, its slot says so, and the values are not looked at.
 #pragma once
 
 #include <cstddef>
@@ -14,75 +15,104 @@ class HashIndex
 public:
     void Add(std::size_t hash, const Value& value)
     {
-        if (mNodes.size() == mFirst.size())
+        // A quarter of the slots stays empty, so that a look soon ends at one.
+        if (4 * (mCount + 1) > 3 * mSlots.size())
             Grow();
-        std::uint32_t& first = FirstOf(hash);
-        const Node node{hash, value, first};
-        if (mFree == kNone)
-        {
-            first = static_cast<std::uint32_t>(mNodes.size());
-            mNodes.push_back(node);
-            return;
-        }
-        first = mFree;
-        mFree = mNodes[first].next;
-        mNodes[first] = node;
+        Put({Short(hash), PlaceFor(value)});
+        ++mCount;
     }
 
     // The value stands under that hash.
     void Remove(std::size_t hash, const Value& value)
     {
-        std::uint32_t* link = &FirstOf(hash);
-        while (mNodes[*link].value != value)
-            link = &mNodes[*link].next;
-        const std::uint32_t gone = *link;
-        *link = mNodes[gone].next;
-        mNodes[gone].next = mFree;
-        mFree = gone;
+        std::size_t at = Short(hash) & Mask();
+        while (mSlots[at].hash != Short(hash) || mValues[mSlots[at].place] != value)
+            at = After(at);
+        mFree.push_back(mSlots[at].place);
+        CloseGap(at);
+        --mCount;
     }
 
     void Clear() { *this = HashIndex(); }
 
-    // Calls `visit` with the values under that hash, in no order, until it answers true. Whether it did.
+    // Calls `visit` with the values under that hash, in no order, until it answers true. Whether it did. A
+    // few of other hashes may be among them.
     template <class Visit>
     bool AnyUnder(std::size_t hash, Visit visit) const
     {
-        if (mFirst.empty())
+        if (mSlots.empty())
             return false;
-        for (std::uint32_t at = mFirst[hash & (mFirst.size() - 1)]; at != kNone; at = mNodes[at].next)
-            if (mNodes[at].hash == hash && visit(mNodes[at].value))
+        for (std::size_t at = Short(hash) & Mask(); mSlots[at].place != kNone; at = After(at))
+            if (mSlots[at].hash == Short(hash) && visit(mValues[mSlots[at].place]))
                 return true;
         return false;
     }
 
 private:
-    struct Node
+    // Stands at the place that its hash says, or after it, with no empty one between.
+    struct Slot
     {
-        std::size_t hash;
-        Value value;
-        std::uint32_t next; // of the same place, or of those that are free
+        std::uint32_t hash = 0;
+        std::uint32_t place = kNone; // of the value
     };
 
     static constexpr std::uint32_t kNone = UINT32_MAX;
-    static constexpr std::size_t kFewest = 16; // places; always a power of two
+    static constexpr std::size_t kFewest = 16; // slots; always a power of two
 
-    std::uint32_t& FirstOf(std::size_t hash) { return mFirst[hash & (mFirst.size() - 1)]; }
-
-    // As many places again as there are nodes, none of which is free.
-    void Grow()
+    static std::uint32_t Short(std::size_t hash)
     {
-        if (mFree != kNone)
-            return;
-        mFirst.assign(mFirst.empty() ? kFewest : 2 * mFirst.size(), kNone);
-        for (std::uint32_t at = 0; at < mNodes.size(); ++at)
+        const std::uint64_t whole = hash;
+        return static_cast<std::uint32_t>(whole ^ (whole >> 32));
+    }
+    std::size_t Mask() const { return mSlots.size() - 1; }
+    std::size_t After(std::size_t at) const { return (at + 1) & Mask(); }
+
+    std::uint32_t PlaceFor(const Value& value)
+    {
+        if (mFree.empty())
         {
-            std::uint32_t& first = FirstOf(mNodes[at].hash);
-            mNodes[at].next = first;
-            first = at;
+            mValues.push_back(value);
+            return static_cast<std::uint32_t>(mValues.size() - 1);
         }
+        const std::uint32_t place = mFree.back();
+        mFree.pop_back();
+        mValues[place] = value;
+        return place;
     }
 
-    std::vector<Node> mNodes;
-    std::vector<std::uint32_t> mFirst; // by the hash's low bits
-    std::uint32_t mFree = kNone;
+    void Put(const Slot& slot)
+    {
+        std::size_t at = slot.hash & Mask();
+        while (mSlots[at].place != kNone)
+            at = After(at);
+        mSlots[at] = slot;
+    }
+
+    // What stands after a gap, up to the next one, moves into it unless that is before where its hash says.
+    void CloseGap(std::size_t gap)
+    {
+        for (std::size_t at = After(gap); mSlots[at].place != kNone; at = After(at))
+        {
+            const std::size_t wanted = mSlots[at].hash & Mask();
+            if (((at - wanted) & Mask()) < ((at - gap) & Mask()))
+                continue;
+            mSlots[gap] = mSlots[at];
+            gap = at;
+        }
+        mSlots[gap] = {};
+    }
+
+    void Grow()
+    {
+        std::vector<Slot> before(mSlots.empty() ? kFewest : 2 * mSlots.size());
+        before.swap(mSlots);
+        for (const Slot& slot : before)
+            if (slot.place != kNone)
+                Put(slot);
+    }
+
+    std::vector<Slot> mSlots; // by the hash's low bits
+    std::vector<Value> mValues;
+    std::vector<std::uint32_t> mFree; // places in it
+    std::size_t mCount = 0;
 };

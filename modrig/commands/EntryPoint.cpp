@@ -11,13 +11,15 @@ namespace
 constexpr const wchar_t* kTexts = L"ModrigLists.dll";
 constexpr long kNoLanguage = 0;
 
-void RegisterCommand(const wchar_t* name, TsEdCommandHandler handler, unsigned usage, unsigned summary)
+void RegisterCommand(const wchar_t* name, TsEdCommandHandler handler, TsEdEntries entries, unsigned usage,
+                     unsigned summary)
 {
     const CStdStr group = CStdStr::OfId(ModrigMessages::kListsGroup);
     TsEdCommandStack* commands = TsEdCommandStack::cast(tsrxSysRegistry()->at(TSED_REGISTERED_COMMANDS));
     if (!commands || commands->addCommand(group.c_str(), name, name, 0, handler) != TSED_COMMAND_OK)
         return;
     tsedTakeArguments(group.c_str(), name, CStdStr::OfId(usage).c_str());
+    tsedOfferEntries(group.c_str(), name, entries);
     tsedDescribeCommand(group.c_str(), name, CStdStr::OfId(summary).c_str());
 }
 
@@ -27,8 +29,9 @@ int Load()
         return TSRX_RET_ERROR;
     const CTemporaryResourceOverride texts(CTemporaryResourceOverride::m_hInstanceDefault);
     using namespace ModrigMessages;
-    RegisterCommand(L"SUITE", ModrigUtils::RunSuite, kSuiteUsage, kSuiteSummary);
-    RegisterCommand(L"HISTORY", ModrigUtils::RunHistory, kHistoryUsage, kHistorySummary);
+    RegisterCommand(L"SUITE", ModrigUtils::RunSuite, ModrigUtils::SuiteEntries, kSuiteUsage, kSuiteSummary);
+    RegisterCommand(L"HISTORY", ModrigUtils::RunHistory, ModrigUtils::HistoryEntries, kHistoryUsage,
+                    kHistorySummary);
     return TSRX_RET_OK;
 }
 } // namespace

@@ -1,8 +1,11 @@
 #include "modrig/commands/KeptList.h"
 
+#include <tessel/tsed.h>
 #include <wincompat/winfile.h>
 
 #include <algorithm>
+#include <cwchar>
+#include <functional>
 #include <string>
 
 #include "modrig/base/SplitPath.h"
@@ -21,6 +24,8 @@ namespace
 {
 constexpr std::size_t kLongestPath = 1023; // what can be read back
 constexpr std::size_t kPlaceSize = 1024;
+constexpr std::size_t kReasonSize = 8192;
+constexpr std::size_t kLongestTyped = 8192;
 
 CStdStr Decimal(std::size_t number)
 {
@@ -38,20 +43,26 @@ CStdStr Summary(unsigned oneText, unsigned manyText, const std::vector<CStdStr>&
                              : CStdStr::Formatted(manyText, Decimal(paths.size()).c_str());
 }
 
-// From the root of the file system on; what is typed with a path counts from the current folder.
+// In the one way in which the lists have it. What no path is known for is looked for as it was typed.
 CStdStr WholePath(const CStdStr& typed)
 {
-    if (typed.Text().starts_with(L'/'))
-        return typed;
-    std::wstring rest = typed.Text();
-    while (rest.starts_with(L"./"))
-        rest.erase(0, 2);
-    return CurrentFolder() + CStdStr(L"/") + CStdStr(rest);
+    wchar_t path[kLongestTyped] = {};
+    return tsedTypedPath(typed.c_str(), path, kLongestTyped) == TS_NORMAL ? CStdStr(std::wstring(path))
+                                                                          : typed;
+}
+
+bool IsNumber(const CStdStr& typed)
+{
+    const std::wstring& text = typed.Text();
+    return !text.empty() && std::all_of(text.begin(), text.end(),
+                                        [](wchar_t digit) { return digit >= L'0' && digit <= L'9'; });
 }
 
 // Why a file cannot join a list; otherwise the path becomes the one that it is found at.
 CStdStr WhyRefused(const KeptList& list, CStdStr& path)
 {
+    if (path.IsEmpty())
+        return CStdStr::OfId(ModrigMessages::kNothingNamed);
     if (!FindExtension(path.AfterLastDot()))
         return CStdStr::Formatted(ModrigMessages::kCannotLoadFile, path.c_str());
     if (ValidateFileExists(path) == INVALID_FILE_ATTRIBUTES)
@@ -80,8 +91,13 @@ CStdStr EntryFor(const KeptList& list, const CStdStr& typed)
 
 CStdStr NotInList(const KeptList& list, const CStdStr& typed)
 {
+    if (typed.IsEmpty())
+        return CStdStr::OfId(ModrigMessages::kNothingNamed);
+    if (IsNumber(typed))
+        return CStdStr::Formatted(ModrigMessages::kPlaceIsNoFile, typed.c_str(),
+                                  CStdStr::OfId(list.inText).c_str());
     return CStdStr::Formatted(ModrigMessages::kNotInList, WholePath(typed).c_str(),
-                              CStdStr::OfId(list.nameText).c_str());
+                              CStdStr::OfId(list.inText).c_str());
 }
 
 // The place of what counts instead of the data; empty when the data would count.
@@ -97,6 +113,50 @@ CStdStr LaidDownInstead(const CStdStr& key, const CStdStr& name, const CStdStr& 
     const bool isTheSame = ReadModrigRegString(HKEY_CURRENT_USER, key, name, counts) && counts == data;
     return laidDown && !isTheSame ? CStdStr(std::wstring(place)) : CStdStr();
 }
+bool LeadsToAFile(const CStdStr& typed)
+{
+    return GetFileAttributesW(WholePath(typed).c_str()) != INVALID_FILE_ATTRIBUTES;
+}
+
+// Typed without its quotes, a name with blanks comes as several. `isMeant` knows it again.
+CStdStr HintAtQuotes(const std::vector<CStdStr>& typed, const std::function<bool(const CStdStr&)>& isMeant)
+{
+    for (auto first = typed.begin(); first != typed.end(); ++first)
+    {
+        std::wstring name = first->Text();
+        for (auto next = first + 1; next != typed.end() && name.size() <= kLongestPath; ++next)
+        {
+            name += L" " + next->Text();
+            if (isMeant(CStdStr(name)))
+                return CStdStr(L"\n") + CStdStr::Formatted(ModrigMessages::kQuotesNeeded, name.c_str());
+        }
+    }
+    return {};
+}
+
+// What the host says of a value that it may have missed; empty when it is what was read.
+CStdStr WhyMissed(const CStdStr& key, const CStdStr& name)
+{
+    wchar_t reason[kReasonSize] = {};
+    const bool mayBeMissed = tsRegMayHaveMissed(key.c_str(), name.c_str(), reason, kReasonSize);
+    return mayBeMissed ? CStdStr(std::wstring(reason)) : CStdStr();
+}
+
+// A list ends at its first gap, and what cannot be read looks like one.
+CStdStr WhyMissed(const StoredListNames& names)
+{
+    const CStdStr key = SubKeyOf(names);
+    CStdStr value;
+    CStdStr missed = WhyMissed(key, CStdStr(names.count));
+    bool isThere = ReadModrigRegString(HKEY_CURRENT_USER, key, CStdStr(names.count), value);
+    const long count = std::wcstol(value.c_str(), nullptr, 10);
+    for (long number = 1; missed.IsEmpty() && isThere && number <= count; ++number)
+    {
+        missed = WhyMissed(key, EntryName(names, number));
+        isThere = ReadModrigRegString(HKEY_CURRENT_USER, key, EntryName(names, number), value);
+    }
+    return missed;
+}
 } // namespace
 
 const KeptList& KeptStartupSuite()
@@ -106,6 +166,7 @@ const KeptList& KeptStartupSuite()
                                kStoredStartupSuite,
                                gStartupList,
                                kStartupSuiteName,
+                               kInStartupSuite,
                                kOneAddedToStartupSuite,
                                kManyAddedToStartupSuite,
                                kOneRemovedFromSuite,
@@ -121,6 +182,7 @@ const KeptList& KeptHistory()
                                kStoredHistory,
                                gHistoryList,
                                kHistoryName,
+                               kInHistory,
                                kOneAddedToHistory,
                                kManyAddedToHistory,
                                kOneRemovedFromHistory,
@@ -129,21 +191,26 @@ const KeptList& KeptHistory()
     return list;
 }
 
-void ReadKept(const KeptList& list)
+CStdStr ReadKept(const KeptList& list)
 {
     ReadStoredList(list.names, list.files, [](const CStdStr&) {});
+    const CStdStr missed = WhyMissed(list.names);
+    return missed.IsEmpty() ? missed
+                            : CStdStr::Formatted(ModrigMessages::kListNotRead,
+                                                 CStdStr::OfId(list.inText).c_str(), missed.c_str());
 }
 
 Change AddFiles(const KeptList& list, const std::vector<CStdStr>& typed)
 {
     if (typed.size() > kMaxFilesAtOnce)
-        return {CStdStr::Formatted(ModrigMessages::kTooManyFiles, Decimal(kMaxFilesAtOnce).c_str())};
+        return {CStdStr::Formatted(ModrigMessages::kTooManyAdded, Decimal(kMaxFilesAtOnce).c_str(),
+                                   Decimal(typed.size()).c_str(), CStdStr::OfId(list.nameText).c_str())};
     std::vector<CStdStr> paths;
     for (const CStdStr& file : typed)
     {
         CStdStr path = WholePath(file);
-        if (CStdStr refused = WhyRefused(list, path); !refused.IsEmpty())
-            return {refused};
+        if (const CStdStr refused = WhyRefused(list, path); !refused.IsEmpty())
+            return {refused + HintAtQuotes(typed, LeadsToAFile)};
         paths.push_back(path);
     }
     for (const CStdStr& path : paths)
@@ -158,7 +225,8 @@ Change RemoveFiles(const KeptList& list, const std::vector<CStdStr>& typed)
     {
         CStdStr path = EntryFor(list, file);
         if (path.IsEmpty())
-            return {NotInList(list, file)};
+            return {NotInList(list, file) + HintAtQuotes(typed, [&list](const CStdStr& name)
+                                                         { return !EntryFor(list, name).IsEmpty(); })};
         paths.push_back(std::move(path));
     }
     for (const CStdStr& path : paths)
@@ -171,7 +239,7 @@ Change RemoveAllFiles(const KeptList& list)
     const std::vector<CStdStr> paths(list.files.begin(), list.files.end());
     list.files.RemoveAll();
     if (paths.empty())
-        return {{}, CStdStr::Formatted(ModrigMessages::kListIsEmpty, CStdStr::OfId(list.nameText).c_str())};
+        return {{}, CStdStr::Formatted(ModrigMessages::kListIsEmpty, CStdStr::OfId(list.inText).c_str())};
     return {{}, Summary(list.oneRemoved, list.manyRemoved, paths)};
 }
 
@@ -181,11 +249,8 @@ Change MoveFile(const CStdStr& typed, const CStdStr& place)
     const CStdStr path = EntryFor(suite, typed);
     if (path.IsEmpty())
         return {NotInList(suite, typed)};
-    const std::wstring& digits = place.Text();
-    const bool isNumber = !digits.empty() && digits.size() < 10 && // fits into the number
-                          std::all_of(digits.begin(), digits.end(),
-                                      [](wchar_t digit) { return digit >= L'0' && digit <= L'9'; });
-    const std::size_t number = isNumber ? std::stoul(digits) : 0;
+    const bool fits = place.Text().size() < 10; // into the number
+    const std::size_t number = fits && IsNumber(place) ? std::stoul(place.Text()) : 0;
     const std::vector<CStdStr> entries(suite.files.begin(), suite.files.end());
     if (number < 1 || number > entries.size())
         return {

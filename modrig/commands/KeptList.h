@@ -16,6 +16,7 @@ struct KeptList
     const StoredListNames& names;
     CStringList& files;
     unsigned nameText; // within a sentence
+    unsigned inText;   // within one about what is in it
     unsigned oneAdded;
     unsigned manyAdded;
     unsigned oneRemoved;
@@ -26,8 +27,8 @@ struct KeptList
 const KeptList& KeptStartupSuite();
 const KeptList& KeptHistory();
 
-// Reads what counts in this profile.
-void ReadKept(const KeptList& list);
+// Reads what counts in this profile. Why some of it, or all, could not be read; empty when all was.
+[[nodiscard]] CStdStr ReadKept(const KeptList& list);
 
 // What a person has done to a list: a sentence about it, or why nothing was done.
 struct Change

@@ -57,7 +57,7 @@ void PrintAsText(const KeptList& list)
         Print(line.Text());
     }
     if (list.files.IsEmpty())
-        Print(CStdStr::Formatted(ModrigMessages::kListIsEmpty, CStdStr::OfId(list.nameText).c_str()).Text());
+        Print(CStdStr::Formatted(ModrigMessages::kListIsEmpty, CStdStr::OfId(list.inText).c_str()).Text());
 }
 
 void PrintAsJson(const KeptList& list)
@@ -100,13 +100,13 @@ struct Request
 Request RequestOf(const Texts& arguments)
 {
     Request request;
-    for (const CStdStr& argument : arguments)
-        if (argument == CStdStr(L"--json"))
-            request.asJson = true;
-        else if (request.action.empty())
-            request.action = argument.Text();
-        else
-            request.files.push_back(argument);
+    if (arguments.empty())
+        return request;
+    request.action = arguments.front().Text();
+    request.files.assign(arguments.begin() + 1, arguments.end());
+    request.asJson = !request.files.empty() && request.files.back() == CStdStr(L"--json");
+    if (request.asJson)
+        request.files.pop_back();
     return request;
 }
 
@@ -146,11 +146,13 @@ void Run(const KeptList& list)
 {
     const CTemporaryResourceOverride texts(CTemporaryResourceOverride::m_hInstanceDefault);
     const Request request = RequestOf(TypedArguments());
-    ReadKept(list);
+    const CStdStr unread = ReadKept(list);
     const Texts before(list.files.begin(), list.files.end());
     const auto change = Apply(list, request);
     if (!change)
         return tsedFailCommand(nullptr);
+    if (!unread.IsEmpty())
+        return tsedFailCommand(unread.c_str());
     if (!change->refused.IsEmpty())
         return tsedFailCommand(change->refused.c_str());
     bool modrigWaits = false;
@@ -158,6 +160,19 @@ void Run(const KeptList& list)
     if (const CStdStr reason = isChanged ? Store(list, modrigWaits) : CStdStr(); !reason.IsEmpty())
         return tsedFailCommand(reason.c_str());
     Tell(list, request, *change, modrigWaits);
+}
+// What cannot be read is told by the command.
+TsResultBuffer* Entries(const KeptList& list)
+{
+    static_cast<void>(ReadKept(list));
+    TsResultBuffer* entries = nullptr;
+    TsResultBuffer** end = &entries;
+    for (const CStdStr& path : list.files)
+    {
+        *end = tsutBuildList({TsRbValue::String(path.c_str())});
+        end = &(*end)->next;
+    }
+    return entries;
 }
 } // namespace
 
@@ -169,5 +184,15 @@ void RunSuite()
 void RunHistory()
 {
     Run(KeptHistory());
+}
+
+TsResultBuffer* SuiteEntries()
+{
+    return Entries(KeptStartupSuite());
+}
+
+TsResultBuffer* HistoryEntries()
+{
+    return Entries(KeptHistory());
 }
 } // namespace ModrigUtils

@@ -1,6 +1,8 @@
 #include "modrig/lists/StoredList.h"
 
 #include <cwchar>
+#include <string>
+#include <string_view>
 #include <utility>
 
 #include "modrig/messages/MessageIds.h"
@@ -16,8 +18,12 @@ CStdStr SubKeyOf(const StoredListNames& names)
 
 CStdStr EntryName(const StoredListNames& names, long index)
 {
-    CStdStr name;
-    name.Fmt(names.entryFormat, index);
+    // Without a format, which would cost more than to read the entry: names are made by the hundred thousand.
+    const std::string digits = std::to_string(index);
+    const std::wstring_view end = names.entryEnd;
+    std::wstring name;
+    name.reserve(digits.size() + end.size());
+    name.append(digits.begin(), digits.end()).append(end);
     return name;
 }
 

@@ -11,13 +11,13 @@ namespace ModrigUtils
 // Where and under which names a list is stored.
 struct StoredListNames
 {
-    const wchar_t* subKey;      // "History"
-    const wchar_t* count;       // "NumHistory"
-    const wchar_t* entryFormat; // "%dHistory"
+    const wchar_t* subKey;   // "History"
+    const wchar_t* count;    // "NumHistory"
+    const wchar_t* entryEnd; // "History": of "1History", "2History"
 };
 
-inline constexpr StoredListNames kStoredHistory = {L"History", L"NumHistory", L"%dHistory"};
-inline constexpr StoredListNames kStoredStartupSuite = {L"Startup", L"NumStartup", L"%dStartup"};
+inline constexpr StoredListNames kStoredHistory = {L"History", L"NumHistory", L"History"};
+inline constexpr StoredListNames kStoredStartupSuite = {L"Startup", L"NumStartup", L"Startup"};
 
 // The key of a list in the profile that is the current one, and the value of an entry, from 1.
 [[nodiscard]] CStdStr SubKeyOf(const StoredListNames& names);

@@ -2,6 +2,8 @@
 
 #include <tessel/tsed.h>
 
+#include <utility>
+
 #include "modrig/base/SplitPath.h"
 #include "modrig/lists/Globals.h"
 #include "modrig/lists/ListMembership.h"
@@ -53,7 +55,7 @@ int PerformModrig(CStdStr path, int addToHistory, signed char loadAll, signed ch
     if (LispIsDisabled() && IsRefusedWhileLispIsOff(path))
         return kNotLoaded;
     const bool alreadyLoaded = FoundinLoadedList(path);
-    const bool isLispApp = IsALispAppFoundinList(path);
+    const bool isLispApp = alreadyLoaded && IsALispAppFoundinList(path);
     if (alreadyLoaded && !isLispApp)
         return kAlreadyLoaded;
     const bool isLoaded = LoadApplication(path, kLoad, loadAll);
@@ -75,9 +77,9 @@ bool LoadApplication(CStdStr path, signed char load, signed char loadAll)
     switch (FileTypeOfPath(path))
     {
     case kCompiledModule:
-        return LoadQMBFile(path, load);
+        return LoadQMBFile(std::move(path), load);
     case kLispFile:
-        return LoadLispFile(path, load, loadAll);
+        return LoadLispFile(std::move(path), load, loadAll);
     default:
         // Macro projects and packaged Lisp are known kinds, but there is no road to load them by.
         return RefuseFile(path);

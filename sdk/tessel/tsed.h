@@ -13,6 +13,13 @@ TESSEL_API int tsedGetVar(const wchar_t* name, TsResultBuffer* result);
 // path. TS_ERROR: not found, or the path does not fit. A full path is only checked for existence.
 TESSEL_API int tsedFindFile(const wchar_t* name, wchar_t* found, std::size_t capacity);
 
+// The file or folder that a person means by what is typed as an argument of a command, from the root on. "~"
+// stands for a home folder, and what does not begin with a slash counts from the current folder. Each file
+// has one such path, but for links, which stay as they were typed. On TS_NORMAL it stands in `path` (capacity
+// in characters), whether anything is there or not. TS_ERROR: nothing was typed, the current folder is gone,
+// or the path does not fit.
+TESSEL_API int tsedTypedPath(const wchar_t* typed, wchar_t* path, std::size_t capacity);
+
 // The full path of the application that is being called (its entry point or one of its commands), or an
 // empty text outside of such a call. Valid until the call ends.
 TESSEL_API const wchar_t* tsedGetAppName();

@@ -60,6 +60,13 @@ TESSEL_API int tsedTakeArguments(const wchar_t* group, const wchar_t* globalName
 // caller frees the list with `tsutRelRb`.
 TESSEL_API TsResultBuffer* tsedCommandArguments();
 
+// Lets the Tab key offer what stands in a list of the application's, at the places of the usage that say
+// `entry`. The function is called while a person types, with what was typed before in
+// `tsedCommandArguments()`, and answers TS_STRING values or null; the host frees them. It must not speak.
+// Status as with `tsedTakeArguments`, TSED_COMMAND_INVALID for null.
+using TsEdEntries = TsResultBuffer* (*)();
+TESSEL_API int tsedOfferEntries(const wchar_t* group, const wchar_t* globalName, TsEdEntries entries);
+
 // Makes the running command one that has failed: when its handler has returned, the host tells the sentence
 // as it tells its own errors, and a script counts the line as failed. Null stands for arguments that the
 // command does not take: the host then says how it is typed. The last call counts; outside of a command

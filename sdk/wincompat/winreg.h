@@ -16,7 +16,8 @@ inline constexpr DWORD REG_SZ = 1;
 inline constexpr DWORD REG_CREATED_NEW_KEY = 1;
 inline constexpr DWORD REG_OPENED_EXISTING_KEY = 2;
 
-// Opens an existing key. ERROR_FILE_NOT_FOUND when there is none. `*result` is closed with `RegCloseKey`.
+// Opens an existing key. ERROR_FILE_NOT_FOUND when there is none, ERROR_READ_FAULT when there may be one: the
+// store cannot be read, or is damaged. `*result` is closed with `RegCloseKey`.
 TESSEL_API LONG RegOpenKeyExW(HKEY root, const wchar_t* subKey, DWORD reserved, DWORD access, HKEY* result);
 
 // Opens a key and makes it and its missing parents. `keyClass`, `security` and `disposition` may be null.
@@ -38,8 +39,9 @@ TESSEL_API LONG RegDeleteValueW(HKEY key, const wchar_t* name);
 TESSEL_API LONG RegCloseKey(HKEY key);
 
 // The host's own value calls. Reading: `*type` is set to the value's type and `*size` (bytes, in: the
-// buffer's, out: the data's with its terminator); ERROR_FILE_NOT_FOUND, or ERROR_MORE_DATA when it does not
-// fit (the buffer is then untouched). An empty name is the key's unnamed value.
+// buffer's, out: the data's with its terminator); ERROR_FILE_NOT_FOUND, ERROR_READ_FAULT when the value may
+// be there all the same, or ERROR_MORE_DATA when it does not fit (the buffer is then untouched). An empty
+// name is the key's unnamed value.
 TESSEL_API LONG tsRegGetValue(HKEY key, const wchar_t* name, DWORD reserved, DWORD* type, void* data,
                               DWORD* size);
 
@@ -50,3 +52,11 @@ TESSEL_API LONG tsudRegSetString(HKEY key, const wchar_t* name, const wchar_t* d
 // under its name here. `place`, when not null, receives where it is laid down, as far as it fits (capacity in
 // characters, the terminator included). False for a handle that is not open.
 TESSEL_API bool tsRegIsLaidDown(HKEY key, const wchar_t* name, wchar_t* place, std::size_t capacity);
+
+// Whether something else may count under the name than what is read there: the person's registry cannot be
+// read, or is damaged. `path` is that of the key below HKEY_CURRENT_USER. `reason`, when not null, receives
+// whole sentences for the person, about the file, what is the matter and what helps, as far as they fit
+// (capacity in characters, the terminator included); then the host does not tell them at the end of the
+// command, which is to fail.
+TESSEL_API bool tsRegMayHaveMissed(const wchar_t* path, const wchar_t* name, wchar_t* reason,
+                                   std::size_t capacity);

@@ -38,6 +38,8 @@ protected:
         ModuleTest::SetUp();
         host().resources.addModule(kTexts, {{ModrigMessages::kHistoryName, L"the History"},
                                             {ModrigMessages::kStartupSuiteName, L"the Suite"},
+                                            {ModrigMessages::kInStartupSuite, L"in the Suite"},
+                                            {ModrigMessages::kListNotRead, L"unread: %s. %s"},
                                             {ModrigMessages::kListNotStored, L"not stored"},
                                             {ModrigMessages::kManyRemovedFromHistory, L"%s removed"},
                                             {ModrigMessages::kManyRemovedFromSuite, L"%s taken out"},
@@ -53,6 +55,8 @@ protected:
                 TSED_COMMAND_OK);
             ASSERT_EQ(tsedTakeArguments(L"LISTS", name, L"..."), TSED_COMMAND_OK);
         }
+        ASSERT_EQ(tsedOfferEntries(L"LISTS", L"SUITE", SuiteEntries), TSED_COMMAND_OK);
+        ASSERT_EQ(tsedOfferEntries(L"LISTS", L"HISTORY", HistoryEntries), TSED_COMMAND_OK);
         Store(kStoredHistory);
         Store(kStoredStartupSuite);
     }
@@ -161,4 +165,27 @@ TEST_F(ListCommandsWithoutHost, WriteNoRecordThatIsAsItShouldBe)
     RecordModrig(kAtStart | kOnCommand);
     EXPECT_TRUE(host().commands.type(L"SUITE REMOVE /a.lsp"));
     EXPECT_THAT(host().applicationRecords.writes, IsEmpty());
+}
+
+TEST_F(ListCommandsWithoutHost, DisturbNobodyAndStoreNothingWhereTheListCannotBeRead)
+{
+    RecordModrig(kAtStart | kOnCommand);
+    host().linker.setLoaded(kModrig);
+    host().registry.whyUnreadable = L"It is torn.";
+    EXPECT_FALSE(host().commands.type(L"SUITE CLEAR"));
+    EXPECT_THAT(host().commands.failure, Optional(std::wstring(L"unread: in the Suite. It is torn.")));
+    EXPECT_THAT(Stored(kStoredStartupSuite), ElementsAre(L"/a.lsp", L"/b.lsp"));
+    EXPECT_THAT(host().linker.calls, IsEmpty());
+    EXPECT_EQ(Recorded(), kAtStart | kOnCommand);
+    EXPECT_THAT(lines(), IsEmpty());
+}
+
+TEST_F(ListCommandsWithoutHost, OfferWhatIsStored)
+{
+    CStringList one;
+    Fill(one, {L"/one.lsp"});
+    ASSERT_TRUE(StoreList(kStoredHistory, one));
+    EXPECT_THAT(host().commands.offered(L"SUITE", {L"REMOVE"}), ElementsAre(L"/a.lsp", L"/b.lsp"));
+    EXPECT_THAT(host().commands.offered(L"HISTORY", {L"REMOVE"}), ElementsAre(L"/one.lsp"));
+    EXPECT_THAT(lines(), IsEmpty());
 }

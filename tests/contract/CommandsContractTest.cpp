@@ -168,6 +168,19 @@ TEST_F(CommandsContract, TakesArgumentsOfAKnownCommandInOneLineOfUsage)
     EXPECT_FALSE(host->type(L"CONTRACTEINS one"));
 }
 
+TEST_F(CommandsContract, TakesEntriesOfAKnownCommandOnly)
+{
+    add(L"CONTRACT", L"CONTRACTONE", L"CONTRACTEINS");
+    const TsEdEntries none = []() -> TsResultBuffer*
+    {
+        return nullptr;
+    };
+    EXPECT_EQ(tsedOfferEntries(L"contract", L"contractone", none), TSED_COMMAND_OK);
+    EXPECT_EQ(tsedOfferEntries(L"CONTRACT", L"CONTRACTTWO", none), TSED_COMMAND_UNKNOWN);
+    EXPECT_EQ(tsedOfferEntries(nullptr, L"CONTRACTONE", none), TSED_COMMAND_UNKNOWN);
+    EXPECT_EQ(tsedOfferEntries(L"CONTRACT", L"CONTRACTONE", nullptr), TSED_COMMAND_INVALID);
+}
+
 TEST_F(CommandsContract, CountsACommandAsFailedThatSaysSo)
 {
     commands->addCommand(L"CONTRACT", L"CONTRACTONE", L"CONTRACTEINS", 0,

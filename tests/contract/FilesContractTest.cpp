@@ -25,6 +25,13 @@ protected:
         wchar_t found[kPathSize] = L"untouched";
         return tsedFindFile(name.c_str(), found, kPathSize) == TS_NORMAL ? found : L"";
     }
+
+    // Empty when nothing is meant.
+    static std::wstring meant(const std::wstring& typed)
+    {
+        wchar_t path[kPathSize] = L"untouched";
+        return tsedTypedPath(typed.c_str(), path, kPathSize) == TS_NORMAL ? path : L"";
+    }
 };
 
 TEST_F(FilesContract, TellsFilesFromFolders)
@@ -108,6 +115,26 @@ TEST_F(FilesContract, DoesNotFindWhatDoesNotFit)
     EXPECT_EQ(tsedFindFile(file.c_str(), buffer.data(), file.size()), TS_ERROR);
     EXPECT_EQ(tsedFindFile(file.c_str(), buffer.data(), file.size() + 1), TS_NORMAL);
     EXPECT_EQ(std::wstring(buffer.data()), file);
+}
+
+TEST_F(FilesContract, HasOnePathForWhatIsTypedInManyWays)
+{
+    const std::wstring folder = host->makeFolder(L"folder");
+    host->enterFolder(folder);
+    for (const wchar_t* typed : {L"tool.lsp", L"./tool.lsp", L"a/../tool.lsp", L".//tool.lsp", L"tool.lsp/"})
+        EXPECT_EQ(meant(typed), folder + L"/tool.lsp") << typed;
+    for (const wchar_t* rest : {L"/tool.lsp", L"//tool.lsp", L"/./tool.lsp", L"/b/../tool.lsp"})
+        EXPECT_EQ(meant(folder + rest), folder + L"/tool.lsp") << rest;
+    EXPECT_EQ(meant(L"/.."), L"/");
+    EXPECT_EQ(meant(L""), L"");
+}
+
+TEST_F(FilesContract, GivesNoPartOfAPathThatIsTyped)
+{
+    std::vector<wchar_t> buffer(10);
+    EXPECT_EQ(tsedTypedPath(L"/tool.lsp", buffer.data(), 9), TS_ERROR);
+    EXPECT_EQ(tsedTypedPath(L"/tool.lsp", buffer.data(), 10), TS_NORMAL);
+    EXPECT_EQ(std::wstring(buffer.data()), L"/tool.lsp");
 }
 
 struct Split

@@ -106,6 +106,16 @@ TEST_F(RegistryContract, HasNothingLaidDownWhereNobodyDidSo)
     EXPECT_FALSE(tsRegIsLaidDown(nullptr, L"Name", nullptr, 0));
 }
 
+TEST_F(RegistryContract, MissesNothingInARegistryThatCanBeRead)
+{
+    set(L"Name", L"1");
+    wchar_t reason[8] = L"before";
+    EXPECT_FALSE(tsRegMayHaveMissed(kContractKey, L"Name", reason, 8));
+    EXPECT_FALSE(tsRegMayHaveMissed(kContractKey, L"None", reason, 8));
+    EXPECT_FALSE(tsRegMayHaveMissed(L"None", L"", nullptr, 0));
+    EXPECT_STREQ(reason, L"before");
+}
+
 TEST_F(RegistryContract, OpensAKeyBelowAnOpenKey)
 {
     const HKEY child = create(L"Child\\Grandchild", key);

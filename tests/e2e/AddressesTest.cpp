@@ -18,6 +18,7 @@
 namespace fs = std::filesystem;
 
 using testing::AllOf;
+using testing::ContainsRegex;
 using testing::ElementsAre;
 using testing::EndsWith;
 using testing::HasSubstr;
@@ -125,6 +126,20 @@ TEST_F(Addresses, AreFetchedOnceAndLoadedEachTime)
     expectFetched(url("/tool.lsp"));
     expectKept(url("/tool.lsp"));
     EXPECT_THAT(load(url("/missing.lsp")).output, HasSubstr("missing.lsp could not be fetched: "));
+}
+
+// Every start would wait for them.
+TEST_F(Addresses, MapTheLibrariesOfTheNetworkWhenSomethingIsFetched)
+{
+    if (!fs::exists("/proc/self/maps"))
+        GTEST_SKIP() << "This system does not list what a process has mapped.";
+    const std::string tell =
+        "(princ (with-open-file (maps \"/proc/self/maps\")"
+        " (if (loop for line = (read-line maps nil) while line thereis (search \"libcurl\" line))"
+        " \"mapped\" \"not yet\")))";
+    const auto result = session.run({tell, "LOAD " + url("/tool.lsp"), tell});
+    EXPECT_EQ(result.exitStatus, 0) << result.output;
+    EXPECT_THAT(result.output, ContainsRegex("not yet(.|\n)*it runs(.|\n)*mapped"));
 }
 
 TEST_F(Addresses, LeaveFilesThatOnlyThePersonCanRead)

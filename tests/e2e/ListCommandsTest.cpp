@@ -55,6 +55,15 @@ protected:
         return paths;
     }
 
+    std::vector<std::string> history() const
+    {
+        std::vector<std::string> paths;
+        const json list = asJson("HISTORY LIST");
+        for (const auto& file : list["files"])
+            paths.push_back(file["path"]);
+        return paths;
+    }
+
     std::string write(const std::string& name) const
     {
         return session.folder().write(name, "(princ \"" + name + " runs\")\n").string();
@@ -164,6 +173,114 @@ TEST_F(ListCommands, TakeFilesFromTheCurrentFolder)
     EXPECT_THAT(suite(), ElementsAre(second));
 }
 
+TEST_F(ListCommands, HaveOneEntryForAFileHoweverItsPathIsTyped)
+{
+    const std::string folder = session.folder().path().string();
+    const std::string name = session.folder().path().filename().string();
+    session.set("HOME", folder);
+    const std::vector<std::string> ways = {
+        "~/first.lsp", folder + "//first.lsp",     folder + "/./first.lsp", folder + "/none/../first.lsp",
+        "first.lsp",   "../" + name + "/first.lsp"};
+    for (const std::string& way : ways)
+    {
+        const auto result = session.start({"--safe", "-c", "CD " + folder, "-c", "SUITE ADD " + way, "-c",
+                                           "HISTORY ADD " + way, "-c", "SUITE MOVE " + way + " 1"});
+        EXPECT_EQ(result.exitStatus, 0) << result.output;
+        EXPECT_THAT(suite(), ElementsAre(first)) << way;
+        EXPECT_THAT(history(), ElementsAre(first)) << way;
+        const auto removed = session.start(
+            {"--safe", "-c", "CD " + folder, "-c", "SUITE REMOVE " + way, "-c", "HISTORY REMOVE " + way});
+        EXPECT_EQ(removed.exitStatus, 0) << removed.output;
+        EXPECT_TRUE(suite().empty()) << way;
+    }
+}
+
+TEST_F(ListCommands, KeepALinkAsItWasTyped)
+{
+    const auto link = session.folder() / "link.lsp";
+    std::filesystem::create_symlink(first, link);
+    quietly("SUITE ADD " + first + " " + link.string());
+    EXPECT_THAT(suite(), ElementsAre(first, link.string()));
+}
+
+TEST_F(ListCommands, SayThatANumberNamesNoEntry)
+{
+    quietly("SUITE ADD " + first + " " + second);
+    const std::string hint =
+        "“1” is a number, and entries are named by their files: type the path that stands "
+        "at that place in the Startup Suite.\n";
+    EXPECT_EQ(quietly("SUITE REMOVE 1", 1), hint);
+    EXPECT_EQ(quietly("SUITE MOVE 1 2", 1), hint);
+    EXPECT_THAT(quietly("HISTORY REMOVE 7", 1), HasSubstr("place in the History list.\n"));
+    EXPECT_THAT(suite(), ElementsAre(first, second));
+}
+
+TEST_F(ListCommands, SayThatANameWithBlanksIsTypedInQuotes)
+{
+    const std::string blanks = write("my gear box.lsp");
+    const auto hint = [](const std::string& path)
+    {
+        return "\nA name with blanks in it is typed in quotes: \"" + path + "\"\n";
+    };
+    const std::string part = blanks.substr(0, blanks.find(" gear"));
+    for (const char* list : {"SUITE", "HISTORY"})
+        EXPECT_EQ(quietly(std::string(list) + " ADD " + first + " " + blanks + " " + second, 1),
+                  notOfAType(part) + hint(blanks));
+    EXPECT_TRUE(suite().empty());
+    quietly("SUITE ADD " + first + " " + inQuotes(blanks));
+    std::filesystem::remove(blanks); // entries need not be there any more
+    EXPECT_EQ(quietly("SUITE REMOVE " + first + " " + blanks, 1),
+              "“" + part + "” is not in the Startup Suite." + hint(blanks));
+    EXPECT_THAT(quietly("SUITE REMOVE " + blanks + "x", 1), Not(HasSubstr("quotes")));
+    EXPECT_THAT(suite(), ElementsAre(first, blanks));
+}
+
+TEST_F(ListCommands, SayThatNoFileWasNamed)
+{
+    quietly("SUITE ADD " + first);
+    for (const char* command :
+         {"SUITE ADD \"\"", "SUITE REMOVE \"\"", "SUITE MOVE \"\" 1", "HISTORY ADD \"\""})
+        EXPECT_EQ(quietly(command, 1), "No file is named: there is nothing between the quotes.\n") << command;
+    EXPECT_THAT(suite(), ElementsAre(first));
+}
+
+// Before and after the application is loaded that has them, in every language.
+TEST_F(ListCommands, OfferTheirEntriesToTheTabKey)
+{
+    struct Said
+    {
+        const char* language;
+        const char* removed;
+        const char* added;
+        const char* moved;
+        const char* forgotten;
+    };
+    for (const Said& said : {Said{"C.UTF-8", "second.lsp was removed", "second.lsp was added",
+                                  "second.lsp is in place 1", "third.lsp was removed"},
+                             Said{"de_DE.UTF-8", "second.lsp wurde aus", "second.lsp wurde zur",
+                                  "second.lsp steht jetzt auf", "third.lsp wurde aus"}})
+    {
+        quietly("SUITE CLEAR");
+        quietly("SUITE ADD " + first + " " + second);
+        quietly("HISTORY ADD " + third);
+        session.set("LC_ALL", said.language);
+        HostTerminal terminal(session, {"--safe"});
+        ASSERT_TRUE(terminal.awaitPrompt());
+        terminal.type("SUITE REMOVE \t\t");
+        EXPECT_TRUE(terminal.shows(first + "  " + second + "\r\n")) << terminal.screen();
+        terminal.type("s\t\r");
+        EXPECT_TRUE(terminal.shows(said.removed)) << terminal.screen();
+        terminal.type("SUITE ADD " + session.folder().path().string() + "/sec\t\r");
+        EXPECT_TRUE(terminal.shows(said.added)) << terminal.screen();
+        terminal.type("SUITE MOVE sec\t1\r");
+        EXPECT_TRUE(terminal.shows(said.moved)) << terminal.screen();
+        terminal.type("HISTORY REMOVE \t\r");
+        EXPECT_TRUE(terminal.shows(said.forgotten)) << terminal.screen();
+        EXPECT_EQ(terminal.quit(), 0);
+        session.set("LC_ALL", "C.UTF-8");
+    }
+}
+
 TEST_F(ListCommands, RefuseWhatCannotBeLoadedAndChangeNothing)
 {
     const std::string text = session.folder().write("notes.txt", "").string();
@@ -181,7 +298,7 @@ TEST_F(ListCommands, TakeNoMoreThanFiftyFilesAtOnce)
     for (int count = 0; count < 50; ++count)
         fifty += " " + first;
     EXPECT_EQ(quietly(fifty + " " + second, 1),
-              "No more than 50 files can be taken at once. None of them has been loaded.\n");
+              "No more than 50 files can be taken at once. None of the 51 was added to the Startup Suite.\n");
     EXPECT_TRUE(suite().empty());
     quietly(fifty);
     EXPECT_THAT(suite(), ElementsAre(first));
@@ -210,11 +327,12 @@ TEST_F(ListCommands, AddToAListOfManyEntries)
 
 TEST_F(ListCommands, TellWhenTheyAreTypedWrongly)
 {
-    const std::string usage = "Usage: SUITE LIST\n       SUITE ADD file...\n       SUITE REMOVE file...\n"
-                              "       SUITE MOVE file place\n       SUITE CLEAR [--json]\n";
+    const std::string usage = "Usage: SUITE LIST [--json]\n       SUITE ADD file... [--json]\n"
+                              "       SUITE REMOVE entry... [--json]\n"
+                              "       SUITE MOVE entry place [--json]\n       SUITE CLEAR [--json]\n";
     const std::vector<std::string> wrong = {
         "SUITE",        "SUITE GROW",      "SUITE LIST " + first, "SUITE ADD",
-        "SUITE REMOVE", "SUITE CLEAR all", "SUITE MOVE " + first};
+        "SUITE REMOVE", "SUITE CLEAR all", "SUITE MOVE " + first, "SUITE --json LIST"};
     for (const std::string& command : wrong)
         EXPECT_EQ(quietly(command, 1), usage) << command;
 }
@@ -246,9 +364,11 @@ TEST_F(ListCommands, SpeakThePersonsLanguage)
 {
     session.set("LC_ALL", "de_AT.UTF-8");
     EXPECT_THAT(session.start({"--safe", "-c", "SUITE LIST"}).output,
-                HasSubstr("In der Startgruppe steht nichts.\n"));
+                HasSubstr("Es steht nichts in der Startgruppe.\n"));
     const auto refused = session.start({"--safe", "-c", "HISTORY REMOVE " + first});
-    EXPECT_THAT(refused.output, HasSubstr("„" + first + "“ steht nicht in dem Verlauf.\n"));
+    EXPECT_THAT(refused.output, HasSubstr("„" + first + "“ steht nicht im Verlauf.\n"));
+    EXPECT_THAT(session.start({"--safe", "-c", "HISTORY LIST"}).output,
+                HasSubstr("\nEs steht nichts im Verlauf.\n"));
 }
 
 TEST_F(ListCommands, AreNotLoadedBeforeTheyAreTyped)

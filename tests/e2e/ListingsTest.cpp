@@ -52,6 +52,18 @@ TEST_F(Listings, OfApplicationsTellWhatIsLoadedAndWhatIsNot)
     EXPECT_NE(apps["notLoaded"][0]["reason"], "");
 }
 
+TEST_F(Listings, TellTheVersionAlone)
+{
+    EXPECT_EQ(answer("VERSION"), json({{"program", "Tessel R21"}, {"version", MODRIG_VERSION}}));
+    EXPECT_EQ(session.run({"VERSION 2"}).exitStatus, 1);
+    EXPECT_EQ(session.run({"VERSION 2 --json"}).exitStatus, 1);
+}
+
+TEST_F(Listings, OfCommandsAreTheSameByTheShortName)
+{
+    EXPECT_EQ(answer("?"), answer("HELP"));
+}
+
 TEST_F(Listings, OfCommandsKnowThoseThatAreNotLoadedYet)
 {
     const json help = answer("HELP");

@@ -162,3 +162,17 @@ TEST_F(OddPaths, WithTheLongestFileNameAreLoadedFromTheStartupSuite)
                   "Tessel R21, reference host for Modrig, version " MODRIG_VERSION "\n" + name +
                   ": message 2\n");
 }
+
+TEST(AQuoteThatIsNotClosed, IsToldAndReachesToTheEndOfTheLine)
+{
+    const HostSession session;
+    const std::string file = session.folder().write("two words.lsp", "(princ \"loaded\")\n").string();
+    const std::string told =
+        "The last quote in the line is not closed. What follows it was taken as \"" + file + "\".\n";
+    const auto open = session.start({"--safe", "-c", "LOAD \"" + file});
+    EXPECT_EQ(open.exitStatus, 0);
+    EXPECT_NE(open.output.find(told), std::string::npos) << open.output;
+    EXPECT_NE(open.output.find("\nloaded"), std::string::npos) << open.output;
+    const auto closed = session.start({"--safe", "-c", "LOAD \"" + file + "\""});
+    EXPECT_EQ(closed.output.find("quote"), std::string::npos) << closed.output;
+}

@@ -61,8 +61,7 @@ TEST(Session, TellsOfACommandHowItIsTypedWithAnExample)
                          "DISABLE: Keeps an application out at starts; it stays in every list\n"
                          "Usage: DISABLE file\nExample: DISABLE moon.bundle\n"));
     EXPECT_THAT(session.run({"HELP CD"}).output, EndsWith("\nExample: CD \"~/My drawings\"\n"));
-    EXPECT_THAT(session.run({"HELP VERSION"}).output,
-                EndsWith("VERSION: Shows the version\nUsage: VERSION\n"));
+    EXPECT_THAT(session.run({"HELP EXIT"}).output, EndsWith("EXIT: Ends the session\nUsage: EXIT\n"));
 }
 
 TEST(Session, ListsEachWayOfTypingACommandOnALine)

@@ -13,7 +13,7 @@ struct Size
     int height = 0;
 };
 
-// Named by its size: "800x600".
+// Named by its size and resolution: "800x600at96".
 class LowScreens : public DialogTest, public testing::WithParamInterface<DisplayKind>
 {
 protected:
@@ -91,9 +91,15 @@ TEST_P(LowScreens, HoldAllOfTheStartupSuiteAndOfItsPanelAndOfAMessageBox)
     closeAndEnd();
 }
 
-INSTANTIATE_TEST_SUITE_P(
-    , LowScreens,
-    testing::Values(DisplayKind{.width = 800, .height = 600}, DisplayKind{.width = 1024, .height = 600},
-                    DisplayKind{.width = 1280, .height = 800}, DisplayKind{.width = 1366, .height = 768}),
-    [](const auto& instance)
-    { return std::to_string(instance.param.width) + "x" + std::to_string(instance.param.height); });
+INSTANTIATE_TEST_SUITE_P(, LowScreens,
+                         testing::Values(DisplayKind{.width = 800, .height = 600},
+                                         DisplayKind{.width = 1024, .height = 600},
+                                         DisplayKind{.width = 1280, .height = 800},
+                                         DisplayKind{.width = 1366, .height = 768},
+                                         DisplayKind{.width = 800, .height = 600, .dotsPerInch = 144}),
+                         [](const auto& instance)
+                         {
+                             return std::to_string(instance.param.width) + "x" +
+                                    std::to_string(instance.param.height) + "at" +
+                                    std::to_string(instance.param.dotsPerInch);
+                         });

@@ -142,3 +142,58 @@ TEST_P(DialogResolution, GivesWayToTheResolutionThatTheDesktopWants)
 INSTANTIATE_TEST_SUITE_P(DotsPerInch, DialogResolution,
                          testing::Values(std::pair{72, 1.0}, std::pair{100, 1.0}, std::pair{144, 1.5},
                                          std::pair{192, 2.0}));
+
+namespace
+{
+struct SmallScreen
+{
+    DisplayKind kind;
+    int percent; // of the usual size
+};
+
+class DialogOnSmallScreens : public DialogTest, public testing::WithParamInterface<SmallScreen>
+{
+protected:
+    DialogOnSmallScreens() : DialogTest(GetParam().kind) {}
+
+    // Neither the size that it has with room, nor less than what it can do with.
+    void expectIsScaledToTheScreen() const
+    {
+        int width = 0;
+        int height = 0;
+        ASSERT_EQ(2, std::sscanf(mScreen.sizeOf(mDialog).c_str(), "%dx%d", &width, &height));
+        const double scale = GetParam().percent / 100.0;
+        EXPECT_NEAR(width, places::kDialogWidth * scale, kRounding);
+        EXPECT_LE(height, GetParam().kind.height);
+        EXPECT_GE(height, kLeastDialogHeight * scale);
+    }
+
+    static constexpr int kLeastDialogHeight = 480;
+};
+} // namespace
+
+// Letters as large as the screen's resolution asks for would leave no room for what is to be done.
+TEST_P(DialogOnSmallScreens, IsNoLargerThanLetsItBeUsed)
+{
+    open();
+    expectIsScaledToTheScreen();
+    closeAndEnd();
+}
+
+TEST_P(DialogOnSmallScreens, IsNoLargerThanThatByASettingEither)
+{
+    setToolkitSetting("GSScaleFactor", "3");
+    open();
+    expectIsScaledToTheScreen();
+    shoot("dialog");
+    closeAndEnd();
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    , DialogOnSmallScreens,
+    testing::Values(SmallScreen{{.width = 800, .height = 600, .dotsPerInch = 144}, 100},
+                    SmallScreen{{.width = 1024, .height = 768, .dotsPerInch = 192}, 125},
+                    SmallScreen{{.width = 1280, .height = 720, .dotsPerInch = 192}, 125},
+                    SmallScreen{{.width = 1200, .height = 1000, .dotsPerInch = 192}, 150}),
+    [](const auto& instance)
+    { return std::to_string(instance.param.kind.width) + "x" + std::to_string(instance.param.kind.height); });

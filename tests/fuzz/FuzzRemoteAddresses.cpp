@@ -5,7 +5,7 @@
 #include <cstdlib>
 
 #include "host/files/RemoteAddress.h"
-#include "host/files/Sha256.h"
+#include "host/files/network/Sha256.h"
 
 namespace
 {

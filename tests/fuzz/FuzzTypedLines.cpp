@@ -6,6 +6,7 @@
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandRunner.h"
 #include "host/commands/CommandStack.h"
+#include "host/commands/TypedLine.h"
 #include "host/console/InputAssembler.h"
 #include "host/text/CommandLine.h"
 #include "host/text/LispScanner.h"

@@ -3,9 +3,11 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <cstddef>
 #include <cstring>
 #include <filesystem>
 #include <fstream>
+#include <initializer_list>
 #include <iterator>
 #include <string>
 #include <vector>
@@ -102,7 +104,32 @@ TEST(MachOFiles, AFileThatEndsInItsHeadersIsRefused)
     const std::size_t headers = sizeof(mach_header_64) + headerOf(whole).sizeofcmds;
     for (std::size_t size = 0; size < headers; ++size)
         ASSERT_NE(refusal(cutTo(whole, size)), L"") << size;
-    EXPECT_EQ(refusal(cutTo(whole, headers)), L"");
+    EXPECT_EQ(refusal(cutTo(whole, headers)), L"the file is cut short");
+}
+
+TEST(MachOFiles, AFileThatHasLostAnythingOfItsEndIsRefused)
+{
+    const Bytes whole = bytesOf(kBuild / "x86_64/samples/primes.zmb");
+    for (const std::size_t lost : {std::size_t{1}, whole.size() / 3, whole.size() / 2})
+        EXPECT_EQ(refusal(cutTo(whole, whole.size() - lost)), L"the file is cut short") << lost;
+}
+
+TEST(MachOFiles, HeadersThatContradictThemselvesAreRefused)
+{
+    const Bytes whole = bytesOf(kBuild / "x86_64/samples/primes.zmb");
+    // The first command is a segment's: it may not end before itself, nor after all commands.
+    for (const std::uint32_t size : {0U, 7U, 8U, 71U, headerOf(whole).sizeofcmds + 1})
+    {
+        Bytes changed = whole;
+        std::memcpy(changed.data() + sizeof(mach_header_64) + offsetof(load_command, cmdsize), &size,
+                    sizeof size);
+        EXPECT_EQ(refusal(changed), L"its program headers are damaged") << size;
+    }
+    Bytes more = whole;
+    mach_header_64 header = headerOf(whole);
+    ++header.ncmds;
+    std::memcpy(more.data(), &header, sizeof header);
+    EXPECT_EQ(refusal(more), L"its program headers are damaged");
 }
 
 TEST(MachOFiles, AUniversalFileThatEndsBeforeItsHalvesDoIsRefused)
@@ -112,6 +139,51 @@ TEST(MachOFiles, AUniversalFileThatEndsBeforeItsHalvesDoIsRefused)
     EXPECT_EQ(refusal(cutTo(whole, 0)), L"it is not a shared library");
     EXPECT_EQ(refusal(cutTo(whole, 6)), L"the file is cut short");
     EXPECT_EQ(refusal(cutTo(whole, half / 2)), L"the file is cut short");
+}
+
+TEST(MachOFiles, AUniversalFileIsWhatItsHalfForThisProcessorIs)
+{
+    const Bytes whole = bytesOf(kBuild / "universal/samples/primes.zmb");
+    // The table of the halves, most significant byte first: a processor, what kind of it, a place, a size.
+    constexpr std::size_t kCount = 4;
+    constexpr std::size_t kTable = 8;
+    constexpr std::size_t kEntry = 20;
+    const auto with = [&](std::size_t place, std::initializer_list<int> bytes)
+    {
+        Bytes changed = whole;
+        std::transform(bytes.begin(), bytes.end(), changed.begin() + static_cast<std::ptrdiff_t>(place),
+                       [](int byte) { return static_cast<char>(byte); });
+        return changed;
+    };
+    // Which of the two is ours is the linker's to choose: both are given another processor, then each
+    // other's.
+    Bytes foreign = with(kTable, {0, 0, 0, 18});
+    std::copy_n(foreign.begin() + kTable, 4, foreign.begin() + kTable + kEntry);
+    EXPECT_EQ(refusal(foreign), L"it is built for another kind of processor");
+    Bytes exchanged = whole;
+    std::swap_ranges(exchanged.begin() + kTable, exchanged.begin() + kTable + 4,
+                     exchanged.begin() + kTable + kEntry);
+    EXPECT_EQ(refusal(exchanged), L"it is built for another kind of processor");
+    EXPECT_EQ(refusal(with(kCount, {0, 0, 0, 0})), L"it is built for another kind of processor");
+    EXPECT_EQ(refusal(with(kCount, {0, 0, 0, 33})), L"it is not a shared library");
+}
+
+TEST(MachOFiles, AFileOfAnotherKindIsRefused)
+{
+    const Bytes whole = bytesOf(kBuild / "x86_64/samples/primes.zmb");
+    constexpr std::uint32_t kCore = 4;
+    constexpr std::uint32_t kDebuggingSymbols = 10;
+    for (const std::uint32_t kind : {0U, 1U, kCore, kDebuggingSymbols, 0xFFFFFFFFU})
+    {
+        mach_header_64 header = headerOf(whole);
+        header.filetype = kind;
+        Bytes changed = whole;
+        std::memcpy(changed.data(), &header, sizeof header);
+        EXPECT_EQ(refusal(changed), L"it is not a shared library") << kind;
+    }
+    Bytes old = whole;
+    old[0] = '\xCE'; // a file for processors of 32 bits
+    EXPECT_EQ(refusal(old), L"it is not a shared library");
 }
 
 TEST(MachOFiles, TheVersionOfTheSdkIsReadFromEitherKindOfFile)

@@ -1,7 +1,8 @@
 """A compiler with the declarations from Apple's tables finds what a Mac's would: mistakes put in on purpose."""
+import json
 import unittest
 
-from support import clang
+from support import BUILD, clang
 
 VIEW = """#import <AppKit/AppKit.h>
 void use(NSView* view, NSWindow* window, id anything)
@@ -78,6 +79,25 @@ class Compiler(unittest.TestCase):
         taken, said = clang("#include <elf.h>\n", "-fsyntax-only", name="source.cpp")
         self.assertFalse(taken)
         self.assertIn("elf.h", said)
+
+
+class TheBuild(unittest.TestCase):
+    """What is shown here of the compiler holds for the sources only when it is asked in the same way."""
+
+    def commands(self, *endings):
+        told = json.loads((BUILD / "arm64/compile_commands.json").read_text(encoding="utf-8"))
+        return [(entry["file"], set(entry["command"].split())) for entry in told if entry["file"].endswith(endings)]
+
+    def test_every_source_is_compiled_with_warnings_as_errors(self):
+        commands = self.commands(".cpp", ".cxx", ".mm", ".m")
+        self.assertGreater(len(commands), 50)
+        self.assertEqual([file for file, words in commands if not {"-Wall", "-Wextra", "-Werror"} <= words or "-w" in words], [])
+
+    def test_no_warning_about_messages_is_switched_off(self):
+        commands = self.commands(".mm")
+        self.assertEqual([file for file, words in commands if "-Wundeclared-selector" not in words], [])
+        without = {word for _, words in commands for word in words if word.startswith("-Wno-")}
+        self.assertLessEqual(without, {"-Wno-deprecated-declarations", "-Wno-unused-command-line-argument", "-Wno-unused-parameter"})
 
 
 if __name__ == "__main__":

@@ -1,11 +1,12 @@
 """The check of what stands in a program finds what is missing there."""
 import plistlib
+import struct
 import tempfile
 import unittest
 from pathlib import Path
 
 import support  # noqa: F401
-from macos import contents
+from macos import binaries, contents
 
 
 class Contents(unittest.TestCase):
@@ -13,11 +14,11 @@ class Contents(unittest.TestCase):
         with tempfile.TemporaryDirectory() as folder:
             app = Path(folder)
             for name in {"Contents/Resources/en.lproj/Window.nib", "Contents/Resources/de.lproj/Window.nib",
-                         "Contents/Resources/App.icns", *beside} - set(without):
+                         "Contents/Resources/App.icns", "Contents/MacOS/App", *beside} - set(without):
                 (app / name).parent.mkdir(parents=True, exist_ok=True)
-                (app / name).touch()
-            (app / "Contents/Info.plist").write_bytes(plistlib.dumps({"CFBundleIconFile": "App"}))
-            return list(contents.faults(app, ["Window"], ["en", "de"]))
+                (app / name).write_bytes(struct.pack("<I12x", binaries.MAGIC) if name == "Contents/MacOS/App" else b"")
+            (app / "Contents/Info.plist").write_bytes(plistlib.dumps({"CFBundleIconFile": "App", "CFBundleExecutable": "App"}))
+            return [*contents.faults(app, ["Window"], ["en", "de"]), *contents.described(app)]
 
     def test_nothing_is_wrong_where_all_is_there(self):
         self.assertEqual(self.faults(), [])
@@ -31,6 +32,9 @@ class Contents(unittest.TestCase):
 
     def test_a_missing_icon_is_found(self):
         self.assertEqual(self.faults("Contents/Resources/App.icns"), ["Contents/Info.plist: there is no icon App"])
+
+    def test_a_missing_program_is_found(self):
+        self.assertEqual(self.faults("Contents/MacOS/App"), ["Contents/Info.plist: there is no program App"])
 
 
 if __name__ == "__main__":

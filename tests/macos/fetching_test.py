@@ -11,6 +11,14 @@ import support
 from macos import fetched, known
 
 
+NO_NETWORK = """npm error code EAI_AGAIN
+npm error syscall getaddrinfo
+npm error errno EAI_AGAIN
+npm error request to https://registry.npmjs.org/some failed, reason: getaddrinfo EAI_AGAIN registry.npmjs.org
+npm error A complete log of this run can be found in: /home/some/.npm/_logs/debug-0.log
+"""
+
+
 class Fetching(unittest.TestCase):
     def setUp(self):
         scratch = tempfile.TemporaryDirectory()
@@ -49,10 +57,29 @@ class Fetching(unittest.TestCase):
 
     def test_without_a_network_a_person_is_told_what_to_do(self):
         with self.assertRaises(SystemExit) as raised:
-            self.fetch("echo 'getaddrinfo failed' >&2; exit 1")
+            self.fetch(f"cat >&2 <<'END'\n{NO_NETWORK}END\nexit 1")
         self.assertEqual(str(raised.exception), "The checks for macOS need some@1 from the npm registry, once, and it could not "
-                         "be fetched: getaddrinfo failed. Connect this machine, and run ./test again.")
-        self.assertFalse((self.scratch / "fetched").exists())
+                         "be fetched: getaddrinfo EAI_AGAIN registry.npmjs.org. Connect this machine, and run ./test again.")
+        self.assertEqual(list(self.scratch.glob("fetched*")), [])
+
+    def test_npm_itself_gives_a_reason(self):
+        with tempfile.TemporaryDirectory() as home, \
+                mock.patch.dict(os.environ, HOME=home, npm_config_registry="http://127.0.0.1:9/"), \
+                self.assertRaises(SystemExit) as raised:
+            fetched.fetch(self.scratch / "fetched")
+        self.assertIn("could not be fetched: connect ECONNREFUSED 127.0.0.1:9. Connect", str(raised.exception))
+
+    def test_what_npm_says_in_other_ways_is_told_too(self):
+        self.assertEqual(fetched.reason_of("npm ERR! code ETARGET\nnpm ERR! notarget No matching version found for some@1.\n"),
+                         "notarget No matching version found for some@1.")
+        self.assertEqual(fetched.reason_of(""), "npm gives no reason")
+
+    def test_what_is_there_stays_until_its_successor_is(self):
+        self.fetch(self.copying())
+        (self.scratch / "fetched/complete").write_text("of another choice")
+        with self.assertRaises(SystemExit):
+            self.fetch("exit 1")
+        self.assertTrue((self.scratch / "fetched/texts/1").exists())
 
     def test_another_archive_than_was_meant_is_refused(self):
         with self.assertRaises(SystemExit) as raised:
@@ -69,6 +96,14 @@ class Fetching(unittest.TestCase):
         with mock.patch.object(fetched.shutil, "which", return_value=None), self.assertRaises(SystemExit) as raised:
             fetched.fetch(self.scratch / "fetched")
         self.assertIn("npm, which tools/setup installs", str(raised.exception))
+
+
+class Licences(unittest.TestCase):
+    def test_they_stand_beside_what_was_fetched_and_what_is_made_of_it(self):
+        for folder in ("fetched", "MacOSX.sdk"):
+            texts = {path.name: path.read_text(encoding="utf-8") for path in (support.BUILD / folder / "licences").iterdir()}
+            self.assertEqual(sorted(texts), ["libcxx", "libcxxabi", "macos-node-api", "zig"])
+            self.assertIn("Permission is hereby granted, free of charge", texts["macos-node-api"])
 
 
 class KnownFaults(unittest.TestCase):

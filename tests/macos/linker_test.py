@@ -34,9 +34,9 @@ class Linker(unittest.TestCase):
         self.addCleanup(self._folder.cleanup)
         self.folder = Path(self._folder.name)
 
-    def link(self, processor, *options, system="12.0"):
+    def link(self, processor, *options, system="12.0", text=MODULE):
         half = self.folder / f"{processor}.half"
-        taken, said = clang(MODULE, "-target", f"{processor}-apple-macos{system}", *LINKED, *options, "-o", half)
+        taken, said = clang(text, "-target", f"{processor}-apple-macos{system}", *LINKED, *options, "-o", half)
         self.assertTrue(taken, said)
         return half
 
@@ -54,7 +54,17 @@ class Linker(unittest.TestCase):
 
     def test_a_further_export_of_one_half_is_found(self):
         faults = self.joined(self.link("arm64"), self.link("x86_64", "-Wl,-exported_symbol,_another"))
-        self.assertEqual(faults, ["whole exports, for x86_64: _another, _tsrxEntryPoint"])
+        self.assertEqual(faults, ["whole exports _another, for x86_64, which it should not"])
+
+    def test_an_export_that_one_half_has_lost_is_found(self):
+        without = MODULE.replace('extern "C" int tsrx', '__attribute__((visibility("hidden"))) extern "C" int tsrx')
+        faults = self.joined(self.link("arm64", text=without), self.link("x86_64"))
+        self.assertEqual(faults, ["whole does not export _tsrxEntryPoint, for arm64"])
+
+    def test_what_is_left_to_be_looked_up_at_run_time_is_found(self):
+        calling = MODULE.replace("return [", "extern void NSBeeps(); NSBeeps(); return [")
+        halves = self.link("arm64", "-Wl,-undefined,dynamic_lookup", text=calling), self.link("x86_64", "-Wl,-undefined,dynamic_lookup")
+        self.assertEqual(self.joined(*halves), ["whole calls _NSBeeps, for arm64, which no library has"])
 
     def test_a_missing_half_is_found(self):
         self.assertEqual(self.joined(self.link("x86_64")), ["whole has no half for arm64"])

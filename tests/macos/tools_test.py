@@ -1,11 +1,14 @@
 """What stands for Apple's developer tools takes what those take, and nothing else."""
+import os
+import shutil
 import struct
 import subprocess
+import sys
 import tempfile
 import unittest
 from pathlib import Path
 
-from support import ROOT
+from support import BUILD, ROOT
 
 ICONUTIL = ROOT / "tools/macos/bin/iconutil"
 IBTOOL = ROOT / "tools/macos/bin/ibtool"
@@ -56,6 +59,32 @@ class IconMaker(unittest.TestCase):
 
     def test_a_picture_of_an_unknown_name_is_refused(self):
         self.assertEqual(self.made({"icon_48x48.png": 48}), (1, b""))
+
+
+class WithoutABuild(unittest.TestCase):
+    def setUp(self):
+        holder = tempfile.TemporaryDirectory()
+        self.addCleanup(holder.cleanup)
+        self.folder = Path(holder.name)
+        shutil.copytree(ROOT / "tools/macos", self.folder / "tools/macos")
+        shutil.copy(ROOT / "tools/check_macos", self.folder / "tools")
+        subprocess.run(["git", "init", "--quiet", self.folder], check=True)
+
+    def said(self, part, **environment):
+        done = subprocess.run([sys.executable, "-B", self.folder / "tools/check_macos", part], capture_output=True, text=True,
+                              check=False, env=os.environ | environment)
+        return done.returncode, done.stdout + done.stderr
+
+    def test_a_check_without_what_it_stands_on_gets_it_or_says_how(self):
+        self.assertEqual(self.said("delegates", PATH="/nowhere"), (1, "The checks for macOS need npm, which tools/setup installs.\n"))
+
+    def test_a_check_of_what_was_built_says_that_nothing_was(self):
+        (self.folder / "build/macos").mkdir(parents=True)
+        for name in ("fetched", "MacOSX.sdk"):
+            (self.folder / "build/macos" / name).symlink_to(BUILD / name)
+        for part in ("binaries", "descriptions"):
+            self.assertEqual(self.said(part), (1, "Nothing has been built for macOS yet: tools/check_macos build-arm64 build-x86_64 "
+                                               "does it.\n"))
 
 
 class RunsProgram(unittest.TestCase):

@@ -27,6 +27,7 @@ protected:
             tells(std::string("bin/") + tool);
         program("bin/screencapture", "echo picture >\"$2\"");
         tells("tools/setup");
+        tells("tools/macos_sign");
         // The dialog stays open; everything else ends.
         program("build/release/Tessel.app/Contents/MacOS/Tessel",
                 "case $* in *--modrig*) exec sleep 60 ;; esac; echo Tessel \"$@\" ~");
@@ -40,7 +41,8 @@ protected:
 
     CommandOutcome report(const std::string& parts = "") const
     {
-        return runCommand("HOME='" + (folder / "home").string() + "' MACOS_REPORT_PATIENCE=1 PATH='" +
+        return runCommand("HOME='" + (folder / "home").string() +
+                          "' MACOS_REPORT_PATIENCE=1 MACOS_REPORT_LIMIT=2 PATH='" +
                           (folder / "bin").string() + "':/usr/bin:/bin '" +
                           (folder / "tools/macos_report").string() + "' " + parts + " 2>&1");
     }
@@ -101,6 +103,36 @@ TEST_F(MacReport, NoticesADialogThatDoesNotStay)
     program("build/release/Tessel.app/Contents/MacOS/Tessel", "echo 'no display'");
     EXPECT_EQ(report("pictures").status, 1);
     EXPECT_THAT(written(), AllOf(HasSubstr("no display"), HasSubstr("The dialog did not stay open.")));
+}
+
+TEST_F(MacReport, EndsASessionThatDoesNotEndAndAllThatItStarted)
+{
+    program("build/release/Tessel.app/Contents/MacOS/Tessel",
+            "echo begun; trap '' TERM; sleep 60 & echo $! >started; wait; sleep 60");
+    EXPECT_EQ(report("session signature").status, 1);
+    EXPECT_THAT(written(), AllOf(HasSubstr("begun"), HasSubstr("It did not end within 2 seconds."),
+                                 HasSubstr("It ended with 137."), HasSubstr("## signature: all well")));
+    // Whoever has ended may still wait for somebody to take note.
+    EXPECT_EQ(runCommand("ps -o stat= -p $(cat '" + (folder / "started").string() + "') | grep -v Z").output,
+              "");
+}
+
+TEST_F(MacReport, EndsADialogThatDoesNotWantTo)
+{
+    program("build/release/Tessel.app/Contents/MacOS/Tessel", "trap '' TERM; while :; do sleep 1; done");
+    EXPECT_EQ(report("pictures").status, 0);
+    EXPECT_EQ(written("dialog.png"), "picture\n");
+}
+
+TEST_F(MacReport, SignsACopyOfWhatWasBuilt)
+{
+    program("tools/macos_sign", "echo signed \"$1\"; ls \"$1/Contents/MacOS\"");
+    EXPECT_EQ(report("signature").status, 0);
+    EXPECT_THAT(written(), HasSubstr("signed build/macos-report/signed/Tessel.app\n    Tessel\n"));
+    EXPECT_FALSE(fs::exists(folder / "build/macos-report/signed"));
+    program("tools/macos_sign", "exit 1");
+    EXPECT_EQ(report("signature").status, 1);
+    EXPECT_THAT(written(), HasSubstr("plutil -lint"));
 }
 
 TEST_F(MacReport, TakesThePersonsFolderOutOfWhatItTells)

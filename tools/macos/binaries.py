@@ -52,6 +52,18 @@ def exported(file, processor):
     return {word for word in listed.split() if word.startswith("_") and word not in ("__mh_bundle_header", "__mh_execute_header")}
 
 
+def found_nowhere(file, processor):
+    """What a linker that was told to leave it to the system has not looked for in any library."""
+    listed = run("llvm-nm", f"--arch={processor}", "-m", "--undefined-only", file)
+    return sorted(line.split()[-4] for line in listed.splitlines() if line.endswith("(dynamically looked up)"))
+
+
+def exports(file, processor, wanted):
+    symbols = exported(file, processor)
+    yield from (f"{file.name} exports {symbol}, for {processor}, which it should not" for symbol in sorted(symbols - wanted))
+    yield from (f"{file.name} does not export {symbol}, for {processor}" for symbol in sorted(wanted - symbols))
+
+
 def load_commands(file, processor):
     return run("llvm-objdump", "--macho", f"--arch={processor}", "--private-headers", file)
 
@@ -74,9 +86,8 @@ def faults(file, wanted, system):
         if processor not in processors(file):
             yield f"{file.name} has no half for {processor}"
             continue
-        symbols = exported(file, processor)
-        if wanted is not None and symbols != wanted:
-            yield f"{file.name} exports, for {processor}: {', '.join(sorted(symbols)) or 'nothing'}"
+        yield from exports(file, processor, wanted) if wanted is not None else ()
+        yield from (f"{file.name} calls {symbol}, for {processor}, which no library has" for symbol in found_nowhere(file, processor))
         yield from (f"{file.name} cannot be moved, for {processor}: {place}" for place in places(file, processor))
         if oldest_system(file, processor) != system:
             yield f"{file.name} runs from macOS {oldest_system(file, processor)} on, for {processor}, and not {system}"

@@ -2,6 +2,8 @@
 description names has to be there."""
 import plistlib
 
+from . import binaries
+
 
 def faults(app, layouts, languages):
     """Of the program's folder: each of the `layouts` (names) has to stand compiled somewhere in each of the languages."""
@@ -10,7 +12,17 @@ def faults(app, layouts, languages):
         for language in languages:
             if not list(app.rglob(f"{language}.lproj/{layout}.nib")):
                 yield f"{layout} is not there in {language}"
-    for description in app.rglob("Info.plist"):
-        icon = plistlib.loads(description.read_bytes()).get("CFBundleIconFile")
+
+
+def described(folder):
+    """Of what the descriptions in a folder name."""
+    for description in sorted(folder.rglob("Info.plist")):
+        try:
+            said = plistlib.loads(description.read_bytes())
+            icon, program = said.get("CFBundleIconFile"), said.get("CFBundleExecutable")
+        except Exception:  # which is told by the check of descriptions
+            continue
         if icon and not (description.parent / f"Resources/{icon}.icns").exists():
-            yield f"{description.relative_to(app)}: there is no icon {icon}"
+            yield f"{description.relative_to(folder)}: there is no icon {icon}"
+        if program and not binaries.is_linked(description.parent / f"MacOS/{program}"):
+            yield f"{description.relative_to(folder)}: there is no program {program}"

@@ -170,6 +170,7 @@ def make(build):
     put_headers(part, folder)
     put_frameworks(part, tables, listings)
     put_libraries(part, folder, tables, listings)
+    shutil.copytree(folder / "licences", part / "licences")
     write(part / "complete", wanted)
     shutil.rmtree(sdk, ignore_errors=True)
     part.rename(sdk)

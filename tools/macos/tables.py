@@ -69,7 +69,7 @@ class Tables:
         (self._constants, self._enums, self._signatures, self._functions, self._protocols, self._classes, self._structs,
          self._unions) = struct.unpack_from("<8I", section, 6)
         self._texts = 38
-        self._known = {}
+        self._known, self._read_signatures = {}, {}
         self.enums = dict(self._read_enums())
         self.constants, self.values = self._read_constants()
         self._read_structs()
@@ -232,6 +232,12 @@ class Tables:
         return list(methods.values())
 
     def signature(self, offset):
+        """Most methods share theirs with others."""
+        if offset not in self._read_signatures:
+            self._read_signatures[offset] = self._read_signature(offset)
+        return self._read_signatures[offset]
+
+    def _read_signature(self, offset):
         place, types, further, more = self._signatures + offset, [], False, True
         while more:
             flags = self._data[place]

@@ -1,5 +1,6 @@
 // The check of a shared library's headers, for Mach-O. The system's loader on macOS examines a file's extent
-// and signature by itself; here it is told in words what kind of file stands in its place.
+// and signature by itself; here it is told in words what kind of file stands in its place, and what it has
+// lost.
 #include "host/applications/ImageCheck.h"
 
 #include <libkern/OSByteOrder.h>
@@ -20,6 +21,7 @@ constexpr auto kNoLibrary = Sentence(L"it is not a shared library");
 constexpr auto kProgram = Sentence(L"it is a program, not a shared library");
 constexpr auto kOtherMachine = Sentence(L"it is built for another kind of processor");
 constexpr auto kCutShort = Sentence(L"the file is cut short");
+constexpr auto kDamaged = Sentence(L"its program headers are damaged");
 
 Failure refused(Sentence<> reason)
 {
@@ -31,20 +33,59 @@ cpu_type_t ownProcessor()
     return _dyld_get_image_header(0)->cputype;
 }
 
-Result<> checkThin(std::uint64_t start, std::uint64_t size, const ReadAt& readAt)
+Result<> checkKind(const mach_header_64& header)
 {
-    mach_header_64 header = {};
-    if (size < sizeof header || !readAt(start, &header, sizeof header))
-        return refused(kCutShort);
     if (header.magic != MH_MAGIC_64)
         return refused(kNoLibrary);
     if (header.cputype != ownProcessor())
         return refused(kOtherMachine);
     if (header.filetype == MH_EXECUTE)
         return refused(kProgram);
-    if (header.filetype != MH_BUNDLE && header.filetype != MH_DYLIB)
-        return refused(kNoLibrary);
-    return header.sizeofcmds <= size - sizeof header ? Result<>() : refused(kCutShort);
+    return header.filetype == MH_BUNDLE || header.filetype == MH_DYLIB ? Result<>() : refused(kNoLibrary);
+}
+
+// Whether the file holds all that it says a segment has.
+Result<> checkSegment(const MachOImage& image, std::uint64_t place, const ReadAt& readAt)
+{
+    segment_command_64 segment = {};
+    if (!readAt(place, &segment, sizeof segment))
+        return refused(kCutShort);
+    if (segment.cmdsize < sizeof segment)
+        return refused(kDamaged);
+    const bool fits = segment.filesize <= image.size && segment.fileoff <= image.size - segment.filesize;
+    return fits ? Result<>() : refused(kCutShort);
+}
+
+Result<> checkCommands(const MachOImage& image, const mach_header_64& header, const ReadAt& readAt)
+{
+    std::uint64_t place = image.start + sizeof header;
+    std::uint64_t room = header.sizeofcmds;
+    for (std::uint32_t left = header.ncmds; left > 0; --left)
+    {
+        load_command command = {};
+        if (!readAt(place, &command, sizeof command))
+            return refused(kCutShort);
+        if (command.cmdsize < sizeof command || command.cmdsize > room)
+            return refused(kDamaged);
+        const auto checked = command.cmd == LC_SEGMENT_64 ? checkSegment(image, place, readAt) : Result<>();
+        if (!checked)
+            return checked;
+        place += command.cmdsize;
+        room -= command.cmdsize;
+    }
+    return {};
+}
+
+Result<> checkThin(const MachOImage& image, const ReadAt& readAt)
+{
+    mach_header_64 header = {};
+    if (image.size < sizeof header || !readAt(image.start, &header, sizeof header))
+        return refused(kCutShort);
+    if (auto checked = checkKind(header); !checked)
+        return checked;
+    if (header.sizeofcmds > image.size - sizeof header)
+        return refused(kCutShort);
+    return checkCommands(image, header, readAt);
 }
 
 } // namespace
@@ -82,6 +123,6 @@ Result<MachOImage> imageForThisProcessor(std::uint64_t fileSize, const ReadAt& r
 Result<> checkMappable(std::uint64_t fileSize, const ReadAt& readAt)
 {
     const auto image = imageForThisProcessor(fileSize, readAt);
-    return image ? checkThin(image->start, image->size, readAt) : image.failure();
+    return image ? checkThin(*image, readAt) : image.failure();
 }
 } // namespace tessel

@@ -6,8 +6,9 @@
 #include <libproc.h>
 #include <mach-o/dyld.h>
 #include <sys/proc_info.h>
-#include <sys/stat.h>
 #include <unistd.h>
+
+#include "host/platform/RegularFile.h"
 
 namespace tessel
 {
@@ -28,15 +29,26 @@ const mach_header* headerOf(void* library)
 }
 } // namespace
 
-bool isMappedFrom(void* library, int descriptor)
+bool isMappedFrom(void* library, const RegularFile& file)
 {
     const auto address = reinterpret_cast<std::uint64_t>(headerOf(library));
     proc_regionwithpathinfo region = {};
-    struct stat file = {};
     const int size = proc_pidinfo(getpid(), PROC_PIDREGIONPATHINFO, address, &region, sizeof region);
-    if (address == 0 || size != static_cast<int>(sizeof region) || fstat(descriptor, &file) != 0)
+    if (address == 0 || size != static_cast<int>(sizeof region))
         return true;
     const vinfo_stat& mapped = region.prp_vip.vip_vi.vi_stat;
-    return mapped.vst_ino == file.st_ino && mapped.vst_dev == static_cast<std::uint32_t>(file.st_dev);
+    return mapped.vst_ino == file.identity().inode &&
+           mapped.vst_dev == static_cast<std::uint32_t>(file.identity().device);
+}
+
+const void* addressIn(void* library)
+{
+    return headerOf(library);
+}
+
+bool isInLibrary(const void* address)
+{
+    Dl_info found = {};
+    return dladdr(address, &found) != 0;
 }
 } // namespace tessel

@@ -2,14 +2,16 @@
 // Objective-C is loaded and unloaded as the plain library it is, and what brings some stays.
 #include "host/applications/platform/ObjectiveCRuntime.h"
 
+#include <algorithm>
 #include <cstdint>
+#include <string>
 #include <string_view>
 
 #include <dlfcn.h>
 #include <link.h>
 
 #include "host/applications/platform/ElfLinkMap.h"
-#include "host/platform/OrdinaryFile.h"
+#include "host/platform/RegularFile.h"
 
 namespace tessel
 {
@@ -17,7 +19,6 @@ namespace
 {
 // What every compiled Objective-C file calls to make its classes and categories known.
 constexpr std::string_view kRegistration = "__objc_exec_class";
-constexpr std::uintmax_t kLargestProgram = std::uintmax_t{1} << 30;
 
 // An entry of the mapped library's dynamic section; 0 when it is not there.
 ElfW(Addr) dynamicEntry(const link_map& map, ElfW(Sxword) tag)
@@ -55,10 +56,23 @@ bool isMissing(void* library, const ElfW(Sym) & symbol, const char* name)
 }
 } // namespace
 
+// In pieces: the names that a program refers to stand near its beginning.
 bool needsBundleLoading(const std::string& program)
 {
-    const auto content = readOrdinaryFile(program, kLargestProgram);
-    return content && content->find(kRegistration) != content->npos;
+    constexpr std::uint64_t kPiece = 65536;
+    constexpr std::uint64_t kOverlap = kRegistration.size() - 1; // which the end of a piece may cut in two
+    const RegularFile file(program);
+    const std::uint64_t size = file.opened() ? file.size() : 0;
+    std::string piece;
+    for (std::uint64_t start = 0; start < size; start += kPiece - kOverlap)
+    {
+        piece.resize(std::min(kPiece, size - start));
+        if (!file.read(start, piece.data(), piece.size()))
+            return false;
+        if (piece.find(kRegistration) != piece.npos)
+            return true;
+    }
+    return false;
 }
 
 bool mustStayMapped(void* library)

@@ -1,4 +1,5 @@
 // Bundles whose description or program is not what it should be: each is told in one sentence.
+#include "host/applications/platform/ObjectiveCRuntime.h"
 #include "tests/host/support/HostWithModules.h"
 
 #include <fstream>
@@ -195,4 +196,18 @@ TEST_F(Bundles, AreDescribedAtTheirTopWhereNoResourcesAre)
     std::ofstream(bundle / "Info.plist") << "(";
     EXPECT_THAT(refusal(),
                 StartsWith("its description \"" + (bundle / "Info.plist").native() + "\" cannot be used: "));
+}
+
+// It is looked for in pieces, the end of one of which may cut the name in two.
+TEST(BundleLoading, IsNeededWhereverTheNameOfTheRuntimeStandsInTheProgram)
+{
+    constexpr std::size_t kAroundThePiecesEnd = 65536;
+    const std::string name = "__objc_exec_class";
+    const TemporaryFolder folder;
+    for (std::size_t before = kAroundThePiecesEnd - 20; before <= kAroundThePiecesEnd + 2; ++before)
+    {
+        const auto program = folder / "program";
+        std::ofstream(program) << std::string(before, '_') << name;
+        EXPECT_TRUE(tessel::needsBundleLoading(program)) << before;
+    }
 }

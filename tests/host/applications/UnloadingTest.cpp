@@ -125,6 +125,28 @@ TEST_F(UnloadingThroughLinks, AnswersForEitherPathOfAFileThatWasReplaced)
     }
 }
 
+// By none of these paths the file would be known after it was replaced, were it not for where they lead.
+TEST_F(UnloadingThroughLinks, AnswersForAPathWithDetoursAndForALinkedFolder)
+{
+    const auto folder = mFolder / "real";
+    std::filesystem::create_directory(folder);
+    std::filesystem::create_directory_symlink(folder, mFolder / "linked");
+    for (const char* detour : {"real//", "real/./", "real/../real/", "linked/"})
+    {
+        real = fixture("LocksItself.zmb", "real/LocksItself.zmb");
+        const auto path = std::filesystem::path(mFolder / detour).native() + "LocksItself.zmb";
+        EXPECT_TRUE(load(path)) << path;
+        output();
+        replace();
+        expectKnownBy(real);
+        expectKnownBy(path);
+        mRunner.run(L"UNLOCK");
+        EXPECT_TRUE(unload(real));
+        EXPECT_EQ(names(), L"");
+        std::filesystem::remove(real);
+    }
+}
+
 TEST_F(Unloading, TakesTheCommandsAlong)
 {
     const auto path = fixture("Command.zmb");

@@ -5,6 +5,7 @@
 #include "host/commands/CallingApplication.h"
 #include "host/commands/CommandRunner.h"
 #include "host/commands/CommandStack.h"
+#include "host/commands/TypedLine.h"
 #include "tests/host/support/HostParts.h"
 
 using tessel::asPart;

@@ -9,6 +9,8 @@ using testing::IsEmpty;
 
 namespace
 {
+using Names = tessel::CompletionSources::Names;
+
 const std::vector<std::wstring> kNames = {L"HELP", L"MODLIST", L"MODRIG", L"Öffnen"};
 
 tessel::CompletionSources namesOnly()
@@ -35,7 +37,7 @@ protected:
                    : command == L"REG" ? L"LIST [key] | EXPORT key file [UTF8] | RESET | RESTORE"
                    : command == L"BI"  ? L"[START|GOOD|BAD|STOP]"
                    : command == L"HE"  ? L"[command] | topic"
-                   : command == L"SUI" ? L"LIST | ADD file... | CLEAR [--json]"
+                   : command == L"SUI" ? L"LIST | ADD file... | REMOVE entry... | CLEAR [--json]"
                                        : L"";
         };
         sources.variables = []
@@ -167,6 +169,22 @@ TEST_F(Completions, LeaveHiddenFilesOutUnlessTheirDotIsTyped)
     EXPECT_EQ(complete(L"load ", sources)->candidates.size(), 6u);
 }
 
+TEST_F(Completions, LeaveOutNamesThatNoLineCanHold)
+{
+    sources.files = [](const std::wstring&)
+    {
+        return std::vector<Branch>{
+            {L"two\nlines.lsp", false}, {L"two\rreturns.lsp", false}, {L"two.lsp", false}};
+    };
+    sources.entries = [](const Names&)
+    {
+        return Names{L"/two\nlines.lsp", L"/two.lsp"};
+    };
+    EXPECT_EQ(after(L"load t"), L"load two.lsp ");
+    EXPECT_EQ(after(L"(load \"t"), L"(load \"two.lsp\"");
+    EXPECT_EQ(after(L"SUI REMOVE /t"), L"SUI REMOVE /two.lsp ");
+}
+
 TEST_F(Completions, OfFoldersLeaveFilesOut)
 {
     EXPECT_EQ(after(L"CD "), L"CD |Moon/|primes one/");
@@ -187,6 +205,30 @@ TEST_F(Completions, OfArgumentsFollowTheWaysOfTypingTheCommand)
     EXPECT_EQ(after(L"UNKNOWN "), L"nothing");
     EXPECT_EQ(after(L"SUI CLEAR -"), L"SUI CLEAR --json ");
     EXPECT_EQ(after(L"SUI ADD one two ge"), L"SUI ADD one two gears.lsp ") << "it can be repeated";
+}
+
+TEST_F(Completions, OfEntriesOfferThoseOfTheListAndNoFiles)
+{
+    Names entries = {L"/a b/moon.lsp", L"/home/gears.lsp", L"/home/gear.zmb"};
+    sources.entries = [&](const Names& parts)
+    {
+        asked = parts.back();
+        return entries;
+    };
+    EXPECT_EQ(after(L"SUI REMOVE "), L"SUI REMOVE /|/a b/moon.lsp|/home/gears.lsp|/home/gear.zmb");
+    EXPECT_EQ(asked, L"REMOVE");
+    EXPECT_EQ(after(L"SUI remove /h"), L"SUI remove /home/gear|/home/gears.lsp|/home/gear.zmb");
+    EXPECT_EQ(after(L"SUI REMOVE /home/gears"), L"SUI REMOVE /home/gears.lsp ");
+    EXPECT_EQ(after(L"SUI REMOVE /a"), L"SUI REMOVE \"/a b/moon.lsp\" ");
+    EXPECT_EQ(after(L"SUI REMOVE one MO"), L"SUI REMOVE one \"/a b/moon.lsp\" ") << "by its name";
+    EXPECT_EQ(after(L"SUI REMOVE g"), L"SUI REMOVE g|/home/gears.lsp|/home/gear.zmb");
+    EXPECT_EQ(after(L"SUI REMOVE \"g"), L"SUI REMOVE \"g|/home/gears.lsp|/home/gear.zmb");
+    EXPECT_EQ(after(L"SUI REMOVE x"), L"nothing");
+    EXPECT_EQ(after(L"SUI REMOVE home"), L"nothing");
+    entries.clear();
+    EXPECT_EQ(after(L"SUI REMOVE "), L"nothing");
+    sources.entries = {};
+    EXPECT_EQ(after(L"SUI REMOVE /"), L"nothing");
 }
 
 TEST_F(Completions, OfKeysKnowWhereAPathGoesOn)

@@ -2,7 +2,8 @@
 
 #include <gmock/gmock.h>
 
-#include "host/files/Sha256.h"
+#include "host/files/NetworkLibrary.h"
+#include "host/files/network/Network.h"
 
 using tessel::parseRemoteAddress;
 
@@ -10,9 +11,9 @@ namespace
 {
 std::string sha256(const std::string& text)
 {
-    tessel::Sha256 checksum;
-    checksum.add(text);
-    return checksum.finish();
+    const auto checksum = tessel::network()->checksum();
+    checksum->add(text);
+    return checksum->finish();
 }
 } // namespace
 

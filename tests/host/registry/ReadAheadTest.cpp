@@ -3,9 +3,13 @@
 #include <gtest/gtest.h>
 
 #include <optional>
+#include <string>
+#include <utility>
 
+#include "host/registry/RowChecksum.h"
 #include "host/registry/Statement.h"
 
+using tessel::checksumOfValue;
 using tessel::ReadAhead;
 using tessel::Statement;
 
@@ -20,16 +24,13 @@ protected:
     void SetUp() override
     {
         ASSERT_EQ(sqlite3_open(":memory:", &mDatabase), SQLITE_OK);
-        ASSERT_EQ(sqlite3_exec(mDatabase,
-                               "CREATE TABLE row(place INTEGER PRIMARY KEY, key, whole, fold);"
-                               "INSERT INTO row VALUES(1,7,1,'a'),(2,7,1,'b'),(3,7,1,'c'),(4,7,0,'d'),"
-                               "(5,8,1,'e')",
-                               nullptr, nullptr, nullptr),
-                  SQLITE_OK);
+        run("CREATE TABLE value(seq INTEGER PRIMARY KEY, key, name, fold, data, sum)");
+        for (const auto& [key, fold] : {std::pair{7, "a"}, {7, "b"}, {7, "c"}, {7, "d"}, {8, "e"}})
+            run("INSERT INTO value(key, name, fold, data, sum) VALUES(" + std::to_string(key) + ", '" + fold +
+                "', '" + fold + "', '', " + std::to_string(checksumOfValue(key, fold, fold, "")) + ")");
+        run("UPDATE value SET sum=sum+1 WHERE fold='d'");
         mRows.emplace();
-        ASSERT_EQ(mRows->prepare(mDatabase, "SELECT place, whole, fold FROM row WHERE key=?1 AND place>?2"
-                                            " ORDER BY place"),
-                  SQLITE_OK);
+        ASSERT_EQ(mRows->prepare(mDatabase, ReadAhead::kRowsAfter), SQLITE_OK);
     }
     void TearDown() override
     {
@@ -37,6 +38,10 @@ protected:
         sqlite3_close(mDatabase);
     }
 
+    void run(const std::string& sql)
+    {
+        ASSERT_EQ(sqlite3_exec(mDatabase, sql.c_str(), nullptr, nullptr, nullptr), SQLITE_OK);
+    }
     int step(std::int64_t key, std::string_view fold) { return mAhead.step(*mRows, key, fold); }
 
     sqlite3* mDatabase = nullptr;
@@ -115,7 +120,7 @@ TEST_F(ReadingAhead, TellsWhatFailedAndDoesNotGoOn)
 {
     mAhead.noteFound(kKey, 0);
     mAhead.noteFound(kKey, 1);
-    sqlite3_exec(mDatabase, "DROP TABLE row", nullptr, nullptr, nullptr);
+    sqlite3_exec(mDatabase, "DROP TABLE value", nullptr, nullptr, nullptr);
     EXPECT_EQ(step(kKey, "b"), SQLITE_ERROR);
     EXPECT_EQ(step(kKey, "b"), SQLITE_DONE);
 }

@@ -4,6 +4,7 @@
 #include <cstring>
 
 #include "tests/host/support/RegistryHost.h"
+#include "tests/support/Database.h"
 
 using testing::ElementsAre;
 
@@ -222,6 +223,26 @@ TEST_F(RegistryCalls, RemoveAValueOnce)
     EXPECT_EQ(RegDeleteValueW(key, nullptr), ERROR_FILE_NOT_FOUND);
 }
 
+TEST_F(RegistryCalls, KeepHandlesApartInWhateverOrderTheyAreClosed)
+{
+    const HKEY keys[] = {create(L"A"), create(L"B"), create(L"C")};
+    const auto write = [&](std::size_t key)
+    {
+        return tsudRegSetString(keys[key], L"name", std::to_wstring(key).c_str());
+    };
+    for (const std::size_t key : {0U, 2U, 1U})
+        EXPECT_EQ(write(key), ERROR_SUCCESS);
+    for (const wchar_t* path : {L"A", L"B", L"C"})
+        EXPECT_EQ(host.registry().read(path, L"name"), std::to_wstring(path[0] - L'A'));
+    EXPECT_EQ(RegCloseKey(keys[1]), ERROR_SUCCESS);
+    EXPECT_EQ(write(1), ERROR_INVALID_HANDLE);
+    EXPECT_EQ(RegCloseKey(keys[2]), ERROR_SUCCESS);
+    EXPECT_EQ(write(2), ERROR_INVALID_HANDLE);
+    EXPECT_EQ(write(0), ERROR_SUCCESS);
+    EXPECT_EQ(RegCloseKey(keys[0]), ERROR_SUCCESS);
+    EXPECT_EQ(write(0), ERROR_INVALID_HANDLE);
+}
+
 TEST_F(RegistryCalls, RefuseHandlesThatAreClosedOrNeverWereOpen)
 {
     HKEY closed = create(L"A");
@@ -280,4 +301,39 @@ TEST_F(RegistryCalls, HaveNoHandlesWhereThereIsNoRegistry)
     EXPECT_EQ(tsudRegSetString(key, L"name", L"1"), ERROR_INVALID_HANDLE);
     HKEY other = nullptr;
     EXPECT_EQ(open(L"A", other), ERROR_INVALID_HANDLE);
+}
+
+// A value or key that is not found is not known not to be there.
+TEST_F(RegistryCalls, TellWhatCannotBeReadFromWhatIsNotThere)
+{
+    host.close();
+    host.folder().write("registry.db", "no registry at all, whatever its name says");
+    host.open();
+    HKEY key = nullptr;
+    DWORD size = 0;
+    EXPECT_EQ(open(L"A", key), ERROR_READ_FAULT);
+    EXPECT_EQ(tsRegGetValue(HKEY_CURRENT_USER, L"name", 0, nullptr, nullptr, &size), ERROR_READ_FAULT);
+    EXPECT_EQ(RegCreateKeyEx(HKEY_CURRENT_USER, L"A", 0, nullptr, 0, KEY_WRITE, nullptr, &key, nullptr),
+              ERROR_ACCESS_DENIED);
+    wchar_t reason[kRoom] = {};
+    EXPECT_TRUE(tsRegMayHaveMissed(L"A", L"name", reason, kRoom));
+    EXPECT_EQ(reason, host.registry().canStore().sentence());
+    EXPECT_TRUE(tsRegMayHaveMissed(L"A", L"name", reason, 4));
+    EXPECT_EQ(reason, host.registry().canStore().sentence().substr(0, 3));
+    EXPECT_TRUE(tsRegMayHaveMissed(nullptr, nullptr, nullptr, 0));
+}
+
+TEST_F(RegistryCalls, TellOnceWhatIsFoundDamagedWhileTheyRead)
+{
+    ASSERT_TRUE(host.registry().write(L"A", L"name", L"1"));
+    ASSERT_TRUE(host.registry().write(L"A", L"other", L"1"));
+    ASSERT_TRUE(host.registry().endOfCommand());
+    ASSERT_EQ(runSql(host.file(), "UPDATE value SET data='2' WHERE name='name'"), "");
+    wchar_t reason[kRoom] = {};
+    EXPECT_FALSE(tsRegMayHaveMissed(L"A", L"other", reason, kRoom)) << "each value on its own account";
+    EXPECT_TRUE(tsRegMayHaveMissed(L"A", L"name", reason, kRoom));
+    EXPECT_NE(std::wstring(reason).find(L"a row of it is not what was stored there"), std::wstring::npos);
+    EXPECT_TRUE(host.registry().endOfCommand());
+    EXPECT_FALSE(tsRegMayHaveMissed(L"A", L"other", reason, kRoom));
+    EXPECT_TRUE(tsRegMayHaveMissed(L"A", L"third", reason, kRoom));
 }

@@ -7,6 +7,7 @@
 #include <random>
 #include <sstream>
 
+#include "host/registry/Soundness.h"
 #include "host/text/Unicode.h"
 #include "tests/host/registry/StoredList.h"
 #include "tests/host/support/RegistryHost.h"
@@ -270,6 +271,24 @@ TEST_F(DamagedRegistry, WithAPageThatLeadsBackToItselfComesToAnEnd)
     EXPECT_FALSE(registry.canStore());
     EXPECT_LE(registry.values(registry.find(kListKey)).size(), kMany + 1u);
     EXPECT_TRUE(registry.endOfCommand()) << "that it is damaged was told when it was opened";
+}
+
+// A look costs as much as the file is long, and a person waits for it.
+TEST_F(DamagedRegistry, IsLookedForAtEveryStartUpToSomeThousandValuesAndLessOftenBeyond)
+{
+    const auto startsBetweenLooks = [this](int entries)
+    {
+        fs::remove(file());
+        fs::remove(copy());
+        makeFile(entries);
+        sqlite3* database = nullptr;
+        sqlite3_open(file().c_str(), &database);
+        const unsigned starts = tessel::startsBetweenLooks(database);
+        sqlite3_close(database);
+        return starts;
+    };
+    EXPECT_EQ(startsBetweenLooks(3000), 1U);
+    EXPECT_EQ(startsBetweenLooks(12'000), 3U);
 }
 
 TEST_F(DamagedRegistry, ThatIsHugeIsNotWrittenOverEither)

@@ -111,7 +111,7 @@ TEST_F(FullDisk, ShowsAtTheWriteInALongListToo)
 {
     constexpr int kEntries = 5000;
     makeFile(kEntries);
-    for (const rlim_t bytes : {rlim_t{0}, rlim_t{100'000}, rlim_t{400'000}, rlim_t{650'000}})
+    for (const rlim_t bytes : {rlim_t{0}, rlim_t{100'000}, rlim_t{200'000}, rlim_t{400'000}})
     {
         EXPECT_THAT(rewriteWithin(bytes, kEntries),
                     StartsWith("write failed, reads 1, undone, reads 1, said: The registry"))
@@ -120,6 +120,28 @@ TEST_F(FullDisk, ShowsAtTheWriteInALongListToo)
     }
     EXPECT_EQ(rewriteWithin(RLIM_INFINITY, kEntries), "written, reads 2, stored, reads 2, said: ");
     EXPECT_EQ(generationInFile(), 2);
+}
+
+TEST_F(FullDisk, KeepsAListThatCouldNotBeEmptied)
+{
+    constexpr int kEntries = 5000;
+    makeFile(kEntries);
+    const std::string answer = askChild(
+        [this]
+        {
+            Registry registry(file());
+            const Registry::Key key = *registry.create(kListKey, Registry::kRoot);
+            const auto values = registry.values(key);
+            if (!limitFiles(20'000))
+                return std::string("cannot start");
+            for (const auto& value : values)
+                if (!registry.removeValue(key, value.name))
+                    break;
+            const bool stored = static_cast<bool>(registry.endOfCommand());
+            return (stored ? "stored " : "undone ") + std::to_string(generationOf(registry));
+        });
+    EXPECT_EQ(answer, "undone 1");
+    EXPECT_EQ(generationInFile(), 1);
 }
 
 TEST_F(FullDisk, IsUsedAgainOnceThereIsRoom)

@@ -151,11 +151,13 @@ TEST_F(RegistryStore, UndoesTheWholeCommandAfterAWriteThatFailed)
     EXPECT_TRUE(registry().endOfCommand());
     EXPECT_TRUE(registry().write(L"A", L"name", L"after"));
     EXPECT_TRUE(registry().write(L"New", L"name", L"after"));
+    const HKEY older = registry().openHandle(registry().find(L"New"));
     const HKEY handle = registry().openHandle(registry().find(L"New"));
     EXPECT_EQ(registry().writeValue(999'999, L"name", L"no such key").code(), ERROR_WRITE_FAULT);
     EXPECT_EQ(registry().read(L"A", L"name"), L"before") << "what is stored is read from then on";
     EXPECT_FALSE(registry().write(L"A", L"name", L"later")) << "the rest of the command fails too";
     EXPECT_EQ(registry().keyOf(handle), std::nullopt) << "a key that was undone has no handle";
+    EXPECT_EQ(registry().keyOf(older), std::nullopt);
     EXPECT_FALSE(host.output().commandLine().tell(registry().endOfCommand()));
     EXPECT_EQ(host.output().text(), "The registry " + host.file().string() +
                                         " could not be written: FOREIGN KEY constraint failed. What was "

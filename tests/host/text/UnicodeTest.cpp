@@ -4,6 +4,7 @@
 
 using tessel::equalIgnoringCase;
 using tessel::foldCase;
+using tessel::foldedUtf8;
 using tessel::toUtf8;
 using tessel::toWide;
 using tessel::withReadableBytes;
@@ -36,6 +37,17 @@ TEST(Utf8, ComesBackAsItWentForEveryCodePoint)
         if ((code < 0xD800 || code > 0xDFFF) && (code < 0x10FE80 || code > 0x10FEFF))
             text += static_cast<wchar_t>(code);
     EXPECT_TRUE(toWide(toUtf8(text)) == text);
+}
+
+TEST(Utf8, ComesBackAsItWentWhereverTheFirstCharacterBeyondAsciiStands)
+{
+    for (std::size_t place = 0; place < 40; ++place)
+    {
+        std::wstring text(40, L'a');
+        text[place] = L'ü';
+        EXPECT_EQ(toWide(toUtf8(text)), text) << place;
+        EXPECT_EQ(toUtf8(text).substr(place, 2), "\xC3\xBC") << place;
+    }
 }
 
 // Names of files, which may be any bytes.
@@ -123,6 +135,13 @@ TEST(CaseFolding, IsRightForLettersOfEveryScript)
     EXPECT_EQ(foldCase(L"ЖУК"), L"жук");
     EXPECT_EQ(foldCase(L"\U00010400"), L"\U00010428");
     EXPECT_EQ(foldCase(L"\x1E9E"), L"ß");
+}
+
+TEST(CaseFolding, IsTheSameInUtf8)
+{
+    for (const wchar_t* text : {L"", L"@AMZ[`az{", L"12History", L"ÄÖ 12History", L"12History \U00010400"})
+        EXPECT_EQ(foldedUtf8(text), toUtf8(foldCase(text)));
+    EXPECT_EQ(foldedUtf8(L"@AMZ[`az{"), "@amz[`az{");
 }
 
 TEST(CaseFolding, NeverChangesTheLength)

@@ -119,6 +119,38 @@ int RecordingCommands::setLine(const std::wstring& group, const std::wstring& gl
     return TSED_COMMAND_UNKNOWN;
 }
 
+int RecordingCommands::offerEntries(const std::wstring& group, const std::wstring& globalName,
+                                    TsEdEntries entries)
+{
+    recordingHost().journal.add(L"tsedOfferEntries", {group, globalName});
+    if (!entries)
+        return TSED_COMMAND_INVALID;
+    for (const auto& command : mCommands)
+        if (isCommand(*command, group, globalName))
+        {
+            command->entries = entries;
+            return TSED_COMMAND_OK;
+        }
+    return TSED_COMMAND_UNKNOWN;
+}
+
+std::vector<std::wstring> RecordingCommands::offered(const std::wstring& name,
+                                                     const std::vector<std::wstring>& typed)
+{
+    const TsEdCommand* found = find(name);
+    if (!found || !found->entries)
+        return {};
+    const RecordingCaller caller(found->owner);
+    arguments = typed;
+    TsResultBuffer* list = found->entries();
+    arguments.clear();
+    std::vector<std::wstring> texts;
+    for (const TsResultBuffer* value = list; value; value = value->next)
+        texts.emplace_back(value->value.string);
+    tsutRelRb(list);
+    return texts;
+}
+
 std::wstring RecordingCommands::descriptionOf(const std::wstring& globalName) const
 {
     const TsEdCommand* found = find(L"_" + globalName);
@@ -158,6 +190,11 @@ int tsedDescribeCommand(const wchar_t* group, const wchar_t* globalName, const w
 int tsedTakeArguments(const wchar_t* group, const wchar_t* globalName, const wchar_t* usage)
 {
     return recordingHost().commands.takeArguments(orEmpty(group), orEmpty(globalName), orEmpty(usage));
+}
+
+int tsedOfferEntries(const wchar_t* group, const wchar_t* globalName, TsEdEntries entries)
+{
+    return recordingHost().commands.offerEntries(orEmpty(group), orEmpty(globalName), entries);
 }
 
 TsResultBuffer* tsedCommandArguments()

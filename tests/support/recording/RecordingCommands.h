@@ -23,6 +23,7 @@ public:
     std::wstring owner;            // the application that was being called
     std::wstring description = {}; // what HELP would tell
     std::wstring usage = {};       // its arguments; empty where it takes none
+    TsEdEntries entries = nullptr; // what the Tab key would offer for them
     int status = TSED_COMMAND_OK;
 };
 
@@ -56,6 +57,9 @@ public:
 
     int describe(const std::wstring& group, const std::wstring& globalName, const std::wstring& description);
     int takeArguments(const std::wstring& group, const std::wstring& globalName, const std::wstring& usage);
+    int offerEntries(const std::wstring& group, const std::wstring& globalName, TsEdEntries entries);
+    // What a command of that local name offers after these arguments.
+    std::vector<std::wstring> offered(const std::wstring& name, const std::vector<std::wstring>& typed);
     // What a command of that global name was described with.
     std::wstring descriptionOf(const std::wstring& globalName) const;
 

@@ -90,3 +90,13 @@ int tsedFindFile(const wchar_t* name, wchar_t* found, std::size_t capacity)
     const std::wstring path = host.files.search(name);
     return !path.empty() && copyText(path, found, capacity) ? TS_NORMAL : TS_ERROR;
 }
+
+// There is no home folder here.
+int tsedTypedPath(const wchar_t* typed, wchar_t* path, std::size_t capacity)
+{
+    const std::filesystem::path folder = tessel::toUtf8(recordingHost().files.currentFolderNow());
+    std::string whole = (folder / tessel::toUtf8(typed)).lexically_normal().string();
+    if (whole.ends_with('/') && whole != "/")
+        whole.pop_back();
+    return *typed && copyText(tessel::toWide(whole), path, capacity) ? TS_NORMAL : TS_ERROR;
+}

@@ -73,6 +73,9 @@ public:
     // The first `successes` calls of that kind from now on go their way, all later ones fail.
     void failAfter(Operation operation, unsigned successes, LONG status = ERROR_WRITE_FAULT);
 
+    // Sentences about a registry of which nothing is certain. What calls find there is up to `failWhen`.
+    std::optional<std::wstring> whyUnreadable;
+
     // All calls in order, with their arguments; failed ones included.
     const std::vector<Call>& calls() const { return mCalls; }
     std::vector<Call> callsOf(Operation operation) const;

@@ -55,3 +55,11 @@ bool tsRegIsLaidDown(HKEY, const wchar_t*, wchar_t*, std::size_t)
 {
     return false;
 }
+
+bool tsRegMayHaveMissed(const wchar_t*, const wchar_t*, wchar_t* reason, std::size_t capacity)
+{
+    const auto& missed = recordingHost().registry.whyUnreadable;
+    if (missed && reason && capacity > 0)
+        reason[missed->copy(reason, capacity - 1)] = L'\0';
+    return missed.has_value();
+}

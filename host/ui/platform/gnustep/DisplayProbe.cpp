@@ -15,6 +15,10 @@ namespace
 constexpr double kUsualDotsPerInch = 96;
 constexpr double kLargestScale = 3;
 constexpr double kMillimetersPerInch = 25.4;
+constexpr double kStepsOfScale = 4; // from 1 to 2
+// What a window of many parts can do with, its frame and its title included; points.
+constexpr double kLeastWidth = 750;
+constexpr double kLeastHeight = 552;
 
 struct CloseDisplay
 {
@@ -53,7 +57,14 @@ double dotsPerInch(Display* display)
 
 double scaleFor(double dotsPerInch)
 {
-    return std::clamp(std::round(dotsPerInch / kUsualDotsPerInch * 4) / 4, 1.0, kLargestScale);
+    return std::clamp(std::round(dotsPerInch / kUsualDotsPerInch * kStepsOfScale) / kStepsOfScale, 1.0,
+                      kLargestScale);
+}
+
+double largestScaleOn(const DisplayFacts& display)
+{
+    const double scale = std::min(display.width / kLeastWidth, display.height / kLeastHeight);
+    return std::max(1.0, std::floor(scale * kStepsOfScale) / kStepsOfScale);
 }
 
 DisplayFacts probeDisplay()
@@ -61,9 +72,12 @@ DisplayFacts probeDisplay()
     const OpenDisplay display(XOpenDisplay(nullptr));
     if (!display)
         return {};
+    const int screen = DefaultScreen(display.get());
     return {.reachable = true,
             .hasWindowManager = hasWindowManager(display.get()),
-            .dotsPerInch = dotsPerInch(display.get())};
+            .dotsPerInch = dotsPerInch(display.get()),
+            .width = static_cast<double>(DisplayWidth(display.get(), screen)),
+            .height = static_cast<double>(DisplayHeight(display.get(), screen))};
 }
 
 void completeRequests(void* display)

@@ -14,4 +14,8 @@ void keepComplaintsIn(NSString* folder);
 
 // Settings that hold where the person has chosen nothing else, for this program or for all of the toolkit's.
 void suggestSettings(NSDictionary* settings);
+
+// A setting of this session that holds whatever the person has chosen, but for what the program was started
+// with.
+void insistOnSetting(NSString* name, NSString* value);
 } // namespace tessel::windowing

@@ -52,4 +52,15 @@ void suggestSettings(NSDictionary* settings)
     if (gPersonalSettings)
         [defaults registerDefaults:gPersonalSettings];
 }
+
+void insistOnSetting(NSString* name, NSString* value)
+{
+    NSUserDefaults* defaults = [NSUserDefaults standardUserDefaults];
+    NSMutableDictionary* session = [NSMutableDictionary dictionaryWithObject:value forKey:name];
+    NSDictionary* arguments = [defaults volatileDomainForName:NSArgumentDomain];
+    if (arguments)
+        [session addEntriesFromDictionary:arguments];
+    [defaults removeVolatileDomainForName:NSArgumentDomain];
+    [defaults setVolatileDomain:session forName:NSArgumentDomain];
+}
 } // namespace tessel::windowing

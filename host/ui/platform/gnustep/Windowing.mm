@@ -35,6 +35,13 @@ NSString* themePath()
     return [[NSFileManager defaultManager] fileExistsAtPath:theme] ? theme : nil;
 }
 
+NSString* const kScale = @"GSScaleFactor";
+
+NSString* asSetting(double number)
+{
+    return [NSString stringWithFormat:@"%g", number];
+}
+
 NSString* const kPlainFontRoles[] = {@"NSFont",        @"NSUserFont",    @"NSControlContentFont",
                                      @"NSLabelFont",   @"NSMenuFont",    @"NSMessageFont",
                                      @"NSPaletteFont", @"NSToolTipsFont"};
@@ -66,8 +73,10 @@ void chooseLook()
     const DisplayFacts display = probeDisplay();
     if (!display.hasWindowManager)
         [look setObject:@"NO" forKey:@"GSBackHandlesWindowDecorations"];
-    [look setObject:[NSString stringWithFormat:@"%g", scaleFor(display.dotsPerInch)] forKey:@"GSScaleFactor"];
+    [look setObject:asSetting(scaleFor(display.dotsPerInch)) forKey:kScale];
     suggestSettings(look);
+    if ([[NSUserDefaults standardUserDefaults] doubleForKey:kScale] > largestScaleOn(display))
+        insistOnSetting(kScale, asSetting(largestScaleOn(display)));
 }
 
 void completeBehaviour()

@@ -1,4 +1,4 @@
-// The SHA-256 of bytes (FIPS 180-4).
+// The SHA-256 of bytes, by the library that has it.
 #pragma once
 
 #include <memory>
@@ -7,17 +7,17 @@
 
 #include <openssl/evp.h>
 
+#include "host/files/network/Network.h"
+
 namespace tessel
 {
-class Sha256
+class Sha256 : public Checksum
 {
 public:
     Sha256();
 
-    void add(std::string_view bytes);
-
-    // 64 hexadecimal digits in small letters; nothing can be added after it.
-    std::string finish();
+    void add(std::string_view bytes) override;
+    std::string finish() override;
 
 private:
     struct Free

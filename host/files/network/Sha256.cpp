@@ -1,4 +1,4 @@
-#include "host/files/Sha256.h"
+#include "host/files/network/Sha256.h"
 
 #include <array>
 #include <new>
