@@ -15,7 +15,8 @@
 #include <optional>
 #include <string>
 
-#include "bench/Child.h"
+#include "bench/HistoryDialogBenchmark.h"
+#include "bench/OpenDialog.h"
 #include "bench/Ratios.h"
 #include "bench/Session.h"
 #include "modrig/lists/Globals.h"
@@ -29,8 +30,6 @@
 
 namespace
 {
-constexpr std::size_t kFewEntries = 1'000;
-constexpr std::size_t kManyEntries = 10'000;
 constexpr std::size_t kFewFiles = 10;
 constexpr std::size_t kManyFiles = 50;
 constexpr std::size_t kFewListed = 2'000;
@@ -45,146 +44,6 @@ void fillHistory(std::size_t count)
     for (std::size_t i = 0; i < count; ++i)
         gHistoryList.AddTail(L"/home/user/Applications/library" + std::to_wstring(i / 100) + L"/tool" +
                              std::to_wstring(i) + L".lsp");
-}
-
-// Of the first table that is not in the accessory view; 0 without one.
-NSUInteger rowsOfTableIn(NSView* view, NSView* accessory)
-{
-    if ([view isKindOfClass:[NSTableView class]])
-        return static_cast<NSUInteger>([(NSTableView*)view numberOfRows]);
-    for (NSView* inner : tsuiEach<NSView*>([view subviews]))
-        if (const NSUInteger rows = inner == accessory ? 0 : rowsOfTableIn(inner, accessory))
-            return rows;
-    return 0;
-}
-
-// The main dialog in its panel, set up as for a run, without the run.
-class OpenDialog
-{
-public:
-    OpenDialog() : mController([[ModrigController alloc] init]), mPanel(tsuiMakeFilePanel())
-    {
-        [mController setupOpenPanel:mPanel];
-    }
-    ~OpenDialog()
-    {
-        [mController cleanOpenPanel:mPanel];
-        [mController release];
-    }
-    OpenDialog(const OpenDialog&) = delete;
-    OpenDialog& operator=(const OpenDialog&) = delete;
-
-    ModrigController* controller() const { return mController; }
-    NSOpenPanel* panel() const { return mPanel; }
-    NSUInteger filesShown() const { return rowsOfTableIn([mPanel contentView], [mPanel accessoryView]); }
-    NSUInteger rows(NSString* table) const
-    {
-        return [[[mController valueForKey:table] arrangedObjects] count];
-    }
-
-private:
-    ModrigController* mController;
-    NSOpenPanel* mPanel;
-};
-
-// Runs `once` again and again; it answers the seconds of what it measures, negative when that went wrong.
-void measure(const std::string& name, std::function<double()> once)
-{
-    const auto run = [once = std::move(once), name](benchmark::State& state)
-    {
-        for (auto iteration : state)
-        {
-            static_cast<void>(iteration);
-            NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
-            const double seconds = once();
-            [pool drain];
-            if (seconds < 0)
-                state.SkipWithError((name + ": the table does not hold what it should").c_str());
-            state.SetIterationTime(seconds);
-        }
-    };
-    benchmark::RegisterBenchmark(name.c_str(), run)
-        ->UseManualTime()
-        ->Iterations(1)
-        ->Repetitions(kRepetitions);
-}
-
-// In a pool of its own: giving back what the work has left behind is part of its cost.
-double secondsInPool(const std::function<void()>& work)
-{
-    return bench::secondsOf(
-        [&]
-        {
-            NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
-            work();
-            [pool drain];
-        });
-}
-
-// What opening does for the History's table, in a dialog that has opened without one.
-double openTable(std::size_t entries)
-{
-    gHistoryList.RemoveAll();
-    const OpenDialog dialog;
-    fillHistory(entries);
-    const double seconds = secondsInPool([&] { [dialog.controller() populateHistoryList]; });
-    return dialog.rows(@"historyList") == entries ? seconds : -1;
-}
-
-NSMutableArray* readyRows(std::size_t entries)
-{
-    fillHistory(entries);
-    NSMutableArray* rows = [NSMutableArray array];
-    for (NSString* path : tsuiEach<NSString*>(ModrigUtils::StringsFromPaths(gHistoryList)))
-        [rows addObject:[[[ModrigFilePath alloc] initWithFilePathName:path] autorelease]];
-    return rows;
-}
-
-NSArrayController* bareController()
-{
-    return [[[NSArrayController alloc] initWithContent:[NSMutableArray array]] autorelease];
-}
-
-// One by one, as the entries of the History come; nothing shows them.
-double giveToBareController(std::size_t entries)
-{
-    NSArray* rows = readyRows(entries);
-    NSArrayController* bare = bareController();
-    const double seconds = secondsInPool(
-        [&]
-        {
-            for (ModrigFilePath* row : tsuiEach<ModrigFilePath*>(rows))
-                [bare addObject:row];
-        });
-    return [[bare arrangedObjects] count] == entries ? seconds : -1;
-}
-
-NSTableView* boundTable(NSArrayController* rows)
-{
-    NSTableView* table = [[[NSTableView alloc] initWithFrame:NSMakeRect(0, 0, 400, 200)] autorelease];
-    for (NSString* key : {@"fileName", @"filePath"})
-    {
-        NSTableColumn* column = [[[NSTableColumn alloc] initWithIdentifier:key] autorelease];
-        [table addTableColumn:column];
-        [column bind:NSValueBinding
-               toObject:rows
-            withKeyPath:[@"arrangedObjects." stringByAppendingString:key]
-                options:nil];
-    }
-    return table;
-}
-
-// All in one call, to the rows of a table with two columns that are bound to them.
-double giveToBoundController(std::size_t entries)
-{
-    NSArray* rows = readyRows(entries);
-    NSArrayController* bare = bareController();
-    NSTableView* table = boundTable(bare);
-    const double seconds = secondsInPool([&] { [bare addObjects:rows]; });
-    const bool all = static_cast<std::size_t>([table numberOfRows]) == entries;
-    for (NSTableColumn* column : tsuiEach<NSTableColumn*>([table tableColumns]))
-        [column unbind:NSValueBinding];
-    return all ? seconds : -1;
 }
 
 // Paths of modules that nothing has loaded.
@@ -210,10 +69,10 @@ double dropFiles(std::size_t files)
 {
     gHistoryList.RemoveAll();
     NSArray* paths = modulePaths(files);
-    const OpenDialog dialog;
+    const bench::OpenDialog dialog;
     [dialog.controller() setSaveHistory:YES];
     const double seconds =
-        secondsInPool([&] { [dialog.controller() loadedAppsTableViewDropFiles:paths atRow:0]; });
+        bench::secondsInPool([&] { [dialog.controller() loadedAppsTableViewDropFiles:paths atRow:0]; });
     const bool all = dialog.rows(@"loadedApps") == files && dialog.rows(@"historyList") == files;
     unload(paths);
     return all ? seconds : -1;
@@ -233,8 +92,8 @@ NSString* folderOfFiles(std::size_t count)
 double listFolder(std::size_t files)
 {
     NSString* folder = folderOfFiles(files);
-    const OpenDialog dialog;
-    const double seconds = secondsInPool(
+    const bench::OpenDialog dialog;
+    const double seconds = bench::secondsInPool(
         [&]
         {
             [dialog.panel() setDirectory:folder];
@@ -249,7 +108,7 @@ double nameFiles(std::size_t files)
     NSString* folder = folderOfFiles(files);
     NSFileManager* manager = [NSFileManager defaultManager];
     std::size_t found = 0;
-    const double seconds = secondsInPool(
+    const double seconds = bench::secondsInPool(
         [&]
         {
             BOOL isFolder = NO;
@@ -272,19 +131,14 @@ double loadHistory(std::size_t entries)
 {
     fillHistory(entries);
     gLoadedAppList.RemoveAll();
-    const OpenDialog dialog;
+    const bench::OpenDialog dialog;
     [dialog.controller() setSaveHistory:YES];
     NSArray* files = [[dialog.controller() valueForKey:@"historyList"] arrangedObjects];
-    const double seconds =
-        secondsInPool([&] { [dialog.controller() loadApps:files successedApps:nil addToStartupSuit:NO]; });
+    const double seconds = bench::secondsInPool(
+        [&] { [dialog.controller() loadApps:files successedApps:nil addToStartupSuit:NO]; });
     const bool all = dialog.rows(@"loadedApps") == entries;
     gLoadedAppList.RemoveAll();
     return all ? seconds : -1;
-}
-
-std::string opening(std::size_t entries)
-{
-    return "open tables, History of " + std::to_string(entries);
 }
 
 std::string dropping(std::size_t files)
@@ -299,28 +153,17 @@ std::string loading(std::size_t entries)
 
 void addBenchmarks()
 {
-    const std::string bare = "give 10000 rows to a bare array controller";
-    const std::string bound = "give 10000 rows to one that a table is bound to";
-    for (const std::size_t entries : {kFewEntries, kManyEntries})
-        measure(opening(entries), [entries] { return openTable(entries); });
-    measure(bare, [] { return giveToBareController(kManyEntries); });
-    measure(bound, [] { return giveToBoundController(kManyEntries); });
     for (const std::size_t files : {kFewFiles, kManyFiles})
-        measure(dropping(files), [files] { return dropFiles(files); });
+        bench::measure(dropping(files), kRepetitions, [files] { return dropFiles(files); });
     const std::string naming = "name the files of a folder of 20000";
     for (const std::size_t files : {kFewListed, kManyListed})
-        measure(listing(files), [files] { return listFolder(files); });
-    measure(naming, [] { return nameFiles(kManyListed); });
+        bench::measure(listing(files), kRepetitions, [files] { return listFolder(files); });
+    bench::measure(naming, kRepetitions, [] { return nameFiles(kManyListed); });
     bench::addRatio({listing(kManyListed) + " / naming them", listing(kManyListed), naming, 3});
     bench::addRatio({"list, cost per file of 20000 / of 2000", listing(kManyListed), listing(kFewListed), 2,
                      kManyListed, kFewListed});
     for (const std::size_t entries : {kSomeRows, kManyRows})
-        measure(loading(entries), [entries] { return loadHistory(entries); });
-    bench::addRatio({opening(kManyEntries) + " / bare array controller", opening(kManyEntries), bare, 2});
-    bench::addRatio(
-        {opening(kManyEntries) + " / the same with a table bound", opening(kManyEntries), bound, 2});
-    bench::addRatio({"open tables, cost per entry at 10000 / at 1000", opening(kManyEntries),
-                     opening(kFewEntries), 1.5, kManyEntries, kFewEntries});
+        bench::measure(loading(entries), kRepetitions, [entries] { return loadHistory(entries); });
     bench::addRatio({"drop, cost per file of 50 / of 10", dropping(kManyFiles), dropping(kFewFiles), 1.5,
                      kManyFiles, kFewFiles});
     bench::addRatio({"load the History, cost per row of 5000 / of 500", loading(kManyRows),
@@ -328,7 +171,7 @@ void addBenchmarks()
 }
 } // namespace
 
-int main()
+int main(int argc, char** argv)
 try
 {
     std::optional<VirtualDisplay> display;
@@ -338,7 +181,11 @@ try
     bench::startHost();
     if (!tsuiPrepareWindows())
         return EXIT_FAILURE;
+    // -part PART -entries COUNT -server PROCESS: the toolkit takes plain words for documents to open.
+    if (argc == 7)
+        return runHistoryPart(argv[2], std::strtoul(argv[4], nullptr, 10), std::stoi(argv[6]));
     addBenchmarks();
+    addHistoryDialogBenchmarks(display ? display->server() : 0);
     const int missed = bench::runAll();
     [pool drain];
     return missed == 0 ? EXIT_SUCCESS : EXIT_FAILURE;

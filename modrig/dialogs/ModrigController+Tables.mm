@@ -7,6 +7,7 @@
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
 #include "modrig/dialogs/Paths.h"
+#include "modrig/dialogs/TableRows.h"
 #include "modrig/dialogs/model/ChosenFiles.h"
 #include "modrig/dialogs/model/RowInsertion.h"
 #include "modrig/dialogs/model/RowSelection.h"
@@ -51,14 +52,12 @@ bool hasSelection(NSArrayController* rows)
 
 - (void)populateLoadedApplications
 {
-    const std::vector<CStdStr> paths = ModrigUtils::ApplicationsShownAsLoaded();
-    [TsOCModrigUtil fill:loadedApps withPathNames:ModrigUtils::StringsFromPaths(paths)];
+    ModrigUtils::FillTable(loadedApps, ModrigUtils::ApplicationsShownAsLoaded());
 }
 
 - (void)populateHistoryList
 {
-    [TsOCModrigUtil fill:historyList
-           withPathNames:ModrigUtils::StringsFromPaths(ModrigUtils::HistoryFiles())];
+    ModrigUtils::FillTable(historyList, ModrigUtils::HistoryFiles());
 }
 
 - (NSArrayController*)rowsOf:(NSTableView*)table

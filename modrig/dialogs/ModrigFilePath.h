@@ -11,6 +11,7 @@
     NSString* mFileName;
     NSString* mFilePath;
     BOOL mUnloadable;
+    BOOL mIsPlain; // the characters of the path stand right after the object
 }
 
 // The full path with symbolic links resolved: what the row stands for.
@@ -24,8 +25,9 @@
 // With nil all texts are nil, and `unloadable` is NO. A path without a dot: message 2.
 - (id)initWithFilePathName:(NSString*)path;
 
-// The same for a path that has no symbolic links in it, which is then not looked at on the disk.
-- (id)initWithResolvedPath:(NSString*)path;
+// A new row, which the caller releases, for a path that has no symbolic links in it: the disk is not looked
+// at. Few of many rows ever show, so its strings are made when they are first asked for.
++ (ModrigFilePath*)newWithResolvedPath:(const CStdStr&)path;
 
 // What `unloadable` becomes for the path; asked once, when the row is made.
 - (BOOL)findUnloadable:(const CStdStr&)path;

@@ -1,36 +1,60 @@
 #import "modrig/dialogs/ModrigFilePath.h"
 
+#include <objc/runtime.h>
+
 #include <wincompat/winstring.h>
 
+#include <algorithm>
 #include <string>
+#include <string_view>
 
 #include "modrig/dialogs/Paths.h"
 #include "modrig/dialogs/model/PathHash.h"
 #include "modrig/loader/LoadedApplications.h"
 
+namespace
+{
+constexpr wchar_t kFirstBeyondAscii = 0x80;
+
+bool isPlain(const std::wstring& path)
+{
+    return std::all_of(path.begin(), path.end(),
+                       [](wchar_t character) { return character > 0 && character < kFirstBeyondAscii; });
+}
+
+char* charactersAfter(ModrigFilePath* row)
+{
+    return static_cast<char*>(object_getIndexedIvars(row));
+}
+} // namespace
+
 @implementation ModrigFilePath
 
-@synthesize filePathName = mFilePathName;
 @synthesize unloadable = mUnloadable;
 
 - (id)initWithFilePathName:(NSString*)path
 {
-    if (!(self = [self initWithResolvedPath:path]) || !path)
+    if (!(self = [super init]) || !path)
         return self;
+    mFilePathName = [[path stringByResolvingSymlinksInPath] copy];
     mFileName = [[path lastPathComponent] copy];
     mFilePath = [[path stringByDeletingLastPathComponent] copy];
-    [mFilePathName release];
-    mFilePathName = [[path stringByResolvingSymlinksInPath] copy];
+    mUnloadable = [self findUnloadable:ModrigUtils::PathFromString(path)];
     return self;
 }
 
-- (id)initWithResolvedPath:(NSString*)path
++ (ModrigFilePath*)newWithResolvedPath:(const CStdStr&)path
 {
-    if (!(self = [super init]) || !path)
-        return self;
-    mFilePathName = [path copy];
-    mUnloadable = [self findUnloadable:CStdStr(NSStringToWstring(path))];
-    return self;
+    const std::wstring& text = path.Text();
+    const bool plain = isPlain(text);
+    auto* row = (ModrigFilePath*)[NSAllocateObject(self, plain ? text.size() + 1 : 0, nullptr) init];
+    row->mIsPlain = plain;
+    if (plain) // the memory is all zeros: there is one after them
+        std::copy(text.begin(), text.end(), charactersAfter(row));
+    else
+        row->mFilePathName = [ModrigUtils::StringFromPath(path) retain];
+    row->mUnloadable = [row findUnloadable:path];
+    return row;
 }
 
 - (BOOL)findUnloadable:(const CStdStr&)path
@@ -46,38 +70,44 @@
     [super dealloc];
 }
 
-// Where no other path was given, name and folder wait for the first who asks: few of many rows ever show.
+- (NSString*)filePathName
+{
+    if (!mFilePathName && mIsPlain)
+        mFilePathName = [[NSString alloc] initWithUTF8String:charactersAfter(self)];
+    return mFilePathName;
+}
+
 - (NSString*)fileName
 {
     if (!mFileName)
-        mFileName = [[mFilePathName lastPathComponent] copy];
+        mFileName = [[[self filePathName] lastPathComponent] copy];
     return mFileName;
 }
 
 - (NSString*)filePath
 {
     if (!mFilePath)
-        mFilePath = [[mFilePathName stringByDeletingLastPathComponent] copy];
+        mFilePath = [[[self filePathName] stringByDeletingLastPathComponent] copy];
     return mFilePath;
 }
 
 - (CStdStr)path
 {
-    return CStdStr(NSStringToWstring(mFilePathName));
+    if (!mIsPlain)
+        return CStdStr(NSStringToWstring(mFilePathName));
+    const std::string_view characters = charactersAfter(self);
+    return CStdStr(std::wstring(characters.begin(), characters.end()));
 }
 
 - (BOOL)isEqual:(id)other
 {
-    return
-        [other isKindOfClass:[self class]] && ModrigUtils::AreSamePath(mFilePathName, [other filePathName]);
+    return [other isKindOfClass:[self class]] &&
+           ModrigUtils::AreSamePath([self filePathName], [other filePathName]);
 }
 
 - (NSUInteger)hash
 {
-    const NSUInteger length = [mFilePathName length];
-    std::u16string characters(length, u'\0');
-    [mFilePathName getCharacters:reinterpret_cast<unichar*>(characters.data()) range:NSMakeRange(0, length)];
-    return ModrigUtils::HashOfPath(characters);
+    return ModrigUtils::HashOfPath([self path].Text());
 }
 
 @end

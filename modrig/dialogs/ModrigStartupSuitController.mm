@@ -11,6 +11,7 @@
 #include "modrig/dialogs/Layout.h"
 #include "modrig/dialogs/Paths.h"
 #include "modrig/dialogs/Settings.h"
+#include "modrig/dialogs/TableRows.h"
 #include "modrig/dialogs/platform/Platform.h"
 #include "modrig/lists/FileIntake.h"
 #include "modrig/lists/ListMembership.h"
@@ -47,8 +48,7 @@ constexpr NSInteger kRemoveSegment = 1;
     ModrigUtils::RestoreFrame([self window], settings, kSuiteWindowSetting);
     ModrigUtils::RestoreColumns(startupTableView, settings, kSuiteColumnSetting);
     ModrigPlatform::ShowRows(startupTableView, startupApps);
-    [TsOCModrigUtil fill:startupApps
-           withPathNames:ModrigUtils::StringsFromPaths(ModrigUtils::StartupSuiteFiles())];
+    ModrigUtils::FillTable(startupApps, ModrigUtils::StartupSuiteFiles());
     [self enableRemove:NO];
 }
 

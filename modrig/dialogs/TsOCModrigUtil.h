@@ -17,10 +17,6 @@
 // The same for many paths, with one change of the table.
 + (void)addPathNames:(NSArray*)paths toArrayController:(NSArrayController*)controller;
 
-// Adds rows for the paths to a table that has just opened, and selects none: nothing has been chosen by
-// anybody yet.
-+ (void)fill:(NSArrayController*)controller withPathNames:(NSArray*)paths;
-
 // The text of the key in the string table of the module's bundle, in English where the person's language has
 // none; the key itself when there is none.
 + (NSString*)modrigLoadString:(NSString*)key;

@@ -1,16 +1,14 @@
 #import "modrig/dialogs/TsOCModrigUtil.h"
 
 #import <tesselui/TsOCFileFilter.h>
-#include <tesselui/tsuieach.h>
 #include <tesselui/tsuitexts.h>
 #include <wincompat/winfile.h>
 #include <wincompat/winstring.h>
 
 #import "modrig/dialogs/ModrigController.h"
-#import "modrig/dialogs/ModrigFilePath.h"
 
 #include "modrig/dialogs/Paths.h"
-#include "modrig/dialogs/model/RowInsertion.h"
+#include "modrig/dialogs/TableRows.h"
 #include "modrig/types/FileFilters.h"
 #include "modrig/types/FileValidation.h"
 
@@ -21,19 +19,6 @@ ModrigController* gModrigController = nil;
 CStdStr wide(NSString* text)
 {
     return CStdStr(NSStringToWstring(text));
-}
-
-NSArray* rowsOf(NSArray* paths)
-{
-    NSMutableArray* rows = [NSMutableArray arrayWithCapacity:[paths count]];
-    for (NSString* path : tsuiEach<NSString*>(paths))
-    {
-        ModrigFilePath* row =
-            [[ModrigFilePath alloc] initWithResolvedPath:[path stringByResolvingSymlinksInPath]];
-        [rows addObject:row];
-        [row release];
-    }
-    return rows;
 }
 } // namespace
 
@@ -58,22 +43,7 @@ NSArray* rowsOf(NSArray* paths)
 
 + (void)addPathNames:(NSArray*)paths toArrayController:(NSArrayController*)controller
 {
-    NSArray* candidates = rowsOf(paths);
-    NSMutableSet* rows = [NSMutableSet setWithArray:[controller arrangedObjects]];
-    ModrigUtils::KnownRows known;
-    known.holds = [=](std::size_t index) -> bool
-    { return [rows containsObject:[candidates objectAtIndex:index]]; };
-    known.add = [=](std::size_t index) { [rows addObject:[candidates objectAtIndex:index]]; };
-    const auto added = ModrigUtils::NewRows([candidates count], known);
-    if (!added.empty())
-        [controller addObjects:[candidates objectsAtIndexes:ModrigUtils::SetFromIndexes(added)]];
-}
-
-+ (void)fill:(NSArrayController*)controller withPathNames:(NSArray*)paths
-{
-    [controller setSelectsInsertedObjects:NO];
-    [self addPathNames:paths toArrayController:controller];
-    [controller setSelectsInsertedObjects:YES];
+    ModrigUtils::AddRows(controller, ModrigUtils::PathsFromStrings(paths));
 }
 
 + (NSString*)modrigLoadString:(NSString*)key

@@ -125,7 +125,7 @@ bool ApplicationIsLoaded(CStdStr path)
     return false;
 }
 
-bool IsAppUnloadAble(CStdStr path)
+bool IsAppUnloadAble(const CStdStr& path)
 {
     return RefuseFileWithoutDot(path) || CouldBeUnloaded(path);
 }

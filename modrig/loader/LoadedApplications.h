@@ -23,7 +23,7 @@ void PopulateLoadedApps();
 
 // Whether the compiled module may be unloaded. False for files of every other kind. A path without a dot:
 // kCannotLoadFile and true.
-[[nodiscard]] bool IsAppUnloadAble(CStdStr path);
+[[nodiscard]] bool IsAppUnloadAble(const CStdStr& path);
 
 // The same answer without a word.
 [[nodiscard]] bool CouldBeUnloaded(const CStdStr& path);

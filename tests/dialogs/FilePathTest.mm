@@ -57,6 +57,18 @@ TEST_F(FilePath, KeepsEveryCharacterOfItsPath)
     EXPECT_EQ(L"/none/" + name, [make(wcharToNSString((L"/none/" + name).c_str())) path].Text());
 }
 
+TEST_F(FilePath, KeepsPathsOfEveryLength)
+{
+    for (std::size_t length = 1; length < 600; ++length)
+    {
+        const std::wstring path = L"/" + std::wstring(length, L'x') + L".lsp";
+        EXPECT_EQ(path, wide(wcharToNSString(path.c_str())));
+        EXPECT_EQ(path, [make(wcharToNSString(path.c_str())) path].Text());
+    }
+    EXPECT_EQ(L"", wide(wcharToNSString(L"")));
+    EXPECT_EQ(nil, wcharToNSString(nullptr));
+}
+
 TEST_F(FilePath, KeepsBytesThatAreNoText)
 {
     const std::wstring odd = file("r\xE9pertoire/odd\xFF.lsp");

@@ -1,8 +1,7 @@
 #include "modrig/dialogs/model/PathHash.h"
 
 #include <array>
-#include <functional>
-#include <string>
+#include <cstdint>
 
 namespace ModrigUtils
 {
@@ -30,22 +29,40 @@ constexpr auto kCertain = []
     return certain;
 }();
 
-bool IsAccent(std::u16string_view path, std::size_t index)
+template <class Path>
+bool IsAccent(const Path& path, std::size_t index)
 {
     return index < path.size() && path[index] >= kFirstAccent && path[index] <= kLastAccent;
 }
-} // namespace
+
+// FNV-1a: bytes as they come, none of them kept.
+constexpr std::uint64_t kHashStart = 0xCBF29CE484222325;
+constexpr std::uint64_t kHashFactor = 0x100000001B3;
 
 // Paths that are equal may differ in more than their letters' case: an accent can be a character of its own,
 // after its letter, or part of it. So a letter counts only where no such character follows. Any other
 // character that follows leaves it alone: what that one is equal to may be a plain letter.
+template <class Path>
+std::size_t HashOf(const Path& path)
+{
+    std::uint64_t hash = kHashStart;
+    for (std::size_t index = 0; index < path.size(); ++index)
+    {
+        const auto character = static_cast<char32_t>(path[index]);
+        if (character <= kLastAscii && kCertain[character] && !IsAccent(path, index + 1))
+            hash = (hash ^ static_cast<unsigned char>(kCertain[character])) * kHashFactor;
+    }
+    return hash;
+}
+} // namespace
+
 std::size_t HashOfPath(std::u16string_view path)
 {
-    std::string certain;
-    certain.reserve(path.size());
-    for (std::size_t index = 0; index < path.size(); ++index)
-        if (path[index] <= kLastAscii && !IsAccent(path, index + 1) && kCertain[path[index]])
-            certain += kCertain[path[index]];
-    return std::hash<std::string>()(certain);
+    return HashOf(path);
+}
+
+std::size_t HashOfPath(std::wstring_view path)
+{
+    return HashOf(path);
 }
 } // namespace ModrigUtils

@@ -18,17 +18,4 @@ std::vector<TableKind> TablesToJoin(bool savesHistory, const std::function<bool(
         tables.push_back(TableKind::kHistory);
     return tables;
 }
-
-std::vector<std::size_t> NewRows(std::size_t candidates, const KnownRows& known)
-{
-    std::vector<std::size_t> rows;
-    for (std::size_t candidate = 0; candidate < candidates; ++candidate)
-    {
-        if (known.holds(candidate))
-            continue;
-        known.add(candidate);
-        rows.push_back(candidate);
-    }
-    return rows;
-}
 } // namespace ModrigUtils

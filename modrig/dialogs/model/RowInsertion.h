@@ -24,15 +24,4 @@ inline constexpr int kAppendRow = -1;
 // the row shows what was loaded now, and the next dialog the entry of the list, which stands for both.
 [[nodiscard]] std::vector<TableKind> TablesToJoin(bool savesHistory,
                                                   const std::function<bool(TableKind)>& holds);
-
-// Rows that a table has, and those that join it.
-struct KnownRows
-{
-    std::function<bool(std::size_t candidate)> holds; // a row that is equal to the candidate
-    std::function<void(std::size_t candidate)> add;
-};
-
-// Which of the candidates, counted from 0, join a table: each that is equal to no row that is known, nor to a
-// candidate before it. Those are added to the known rows.
-[[nodiscard]] std::vector<std::size_t> NewRows(std::size_t candidates, const KnownRows& known);
 } // namespace ModrigUtils

@@ -31,3 +31,10 @@ TEST(PathHash, PassesOverALetterThatAnAccentMayFollow)
     EXPECT_EQ(HashOfPath(u"/caf\u00E9.x"), HashOfPath(u"/cafe\u0301.x"));
     EXPECT_EQ(HashOfPath(u"/\u00E9"), HashOfPath(u"/e\u0301"));
 }
+
+TEST(PathHash, IsTheSameForAPathInEitherEncoding)
+{
+    EXPECT_EQ(HashOfPath(u"/Caf\u00E9/cafe\u0301\U0001F600.lsp"),
+              HashOfPath(L"/Caf\u00E9/cafe\u0301\U0001F600.lsp"));
+    EXPECT_NE(HashOfPath(L"/a/one"), HashOfPath(L"/a/two"));
+}

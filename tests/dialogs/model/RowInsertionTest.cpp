@@ -17,23 +17,6 @@ std::vector<TableKind> JoinedWhereHeld(bool savesHistory, const std::set<TableKi
 {
     return TablesToJoin(savesHistory, [&](TableKind kind) { return holding.contains(kind); });
 }
-
-// A table that holds some files, to be joined by others.
-struct JoinedTable
-{
-    std::set<std::string> rows;
-    std::vector<std::string> candidates;
-
-    std::vector<std::size_t> Join()
-    {
-        return NewRows(candidates.size(),
-                       {[this](std::size_t index) { return rows.contains(candidates.at(index)); },
-                        [this](std::size_t index)
-                        {
-                            rows.insert(candidates.at(index));
-                        }});
-    }
-};
 } // namespace
 
 TEST(RowForInsertion, IsTheEndWhenNothingWasDropped)
@@ -68,23 +51,4 @@ TEST(TablesToJoin, LeaveOutWhatHasARowForTheFile)
     EXPECT_THAT(JoinedWhereHeld(true, {kLoadedTable}), ElementsAre(kHistoryTable));
     EXPECT_THAT(JoinedWhereHeld(true, {kHistoryTable}), ElementsAre(kLoadedTable));
     EXPECT_THAT(JoinedWhereHeld(true, {kLoadedTable, kHistoryTable}), IsEmpty());
-}
-
-TEST(NewRows, AreThoseThatTheTableDoesNotHold)
-{
-    JoinedTable table = {{"b"}, {"a", "b", "c"}};
-    EXPECT_THAT(table.Join(), ElementsAre(0, 2));
-    EXPECT_THAT(table.rows, ElementsAre("a", "b", "c"));
-}
-
-TEST(NewRows, AreTheFirstOfSeveralThatAreEqual)
-{
-    JoinedTable table = {{}, {"a", "b", "a", "b", "c"}};
-    EXPECT_THAT(table.Join(), ElementsAre(0, 1, 4));
-}
-
-TEST(NewRows, AreNoneWhereNothingComes)
-{
-    JoinedTable table = {{"a"}, {}};
-    EXPECT_THAT(table.Join(), IsEmpty());
 }

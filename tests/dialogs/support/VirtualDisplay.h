@@ -24,6 +24,7 @@ public:
 
     // What DISPLAY is set to for its programs: ":5".
     const std::string& name() const { return mName; }
+    pid_t server() const { return mServer; }
 
 private:
     pid_t mServer = -1;

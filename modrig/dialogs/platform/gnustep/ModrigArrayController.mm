@@ -86,10 +86,15 @@
         atArrangedObjectIndexes:[NSIndexSet indexSetWithIndex:place]];
 }
 
+// What is selected stays where it is, however many come after it.
 - (void)addObjects:(NSArray*)objects
 {
     const NSRange end = NSMakeRange([[self content] count], [objects count]);
-    [self insertObjects:objects atArrangedObjectIndexes:[NSIndexSet indexSetWithIndexesInRange:end]];
+    NSIndexSet* selection =
+        [self selectsInsertedObjects] ? [NSIndexSet indexSetWithIndexesInRange:end] : [self selectionIndexes];
+    [[self content] addObjectsFromArray:objects];
+    [self noteAdded:objects];
+    [self showContentSelecting:selection];
 }
 
 - (void)addObject:(id)object
