@@ -37,7 +37,7 @@ constexpr int kFewRepetitions = 31; // short ones are noisy
 // What was measured and a tenth.
 constexpr double kReadToStore = 1.0;
 constexpr double kWriteToStore = 0.8;
-constexpr double kWriteNewToStore = 0.8;
+constexpr double kWriteNewToStore = 0.85;
 constexpr double kWriteSameToStore = 0.45;
 constexpr DWORD kBufferCharacters = 1024;
 
