@@ -24,7 +24,7 @@ constexpr int kMostModules = 10'000;
 constexpr int kLispFilesPerModule = 10;
 constexpr int kPaths = 1'000;
 constexpr int kRebuildRepetitions = 9;
-constexpr int kPathRepetitions = 31; // of the file system, which wobbles
+constexpr int kPathRepetitions = 31;  // of the file system, which wobbles
 constexpr int kRepetitionsOfMost = 5; // before each of which the modules are loaded for seconds
 
 // Whether all of them were loaded.
