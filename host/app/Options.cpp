@@ -44,6 +44,7 @@ std::string isThere(const std::string& folder)
 void declare(CLI::App& app, Options& options)
 {
     app.footer(translatedInUtf8(kAfterword));
+    app.option_defaults()->disable_flag_override(); // --safe=3 would be --safe, and --safe=no nothing
     app.set_help_flag("-h,--help", translatedInUtf8(L"Show this text and end"));
     app.set_version_flag("--version", versionLine(), translatedInUtf8(L"Show the version and end"));
     app.add_option("--profile-dir", options.profileFolder,

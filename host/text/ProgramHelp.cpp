@@ -40,7 +40,7 @@ std::wstring whatIsWrong(const CLI::Error& error)
     return words.ends_with(L" missing")
                ? translated(L"Something is missing after {}: {}", before(words, L":"),
                             before(after(words, L" required "), L" missing"))
-               : translated(L"{} takes no value.", before(words, L" was given"));
+               : translated(L"{} takes no value.", L"--" + before(words, L" was given"));
 }
 } // namespace
 

@@ -107,7 +107,7 @@ TEST_F(GermanPerson, ReadsTheHelpOfTheCompilerAndWhatItRefuses)
     EXPECT_THAT(
         reads({}),
         AllOf(HasSubstr("Übersetzt eine Lisp-Datei für Tessel in Bytecode.\nAufruf: tesselc [OPTIONEN] "
-                        "FILE\n\nArgumente:\n  FILE TEXT ERFORDERLICH "),
+                        "DATEI\n\nArgumente:\n  DATEI TEXT ERFORDERLICH "),
               HasSubstr("\nOptionen:\n  -h,--help                   Zeigt diese Hilfe und endet\n"),
               HasSubstr("\ntesselc: „.“ kann nicht geladen werden: ein Ordner.\n")));
 }

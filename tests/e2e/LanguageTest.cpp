@@ -60,11 +60,11 @@ TEST_F(PersonsLanguage, IsThatOfTheOptionsAndOfWhatIsWrongWithThem)
     };
     const std::string more = "\nMehr dazu sagt --help.\n";
     EXPECT_EQ(refused({"--none"}), "Dieses Argument gibt es nicht: --none" + more);
-    EXPECT_EQ(refused({"--none", "-z"}), "Diese Argumente gibt es nicht: --none -z" + more);
+    EXPECT_EQ(refused({"--none", "-z"}), "Diese Argumente gibt es nicht: -z --none" + more);
     EXPECT_EQ(refused({"--log"}), "Nach --log fehlt noch etwas: DATEI" + more);
-    EXPECT_EQ(refused({"-q", "-v"}), "--verbose und --quiet können nicht zugleich angegeben werden." + more);
+    EXPECT_EQ(refused({"-q", "-v"}), "--quiet und --verbose können nicht zugleich angegeben werden." + more);
     EXPECT_EQ(refused({"--safe=3"}), "--safe nimmt keinen Wert." + more);
-    EXPECT_EQ(refused({"--log", ""}), "--log: eine Datei wird gebraucht, und keine ist genannt" + more);
+    EXPECT_EQ(refused({"--log", ""}), "--log: eine Datei ist nötig, und keine ist genannt" + more);
 }
 
 TEST_F(PersonsLanguage, IsFoundBesideAMovedProgram)
