@@ -1,30 +1,36 @@
 #include <tessel/tsresbuf.h>
 
-#include <cwchar>
-#include <memory>
+#include <new>
 #include <string_view>
 
 namespace
 {
-wchar_t* copyText(std::wstring_view text)
+// Where a list puts a text: after the buffer, in the same block of memory. Whoever asks for what is loaded
+// gets a buffer for every module, and has a Suite of hundreds ask as often.
+wchar_t* placeForText(TsResultBuffer* buffer)
 {
-    auto* copy = new wchar_t[text.size() + 1];
-    std::wmemcpy(copy, text.data(), text.size());
-    copy[text.size()] = L'\0';
-    return copy;
+    return reinterpret_cast<wchar_t*>(buffer + 1);
+}
+
+TsResultBuffer* blockFor(std::wstring_view text)
+{
+    void* const block = operator new(sizeof(TsResultBuffer) + (text.size() + 1) * sizeof(wchar_t));
+    auto* const buffer = new (block) TsResultBuffer;
+    buffer->value.string = placeForText(buffer);
+    text.copy(buffer->value.string, text.size());
+    buffer->value.string[text.size()] = L'\0';
+    return buffer;
 }
 
 TsResultBuffer* newBuffer(const TsRbValue& value)
 {
-    auto buffer = std::make_unique<TsResultBuffer>();
+    TsResultBuffer* const buffer = blockFor(value.text() ? value.text() : L"");
     buffer->next = nullptr;
     buffer->type = value.type();
-    buffer->value.real = 0;
     switch (value.type())
     {
     case TS_STRING:
-        buffer->value.string = copyText(value.text() ? value.text() : L"");
-        break;
+        break; // lies in its place
     case TS_SHORT:
         buffer->value.shortNumber = static_cast<std::int16_t>(value.number());
         break;
@@ -35,9 +41,10 @@ TsResultBuffer* newBuffer(const TsRbValue& value)
         buffer->value.real = value.real();
         break;
     default: // truth values carry nothing else
+        buffer->value.real = 0;
         break;
     }
-    return buffer.release();
+    return buffer;
 }
 } // namespace
 
@@ -57,10 +64,11 @@ int tsutRelRb(TsResultBuffer* list)
 {
     while (list)
     {
-        const std::unique_ptr<TsResultBuffer> buffer(list);
+        TsResultBuffer* const buffer = list;
         list = list->next;
-        if (buffer->type == TS_STRING)
-            delete[] buffer->value.string;
+        if (buffer->type == TS_STRING && buffer->value.string != placeForText(buffer))
+            delete[] buffer->value.string; // that of somebody who has put another text there
+        operator delete(buffer);
     }
     return TS_NORMAL;
 }

@@ -35,6 +35,22 @@ TEST(ResultBuffers, CopyTheirStrings)
     tsutRelRb(list);
 }
 
+TEST(ResultBuffers, MayBeGivenOtherTexts)
+{
+    TsResultBuffer* list = tsutBuildList({TsRbValue::String(L"first"), TsRbValue::String(L"second")});
+    ASSERT_NE(list, nullptr);
+    list->value.string = new wchar_t[]{L'o', L'w', L'n', L'\0'};
+    EXPECT_STREQ(list->next->value.string, L"second");
+    EXPECT_EQ(tsutRelRb(list), TS_NORMAL);
+}
+
+TEST(ResultBuffers, MayBeMadeByHand)
+{
+    auto* list = new TsResultBuffer{nullptr, TS_STRING, {}};
+    list->value.string = new wchar_t[]{L'o', L'w', L'n', L'\0'};
+    EXPECT_EQ(tsutRelRb(list), TS_NORMAL);
+}
+
 TEST(ResultBuffers, TakeNullTextForAnEmptyOne)
 {
     TsResultBuffer* list = tsutBuildList({TsRbValue::String(nullptr)});
