@@ -259,7 +259,7 @@ void addHistoryDialogBenchmarks(pid_t display)
 {
     addOpenings();
     addWindow("window shown", 1.5, display);
-    addWindow(kInFront, 1.5, display);
+    addWindow(kInFront, 1.65, display);
     addPeers(display);
     addMemory();
 }

@@ -138,12 +138,11 @@ void addStartBenchmarks()
         "Bare is a process without any code of the host's own: the registry's file opened with the host's "
         "settings, the bundle mapped lazily with all libraries that it needs, its entry point called with a "
         "message that does nothing. Most of the difference is the toolkit's own start (its character sets, "
-        "its bundles), which "
-        "mapping a library does not begin.");
+        "its bundles), which mapping a library does not begin.");
     addStart("Suite of 500, History of 10000", {500, 10'000}, 1.3,
              "Bare also reads the rows of both lists by one prepared statement in one transaction, and maps "
-             "and calls each module. Beyond the start itself the host takes time for the look "
-             "at each file before it is mapped, and for the list of what is loaded, which Modrig asks for "
-             "before each entry, which grows by one with each.");
+             "and calls each module. Beyond the start itself the host takes time to look at each "
+             "file before it is mapped, and to list what is loaded: Modrig asks for that before each entry, "
+             "and it grows by one with each.");
     addStart("History of 100000", {0, 100'000}, 1.3, "");
 }
