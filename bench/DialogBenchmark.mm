@@ -159,15 +159,15 @@ void addBenchmarks()
     for (const std::size_t files : {kFewListed, kManyListed})
         bench::measure(listing(files), kRepetitions, [files] { return listFolder(files); });
     bench::measure(naming, kRepetitions, [] { return nameFiles(kManyListed); });
-    bench::addRatio({listing(kManyListed) + " / naming them", listing(kManyListed), naming, 3});
-    bench::addRatio({"list, cost per file of 20000 / of 2000", listing(kManyListed), listing(kFewListed), 2,
+    bench::addRatio({listing(kManyListed) + " / naming them", listing(kManyListed), naming, 2.3});
+    bench::addRatio({"list, cost per file of 20000 / of 2000", listing(kManyListed), listing(kFewListed), 1.1,
                      kManyListed, kFewListed});
     for (const std::size_t entries : {kSomeRows, kManyRows})
         bench::measure(loading(entries), kRepetitions, [entries] { return loadHistory(entries); });
-    bench::addRatio({"drop, cost per file of 50 / of 10", dropping(kManyFiles), dropping(kFewFiles), 1.5,
+    bench::addRatio({"drop, cost per file of 50 / of 10", dropping(kManyFiles), dropping(kFewFiles), 1.0,
                      kManyFiles, kFewFiles});
     bench::addRatio({"load the History, cost per row of 5000 / of 500", loading(kManyRows),
-                     loading(kSomeRows), 1.5, kManyRows, kSomeRows});
+                     loading(kSomeRows), 1.05, kManyRows, kSomeRows});
 }
 } // namespace
 

@@ -1,36 +1,30 @@
 #include <tessel/tsresbuf.h>
 
-#include <new>
+#include <cwchar>
+#include <memory>
 #include <string_view>
 
 namespace
 {
-// Where a list puts a text: after the buffer, in the same block of memory. Whoever asks for what is loaded
-// gets a buffer for every module, and has a Suite of hundreds ask as often.
-wchar_t* placeForText(TsResultBuffer* buffer)
+wchar_t* copyText(std::wstring_view text)
 {
-    return reinterpret_cast<wchar_t*>(buffer + 1);
-}
-
-TsResultBuffer* blockFor(std::wstring_view text)
-{
-    void* const block = operator new(sizeof(TsResultBuffer) + (text.size() + 1) * sizeof(wchar_t));
-    auto* const buffer = new (block) TsResultBuffer;
-    buffer->value.string = placeForText(buffer);
-    text.copy(buffer->value.string, text.size());
-    buffer->value.string[text.size()] = L'\0';
-    return buffer;
+    auto* copy = new wchar_t[text.size() + 1];
+    std::wmemcpy(copy, text.data(), text.size());
+    copy[text.size()] = L'\0';
+    return copy;
 }
 
 TsResultBuffer* newBuffer(const TsRbValue& value)
 {
-    TsResultBuffer* const buffer = blockFor(value.text() ? value.text() : L"");
+    auto buffer = std::make_unique<TsResultBuffer>();
     buffer->next = nullptr;
     buffer->type = value.type();
+    buffer->value.real = 0;
     switch (value.type())
     {
     case TS_STRING:
-        break; // lies in its place
+        buffer->value.string = copyText(value.text() ? value.text() : L"");
+        break;
     case TS_SHORT:
         buffer->value.shortNumber = static_cast<std::int16_t>(value.number());
         break;
@@ -41,10 +35,9 @@ TsResultBuffer* newBuffer(const TsRbValue& value)
         buffer->value.real = value.real();
         break;
     default: // truth values carry nothing else
-        buffer->value.real = 0;
         break;
     }
-    return buffer;
+    return buffer.release();
 }
 } // namespace
 
@@ -64,11 +57,10 @@ int tsutRelRb(TsResultBuffer* list)
 {
     while (list)
     {
-        TsResultBuffer* const buffer = list;
+        const std::unique_ptr<TsResultBuffer> buffer(list);
         list = list->next;
-        if (buffer->type == TS_STRING && buffer->value.string != placeForText(buffer))
-            delete[] buffer->value.string; // that of somebody who has put another text there
-        operator delete(buffer);
+        if (buffer->type == TS_STRING)
+            delete[] buffer->value.string;
     }
     return TS_NORMAL;
 }

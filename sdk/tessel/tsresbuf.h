@@ -14,7 +14,7 @@ struct TsResultBuffer
         double real;
         std::int16_t shortNumber;
         std::int32_t longNumber;
-        wchar_t* string; // owned by the buffer; what is put in its place is made with new[]
+        wchar_t* string; // owned by the buffer, made with new[]
     } value;
 };
 
