@@ -77,10 +77,11 @@ CommandRunner::CommandRunner(const CommandStack& commands, CommandLine& commandL
 
 bool CommandRunner::run(std::wstring_view line)
 {
-    const CommandStack::Arguments parts = splitLine(line);
+    const TypedLine typed = takeApart(line);
+    const CommandStack::Arguments parts = typed.allParts();
     if (parts.empty())
         return true;
-    if (const TypedLine typed = takeApart(line); typed.last.isInQuotes)
+    if (typed.last.isInQuotes)
         mCommandLine.warn(
             translated(L"The last quote in the line is not closed. What follows it was taken as {}.",
                        asPart(typed.last.text)));

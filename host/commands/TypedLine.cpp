@@ -36,12 +36,17 @@ TypedLine takeApart(std::wstring_view line)
     return taken;
 }
 
+std::vector<std::wstring> TypedLine::allParts() const
+{
+    std::vector<std::wstring> all = parts;
+    if (!last.typed.empty())
+        all.push_back(last.text);
+    return all;
+}
+
 std::vector<std::wstring> splitLine(std::wstring_view line)
 {
-    TypedLine taken = takeApart(line);
-    if (!taken.last.typed.empty())
-        taken.parts.push_back(std::move(taken.last.text));
-    return std::move(taken.parts);
+    return takeApart(line).allParts();
 }
 
 bool isForPrograms(std::wstring_view line)

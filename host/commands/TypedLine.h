@@ -21,12 +21,15 @@ struct TypedLine
 {
     std::vector<std::wstring> parts; // those before
     OpenPart last;
+
+    // As a command gets them.
+    std::vector<std::wstring> allParts() const;
 };
 
-// The parts look into the line.
+// `typed` looks into the line.
 TypedLine takeApart(std::wstring_view line);
 
-// All of its parts, as a command gets them.
+// All of its parts at once.
 std::vector<std::wstring> splitLine(std::wstring_view line);
 
 // Whether the command in the line is asked to answer a program, as one JSON document: by --json at its end.
