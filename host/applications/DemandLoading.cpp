@@ -10,6 +10,7 @@
 #include "host/applications/ApplicationFiles.h"
 #include "host/applications/ApplicationRecords.h"
 #include "host/applications/DynamicLinker.h"
+#include "host/commands/CommandStack.h"
 #include "host/platform/RealPath.h"
 #include "host/text/Translation.h"
 #include "host/text/Unicode.h"
@@ -18,8 +19,6 @@ namespace tessel
 {
 namespace
 {
-constexpr wchar_t kGlobalNameMark = L'_';
-
 // Not there, and not merely out of reach.
 bool isGone(const std::wstring& module)
 {

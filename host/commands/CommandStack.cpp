@@ -18,9 +18,6 @@ namespace tessel
 {
 namespace
 {
-// The global name may be typed with this in front, whatever language the local names are in.
-constexpr wchar_t kGlobalNameMark = L'_';
-
 bool isName(const wchar_t* text)
 {
     const std::wstring_view name = text ? text : L"";

@@ -18,6 +18,9 @@ namespace tessel
 class CallingApplication;
 struct CommandText;
 
+// The global name may be typed with this in front, whatever language the local names are in.
+inline constexpr wchar_t kGlobalNameMark = L'_';
+
 class CommandStack : public TsEdCommandStack
 {
 public:
