@@ -26,7 +26,7 @@ constexpr std::size_t kMostSegments = 128;    // linkers write about a dozen
 constexpr std::uint64_t kSmallestPage = 4096; // the smallest page that segments are laid out for
 
 constexpr auto kNoLibrary = Sentence(L"it is not a shared library");
-constexpr auto kProgram = Sentence(L"it is a program, not a shared library");
+constexpr auto kIsProgram = Sentence(L"it is a program, not a shared library");
 constexpr auto kObjectFile = Sentence(L"it is an object file, not a shared library");
 constexpr auto kOtherMachine = Sentence(L"it is built for another kind of processor");
 constexpr auto kCutShort = Sentence(L"the file is cut short");
@@ -62,7 +62,7 @@ Result<> checkKind(const Header& header)
     if (!sameMachine)
         return refused(kOtherMachine);
     if (header.e_type == ET_EXEC)
-        return refused(kProgram);
+        return refused(kIsProgram);
     if (header.e_type == ET_REL)
         return refused(kObjectFile);
     return header.e_type == ET_DYN ? Result<>() : refused(kNoLibrary);
@@ -177,7 +177,7 @@ Result<> checkSegments(std::span<const Segment> segments, std::uint64_t fileSize
         return std::ranges::count(segments, type, &Segment::p_type);
     };
     if (count(PT_INTERP) > 0)
-        return refused(kProgram);
+        return refused(kIsProgram);
     if (auto checked = checkLoadedSegments(segments, fileSize); !checked)
         return checked;
     const bool partsAreSound =

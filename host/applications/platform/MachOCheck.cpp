@@ -18,7 +18,7 @@ namespace
 constexpr std::uint32_t kMostArchitectures = 32;
 
 constexpr auto kNoLibrary = Sentence(L"it is not a shared library");
-constexpr auto kProgram = Sentence(L"it is a program, not a shared library");
+constexpr auto kIsProgram = Sentence(L"it is a program, not a shared library");
 constexpr auto kOtherMachine = Sentence(L"it is built for another kind of processor");
 constexpr auto kCutShort = Sentence(L"the file is cut short");
 constexpr auto kDamaged = Sentence(L"its program headers are damaged");
@@ -40,7 +40,7 @@ Result<> checkKind(const mach_header_64& header)
     if (header.cputype != ownProcessor())
         return refused(kOtherMachine);
     if (header.filetype == MH_EXECUTE)
-        return refused(kProgram);
+        return refused(kIsProgram);
     return header.filetype == MH_BUNDLE || header.filetype == MH_DYLIB ? Result<>() : refused(kNoLibrary);
 }
 
