@@ -18,7 +18,6 @@
 #include "host/app/TerminalWindow.h"
 #include "host/app/WindowBox.h"
 #include "host/app/platform/Terminal.h"
-#include "host/commands/CommandRunner.h"
 #include "host/commands/LastWords.h"
 #include "host/commands/TypedLine.h"
 #include "host/console/Colours.h"

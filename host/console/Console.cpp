@@ -1,12 +1,11 @@
 #include "host/console/Console.h"
-#include "host/commands/TypedLine.h"
 
 #include <cstdint>
 #include <optional>
 #include <sstream>
 #include <utility>
 
-#include "host/commands/CommandRunner.h"
+#include "host/commands/TypedLine.h"
 #include "host/console/LineEditor.h"
 #include "host/console/TypedHistory.h"
 #include "host/messages/Questions.h"

@@ -1,5 +1,6 @@
 #include "host/applications/platform/ElfMappings.h"
 
+#include <algorithm>
 #include <array>
 #include <charconv>
 #include <cstdint>
