@@ -11,6 +11,7 @@
 #include <unistd.h>
 
 #include "host/commands/RunningMarker.h"
+#include "host/text/ControlCharacters.h"
 #include "host/text/Running.h"
 #include "host/text/Translation.h"
 #include "host/text/Unicode.h"
@@ -27,20 +28,11 @@ alignas(16) std::array<char, std::size_t{64} << 10> theStack;
 // A signal handler can be given nothing. Written before the handlers are in place.
 std::array<struct sigaction, NSIG> theFormer;
 
-// What a file is called must not steer the terminal. Of what lies beyond ASCII some take the characters from
-// U+0080 to U+009F for an escape and a letter, and others each byte of these for a character; a name need not
-// be text.
-bool isOrder(char32_t code)
-{
-    constexpr char32_t kDelete = 0x7F;
-    constexpr char32_t kLastControl = 0x9F;
-    return code < U' ' || (code >= kDelete && code <= kLastControl);
-}
-
 // A line in pieces, made without memory of the system.
 class Line
 {
 public:
+    // What a file is called must not steer the terminal, and need not be text.
     void add(std::string_view text)
     {
         text = text.substr(0, mBytes.size() - 1 - mLength);
@@ -48,7 +40,7 @@ public:
         {
             const std::size_t start = at;
             const auto code = takeUtf8(text, at);
-            const bool isShown = code && !isOrder(*code);
+            const bool isShown = code && !isControl(*code);
             for (const char byte : text.substr(start, at - start))
                 mBytes[mLength++] = isShown ? byte : '?';
         }

@@ -2,6 +2,7 @@
 
 #include <boost/locale/encoding_utf.hpp>
 
+#include "host/text/ControlCharacters.h"
 #include "host/text/Unicode.h"
 
 namespace tessel::json
@@ -10,15 +11,13 @@ namespace
 {
 using boost::locale::conv::utf_to_utf;
 
-constexpr wchar_t kDelete = 0x7F;
-constexpr wchar_t kLastControl = 0x9F;
 constexpr wchar_t kFirstPrivateByte = 0x10FE00;
 constexpr int kOnOneLine = -1;
 constexpr bool kInAscii = true;
 
 bool standsForItself(wchar_t character)
 {
-    return character < kDelete || (character > kLastControl && character < kFirstPrivateByte);
+    return !isControl(static_cast<char32_t>(character)) && character < kFirstPrivateByte;
 }
 
 // With a private character as its four bytes, and not as the byte that it stands for, which would be no

@@ -1,5 +1,6 @@
 #include "host/text/TerminalText.h"
 
+#include "host/text/ControlCharacters.h"
 #include "host/text/Credentials.h"
 #include "host/text/Hexadecimal.h"
 #include "host/text/Unicode.h"
@@ -8,15 +9,9 @@ namespace tessel
 {
 namespace
 {
-constexpr wchar_t kDelete = 0x7F;
-constexpr wchar_t kLastControl =
-    0x9F; // those from U+0080 are what some terminals take for an escape and a letter
-
 bool isOrder(wchar_t character)
 {
-    const bool isControl =
-        (character >= 0 && character < L' ') || (character >= kDelete && character <= kLastControl);
-    return isControl && character != L'\n' && character != L'\t';
+    return isControl(static_cast<char32_t>(character)) && character != L'\n' && character != L'\t';
 }
 } // namespace
 
