@@ -3,11 +3,11 @@
 #include <tessel/tsed.h>
 
 #include <algorithm>
-#include <cwchar>
 #include <string_view>
 #include <system_error>
 
 #include "host/registry/SystemVariables.h"
+#include "host/text/CallersBuffer.h"
 #include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
@@ -74,8 +74,5 @@ int tsedFindFile(const wchar_t* name, wchar_t* found, std::size_t capacity)
         return TS_ERROR;
     const auto path = files->find(tessel::toUtf8(name));
     const std::wstring text = path ? tessel::toWide(path->string()) : std::wstring();
-    if (text.empty() || text.size() + 1 > capacity)
-        return TS_ERROR;
-    std::wmemcpy(found, text.c_str(), text.size() + 1);
-    return TS_NORMAL;
+    return !text.empty() && tessel::copyWhole(text, found, capacity) ? TS_NORMAL : TS_ERROR;
 }

@@ -2,10 +2,10 @@
 #include <unistd.h>
 #include <wincompat/winfile.h>
 
-#include <cwchar>
 #include <filesystem>
 #include <system_error>
 
+#include "host/text/CallersBuffer.h"
 #include "host/text/Unicode.h"
 
 DWORD GetFileAttributesW(const wchar_t* path)
@@ -26,8 +26,6 @@ DWORD GetCurrentDirectory(DWORD capacity, wchar_t* buffer)
     const std::wstring folder = tessel::toWide(std::filesystem::current_path(failed).string());
     if (failed)
         return 0;
-    if (!buffer || folder.size() + 1 > capacity)
-        return static_cast<DWORD>(folder.size() + 1);
-    std::wmemcpy(buffer, folder.c_str(), folder.size() + 1);
-    return static_cast<DWORD>(folder.size());
+    const bool copied = buffer && tessel::copyWhole(folder, buffer, capacity);
+    return static_cast<DWORD>(copied ? folder.size() : folder.size() + 1);
 }

@@ -2,10 +2,8 @@
 
 #include <tessel/tsdefs.h>
 
-#include <algorithm>
 #include <cerrno>
 #include <cstdint>
-#include <cwchar>
 #include <system_error>
 
 #include "host/files/Download.h"
@@ -15,6 +13,7 @@
 #include "host/platform/OrdinaryFile.h"
 #include "host/platform/PartFile.h"
 #include "host/platform/PrivateFolder.h"
+#include "host/text/CallersBuffer.h"
 #include "host/text/Running.h"
 #include "host/text/Translation.h"
 #include "host/text/Unicode.h"
@@ -203,13 +202,7 @@ bool RemoteFiles::IsRemoteFile(const wchar_t* localPath, wchar_t* url, std::size
     const std::string address = canBeTrusted(file) ? originIn(folder) : std::string();
     if (address.empty() || file.filename() != fileNameOf(address))
         return false;
-    const std::wstring origin = toWide(address);
-    if (url && capacity > 0)
-    {
-        const std::size_t copied = std::min(origin.size(), capacity - 1);
-        std::wmemcpy(url, origin.data(), copied);
-        url[copied] = L'\0';
-    }
+    copyCut(toWide(address), url, capacity);
     return true;
 }
 } // namespace tessel

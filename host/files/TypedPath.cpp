@@ -2,10 +2,10 @@
 
 #include <tessel/tsed.h>
 
-#include <cwchar>
 #include <system_error>
 
 #include "host/platform/HomeFolder.h"
+#include "host/text/CallersBuffer.h"
 #include "host/text/Unicode.h"
 
 namespace tessel
@@ -58,8 +58,5 @@ int tsedTypedPath(const wchar_t* typed, wchar_t* path, std::size_t capacity)
         return TS_ERROR;
     const auto whole = tessel::wholePath(tessel::toUtf8(typed));
     const std::wstring text = whole ? tessel::toWide(whole->native()) : std::wstring();
-    if (text.empty() || text.size() + 1 > capacity)
-        return TS_ERROR;
-    std::wmemcpy(path, text.c_str(), text.size() + 1);
-    return TS_NORMAL;
+    return !text.empty() && tessel::copyWhole(text, path, capacity) ? TS_NORMAL : TS_ERROR;
 }

@@ -1,11 +1,11 @@
 // The functions of the SDK that ask.
 #include <tessel/tsask.h>
 
-#include <algorithm>
 #include <filesystem>
 
 #include "host/messages/Answers.h"
 #include "host/messages/Questions.h"
+#include "host/text/CallersBuffer.h"
 #include "host/text/Running.h"
 #include "host/text/Translation.h"
 #include "host/text/Unicode.h"
@@ -13,6 +13,7 @@
 namespace
 {
 using tessel::Failure;
+using tessel::hasRoom;
 using tessel::Questions;
 using tessel::Result;
 using tessel::translated;
@@ -29,19 +30,12 @@ std::optional<std::wstring> orNothing(const wchar_t* text)
     return text ? std::optional<std::wstring>(text) : std::nullopt;
 }
 
-bool hasRoom(const std::wstring& text, std::size_t capacity)
-{
-    return text.size() < capacity;
-}
-
 Result<> copyInto(const std::wstring& text, wchar_t* buffer, std::size_t capacity)
 {
-    if (!hasRoom(text, capacity))
-        return Failure{translatedByCount(capacity - 1,
-                                         L"This is too long: at most {} character can be taken.",
-                                         L"This is too long: at most {} characters can be taken.")};
-    *std::ranges::copy(text, buffer).out = L'\0';
-    return {};
+    if (tessel::copyWhole(text, buffer, capacity))
+        return {};
+    return Failure{translatedByCount(capacity - 1, L"This is too long: at most {} character can be taken.",
+                                     L"This is too long: at most {} characters can be taken.")};
 }
 
 // The person's own words, or the English ones, which scripts have.

@@ -2,9 +2,9 @@
 #include <wincompat/winreg.h>
 
 #include <cstring>
-#include <cwchar>
 
 #include "host/registry/LayeredRegistry.h"
+#include "host/text/CallersBuffer.h"
 #include "host/text/Running.h"
 #include "host/text/Unicode.h"
 
@@ -38,12 +38,6 @@ const wchar_t* orEmpty(const wchar_t* text)
 LONG notFound(const LayeredRegistry& registry)
 {
     return registry.own().mayHaveMissed() ? ERROR_READ_FAULT : ERROR_FILE_NOT_FOUND;
-}
-
-void copyText(const std::wstring& text, wchar_t* buffer, std::size_t capacity)
-{
-    if (buffer && capacity > 0)
-        buffer[text.copy(buffer, capacity - 1)] = L'\0';
 }
 
 LONG copyData(const std::wstring& data, void* buffer, DWORD* size)
@@ -103,9 +97,8 @@ LONG RegEnumValueW(HKEY key, DWORD index, wchar_t* name, DWORD* nameLength, DWOR
     const auto found = target.registry->valueName(target.key, index);
     if (!found)
         return found.code();
-    if (found->size() + 1 > *nameLength)
+    if (!tessel::copyWhole(*found, name, *nameLength))
         return ERROR_MORE_DATA;
-    std::wmemcpy(name, found->c_str(), found->size() + 1);
     *nameLength = static_cast<DWORD>(found->size());
     return type || dataSize ? tsRegGetValue(key, found->c_str(), 0, type, data, dataSize) : ERROR_SUCCESS;
 }
@@ -154,7 +147,7 @@ bool tsRegIsLaidDown(HKEY key, const wchar_t* name, wchar_t* place, std::size_t 
     const Target target = targetOf(key);
     const auto file = target ? target.registry->laidDownIn(target.key, orEmpty(name)) : std::nullopt;
     if (file)
-        copyText(tessel::toWide(file->native()), place, capacity);
+        tessel::copyCut(tessel::toWide(file->native()), place, capacity);
     return file.has_value();
 }
 
@@ -163,6 +156,6 @@ bool tsRegMayHaveMissed(const wchar_t* path, const wchar_t* name, wchar_t* reaso
     LayeredRegistry* registry = tessel::running<LayeredRegistry>();
     if (!registry || !registry->mayHaveMissed(orEmpty(path), orEmpty(name)))
         return false;
-    copyText(registry->own().takeReason(), reason, capacity);
+    tessel::copyCut(registry->own().takeReason(), reason, capacity);
     return true;
 }

@@ -6,6 +6,8 @@
 #include <string>
 #include <string_view>
 
+#include "host/text/CallersBuffer.h"
+
 namespace
 {
 // Numbers are padded no wider than this: a format may come from a file's name, and must not fill the memory.
@@ -204,11 +206,6 @@ std::size_t tsutFormatArguments(wchar_t* buffer, std::size_t capacity, const wch
                                 const TsFormatArgument* arguments, std::size_t count)
 {
     const std::wstring text = formatAll(format ? format : L"", arguments, count);
-    if (buffer && capacity > 0)
-    {
-        const std::size_t copied = std::min(text.size(), capacity - 1);
-        std::wmemcpy(buffer, text.data(), copied);
-        buffer[copied] = L'\0';
-    }
+    tessel::copyCut(text, buffer, capacity);
     return text.size();
 }
