@@ -2,7 +2,7 @@
 
 #include <array>
 #include <cerrno>
-#include <optional>
+#include <csignal>
 #include <utility>
 
 #include <fcntl.h>
@@ -21,31 +21,47 @@ namespace
 {
 constexpr char kNowhere[] = "/dev/null";
 
-class ProgramStart
+class NewProgram
 {
 public:
-    ProgramStart()
+    NewProgram()
     {
         posix_spawn_file_actions_init(&mFiles);
         posix_spawnattr_init(&mAttributes);
-        posix_spawnattr_setflags(&mAttributes, POSIX_SPAWN_SETSID);
     }
-    ~ProgramStart()
+    ~NewProgram()
     {
         posix_spawnattr_destroy(&mAttributes);
         posix_spawn_file_actions_destroy(&mFiles);
     }
-    ProgramStart(const ProgramStart&) = delete;
-    ProgramStart& operator=(const ProgramStart&) = delete;
+    NewProgram(const NewProgram&) = delete;
+    NewProgram& operator=(const NewProgram&) = delete;
 
+    void readFrom(int descriptor) { posix_spawn_file_actions_adddup2(&mFiles, descriptor, STDIN_FILENO); }
     void writeTo(int descriptor) { posix_spawn_file_actions_adddup2(&mFiles, descriptor, STDOUT_FILENO); }
     void writeNowhere() { posix_spawn_file_actions_addopen(&mFiles, STDOUT_FILENO, kNowhere, O_WRONLY, 0); }
 
-    // Nothing when there is no such program. To be called once, with the output settled.
-    std::optional<pid_t> start(ProgramWords words)
+    void leaveTheTerminal()
     {
+        posix_spawnattr_setflags(&mAttributes, POSIX_SPAWN_SETSID);
         posix_spawn_file_actions_addopen(&mFiles, STDIN_FILENO, kNowhere, O_RDONLY, 0);
         posix_spawn_file_actions_addopen(&mFiles, STDERR_FILENO, kNowhere, O_WRONLY, 0);
+    }
+
+    // The signals that the host does without are as they usually are.
+    void shareTheTerminal()
+    {
+        sigset_t usual;
+        sigemptyset(&usual);
+        for (const int signal : {SIGINT, SIGQUIT, SIGPIPE, SIGXFSZ})
+            sigaddset(&usual, signal);
+        posix_spawnattr_setsigdefault(&mAttributes, &usual);
+        posix_spawnattr_setflags(&mAttributes, POSIX_SPAWN_SETSIGDEF);
+    }
+
+    // Nothing when there is no such program. To be called once, with all of the above settled.
+    std::optional<pid_t> start(ProgramWords words)
+    {
         std::vector<char*> pointers;
         for (std::string& word : words)
             pointers.push_back(word.data());
@@ -78,19 +94,23 @@ std::string readToEnd(const Descriptor& output)
     return text;
 }
 
-void waitForEnd(pid_t process)
+// As `waitpid` has it.
+int statusAtEndOf(pid_t process)
 {
-    while (waitpid(process, nullptr, 0) < 0 && errno == EINTR)
+    int status = 0;
+    while (waitpid(process, &status, 0) < 0 && errno == EINTR)
         continue;
+    return status;
 }
 } // namespace
 
 bool startProgram(ProgramWords words)
 {
     std::erase_if(startedPrograms(), [](pid_t process) { return waitpid(process, nullptr, WNOHANG) != 0; });
-    ProgramStart start;
-    start.writeNowhere();
-    const auto process = start.start(std::move(words));
+    NewProgram program;
+    program.writeNowhere();
+    program.leaveTheTerminal();
+    const auto process = program.start(std::move(words));
     if (process)
         startedPrograms().push_back(*process);
     return process.has_value();
@@ -101,14 +121,32 @@ std::string outputOfProgram(ProgramWords words)
     auto pipe = openPipe();
     if (!pipe)
         return "";
-    ProgramStart start;
-    start.writeTo(pipe->input.number());
-    const auto process = start.start(std::move(words));
+    NewProgram program;
+    program.writeTo(pipe->input.number());
+    program.leaveTheTerminal();
+    const auto process = program.start(std::move(words));
     if (!process)
         return "";
     pipe->input = Descriptor(-1); // otherwise the output would not end
     const std::string text = readToEnd(pipe->output);
-    waitForEnd(*process);
+    statusAtEndOf(*process);
     return text;
+}
+
+std::optional<int> showByProgram(ProgramWords words, std::string_view text)
+{
+    auto pipe = openPipe();
+    if (!pipe)
+        return std::nullopt;
+    NewProgram program;
+    program.shareTheTerminal();
+    program.readFrom(pipe->output.number());
+    const auto process = program.start(std::move(words));
+    pipe->output = Descriptor(-1); // otherwise nobody would learn that the program reads no more
+    if (!process)
+        return std::nullopt;
+    static_cast<void>(pipe->input.write(text)); // who leaves early has read enough
+    pipe->input = Descriptor(-1);
+    return statusAtEndOf(*process);
 }
 } // namespace tessel

@@ -2,7 +2,9 @@
 
 #include <gtest/gtest.h>
 
+#include <csignal>
 #include <sstream>
+#include <string>
 
 #include <fcntl.h>
 #include <sys/wait.h>
@@ -12,6 +14,26 @@
 #include "tests/support/TemporaryFolder.h"
 
 using tessel::outputOfProgram;
+using tessel::showByProgram;
+
+namespace
+{
+struct Process
+{
+    pid_t number = 0;
+    pid_t session = 0;
+};
+
+Process processIn(const std::string& stat)
+{
+    std::istringstream facts(stat);
+    Process process;
+    std::string between; // name, state, parent and group
+    facts >> process.number >> between >> between >> between >> between >> process.session;
+    EXPECT_TRUE(facts) << stat;
+    return process;
+}
+} // namespace
 
 TEST(Programs, GetTheirArgumentsAsTheyAre)
 {
@@ -43,18 +65,40 @@ TEST(Programs, HaveNothingToReadAndComplainToNobody)
 
 TEST(Programs, RunInASessionOfTheirOwn)
 {
-    std::istringstream facts(outputOfProgram({"cat", "/proc/self/stat"}));
-    std::string process;
-    std::string word;
-    std::string session;
-    facts >> process >> word >> word >> word >> word >>
-        session; // name, state, parent and group stand between
-    EXPECT_FALSE(process.empty());
-    EXPECT_EQ(session, process);
+    const Process process = processIn(outputOfProgram({"cat", "/proc/self/stat"}));
+    EXPECT_EQ(process.session, process.number);
 }
 
 TEST(Programs, ThatAreNotThereWriteNothing)
 {
     EXPECT_EQ(outputOfProgram({"no-such-program-anywhere"}), "");
     EXPECT_FALSE(tessel::startProgram({"no-such-program-anywhere"}));
+}
+
+TEST(Programs, ThatShowATextReadItAndWriteWhereWeDo)
+{
+    testing::internal::CaptureStdout();
+    const auto status = showByProgram({"sed", "s/^/shown: /"}, "a text\n");
+    EXPECT_EQ(testing::internal::GetCapturedStdout(), "shown: a text\n");
+    EXPECT_EQ(status, 0);
+}
+
+TEST(Programs, ThatShowATextStayAtOurTerminal)
+{
+    testing::internal::CaptureStdout();
+    showByProgram({"cat", "/proc/self/stat"}, "");
+    EXPECT_EQ(processIn(testing::internal::GetCapturedStdout()).session, getsid(0));
+}
+
+TEST(Programs, ThatShowATextEndAsTheyDo)
+{
+    EXPECT_EQ(WEXITSTATUS(showByProgram({"sh", "-c", "exit 3"}, "").value_or(0)), 3);
+    EXPECT_EQ(showByProgram({"no-such-program-anywhere"}, ""), std::nullopt);
+}
+
+TEST(Programs, ThatShowATextEndByASignalThatWeIgnore)
+{
+    const auto before = std::signal(SIGINT, SIG_IGN);
+    EXPECT_EQ(WTERMSIG(showByProgram({"sh", "-c", "kill -INT $$; exit 3"}, "").value_or(0)), SIGINT);
+    std::signal(SIGINT, before);
 }
