@@ -4,11 +4,11 @@
 #include <unistd.h>
 
 #include <cstdio>
-#include <ctime>
 #include <filesystem>
 #include <map>
 
 #include "bench/Counting.h"
+#include "bench/ProcessorTime.h"
 
 namespace bench
 {
@@ -27,13 +27,6 @@ std::map<double, double>& instructionsBySeconds()
 {
     static std::map<double, double> all;
     return all;
-}
-
-double processorSeconds()
-{
-    timespec now = {};
-    clock_gettime(CLOCK_PROCESS_CPUTIME_ID, &now);
-    return static_cast<double>(now.tv_sec) + static_cast<double>(now.tv_nsec) * 1e-9;
 }
 
 double remembered(const Cost& cost)

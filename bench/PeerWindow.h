@@ -5,12 +5,13 @@
 
 #include <cstdio>
 #include <cstdlib>
-#include <ctime>
 #include <fstream>
 #include <string>
 #include <vector>
 
 #include <sys/types.h>
+
+#include "bench/ProcessorTime.h"
 
 namespace bench
 {
@@ -21,22 +22,6 @@ inline std::vector<std::string> linesOf(const char* file)
     for (std::string line; std::getline(input, line);)
         lines.push_back(line);
     return lines;
-}
-
-// Of the process 0, this one, or of another.
-inline double processorSecondsOf(pid_t process)
-{
-    clockid_t clock = 0;
-    timespec spent = {};
-    if (clock_getcpuclockid(process, &clock) != 0 || clock_gettime(clock, &spent) != 0)
-        return 0;
-    return static_cast<double>(spent.tv_sec) + static_cast<double>(spent.tv_nsec) * 1e-9;
-}
-
-// Processor time so far, that of the display included where its process is known.
-inline double processorSeconds(pid_t display)
-{
-    return processorSecondsOf(0) + (display > 0 ? processorSecondsOf(display) : 0);
 }
 
 inline constexpr int kPeerWidth = 640;

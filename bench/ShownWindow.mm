@@ -6,6 +6,7 @@
 #include <X11/Xlib.h>
 
 #include "bench/PeerWindow.h"
+#include "bench/ProcessorTime.h"
 #include "modrig/dialogs/Paths.h"
 #include "modrig/dialogs/TableRows.h"
 #include "modrig/lists/ListMembership.h"
