@@ -15,9 +15,9 @@
 #include <fstream>
 #include <iterator>
 #include <sstream>
-#include <stdexcept>
 #include <vector>
 
+#include "bench/TemporaryFolder.h"
 #include "tests/support/ProgramArguments.h"
 
 namespace bench
@@ -53,30 +53,6 @@ int openCounter()
     return static_cast<int>(
         syscall(SYS_perf_event_open, &wanted, kThisProcess, kAnyProcessor, kNoGroup, PERF_FLAG_FD_CLOEXEC));
 }
-
-class TemporaryFolder
-{
-public:
-    TemporaryFolder()
-    {
-        std::string name = (fs::temp_directory_path() / "modrig-bench-count-XXXXXX").string();
-        if (!mkdtemp(name.data()))
-            throw std::runtime_error("cannot make a folder for what Valgrind counts");
-        mPath = name;
-    }
-    ~TemporaryFolder()
-    {
-        std::error_code ignored; // what cannot be removed is the system's to clean
-        fs::remove_all(mPath, ignored);
-    }
-    TemporaryFolder(const TemporaryFolder&) = delete;
-    TemporaryFolder& operator=(const TemporaryFolder&) = delete;
-
-    const fs::path& path() const { return mPath; }
-
-private:
-    fs::path mPath;
-};
 
 std::vector<std::string> ownArguments()
 {
@@ -180,8 +156,8 @@ std::optional<double> InstructionCounter::stop()
 
 std::optional<double> countByValgrind(const std::string& benchmark)
 {
-    const TemporaryFolder counts;
-    const TemporaryFolder words;
+    const TemporaryFolder counts("modrig-bench-count");
+    const TemporaryFolder words("modrig-bench-count");
     const std::string log = words.path() / "log";
     const bool endedWell = runUnderValgrind(benchmark, counts.path(), log);
     const double count = sumOfCounts(counts.path());

@@ -1,41 +1,15 @@
 #include "bench/Session.h"
 
-#include <cstdlib>
-#include <memory>
 #include <stdexcept>
 #include <string>
-#include <system_error>
 
+#include "bench/TemporaryFolder.h"
 #include "host/app/Host.h"
 
 namespace bench
 {
 namespace
 {
-class WorkFolder
-{
-public:
-    WorkFolder()
-    {
-        std::string name = (std::filesystem::temp_directory_path() / "modrig-bench-XXXXXX").string();
-        if (!mkdtemp(name.data()))
-            throw std::runtime_error("cannot make a folder for the benchmarks");
-        mPath = name;
-    }
-    ~WorkFolder()
-    {
-        std::error_code ignored; // what cannot be removed is the system's to clean
-        std::filesystem::remove_all(mPath, ignored);
-    }
-    WorkFolder(const WorkFolder&) = delete;
-    WorkFolder& operator=(const WorkFolder&) = delete;
-
-    const std::filesystem::path& path() const { return mPath; }
-
-private:
-    std::filesystem::path mPath;
-};
-
 tessel::Host& host()
 {
     static tessel::Host running({.profileFolder = workFolder() / "profile", .safe = true, .output = [](auto) {
@@ -46,7 +20,7 @@ tessel::Host& host()
 
 const std::filesystem::path& workFolder()
 {
-    static WorkFolder folder;
+    static const TemporaryFolder folder("modrig-bench");
     return folder.path();
 }
 
