@@ -67,11 +67,6 @@ private:
     bool mReady = false;
 };
 
-std::string nameOf(std::size_t number)
-{
-    return std::to_string(number) + "History";
-}
-
 std::string foldOf(std::size_t number)
 {
     return std::to_string(number) + "history";
@@ -111,13 +106,13 @@ bool removeAll(const Store& store, std::size_t count)
     return all;
 }
 
-bool insertAll(const Store& store, std::size_t count, std::string (*pathOf)(std::size_t))
+bool insertAll(const Store& store, std::size_t count, PathOf pathOf)
 {
     Query insert(store, "INSERT INTO value(key, name, fold, data, sum) VALUES(?1, ?2, ?3, ?4, ?1)");
     bool all = true;
     for (std::size_t number = 1; number <= count; ++number)
     {
-        const std::string name = nameOf(number);
+        const std::string name = entryName(number);
         const std::string fold = foldOf(number);
         const std::string path = pathOf(number - 1);
         insert.bind(1, 1);
@@ -150,12 +145,6 @@ bool readAll(Store& store, std::size_t count)
 }
 } // namespace
 
-bool readBare(const std::filesystem::path& registry, std::size_t count)
-{
-    Store store(registry, SQLITE_OPEN_READONLY);
-    return readAll(store, count);
-}
-
 bool makeBare(const std::filesystem::path& registry, const std::filesystem::path& file)
 {
     std::filesystem::remove(file);
@@ -185,7 +174,7 @@ bool BareStore::read(std::size_t count)
     return readAll(*mConnection, count);
 }
 
-bool BareStore::write(std::size_t count, bool removeFirst, std::string (*pathOf)(std::size_t))
+bool BareStore::write(std::size_t count, bool removeFirst, PathOf pathOf)
 {
     bool written = mConnection->run("PRAGMA synchronous=FULL") && mConnection->run("BEGIN IMMEDIATE");
     if (removeFirst)

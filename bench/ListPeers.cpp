@@ -14,11 +14,6 @@ namespace
 constexpr const char* kGroup = "History";
 constexpr const char* kCountName = "NumHistory";
 
-std::string nameOf(std::size_t number)
-{
-    return std::to_string(number) + "History";
-}
-
 class Settings : public QSettings
 {
 public:
@@ -48,7 +43,8 @@ bool storeByQSettings(const std::filesystem::path& file, std::size_t count, Path
     Settings settings(file);
     settings.setValue(QLatin1String(kCountName), QString::number(count));
     for (std::size_t number = 1; number <= count; ++number)
-        settings.setValue(QString::fromStdString(nameOf(number)), QString::fromStdString(pathOf(number - 1)));
+        settings.setValue(QString::fromStdString(entryName(number)),
+                          QString::fromStdString(pathOf(number - 1)));
     settings.sync();
     return settings.status() == QSettings::NoError;
 }
@@ -58,7 +54,7 @@ bool readByQSettings(const std::filesystem::path& file, std::size_t count)
     const Settings settings(file);
     std::vector<QString> list;
     for (std::size_t number = 1; number <= count; ++number)
-        list.push_back(settings.value(QString::fromStdString(nameOf(number))).toString());
+        list.push_back(settings.value(QString::fromStdString(entryName(number))).toString());
     return settings.value(QLatin1String(kCountName)).toUInt() == count && !list.back().isEmpty();
 }
 
@@ -67,7 +63,7 @@ bool storeByGKeyFile(const std::filesystem::path& file, std::size_t count, PathO
     const KeyFile keys(g_key_file_new());
     g_key_file_set_string(keys.get(), kGroup, kCountName, std::to_string(count).c_str());
     for (std::size_t number = 1; number <= count; ++number)
-        g_key_file_set_string(keys.get(), kGroup, nameOf(number).c_str(), pathOf(number - 1).c_str());
+        g_key_file_set_string(keys.get(), kGroup, entryName(number).c_str(), pathOf(number - 1).c_str());
     gsize size = 0;
     const Text text(g_key_file_to_data(keys.get(), &size, nullptr));
     constexpr auto kSafe =
@@ -84,7 +80,7 @@ bool readByGKeyFile(const std::filesystem::path& file, std::size_t count)
         return false;
     std::vector<std::string> list;
     for (std::size_t number = 1; number <= count; ++number)
-        if (const Text text{g_key_file_get_string(keys.get(), kGroup, nameOf(number).c_str(), nullptr)})
+        if (const Text text{g_key_file_get_string(keys.get(), kGroup, entryName(number).c_str(), nullptr)})
             list.emplace_back(text.get());
     return list.size() == count;
 }

@@ -3,16 +3,15 @@
 
 #include <cstddef>
 #include <filesystem>
-#include <string>
+
+#include "bench/Entries.h"
 
 namespace bench
 {
 // Each stores a list of so many numbered paths, or reads one that it has stored, in a file that it has not
-// seen before in this process. False when not all of it is stored, or there. `pathOf` answers the text of
-// each, in UTF-8.
+// seen before in this process. False when not all of it is stored, or there.
 //
 // All of them write a new file, have the system bring it to the disk, and give it the old one's name.
-using PathOf = std::string (*)(std::size_t);
 bool storeByQSettings(const std::filesystem::path& file, std::size_t count, PathOf pathOf);
 bool readByQSettings(const std::filesystem::path& file, std::size_t count);
 bool storeByGKeyFile(const std::filesystem::path& file, std::size_t count, PathOf pathOf);
