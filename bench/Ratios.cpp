@@ -19,8 +19,8 @@ namespace bench
 namespace
 {
 constexpr int kQuickRepetitions = 3;
-constexpr int kCounts =
-    3; // by Valgrind, of each benchmark: addresses differ from run to run, and instructions a little
+// By Valgrind, of each benchmark: addresses differ from run to run, and instructions a little.
+constexpr int kCounts = 3;
 const std::string kEveryBenchmark = ".";
 
 struct SourcedRatio
@@ -129,13 +129,12 @@ std::set<std::string> namesOf(const std::vector<Ratio>& wanted)
 }
 
 // Where the machine does not count, Valgrind does, for what is judged by it.
-void count(const std::vector<Ratio>& wanted, SamplesByName& samples)
+void count(std::vector<Ratio> wanted, SamplesByName& samples)
 {
-    std::set<std::string> names;
-    for (const Ratio& ratio : wanted)
-        if (ratio.by == kInstructions && !whyNothingCounts().empty())
-            names.insert({ratio.measured, ratio.base});
-    for (const std::string& name : names)
+    if (whyNothingCounts().empty())
+        return;
+    std::erase_if(wanted, [](const Ratio& ratio) { return ratio.by != kInstructions; });
+    for (const std::string& name : namesOf(wanted))
         for (int i = 0; i < repetitions(kCounts); ++i)
             if (const auto instructions = countByValgrind(name))
                 samples[name].instructions.push_back(*instructions);
@@ -144,6 +143,16 @@ void count(const std::vector<Ratio>& wanted, SamplesByName& samples)
 void run(const std::string& filter, Collector& collector)
 {
     benchmark::RunSpecifiedBenchmarks(&collector, filter);
+}
+
+void runAgain(std::vector<Ratio> wanted, const std::set<std::string>& names, Collector& collector)
+{
+    std::printf("\nWithin its wobble of its limit, so run again:\n");
+    for (const std::string& name : names)
+        std::printf("    %s\n", name.c_str());
+    run(filterFor(names), collector);
+    std::erase_if(wanted, [&](const Ratio& ratio) { return !names.contains(ratio.measured); });
+    count(wanted, collector.samples());
 }
 
 void runWanted(const std::vector<Ratio>& wanted, Collector& collector)
@@ -156,17 +165,7 @@ void runWanted(const std::vector<Ratio>& wanted, Collector& collector)
     if (wishes().quick)
         return;
     runWhileInDoubt(wanted, collector.samples(),
-                    [&](const std::set<std::string>& names)
-                    {
-                        std::printf("\nWithin its wobble of its limit, so run again:\n");
-                        for (const std::string& name : names)
-                            std::printf("    %s\n", name.c_str());
-                        run(filterFor(names), collector);
-                        std::vector<Ratio> again = wanted;
-                        std::erase_if(again,
-                                      [&](const Ratio& ratio) { return !names.contains(ratio.measured); });
-                        count(again, collector.samples());
-                    });
+                    [&](const std::set<std::string>& names) { runAgain(wanted, names, collector); });
 }
 
 Figure figureOf(const SourcedRatio& each, const SamplesByName& samples)
