@@ -62,7 +62,7 @@ void measure(const std::string& name, int usual, std::function<double()> once)
     benchmark::RegisterBenchmark(name.c_str(), run)
         ->UseManualTime()
         ->Iterations(1)
-        ->Repetitions(bench::repetitions(usual));
+        ->Repetitions(repetitions(usual));
 }
 
 double secondsInPool(const std::function<void()>& work)

@@ -8,11 +8,14 @@ namespace bench
 {
 struct Wishes
 {
-    bool quick = false; // MODRIG_BENCH_QUICK: few repetitions, and no limit is judged
-    std::string
-        only; // MODRIG_BENCH_ONLY: figures whose names hold this alone, stars as in a shell; all when empty
-    std::string results; // MODRIG_BENCH_RESULTS: the file to write the figures to, as JSON; none when empty
-    std::string count;   // MODRIG_BENCH_COUNT: the one benchmark of which Valgrind counts the instructions
+    // MODRIG_BENCH_QUICK: few repetitions, and no limit is judged.
+    bool quick = false;
+    // MODRIG_BENCH_ONLY: figures whose names hold this alone, stars as in a shell; all when empty.
+    std::string only;
+    // MODRIG_BENCH_RESULTS: the file to write the figures to, as JSON; none when empty.
+    std::string results;
+    // MODRIG_BENCH_COUNT: the one benchmark of which Valgrind counts the instructions.
+    std::string count;
 };
 
 // Read once.
