@@ -13,7 +13,7 @@ namespace tessel
 namespace
 {
 constexpr char kFileName[] = "bisection";
-constexpr std::string_view kFirstLine = "Tessel looks for the culprit, 1";
+constexpr std::string_view kFirstLineOfSearch = "Tessel looks for the culprit, 1";
 constexpr char kGood = 'g';
 constexpr char kBad = 'b';
 
@@ -54,7 +54,7 @@ Result<std::optional<Bisecting::Search>> Bisecting::read() const
     if (!*content)
         return std::optional<Search>();
     const auto lines = linesOf(**content);
-    if (lines.size() < 3 || lines[0] != kFirstLine || !areAnswers(lines[1]))
+    if (lines.size() < 3 || lines[0] != kFirstLineOfSearch || !areAnswers(lines[1]))
         return Failure{
             translated(L"The file {} is damaged; BISECT STOP ends the search that it is about.", mFile)};
     Search search;
@@ -66,7 +66,7 @@ Result<std::optional<Bisecting::Search>> Bisecting::read() const
 
 Result<> Bisecting::store(const Search& search) const
 {
-    std::string content = std::string(kFirstLine) + '\n';
+    std::string content = std::string(kFirstLineOfSearch) + '\n';
     for (const bool wasGood : search.answers)
         content += wasGood ? kGood : kBad;
     content += '\n';

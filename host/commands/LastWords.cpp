@@ -20,7 +20,7 @@ namespace tessel
 {
 namespace
 {
-constexpr int kSomethingFailed = 1;
+constexpr int kEndedInFailure = 1;
 
 // A full stack has no room for a handler.
 alignas(16) std::array<char, std::size_t{64} << 10> theStack;
@@ -141,7 +141,7 @@ void onExit()
     if (!speak(RunningMarker::kCalledExit))
         return;
     std::fflush(nullptr);
-    _exit(kSomethingFailed);
+    _exit(kEndedInFailure);
 }
 } // namespace
 

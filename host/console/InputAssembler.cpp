@@ -7,11 +7,11 @@ namespace tessel
 {
 namespace
 {
-constexpr std::wstring_view kBlanks = L" \t\r";
+constexpr std::wstring_view kBlanksInALine = L" \t\r";
 
 std::wstring_view withoutLeadingBlanks(std::wstring_view text)
 {
-    return text.substr(std::min(text.find_first_not_of(kBlanks), text.size()));
+    return text.substr(std::min(text.find_first_not_of(kBlanksInALine), text.size()));
 }
 } // namespace
 

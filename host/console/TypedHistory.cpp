@@ -37,7 +37,7 @@ bool isPlain(unsigned char byte)
     return byte > ' ' && byte != '\\' && byte != 0x7F;
 }
 
-std::string encoded(std::string_view line)
+std::string encodedLine(std::string_view line)
 {
     std::string result;
     for (const char character : line)
@@ -65,7 +65,7 @@ std::optional<char> octalByte(std::string_view text)
     return static_cast<char>((text[1] - '0') << 6 | (text[2] - '0') << 3 | (text[3] - '0'));
 }
 
-std::string decoded(std::string_view line)
+std::string decodedLine(std::string_view line)
 {
     std::string result;
     while (!line.empty())
@@ -170,7 +170,7 @@ Result<std::vector<std::wstring>> TypedHistory::read()
     if (stored.size() > kMostHistoryLines)
         stored.erase(stored.begin(), stored.end() - kMostHistoryLines);
     for (const std::string_view line : stored)
-        lines.push_back(toWide(decoded(line)));
+        lines.push_back(toWide(decodedLine(line)));
     return lines;
 }
 
@@ -184,7 +184,7 @@ Result<> TypedHistory::add(const std::wstring& line)
         return giveUp(kNotWritten, systemFailure(errno).sentence);
     if (const auto ordinary = checkOpened(file); !ordinary)
         return giveUp(kNotUsed, ordinary.sentence());
-    auto written = file.write(beginning(file.number()) + encoded(kept) + "\n");
+    auto written = file.write(beginning(file.number()) + encodedLine(kept) + "\n");
     if (written)
         written = file.close();
     return written ? written : giveUp(kNotWritten, written.sentence());

@@ -16,8 +16,8 @@ namespace tessel
 {
 namespace
 {
-constexpr std::chrono::seconds kPatience{2}; // without a word
-constexpr long kWholeFile = 200;             // of the other answers none brings the file that was asked for
+constexpr std::chrono::seconds kLongestSilence{2}; // without a word
+constexpr long kWholeFile = 200; // of the other answers none brings the file that was asked for
 
 class Sink final : public TransferWatch
 {
@@ -44,7 +44,7 @@ public:
     bool goesOn() override
     {
         stopped = interrupted.isThere();
-        if (const auto now = Clock::now(); now - told >= kPatience)
+        if (const auto now = Clock::now(); now - told >= kLongestSilence)
         {
             told = now;
             tell(received);

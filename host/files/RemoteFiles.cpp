@@ -63,7 +63,7 @@ Failure about(Sentence<2> words, const std::filesystem::path& path, const Outcom
 constexpr auto kNoFolder = Sentence<2>(L"the cache folder {} cannot be made: {}");
 constexpr auto kUnsafeFolder = Sentence<2>(L"the cache folder {} is not safe: {}");
 constexpr auto kNoOrigin = Sentence<2>(L"the cache folder {} cannot be written: {}");
-constexpr auto kNoCopy = Sentence<2>(L"the local copy {} cannot be made: {}");
+constexpr auto kNoLocalCopy = Sentence<2>(L"the local copy {} cannot be made: {}");
 
 // A folder of the cache's own: made where it is missing, and closed to others where an older version has left
 // it open.
@@ -105,7 +105,7 @@ Result<> store(PartFile& part, const std::filesystem::path& copy, const std::str
     // What an earlier fetch wrote stays: a copy without its origin would be lost.
     const bool isKnown = originIn(folder) == url && checkNobodyElseWrites(folder / kOriginFile);
     if (const auto moved = part.moveTo(copy); !moved)
-        return about(kNoCopy, copy, moved);
+        return about(kNoLocalCopy, copy, moved);
     const auto noted = isKnown ? Result<>() : replaceFile(folder / kOriginFile, url);
     if (noted)
         return noted;
@@ -168,7 +168,7 @@ Result<> RemoteFiles::fetchInto(const std::filesystem::path& copy, const RemoteA
         return prepared;
     PartFile part(mCacheFolder);
     if (!part.made())
-        return about(kNoCopy, copy, part.made());
+        return about(kNoLocalCopy, copy, part.made());
     const auto tell = [&](std::uint64_t bytes)
     {
         constexpr std::uint64_t kThousand = 1024;

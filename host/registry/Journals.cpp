@@ -177,7 +177,7 @@ Result<std::optional<std::wstring>> setForeignLogAside(const std::filesystem::pa
                                   log, failure.sentence),
                        failure.code};
     }
-    static_cast<void>(remove(indexOfLog(file).c_str()));
+    static_cast<void>(std::remove(indexOfLog(file).c_str()));
     return std::optional(
         translated(L"The registry {} is read without its log: the write-ahead log {} does not belong to it, "
                    L"but to another registry or to another state of it. It was set aside as {}.",

@@ -33,8 +33,8 @@ constexpr std::uint32_t kStringTables = 6;
 constexpr unsigned kTextsPerBlock = 16;
 constexpr std::size_t kUnitSize = 2; // a UTF-16 code unit
 
-constexpr auto kCutShort = Sentence(L"the file is cut short");
-constexpr auto kNoLibrary = Sentence(L"it is not a Windows library");
+constexpr auto kLibraryCutShort = Sentence(L"the file is cut short");
+constexpr auto kNoWindowsLibrary = Sentence(L"it is not a Windows library");
 constexpr auto kNoResources = Sentence(L"it holds no resources");
 constexpr auto kBadSections = Sentence(L"its table of sections is damaged");
 constexpr auto kBadTree = Sentence(L"its resources are damaged");
@@ -70,17 +70,17 @@ std::size_t directoriesIn(const ByteReader& file, std::size_t optionalHeader)
     case kMark64:
         return optionalHeader + kDirectories64At;
     default:
-        throw DamagedFile{kNoLibrary};
+        throw DamagedFile{kNoWindowsLibrary};
     }
 }
 
 Headers headersOf(const ByteReader& file)
 {
     if (file.u16(0) != kDosMark)
-        throw DamagedFile{kNoLibrary};
+        throw DamagedFile{kNoWindowsLibrary};
     const std::size_t mark = file.u32(kPeOffsetAt);
     if (file.u32(mark) != kPeMark)
-        throw DamagedFile{kNoLibrary};
+        throw DamagedFile{kNoWindowsLibrary};
     const std::size_t optionalHeader = mark + kOptionalHeaderAt;
     const std::size_t directories = directoriesIn(file, optionalHeader);
     Headers headers;
@@ -277,7 +277,7 @@ std::wstring decode(const ByteReader& units)
 Result<PeResources> PeResources::read(std::vector<std::uint8_t> bytes)
 try
 {
-    const ByteReader file(bytes, kCutShort);
+    const ByteReader file(bytes, kLibraryCutShort);
     const Headers headers = headersOf(file);
     const Extent tree = resourcesIn(file, headers);
     PeResources result;

@@ -22,8 +22,8 @@ namespace
 using Header = ElfW(Ehdr);
 using Segment = ElfW(Phdr);
 
-constexpr std::size_t kMostSegments = 128;    // linkers write about a dozen
-constexpr std::uint64_t kSmallestPage = 4096; // the smallest page that segments are laid out for
+constexpr std::size_t kMostSegments = 128;            // linkers write about a dozen
+constexpr std::uint64_t kSmallestPageInMemory = 4096; // the smallest page that segments are laid out for
 
 constexpr auto kNoLibrary = Sentence(L"it is not a shared library");
 constexpr auto kIsProgram = Sentence(L"it is a program, not a shared library");
@@ -44,12 +44,12 @@ bool fits(std::uint64_t offset, std::uint64_t size, std::uint64_t whole)
 
 std::uint64_t pageStart(std::uint64_t address)
 {
-    return address & ~(kSmallestPage - 1);
+    return address & ~(kSmallestPageInMemory - 1);
 }
 
 std::uint64_t pageEnd(std::uint64_t address)
 {
-    return pageStart(address + kSmallestPage - 1);
+    return pageStart(address + kSmallestPageInMemory - 1);
 }
 
 Result<> checkKind(const Header& header)
@@ -68,7 +68,7 @@ Result<> checkKind(const Header& header)
     return header.e_type == ET_DYN ? Result<>() : refused(kNoLibrary);
 }
 
-Result<> checkTables(const Header& header, std::uint64_t fileSize)
+Result<> checkHeaderTables(const Header& header, std::uint64_t fileSize)
 {
     if (header.e_phentsize != sizeof(Segment) || header.e_phnum == 0 || header.e_phnum > kMostSegments)
         return refused(kDamaged);
@@ -86,8 +86,9 @@ Result<> checkLoadedSegment(const Segment& segment, std::uint64_t fileSize)
     if (!fits(segment.p_offset, segment.p_filesz, fileSize))
         return refused(kCutShort);
     const bool alignmentIsPower = (segment.p_align & (segment.p_align - 1)) == 0;
-    const bool samePlaceInPage = (segment.p_vaddr - segment.p_offset) % kSmallestPage == 0;
-    const bool endsInAddressSpace = segment.p_vaddr + segment.p_memsz + kSmallestPage > segment.p_vaddr;
+    const bool samePlaceInPage = (segment.p_vaddr - segment.p_offset) % kSmallestPageInMemory == 0;
+    const bool endsInAddressSpace =
+        segment.p_vaddr + segment.p_memsz + kSmallestPageInMemory > segment.p_vaddr;
     // Only what can be written has a part that the file does not hold.
     const bool sizesAgree = (segment.p_flags & PF_W) != 0 ? segment.p_filesz <= segment.p_memsz
                                                           : segment.p_filesz == segment.p_memsz;
@@ -105,7 +106,7 @@ std::uint64_t shiftOf(const Segment& segment)
 // that the file does not hold: one farther away has been moved, and what is written there ends the host.
 bool isNear(const Segment& segment, const Segment& previous)
 {
-    const std::uint64_t room = std::max<std::uint64_t>(segment.p_align, kSmallestPage) +
+    const std::uint64_t room = std::max<std::uint64_t>(segment.p_align, kSmallestPageInMemory) +
                                pageEnd(previous.p_memsz - previous.p_filesz);
     return static_cast<std::int64_t>(shiftOf(segment) - shiftOf(previous)) <= static_cast<std::int64_t>(room);
 }
@@ -202,7 +203,7 @@ Result<> checkMappable(std::uint64_t fileSize, const ReadAt& readAt)
         return checkShortFile(fileSize, readAt);
     if (auto checked = checkKind(header); !checked)
         return checked;
-    if (auto checked = checkTables(header, fileSize); !checked)
+    if (auto checked = checkHeaderTables(header, fileSize); !checked)
         return checked;
     std::array<Segment, kMostSegments> table;
     if (!readAt(header.e_phoff, table.data(), header.e_phnum * sizeof(Segment)))

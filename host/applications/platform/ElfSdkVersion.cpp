@@ -22,7 +22,7 @@ constexpr std::uint64_t kMostBytesOfNotes = 1 << 16; // linkers write some hundr
 constexpr std::size_t kNoteHead = sizeof(Note) + sizeof TSRX_SDK_NOTE_OWNER;
 static_assert(offsetof(TsRxSdkNote, majorNumber) == kNoteHead);
 
-std::uint64_t padded(std::uint64_t size)
+std::uint64_t inWholeUnits(std::uint64_t size)
 {
     constexpr std::uint64_t kUnit = 4;
     return (size + kUnit - 1) / kUnit * kUnit;
@@ -44,7 +44,7 @@ std::optional<SdkVersion> versionIn(const Segment& notes, const ReadAt& readAt)
     {
         if (isVersion(note))
             return SdkVersion{note.majorNumber, note.minorNumber};
-        place += sizeof(Note) + padded(note.ownerSize) + padded(note.versionSize);
+        place += sizeof(Note) + inWholeUnits(note.ownerSize) + inWholeUnits(note.versionSize);
     }
     return std::nullopt;
 }
