@@ -22,9 +22,9 @@ bool isSame(std::wstring_view left, std::wstring_view right, bool caseMatters)
     return caseMatters ? left == right : equalIgnoringCase(left, right);
 }
 
-bool beginsWith(const std::wstring& name, std::wstring_view beginning, bool caseMatters)
+bool beginsWith(std::wstring_view name, std::wstring_view beginning, bool caseMatters)
 {
-    return isSame(std::wstring_view(name).substr(0, beginning.size()), beginning, caseMatters);
+    return isSame(name.substr(0, beginning.size()), beginning, caseMatters);
 }
 
 // The part of the first name that all names share.
@@ -133,9 +133,8 @@ std::optional<Completion> completeEntry(const OpenPart& typed, Names entries)
     std::erase_if(entries,
                   [&](const std::wstring& entry)
                   {
-                      const bool fits =
-                          beginsWith(entry, typed.text, false) ||
-                          (byName && beginsWith(std::wstring(nameOfFile(entry)), typed.text, false));
+                      const bool fits = beginsWith(entry, typed.text, false) ||
+                                        (byName && beginsWith(nameOfFile(entry), typed.text, false));
                       return !fits || !fitsIntoALine(entry);
                   });
     if (entries.empty())
