@@ -19,77 +19,82 @@ namespace
 constexpr std::chrono::seconds kLongestSilence{2}; // without a word
 constexpr long kWholeFile = 200; // of the other answers none brings the file that was asked for
 
+// Takes what comes, and knows what has ended the transfer on this side.
 class Sink final : public TransferWatch
 {
 public:
-    Sink(PartFile& part, std::uint64_t most, const Interruption& interruption,
-         const std::function<void(std::uint64_t)>& tellBytes, std::unique_ptr<Checksum> sum)
-        : file(part), limit(most), interrupted(interruption), tell(tellBytes), checksum(std::move(sum))
+    Sink(PartFile& file, std::uint64_t limit, const Interruption& interruption,
+         const std::function<void(std::uint64_t)>& tell, std::unique_ptr<Checksum> checksum)
+        : mFile(file), mLimit(limit), mInterrupted(interruption), mTell(tell), mChecksum(std::move(checksum))
     {
     }
-
-    bool isFull() const { return received > limit; }
 
     // A body sent in chunks does not say its length before, so that the bytes are counted as they come.
     bool receive(std::string_view bytes) override
     {
-        received += bytes.size();
+        mReceived += bytes.size();
         if (isFull())
             return false;
-        checksum->add(bytes);
-        written = static_cast<bool>(file.write(bytes));
-        return written;
+        mChecksum->add(bytes);
+        mWritten = static_cast<bool>(mFile.write(bytes));
+        return mWritten;
     }
 
     bool goesOn() override
     {
-        stopped = interrupted.isThere();
-        if (const auto now = Clock::now(); now - told >= kLongestSilence)
+        mStopped = mInterrupted.isThere();
+        if (const auto now = Clock::now(); now - mTold >= kLongestSilence)
         {
-            told = now;
-            tell(received);
+            mTold = now;
+            mTell(mReceived);
         }
-        return !stopped;
+        return !mStopped;
     }
 
     bool mayAsk(const char* url) override
     {
         const bool secure = isSecure(url);
-        ledAstray = wasSecure && !secure;
-        wasSecure = secure;
-        return !ledAstray;
+        mLedAstray = mWasSecure && !secure;
+        mWasSecure = secure;
+        return !mLedAstray;
     }
 
+    // Fails when the transfer ended on this side.
+    Result<> outcome(TransferEnd end) const
+    {
+        if (mStopped)
+            return Failure{translated(L"it was interrupted")};
+        if (mLedAstray)
+            return Failure{translated(L"the server leads from https to http")};
+        if (isFull() || end == TransferEnd::kTooLarge)
+            return Failure{translated(L"it is larger than {}", sizeInWords(mLimit))};
+        return mWritten ? Result<>() : Failure{translated(L"the local copy could not be written")};
+    }
+
+    bool wasStopped() const { return mStopped; }
+    std::string sha256() { return mChecksum->finish(); }
+
+private:
     using Clock = std::chrono::steady_clock;
 
-    PartFile& file;
-    std::uint64_t limit;
-    Interruption::Wish interrupted;
-    const std::function<void(std::uint64_t)>& tell;
-    std::unique_ptr<Checksum> checksum;
-    Clock::time_point told = Clock::now();
-    std::uint64_t received = 0;
-    bool written = true;
-    bool stopped = false;
-    bool wasSecure = false;
-    bool ledAstray = false; // from where nobody can read along to where anybody can
+    bool isFull() const { return mReceived > mLimit; }
+
+    PartFile& mFile;
+    std::uint64_t mLimit;
+    Interruption::Wish mInterrupted;
+    const std::function<void(std::uint64_t)>& mTell;
+    std::unique_ptr<Checksum> mChecksum;
+    Clock::time_point mTold = Clock::now();
+    std::uint64_t mReceived = 0;
+    bool mWritten = true;
+    bool mStopped = false;
+    bool mWasSecure = false;
+    bool mLedAstray = false; // from where nobody can read along to where anybody can
 };
 
 TransferOrder orderFor(const RemoteAddress& address, const RemoteFiles::Limits& limits)
 {
     return {address.url, address.user, address.password, limits.bytes, limits.connecting, limits.whole};
-}
-
-// What stopped the transfer on this side; nothing when the other one did, or nobody.
-Result<> ownOutcome(TransferEnd end, const Sink& sink)
-{
-    if (sink.stopped)
-        return Failure{translated(L"it was interrupted")};
-    if (sink.ledAstray)
-        return Failure{translated(L"the server leads from https to http")};
-    if (sink.isFull() || end == TransferEnd::kTooLarge)
-        return Failure{translated(L"it is larger than {}", sizeInWords(sink.limit))};
-    return sink.written ? Result<>() : Failure{translated(L"the local copy could not be written")};
 }
 
 Failure noNetwork()
@@ -99,7 +104,7 @@ Failure noNetwork()
 
 Result<> outcomeOf(const TransferResult& result, const Sink& sink)
 {
-    if (auto own = ownOutcome(result.end, sink); !own)
+    if (auto own = sink.outcome(result.end); !own)
         return own;
     if (result.end == TransferEnd::kNotStarted)
         return noNetwork();
@@ -119,8 +124,8 @@ Result<std::string> download(const RemoteAddress& address, PartFile& file, const
         return noNetwork();
     Sink sink(file, limits.bytes, interruption, tell, net->checksum());
     const auto outcome = outcomeOf(net->transfer(orderFor(address, limits), sink), sink);
-    if (sink.stopped)
+    if (sink.wasStopped())
         interruption.settle();
-    return outcome ? Result<std::string>(sink.checksum->finish()) : outcome.failure();
+    return outcome ? Result<std::string>(sink.sha256()) : outcome.failure();
 }
 } // namespace tessel
