@@ -32,7 +32,8 @@ std::wstring_view takeFront(std::wstring_view& text, std::size_t length)
     return front;
 }
 
-// The length up to and with the last separator.
+// The length up to and with the last separator. In a list every path comes by here, and `find_last_of` makes
+// a call for each character.
 std::size_t folderLength(std::wstring_view path)
 {
     std::size_t length = path.size();
