@@ -39,6 +39,7 @@ constexpr double kReadToStore = 1.0;
 constexpr double kWriteToStore = 0.8;
 constexpr double kWriteNewToStore = 0.85;
 constexpr double kWriteSameToStore = 0.45;
+
 constexpr DWORD kBufferCharacters = 1024;
 
 // Lists of an even and an odd generation have no path in common.
@@ -376,40 +377,33 @@ void addStoreAlone()
             [] { return storeAll(kMany); });
 }
 
+void addStoreRatio(const std::string& what, const std::string& measured, const std::string& base, double most,
+                   const std::string& how)
+{
+    bench::addRatio({.what = what, .measured = measured, .base = base, .most = most, .how = how});
+}
+
 void addStoreRatios()
 {
     const std::string read = "read" + ofHistory(kMany);
     const std::string write = "write" + ofHistory(kMany);
     const std::string none = write + ", none before";
-    bench::addRatio({.what = read + " / store alone",
-                     .measured = read,
-                     .base = read + ", store alone",
-                     .most = kReadToStore,
-                     .how = "Bare SQLite looks each row up by its name, with one prepared statement in one "
-                            "transaction, in the same file, which is open before. The module's reading also "
-                            "checks the rows' checksums and looks every path up in the list."});
-    bench::addRatio({.what = write + " over others / store alone",
-                     .measured = write,
-                     .base = write + ", store alone",
-                     .most = kWriteToStore,
-                     .how =
-                         "As many other paths were stored before. Bare SQLite deletes their rows one by one "
-                         "and inserts the new ones one by one, in one transaction and with full "
-                         "synchronisation. The module asks for the same, and for the names before; the "
-                         "registry changes the rows in their places."});
-    bench::addRatio({.what = none + " / store alone",
-                     .measured = none,
-                     .base = none + ", store alone",
-                     .most = kWriteNewToStore,
-                     .how =
-                         "Nothing was stored before. Bare SQLite inserts one by one, the registry many rows "
-                         "by one statement."});
-    bench::addRatio({.what = write + " over the same / store alone, others",
-                     .measured = write + ", the same before",
-                     .base = write + ", store alone",
-                     .most = kWriteSameToStore,
-                     .how = "What closing the dialog does when no list has changed. Bare SQLite deletes and "
-                            "inserts all the same."});
+    addStoreRatio(read + " / store alone", read, read + ", store alone", kReadToStore,
+                  "Bare SQLite looks each row up by its name, with one prepared statement in one "
+                  "transaction, in the same file, which is open before. The module's reading also "
+                  "checks the rows' checksums and looks every path up in the list.");
+    addStoreRatio(write + " over others / store alone", write, write + ", store alone", kWriteToStore,
+                  "As many other paths were stored before. Bare SQLite deletes their rows one by one "
+                  "and inserts the new ones one by one, in one transaction and with full "
+                  "synchronisation. The module asks for the same, and for the names before; the "
+                  "registry changes the rows in their places.");
+    addStoreRatio(none + " / store alone", none, none + ", store alone", kWriteNewToStore,
+                  "Nothing was stored before. Bare SQLite inserts one by one, the registry many rows "
+                  "by one statement.");
+    addStoreRatio(write + " over the same / store alone, others", write + ", the same before",
+                  write + ", store alone", kWriteSameToStore,
+                  "What closing the dialog does when no list has changed. Bare SQLite deletes and "
+                  "inserts all the same.");
 }
 
 void addHistoryRatios(const std::string& verb, double mostToCalls, double mostToFew, double mostToSecond)
