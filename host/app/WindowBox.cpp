@@ -17,19 +17,24 @@ constexpr char kExpectSomebody[] = "tsuiExpectSomebody";
 using ShowBox = int (*)(const wchar_t* text, const wchar_t* detail, unsigned style, void* parent);
 using CanShowWindows = bool (*)();
 using ExpectSomebody = void (*)();
+
+// Without a display nothing is found, and the library is not loaded.
+template <class Function>
+Function findAtDisplay(const std::filesystem::path& libraryFolder, const char* name)
+{
+    return hasDisplay() ? findWindowsFunction<Function>(libraryFolder, name) : nullptr;
+}
 } // namespace
 
 bool canShowWindows(const std::filesystem::path& libraryFolder)
 {
-    const auto ask =
-        hasDisplay() ? findWindowsFunction<CanShowWindows>(libraryFolder, kCanShowWindows) : nullptr;
+    const auto ask = findAtDisplay<CanShowWindows>(libraryFolder, kCanShowWindows);
     return ask && ask();
 }
 
 void expectSomebodyAtTheDisplay(const std::filesystem::path& libraryFolder)
 {
-    if (const auto expect =
-            hasDisplay() ? findWindowsFunction<ExpectSomebody>(libraryFolder, kExpectSomebody) : nullptr)
+    if (const auto expect = findAtDisplay<ExpectSomebody>(libraryFolder, kExpectSomebody))
         expect();
 }
 
@@ -37,8 +42,7 @@ MessageBox::Presenter windowBoxes(const std::filesystem::path& libraryFolder)
 {
     return [libraryFolder](const MessageBox::Box& box)
     {
-        static const ShowBox showBox =
-            hasDisplay() ? findWindowsFunction<ShowBox>(libraryFolder, kShowBox) : nullptr;
+        static const auto showBox = findAtDisplay<ShowBox>(libraryFolder, kShowBox);
         return showBox ? showBox(box.text.c_str(), box.detail.c_str(), box.style, box.parent) : 0;
     };
 }
