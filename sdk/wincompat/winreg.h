@@ -28,7 +28,7 @@ TESSEL_API LONG RegCreateKeyEx(HKEY root, const wchar_t* subKey, DWORD reserved,
 
 // The name of the value at an index from 0, in the order in which the values were created. `*nameLength` is
 // the buffer's size in characters, the terminator included, and becomes the name's length without it. The
-// data may be asked for as with RegQueryValueEx, or not (null). ERROR_NO_MORE_ITEMS past the last value,
+// data may be asked for as with `tsRegGetValue`, or not (null). ERROR_NO_MORE_ITEMS past the last value,
 // ERROR_MORE_DATA when the name does not fit.
 TESSEL_API LONG RegEnumValueW(HKEY key, DWORD index, wchar_t* name, DWORD* nameLength, DWORD* reserved,
                               DWORD* type, BYTE* data, DWORD* dataSize);
