@@ -1,8 +1,6 @@
 // What an administrator lays out for everybody who starts Tessel on a machine.
 #include <gmock/gmock.h>
 
-#include <unistd.h>
-
 #include "tests/e2e/Applications.h"
 
 using testing::EndsWith;
@@ -161,8 +159,7 @@ TEST_F(Layout, InAFolderThatCannotBeReadIsToldAndDoesNotCount)
 {
     layOutSuite("suite.reg", sample("hilbert.lsp"));
     const auto layout = session.folder() / "layout";
-    if (geteuid() == 0)
-        session.startBy("exec setpriv --bounding-set=-dac_override,-dac_read_search -- \"$0\" \"$@\"");
+    session.startBoundByRights();
     for (const auto& folder : {layout / "policy", layout})
     {
         std::filesystem::create_directories(folder);
