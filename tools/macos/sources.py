@@ -110,6 +110,11 @@ def setter(name):
     return f"set{name[:1].upper()}{name[1:]}:"
 
 
+def getters(key):
+    """By which of these something may be read by that key."""
+    return key, f"is{key[:1].upper()}{key[1:]}"
+
+
 class Sources:
     """`called`: selectors of messages and selectors and keys that are named. `sent`: messages by what stands first in them."""
 
