@@ -46,23 +46,16 @@ protected:
         return json::parse(result.output);
     }
 
-    std::vector<std::string> suite() const
+    std::vector<std::string> pathsIn(const std::string& name) const
     {
         std::vector<std::string> paths;
-        const json list = asJson("SUITE LIST");
+        const json list = asJson(name + " LIST");
         for (const auto& file : list["files"])
             paths.push_back(file["path"]);
         return paths;
     }
-
-    std::vector<std::string> history() const
-    {
-        std::vector<std::string> paths;
-        const json list = asJson("HISTORY LIST");
-        for (const auto& file : list["files"])
-            paths.push_back(file["path"]);
-        return paths;
-    }
+    std::vector<std::string> suite() const { return pathsIn("SUITE"); }
+    std::vector<std::string> history() const { return pathsIn("HISTORY"); }
 
     std::string write(const std::string& name) const
     {
@@ -192,6 +185,7 @@ TEST_F(ListCommands, HaveOneEntryForAFileHoweverItsPathIsTyped)
             {"--safe", "-c", "CD " + folder, "-c", "SUITE REMOVE " + way, "-c", "HISTORY REMOVE " + way});
         EXPECT_EQ(removed.exitStatus, 0) << removed.output;
         EXPECT_TRUE(suite().empty()) << way;
+        EXPECT_TRUE(history().empty()) << way;
     }
 }
 
