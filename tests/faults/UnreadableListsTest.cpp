@@ -149,11 +149,8 @@ TEST_F(UnreadableLists, OnStandardErrorLeaveNothingForProgramsToRead)
 TEST_F(UnreadableLists, ThatAnAdministratorHasLaidDownAreStillTold)
 {
     session.folder().write("layout/policy/all.reg",
-                           "Windows Registry Editor Version 5.00\n\n"
-                           "[HKEY_CURRENT_USER\\Software\\Tessel\\R21\\Profiles]\n@=\"Default\"\n"
-                           "[HKEY_CURRENT_USER\\" +
-                               std::string(kSuiteKey) + "]\n\"NumStartup\"=\"1\"\n\"1Startup\"=\"" +
-                               application + "\"\n");
+                           suiteInFile({application}) +
+                               "[HKEY_CURRENT_USER\\Software\\Tessel\\R21\\Profiles]\n@=\"Default\"\n");
     session.alwaysWith({"--safe", "--layout-dir", (session.folder() / "layout").string()});
     cutShort();
     const auto result = session.run({"SUITE LIST"});
@@ -164,9 +161,7 @@ TEST_F(UnreadableLists, ThatAnAdministratorHasLaidDownAreStillTold)
 
 TEST_F(UnreadableLists, OfWhichOnlyTheDefaultsAreKnownAreNotTakenForThose)
 {
-    session.folder().write("layout/all.reg", "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
-                                                 std::string(kSuiteKey) +
-                                                 "]\n\"NumStartup\"=\"1\"\n\"1Startup\"=\"/default.lsp\"\n");
+    layOutSuite(session, "all.reg", "/default.lsp");
     session.alwaysWith({"--safe", "--layout-dir", (session.folder() / "layout").string()});
     cutShort();
     expectTold("SUITE LIST", kOfTheSuite);
