@@ -113,6 +113,7 @@ CStdStr LaidDownInstead(const CStdStr& key, const CStdStr& name, const CStdStr& 
     const bool isTheSame = ReadModrigRegString(HKEY_CURRENT_USER, key, name, counts) && counts == data;
     return laidDown && !isTheSame ? CStdStr(std::wstring(place)) : CStdStr();
 }
+
 bool LeadsToAFile(const CStdStr& typed)
 {
     return GetFileAttributesW(WholePath(typed).c_str()) != INVALID_FILE_ATTRIBUTES;

@@ -161,6 +161,7 @@ void Run(const KeptList& list)
         return tsedFailCommand(reason.c_str());
     Tell(list, request, *change, modrigWaits);
 }
+
 // What cannot be read is told by the command.
 TsResultBuffer* Entries(const KeptList& list)
 {
