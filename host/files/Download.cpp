@@ -92,17 +92,12 @@ Result<> ownOutcome(TransferEnd end, const Sink& sink)
     return sink.written ? Result<>() : Failure{translated(L"the local copy could not be written")};
 }
 
-Failure noNetwork()
-{
-    return {translated(L"the network library cannot be started")};
-}
-
 Result<> outcomeOf(const TransferResult& result, const Sink& sink)
 {
     if (auto own = ownOutcome(result.end, sink); !own)
         return own;
     if (result.end == TransferEnd::kNotStarted)
-        return noNetwork();
+        return Failure{translated(L"the network library cannot be started")};
     if (result.end == TransferEnd::kFailed)
         return Failure{toWide(result.words)};
     if (result.answer != kWholeFile)
@@ -114,11 +109,11 @@ Result<> outcomeOf(const TransferResult& result, const Sink& sink)
 Result<std::string> download(const RemoteAddress& address, PartFile& file, const RemoteFiles::Limits& limits,
                              Interruption& interruption, const std::function<void(std::uint64_t)>& tell)
 {
-    Network* const net = network();
+    const auto net = network();
     if (!net)
-        return noNetwork();
-    Sink sink(file, limits.bytes, interruption, tell, net->checksum());
-    const auto outcome = outcomeOf(net->transfer(orderFor(address, limits), sink), sink);
+        return net.failure();
+    Sink sink(file, limits.bytes, interruption, tell, (*net)->checksum());
+    const auto outcome = outcomeOf((*net)->transfer(orderFor(address, limits), sink), sink);
     if (sink.stopped)
         interruption.settle();
     return outcome ? Result<std::string>(sink.checksum->finish()) : outcome.failure();
