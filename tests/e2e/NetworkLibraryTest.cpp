@@ -44,7 +44,9 @@ protected:
     const fs::path copy = session.folder() / "a copy of Tessel.app";
     const fs::path library = copy / fs::path(NETWORK_LIBRARY).filename();
     HttpServer server{[](const std::string&) -> HttpServer::Answer
-                      { return {httpAnswer("200 OK", "(write-line \"it runs\")"), "", {}}; }};
+                      {
+                          return {httpAnswer("200 OK", "(write-line \"it runs\")"), "", {}};
+                      }};
 };
 } // namespace
 
@@ -56,15 +58,17 @@ TEST_F(NetworkLibrary, IsFoundWhereTheProductIsMovedTo)
 TEST_F(NetworkLibrary, ThatIsMissingIsNamedWithTheWayOut)
 {
     fs::remove(library);
-    expectNotFetched("Tessel's library for the network cannot be used, and Tessel has to be installed again (" +
-                     library.string() + ": ");
+    expectNotFetched(
+        "Tessel's library for the network cannot be used, and Tessel has to be installed again (" +
+        library.string() + ": ");
 }
 
 TEST_F(NetworkLibrary, ThatIsNoLibraryIsNamedWithTheWayOut)
 {
     std::ofstream(library, std::ios::binary) << "Dear Sir or Madam,\n";
-    expectNotFetched("Tessel's library for the network cannot be used, and Tessel has to be installed again (" +
-                     library.string() + ": ");
+    expectNotFetched(
+        "Tessel's library for the network cannot be used, and Tessel has to be installed again (" +
+        library.string() + ": ");
 }
 
 TEST_F(NetworkLibrary, OfAnotherVersionIsNotUsed)
