@@ -210,6 +210,16 @@ TEST_F(ListCommands, HaveOneEntryForAFileHoweverItsPathIsTyped)
     }
 }
 
+TEST_F(ListCommands, CountAFileThatIsTypedTwiceOnce)
+{
+    const std::string inAnotherWay = "/." + first;
+    EXPECT_EQ(quietly("HISTORY ADD " + first + " " + inAnotherWay),
+              "first.lsp was added to the History list.\n");
+    EXPECT_EQ(quietly("HISTORY REMOVE " + inAnotherWay + " " + first),
+              "first.lsp was removed from the History list.\n");
+    EXPECT_TRUE(history().empty());
+}
+
 TEST_F(ListCommands, KeepALinkAsItWasTyped)
 {
     const auto link = session.folder() / "link.lsp";
