@@ -218,6 +218,13 @@ bool RunningMarker::map(int flags, int file)
     return true;
 }
 
+// Once the end is noted it stays as it is: where a thread of an application ends the process, the others go
+// on until it is over, and what they end would take the mark away.
+bool RunningMarker::marks() const
+{
+    return mPage && mPage->ending == kVanished;
+}
+
 std::size_t RunningMarker::depth() const
 {
     return mPage ? mPage->depth.load(std::memory_order_relaxed) : 0;
@@ -226,7 +233,7 @@ std::size_t RunningMarker::depth() const
 // Counted last: whenever the process ends, what is counted is whole.
 void RunningMarker::begin(Deed deed, std::string_view path, std::string_view detail)
 {
-    if (!mPage)
+    if (!marks())
         return;
     const std::size_t depth = this->depth();
     if (depth < kDeepest)
@@ -250,7 +257,7 @@ void RunningMarker::begin(Deed deed, std::string_view path, std::string_view det
 
 void RunningMarker::endTo(std::size_t depth)
 {
-    if (mPage)
+    if (marks())
         mPage->depth.store(static_cast<std::uint32_t>(depth), std::memory_order_release);
 }
 

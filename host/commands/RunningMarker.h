@@ -153,6 +153,7 @@ private:
     void make(const std::filesystem::path& folder);
     Result<> keepIn(const std::filesystem::path& folder);
     bool map(int flags, int file);
+    bool marks() const;
 
     Result<> mOutlivesProcess;
     Page* mPage = nullptr;

@@ -24,6 +24,9 @@ std::string sample(const std::string& name);
 std::string fixtureModule(const std::string& name);
 // An application in the session's folder that ends the host in that way (see fixtures/modules/Deadly.cpp).
 std::string deadly(const HostSession& session, const std::string& way);
+// A form that ends the host by a memory fault. Any thread may take the signal: the one that runs Lisp waits
+// for the end.
+inline constexpr char kLispThatFaults[] = "(progn (ext:system \"kill -SEGV $PPID\") (sleep 60))";
 std::string lispFixture(const std::string& name);
 std::string modrigBundle();
 

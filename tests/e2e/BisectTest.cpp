@@ -248,8 +248,7 @@ protected:
     // Lisp that ends the host while the flag is there.
     std::string writeDeadly() const
     {
-        return write("deadly",
-                     "(when (probe-file \"" + flag.string() + "\") (ext:system \"kill -SEGV $PPID\"))");
+        return write("deadly", "(when (probe-file \"" + flag.string() + "\") " + kLispThatFaults + ")");
     }
     void raiseFlag() const { session.folder().write("flag", ""); }
     void lowerFlag() const { std::filesystem::remove(flag); }
@@ -290,8 +289,10 @@ TEST_F(BisectAndCrash, LetsATrialWaitUntilTheSearchIsOver)
     const std::string bad = writeDeadly();
     raiseFlag();
     storeSuite(session, {write("a"), write("b"), bad});
-    EXPECT_EQ(session.run({}).exitStatus, -SIGSEGV);
-    EXPECT_THAT(session.run({"BISECT START"}).output, HasSubstr("BISECT searches among 2 applications; "));
+    const auto first = session.run({});
+    EXPECT_EQ(first.exitStatus, -SIGSEGV);
+    EXPECT_THAT(session.run({"BISECT START"}).output, HasSubstr("BISECT searches among 2 applications; "))
+        << first.output;
     for (const char* command : {"VERSION", "BISECT STOP"})
     {
         const auto result = session.run({command});

@@ -86,7 +86,7 @@ TEST(LastWordsOf, AnApplicationThatIsUnloaded)
 TEST(LastWordsOf, ALispFile)
 {
     const HostSession session;
-    const auto path = session.folder().write("deadly.lsp", "(ext:system \"kill -SEGV $PPID\")\n").string();
+    const auto path = session.folder().write("deadly.lsp", kLispThatFaults).string();
     const auto result = session.run({"LOAD " + path, "VERSION"});
     EXPECT_EQ(result.exitStatus, -SIGSEGV) << result.output;
     EXPECT_THAT(result.output,

@@ -201,6 +201,30 @@ TEST_F(Marker, TellsHowTheSessionEnded)
     EXPECT_EQ(leftovers().at(0).ending, SIGSEGV);
 }
 
+// As when it faults on a thread that an application has started, while the host goes on.
+TEST_F(Marker, StaysAsItWasWhenTheEndWasNoted)
+{
+    vanishAfter(
+        [](RunningMarker& marker)
+        {
+            marker.begin(Deed::kEntryPoint, "/a");
+            marker.noteEnding(SIGSEGV);
+            marker.endTo(0);
+        });
+    EXPECT_EQ(leftovers().at(0).work.path, "/a");
+    {
+        RunningMarker(mFolder.path()).forgetLeftovers();
+    }
+    vanishAfter(
+        [](RunningMarker& marker)
+        {
+            marker.begin(Deed::kEntryPoint, "/a");
+            marker.noteEnding(SIGSEGV);
+            marker.begin(Deed::kEntryPoint, "/b");
+        });
+    EXPECT_EQ(leftovers().at(0).work.path, "/a");
+}
+
 TEST_F(Marker, TellsThatACommandWaitedForAPersonAndNothingElseDoes)
 {
     vanishAfter(
