@@ -21,6 +21,21 @@ constexpr char kModrigWaits[] =
     "the Startup Suite with it.\n";
 constexpr char kNoWindow[] = "Tessel cannot open a window: there is no display.\n";
 
+std::string historyOf(int entries)
+{
+    std::string file =
+        "Windows Registry Editor Version 5.00\n\n"
+        "[HKEY_CURRENT_USER\\Software\\Tessel\\R21\\Profiles\\Default\\Dialogs\\Modrig\\History]\n"
+        "\"NumHistory\"=\"" +
+        std::to_string(entries) + "\"\n";
+    for (int number = 1; number <= entries; ++number)
+    {
+        const std::string digits = std::to_string(number);
+        file += "\"" + digits + "History\"=\"/nowhere/" + digits + ".lsp\"\n";
+    }
+    return file;
+}
+
 class ListCommands : public testing::Test
 {
 protected:
@@ -179,6 +194,16 @@ TEST_F(ListCommands, HaveOneEntryForAFileHoweverItsPathIsTyped)
         EXPECT_TRUE(suite().empty()) << way;
         EXPECT_TRUE(history().empty()) << way;
     }
+}
+
+TEST_F(ListCommands, CountAFileThatIsTypedTwiceOnce)
+{
+    const std::string inAnotherWay = "/." + first;
+    EXPECT_EQ(quietly("HISTORY ADD " + first + " " + inAnotherWay),
+              "first.lsp was added to the History list.\n");
+    EXPECT_EQ(quietly("HISTORY REMOVE " + inAnotherWay + " " + first),
+              "first.lsp was removed from the History list.\n");
+    EXPECT_TRUE(history().empty());
 }
 
 TEST_F(ListCommands, KeepALinkAsItWasTyped)
@@ -484,6 +509,28 @@ TEST_F(ListCommands, ChangeWhatIsOnlyADefault)
     EXPECT_THAT(suite(), ElementsAre(second));
     quietly("SUITE CLEAR");
     EXPECT_TRUE(suite().empty());
+}
+
+// Wherever the limit is met: while the list is written, or at the end of the command.
+TEST_F(ListCommands, DoNotSayThatALongListIsRemovedWhereThatCannotBeStored)
+{
+    constexpr int kMany = 300;
+    constexpr int kPage = 8; // of the store, in what `ulimit` counts
+    constexpr int kEnough = 30 * kPage;
+    quietly("REGISTRY IMPORT " + session.folder().write("long.reg", historyOf(kMany)).string());
+    int limit = 0;
+    for (bool stored = false; !stored && limit < kEnough;)
+    {
+        limit += kPage;
+        session.startBy("ulimit -f " + std::to_string(limit) + "; exec \"$0\" \"$@\"");
+        const auto result = session.start({"--safe", "-c", "HISTORY CLEAR"});
+        stored = result.exitStatus == 0;
+        EXPECT_EQ(result.output.find("were removed") != result.output.npos, stored) << limit << result.output;
+    }
+    session.startBy("exec \"$0\" \"$@\"");
+    EXPECT_GT(limit, 3 * kPage);
+    EXPECT_LT(limit, kEnough);
+    EXPECT_TRUE(history().empty());
 }
 
 TEST_F(ListCommands, FailWhenTheRegistryCannotBeWritten)
