@@ -209,10 +209,10 @@ TEST_F(LinkerContract, ListsWhatIsLeftOfManyAfterSomeWereUnloaded)
         EXPECT_TRUE(load(paths.back()));
     }
     EXPECT_THAT(loadedNames(), ElementsAreArray(names));
-    for (const int gone : {19, 10, 0})
+    for (const std::size_t gone : {19U, 10U, 0U})
     {
         EXPECT_TRUE(linker->unloadModule(paths[gone].c_str(), false));
-        names.erase(names.begin() + gone);
+        names.erase(names.begin() + static_cast<std::ptrdiff_t>(gone));
         EXPECT_THAT(loadedNames(), ElementsAreArray(names));
     }
 }
