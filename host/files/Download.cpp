@@ -97,17 +97,12 @@ TransferOrder orderFor(const RemoteAddress& address, const RemoteFiles::Limits& 
     return {address.url, address.user, address.password, limits.bytes, limits.connecting, limits.whole};
 }
 
-Failure noNetwork()
-{
-    return {translated(L"the network library cannot be started")};
-}
-
 Result<> outcomeOf(const TransferResult& result, const Sink& sink)
 {
     if (auto own = sink.outcome(result.end); !own)
         return own;
     if (result.end == TransferEnd::kNotStarted)
-        return noNetwork();
+        return Failure{translated(L"the network library cannot be started")};
     if (result.end == TransferEnd::kFailed)
         return Failure{toWide(result.words)};
     if (result.answer != kWholeFile)
@@ -119,11 +114,11 @@ Result<> outcomeOf(const TransferResult& result, const Sink& sink)
 Result<std::string> download(const RemoteAddress& address, PartFile& file, const RemoteFiles::Limits& limits,
                              Interruption& interruption, const std::function<void(std::uint64_t)>& tell)
 {
-    Network* const net = network();
+    const auto net = network();
     if (!net)
-        return noNetwork();
-    Sink sink(file, limits.bytes, interruption, tell, net->checksum());
-    const auto outcome = outcomeOf(net->transfer(orderFor(address, limits), sink), sink);
+        return net.failure();
+    Sink sink(file, limits.bytes, interruption, tell, (*net)->checksum());
+    const auto outcome = outcomeOf((*net)->transfer(orderFor(address, limits), sink), sink);
     if (sink.wasStopped())
         interruption.settle();
     return outcome ? Result<std::string>(sink.sha256()) : outcome.failure();

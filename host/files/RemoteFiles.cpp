@@ -90,10 +90,10 @@ Result<> checkContent(const std::string& sha256, const RemoteAddress& address)
 std::string sha256Of(const std::filesystem::path& file, std::uintmax_t mostBytes)
 {
     const auto content = readOrdinaryFile(file, mostBytes);
-    Network* const net = network();
+    const auto net = network();
     if (!content || !net)
         return {};
-    const auto checksum = net->checksum();
+    const auto checksum = (*net)->checksum();
     checksum->add(*content);
     return checksum->finish();
 }

@@ -221,9 +221,20 @@ void LayeredRegistry::expectReplacement(Key key)
 
 Result<> LayeredRegistry::endOfCommand()
 {
+    putBackWhatDidNotChange();
+    return mOwn.endOfCommand();
+}
+
+Result<> LayeredRegistry::store()
+{
+    putBackWhatDidNotChange();
+    return mOwn.store();
+}
+
+void LayeredRegistry::putBackWhatDidNotChange()
+{
     for (const auto& [key, before] : std::exchange(mBefore, {}))
         putBackIfNothingChanged(before);
-    return mOwn.endOfCommand();
 }
 
 // What fails here fails in all of the command, which is then undone and told.

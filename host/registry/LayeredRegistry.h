@@ -74,6 +74,9 @@ public:
     void expectReplacement(Key key);
     Result<> endOfCommand();
 
+    // In place of the own registry's, for what was replaced by then.
+    Result<> store();
+
     HKEY openHandle(Key key);
     std::optional<Key> keyOf(HKEY handle) const;
     bool closeHandle(HKEY handle);
@@ -95,6 +98,7 @@ private:
         std::vector<Registry::Value> own;
         std::vector<Value> counting;
     };
+    void putBackWhatDidNotChange();
     void putBackIfNothingChanged(const Before& before);
     void tellLaidDown(const std::wstring& path, const RegistryTree::Value& value);
 

@@ -573,6 +573,12 @@ void Registry::storeSoFar()
     endOfWork();
 }
 
+Result<> Registry::store()
+{
+    storeSoFar();
+    return mCommand;
+}
+
 void Registry::endOfWork()
 {
     mWork.end();

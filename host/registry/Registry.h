@@ -110,6 +110,9 @@ public:
     // command's, and is told at its end.
     void storeSoFar();
 
+    // The same, for who wants to know whether it is stored.
+    Result<> store();
+
     // Makes the copy of the last sound state, if something was stored since the last one and the file is
     // known to be sound. A failure is a whole sentence.
     Result<> keepCopy();

@@ -118,6 +118,12 @@ LONG RegCloseKey(HKEY key)
     return target && target.registry->closeHandle(key) ? ERROR_SUCCESS : ERROR_INVALID_HANDLE;
 }
 
+LONG RegFlushKey(HKEY key)
+{
+    const Target target = targetOf(key);
+    return target ? target.registry->store().code() : ERROR_INVALID_HANDLE;
+}
+
 LONG tsRegGetValue(HKEY key, const wchar_t* name, DWORD, DWORD* type, void* data, DWORD* size)
 {
     if (data && !size)

@@ -7,6 +7,7 @@
 #include <cwchar>
 #include <functional>
 #include <string>
+#include <utility>
 
 #include "modrig/base/SplitPath.h"
 #include "modrig/commands/CommandTexts.h"
@@ -80,6 +81,14 @@ bool Holds(const CStringList& files, const CStdStr& path)
                        [&path](const CStdStr& entry) { return entry.EqualsNoCase(path); });
 }
 
+// What was typed twice is one file.
+void NoteOnce(std::vector<CStdStr>& paths, CStdStr path)
+{
+    if (std::none_of(paths.begin(), paths.end(),
+                     [&path](const CStdStr& noted) { return noted.EqualsNoCase(path); }))
+        paths.push_back(std::move(path));
+}
+
 // As it is kept: as it was typed, or by the whole path. Empty where it is not.
 CStdStr EntryFor(const KeptList& list, const CStdStr& typed)
 {
@@ -113,6 +122,7 @@ CStdStr LaidDownInstead(const CStdStr& key, const CStdStr& name, const CStdStr& 
     const bool isTheSame = ReadModrigRegString(HKEY_CURRENT_USER, key, name, counts) && counts == data;
     return laidDown && !isTheSame ? CStdStr(std::wstring(place)) : CStdStr();
 }
+
 bool LeadsToAFile(const CStdStr& typed)
 {
     return GetFileAttributesW(WholePath(typed).c_str()) != INVALID_FILE_ATTRIBUTES;
@@ -211,7 +221,7 @@ Change AddFiles(const KeptList& list, const std::vector<CStdStr>& typed)
         CStdStr path = WholePath(file);
         if (const CStdStr refused = WhyRefused(list, path); !refused.IsEmpty())
             return {refused + HintAtQuotes(typed, LeadsToAFile)};
-        paths.push_back(path);
+        NoteOnce(paths, std::move(path));
     }
     for (const CStdStr& path : paths)
         static_cast<void>(list.files.AddTailUnlessHeld(path)); // what is there already counts as added
@@ -227,10 +237,10 @@ Change RemoveFiles(const KeptList& list, const std::vector<CStdStr>& typed)
         if (path.IsEmpty())
             return {NotInList(list, file) + HintAtQuotes(typed, [&list](const CStdStr& name)
                                                          { return !EntryFor(list, name).IsEmpty(); })};
-        paths.push_back(std::move(path));
+        NoteOnce(paths, std::move(path));
     }
     for (const CStdStr& path : paths)
-        static_cast<void>(list.files.RemoveFirstNoCase(path)); // typed twice, it is gone by now
+        static_cast<void>(list.files.RemoveFirstNoCase(path)); // each is in it
     return {{}, Summary(list.oneRemoved, list.manyRemoved, paths)};
 }
 

@@ -2,6 +2,7 @@
 
 #include <tessel/tsedcommands.h>
 #include <wincompat/winfile.h>
+#include <wincompat/winreg.h>
 
 #include <vector>
 
@@ -87,6 +88,8 @@ CStdStr Store(const KeptList& list, bool& modrigWaits)
         return CStdStr::OfId(ModrigMessages::kListNotStored);
     if (list.isLoadedAtStart)
         UpdateRecordOfModrig(!list.files.IsEmpty());
+    if (RegFlushKey(HKEY_CURRENT_USER) != ERROR_SUCCESS)
+        return CStdStr::OfId(ModrigMessages::kListNotStored);
     return {};
 }
 
@@ -161,6 +164,7 @@ void Run(const KeptList& list)
         return tsedFailCommand(reason.c_str());
     Tell(list, request, *change, modrigWaits);
 }
+
 // What cannot be read is told by the command.
 TsResultBuffer* Entries(const KeptList& list)
 {

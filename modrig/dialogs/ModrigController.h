@@ -33,7 +33,7 @@
     NSArray* furtherQuestions;
 }
 
-// What Load will load: `ModrigFilePath`s, from the panel's selection or the History's.
+// What was chosen last, in the panel or in the History: `ModrigFilePath`s. Load leaves those of folders out.
 @property (nonatomic, retain) NSMutableArray* selectedFiles;
 @property (nonatomic, assign) BOOL saveHistory;
 // `kLoadedApplicationsTab` or `kHistoryTab` (model/ShownTab.h).
@@ -117,12 +117,12 @@
 - (IBAction)onFileTypesChanged:(id)sender;
 
 - (BOOL)panel:(id)panel shouldShowFilename:(NSString*)name;
-// Makes what is chosen in the panel what Load will load, folders too; no folder is when it does.
+// What is selected in the panel is what was chosen last then, folders too.
 - (void)panelSelectionDidChange:(id)panel;
 - (void)choose:(NSArray*)urls;
 // Whether there is anything among the URLs but folders on the way to files.
 - (BOOL)isAnyFileIn:(NSArray*)urls;
-// What Load loads of that which is chosen.
+// What Load loads of what was chosen last.
 - (NSArray*)chosenFiles;
 // The action of the panel's default button.
 - (void)openPanelOK:(id)sender;

@@ -14,14 +14,6 @@
 
 namespace
 {
-constexpr wchar_t kFirstBeyondAscii = 0x80;
-
-bool isPlain(const std::wstring& path)
-{
-    return std::all_of(path.begin(), path.end(),
-                       [](wchar_t character) { return character > 0 && character < kFirstBeyondAscii; });
-}
-
 char* charactersAfter(ModrigFilePath* row)
 {
     return static_cast<char*>(object_getIndexedIvars(row));
@@ -46,7 +38,7 @@ char* charactersAfter(ModrigFilePath* row)
 + (ModrigFilePath*)newWithResolvedPath:(const CStdStr&)path
 {
     const std::wstring& text = path.Text();
-    const bool plain = isPlain(text);
+    const bool plain = ModrigUtils::IsAscii(text);
     auto* row = (ModrigFilePath*)[NSAllocateObject(self, plain ? text.size() + 1 : 0, nullptr) init];
     row->mIsPlain = plain;
     if (plain) // the memory is all zeros: there is one after them

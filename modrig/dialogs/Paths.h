@@ -4,6 +4,7 @@
 #import <AppKit/AppKit.h>
 
 #include <functional>
+#include <string_view>
 #include <vector>
 
 #include "modrig/base/CStdStr.h"
@@ -34,12 +35,10 @@ bool AreSamePath(NSString* path, NSString* other);
 
 CStdStr PathFromString(NSString* text);
 NSString* StringFromPath(const CStdStr& path);
-// Of a list, or of any other row of paths.
-template <typename Paths> NSArray* StringsFromPaths(const Paths& paths)
-{
-    NSMutableArray* strings = [NSMutableArray array];
-    for (const CStdStr& path : paths)
-        [strings addObject:StringFromPath(path)];
-    return strings;
-}
+
+// Whether each character is one byte wherever the path goes.
+bool IsAscii(std::wstring_view path);
+
+// What the toolkit's stringByResolvingSymlinksInPath makes of the path.
+CStdStr ResolvedByToolkit(const CStdStr& path);
 } // namespace ModrigUtils

@@ -3,6 +3,8 @@
 #include <tesselui/tsuieach.h>
 #include <wincompat/winstring.h>
 
+#include <algorithm>
+
 #import "modrig/dialogs/ModrigFilePath.h"
 
 #include "modrig/dialogs/model/ShownText.h"
@@ -82,5 +84,17 @@ CStdStr PathFromString(NSString* text)
 NSString* StringFromPath(const CStdStr& path)
 {
     return wcharToNSString(path.c_str());
+}
+
+bool IsAscii(std::wstring_view path)
+{
+    constexpr wchar_t kFirstBeyond = 0x80;
+    return std::all_of(path.begin(), path.end(),
+                       [](wchar_t character) { return character > 0 && character < kFirstBeyond; });
+}
+
+CStdStr ResolvedByToolkit(const CStdStr& path)
+{
+    return PathFromString([StringFromPath(path) stringByResolvingSymlinksInPath]);
 }
 } // namespace ModrigUtils

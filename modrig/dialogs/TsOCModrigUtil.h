@@ -14,8 +14,6 @@
 
 // Adds a row for the path, links resolved, unless the table has one for that file.
 + (void)addPathName:(NSString*)path toArrayController:(NSArrayController*)controller;
-// The same for many paths, with one change of the table.
-+ (void)addPathNames:(NSArray*)paths toArrayController:(NSArrayController*)controller;
 
 // The text of the key in the string table of the module's bundle, in English where the person's language has
 // none; the key itself when there is none.

@@ -3,7 +3,8 @@
 #import <tesselui/TsOCFileFilter.h>
 #include <tesselui/tsuitexts.h>
 #include <wincompat/winfile.h>
-#include <wincompat/winstring.h>
+
+#include <vector>
 
 #import "modrig/dialogs/ModrigController.h"
 
@@ -15,11 +16,6 @@
 namespace
 {
 ModrigController* gModrigController = nil;
-
-CStdStr wide(NSString* text)
-{
-    return CStdStr(NSStringToWstring(text));
-}
 } // namespace
 
 @implementation TsOCModrigUtil
@@ -38,12 +34,7 @@ CStdStr wide(NSString* text)
 
 + (void)addPathName:(NSString*)path toArrayController:(NSArrayController*)controller
 {
-    [self addPathNames:[NSArray arrayWithObject:path] toArrayController:controller];
-}
-
-+ (void)addPathNames:(NSArray*)paths toArrayController:(NSArrayController*)controller
-{
-    ModrigUtils::AddRows(controller, ModrigUtils::PathsFromStrings(paths));
+    ModrigUtils::AddRows(controller, std::vector<CStdStr>{ModrigUtils::PathFromString(path)});
 }
 
 + (NSString*)modrigLoadString:(NSString*)key
@@ -65,20 +56,20 @@ CStdStr wide(NSString* text)
 
 + (BOOL)isValidFileForModrig:(NSString*)path
 {
-    return ModrigUtils::IsValidFileForModrig(wide(path));
+    return ModrigUtils::IsValidFileForModrig(ModrigUtils::PathFromString(path));
 }
 
 + (NSString*)validateFileExists:(NSString*)path
 {
-    CStdStr found = wide(path);
+    CStdStr found = ModrigUtils::PathFromString(path);
     if (ModrigUtils::ValidateFileExists(found) == INVALID_FILE_ATTRIBUTES)
         return nil;
-    return wcharToNSString(found.c_str());
+    return ModrigUtils::StringFromPath(found);
 }
 
 + (BOOL)isTempInternetFile:(NSString*)path
 {
-    return ModrigUtils::IsTempInternetFile(wide(path));
+    return ModrigUtils::IsTempInternetFile(ModrigUtils::PathFromString(path));
 }
 
 @end

@@ -31,6 +31,13 @@ std::vector<CStdStr> CandidateNames(const SplitPath& split)
     return names;
 }
 
+CStdStr CurrentFolder()
+{
+    wchar_t folder[kPathSize] = {};
+    GetCurrentDirectory(kPathSize, folder); // a folder that does not fit leaves the text empty
+    return CStdStr(std::wstring(folder));
+}
+
 DWORD FindInCurrentFolder(const std::vector<CStdStr>& names, CStdStr& path)
 {
     for (const CStdStr& name : names)
@@ -68,13 +75,6 @@ CStdStr StripClosingSeparators(const CStdStr& path)
     return CStdStr(text);
 }
 } // namespace
-
-CStdStr CurrentFolder()
-{
-    wchar_t folder[kPathSize] = {};
-    GetCurrentDirectory(kPathSize, folder); // a folder that does not fit leaves the text empty
-    return CStdStr(std::wstring(folder));
-}
 
 bool IsValidFileForModrig(const CStdStr& path)
 {

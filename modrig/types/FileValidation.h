@@ -15,9 +15,6 @@ namespace ModrigUtils
 // path of the file found. A path that is too long to be taken apart is found where it says or not at all.
 [[nodiscard]] DWORD ValidateFileExists(CStdStr& path);
 
-// Of the process. Empty where its path is too long.
-[[nodiscard]] CStdStr CurrentFolder();
-
 // Whether the file is a local copy of one from the internet, which may be gone at the next start.
 [[nodiscard]] bool IsTempInternetFile(const CStdStr& path);
 

@@ -38,6 +38,10 @@ TESSEL_API LONG RegDeleteValueW(HKEY key, const wchar_t* name);
 
 TESSEL_API LONG RegCloseKey(HKEY key);
 
+// Stores what the command has written so far, in all keys, and answers whether it is stored now: for who is
+// about to say that it is. Writes that succeed may wait for the command's end, and fail there.
+TESSEL_API LONG RegFlushKey(HKEY key);
+
 // The host's own value calls. Reading: `*type` is set to the value's type and `*size` (bytes, in: the
 // buffer's, out: the data's with its terminator); ERROR_FILE_NOT_FOUND, ERROR_READ_FAULT when the value may
 // be there all the same, or ERROR_MORE_DATA when it does not fit (the buffer is then untouched). An empty

@@ -137,6 +137,15 @@ TEST_F(ListCommandsWithoutHost, DisturbNobodyWhileAnotherSessionRuns)
     EXPECT_TRUE(host().commands.type(L"SUITE LIST"));
 }
 
+// A store may have room for the list in memory, and find none on the disk.
+TEST_F(ListCommandsWithoutHost, FailWhenWhatWasWrittenCannotBeStored)
+{
+    host().registry.failAfter(RecordingRegistry::Operation::kFlush, 0);
+    EXPECT_FALSE(host().commands.type(L"HISTORY CLEAR"));
+    EXPECT_THAT(host().commands.failure, Optional(std::wstring(L"not stored")));
+    EXPECT_THAT(lines(), IsEmpty());
+}
+
 TEST_F(ListCommandsWithoutHost, FailWithoutABoxWhenTheListCannotBeStored)
 {
     RecordModrig(kAtStart | kOnCommand);

@@ -97,6 +97,17 @@ TEST_F(RegistryContract, OpensWhatItIsAskedToMakeTwice)
     RegCloseKey(again);
 }
 
+TEST_F(RegistryContract, StoresInTheMiddleOfACommandWhatWasWritten)
+{
+    set(L"Name", L"1");
+    EXPECT_EQ(RegFlushKey(key), ERROR_SUCCESS);
+    EXPECT_EQ(read(key, L"Name"), L"1");
+    set(L"Name", L"2");
+    EXPECT_EQ(RegFlushKey(HKEY_CURRENT_USER), ERROR_SUCCESS);
+    EXPECT_EQ(read(key, L"Name"), L"2");
+    EXPECT_EQ(RegFlushKey(nullptr), ERROR_INVALID_HANDLE);
+}
+
 TEST_F(RegistryContract, HasNothingLaidDownWhereNobodyDidSo)
 {
     set(L"Name", L"1");

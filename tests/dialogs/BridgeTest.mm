@@ -80,16 +80,6 @@ TEST_F(Bridge, MakesTheRowFromTheResolvedPath)
     EXPECT_EQ(L"real.lsp", wide([[[table arrangedObjects] objectAtIndex:0] fileName]));
 }
 
-TEST_F(Bridge, AddsManyPathsLikeOneAfterAnother)
-{
-    ModrigArrayController* table = makeTable();
-    [TsOCModrigUtil addPathName:@"/a/one.lsp" toArrayController:table];
-    NSArray* more =
-        [NSArray arrayWithObjects:@"/a/two.lsp", @"/A/ONE.lsp", @"/a/TWO.lsp", @"/a/three.lsp", nil];
-    [TsOCModrigUtil addPathNames:more toArrayController:table];
-    EXPECT_THAT(rowsOf(table), ElementsAre(L"/a/one.lsp", L"/a/two.lsp", L"/a/three.lsp"));
-}
-
 TEST_F(Bridge, AddsPathsByTheEqualityOfRows)
 {
     // The same letter in one character and in two, as file systems hand it out.

@@ -301,7 +301,7 @@ TEST_F(SystemPanel, LoadsAtEveryPressThoughItAsksNoMoreOnceItIsRefused)
     EXPECT_EQ(3u, lines().size());
 }
 
-TEST_F(SystemPanel, LoadsWhatIsChosenAnewThoughItHasNotAskedAboutItBefore)
+TEST_F(SystemPanel, LoadsAnotherChoiceAlsoWhereItHasWaitedToAskAboutAFileOfIt)
 {
     for (const char* name : {"a.lsp", "b.lsp", "c.lsp"})
         file(name);

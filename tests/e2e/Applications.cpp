@@ -81,6 +81,21 @@ void storeSuite(const HostSession& session, const Paths& paths)
     ASSERT_EQ(result.exitStatus, 0) << result.output;
 }
 
+std::string suiteInFile(const Paths& paths)
+{
+    std::string text = "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
+                       std::string(kSuiteKey) + "]\n\"NumStartup\"=\"" + std::to_string(paths.size()) +
+                       "\"\n";
+    for (std::size_t index = 0; index < paths.size(); ++index)
+        text += "\"" + std::to_string(index + 1) + "Startup\"=\"" + paths[index] + "\"\n";
+    return text;
+}
+
+void layOutSuite(const HostSession& session, const std::string& place, const std::string& application)
+{
+    session.folder().write("layout/" + place, suiteInFile({application}));
+}
+
 void putOffModrig(const HostSession& session)
 {
     const std::string set = std::string("REGISTRY SET ") + kRecordKey;

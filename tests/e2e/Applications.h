@@ -37,6 +37,10 @@ std::string inQuotes(const std::string& text);
 std::string setInSuite(const std::string& name, const std::string& data);
 // Stores the Startup Suite, in a session that loads nothing.
 void storeSuite(const HostSession& session, const Paths& paths);
+// The text of a registry file with a Startup Suite.
+std::string suiteInFile(const Paths& paths);
+// Lays out a Suite of one application for everybody; `place`: below the session's folder `layout`.
+void layOutSuite(const HostSession& session, const std::string& place, const std::string& application);
 // Makes the host leave Modrig alone until somebody asks for it. Otherwise nothing can be done before it is
 // loaded.
 void putOffModrig(const HostSession& session);

@@ -113,6 +113,12 @@ HostSession::HostSession()
     set("WAYLAND_DISPLAY", "");
 }
 
+void HostSession::startBoundByRights()
+{
+    if (geteuid() == 0)
+        startBy("exec setpriv --bounding-set=-dac_override,-dac_read_search -- \"$0\" \"$@\"");
+}
+
 void HostSession::set(const std::string& variable, const std::string& value)
 {
     std::erase_if(mEnvironment, [&](const auto& change) { return change.first == variable; });

@@ -55,6 +55,9 @@ public:
     // A shell command that starts the host, which it knows as "$0" "$@": for limits and pipes.
     void startBy(const std::string& shellCommand) { mLauncher = {"/bin/sh", "-c", shellCommand}; }
 
+    // Rights of files bind the administrator only who gives up his own.
+    void startBoundByRights();
+
     // Changes the environment that the host is started in. It has no display from the beginning.
     void set(const std::string& variable, const std::string& value);
 

@@ -1,8 +1,6 @@
 // What an administrator lays out for everybody who starts Tessel on a machine.
 #include <gmock/gmock.h>
 
-#include <unistd.h>
-
 #include "tests/e2e/Applications.h"
 
 using testing::EndsWith;
@@ -20,14 +18,6 @@ protected:
         std::filesystem::create_directories(session.folder() / "layout");
     }
 
-    // A Startup Suite of one application.
-    void layOutSuite(const std::string& file, const std::string& application)
-    {
-        session.folder().write("layout/" + file,
-                               "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
-                                   std::string(kSuiteKey) + "]\n\"NumStartup\"=\"1\"\n\"1Startup\"=\"" +
-                                   application + "\"\n");
-    }
     std::string apps() { return session.run({"APPS"}).output; }
 
     HostSession session;
@@ -36,7 +26,7 @@ protected:
 
 TEST_F(Layout, OfASuiteIsLoadedByEverybody)
 {
-    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    layOutSuite(session, "suite.reg", sample("hilbert.lsp"));
     EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
     EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp"))) << "and at the second start";
     session.nameProfile("another");
@@ -45,7 +35,7 @@ TEST_F(Layout, OfASuiteIsLoadedByEverybody)
 
 TEST_F(Layout, GivesWayToAPersonsOwnSuite)
 {
-    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    layOutSuite(session, "suite.reg", sample("hilbert.lsp"));
     storeSuite(session, {sample("calendar.qbc")});
     EXPECT_THAT(apps(), EndsWith(listed(sample("calendar.qbc"), "Lisp")));
     EXPECT_THAT(apps(), Not(HasSubstr("hilbert.lsp")));
@@ -53,7 +43,7 @@ TEST_F(Layout, GivesWayToAPersonsOwnSuite)
 
 TEST_F(Layout, ThatIsPolicyStandsBeforeAPersonsOwnSuite)
 {
-    layOutSuite("policy/suite.reg", sample("hilbert.lsp"));
+    layOutSuite(session, "policy/suite.reg", sample("hilbert.lsp"));
     storeSuite(session, {sample("calendar.qbc")});
     EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
     EXPECT_THAT(apps(), Not(HasSubstr("calendar.qbc")));
@@ -61,7 +51,7 @@ TEST_F(Layout, ThatIsPolicyStandsBeforeAPersonsOwnSuite)
 
 TEST_F(Layout, ThatIsPolicyCannotBeTakenOutAndThePersonIsTold)
 {
-    layOutSuite("policy/suite.reg", sample("hilbert.lsp"));
+    layOutSuite(session, "policy/suite.reg", sample("hilbert.lsp"));
     const std::string key = kSuiteKey;
     const auto file = (session.folder() / "layout/policy/suite.reg").string();
     const auto removed = session.run({"REGISTRY DELETE " + key + " 1Startup"});
@@ -81,7 +71,7 @@ TEST_F(Layout, ThatIsPolicyCannotBeTakenOutAndThePersonIsTold)
 
 TEST_F(Layout, OfASuiteIsLoadedAgainAfterItWasOutOfReach)
 {
-    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    layOutSuite(session, "suite.reg", sample("hilbert.lsp"));
     EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
     const auto layout = session.folder() / "layout";
     const auto away = session.folder() / "away";
@@ -102,13 +92,13 @@ TEST_F(Layout, ThatIsPolicyReachesWhoHasEmptiedTheirSuite)
     storeSuite(session, {});
     apps();
     EXPECT_THAT(apps(), EndsWith("Command: APPS\nNo application is loaded.\n"));
-    layOutSuite("policy/suite.reg", sample("hilbert.lsp"));
+    layOutSuite(session, "policy/suite.reg", sample("hilbert.lsp"));
     EXPECT_THAT(apps(), EndsWith(listed(sample("hilbert.lsp"), "Lisp")));
 }
 
 TEST_F(Layout, OfASuiteIsLoadedOnceItsProfileIsTheCurrentOne)
 {
-    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    layOutSuite(session, "suite.reg", sample("hilbert.lsp"));
     for (int start = 0; start < 2; ++start)
         session.run({"PROFILE empty"});
     ASSERT_THAT(apps(), EndsWith("Command: APPS\nNo application is loaded.\n"));
@@ -130,7 +120,7 @@ TEST_F(Layout, IsNotLookedAtForAProfileThatIsTheCurrentOneAlready)
 // In a safe session nothing of it was loaded; only the layout knows the whole path.
 TEST_F(Layout, OfASuiteIsKnownToDisableByItsNames)
 {
-    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    layOutSuite(session, "suite.reg", sample("hilbert.lsp"));
     session.alwaysWith({"--layout-dir", (session.folder() / "layout").string(), "--safe"});
     const auto disabled = session.run({"DISABLE hilbert.lsp"});
     EXPECT_EQ(disabled.exitStatus, 0) << disabled.output;
@@ -139,7 +129,7 @@ TEST_F(Layout, OfASuiteIsKnownToDisableByItsNames)
 
 TEST_F(Layout, ThatIsDamagedIsToldAtEveryStartAndDoesNotCount)
 {
-    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    layOutSuite(session, "suite.reg", sample("hilbert.lsp"));
     const auto file = session.folder().write("layout/zz.reg", "damaged");
     EXPECT_THAT(apps(),
                 HasSubstr("\nThe values for everybody in " + file.string() + " do not count: in line 1 "));
@@ -159,10 +149,9 @@ TEST_F(Layout, ThatIsABottomlessKeyDoesNotCountAndHarmsNothing)
 
 TEST_F(Layout, InAFolderThatCannotBeReadIsToldAndDoesNotCount)
 {
-    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    layOutSuite(session, "suite.reg", sample("hilbert.lsp"));
     const auto layout = session.folder() / "layout";
-    if (geteuid() == 0)
-        session.startBy("exec setpriv --bounding-set=-dac_override,-dac_read_search -- \"$0\" \"$@\"");
+    session.startBoundByRights();
     for (const auto& folder : {layout / "policy", layout})
     {
         std::filesystem::create_directories(folder);
@@ -187,7 +176,7 @@ TEST(LayoutFolder, ThatIsToBeTriedHasToBeThere)
 
 TEST_F(Layout, IsNotPartOfWhatAPersonExports)
 {
-    layOutSuite("suite.reg", sample("hilbert.lsp"));
+    layOutSuite(session, "suite.reg", sample("hilbert.lsp"));
     const auto file = session.folder() / "mine.reg";
     const auto exported = session.run({"REGISTRY EXPORT " + std::string(kSuiteKey) + " " + file.string()});
     EXPECT_THAT(exported.output, HasSubstr("there is no such key.\n"));

@@ -21,6 +21,21 @@ constexpr char kModrigWaits[] =
     "the Startup Suite with it.\n";
 constexpr char kNoWindow[] = "Tessel cannot open a window: there is no display.\n";
 
+std::string historyOf(int entries)
+{
+    std::string file =
+        "Windows Registry Editor Version 5.00\n\n"
+        "[HKEY_CURRENT_USER\\Software\\Tessel\\R21\\Profiles\\Default\\Dialogs\\Modrig\\History]\n"
+        "\"NumHistory\"=\"" +
+        std::to_string(entries) + "\"\n";
+    for (int number = 1; number <= entries; ++number)
+    {
+        const std::string digits = std::to_string(number);
+        file += "\"" + digits + "History\"=\"/nowhere/" + digits + ".lsp\"\n";
+    }
+    return file;
+}
+
 class ListCommands : public testing::Test
 {
 protected:
@@ -46,35 +61,20 @@ protected:
         return json::parse(result.output);
     }
 
-    std::vector<std::string> suite() const
+    std::vector<std::string> pathsIn(const std::string& name) const
     {
         std::vector<std::string> paths;
-        const json list = asJson("SUITE LIST");
+        const json list = asJson(name + " LIST");
         for (const auto& file : list["files"])
             paths.push_back(file["path"]);
         return paths;
     }
-
-    std::vector<std::string> history() const
-    {
-        std::vector<std::string> paths;
-        const json list = asJson("HISTORY LIST");
-        for (const auto& file : list["files"])
-            paths.push_back(file["path"]);
-        return paths;
-    }
+    std::vector<std::string> suite() const { return pathsIn("SUITE"); }
+    std::vector<std::string> history() const { return pathsIn("HISTORY"); }
 
     std::string write(const std::string& name) const
     {
         return session.folder().write(name, "(princ \"" + name + " runs\")\n").string();
-    }
-
-    void layDownSuite(const std::string& file, const std::string& application) const
-    {
-        session.folder().write("layout/" + file,
-                               "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
-                                   std::string(kSuiteKey) + "]\n\"NumStartup\"=\"1\"\n\"1Startup\"=\"" +
-                                   application + "\"\n");
     }
 
     HostSession session;
@@ -192,7 +192,18 @@ TEST_F(ListCommands, HaveOneEntryForAFileHoweverItsPathIsTyped)
             {"--safe", "-c", "CD " + folder, "-c", "SUITE REMOVE " + way, "-c", "HISTORY REMOVE " + way});
         EXPECT_EQ(removed.exitStatus, 0) << removed.output;
         EXPECT_TRUE(suite().empty()) << way;
+        EXPECT_TRUE(history().empty()) << way;
     }
+}
+
+TEST_F(ListCommands, CountAFileThatIsTypedTwiceOnce)
+{
+    const std::string inAnotherWay = "/." + first;
+    EXPECT_EQ(quietly("HISTORY ADD " + first + " " + inAnotherWay),
+              "first.lsp was added to the History list.\n");
+    EXPECT_EQ(quietly("HISTORY REMOVE " + inAnotherWay + " " + first),
+              "first.lsp was removed from the History list.\n");
+    EXPECT_TRUE(history().empty());
 }
 
 TEST_F(ListCommands, KeepALinkAsItWasTyped)
@@ -309,17 +320,7 @@ TEST_F(ListCommands, AddToAListOfManyEntries)
     Paths many;
     for (int number = 1; number <= 3000; ++number)
         many.push_back("/nowhere/" + std::to_string(number) + ".lsp");
-    session.folder().write(
-        "many.reg",
-        [&]
-        {
-            std::string text = "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
-                               std::string(kSuiteKey) + "]\n\"NumStartup\"=\"3000\"\n";
-            for (std::size_t index = 0; index < many.size(); ++index)
-                text += "\"" + std::to_string(index + 1) + "Startup\"=\"" + many[index] + "\"\n";
-            return text;
-        }());
-    quietly("REGISTRY IMPORT " + (session.folder() / "many.reg").string());
+    quietly("REGISTRY IMPORT " + session.folder().write("many.reg", suiteInFile(many)).string());
     quietly("SUITE ADD " + first);
     many.push_back(first);
     EXPECT_EQ(suite(), many);
@@ -483,7 +484,7 @@ TEST_F(ListCommands, ChangeNothingWhileAnotherTesselWorksWithTheProfile)
 TEST_F(ListCommands, ChangeNothingThatTheAdministratorHasLaidDown)
 {
     session.alwaysWith({"--layout-dir", (session.folder() / "layout").string()});
-    layDownSuite("policy/suite.reg", first);
+    layOutSuite(session, "policy/suite.reg", first);
     const std::string stays = "The administrator has laid down the Startup Suite in " +
                               (session.folder() / "layout/policy/suite.reg").string() +
                               ": it stays as it is.\n";
@@ -501,13 +502,35 @@ TEST_F(ListCommands, ChangeNothingThatTheAdministratorHasLaidDown)
 TEST_F(ListCommands, ChangeWhatIsOnlyADefault)
 {
     session.alwaysWith({"--layout-dir", (session.folder() / "layout").string()});
-    layDownSuite("suite.reg", first);
+    layOutSuite(session, "suite.reg", first);
     quietly("SUITE ADD " + second);
     EXPECT_THAT(suite(), ElementsAre(first, second));
     quietly("SUITE REMOVE " + first);
     EXPECT_THAT(suite(), ElementsAre(second));
     quietly("SUITE CLEAR");
     EXPECT_TRUE(suite().empty());
+}
+
+// Wherever the limit is met: while the list is written, or at the end of the command.
+TEST_F(ListCommands, DoNotSayThatALongListIsRemovedWhereThatCannotBeStored)
+{
+    constexpr int kMany = 300;
+    constexpr int kPage = 8; // of the store, in what `ulimit` counts
+    constexpr int kEnough = 30 * kPage;
+    quietly("REGISTRY IMPORT " + session.folder().write("long.reg", historyOf(kMany)).string());
+    int limit = 0;
+    for (bool stored = false; !stored && limit < kEnough;)
+    {
+        limit += kPage;
+        session.startBy("ulimit -f " + std::to_string(limit) + "; exec \"$0\" \"$@\"");
+        const auto result = session.start({"--safe", "-c", "HISTORY CLEAR"});
+        stored = result.exitStatus == 0;
+        EXPECT_EQ(result.output.find("were removed") != result.output.npos, stored) << limit << result.output;
+    }
+    session.startBy("exec \"$0\" \"$@\"");
+    EXPECT_GT(limit, 3 * kPage);
+    EXPECT_LT(limit, kEnough);
+    EXPECT_TRUE(history().empty());
 }
 
 TEST_F(ListCommands, FailWhenTheRegistryCannotBeWritten)

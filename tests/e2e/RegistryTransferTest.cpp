@@ -1,8 +1,6 @@
 // Parts of the registry that go to files and come back, as a person types it.
 #include <gmock/gmock.h>
 
-#include <unistd.h>
-
 #include "tests/e2e/Applications.h"
 #include "tests/support/Content.h"
 
@@ -165,8 +163,7 @@ TEST_F(RegistryTransfer, StoresNothingInARegistryThatMayOnlyBeRead)
     expectWell(session.run({"REGISTRY SET My a old"}));
     session.folder().write(file.filename(), kBegin + "[HKCU\\My]\n\"a\"=\"new\"\n");
     fs::permissions(session.profile() / "registry.db", fs::perms::owner_read);
-    if (geteuid() == 0)
-        session.startBy("exec setpriv --bounding-set=-dac_override,-dac_read_search -- \"$0\" \"$@\"");
+    session.startBoundByRights();
     const auto result = session.run({"REGISTRY IMPORT " + quotedFile});
     EXPECT_EQ(result.exitStatus, 1) << result.output;
     EXPECT_THAT(result.output, HasSubstr("is not imported: "));

@@ -80,9 +80,7 @@ TEST_F(RollingOut, MakesItPolicyThatAPersonCannotChange)
 // A file that is not understood would not count, and nobody would be told before the next start.
 TEST_F(RollingOut, FailsWhenTesselDoesNotSeeWhatWasLaidOut)
 {
-    session.folder().write("etc/tessel/zzz.reg",
-                           std::string("Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\") +
-                               kSuiteKey + "]\n\"NumStartup\"=\"0\"\n");
+    session.folder().write("etc/tessel/zzz.reg", suiteInFile({}));
     const auto rolled = roll({sample("primes.zmb")});
     EXPECT_NE(rolled.status, 0);
     EXPECT_THAT(rolled.output, HasSubstr("Assertion failed"));

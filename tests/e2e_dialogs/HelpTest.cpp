@@ -3,16 +3,16 @@
 #include <fstream>
 
 #include "tests/e2e_dialogs/DialogTest.h"
+#include "tests/support/ShellProgram.h"
 
 class DialogHelp : public DialogTest
 {
 protected:
     DialogHelp()
     {
-        const auto opener = mSession.folder().write(
-            "bin/xdg-open", "#!/bin/sh\nprintf %s \"$1\" >" + note().string() + ".new && mv " +
-                                note().string() + ".new " + note().string() + "\n");
-        std::filesystem::permissions(opener, std::filesystem::perms::owner_all);
+        const auto opener = writeProgram(mSession.folder(), "bin/xdg-open",
+                                         "printf %s \"$1\" >" + note().string() + ".new && mv " +
+                                             note().string() + ".new " + note().string());
         mSession.set("PATH", opener.parent_path().string() + ":" + std::getenv("PATH"));
     }
 

@@ -31,25 +31,19 @@ protected:
     HeldRegistry()
     {
         storeSuite(session, {fixtureModule("Good.zmb"), lispFixture("good.lsp")});
-        EXPECT_EQ(runSql(file(), "PRAGMA journal_mode=DELETE"), "delete");
+        useOldJournal(file());
     }
-    ~HeldRegistry() override { letGo(); }
 
     fs::path file() const { return session.profile() / "registry.db"; }
 
-    // In the words of sqlite3's SQL.
-    void hold(const char* by)
-    {
-        ASSERT_EQ(sqlite3_open(file().c_str(), &mHolder), SQLITE_OK);
-        ASSERT_EQ(sqlite3_exec(mHolder, by, nullptr, nullptr, nullptr), SQLITE_OK) << by;
-    }
+    void hold(const char* by) { mHolder.hold(file(), by); }
     // What was changed is in the file by then, and what it was in the journal.
     void holdInTheMidstOfWriting()
     {
         hold("BEGIN EXCLUSIVE; UPDATE value SET data='half'");
-        ASSERT_EQ(sqlite3_db_cacheflush(mHolder), SQLITE_OK);
+        mHolder.writeOut();
     }
-    void letGo() { sqlite3_close(std::exchange(mHolder, nullptr)); }
+    void letGo() { mHolder.letGo(); }
 
     // How a session of one command went, which is to have waited that long for the registry.
     std::string outputAfterWaiting(seconds atLeast, seconds lessThan)
@@ -73,7 +67,7 @@ protected:
     HostSession session;
 
 private:
-    sqlite3* mHolder = nullptr;
+    DatabaseHolder mHolder;
 };
 } // namespace
 

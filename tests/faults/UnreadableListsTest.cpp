@@ -2,7 +2,6 @@
 #include <gmock/gmock.h>
 
 #include <sys/stat.h>
-#include <unistd.h>
 
 #include "tests/e2e/Applications.h"
 #include "tests/support/Content.h"
@@ -27,11 +26,7 @@ protected:
         session.alwaysWith({"--safe"});
         EXPECT_EQ(session.run({"SUITE ADD " + application, "HISTORY ADD " + application}).exitStatus, 0);
     }
-    ~UnreadableLists() override
-    {
-        chmod(file().c_str(), 0600);
-        sqlite3_close(mHolder);
-    }
+    ~UnreadableLists() override { chmod(file().c_str(), 0600); }
 
     fs::path file() const { return session.profile() / "registry.db"; }
     fs::path copy() const { return file().string() + ".sound"; }
@@ -46,18 +41,16 @@ protected:
     void takeRightsAway()
     {
         ASSERT_EQ(chmod(file().c_str(), 0), 0);
-        if (geteuid() == 0)
-            session.startBy("exec setpriv --bounding-set=-dac_override,-dac_read_search -- \"$0\" \"$@\"");
+        session.startBoundByRights();
     }
 
     // By a program that also changes it whenever it is copied.
     void hold()
     {
-        EXPECT_EQ(runSql(file(), "PRAGMA journal_mode=DELETE"), "delete");
+        useOldJournal(file());
         session.set("LD_PRELOAD", FAULTY_CALLS);
         session.set("MODRIG_FAULT_TOUCH", "1");
-        ASSERT_EQ(sqlite3_open(file().c_str(), &mHolder), SQLITE_OK);
-        ASSERT_EQ(sqlite3_exec(mHolder, "BEGIN EXCLUSIVE", nullptr, nullptr, nullptr), SQLITE_OK);
+        mHolder.hold(file(), "BEGIN EXCLUSIVE");
     }
 
     std::string cannotBeUsed(const std::string& reason) const
@@ -89,7 +82,7 @@ protected:
         "LIST", "LIST --json", "ADD " + application, "REMOVE " + application, "CLEAR", "CLEAR --json"};
 
 private:
-    sqlite3* mHolder = nullptr;
+    DatabaseHolder mHolder;
 };
 } // namespace
 
@@ -136,7 +129,7 @@ TEST_F(UnreadableLists, ThatAnotherProgramHoldsSaySo)
 TEST_F(UnreadableLists, WithADamagedEntryAreNotToldAsIfItWereNotThere)
 {
     session.run({"SUITE ADD " + sample("gears.omp")});
-    runSql(file(), "PRAGMA journal_mode=DELETE");
+    useOldJournal(file());
     runSql(file(), "UPDATE value SET data='/other' WHERE name='1Startup'");
     expectTold("SUITE LIST", kOfTheSuite + ("The registry " + file().string() + " is damaged: the value"));
     expectTold("SUITE ADD " + application, kOfTheSuite);
@@ -156,11 +149,8 @@ TEST_F(UnreadableLists, OnStandardErrorLeaveNothingForProgramsToRead)
 TEST_F(UnreadableLists, ThatAnAdministratorHasLaidDownAreStillTold)
 {
     session.folder().write("layout/policy/all.reg",
-                           "Windows Registry Editor Version 5.00\n\n"
-                           "[HKEY_CURRENT_USER\\Software\\Tessel\\R21\\Profiles]\n@=\"Default\"\n"
-                           "[HKEY_CURRENT_USER\\" +
-                               std::string(kSuiteKey) + "]\n\"NumStartup\"=\"1\"\n\"1Startup\"=\"" +
-                               application + "\"\n");
+                           suiteInFile({application}) +
+                               "[HKEY_CURRENT_USER\\Software\\Tessel\\R21\\Profiles]\n@=\"Default\"\n");
     session.alwaysWith({"--safe", "--layout-dir", (session.folder() / "layout").string()});
     cutShort();
     const auto result = session.run({"SUITE LIST"});
@@ -171,9 +161,7 @@ TEST_F(UnreadableLists, ThatAnAdministratorHasLaidDownAreStillTold)
 
 TEST_F(UnreadableLists, OfWhichOnlyTheDefaultsAreKnownAreNotTakenForThose)
 {
-    session.folder().write("layout/all.reg", "Windows Registry Editor Version 5.00\n\n[HKEY_CURRENT_USER\\" +
-                                                 std::string(kSuiteKey) +
-                                                 "]\n\"NumStartup\"=\"1\"\n\"1Startup\"=\"/default.lsp\"\n");
+    layOutSuite(session, "all.reg", "/default.lsp");
     session.alwaysWith({"--safe", "--layout-dir", (session.folder() / "layout").string()});
     cutShort();
     expectTold("SUITE LIST", kOfTheSuite);

@@ -6,7 +6,6 @@
 #include <csignal>
 
 #include <sys/stat.h>
-#include <unistd.h>
 
 #include "tests/e2e/Applications.h"
 #include "tests/e2e/HostTerminal.h"
@@ -42,14 +41,10 @@ protected:
     fs::path file() const { return session.profile() / "registry.db"; }
     fs::path beside(const std::string& ending) const { return file().string() + ending; }
 
-    void useOldJournal() const { EXPECT_EQ(runSql(file(), "PRAGMA journal_mode=DELETE"), "delete"); }
-
-    // Rights bind the administrator only who gives up his own.
     void giveRights(const fs::path& path, mode_t rights)
     {
         EXPECT_EQ(chmod(path.c_str(), rights), 0) << path;
-        if (geteuid() == 0)
-            session.startBy("exec setpriv --bounding-set=-dac_override,-dac_read_search -- \"$0\" \"$@\"");
+        session.startBoundByRights();
     }
 
     void failWith(const std::string& fault)
@@ -122,7 +117,7 @@ TEST_F(UnwritableStore, OnAFullDiskNamesThatReason)
 {
     failWith("pwrite 1 ever " + std::to_string(ENOSPC));
     expectReadAndTold("No space left on device", kMakeRoom);
-    useOldJournal();
+    useOldJournal(file());
     expectReadAndTold("No space left on device", kMakeRoom);
 }
 
@@ -130,7 +125,7 @@ TEST_F(UnwritableStore, WhereFilesMayNotGrowNamesThatReason)
 {
     session.startBy("ulimit -f 0; exec \"$0\" \"$@\"");
     expectReadAndTold("File too large", kLiftLimit);
-    useOldJournal();
+    useOldJournal(file());
     expectReadAndTold("File too large", kLiftLimit);
 }
 
@@ -139,7 +134,7 @@ TEST_F(UnwritableStore, InAFolderThatMayNotBeWrittenNamesThatReason)
     giveRights(session.profile(), 0555);
     expectReadAndTold(kFolder, kGrant);
     giveRights(session.profile(), 0700);
-    useOldJournal();
+    useOldJournal(file());
     giveRights(session.profile(), 0555);
     expectReadAndTold(kFolder, kGrant);
 }
@@ -237,7 +232,7 @@ TEST_F(UnwritableStore, ReadsALogThatAKilledSessionHasLeftWhereTheFileMayNotBeWr
 // What it had not finished is undone, also where that cannot be written down.
 TEST_F(UnwritableStore, ReadsWhatWasStoredBeforeASessionWasKilledInTheMidstOfWriting)
 {
-    useOldJournal();
+    useOldJournal(file());
     leaveHalfWritten("BEGIN; UPDATE value SET data='/half of it'");
     ASSERT_NE(contentOf(file()).find("/half of it"), std::string::npos);
     giveRights(session.profile(), 0555);

@@ -11,15 +11,14 @@
 #include "host/app/TerminalWindow.h"
 #include "host/app/platform/Terminal.h"
 #include "tests/support/EnvironmentVariable.h"
-#include "tests/support/TemporaryFolder.h"
+#include "tests/support/ShellProgram.h"
 
 TEST(Finder, GetsAWindowOfTerminalWithTesselInIt)
 {
     const TemporaryFolder folder;
     const auto note = folder / "note";
     mkfifo(note.c_str(), 0600);
-    const auto opener = folder.write("open", "#!/bin/sh\nprintf '%s\\n' \"$@\" >'" + note.string() + "'\n");
-    std::filesystem::permissions(opener, std::filesystem::perms::owner_all);
+    writeProgram(folder, "open", "printf '%s\\n' \"$@\" >'" + note.string() + "'");
     const EnvironmentVariable path("PATH", folder.path().string() + ":" + std::getenv("PATH"));
     const tessel::ProgramStart byFinder = {1, 1, false, false};
     const auto program = "/Applications/My Tessel.app/Contents/MacOS/Tessel";

@@ -5,8 +5,7 @@
 
 #include <gmock/gmock.h>
 
-#include "tests/support/ShellCommand.h"
-#include "tests/support/TemporaryFolder.h"
+#include "tests/packages/TreeOfPrograms.h"
 
 namespace fs = std::filesystem;
 using testing::AllOf;
@@ -15,7 +14,7 @@ using testing::Not;
 
 namespace
 {
-class MacReport : public testing::Test
+class MacReport : public TreeOfPrograms
 {
 protected:
     MacReport()
@@ -33,26 +32,17 @@ protected:
                 "case $* in *--modrig*) exec sleep 60 ;; esac; echo Tessel \"$@\" ~");
     }
 
-    void program(const std::string& name, const std::string& body) const
-    {
-        fs::permissions(folder.write(name, "#!/bin/sh\n" + body + "\n"), fs::perms::owner_all);
-    }
-    void tells(const std::string& name) const { program(name, "echo \"${0##*/} $*.\""); }
-
     CommandOutcome report(const std::string& parts = "") const
     {
         return runCommand("HOME='" + (folder / "home").string() +
-                          "' MACOS_REPORT_PATIENCE=1 MACOS_REPORT_LIMIT=2 PATH='" +
-                          (folder / "bin").string() + "':/usr/bin:/bin '" +
-                          (folder / "tools/macos_report").string() + "' " + parts + " 2>&1");
+                          "' MACOS_REPORT_PATIENCE=1 MACOS_REPORT_LIMIT=2 " + path() + "'" +
+                          (folder / "tools/macos_report").string() + "' " + parts);
     }
     std::string written(const std::string& name = "report.md") const
     {
         std::ifstream file(folder / "build/macos-report" / name);
         return {std::istreambuf_iterator<char>(file), {}};
     }
-
-    TemporaryFolder folder;
 };
 } // namespace
 

@@ -3,42 +3,30 @@
 
 #include <gmock/gmock.h>
 
-#include "tests/support/ShellCommand.h"
-#include "tests/support/TemporaryFolder.h"
+#include "tests/packages/TreeOfPrograms.h"
 
 namespace fs = std::filesystem;
 using testing::HasSubstr;
 
 namespace
 {
-class MacSign : public testing::Test
+class MacSign : public TreeOfPrograms
 {
 protected:
     MacSign()
     {
         for (const char* file : {"MacOS/Tessel", "MacOS/libtessel.dylib", "MacOS/tesselc",
                                  "PlugIns/A.bundle/Contents/MacOS/A", "PlugIns/A.reg", "Resources/icon"})
-        {
-            fs::create_directories((app() / file).parent_path());
             folder.write("Tessel.app/Contents/" + std::string(file), "");
-        }
-        fs::create_directories(folder / "bin");
         codesign("echo \"$@\" | sed -e 's|" + folder.path().string() +
                  "/||' -e 's|/[^ ]*/packaging/tessel.entitlements |entitled |'");
     }
 
-    fs::path app() const { return folder / "Tessel.app/Contents"; }
-    void codesign(const std::string& body) const
-    {
-        fs::permissions(folder.write("bin/codesign", "#!/bin/sh\n" + body + "\n"), fs::perms::owner_all);
-    }
+    void codesign(const std::string& lines) const { program("bin/codesign", lines); }
     CommandOutcome sign(const std::string& words) const
     {
-        return runCommand("cd '" + folder.path().string() + "' && PATH='" + (folder / "bin").string() +
-                          "':/usr/bin:/bin '" MACOS_SIGN "' " + words);
+        return runCommand("cd '" + folder.path().string() + "' && " + path() + "'" MACOS_SIGN "' " + words);
     }
-
-    TemporaryFolder folder;
 };
 } // namespace
 

@@ -3,8 +3,7 @@
 
 #include <gmock/gmock.h>
 
-#include "tests/support/ShellCommand.h"
-#include "tests/support/TemporaryFolder.h"
+#include "tests/packages/TreeOfPrograms.h"
 
 namespace fs = std::filesystem;
 using testing::AllOf;
@@ -14,7 +13,7 @@ using testing::Not;
 
 namespace
 {
-class Run : public testing::Test
+class Run : public TreeOfPrograms
 {
 protected:
     Run()
@@ -22,15 +21,10 @@ protected:
         fs::copy_file(RUN, folder / "run");
         for (const char* name :
              {"tools/setup", "tools/tour", "tools/demo_profile", "build/release/Tessel.app/Tessel"})
-            program(name, "echo \"${0##*/} $*.\"");
+            tells(name);
         program("bin/cmake",
                 "printf '[0/2] Re-checking globbed directories...\\n[1/3] Building a\\n[3/3] Linking b\\n'");
         folder.write("build/release/build.ninja", "");
-    }
-
-    void program(const std::string& name, const std::string& body) const
-    {
-        fs::permissions(folder.write(name, "#!/bin/sh\n" + body + "\n"), fs::perms::owner_all);
     }
 
     std::string command(const std::string& arguments) const
@@ -51,8 +45,6 @@ protected:
         return runCommand("script --quiet --return --command 'sh " + script.string() +
                           "' /dev/null </dev/null");
     }
-
-    TemporaryFolder folder;
 };
 } // namespace
 
@@ -77,7 +69,7 @@ TEST_F(Run, PlaysTheTourWhereThereIsNoTerminal)
 TEST_F(Run, StartsTesselOnAMacWhichHasNoDisplayForATour)
 {
     program("bin/uname", "echo Darwin");
-    program("build/release/Tessel.app/Contents/MacOS/Tessel", "echo \"${0##*/} $*.\"");
+    tells("build/release/Tessel.app/Contents/MacOS/Tessel");
     const auto outcome = run("");
     EXPECT_EQ(outcome.status, 0) << outcome.output;
     EXPECT_THAT(outcome.output, AllOf(HasSubstr("Tessel --profile-dir"), Not(HasSubstr("tour"))));

@@ -4,8 +4,7 @@
 
 #include <gmock/gmock.h>
 
-#include "tests/support/ShellCommand.h"
-#include "tests/support/TemporaryFolder.h"
+#include "tests/packages/TreeOfPrograms.h"
 
 namespace fs = std::filesystem;
 using testing::AllOf;
@@ -19,7 +18,7 @@ const char kAllForBuilding[] =
     "cmake ninja pkgconf ecl bdw-gc sqlite icu4c@77 openssl@3 libedit cli11 nlohmann-json gettext "
     "boost llvm lld librsvg ";
 
-class SetupOnMac : public testing::Test
+class SetupOnMac : public TreeOfPrograms
 {
 protected:
     SetupOnMac()
@@ -32,12 +31,6 @@ protected:
             program(installer, "echo \"Asked to install: $*\"");
     }
 
-    void program(const std::string& name, const std::string& body) const
-    {
-        const auto file = folder.write(name, "#!/bin/sh\n" + body + "\n");
-        fs::permissions(file, fs::perms::owner_all);
-    }
-
     // What Homebrew has installed. All else that it is asked for counts as installing.
     void has(const std::string& formulae) const
     {
@@ -48,11 +41,8 @@ protected:
 
     CommandOutcome setup(const std::string& option = "") const
     {
-        return runCommand("PATH='" + (folder / "bin").string() + "':/usr/bin:/bin " SETUP " " + option +
-                          " 2>&1");
+        return runCommand(path() + SETUP " " + option);
     }
-
-    TemporaryFolder folder;
 };
 } // namespace
 

@@ -1,14 +1,11 @@
 // What is installed before anything is built, on a machine that has none of it.
-#include <filesystem>
 #include <fstream>
 #include <iterator>
 
 #include <gmock/gmock.h>
 
-#include "tests/support/ShellCommand.h"
-#include "tests/support/TemporaryFolder.h"
+#include "tests/packages/TreeOfPrograms.h"
 
-namespace fs = std::filesystem;
 using testing::AllOf;
 using testing::HasSubstr;
 using testing::Not;
@@ -16,27 +13,23 @@ using testing::Not;
 namespace
 {
 // Programs in the place of those that know and install packages.
-class Setup : public testing::Test
+class Setup : public TreeOfPrograms
 {
 protected:
     Setup()
     {
-        program("id", "echo 0");
-        program("apt-get", "echo \" $* \" >>\"$(dirname \"$0\")/../asked\"");
-        program("apt-cache", "printf 'gnustep-back%s\\n' 0.29-cairo 0.31-cairo 0.31-xlib -common 0.4-cairo");
+        program("bin/id", "echo 0");
+        program("bin/apt-get", "echo \" $* \" >>\"$(dirname \"$0\")/../asked\"");
+        program("bin/apt-cache",
+                "printf 'gnustep-back%s\\n' 0.29-cairo 0.31-cairo 0.31-xlib -common 0.4-cairo");
         installed("nothing");
-    }
-
-    void program(const std::string& name, const std::string& body) const
-    {
-        const auto file = folder.write("bin/" + name, "#!/bin/sh\n" + body + "\n");
-        fs::permissions(file, fs::perms::owner_all);
     }
 
     // The package as the pattern of a shell has it.
     void installed(const std::string& pattern) const
     {
-        program("dpkg-query", "case $3 in " + pattern + ") echo installed ;; *) echo not-installed ;; esac");
+        program("bin/dpkg-query",
+                "case $3 in " + pattern + ") echo installed ;; *) echo not-installed ;; esac");
     }
 
     // What apt was asked for.
@@ -48,8 +41,6 @@ protected:
         std::ifstream file(folder / "asked");
         return {std::istreambuf_iterator<char>(file), {}};
     }
-
-    TemporaryFolder folder;
 };
 } // namespace
 

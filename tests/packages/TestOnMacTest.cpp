@@ -3,8 +3,7 @@
 
 #include <gmock/gmock.h>
 
-#include "tests/support/ShellCommand.h"
-#include "tests/support/TemporaryFolder.h"
+#include "tests/packages/TreeOfPrograms.h"
 
 namespace fs = std::filesystem;
 using testing::AllOf;
@@ -13,7 +12,7 @@ using testing::Not;
 
 namespace
 {
-class TestOnMac : public testing::Test
+class TestOnMac : public TreeOfPrograms
 {
 protected:
     TestOnMac()
@@ -21,26 +20,19 @@ protected:
         fs::copy_file(TEST_EVERYTHING, folder / "test");
         for (const char* name :
              {"tools/setup", "tools/static_checks", "tools/check_macos", "bin/cmake", "bin/ctest"})
-            program(name, "echo \"${0##*/} $*.\"");
+            tells(name);
         system("Darwin");
         folder.write("build/debug/build.ninja", "");
         folder.write("build/asan/build.ninja", "");
         folder.write("build/tsan/build.ninja", "");
     }
 
-    void program(const std::string& name, const std::string& body) const
-    {
-        fs::permissions(folder.write(name, "#!/bin/sh\n" + body + "\n"), fs::perms::owner_all);
-    }
     void system(const std::string& name) const { program("bin/uname", "echo " + name); }
 
     CommandOutcome test(const std::string& arguments = "") const
     {
-        return runCommand("PATH='" + (folder / "bin").string() + "':/usr/bin:/bin '" +
-                          (folder / "test").string() + "' " + arguments + " 2>&1");
+        return runCommand(path() + "'" + (folder / "test").string() + "' " + arguments);
     }
-
-    TemporaryFolder folder;
 };
 } // namespace
 

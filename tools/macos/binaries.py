@@ -68,26 +68,28 @@ def load_commands(file, processor):
     return run("llvm-objdump", "--macho", f"--arch={processor}", "--private-headers", file)
 
 
-def places(file, processor):
-    """Where the file looks for libraries, and what it calls itself: places of the system, or from where it stands."""
-    named = re.findall(r"cmd LC_(?:RPATH|LOAD_DYLIB|ID_DYLIB)\n.*\n\s*(?:path|name) (\S+)", load_commands(file, processor))
+def foreign_places(commands):
+    """Where a file looks for libraries, and what it calls itself, beyond places of the system and those from where it stands."""
+    named = re.findall(r"cmd LC_(?:RPATH|LOAD_DYLIB|ID_DYLIB)\n.*\n\s*(?:path|name) (\S+)", commands)
     return [place for place in named if not place.startswith(("@rpath/", "@loader_path", "/usr/", "/System/"))]
 
 
-def oldest_system(file, processor):
-    commands = load_commands(file, processor)
+def oldest_system(commands):
     found = re.search(r"cmd LC_BUILD_VERSION\n(?:.*\n)*?\s*minos (\S+)", commands)
     return found.group(1) if found else "none"
 
 
 def faults(file, wanted, system):
     """`wanted`: the symbols that it exports, or None when any will do. `system`: the oldest version that it is built for."""
+    halves = processors(file)
     for processor in ("arm64", "x86_64"):
-        if processor not in processors(file):
+        if processor not in halves:
             yield f"{file.name} has no half for {processor}"
             continue
         yield from exports(file, processor, wanted) if wanted is not None else ()
         yield from (f"{file.name} calls {symbol}, for {processor}, which no library has" for symbol in found_nowhere(file, processor))
-        yield from (f"{file.name} cannot be moved, for {processor}: {place}" for place in places(file, processor))
-        if oldest_system(file, processor) != system:
-            yield f"{file.name} runs from macOS {oldest_system(file, processor)} on, for {processor}, and not {system}"
+        commands = load_commands(file, processor)
+        yield from (f"{file.name} cannot be moved, for {processor}: {place}" for place in foreign_places(commands))
+        oldest = oldest_system(commands)
+        if oldest != system:
+            yield f"{file.name} runs from macOS {oldest} on, for {processor}, and not {system}"

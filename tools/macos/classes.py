@@ -1,5 +1,5 @@
 """Our classes and the system's as one family: who descends from whom, and what each answers to."""
-from .sources import setter
+from .sources import getters, setter
 from .tables import Kind
 
 
@@ -36,7 +36,7 @@ class Classes:
 
     def gives(self, name, key):
         """Whether something can be read of it by that key."""
-        return any(self._reads(name, selector) for selector in (key, f"is{key[:1].upper()}{key[1:]}"))
+        return any(self._reads(name, selector) for selector in getters(key))
 
     def acts(self, name, selector):
         """Whether it is an action: of ours one that says so."""

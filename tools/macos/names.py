@@ -1,7 +1,7 @@
 """Checks what sources name in texts, where no compiler looks: keys, selectors and layouts, which raise when they are not there."""
 import re
 
-from .sources import named, setter, without_comments
+from .sources import getters, named, setter, without_comments
 
 KEY = re.compile(r'\b(?:valueForKey|valueForKeyPath|willChangeValueForKey|didChangeValueForKey):\s*@"([\w.]+)"')
 SELECTOR = re.compile(r'\bNSSelectorFromString\(\s*@"([\w:]+)"')
@@ -20,7 +20,7 @@ def faults(files, sources, tables, layouts):
         text = without_comments(file)
         for found in KEY.finditer(text):
             for key in found.group(1).split("."):
-                if known.isdisjoint((key, f"is{key[:1].upper()}{key[1:]}", setter(key))):
+                if known.isdisjoint((*getters(key), setter(key))):
                     yield f"{place(file, text, found)}: reads the key {key}, which nothing has"
         for found in SELECTOR.finditer(text):
             if found.group(1) not in known:

@@ -110,22 +110,28 @@ def setter(name):
     return f"set{name[:1].upper()}{name[1:]}:"
 
 
+def getters(key):
+    """By which of these something may be read by that key."""
+    return key, f"is{key[:1].upper()}{key[1:]}"
+
+
 class Sources:
     """`called`: selectors of messages and selectors and keys that are named. `sent`: messages by what stands first in them."""
 
     def __init__(self, files, others=(), layouts=()):
         """`others`: sources for another system, which call as well. `layouts`: XIB files, which do so by name."""
         self.classes, self.protocols, self.called, self.sent = {}, {}, set(), set()
+        texts = {file: without_comments(file) for file in (*files, *others)}
         for file in files:
-            text = without_comments(file)
+            text = texts[file]
             for found in PROTOCOL.finditer(text):
                 self.protocols[found.group(1)] = {selector for _, selector, _, _ in methods_in(found.group(3), ";")}
             for found in INTERFACE.finditer(text):
                 self._read_interface(file, text[:found.start(5)].count("\n") + 1, *found.group(1, 3, 4, 5))
             for found in IMPLEMENTATION.finditer(text):
                 self._read_implementation(file, text[:found.start(2)].count("\n") + 1, *found.groups())
-        for file in (*files, *others):
-            self._read_calls(without_comments(file))
+        for text in texts.values():
+            self._read_calls(text)
         for file in layouts:
             self._call(*(name for pair in NAMED.findall(file.read_text(encoding="utf-8")) for name in pair))
 

@@ -3,6 +3,7 @@
 #include <curl/curl.h>
 
 #include <cstdlib>
+#include <string_view>
 
 #include <tessel/tsdefs.h>
 
@@ -124,8 +125,9 @@ public:
 } // namespace
 } // namespace tessel
 
-extern "C" TESSEL_EXPORT tessel::Network* tesselNetwork()
+// Null for a host of another version, which may know these classes with other members.
+extern "C" TESSEL_EXPORT tessel::Network* tesselNetwork(const char* versionOfHost)
 {
     static tessel::CurlNetwork network;
-    return &network;
+    return std::string_view(versionOfHost) == TESSEL_VERSION ? &network : nullptr;
 }

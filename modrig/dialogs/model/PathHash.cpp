@@ -7,10 +7,10 @@ namespace ModrigUtils
 {
 namespace
 {
-constexpr char16_t kLastAscii = 0x7F;
+constexpr wchar_t kLastAscii = 0x7F;
 // The accents that are characters of their own.
-constexpr char16_t kFirstAccent = 0x0300;
-constexpr char16_t kLastAccent = 0x036F;
+constexpr wchar_t kFirstAccent = 0x0300;
+constexpr wchar_t kLastAccent = 0x036F;
 
 // Nothing else is equal to these and their capitals without regard to case. Left out are the letters that
 // something is: the s (long s), the k (Kelvin), those of ligatures.
@@ -29,8 +29,7 @@ constexpr auto kCertain = []
     return certain;
 }();
 
-template <class Path>
-bool IsAccent(const Path& path, std::size_t index)
+bool IsAccent(std::wstring_view path, std::size_t index)
 {
     return index < path.size() && path[index] >= kFirstAccent && path[index] <= kLastAccent;
 }
@@ -38,12 +37,12 @@ bool IsAccent(const Path& path, std::size_t index)
 // FNV-1a: bytes as they come, none of them kept.
 constexpr std::uint64_t kHashStart = 0xCBF29CE484222325;
 constexpr std::uint64_t kHashFactor = 0x100000001B3;
+} // namespace
 
 // Paths that are equal may differ in more than their letters' case: an accent can be a character of its own,
 // after its letter, or part of it. So a letter counts only where no such character follows. Any other
 // character that follows leaves it alone: what that one is equal to may be a plain letter.
-template <class Path>
-std::size_t HashOf(const Path& path)
+std::size_t HashOfPath(std::wstring_view path)
 {
     std::uint64_t hash = kHashStart;
     for (std::size_t index = 0; index < path.size(); ++index)
@@ -53,16 +52,5 @@ std::size_t HashOf(const Path& path)
             hash = (hash ^ static_cast<unsigned char>(kCertain[character])) * kHashFactor;
     }
     return hash;
-}
-} // namespace
-
-std::size_t HashOfPath(std::u16string_view path)
-{
-    return HashOf(path);
-}
-
-std::size_t HashOfPath(std::wstring_view path)
-{
-    return HashOf(path);
 }
 } // namespace ModrigUtils

@@ -7,7 +7,5 @@
 namespace ModrigUtils
 {
 // The same for all paths that the toolkit finds equal without regard to case, and seldom the same for others.
-// It is the same for a path in either encoding.
-[[nodiscard]] std::size_t HashOfPath(std::u16string_view path);
 [[nodiscard]] std::size_t HashOfPath(std::wstring_view path);
 } // namespace ModrigUtils

@@ -252,6 +252,7 @@ void OpenDialogTest::lookAtMessageBox(const wchar_t* text, const wchar_t* detail
 
 - (void)schedule
 {
+    [NSObject cancelPreviousPerformRequestsWithTarget:self];
     [self performSelector:@selector(runStep) withObject:nil afterDelay:0.05 inModes:kStepModes];
 }
 
@@ -283,12 +284,15 @@ void OpenDialogTest::lookAtMessageBox(const wchar_t* text, const wchar_t* detail
     const std::size_t step = next++;
     if (++tries > kMostTries)
         [self giveUp];
-    // Scheduled first: a step may open another modal run, which goes on with the steps after it.
+    // Scheduled first: a step may open another modal run, which goes on with the steps after it. And once
+    // more: a step that lets the loop go on, as a click does, may have used that up, and the event alone
+    // wakes nobody.
     [self schedule];
     if (!(*steps)[step].run())
         next = step;
     else
         tries = 0;
+    [self schedule];
     [self wakeLoop];
 }
 

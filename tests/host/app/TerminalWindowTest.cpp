@@ -9,7 +9,7 @@
 #include <unistd.h>
 
 #include "host/app/TerminalWindow.h"
-#include "tests/support/TemporaryFolder.h"
+#include "tests/support/ShellProgram.h"
 
 using tessel::goesOnInTerminal;
 using tessel::ProgramStart;
@@ -28,9 +28,7 @@ protected:
 
     ProgramWords words() const
     {
-        const auto opener =
-            mFolder.write("open", "#!/bin/sh\nprintf '%s' \"$*\" >'" + mNote.string() + "'\n");
-        std::filesystem::permissions(opener, std::filesystem::perms::owner_all);
+        const auto opener = writeProgram(mFolder, "open", "printf '%s' \"$*\" >'" + mNote.string() + "'");
         return {opener.string(), "/Applications/Tessel"};
     }
     std::string opened() const

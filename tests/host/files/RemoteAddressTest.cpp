@@ -11,7 +11,7 @@ namespace
 {
 std::string sha256(const std::string& text)
 {
-    const auto checksum = tessel::network()->checksum();
+    const auto checksum = (*tessel::network())->checksum();
     checksum->add(text);
     return checksum->finish();
 }

@@ -10,7 +10,7 @@
 #include "host/messages/Browser.h"
 #include "host/messages/platform/Desktop.h"
 #include "tests/support/EnvironmentVariable.h"
-#include "tests/support/TemporaryFolder.h"
+#include "tests/support/ShellProgram.h"
 
 namespace fs = std::filesystem;
 
@@ -27,9 +27,10 @@ protected:
     // A program that tells which page it was given, and then does not end before somebody has read it.
     void install(const std::string& name, bool runs = true)
     {
-        const fs::path program = mFolder.write(
-            "programs/" + name, "#!/bin/sh\nprintf '%s in " + name + "' \"$1\" >'" + mNote.string() + "'\n");
-        fs::permissions(program, runs ? fs::perms::owner_all : fs::perms::owner_read);
+        const auto program = writeProgram(mFolder, "programs/" + name,
+                                          "printf '%s in " + name + "' \"$1\" >'" + mNote.string() + "'");
+        if (!runs)
+            fs::permissions(program, fs::perms::owner_read);
     }
 
     std::string opened() const

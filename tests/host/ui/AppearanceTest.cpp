@@ -6,7 +6,7 @@
 
 #include <gtest/gtest.h>
 
-#include "tests/support/TemporaryFolder.h"
+#include "tests/support/ShellProgram.h"
 
 using tessel::windowing::Appearance;
 using namespace tessel::windowing;
@@ -32,11 +32,7 @@ protected:
         unsetenv("GTK_THEME");
     }
 
-    void answer(const std::string& text)
-    {
-        const auto program = mFolder.write("gdbus", "#!/bin/sh\necho '" + text + "'\n");
-        std::filesystem::permissions(program, std::filesystem::perms::owner_all);
-    }
+    void answer(const std::string& text) { writeProgram(mFolder, "gdbus", "echo '" + text + "'"); }
 
     TemporaryFolder mFolder;
 
@@ -62,8 +58,7 @@ TEST_F(ChosenAppearance, FollowsTheDesktop)
 TEST_F(ChosenAppearance, IsAskedForInOneCallThatWaitsForASecondAtMost)
 {
     const auto asked = mFolder / "asked";
-    const auto program = mFolder.write("gdbus", "#!/bin/sh\necho \"$*\" >'" + asked.string() + "'\n");
-    std::filesystem::permissions(program, std::filesystem::perms::owner_all);
+    writeProgram(mFolder, "gdbus", "echo \"$*\" >'" + asked.string() + "'");
     EXPECT_EQ(Appearance::kLight, chosenAppearance("auto"));
     std::ifstream file(asked);
     std::string words;

@@ -35,7 +35,7 @@ const wchar_t* callName(RecordingRegistry::Operation operation)
 {
     static constexpr const wchar_t* kNames[] = {L"RegOpenKeyExW",   L"RegCreateKeyEx", L"RegEnumValueW",
                                                 L"RegDeleteValueW", L"tsRegGetValue",  L"tsudRegSetString",
-                                                L"RegCloseKey"};
+                                                L"RegCloseKey",     L"RegFlushKey"};
     return kNames[static_cast<std::size_t>(operation)];
 }
 
@@ -252,6 +252,14 @@ LONG RecordingRegistry::remove(HKEY key, const wchar_t* name)
         return status;
     Key* found = find(*path);
     return found && found->erase(valueName) ? ERROR_SUCCESS : ERROR_FILE_NOT_FOUND;
+}
+
+LONG RecordingRegistry::flush(HKEY key)
+{
+    const std::wstring* path = openPath(key);
+    if (!path && key != HKEY_CURRENT_USER)
+        return ERROR_INVALID_HANDLE;
+    return record({.operation = Operation::kFlush, .key = path ? *path : std::wstring()});
 }
 
 LONG RecordingRegistry::close(HKEY key)

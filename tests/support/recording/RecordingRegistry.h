@@ -25,7 +25,8 @@ public:
         kDelete,
         kRead,
         kWrite,
-        kClose
+        kClose,
+        kFlush
     };
 
     // One call of the registry functions.
@@ -87,6 +88,7 @@ public:
                    DWORD* dataSize);
     LONG remove(HKEY key, const wchar_t* name);
     LONG close(HKEY key);
+    LONG flush(HKEY key);
     LONG read(Call call, HKEY key, const wchar_t* name, DWORD* type, void* data, DWORD* size);
     LONG write(HKEY key, const wchar_t* name, const wchar_t* data);
 

@@ -37,6 +37,11 @@ LONG RegCloseKey(HKEY key)
     return recordingHost().registry.close(key);
 }
 
+LONG RegFlushKey(HKEY key)
+{
+    return recordingHost().registry.flush(key);
+}
+
 LONG tsRegGetValue(HKEY key, const wchar_t* name, DWORD reserved, DWORD* type, void* data, DWORD* size)
 {
     RecordingRegistry::Call call = {.reserved = reserved};

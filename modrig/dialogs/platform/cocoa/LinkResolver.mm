@@ -1,7 +1,5 @@
 #include "modrig/dialogs/platform/LinkResolver.h"
 
-#import <Foundation/Foundation.h>
-
 #include "modrig/dialogs/Paths.h"
 
 namespace ModrigPlatform
@@ -15,8 +13,7 @@ public:
 
     const CStdStr& Resolve(const CStdStr& path) override
     {
-        NSString* text = ModrigUtils::StringFromPath(path);
-        mResolved = ModrigUtils::PathFromString([text stringByResolvingSymlinksInPath]);
+        mResolved = ModrigUtils::ResolvedByToolkit(path);
         return mResolved;
     }
 

@@ -2,7 +2,6 @@
 
 #import <Foundation/Foundation.h>
 
-#include <algorithm>
 #include <cerrno>
 #include <cstdlib>
 #include <limits.h>
@@ -18,15 +17,8 @@ namespace ModrigPlatform
 {
 namespace
 {
-constexpr wchar_t kFirstBeyondAscii = 0x80;
 // Reading the name of an entry takes a quarter of the time that the question about a file does.
 constexpr std::size_t kNamesForOneQuestion = 4;
-
-bool IsAscii(std::wstring_view text)
-{
-    return std::all_of(text.begin(), text.end(),
-                       [](wchar_t character) { return character > 0 && character < kFirstBeyondAscii; });
-}
 
 // Whether the folder holds no links, as far as that can be told from the names of so many entries at most.
 bool HoldsNoLinks(const std::string& folder, std::size_t most)
@@ -115,7 +107,7 @@ struct Parts
     bool AreApart() const
     {
         return !folder.empty() && folder.front() == L'/' && !name.empty() && name != L"." && name != L".." &&
-               IsAscii(name);
+               ModrigUtils::IsAscii(name);
     }
 
     std::wstring_view folder;
@@ -162,8 +154,7 @@ private:
 
     const CStdStr& AskToolkit(const CStdStr& path)
     {
-        NSString* text = ModrigUtils::StringFromPath(path);
-        mResolved = ModrigUtils::PathFromString([text stringByResolvingSymlinksInPath]);
+        mResolved = ModrigUtils::ResolvedByToolkit(path);
         return mResolved;
     }
 
