@@ -3,7 +3,7 @@
 #include <cstdint>
 
 #include <ecl/ecl.h>
-#include <zlib.h>
+#include <libdeflate.h>
 
 #include "host/text/Translation.h"
 
@@ -27,8 +27,7 @@ constexpr std::size_t kNumbersSize = 4 * kNumberSize;
 
 std::uint32_t addToChecksum(std::uint32_t checksum, std::string_view bytes)
 {
-    return static_cast<std::uint32_t>(
-        crc32_z(checksum, reinterpret_cast<const Bytef*>(bytes.data()), bytes.size()));
+    return libdeflate_crc32(checksum, bytes.data(), bytes.size());
 }
 
 void appendNumber(std::string& bytes, std::uint32_t number)

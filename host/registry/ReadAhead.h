@@ -13,9 +13,9 @@ class Statement;
 class ReadAhead
 {
 public:
-    // Asked of the table alone, which is quicker than an index, and may be another key's.
+    // Asked of the table alone, which is quicker than an index, and may be another key's: their sums tell.
     static constexpr const char* kRowsAfter =
-        "SELECT seq, key, sum, name, fold, data FROM value WHERE seq>?1 ORDER BY seq";
+        "SELECT seq, sum, name, fold, data FROM value WHERE seq>?1 ORDER BY seq";
 
     // A row was found by a search: of the key, and with that place among all rows.
     void noteFound(std::int64_t key, std::int64_t place);

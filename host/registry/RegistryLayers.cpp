@@ -5,7 +5,7 @@
 #include <system_error>
 #include <utility>
 
-#include <zlib.h>
+#include <libdeflate.h>
 
 #include "host/platform/OrdinaryFile.h"
 #include "host/platform/SystemFailure.h"
@@ -44,8 +44,7 @@ Result<std::vector<fs::path>> registryFilesIn(const fs::path& folder)
 
 std::uint32_t markAfter(std::uint32_t mark, std::string_view bytes)
 {
-    return static_cast<std::uint32_t>(
-        crc32_z(mark, reinterpret_cast<const unsigned char*>(bytes.data()), bytes.size()));
+    return libdeflate_crc32(mark, bytes.data(), bytes.size());
 }
 
 void take(const fs::path& file, RegistryTree& tree, RegistryLayers& layers)

@@ -1,9 +1,9 @@
 #include "host/registry/RowChecksum.h"
 
-#include <zlib.h>
-
 #include <cstring>
 #include <utility>
+
+#include <libdeflate.h>
 
 namespace tessel
 {
@@ -19,7 +19,7 @@ void RowChecksum::addBytes(const void* bytes, std::size_t count)
         sumUp();
     if (count > mGathered.size())
     {
-        mSum = crc32_z(mSum, static_cast<const Bytef*>(bytes), count);
+        mSum = libdeflate_crc32(mSum, bytes, count);
         return;
     }
     if (count > 0)
@@ -30,6 +30,6 @@ void RowChecksum::addBytes(const void* bytes, std::size_t count)
 // The sum of nothing is 0, with which it begins.
 void RowChecksum::sumUp()
 {
-    mSum = crc32_z(mSum, mGathered.data(), std::exchange(mCount, 0));
+    mSum = libdeflate_crc32(mSum, mGathered.data(), std::exchange(mCount, 0));
 }
 } // namespace tessel

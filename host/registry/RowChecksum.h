@@ -34,12 +34,13 @@ private:
 
     std::array<unsigned char, 512> mGathered;
     std::size_t mCount = 0;
-    unsigned long mSum = 0;
+    std::uint32_t mSum = 0;
 };
 
 inline std::int64_t checksumOfValue(std::int64_t key, std::string_view name, std::string_view fold,
                                     std::string_view data)
 {
-    return RowChecksum().add(key).add(name).add(fold).add(data).finish();
+    RowChecksum sum; // RowChecksum() would clear the room for the pieces first
+    return sum.add(key).add(name).add(fold).add(data).finish();
 }
 } // namespace tessel

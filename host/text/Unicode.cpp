@@ -165,15 +165,15 @@ std::wstring foldCase(std::wstring_view text)
 
 std::string foldedUtf8(std::wstring_view text)
 {
-    if (endOfAscii(text) != text.end())
-        return toUtf8(foldCase(text));
     std::string folded(text.size(), '\0');
-    std::transform(text.begin(), text.end(), folded.begin(),
-                   [](wchar_t character)
-                   {
-                       const bool isCapital = character >= L'A' && character <= L'Z';
-                       return static_cast<char>(isCapital ? character + (L'a' - L'A') : character);
-                   });
+    for (std::size_t at = 0; at < text.size(); ++at)
+    {
+        const auto character = static_cast<char32_t>(text[at]);
+        if (character >= kFirstBeyondAscii)
+            return toUtf8(foldCase(text));
+        const bool isCapital = character >= U'A' && character <= U'Z';
+        folded[at] = static_cast<char>(isCapital ? character + (U'a' - U'A') : character);
+    }
     return folded;
 }
 

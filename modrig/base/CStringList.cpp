@@ -1,22 +1,29 @@
 #include "modrig/base/CStringList.h"
 
+#include <string_view>
 #include <utility>
 
+#include "modrig/base/CaseFolding.h"
 #include "modrig/base/SplitPath.h"
 
 namespace
 {
+constexpr std::wstring_view kBundle = L"bundle";
+constexpr std::wstring_view kObjectDatabaseModule = L".omp";
+
 // Object-database modules are the same application wherever they lie. The extension of a split path begins
 // with its dot, so that "bundle" is never equal and bundles are told apart by their folders too: users keep
 // several versions of a bundle in different folders, and adding the dot would make them one.
 bool IsKnownByFileNameAlone(const SplitPath& entry)
 {
-    return entry.HasExtension(L"bundle") || entry.HasExtension(L".omp");
+    const std::wstring_view extension = entry.Extension();
+    return EqualIgnoringCase(extension, kBundle) || EqualIgnoringCase(extension, kObjectDatabaseModule);
 }
 
-std::size_t MatchingHash(const SplitPath& entry)
+std::size_t MatchingHash(const CStdStr& entry)
 {
-    return IsKnownByFileNameAlone(entry) ? entry.FileNameHash() : entry.PathHash();
+    const SplitPath split(entry);
+    return IsKnownByFileNameAlone(split) ? split.FileNameHash() : WholePathHash(entry);
 }
 } // namespace
 
@@ -29,14 +36,13 @@ bool MatchesEntry(const SplitPath& entry, const SplitPath& target)
 
 void CStringList::AddTail(const CStdStr& text)
 {
-    const SplitPath split(text);
-    Append(text, split, split.PathHash());
+    Append(text, SplitPath(text), WholePathHash(text));
 }
 
 const CStdStr* CStringList::AddTailUnlessHeld(CStdStr path)
 {
     const SplitPath target(path);
-    const std::size_t pathHash = target.PathHash();
+    const std::size_t pathHash = WholePathHash(path);
     if (Holds(target, pathHash))
         return nullptr;
     Append(std::move(path), target, pathHash);
@@ -61,7 +67,7 @@ void CStringList::RemoveAll()
 bool CStringList::RemoveFirstNoCase(const CStdStr& text)
 {
     // Texts that are equal without regard to case are split alike, so that all of them stand under one hash.
-    const std::size_t hash = MatchingHash(SplitPath(text));
+    const std::size_t hash = MatchingHash(text);
     auto first = mEntries.end();
     mIndex.AnyUnder(hash,
                     [&](Entries::iterator candidate)
@@ -82,8 +88,7 @@ bool CStringList::HoldsApplication(const CStdStr& path) const
 {
     if (IsEmpty())
         return false;
-    const SplitPath target(path);
-    return Holds(target, target.PathHash());
+    return Holds(SplitPath(path), WholePathHash(path));
 }
 
 bool CStringList::Holds(const SplitPath& target, std::size_t pathHash) const

@@ -22,6 +22,16 @@ wchar_t FoldBeyondAscii(wchar_t character)
         return character;
     return static_cast<wchar_t>(static_cast<int>(code) + range.delta);
 }
+
+// The same for characters that are equal without regard to case. So that nearly all of them need but one
+// look, it is the same for some others too: letters of ASCII differ from their capitals by this bit, and a
+// few of its signs from each other.
+std::uint32_t HashedCharacter(wchar_t character)
+{
+    constexpr std::uint32_t kSmall = L'a' - L'A';
+    const bool isAscii = static_cast<std::uint32_t>(character) < 0x80;
+    return kSmall | static_cast<std::uint32_t>(isAscii ? character : FoldBeyondAscii(character));
+}
 } // namespace
 
 wchar_t FoldCase(wchar_t character)
@@ -67,10 +77,10 @@ std::size_t HashIgnoringCase(std::wstring_view text, std::size_t seed)
     std::size_t at = 0;
     for (; at + 1 < text.size(); at += 2)
     {
-        even = (even ^ static_cast<std::uint32_t>(FoldCase(text[at]))) * kPrime;
-        odd = (odd ^ static_cast<std::uint32_t>(FoldCase(text[at + 1]))) * kPrime;
+        even = (even ^ HashedCharacter(text[at])) * kPrime;
+        odd = (odd ^ HashedCharacter(text[at + 1])) * kPrime;
     }
     if (at < text.size())
-        even = (even ^ static_cast<std::uint32_t>(FoldCase(text[at]))) * kPrime;
+        even = (even ^ HashedCharacter(text[at])) * kPrime;
     return even ^ std::rotl(odd, kApart);
 }

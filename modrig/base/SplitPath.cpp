@@ -39,7 +39,8 @@ std::size_t SplitPath::FileNameHash() const
     return HashIgnoringCase(mTooLong.Text(), HashIgnoringCase(mExtension, HashIgnoringCase(mName)));
 }
 
-std::size_t SplitPath::PathHash() const
+// The parts stand in the path one after the other, with nothing between them.
+std::size_t WholePathHash(const CStdStr& path)
 {
-    return HashIgnoringCase(mFolder, HashIgnoringCase(mDrive, FileNameHash()));
+    return HashIgnoringCase(path.Text());
 }

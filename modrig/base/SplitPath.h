@@ -26,10 +26,8 @@ public:
     bool SameFileName(const SplitPath& other) const;
     bool SameFolder(const SplitPath& other) const;
 
-    // Hashes to go with the two comparisons: equal file names have equal hashes, and so have paths that are
-    // equal in file name and folder.
+    // Equal file names have equal hashes.
     std::size_t FileNameHash() const;
-    std::size_t PathHash() const;
 
 private:
     static constexpr std::size_t kDriveSize = 3;
@@ -43,3 +41,6 @@ private:
     wchar_t mExtension[kExtensionSize];
     CStdStr mTooLong; // the whole path when it could not be taken apart, else empty
 };
+
+// Paths that are equal in file name and folder have equal hashes.
+std::size_t WholePathHash(const CStdStr& path);

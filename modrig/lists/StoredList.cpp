@@ -1,6 +1,8 @@
 #include "modrig/lists/StoredList.h"
 
 #include <cwchar>
+#include <iterator>
+#include <limits>
 #include <string>
 #include <string_view>
 #include <utility>
@@ -19,11 +21,17 @@ CStdStr SubKeyOf(const StoredListNames& names)
 CStdStr EntryName(const StoredListNames& names, long index)
 {
     // Without a format, which would cost more than to read the entry: names are made by the hundred thousand.
-    const std::string digits = std::to_string(index);
+    constexpr long kBase = 10;
+    wchar_t digits[std::numeric_limits<long>::digits10 + 1];
+    wchar_t* first = std::end(digits);
+    long rest = index;
+    do
+        *--first = static_cast<wchar_t>(L'0' + rest % kBase);
+    while ((rest /= kBase) > 0);
     const std::wstring_view end = names.entryEnd;
     std::wstring name;
-    name.reserve(digits.size() + end.size());
-    name.append(digits.begin(), digits.end()).append(end);
+    name.reserve(std::size(digits) + end.size());
+    name.append(first, static_cast<std::size_t>(std::end(digits) - first)).append(end);
     return name;
 }
 

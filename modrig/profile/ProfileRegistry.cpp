@@ -72,7 +72,7 @@ CStdStr GetModrigProfileRegKey()
     return key;
 }
 
-bool ReadModrigRegString(HKEY root, CStdStr subKey, CStdStr valueName, CStdStr& data)
+bool ReadModrigRegString(HKEY root, const CStdStr& subKey, const CStdStr& valueName, CStdStr& data)
 {
     const OpenKey key(root, subKey, Access::kRead);
     if (!key)
@@ -86,7 +86,7 @@ bool ReadModrigRegString(HKEY root, CStdStr subKey, CStdStr valueName, CStdStr& 
     return true;
 }
 
-bool WriteModrigRegString(HKEY root, CStdStr subKey, CStdStr valueName, CStdStr data)
+bool WriteModrigRegString(HKEY root, const CStdStr& subKey, const CStdStr& valueName, const CStdStr& data)
 {
     const OpenKey key(root, subKey, Access::kWrite);
     if (!key)
@@ -98,7 +98,7 @@ bool WriteModrigRegString(HKEY root, CStdStr subKey, CStdStr valueName, CStdStr 
     return tsudRegSetString(key.get(), valueName.c_str(), data.c_str()) == ERROR_SUCCESS;
 }
 
-bool DeleteModrigRegString(HKEY root, CStdStr subKey, CStdStr valueName)
+bool DeleteModrigRegString(HKEY root, const CStdStr& subKey, const CStdStr& valueName)
 {
     const OpenKey key(root, subKey, Access::kWrite);
     if (!key)
@@ -108,7 +108,7 @@ bool DeleteModrigRegString(HKEY root, CStdStr subKey, CStdStr valueName)
     return RegDeleteValueW(key.get(), valueName.c_str()) == ERROR_SUCCESS;
 }
 
-bool EnumModrigRegString(HKEY root, CStdStr subKey, CStringList& names)
+bool EnumModrigRegString(HKEY root, const CStdStr& subKey, CStringList& names)
 {
     names.RemoveAll();
     const OpenKey key(root, subKey, Access::kRead);

@@ -19,11 +19,11 @@ LIBRARIES = "/System/Library/Frameworks/{0}.framework/Versions/A/{0}"
 PASSED_ON = {"Cocoa": [LIBRARIES.format(name) for name in ("AppKit", "CoreFoundation", "CoreGraphics", "Foundation")],
              "Foundation": [LIBRARIES.format("CoreFoundation"), "/usr/lib/libobjc"]}
 # What a Mac has from elsewhere. The headers are the same as here.
-OTHERS = ("sqlite3", "icuuc", "icudata", "icui18n", "curl", "edit", "ecl", "gc", "crypto", "ssl", "z")
+OTHERS = ("sqlite3", "icuuc", "icudata", "icui18n", "curl", "edit", "ecl", "gc", "crypto", "ssl", "deflate")
 # Below /usr/include or its folder for this machine: what belongs to those libraries, and nothing else.
 OTHER_HEADERS = ("sqlite3.h", "sqlite3ext.h", "unicode", "curl", "editline", "histedit.h", "ecl", "gc", "gc.h", "gmp.h", "CLI",
                  "atomic_ops", "atomic_ops.h",
-                 "openssl", "zlib.h", "zconf.h", "boost", "nlohmann")
+                 "openssl", "libdeflate.h", "boost", "nlohmann")
 CLI11 = """add_library(CLI11::CLI11 INTERFACE IMPORTED)
 target_include_directories(CLI11::CLI11 INTERFACE "${CMAKE_CURRENT_LIST_DIR}/../../../include")
 """
@@ -50,7 +50,8 @@ target_link_libraries(gmock_main PUBLIC gmock)
 add_library(GTest::gmock ALIAS gmock)
 add_library(GTest::gmock_main ALIAS gmock_main)
 """
-PACKAGES = {"sqlite3": "-lsqlite3", "icu-uc": "-licuuc -licudata", "libedit": "-ledit"}
+PACKAGES = {"sqlite3": "-lsqlite3", "icu-uc": "-licuuc -licudata", "libedit": "-ledit",
+            "libdeflate": "-ldeflate"}
 
 
 def section_of_tables(library):
@@ -106,8 +107,6 @@ def put_headers(sdk, folder):
     include = sdk / "usr/include"
     for layer in ("any", "12", "arm64", "x86_64"):
         shutil.copytree(folder / "c" / layer, include, dirs_exist_ok=True)
-    for name in ("zlib.h", "zconf.h"):  # CMake takes the folder of these for one of ours, and searches it too early
-        (include / name).unlink()
     shutil.copytree(folder / "c++", include / "c++/v1")
     for name in OTHER_HEADERS:
         link_all(sdk / "usr/local/include" / name, [Path("/usr/include") / name, Path("/usr/include") / machine() / name])

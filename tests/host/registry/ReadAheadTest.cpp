@@ -97,6 +97,16 @@ TEST_F(ReadingAhead, LeavesAnotherKeyToTheSearchAndLetsTheRowGo)
     EXPECT_EQ(step(8, "e"), SQLITE_DONE) << "one row of a key is no order";
 }
 
+TEST_F(ReadingAhead, LeavesTheNameToTheSearchWhereTheNextRowIsAnotherKeysOfThatName)
+{
+    mAhead.noteFound(kKey, 3);
+    mAhead.noteFound(kKey, 4);
+    EXPECT_EQ(step(kKey, "e"), SQLITE_DONE);
+    mAhead.noteFound(8, 3);
+    mAhead.noteFound(8, 4);
+    EXPECT_EQ(step(8, "e"), SQLITE_ROW) << "whose it is";
+}
+
 TEST_F(ReadingAhead, TakesLeapsForNoOrder)
 {
     mAhead.noteFound(kKey, 0);
