@@ -59,6 +59,19 @@ bool IsNumber(const CStdStr& typed)
                                         [](wchar_t digit) { return digit >= L'0' && digit <= L'9'; });
 }
 
+// Why what stands there can never be loaded, whatever it holds.
+CStdStr WhyNoApplication(const CStdStr& path, DWORD attributes)
+{
+    const bool isBundle = path.AfterLastDot().EqualsNoCase(CStdStr(L"bundle"));
+    const bool isFolder = (attributes & FILE_ATTRIBUTE_DIRECTORY) != 0;
+    if ((attributes & FILE_ATTRIBUTE_DEVICE) != 0)
+        return CStdStr::Formatted(ModrigMessages::kFileIsNotOrdinary, path.c_str());
+    if (isFolder != isBundle)
+        return CStdStr::Formatted(isFolder ? ModrigMessages::kFileIsFolder : ModrigMessages::kBundleIsFile,
+                                  path.c_str());
+    return {};
+}
+
 // Why a file cannot join a list; otherwise the path becomes the one that it is found at.
 CStdStr WhyRefused(const KeptList& list, CStdStr& path)
 {
@@ -66,8 +79,11 @@ CStdStr WhyRefused(const KeptList& list, CStdStr& path)
         return CStdStr::OfId(ModrigMessages::kNothingNamed);
     if (!FindExtension(path.AfterLastDot()))
         return CStdStr::Formatted(ModrigMessages::kCannotLoadFile, path.c_str());
-    if (ValidateFileExists(path) == INVALID_FILE_ATTRIBUTES)
+    const DWORD attributes = ValidateFileExists(path);
+    if (attributes == INVALID_FILE_ATTRIBUTES)
         return CStdStr::Formatted(ModrigMessages::kFileNotThere, path.c_str());
+    if (CStdStr refused = WhyNoApplication(path, attributes); !refused.IsEmpty())
+        return refused;
     if (path.Text().size() > kLongestPath)
         return CStdStr::Formatted(ModrigMessages::kPathTooLong, path.c_str());
     if (list.isLoadedAtStart && IsTempInternetFile(path))
