@@ -280,6 +280,9 @@ void Host::addCommands()
 
 void Host::showWhatWasNotTaken()
 {
+    // A module's own box, if it shows one, does not know why.
+    if (const auto& canStore = mParts->registry->canStore(); !canStore)
+        mParts->notTaken.push_back(canStore.sentence());
     for (const std::wstring& sentence : mParts->notTaken)
         static_cast<void>(mParts->messageBox->show(sentence.c_str(), MB_OK | MB_ICONEXCLAMATION, nullptr));
 }
@@ -307,9 +310,17 @@ bool Host::runLisp(const std::wstring& input, const Interruption::Wish& wish)
 bool Host::finishLine()
 {
     // What the line wrote is stored before the queue runs: queued Lisp may take its time, or never end.
-    const bool stored = mCommandLine.tell(mParts->layered->endOfCommand());
+    const bool stored = tellOfStoring();
     mParts->lisp->runQueue();
-    return mCommandLine.tell(mParts->layered->endOfCommand()) && stored;
+    return tellOfStoring() && stored;
+}
+
+bool Host::tellOfStoring()
+{
+    const auto stored = mParts->layered->endOfCommand();
+    if (!stored && mParts->registry->canStore()) // otherwise it is known from the start on
+        mParts->notTaken.push_back(stored.sentence());
+    return mCommandLine.tell(stored);
 }
 
 Result<> Host::runScript(const std::filesystem::path& script)

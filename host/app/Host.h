@@ -66,7 +66,8 @@ public:
     // the registry is stored, and the queued Lisp is evaluated; a store that fails makes the line fail.
     bool run(const std::wstring& input) override;
 
-    // Shows in windows which changes were not taken so far. For whoever has no command line to read it on.
+    // Shows in windows which changes were not taken or not stored so far, and why. For whoever has no command
+    // line to read it on.
     void showWhatWasNotTaken();
 
     // Runs a file of lines as if typed. Scripts may run scripts, to a sensible depth. Fails without a
@@ -109,6 +110,7 @@ private:
     void addShippedRecords();
     void addCommands();
     bool finishLine();
+    bool tellOfStoring();
 
     HostOptions mOptions;
     CommandLine mCommandLine;

@@ -83,7 +83,7 @@ struct Parts
                              {
                                  return wish.isThere();
                              }};
-    std::vector<std::wstring> notTaken; // which changes do not count, and why
+    std::vector<std::wstring> notTaken; // which changes do not count or are not stored, and why
     Owned<LayeredRegistry> layered{*registry, readRegistryLayers(foundations.layoutFolders),
                                    [this](const std::wstring& sentence)
                                    {

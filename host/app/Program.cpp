@@ -102,8 +102,10 @@ int showDialog(Host& host)
     const auto& windows = runningProductFolders().binaries;
     expectSomebodyAtTheDisplay(windows);
     const bool ran = host.run(kDialogCommand);
+    if (!canShowWindows(windows))
+        return kSomethingFailed;
     host.showWhatWasNotTaken();
-    return ran && canShowWindows(windows) ? kAllWell : kSomethingFailed;
+    return ran ? kAllWell : kSomethingFailed;
 }
 
 int runBatch(Host& host, const Options& options)

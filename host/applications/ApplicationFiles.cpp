@@ -4,8 +4,8 @@
 #include <array>
 #include <string_view>
 
-#include "host/applications/ImageCheck.h"
 #include "host/platform/Bundle.h"
+#include "host/platform/ImageCheck.h"
 #include "host/platform/RegularFile.h"
 #include "host/text/Translation.h"
 #include "host/text/Unicode.h"
@@ -29,10 +29,7 @@ bool hasOneOf(const std::array<std::wstring_view, count>& extensions, const std:
 
 bool isSharedLibrary(const std::filesystem::path& path)
 {
-    const RegularFile file(path.native());
-    return file.opened() &&
-           checkMappable(file.size(), [&](std::uint64_t offset, void* buffer, std::size_t size)
-                         { return file.read(offset, buffer, size); });
+    return static_cast<bool>(checkMappable(RegularFile(path.native())));
 }
 } // namespace
 

@@ -7,7 +7,7 @@
 #include <cstdint>
 #include <optional>
 
-#include "host/applications/ImageCheck.h"
+#include "host/platform/ImageCheck.h"
 #include "host/text/Result.h"
 
 namespace tessel

@@ -13,7 +13,8 @@ DWORD GetFileAttributesW(const wchar_t* path)
     struct stat status = {};
     if (!path || !*path || stat(tessel::toUtf8(path).c_str(), &status) != 0)
         return INVALID_FILE_ATTRIBUTES;
-    DWORD attributes = S_ISDIR(status.st_mode) ? FILE_ATTRIBUTE_DIRECTORY : 0;
+    const DWORD folderOrOther = S_ISDIR(status.st_mode) ? FILE_ATTRIBUTE_DIRECTORY : FILE_ATTRIBUTE_DEVICE;
+    DWORD attributes = S_ISREG(status.st_mode) ? 0 : folderOrOther;
     constexpr mode_t kAnyoneMayWrite = S_IWUSR | S_IWGRP | S_IWOTH;
     if ((status.st_mode & kAnyoneMayWrite) == 0)
         attributes |= FILE_ATTRIBUTE_READONLY;

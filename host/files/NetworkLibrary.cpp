@@ -2,9 +2,12 @@
 
 #include <dlfcn.h>
 
+#include <filesystem>
 #include <string>
 
+#include "host/platform/ImageCheck.h"
 #include "host/platform/ProductFolders.h"
+#include "host/platform/RegularFile.h"
 #include "host/text/Translation.h"
 #include "host/text/Unicode.h"
 #include "host/text/Version.h"
@@ -26,19 +29,27 @@ std::wstring lastWordsOfLinker()
     return toWide(words ? words : "");
 }
 
-// Beside the host's library; or where a program has it that is linked with the host's parts.
+// The one beside the host's library; or, where none is, the one that a program has which is linked with the
+// host's parts. Why not is the reason alone.
+Result<void*> openLibrary(const std::filesystem::path& beside)
+{
+    const auto mappable = checkMappable(RegularFile(beside.native()));
+    if (!mappable && mappable.code() != kNothingThere)
+        return Failure{toWide(beside.native()) + L": " + mappable.sentence()};
+    if (void* library = dlopen(mappable ? beside.c_str() : kLinkedLibrary, RTLD_NOW | RTLD_LOCAL))
+        return library;
+    return Failure{mappable ? lastWordsOfLinker() : toWide(beside.native()) + L": " + mappable.sentence()};
+}
+
 Result<Network*> mapNetwork()
 {
     const auto beside = runningProductFolders().binaries / kNetworkLibrary;
-    void* library = dlopen(beside.c_str(), RTLD_NOW | RTLD_LOCAL);
-    const std::wstring reason = library ? std::wstring() : lastWordsOfLinker();
-    if (!library)
-        library = dlopen(kLinkedLibrary, RTLD_NOW | RTLD_LOCAL);
+    const auto library = openLibrary(beside);
     if (!library)
         return Failure{translated(
             L"Tessel's library for the network cannot be used, and Tessel has to be installed again ({})",
-            reason)};
-    const auto ask = reinterpret_cast<NetworkOfVersion>(dlsym(library, kNetwork));
+            library.sentence())};
+    const auto ask = reinterpret_cast<NetworkOfVersion>(dlsym(*library, kNetwork));
     Network* const found = ask ? ask(version().c_str()) : nullptr;
     if (!found)
         return Failure{translated(L"Tessel's library for the network is of another version, and Tessel has "

@@ -3,6 +3,7 @@
 #include <array>
 #include <cerrno>
 #include <csignal>
+#include <initializer_list>
 #include <utility>
 
 #include <fcntl.h>
@@ -43,21 +44,12 @@ public:
 
     void leaveTheTerminal()
     {
-        posix_spawnattr_setflags(&mAttributes, POSIX_SPAWN_SETSID);
+        leaveAsUsual({}, POSIX_SPAWN_SETSID);
         posix_spawn_file_actions_addopen(&mFiles, STDIN_FILENO, kNowhere, O_RDONLY, 0);
         posix_spawn_file_actions_addopen(&mFiles, STDERR_FILENO, kNowhere, O_WRONLY, 0);
     }
 
-    // The signals that the host does without are as they usually are.
-    void shareTheTerminal()
-    {
-        sigset_t usual;
-        sigemptyset(&usual);
-        for (const int signal : {SIGINT, SIGQUIT, SIGPIPE, SIGXFSZ})
-            sigaddset(&usual, signal);
-        posix_spawnattr_setsigdefault(&mAttributes, &usual);
-        posix_spawnattr_setflags(&mAttributes, POSIX_SPAWN_SETSIGDEF);
-    }
+    void shareTheTerminal() { leaveAsUsual({SIGINT, SIGQUIT}, 0); }
 
     // Nothing when there is no such program. To be called once, with all of the above settled.
     std::optional<pid_t> start(ProgramWords words)
@@ -73,6 +65,19 @@ public:
     }
 
 private:
+    // These signals, and those that the host does without, do to the program what they usually do.
+    void leaveAsUsual(std::initializer_list<int> signals, int otherFlags)
+    {
+        sigset_t usual;
+        sigemptyset(&usual);
+        for (const int signal : {SIGPIPE, SIGXFSZ})
+            sigaddset(&usual, signal);
+        for (const int signal : signals)
+            sigaddset(&usual, signal);
+        posix_spawnattr_setsigdefault(&mAttributes, &usual);
+        posix_spawnattr_setflags(&mAttributes, static_cast<short>(POSIX_SPAWN_SETSIGDEF | otherFlags));
+    }
+
     posix_spawn_file_actions_t mFiles{};
     posix_spawnattr_t mAttributes{};
 };

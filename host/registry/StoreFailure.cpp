@@ -12,6 +12,9 @@ namespace
 {
 constexpr int kKind = 0xFF; // of a status: the rest says more
 
+// Nobody has the rights that are missing there.
+constexpr int kOfReadOnlyFileSystem = SQLITE_PERM | 0x100;
+
 int kindOf(int status)
 {
     return status & kKind;
@@ -52,8 +55,9 @@ int codeOf(int systemError)
         return SQLITE_TOOBIG;
     case EACCES:
     case EPERM:
-    case EROFS:
         return SQLITE_PERM;
+    case EROFS:
+        return kOfReadOnlyFileSystem;
     default:
         return SQLITE_CANTOPEN;
     }
@@ -87,6 +91,8 @@ Failure systemsFailure(sqlite3* database, int status)
 
 std::wstring whatHelpsFirst(int code)
 {
+    if (code == kOfReadOnlyFileSystem)
+        return translated(L"Have the file system made writable");
     switch (kindOf(code))
     {
     case SQLITE_BUSY:

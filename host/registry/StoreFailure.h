@@ -12,7 +12,7 @@ namespace tessel
 {
 // The end of a sentence, in the system's words where the system is the reason. The code is the status, or the
 // one that says more: SQLITE_FULL where there is no room, SQLITE_TOOBIG where a limit is in force,
-// SQLITE_PERM where rights are missing.
+// SQLITE_PERM, or a code of this kind, where rights are missing.
 Failure storeFailure(sqlite3* database, int status);
 
 // The same for a call of the system itself.

@@ -31,6 +31,9 @@ inline constexpr unsigned kPlaceIsNoFile = 153; // what was typed, in the list
 inline constexpr unsigned kQuotesNeeded = 154;  // the name, which gets them
 inline constexpr unsigned kNothingNamed = 155;
 inline constexpr unsigned kTooManyAdded = 156; // the limit, how many there were, name of the list
+inline constexpr unsigned kFileIsFolder = 157; // full path, as the next two
+inline constexpr unsigned kFileIsNotOrdinary = 158;
+inline constexpr unsigned kBundleIsFile = 159;
 
 inline constexpr unsigned kLaidDown = 160;         // name of the list, file
 inline constexpr unsigned kOtherSessionRuns = 161; // name of the list

@@ -59,6 +59,19 @@ bool IsNumber(const CStdStr& typed)
                                         [](wchar_t digit) { return digit >= L'0' && digit <= L'9'; });
 }
 
+// Why what stands there can never be loaded, whatever it holds.
+CStdStr WhyNoApplication(const CStdStr& path, DWORD attributes)
+{
+    const bool isBundle = path.AfterLastDot().EqualsNoCase(CStdStr(L"bundle"));
+    const bool isFolder = (attributes & FILE_ATTRIBUTE_DIRECTORY) != 0;
+    if ((attributes & FILE_ATTRIBUTE_DEVICE) != 0)
+        return CStdStr::Formatted(ModrigMessages::kFileIsNotOrdinary, path.c_str());
+    if (isFolder != isBundle)
+        return CStdStr::Formatted(isFolder ? ModrigMessages::kFileIsFolder : ModrigMessages::kBundleIsFile,
+                                  path.c_str());
+    return {};
+}
+
 // Why a file cannot join a list; otherwise the path becomes the one that it is found at.
 CStdStr WhyRefused(const KeptList& list, CStdStr& path)
 {
@@ -66,8 +79,11 @@ CStdStr WhyRefused(const KeptList& list, CStdStr& path)
         return CStdStr::OfId(ModrigMessages::kNothingNamed);
     if (!FindExtension(path.AfterLastDot()))
         return CStdStr::Formatted(ModrigMessages::kCannotLoadFile, path.c_str());
-    if (ValidateFileExists(path) == INVALID_FILE_ATTRIBUTES)
+    const DWORD attributes = ValidateFileExists(path);
+    if (attributes == INVALID_FILE_ATTRIBUTES)
         return CStdStr::Formatted(ModrigMessages::kFileNotThere, path.c_str());
+    if (CStdStr refused = WhyNoApplication(path, attributes); !refused.IsEmpty())
+        return refused;
     if (path.Text().size() > kLongestPath)
         return CStdStr::Formatted(ModrigMessages::kPathTooLong, path.c_str());
     if (list.isLoadedAtStart && IsTempInternetFile(path))
@@ -109,19 +125,43 @@ CStdStr NotInList(const KeptList& list, const CStdStr& typed)
                               CStdStr::OfId(list.inText).c_str());
 }
 
-// The place of what counts instead of the data; empty when the data would count.
-CStdStr LaidDownInstead(const CStdStr& key, const CStdStr& name, const CStdStr& data)
+// What the administrator has laid down of a list, while this is there.
+class LaidDownValues
 {
-    HKEY open = nullptr;
-    if (RegOpenKeyExW(HKEY_CURRENT_USER, key.c_str(), 0, KEY_READ, &open) != ERROR_SUCCESS)
-        return {};
-    wchar_t place[kPlaceSize] = {};
-    const bool laidDown = tsRegIsLaidDown(open, name.c_str(), place, kPlaceSize);
-    RegCloseKey(open);
-    CStdStr counts;
-    const bool isTheSame = ReadModrigRegString(HKEY_CURRENT_USER, key, name, counts) && counts == data;
-    return laidDown && !isTheSame ? CStdStr(std::wstring(place)) : CStdStr();
-}
+public:
+    explicit LaidDownValues(const StoredListNames& names) : mPath(SubKeyOf(names))
+    {
+        mIsOpen = RegOpenKeyExW(HKEY_CURRENT_USER, mPath.c_str(), 0, KEY_READ, &mKey) == ERROR_SUCCESS;
+    }
+    ~LaidDownValues()
+    {
+        if (mIsOpen)
+            RegCloseKey(mKey);
+    }
+    LaidDownValues(const LaidDownValues&) = delete;
+    LaidDownValues& operator=(const LaidDownValues&) = delete;
+
+    bool Have(const CStdStr& name) const
+    {
+        return mIsOpen && tsRegIsLaidDown(mKey, name.c_str(), nullptr, 0);
+    }
+
+    // The place of what counts instead of the data; empty when the data would count.
+    CStdStr PlaceOfOther(const CStdStr& name, const CStdStr& data) const
+    {
+        wchar_t place[kPlaceSize] = {};
+        CStdStr counts;
+        if (!Have(name) || (ReadModrigRegString(HKEY_CURRENT_USER, mPath, name, counts) && counts == data))
+            return {};
+        static_cast<void>(tsRegIsLaidDown(mKey, name.c_str(), place, kPlaceSize)); // it is, as was seen
+        return CStdStr(std::wstring(place));
+    }
+
+private:
+    const CStdStr mPath;
+    HKEY mKey = nullptr;
+    bool mIsOpen = false;
+};
 
 bool LeadsToAFile(const CStdStr& typed)
 {
@@ -147,24 +187,23 @@ CStdStr HintAtQuotes(const std::vector<CStdStr>& typed, const std::function<bool
 // What the host says of a value that it may have missed; empty when it is what was read.
 CStdStr WhyMissed(const CStdStr& key, const CStdStr& name)
 {
-    wchar_t reason[kReasonSize] = {};
+    wchar_t reason[kReasonSize]; // looked at only where it is filled: to clear it takes longer than to ask
     const bool mayBeMissed = tsRegMayHaveMissed(key.c_str(), name.c_str(), reason, kReasonSize);
     return mayBeMissed ? CStdStr(std::wstring(reason)) : CStdStr();
 }
 
-// A list ends at its first gap, and what cannot be read looks like one.
-CStdStr WhyMissed(const StoredListNames& names)
+// Of a list of which so many entries were read. It ends at its first gap, and what cannot be read looks like
+// one.
+CStdStr WhyMissed(const StoredListNames& names, long entriesRead)
 {
     const CStdStr key = SubKeyOf(names);
-    CStdStr value;
+    CStdStr count;
     CStdStr missed = WhyMissed(key, CStdStr(names.count));
-    bool isThere = ReadModrigRegString(HKEY_CURRENT_USER, key, CStdStr(names.count), value);
-    const long count = std::wcstol(value.c_str(), nullptr, 10);
-    for (long number = 1; missed.IsEmpty() && isThere && number <= count; ++number)
-    {
+    if (!missed.IsEmpty() || !ReadModrigRegString(HKEY_CURRENT_USER, key, CStdStr(names.count), count))
+        return missed;
+    const long last = std::min(std::wcstol(count.c_str(), nullptr, 10), entriesRead + 1);
+    for (long number = 1; missed.IsEmpty() && number <= last; ++number)
         missed = WhyMissed(key, EntryName(names, number));
-        isThere = ReadModrigRegString(HKEY_CURRENT_USER, key, EntryName(names, number), value);
-    }
     return missed;
 }
 } // namespace
@@ -203,8 +242,8 @@ const KeptList& KeptHistory()
 
 CStdStr ReadKept(const KeptList& list)
 {
-    ReadStoredList(list.names, list.files, [](const CStdStr&) {});
-    const CStdStr missed = WhyMissed(list.names);
+    const long entriesRead = ReadStoredList(list.names, list.files, [](const CStdStr&) {});
+    const CStdStr missed = WhyMissed(list.names, entriesRead);
     return missed.IsEmpty() ? missed
                             : CStdStr::Formatted(ModrigMessages::kListNotRead,
                                                  CStdStr::OfId(list.inText).c_str(), missed.c_str());
@@ -272,17 +311,20 @@ Change MoveFile(const CStdStr& typed, const CStdStr& place)
 
 CStdStr LaidDownInstead(const KeptList& list)
 {
-    const CStdStr key = SubKeyOf(list.names);
-    CStdStr place = LaidDownInstead(key, CStdStr(list.names.count), Decimal(list.files.GetCount()));
+    const LaidDownValues laidDown(list.names);
+    CStdStr place = laidDown.PlaceOfOther(CStdStr(list.names.count), Decimal(list.files.GetCount()));
     long number = 0;
     for (auto entry = list.files.begin(); place.IsEmpty() && entry != list.files.end(); ++entry)
-        place = LaidDownInstead(key, EntryName(list.names, ++number), *entry);
+        place = laidDown.PlaceOfOther(EntryName(list.names, ++number), *entry);
     return place;
 }
 
-bool IsEntryLaidDown(const KeptList& list, std::size_t place)
+std::vector<bool> WhichAreLaidDown(const KeptList& list)
 {
-    return !LaidDownInstead(SubKeyOf(list.names), EntryName(list.names, static_cast<long>(place)), CStdStr())
-                .IsEmpty();
+    const LaidDownValues laidDown(list.names);
+    std::vector<bool> entries;
+    for (long number = 1; number <= static_cast<long>(list.files.GetCount()); ++number)
+        entries.push_back(laidDown.Have(EntryName(list.names, number)));
+    return entries;
 }
 } // namespace ModrigUtils

@@ -47,6 +47,6 @@ struct Change
 
 // Where the administrator has laid down something else than these files; empty where nothing is in the way.
 [[nodiscard]] CStdStr LaidDownInstead(const KeptList& list);
-// Whether the entry at the place from 1 on is laid down by the administrator.
-[[nodiscard]] bool IsEntryLaidDown(const KeptList& list, std::size_t place);
+// Which of the entries are laid down by the administrator, in their order.
+[[nodiscard]] std::vector<bool> WhichAreLaidDown(const KeptList& list);
 } // namespace ModrigUtils

@@ -46,6 +46,7 @@ std::wstring TrueOrFalse(bool value)
 
 void PrintAsText(const KeptList& list)
 {
+    const std::vector<bool> isLaidDown = WhichAreLaidDown(list);
     std::size_t place = 0;
     for (const CStdStr& path : list.files)
     {
@@ -53,7 +54,7 @@ void PrintAsText(const KeptList& list)
         CStdStr line = CStdStr(std::to_wstring(place)) + CStdStr(L"  ") + path;
         if (!IsThere(path))
             line = line + CStdStr::OfId(ModrigMessages::kEntryNotThere);
-        if (IsEntryLaidDown(list, place))
+        if (isLaidDown[place - 1])
             line = line + CStdStr::OfId(ModrigMessages::kEntryLaidDown);
         Print(line.Text());
     }
@@ -64,13 +65,14 @@ void PrintAsText(const KeptList& list)
 void PrintAsJson(const KeptList& list)
 {
     std::wstring text = L"{\"list\": " + InJson(list.token) + L", \"files\": [";
+    const std::vector<bool> isLaidDown = WhichAreLaidDown(list);
     std::size_t place = 0;
     for (const CStdStr& path : list.files)
     {
         ++place;
         text += std::wstring(place == 1 ? L"" : L", ") + L"{\"place\": " + std::to_wstring(place) +
                 L", \"path\": " + InJson(path.Text()) + L", \"isThere\": " + TrueOrFalse(IsThere(path)) +
-                L", \"isLaidDown\": " + TrueOrFalse(IsEntryLaidDown(list, place)) + L"}";
+                L", \"isLaidDown\": " + TrueOrFalse(isLaidDown[place - 1]) + L"}";
     }
     Print(text + L"]}");
 }

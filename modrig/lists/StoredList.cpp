@@ -49,6 +49,9 @@ public:
     {
     }
 
+    // How many there were up to now.
+    long Count() const { return mIndex - 1; }
+
     // The next entry, or false at the end.
     bool Read(CStdStr& path)
     {
@@ -111,18 +114,19 @@ bool WriteEntries(const StoredListNames& names, const CStdStr& subKey, const CSt
 }
 } // namespace
 
-void ReadStoredList(const StoredListNames& names, CStringList& list,
+long ReadStoredList(const StoredListNames& names, CStringList& list,
                     const std::function<void(const CStdStr& path)>& appended)
 {
     list.RemoveAll();
     const CStdStr subKey = SubKeyOf(names);
     CStdStr stored;
     if (!ReadModrigRegString(HKEY_CURRENT_USER, subKey, names.count, stored))
-        return;
+        return 0;
     EntryReader entries(names, subKey, ReadCount(stored));
     for (CStdStr path; entries.Read(path);)
         if (const CStdStr* added = list.AddTailUnlessHeld(std::move(path)))
             appended(*added);
+    return entries.Count();
 }
 
 bool StoreList(const StoredListNames& names, const CStringList& list)

@@ -25,8 +25,9 @@ inline constexpr StoredListNames kStoredStartupSuite = {L"Startup", L"NumStartup
 
 // Replaces the list with what is stored. Duplicates are skipped. The list ends at the first gap in the
 // numbering. The count is of attempts: each that fails, where a later one succeeds, costs an entry at the
-// end. `appended` is called after every entry that has joined the list.
-void ReadStoredList(const StoredListNames& names, CStringList& list,
+// end. `appended` is called after every entry that has joined the list. Answers how many entries were read,
+// duplicates too.
+long ReadStoredList(const StoredListNames& names, CStringList& list,
                     const std::function<void(const CStdStr& path)>& appended);
 
 // Replaces what is stored with the list. On failure the store may hold a part of the list, unless the host

@@ -6,6 +6,7 @@
 inline constexpr DWORD INVALID_FILE_ATTRIBUTES = 0xFFFFFFFF;
 inline constexpr DWORD FILE_ATTRIBUTE_READONLY = 0x1;
 inline constexpr DWORD FILE_ATTRIBUTE_DIRECTORY = 0x10;
+inline constexpr DWORD FILE_ATTRIBUTE_DEVICE = 0x40; // or a pipe, or a socket
 inline constexpr DWORD FILE_ATTRIBUTE_NORMAL = 0x80;
 
 // Attributes of the file (links followed), or INVALID_FILE_ATTRIBUTES when it cannot be reached. A relative

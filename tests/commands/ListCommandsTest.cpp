@@ -74,6 +74,14 @@ protected:
         return Texts(list);
     }
 
+    // Of the registry's functions.
+    static std::size_t CallsToList()
+    {
+        const std::size_t before = host().registry.calls().size();
+        EXPECT_TRUE(host().commands.type(L"HISTORY LIST"));
+        return host().registry.calls().size() - before;
+    }
+
     static void RecordModrig(unsigned reasons)
     {
         host().applicationRecords.set({L"TesselModrig", kModrig, L"as it was", reasons});
@@ -135,6 +143,17 @@ TEST_F(ListCommandsWithoutHost, DisturbNobodyWhileAnotherSessionRuns)
     EXPECT_THAT(Stored(kStoredStartupSuite), ElementsAre(L"/a.lsp", L"/b.lsp"));
     EXPECT_THAT(host().linker.calls, IsEmpty());
     EXPECT_TRUE(host().commands.type(L"SUITE LIST"));
+}
+
+// Lists may be long.
+TEST_F(ListCommandsWithoutHost, ReadAnEntryOnceToListIt)
+{
+    const std::size_t callsForTwo = CallsToList();
+    CStringList longer;
+    Fill(longer, {L"/a.lsp", L"/b.lsp", L"/c.lsp", L"/d.lsp"});
+    ASSERT_TRUE(StoreList(kStoredHistory, longer));
+    constexpr std::size_t kOpenReadAndClose = 3;
+    EXPECT_EQ(CallsToList() - callsForTwo, 2 * kOpenReadAndClose);
 }
 
 // A store may have room for the list in memory, and find none on the disk.

@@ -39,6 +39,7 @@ TEST_F(FilesContract, TellsFilesFromFolders)
     EXPECT_EQ(GetFileAttributesW(host->makeFile(L"file.lsp").c_str()), FILE_ATTRIBUTE_NORMAL);
     EXPECT_EQ(GetFileAttributesW(host->makeFolder(L"folder").c_str()), FILE_ATTRIBUTE_DIRECTORY);
     EXPECT_EQ(GetFileAttributesW(host->makeReadOnlyFile(L"kept.lsp").c_str()), FILE_ATTRIBUTE_READONLY);
+    EXPECT_EQ(GetFileAttributesW(host->makePipe(L"pipe.lsp").c_str()), FILE_ATTRIBUTE_DEVICE);
 }
 
 TEST_F(FilesContract, HasNoAttributesForWhatIsMissing)

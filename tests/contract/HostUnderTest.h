@@ -35,6 +35,7 @@ public:
     // the full path.
     virtual std::wstring makeFile(const std::wstring& name) = 0;
     virtual std::wstring makeReadOnlyFile(const std::wstring& name) = 0;
+    virtual std::wstring makePipe(const std::wstring& name) = 0;
     virtual std::wstring makeFolder(const std::wstring& name) = 0;
     virtual void enterFolder(const std::wstring& path) = 0;
 

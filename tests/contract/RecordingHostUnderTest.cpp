@@ -52,6 +52,12 @@ public:
         return kFolder + name;
     }
 
+    std::wstring makePipe(const std::wstring& name) override
+    {
+        recordingHost().files.addFile(kFolder + name, FILE_ATTRIBUTE_DEVICE);
+        return kFolder + name;
+    }
+
     std::wstring makeFolder(const std::wstring& name) override
     {
         recordingHost().files.addFolder(kFolder + name);

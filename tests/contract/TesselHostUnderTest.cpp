@@ -1,4 +1,6 @@
 // The reference host, in this process, with its profile and the test's files in a throwaway folder.
+#include <sys/stat.h>
+
 #include <cstdlib>
 #include <set>
 #include <stdexcept>
@@ -84,6 +86,14 @@ public:
         const fs::path file = mFolder.write(toPath(name), "");
         fs::permissions(file, fs::perms::owner_read);
         return toText(file);
+    }
+
+    std::wstring makePipe(const std::wstring& name) override
+    {
+        const fs::path pipe = mFolder / toPath(name);
+        if (mkfifo(pipe.c_str(), S_IRUSR | S_IWUSR) != 0)
+            throw std::runtime_error("there can be no pipe: " + pipe.string());
+        return toText(pipe);
     }
 
     std::wstring makeFolder(const std::wstring& name) override

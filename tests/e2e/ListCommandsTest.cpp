@@ -4,6 +4,8 @@
 
 #include <gmock/gmock.h>
 
+#include <sys/stat.h>
+
 #include <nlohmann/json.hpp>
 
 #include "tests/e2e/Applications.h"
@@ -301,6 +303,40 @@ TEST_F(ListCommands, RefuseWhatCannotBeLoadedAndChangeNothing)
     EXPECT_EQ(quietly("SUITE ADD " + first + " " + text, 1), notOfAType(text) + "\n");
     EXPECT_EQ(quietly("SUITE ADD " + bare, 1), notOfAType(bare) + "\n");
     EXPECT_TRUE(suite().empty());
+}
+
+TEST_F(ListCommands, RefuseWhatIsCalledLikeAnApplicationAndIsNone)
+{
+    const std::string folder = (session.folder() / "folder.lsp").string();
+    const std::string pipe = (session.folder() / "pipe.omp").string();
+    const std::string device = (session.folder() / "device.lsp").string();
+    const std::string bundle = session.folder().write("file.Bundle", "").string();
+    std::filesystem::create_directory(folder);
+    ASSERT_EQ(mkfifo(pipe.c_str(), 0600), 0);
+    std::filesystem::create_symlink("/dev/null", device);
+    for (const std::string list : {"SUITE", "HISTORY"})
+    {
+        EXPECT_EQ(quietly(list + " ADD " + first + " " + folder, 1),
+                  "“" + folder + "” is a folder and no application.\n");
+        for (const std::string& path : {pipe, device})
+            EXPECT_EQ(quietly(list + " ADD " + path, 1),
+                      "“" + path + "” is no application: it is not an ordinary file.\n");
+        EXPECT_EQ(quietly(list + " ADD " + bundle, 1),
+                  "“" + bundle + "” is no application: it is a file, and a bundle is a folder.\n");
+    }
+    EXPECT_TRUE(suite().empty());
+    EXPECT_TRUE(history().empty());
+    EXPECT_EQ(quietly("SUITE ADD " + sample("moon.bundle")), "moon.bundle was added to the Startup Suite.\n");
+}
+
+TEST_F(ListCommands, RemoveAndMoveEntriesThatHaveBecomeFolders)
+{
+    quietly("SUITE ADD " + first + " " + second);
+    std::filesystem::remove(second);
+    std::filesystem::create_directory(second);
+    EXPECT_EQ(quietly("SUITE MOVE " + second + " 1"), "second.lsp is in place 1 of the Startup Suite now.\n");
+    EXPECT_EQ(quietly("SUITE REMOVE " + second), "second.lsp was removed from the Startup Suite.\n");
+    EXPECT_THAT(suite(), ElementsAre(first));
 }
 
 TEST_F(ListCommands, TakeNoMoreThanFiftyFilesAtOnce)

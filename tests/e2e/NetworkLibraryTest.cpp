@@ -68,7 +68,16 @@ TEST_F(NetworkLibrary, ThatIsNoLibraryIsNamedWithTheWayOut)
     std::ofstream(library, std::ios::binary) << "Dear Sir or Madam,\n";
     expectNotFetched(
         "Tessel's library for the network cannot be used, and Tessel has to be installed again (" +
-        library.string() + ": ");
+        library.string() + ": it is not a shared library)");
+}
+
+// The system's linker would end the process by it.
+TEST_F(NetworkLibrary, ThatIsCutShortIsNamedWithTheWayOut)
+{
+    fs::resize_file(library, 4096);
+    expectNotFetched(
+        "Tessel's library for the network cannot be used, and Tessel has to be installed again (" +
+        library.string() + ": the file is cut short)");
 }
 
 TEST_F(NetworkLibrary, OfAnotherVersionIsNotUsed)

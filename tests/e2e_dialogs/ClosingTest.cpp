@@ -1,10 +1,20 @@
 // Closing the dialog, and what it remembers.
+#include <sys/resource.h>
+
 #include "tests/e2e_dialogs/DialogTest.h"
 
 using testing::HasSubstr;
+using testing::Not;
 
 class DialogClosing : public DialogTest
 {
+protected:
+    // As a disk does that has no more room: what the host prints is short enough.
+    void limitFiles(rlim_t bytes) const
+    {
+        const rlimit limit = {bytes, RLIM_INFINITY};
+        EXPECT_EQ(prlimit(mHost->process(), RLIMIT_FSIZE, &limit, nullptr), 0);
+    }
 };
 
 TEST_F(DialogClosing, ByEscapeLeavesAHostThatGoesOn)
@@ -47,6 +57,29 @@ TEST_F(DialogClosing, LeavesAModuleThatCanBeUnloadedAndLoadedAgain)
     shoot("loaded-again");
     closeAndEnd();
     EXPECT_EQ(stored("History"), "NumHistory = 1\n1History = " + first + "\n");
+}
+
+TEST_F(DialogClosing, KeepsWhatFindsNoRoomAndStoresItOnceThereIsSome)
+{
+    const std::string path = writeLisp("a.lsp");
+    storeHistory({"/before.lsp"});
+    setSetting("SaveHistory", "1");
+    open();
+    loadFile(0, "a.lsp");
+    limitFiles(4096);
+    press("Escape");
+    EXPECT_TRUE(mScreen.waitUntilGone(kDialog));
+    EXPECT_TRUE(
+        prints("registry.db could not be written: File too large. What was stored before is unchanged. "
+               "Lift the limit on the size of files, and try again.\n"))
+        << mHost->output();
+    EXPECT_THAT(mHost->output(), HasSubstr("Message: A list of applications could not be stored"));
+    EXPECT_EQ(stored("History"), "NumHistory = 1\n1History = /before.lsp\n");
+    limitFiles(RLIM_INFINITY);
+    openAgain();
+    const std::string before = mHost->output();
+    EXPECT_THAT(closeAndEnd().substr(before.size()), Not(HasSubstr("stored")));
+    EXPECT_EQ(stored("History"), "NumHistory = 2\n1History = /before.lsp\n2History = " + path + "\n");
 }
 
 TEST_F(DialogClosing, RemembersTheTabAndTheCheckBox)

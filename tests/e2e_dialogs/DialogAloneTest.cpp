@@ -1,4 +1,7 @@
 // The dialog without a prompt, as an entry of a desktop's menu opens it.
+#include <sys/resource.h>
+#include <sys/stat.h>
+
 #include "tests/e2e_dialogs/DialogTest.h"
 
 using testing::Optional;
@@ -22,6 +25,21 @@ protected:
                                           mSession.folder() / "output.txt");
         mDialog = mScreen.waitForActive(kDialog);
         ASSERT_FALSE(mDialog.empty()) << mHost->output();
+    }
+
+    // Closes so many boxes, which come one after the other.
+    void dismissMessageBoxes(int count)
+    {
+        std::string before;
+        for (int number = 1; number <= count; ++number)
+        {
+            std::string box;
+            ASSERT_TRUE(comesTrue([&] { return (box = mScreen.waitForActive(kMessageBox)) != before; }));
+            ASSERT_FALSE(box.empty()) << "there is no box " << number;
+            shoot("box-" + std::to_string(number));
+            press("Return");
+            before = box;
+        }
     }
 };
 
@@ -64,6 +82,32 @@ TEST_F(DialogAlone, SaysInAWindowThatWhatIsPolicyStays)
     press("Return");
     EXPECT_THAT(mHost->waitForEnd(), Optional(0));
     EXPECT_THAT(mHost->output(), testing::HasSubstr("are laid down by the administrator"));
+}
+
+// The module tells it of each of its two lists, and the host the reason.
+TEST_F(DialogAlone, SaysInAWindowWhyNothingCouldBeStored)
+{
+    writeLisp("a.lsp");
+    setSetting("SaveHistory", "1");
+    openAlone({"--modrig"});
+    loadFile(0, "a.lsp");
+    const rlimit limit = {4096, RLIM_INFINITY};
+    ASSERT_EQ(prlimit(mHost->process(), RLIMIT_FSIZE, &limit, nullptr), 0);
+    press("Escape");
+    dismissMessageBoxes(3);
+    EXPECT_THAT(mHost->waitForEnd(), Optional(1));
+    EXPECT_THAT(mHost->output(), testing::HasSubstr("registry.db could not be written: File too large."));
+}
+
+TEST_F(DialogAlone, SaysInAWindowThatNothingMayBeStored)
+{
+    setSetting("SaveHistory", "1");
+    ASSERT_EQ(chmod((mSession.profile() / "registry.db").c_str(), S_IRUSR), 0);
+    openAlone({"--modrig"});
+    press("Escape");
+    dismissMessageBoxes(3);
+    EXPECT_THAT(mHost->waitForEnd(), Optional(0));
+    EXPECT_THAT(mHost->output(), testing::HasSubstr("registry.db may only be read"));
 }
 
 TEST_F(DialogAlone, OpensAfterTheFilesThatWereNamedAreLoaded)

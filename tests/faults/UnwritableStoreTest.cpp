@@ -210,6 +210,20 @@ TEST_F(UnwritableStore, TellsThatNoRoomIsLeftForAWrite)
     }
 }
 
+// As a system makes it that has met an error of the disk.
+TEST_F(UnwritableStore, OfAFileSystemThatMayOnlyBeReadSaysThatRightsDoNotHelp)
+{
+    failWith("pwrite 1 ever " + std::to_string(EROFS));
+    expectReadAndTold("Read-only file system", "Have the file system made writable, and start Tessel again.");
+    session.alwaysWith({"--safe"});
+    failWith("pwrite 12 ever " + std::to_string(EROFS));
+    const auto result = session.run({"REGISTRY SET Software\\Trial name 1"});
+    EXPECT_EQ(result.exitStatus, 1);
+    EXPECT_THAT(result.output,
+                HasSubstr(" could not be written: Read-only file system. What was stored before is "
+                          "unchanged. Have the file system made writable, and try again.\n"));
+}
+
 TEST_F(UnwritableStore, ReadsALogThatAKilledSessionHasLeft)
 {
     leaveLog();

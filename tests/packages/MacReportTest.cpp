@@ -107,6 +107,14 @@ TEST_F(MacReport, EndsASessionThatDoesNotEndAndAllThatItStarted)
               "");
 }
 
+TEST_F(MacReport, TellsASessionThatIsKilledFromOneThatDoesNotEnd)
+{
+    program("build/release/Tessel.app/Contents/MacOS/Tessel", "echo begun; kill -KILL $$");
+    EXPECT_EQ(report("session").status, 1);
+    EXPECT_THAT(written(), AllOf(HasSubstr("begun"), HasSubstr("It ended with 137."),
+                                 Not(HasSubstr("It did not end within"))));
+}
+
 TEST_F(MacReport, EndsADialogThatDoesNotWantTo)
 {
     program("build/release/Tessel.app/Contents/MacOS/Tessel", "trap '' TERM; while :; do sleep 1; done");

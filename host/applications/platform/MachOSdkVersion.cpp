@@ -7,7 +7,7 @@
 #include <mach-o/loader.h>
 #include <tessel/tsversion.h>
 
-#include "host/applications/platform/MachOFile.h"
+#include "host/platform/MachOFile.h"
 
 namespace tessel
 {

@@ -12,7 +12,7 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
-#include "host/applications/ImageCheck.h"
+#include "host/platform/ImageCheck.h"
 #include "host/platform/RegularFile.h"
 
 namespace

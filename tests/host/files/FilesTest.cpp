@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include <sys/stat.h>
 #include <wincompat/winfile.h>
 
 #include <filesystem>
@@ -23,6 +24,14 @@ TEST(FileAttributes, TellFilesAndFolders)
     EXPECT_EQ(attributesOf(folder.write("tool.lsp", "")), FILE_ATTRIBUTE_NORMAL);
     EXPECT_EQ(attributesOf(folder.path()), FILE_ATTRIBUTE_DIRECTORY);
     EXPECT_EQ(attributesOf(folder / "missing.lsp"), INVALID_FILE_ATTRIBUTES);
+}
+
+TEST(FileAttributes, TellPipesAndDevicesFromFiles)
+{
+    const TemporaryFolder folder;
+    ASSERT_EQ(mkfifo((folder / "pipe").c_str(), 0600), 0);
+    EXPECT_EQ(attributesOf(folder / "pipe"), FILE_ATTRIBUTE_DEVICE);
+    EXPECT_EQ(attributesOf("/dev/null"), FILE_ATTRIBUTE_DEVICE);
 }
 
 TEST(FileAttributes, AreThereForNamesOfEveryKind)

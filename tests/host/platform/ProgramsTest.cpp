@@ -75,6 +75,27 @@ TEST(Programs, ThatAreNotThereWriteNothing)
     EXPECT_FALSE(tessel::startProgram({"no-such-program-anywhere"}));
 }
 
+// A browser, and all that it starts in its turn, expects to be ended by a pipe that nobody reads.
+TEST(Programs, AreEndedByTheSignalsThatTheHostDoesWithout)
+{
+    for (const int signal : {SIGPIPE, SIGXFSZ})
+    {
+        const auto before = std::signal(signal, SIG_IGN);
+        const std::string kill = "kill -s " + std::to_string(signal) + " $$; echo goes on";
+        EXPECT_EQ(outputOfProgram({"sh", "-c", kill}), "") << signal;
+        EXPECT_EQ(WTERMSIG(showByProgram({"sh", "-c", kill}, "").value_or(0)), signal);
+        std::signal(signal, before);
+    }
+}
+
+// Who starts Tessel so that it outlives the terminal means what it starts, too.
+TEST(Programs, IgnoreWhatSomebodyElseWantsIgnored)
+{
+    const auto before = std::signal(SIGHUP, SIG_IGN);
+    EXPECT_EQ(outputOfProgram({"sh", "-c", "kill -s HUP $$; echo goes on"}), "goes on\n");
+    std::signal(SIGHUP, before);
+}
+
 TEST(Programs, ThatShowATextReadItAndWriteWhereWeDo)
 {
     testing::internal::CaptureStdout();

@@ -17,7 +17,8 @@ DWORD realAttributes(const std::wstring& path)
         return INVALID_FILE_ATTRIBUTES;
     const bool writable =
         (status.permissions() & std::filesystem::perms::owner_write) != std::filesystem::perms::none;
-    const DWORD kind = std::filesystem::is_directory(status) ? FILE_ATTRIBUTE_DIRECTORY : 0;
+    const DWORD other = std::filesystem::is_other(status) ? FILE_ATTRIBUTE_DEVICE : 0;
+    const DWORD kind = std::filesystem::is_directory(status) ? FILE_ATTRIBUTE_DIRECTORY : other;
     const DWORD all = kind | (writable ? 0 : FILE_ATTRIBUTE_READONLY);
     return all ? all : FILE_ATTRIBUTE_NORMAL;
 }

@@ -1,5 +1,5 @@
 // The check of a shared library's headers, for ELF.
-#include "host/applications/ImageCheck.h"
+#include "host/platform/ImageCheck.h"
 
 #include <algorithm>
 #include <array>

@@ -1,14 +1,14 @@
 // The check of a shared library's headers, for Mach-O. The system's loader on macOS examines a file's extent
 // and signature by itself; here it is told in words what kind of file stands in its place, and what it has
 // lost.
-#include "host/applications/ImageCheck.h"
+#include "host/platform/ImageCheck.h"
 
 #include <libkern/OSByteOrder.h>
 #include <mach-o/dyld.h>
 #include <mach-o/fat.h>
 #include <mach-o/loader.h>
 
-#include "host/applications/platform/MachOFile.h"
+#include "host/platform/MachOFile.h"
 #include "host/text/Translation.h"
 
 namespace tessel

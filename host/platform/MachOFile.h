@@ -3,7 +3,7 @@
 
 #include <cstdint>
 
-#include "host/applications/ImageCheck.h"
+#include "host/platform/ImageCheck.h"
 
 namespace tessel
 {
