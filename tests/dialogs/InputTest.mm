@@ -60,8 +60,11 @@ protected:
 TEST_F(Input, IsTakenAtOnceWhenItCameRightBeforeTheWait)
 {
     PointerMover* mover = [[[PointerMover alloc] initWithView:[mWindow contentView]] autorelease];
-    NSTimer* timer =
-        [NSTimer timerWithTimeInterval:0 target:mover selector:@selector(move:) userInfo:nil repeats:NO];
+    NSTimer* timer = [NSTimer timerWithTimeInterval:0
+                                             target:mover
+                                           selector:@selector(move:)
+                                           userInfo:nil
+                                            repeats:NO];
     [[NSRunLoop currentRunLoop] addTimer:timer forMode:NSEventTrackingRunLoopMode];
     EXPECT_NE(nil, [NSApp nextEventMatchingMask:NSMouseMovedMask
                                       untilDate:[NSDate dateWithTimeIntervalSinceNow:3]

@@ -1,5 +1,5 @@
-// What comes from the display. The toolkit loses a part of it in its waits: a tap, whose press and release come
-// at once, left a button down or a row pressed until the next click.
+// What comes from the display. The toolkit loses a part of it in its waits: a tap, whose press and release
+// come at once, left a button down or a row pressed until the next click.
 #import <AppKit/AppKit.h>
 #import <GNUstepGUI/GSDisplayServer.h>
 
@@ -78,8 +78,8 @@ BOOL shouldBlock(id server, SEL selector, BOOL* trigger)
     return blocks;
 }
 
-// What the display's library has read already is taken at once, but the toolkit does not count it as input and
-// waits on for more: whoever waits for that event is not told of it.
+// What the display's library has read already is taken at once, but the toolkit does not count it as input
+// and waits on for more: whoever waits for that event is not told of it.
 BOOL pollUntil(id context, SEL selector, int milliseconds, NSArray* contexts)
 {
     const Noted noInput(inputWaits, false);
@@ -93,8 +93,8 @@ void receivedEvent(id server, SEL selector, void* data, RunLoopEventType type, v
     toolkitReceivedEvent(server, selector, data, type, extra, mode);
 }
 
-// To take an event may need an answer of another program of the toolkit: the first press of a session asks how
-// the mouse is set up. What comes from the display during that wait would overtake the event.
+// To take an event may need an answer of another program of the toolkit: the first press of a session asks
+// how the mouse is set up. What comes from the display during that wait would overtake the event.
 void acceptInput(id loop, SEL selector, NSString* mode, NSDate* limit)
 {
     if (!takesInput || ![mode isEqualToString:NSConnectionReplyMode])
