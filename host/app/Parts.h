@@ -73,7 +73,7 @@ struct Parts
     Parts& operator=(const Parts&) = delete;
 
     const Foundations foundations;
-    const ProductFolders folders = runningProductFolders();
+    const ProductFolders& folders = runningProductFolders();
     Published<CommandLine> commandLine{foundations.commandLine};
     Published<Questions> questions{foundations.questions};
     Published<EndRequest> endRequest{foundations.endRequest};

@@ -99,7 +99,7 @@ bool loadFiles(Host& host, const std::vector<std::string>& files)
 // Without a display the command says so, which is no failure of a command, but all that was asked for here.
 int showDialog(Host& host)
 {
-    const auto windows = runningProductFolders().binaries;
+    const auto& windows = runningProductFolders().binaries;
     expectSomebodyAtTheDisplay(windows);
     const bool ran = host.run(kDialogCommand);
     host.showWhatWasNotTaken();

@@ -48,7 +48,8 @@ Result<> Admission::check(const std::wstring& path)
         mAskedFor.push_back(file);
     if (isOfStart(reason) && mBisecting.keepsOut(file))
         return Failure{translated(L"it is kept out at this start by BISECT"), kAlreadyTold};
-    sayWhenOnTrial(file);
+    if (known)
+        sayWhenOnTrial(file);
     return {};
 }
 

@@ -353,12 +353,6 @@ std::vector<DynamicLinker::LoadedModule> DynamicLinker::loadedModules() const
     return result;
 }
 
-void DynamicLinker::forEachLoaded(const std::function<void(const wchar_t* name)>& tell) const
-{
-    for (const Module* module : mModules.loaded())
-        tell(module->name().data());
-}
-
 std::wstring DynamicLinker::pathOfModule(const std::wstring& name) const
 {
     const Module* module = mModules.named(name);

@@ -10,9 +10,9 @@
 // said, and a later load sends message 1 to the library that is still there.
 #pragma once
 
-#include <functional>
 #include <optional>
 #include <set>
+#include <span>
 #include <string>
 #include <vector>
 
@@ -68,8 +68,8 @@ public:
 
     // What counts as loaded, in the order in which it came to.
     std::vector<LoadedModule> loadedModules() const;
-    // Only their names, one after the other.
-    void forEachLoaded(const std::function<void(const wchar_t* name)>& tell) const;
+    // Only their names; good until something is loaded or unloaded.
+    std::span<const std::wstring_view> namesOfLoaded() const { return mModules.namesOfLoaded(); }
 
     // The full path of the first loaded application of that name, in any case; empty when there is none.
     std::wstring pathOfModule(const std::wstring& name) const;

@@ -33,6 +33,7 @@ void LoadedModules::countAsLoaded(Module& module)
         return;
     module.isLoaded = true;
     mLoaded.push_back(&module);
+    mNames.push_back(module.name());
     mByName[foldCase(module.name())].push_back(&module);
 }
 
@@ -45,10 +46,10 @@ void LoadedModules::remove(Module& module)
         if (named->second.empty())
             mByName.erase(named);
         // The session's end takes the last away each time, and a person's selection goes from the first on.
-        if (mLoaded.back() == &module)
-            mLoaded.pop_back();
-        else
-            mLoaded.erase(std::ranges::find(mLoaded, &module));
+        const auto place =
+            mLoaded.back() == &module ? mLoaded.end() - 1 : std::ranges::find(mLoaded, &module);
+        mNames.erase(mNames.begin() + (place - mLoaded.begin()));
+        mLoaded.erase(place);
     }
     mByPath.erase(module.path);
     if (!module.otherPath.empty())

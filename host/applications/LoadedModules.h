@@ -5,6 +5,7 @@
 #include <cstddef>
 #include <map>
 #include <memory>
+#include <span>
 #include <string>
 #include <string_view>
 #include <unordered_map>
@@ -51,6 +52,8 @@ public:
 
     // In the order in which they came to count as loaded.
     const std::vector<Module*>& loaded() const { return mLoaded; }
+    // Their names, in the same order.
+    std::span<const std::wstring_view> namesOfLoaded() const { return mNames; }
 
 private:
     std::unordered_map<const void*, std::unique_ptr<Module>> mByHandle;
@@ -58,5 +61,6 @@ private:
     std::map<FileIdentity, Module*> mByIdentity;
     std::unordered_map<std::wstring, std::vector<Module*>> mByName; // folded; in the order of loading
     std::vector<Module*> mLoaded;
+    std::vector<std::wstring_view> mNames; // the modules' own, kept at hand: they are asked for all at once
 };
 } // namespace tessel

@@ -5,6 +5,7 @@
 #include <tessel/tsed.h>
 
 #include "host/applications/DynamicLinker.h"
+#include "host/text/ResultBuffers.h"
 #include "host/text/Running.h"
 
 namespace
@@ -15,18 +16,8 @@ constexpr int kNotFound = 1;
 
 TsResultBuffer* tsedQmbLoaded()
 {
-    TsResultBuffer* list = nullptr;
-    TsResultBuffer** end = &list;
     const auto* linker = tessel::running<tessel::DynamicLinker>();
-    if (!linker)
-        return nullptr;
-    linker->forEachLoaded(
-        [&](const wchar_t* name)
-        {
-            *end = tsutBuildList({TsRbValue::String(name)});
-            end = &(*end)->next;
-        });
-    return list;
+    return linker ? tessel::listOfTexts(linker->namesOfLoaded()) : nullptr;
 }
 
 int tsedGetModuleFileName(const wchar_t* moduleName, wchar_t* path, std::size_t capacity)

@@ -13,15 +13,8 @@ namespace
 {
 constexpr char kProgramsOfBundle[] = "MacOS"; // Tessel.app/Contents/MacOS
 constexpr char kTranslations[] = "locale";    // among the resources
-} // namespace
 
-ProductFolders productFoldersOf(const std::filesystem::path& binaries)
-{
-    const auto contents = binaries.filename() == kProgramsOfBundle ? binaries.parent_path() : binaries;
-    return {binaries, contents / "Resources", contents / "PlugIns"};
-}
-
-ProductFolders runningProductFolders()
+ProductFolders foldersOfThisLibrary()
 {
     Dl_info library{};
     static const char insideOfLibrary = 0;
@@ -30,6 +23,19 @@ ProductFolders runningProductFolders()
     if (dladdr(&insideOfLibrary, &library) != 0)
         file = std::filesystem::canonical(library.dli_fname, error);
     return productFoldersOf(file.parent_path());
+}
+} // namespace
+
+ProductFolders productFoldersOf(const std::filesystem::path& binaries)
+{
+    const auto contents = binaries.filename() == kProgramsOfBundle ? binaries.parent_path() : binaries;
+    return {binaries, contents / "Resources", contents / "PlugIns"};
+}
+
+const ProductFolders& runningProductFolders()
+{
+    static const ProductFolders folders = foldersOfThisLibrary();
+    return folders;
 }
 
 void usePersonsLanguage()

@@ -16,8 +16,8 @@ struct ProductFolders
 // The folders of the app whose programs are in that folder: `Contents/MacOS` or the app's own folder.
 ProductFolders productFoldersOf(const std::filesystem::path& binaries);
 
-// The folders of the running host.
-ProductFolders runningProductFolders();
+// The folders of the running host, as they were when somebody asked first.
+const ProductFolders& runningProductFolders();
 
 // From now on what is said is in the person's language (see host/text/Translation.h), where the product has
 // it. For the programs, at their beginning: tests speak English.

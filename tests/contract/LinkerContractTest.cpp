@@ -4,6 +4,7 @@
 #include "tests/contract/ContractTest.h"
 
 using testing::ElementsAre;
+using testing::ElementsAreArray;
 using testing::IsEmpty;
 
 namespace
@@ -195,6 +196,25 @@ TEST_F(LinkerContract, ListsNamesInTheOrderOfLoading)
     for (const wchar_t* name : {L"zebra.zmb", L"Apple.omp", L"middle.zmb"})
         EXPECT_TRUE(load(host->makeModule(name, ContractModule::kPlain)));
     EXPECT_THAT(loadedNames(), ElementsAre(L"zebra.zmb", L"Apple.omp", L"middle.zmb"));
+}
+
+TEST_F(LinkerContract, ListsWhatIsLeftOfManyAfterSomeWereUnloaded)
+{
+    std::vector<std::wstring> names;
+    std::vector<std::wstring> paths;
+    for (int i = 10; i < 30; ++i)
+    {
+        names.push_back(L"tool" + std::to_wstring(i) + L".zmb");
+        paths.push_back(host->makeModule(names.back(), ContractModule::kPlain));
+        EXPECT_TRUE(load(paths.back()));
+    }
+    EXPECT_THAT(loadedNames(), ElementsAreArray(names));
+    for (const std::size_t gone : {19U, 10U, 0U})
+    {
+        EXPECT_TRUE(linker->unloadModule(paths[gone].c_str(), false));
+        names.erase(names.begin() + static_cast<std::ptrdiff_t>(gone));
+        EXPECT_THAT(loadedNames(), ElementsAreArray(names));
+    }
 }
 
 TEST_F(LinkerContract, FindsThePathOfALoadedNameInAnyCase)

@@ -49,9 +49,10 @@ int listToAsk()
 {
     static Descriptor list(-1);
     static pid_t opener = 0;
-    if (!list || opener != getpid())
+    const pid_t process = getpid();
+    if (!list || opener != process)
         list = Descriptor(open(kList, O_RDONLY | O_CLOEXEC));
-    opener = getpid();
+    opener = process;
     return list.number();
 }
 

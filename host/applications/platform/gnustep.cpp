@@ -59,7 +59,7 @@ bool isMissing(void* library, const ElfW(Sym) & symbol, const char* name)
 // In pieces: the names that a program refers to stand near its beginning.
 bool needsBundleLoading(const std::string& program)
 {
-    constexpr std::uint64_t kPiece = 65536;
+    constexpr std::uint64_t kPiece = 16384;
     constexpr std::uint64_t kOverlap = kRegistration.size() - 1; // which the end of a piece may cut in two
     const RegularFile file(program);
     const std::uint64_t size = file.opened() ? file.size() : 0;

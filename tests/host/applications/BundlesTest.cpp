@@ -201,7 +201,7 @@ TEST_F(Bundles, AreDescribedAtTheirTopWhereNoResourcesAre)
 // It is looked for in pieces, the end of one of which may cut the name in two.
 TEST(BundleLoading, IsNeededWhereverTheNameOfTheRuntimeStandsInTheProgram)
 {
-    constexpr std::size_t kAroundThePiecesEnd = 65536;
+    constexpr std::size_t kAroundThePiecesEnd = 16384;
     const std::string name = "__objc_exec_class";
     const TemporaryFolder folder;
     for (std::size_t before = kAroundThePiecesEnd - 20; before <= kAroundThePiecesEnd + 2; ++before)

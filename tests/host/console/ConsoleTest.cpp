@@ -66,7 +66,7 @@ private:
     bool mEnding = false;
 };
 
-class Console : public testing::Test
+class ConsoleRun : public testing::Test
 {
 protected:
     bool runLines(const std::string& text)
@@ -84,14 +84,14 @@ protected:
 };
 } // namespace
 
-TEST_F(Console, EchoesEachLineAfterThePrompt)
+TEST_F(ConsoleRun, EchoesEachLineAfterThePrompt)
 {
     EXPECT_TRUE(runLines("HELP\n\nVERSION"));
     EXPECT_THAT(runner.inputs, ElementsAre(L"HELP", L"VERSION"));
     EXPECT_EQ(output.text(), "Command: HELP\nCommand: \nCommand: VERSION\n");
 }
 
-TEST_F(Console, AnswersAQuestionWithTheNextLine)
+TEST_F(ConsoleRun, AnswersAQuestionWithTheNextLine)
 {
     EXPECT_TRUE(runLines("ASK\nbecause\r\nHELP\n"));
     EXPECT_TRUE(runner.answered);
@@ -100,14 +100,14 @@ TEST_F(Console, AnswersAQuestionWithTheNextLine)
     EXPECT_EQ(output.text(), "Command: ASK\nWhy <so>: because\nCommand: HELP\n");
 }
 
-TEST_F(Console, CancelsAQuestionAtTheEndOfTheLines)
+TEST_F(ConsoleRun, CancelsAQuestionAtTheEndOfTheLines)
 {
     EXPECT_TRUE(runLines("ASK\n"));
     EXPECT_FALSE(runner.answered);
     EXPECT_EQ(output.text(), "Command: ASK\nWhy <so>: \n");
 }
 
-TEST_F(Console, CancelsAQuestionThatALineDoesNotAnswerAndGoesOnWithTheNext)
+TEST_F(ConsoleRun, CancelsAQuestionThatALineDoesNotAnswerAndGoesOnWithTheNext)
 {
     EXPECT_TRUE(runLines("ASK\nNO\nHELP\n"));
     EXPECT_FALSE(runner.answered);
@@ -115,7 +115,7 @@ TEST_F(Console, CancelsAQuestionThatALineDoesNotAnswerAndGoesOnWithTheNext)
     EXPECT_EQ(output.text(), "Command: ASK\nWhy <so>: NO\nNot that.\nCommand: HELP\n");
 }
 
-TEST_F(Console, TakesTheDefaultInALineByItself)
+TEST_F(ConsoleRun, TakesTheDefaultInALineByItself)
 {
     EXPECT_TRUE(console.runLine("ASK\nHELP"));
     EXPECT_TRUE(runner.answered);
@@ -123,51 +123,51 @@ TEST_F(Console, TakesTheDefaultInALineByItself)
     EXPECT_EQ(output.text(), "Command: ASK\nWhy <so>: so\nCommand: HELP\n");
 }
 
-TEST_F(Console, ShowsAContinuationPromptInsideOfLisp)
+TEST_F(ConsoleRun, ShowsAContinuationPromptInsideOfLisp)
 {
     EXPECT_TRUE(runLines("(list\r\n1)\r\n"));
     EXPECT_THAT(runner.inputs, ElementsAre(L"(list\n1)"));
     EXPECT_EQ(output.text(), "Command: (list\n     ... 1)\n");
 }
 
-TEST_F(Console, DoesNotRepeatAPromptThatStandsThereAlready)
+TEST_F(ConsoleRun, DoesNotRepeatAPromptThatStandsThereAlready)
 {
     EXPECT_TRUE(runLines("PROMPT\nHELP\n"));
     EXPECT_EQ(output.text(), "Command: PROMPT\n\nCommand: HELP\n");
 }
 
-TEST_F(Console, StartsThePromptOnALineOfItsOwn)
+TEST_F(ConsoleRun, StartsThePromptOnALineOfItsOwn)
 {
     EXPECT_TRUE(runLines("OPEN\nHELP\n"));
     EXPECT_EQ(output.text(), "Command: OPEN\nno line break\nCommand: HELP\n");
 }
 
-TEST_F(Console, GoesOnAfterALineThatFails)
+TEST_F(ConsoleRun, GoesOnAfterALineThatFails)
 {
     EXPECT_FALSE(runLines("BAD\nHELP\n"));
     EXPECT_THAT(runner.inputs, ElementsAre(L"BAD", L"HELP"));
 }
 
-TEST_F(Console, StopsWhenACommandEndsTheSession)
+TEST_F(ConsoleRun, StopsWhenACommandEndsTheSession)
 {
     EXPECT_TRUE(runLines("QUIT\nHELP\n"));
     EXPECT_THAT(runner.inputs, ElementsAre(L"QUIT"));
 }
 
-TEST_F(Console, SaysWhenTheInputEndsInsideOfLisp)
+TEST_F(ConsoleRun, SaysWhenTheInputEndsInsideOfLisp)
 {
     EXPECT_FALSE(runLines("(list 1\n"));
     EXPECT_THAT(output.text(), HasSubstr("The Lisp expression is not finished"));
 }
 
-TEST_F(Console, RunsAScriptFromAFile)
+TEST_F(ConsoleRun, RunsAScriptFromAFile)
 {
     const TemporaryFolder folder;
     EXPECT_TRUE(console.runScript(folder.write("größe 100%s.script", "; comment\nHELP\n")));
     EXPECT_THAT(runner.inputs, ElementsAre(L"HELP"));
 }
 
-TEST_F(Console, TellsWhichLineOfAScriptFailed)
+TEST_F(ConsoleRun, TellsWhichLineOfAScriptFailed)
 {
     const TemporaryFolder folder;
     const auto script = folder.write("a.scr", "HELP\nASK\nso\n\nBAD\n(list\n");
@@ -180,7 +180,7 @@ TEST_F(Console, TellsWhichLineOfAScriptFailed)
     EXPECT_EQ(output.text(), "Command: BAD\nThat is bad.\n") << "no file";
 }
 
-TEST_F(Console, SaysWhyAScriptCannotBeRead)
+TEST_F(ConsoleRun, SaysWhyAScriptCannotBeRead)
 {
     const TemporaryFolder folder;
     EXPECT_FALSE(output.commandLine().tell(console.runScript(folder / "missing.script")));

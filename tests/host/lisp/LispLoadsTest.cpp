@@ -17,7 +17,7 @@ using testing::Pair;
 
 namespace
 {
-class LispLoads : public testing::Test
+class LoadsOfLisp : public testing::Test
 {
 protected:
     std::string write(const std::string& name, const std::string& content)
@@ -59,14 +59,14 @@ protected:
 };
 } // namespace
 
-TEST_F(LispLoads, NameTheLineOfAFileThatFails)
+TEST_F(LoadsOfLisp, NameTheLineOfAFileThatFails)
 {
     const auto path = write("a.lsp", "1\n(car 5)");
     fail(load(path));
     EXPECT_THAT(failed(), ElementsAre(Pair(path, testing::StartsWith("line 2: In function CAR, "))));
 }
 
-TEST_F(LispLoads, NameTheLineOfAFileThatWasNamedWithoutItsExtension)
+TEST_F(LoadsOfLisp, NameTheLineOfAFileThatWasNamedWithoutItsExtension)
 {
     write("a.lsp", "\n(unknown)");
     const auto stem = (folder / "a").string();
@@ -74,7 +74,7 @@ TEST_F(LispLoads, NameTheLineOfAFileThatWasNamedWithoutItsExtension)
     EXPECT_THAT(failed(), ElementsAre(Pair(stem, "line 2: The function UNKNOWN is undefined.")));
 }
 
-TEST_F(LispLoads, GiveTheReasonOfAFileThatIsRefused)
+TEST_F(LoadsOfLisp, GiveTheReasonOfAFileThatIsRefused)
 {
     const auto path = (folder / "no.lsp").string();
     fail(load(path));
@@ -83,7 +83,7 @@ TEST_F(LispLoads, GiveTheReasonOfAFileThatIsRefused)
                                       Pair(folder.path().string(), "it is a folder")));
 }
 
-TEST_F(LispLoads, BlameTheOutermostFileAndNameTheOneWithin)
+TEST_F(LoadsOfLisp, BlameTheOutermostFileAndNameTheOneWithin)
 {
     const auto inner = write("inner.lsp", "1\n2\n(unknown)");
     const auto missing = (folder / "missing.lsp").string();
@@ -96,7 +96,7 @@ TEST_F(LispLoads, BlameTheOutermostFileAndNameTheOneWithin)
                                                        "\": No such file or directory.")));
 }
 
-TEST_F(LispLoads, BlameNoFileWhoseErrorWasCaughtForWhatComesAfterIt)
+TEST_F(LoadsOfLisp, BlameNoFileWhoseErrorWasCaughtForWhatComesAfterIt)
 {
     const auto bad = write("bad.lsp", "(unknown)");
     fail("(progn (ignore-errors " + load(bad) + ") (car 5))");
@@ -107,7 +107,7 @@ TEST_F(LispLoads, BlameNoFileWhoseErrorWasCaughtForWhatComesAfterIt)
     EXPECT_THAT(failed(), ElementsAre(Pair(other, "line 1: The function UNKNOWN is undefined.")));
 }
 
-TEST_F(LispLoads, NoteAFileThatGoesOnWithoutOneWithin)
+TEST_F(LoadsOfLisp, NoteAFileThatGoesOnWithoutOneWithin)
 {
     const auto bad = write("bad.lsp", "(unknown)");
     const auto good = write("good.lsp", "(ignore-errors " + load(bad) + ")");
@@ -117,7 +117,7 @@ TEST_F(LispLoads, NoteAFileThatGoesOnWithoutOneWithin)
     EXPECT_EQ(outcomes.of(tessel::toWide(bad)), nullptr);
 }
 
-TEST_F(LispLoads, BlameTheFileInWhichLispIsInterrupted)
+TEST_F(LoadsOfLisp, BlameTheFileInWhichLispIsInterrupted)
 {
     const auto path = write("a.lsp", "1\n(progn (princ \"x\") (loop))");
     onOutput = [this]
@@ -128,7 +128,7 @@ TEST_F(LispLoads, BlameTheFileInWhichLispIsInterrupted)
     EXPECT_THAT(failed(), ElementsAre(Pair(path, "line 2: Lisp was interrupted.")));
 }
 
-TEST_F(LispLoads, BlameTheFileThatFillsTheStack)
+TEST_F(LoadsOfLisp, BlameTheFileThatFillsTheStack)
 {
     const auto path = write("a.lsp", "(defun endless (n) (+ 1 (endless n)))\n(endless 1)");
     fail(load(path));
