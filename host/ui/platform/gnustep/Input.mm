@@ -17,11 +17,11 @@ namespace
 using ShouldBlock = BOOL (*)(id, SEL, BOOL*);
 using PollUntil = BOOL (*)(id, SEL, int, NSArray*);
 using ReceivedEvent = void (*)(id, SEL, void*, RunLoopEventType, void*, NSString*);
-using AcceptInput = void (*)(id, SEL, NSString*, NSDate*);
+using AcceptOrderedInput = void (*)(id, SEL, NSString*, NSDate*);
 ShouldBlock toolkitShouldBlock;
 PollUntil toolkitPollUntil;
 ReceivedEvent toolkitReceivedEvent;
-AcceptInput toolkitAcceptInput;
+AcceptOrderedInput toolkitAcceptOrderedInput;
 
 // Threads have run loops of their own, and no display.
 thread_local bool inputWaits = false;
@@ -95,12 +95,12 @@ void receivedEvent(id server, SEL selector, void* data, RunLoopEventType type, v
 
 // To take an event may need an answer of another program of the toolkit: the first press of a session asks
 // how the mouse is set up. What comes from the display during that wait would overtake the event.
-void acceptInput(id loop, SEL selector, NSString* mode, NSDate* limit)
+void acceptOrderedInput(id loop, SEL selector, NSString* mode, NSDate* limit)
 {
     if (!takesInput || ![mode isEqualToString:NSConnectionReplyMode])
-        return toolkitAcceptInput(loop, selector, mode, limit);
+        return toolkitAcceptOrderedInput(loop, selector, mode, limit);
     const DisplayUnwatched unwatched;
-    toolkitAcceptInput(loop, selector, mode, limit);
+    toolkitAcceptOrderedInput(loop, selector, mode, limit);
 }
 } // namespace
 
@@ -110,6 +110,7 @@ void takeInputInItsOrder()
     toolkitPollUntil = standInFor("GSRunLoopCtxt", @selector(pollUntil:within:), pollUntil);
     toolkitReceivedEvent =
         standInFor("XGServer", @selector(receivedEvent:type:extra:forMode:), receivedEvent);
-    toolkitAcceptInput = standInFor("NSRunLoop", @selector(acceptInputForMode:beforeDate:), acceptInput);
+    toolkitAcceptOrderedInput =
+        standInFor("NSRunLoop", @selector(acceptInputForMode:beforeDate:), acceptOrderedInput);
 }
 } // namespace tessel::windowing
