@@ -186,12 +186,10 @@ bool hasSelection(NSArrayController* rows)
 
 - (IBAction)onRemove:(id)sender
 {
-    NSArray* rows = [[[historyList selectedObjects] copy] autorelease];
-    if ([rows count] == 0)
+    if (!hasSelection(historyList))
         return;
     [self clearMessage];
-    ModrigUtils::RemoveFromHistory(ModrigUtils::PathsFromRows(rows),
-                                   ModrigUtils::RemovingRows(rows, historyList));
+    ModrigUtils::RemoveFromHistory(ModrigUtils::TakeSelectedRows(historyList));
 }
 
 - (IBAction)onUnload:(id)sender

@@ -105,12 +105,10 @@ constexpr NSInteger kRemoveSegment = 1;
 
 - (void)onRemove
 {
-    NSArray* rows = [[[startupApps selectedObjects] copy] autorelease];
-    if ([rows count] == 0)
+    if ([[startupApps selectedObjects] count] == 0)
         return;
     [[TsOCModrigUtil getModrigController] clearMessage];
-    ModrigUtils::RemoveFromStartupSuite(ModrigUtils::PathsFromRows(rows),
-                                        ModrigUtils::RemovingRows(rows, startupApps));
+    ModrigUtils::RemoveFromStartupSuite(ModrigUtils::TakeSelectedRows(startupApps));
 }
 
 - (NSInteger)numberOfRowsInTableView:(NSTableView*)table

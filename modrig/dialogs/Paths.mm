@@ -44,6 +44,13 @@ std::function<void(std::size_t)> RemovingRows(NSArray* rows, NSArrayController* 
     return [=](std::size_t index) { [table removeObject:[rows objectAtIndex:index]]; };
 }
 
+std::vector<CStdStr> TakeSelectedRows(NSArrayController* table)
+{
+    std::vector<CStdStr> paths = PathsFromRows([table selectedObjects]);
+    [table removeObjectsAtArrangedObjectIndexes:[table selectionIndexes]];
+    return paths;
+}
+
 std::vector<std::size_t> IndexesFromSet(NSIndexSet* set)
 {
     std::vector<std::size_t> indexes;

@@ -9,26 +9,23 @@ namespace ModrigUtils
 {
 namespace
 {
-void RemoveOneByOne(const std::vector<CStdStr>& paths, CStringList& list, const Removing& removing)
+void RemoveAllOf(const std::vector<CStdStr>& paths, CStringList& list)
 {
-    for (std::size_t index = 0; index < paths.size(); ++index)
-    {
-        removing(index);
-        RemoveInSpecificList(paths[index], list);
-    }
+    for (const CStdStr& path : paths)
+        RemoveInSpecificList(path, list);
 }
 } // namespace
 
-void RemoveFromHistory(const std::vector<CStdStr>& paths, const Removing& removing)
+void RemoveFromHistory(const std::vector<CStdStr>& paths)
 {
-    RemoveOneByOne(paths, gHistoryList, removing);
+    RemoveAllOf(paths, gHistoryList);
     if (!paths.empty())
         ModrigCmdlineSummary(ModrigMessages::kOneRemovedFromHistory, ModrigMessages::kManyRemovedFromHistory,
                              static_cast<unsigned>(paths.size()), paths.back());
 }
 
-void RemoveFromStartupSuite(const std::vector<CStdStr>& paths, const Removing& removing)
+void RemoveFromStartupSuite(const std::vector<CStdStr>& paths)
 {
-    RemoveOneByOne(paths, gStartupList, removing);
+    RemoveAllOf(paths, gStartupList);
 }
 } // namespace ModrigUtils

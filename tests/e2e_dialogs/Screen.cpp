@@ -124,6 +124,11 @@ void Screen::click(const std::string& window, Place place) const
     run("xdotool" + moveTo(window, place) + kPress);
 }
 
+void Screen::tap(const std::string& window, Place place) const
+{
+    run("xdotool" + moveTo(window, place) + "mousedown 1 mouseup 1");
+}
+
 void Screen::holdMenuOpenAt(const std::string& window, Place place) const
 {
     run("xdotool" + moveTo(window, place) + "mousedown 3 sleep 0.4");

@@ -37,6 +37,8 @@ public:
 
     // Presses and releases the mouse button, slowly enough for the toolkit.
     void click(const std::string& window, Place place) const;
+    // Presses and releases it at once, as touch pads do for a tap.
+    void tap(const std::string& window, Place place) const;
     // Presses the button and keeps it down: a menu stays open.
     void press(const std::string& window, Place place) const;
     void clickHolding(const std::string& key, const std::string& window, Place place) const;

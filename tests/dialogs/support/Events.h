@@ -22,6 +22,8 @@ void postKey(NSWindow* window, NSString* characters, unsigned modifiers);
 
 // Moves the pointer there, in the view's coordinates.
 void movePointerTo(NSView* view, NSPoint place);
+// The same without dealing with what comes of it.
+void sendPointerTo(NSView* view, NSPoint place);
 
 // How many windows the display shows, tips and menus among them.
 std::size_t windowsOnTheScreen();

@@ -34,7 +34,7 @@ void pump()
         [NSApp sendEvent:event];
 }
 
-void movePointerTo(NSView* view, NSPoint place)
+void sendPointerTo(NSView* view, NSPoint place)
 {
     const NSPoint point = [[view window] convertBaseToScreen:[view convertPoint:place toView:nil]];
     auto* display = static_cast<Display*>([GSCurrentServer() serverDevice]);
@@ -46,6 +46,11 @@ void movePointerTo(NSView* view, NSPoint place)
                      top + step);
         XSync(display, False);
     }
+}
+
+void movePointerTo(NSView* view, NSPoint place)
+{
+    sendPointerTo(view, place);
     pump();
 }
 

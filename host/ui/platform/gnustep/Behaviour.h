@@ -10,6 +10,9 @@ void keepHelperProgramsToTheSession();
 // Takes files that are dragged here from other programs.
 void acceptFileDrops();
 
+// Takes what comes from the display in the order in which it came, and as soon as it has come.
+void takeInputInItsOrder();
+
 // Lets every window be closed by its frame: file panels are cancelled then, message boxes answered.
 void makeWindowsClosable();
 

@@ -45,6 +45,11 @@ void setOwner(Display* display, Window window, Window owner)
 }
 } // namespace
 
+int connectionNumber(void* display)
+{
+    return XConnectionNumber(static_cast<Display*>(display));
+}
+
 bool isOnScreen(unsigned long window, void* display)
 {
     XWindowAttributes attributes;

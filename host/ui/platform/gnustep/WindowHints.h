@@ -5,6 +5,9 @@
 
 namespace tessel::windowing
 {
+// The descriptor that tells when something has come from the display.
+int connectionNumber(void* display);
+
 bool isOnScreen(unsigned long window, void* display);
 
 // Before the window is shown: which process it is of and, if it has an owner, that it is a dialog which stays

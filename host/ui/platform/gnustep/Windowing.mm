@@ -82,6 +82,7 @@ void chooseLook()
 void completeBehaviour()
 {
     acceptFileDrops();
+    takeInputInItsOrder();
     makeWindowsClosable();
     letNewWindowsHaveTheKeyboard();
     keepModalWindowsInFront();
