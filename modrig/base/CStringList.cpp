@@ -36,24 +36,36 @@ bool MatchesEntry(const SplitPath& entry, const SplitPath& target)
 
 void CStringList::AddTail(const CStdStr& text)
 {
-    Append(text, SplitPath(text), WholePathHash(text));
+    const auto entry = Append(text);
+    AddToIndex(entry, SplitPath(entry->text), WholePathHash(entry->text));
 }
 
+// The index of a long list is in no cache of the processor's, and memory takes about as long to answer as
+// everything takes that stands between asking and looking.
 const CStdStr* CStringList::AddTailUnlessHeld(CStdStr path)
 {
-    const SplitPath target(path);
     const std::size_t pathHash = WholePathHash(path);
-    if (Holds(target, pathHash))
+    mIndex.Prefetch(pathHash);
+    const auto entry = Append(std::move(path));
+    const SplitPath split(entry->text);
+    if (Holds(split, pathHash))
+    {
+        mEntries.erase(entry);
         return nullptr;
-    Append(std::move(path), target, pathHash);
-    return &mEntries.back().text;
+    }
+    AddToIndex(entry, split, pathHash);
+    return &entry->text;
 }
 
-void CStringList::Append(CStdStr text, const SplitPath& split, std::size_t pathHash)
+CStringList::Entries::iterator CStringList::Append(CStdStr text)
+{
+    return mEntries.insert(mEntries.end(), Entry{std::move(text), mNextPlace++});
+}
+
+void CStringList::AddToIndex(Entries::iterator entry, const SplitPath& split, std::size_t pathHash)
 {
     const bool knownByName = IsKnownByFileNameAlone(split);
     mKnownByName = mKnownByName || knownByName;
-    const auto entry = mEntries.insert(mEntries.end(), Entry{std::move(text), mNextPlace++});
     mIndex.Add(knownByName ? split.FileNameHash() : pathHash, entry);
 }
 

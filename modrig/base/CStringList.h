@@ -79,7 +79,8 @@ public:
     [[nodiscard]] bool HoldsApplication(const CStdStr& path) const;
 
 private:
-    void Append(CStdStr text, const SplitPath& split, std::size_t pathHash);
+    Entries::iterator Append(CStdStr text);
+    void AddToIndex(Entries::iterator entry, const SplitPath& split, std::size_t pathHash);
     bool Holds(const SplitPath& target, std::size_t pathHash) const;
     bool HoldsUnder(std::size_t hash, const SplitPath& target) const;
 
