@@ -37,7 +37,7 @@ constexpr int kFewRepetitions = 31; // short ones are noisy
 // What was measured and a tenth.
 constexpr double kReadToStore = 0.7;
 constexpr double kWriteToStore = 0.75;
-constexpr double kWriteNewToStore = 0.7;
+constexpr double kWriteNewToStore = 0.8;
 constexpr double kWriteSameToStore = 0.4;
 
 constexpr DWORD kBufferCharacters = 1024;
@@ -558,7 +558,7 @@ void addListBenchmarks()
     addListPeers();
     addStoreRatios();
     addHistoryRatios("read", 1.15, 1.2, 1.4);
-    addHistoryRatios("write", 1.2, 1.1, 1.15);
+    addHistoryRatios("write", 1.15, 1.15, 1.3);
     addLookups();
     addMemory();
 }

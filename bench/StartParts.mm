@@ -1,8 +1,11 @@
 // What a start cannot do without, by the calls of the store and of the system alone: none of the host's code
 // runs here, so that whatever the host adds to it shows. The registry's file is opened with the host's
-// settings, the bundle is mapped with the libraries that it needs and its entry point called with a message
+// settings, the bundle is loaded with the libraries that it needs and its entry point called with a message
 // that does nothing, and each entry of the Startup Suite is read, mapped and called; then each entry of the
-// History is read.
+// History is read. A bundle is loaded by the platform's call for bundles, without which its classes do not
+// find what lies in it; its program alone is mapped by the linker.
+#import <Foundation/Foundation.h>
+
 #include <dlfcn.h>
 #include <sqlite3.h>
 
@@ -110,8 +113,24 @@ void mapAndCall(const std::string& program, int binding)
     expect(entryPoint && entryPoint(kNothing, nullptr) == TSRX_RET_OK, "the entry point does not answer");
 }
 
-template <class Use>
-void readList(Store& store, const std::string& fold, long count, Use use)
+// Answers the program that it has mapped.
+std::string programOfLoaded(const std::string& folder)
+{
+    NSAutoreleasePool* const pool = [[NSAutoreleasePool alloc] init];
+    NSBundle* const bundle = [NSBundle bundleWithPath:[NSString stringWithUTF8String:folder.c_str()]];
+    expect([bundle load], "the bundle cannot be loaded");
+    std::string program = [[bundle executablePath] fileSystemRepresentation];
+    [pool release];
+    return program;
+}
+
+void loadAndCall(const std::string& bundleOrProgram)
+{
+    const bool isBundle = bundleOrProgram.ends_with(".bundle");
+    mapAndCall(isBundle ? programOfLoaded(bundleOrProgram) : bundleOrProgram, RTLD_LAZY); // as bundles are
+}
+
+template <class Use> void readList(Store& store, const std::string& fold, long count, Use use)
 {
     sqlite3_int64 key = 1;
     for (const char* const part : kModrig)
@@ -132,11 +151,11 @@ int main(int argc, char** argv)
 {
     if (argc != 5)
     {
-        std::fputs("usage: bench_start_parts REGISTRY PROGRAM-OF-BUNDLE SUITE-COUNT HISTORY-COUNT\n", stderr);
+        std::fputs("usage: bench_start_parts REGISTRY BUNDLE|PROGRAM SUITE-COUNT HISTORY-COUNT\n", stderr);
         return 2;
     }
     Store store(argv[1]);
-    mapAndCall(argv[2], RTLD_LAZY); // as the platform does with bundles
+    loadAndCall(argv[2]);
     readList(store, "startup", std::atol(argv[3]),
              [](const std::string& entry) { mapAndCall(entry, RTLD_NOW); });
     readList(store, "history", std::atol(argv[4]), [](const std::string&) {});
