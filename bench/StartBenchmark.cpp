@@ -153,8 +153,8 @@ void addStartBenchmarks()
         "empty lists", {0, 0}, {.loaded = 1.2, .mapped = 1.4},
         "Bare is a process without any code of the host's own: the registry's file opened with the host's "
         "settings, the bundle loaded by the platform's call for bundles with all libraries that it needs, "
-        "its "
-        "entry point called with a message that does nothing. The platform's call begins the toolkit (its "
+        "its entry point called with a message that does nothing. The platform's call begins the toolkit "
+        "(its "
         "character sets, its languages), which mapping the bundle's program by the linker does not; but "
         "classes so mapped do not find their windows and texts. The ratio to that stands beside it.");
     addStart(
