@@ -15,7 +15,7 @@ using testing::Not;
 namespace
 {
 const char kAllForBuilding[] =
-    "cmake ninja pkgconf ecl bdw-gc sqlite icu4c@77 openssl@3 libedit cli11 nlohmann-json gettext "
+    "cmake ninja pkgconf ecl bdw-gc sqlite icu4c@77 libdeflate openssl@3 libedit cli11 nlohmann-json gettext "
     "boost llvm lld librsvg ";
 
 class SetupOnMac : public TreeOfPrograms
@@ -58,9 +58,10 @@ TEST_F(SetupOnMac, SaysWhatIsMissingAndTheCommandThatBringsItAndInstallsNothing)
     has("cmake ninja ecl icu4c@77 lldb");
     const auto outcome = setup();
     EXPECT_EQ(outcome.status, 1);
-    EXPECT_THAT(outcome.output,
-                HasSubstr("brew install pkgconf bdw-gc sqlite openssl@3 libedit cli11 nlohmann-json gettext "
-                          "boost llvm lld librsvg googletest doxygen\n"));
+    EXPECT_THAT(
+        outcome.output,
+        HasSubstr("brew install pkgconf bdw-gc sqlite libdeflate openssl@3 libedit cli11 nlohmann-json "
+                  "gettext boost llvm lld librsvg googletest doxygen\n"));
     EXPECT_THAT(outcome.output, Not(HasSubstr("Asked to install")));
 }
 
