@@ -10,6 +10,7 @@
 #include <elf.h>
 #include <link.h>
 
+#include "host/platform/ImageRefusal.h"
 #include "host/text/Translation.h"
 
 // The host's own header, put there by the linker: what we load must be made for the same machine.
@@ -25,17 +26,7 @@ using Segment = ElfW(Phdr);
 constexpr std::size_t kMostSegments = 128;            // linkers write about a dozen
 constexpr std::uint64_t kSmallestPageInMemory = 4096; // the smallest page that segments are laid out for
 
-constexpr auto kNoLibrary = Sentence(L"it is not a shared library");
-constexpr auto kIsProgram = Sentence(L"it is a program, not a shared library");
 constexpr auto kObjectFile = Sentence(L"it is an object file, not a shared library");
-constexpr auto kOtherMachine = Sentence(L"it is built for another kind of processor");
-constexpr auto kCutShort = Sentence(L"the file is cut short");
-constexpr auto kDamaged = Sentence(L"its program headers are damaged");
-
-Failure refused(Sentence<> reason)
-{
-    return {translated(reason)};
-}
 
 bool fits(std::uint64_t offset, std::uint64_t size, std::uint64_t whole)
 {
@@ -55,36 +46,36 @@ std::uint64_t pageEnd(std::uint64_t address)
 Result<> checkKind(const Header& header)
 {
     if (std::memcmp(header.e_ident, ELFMAG, SELFMAG) != 0)
-        return refused(kNoLibrary);
+        return refusal::refused(refusal::kNoLibrary);
     const bool sameMachine = header.e_ident[EI_CLASS] == __ehdr_start.e_ident[EI_CLASS] &&
                              header.e_ident[EI_DATA] == __ehdr_start.e_ident[EI_DATA] &&
                              header.e_machine == __ehdr_start.e_machine;
     if (!sameMachine)
-        return refused(kOtherMachine);
+        return refusal::refused(refusal::kOtherMachine);
     if (header.e_type == ET_EXEC)
-        return refused(kIsProgram);
+        return refusal::refused(refusal::kIsProgram);
     if (header.e_type == ET_REL)
-        return refused(kObjectFile);
-    return header.e_type == ET_DYN ? Result<>() : refused(kNoLibrary);
+        return refusal::refused(kObjectFile);
+    return header.e_type == ET_DYN ? Result<>() : refusal::refused(refusal::kNoLibrary);
 }
 
 Result<> checkHeaderTables(const Header& header, std::uint64_t fileSize)
 {
     if (header.e_phentsize != sizeof(Segment) || header.e_phnum == 0 || header.e_phnum > kMostSegments)
-        return refused(kDamaged);
+        return refusal::refused(refusal::kDamaged);
     if (!fits(header.e_phoff, std::uint64_t{header.e_phnum} * sizeof(Segment), fileSize))
-        return refused(kCutShort);
+        return refusal::refused(refusal::kCutShort);
     // Sections are not mapped, but their table is the last thing in the file: where it is missing, the file
     // has lost its end.
     if (!fits(header.e_shoff, std::uint64_t{header.e_shnum} * header.e_shentsize, fileSize))
-        return refused(kCutShort);
+        return refusal::refused(refusal::kCutShort);
     return {};
 }
 
 Result<> checkLoadedSegment(const Segment& segment, std::uint64_t fileSize)
 {
     if (!fits(segment.p_offset, segment.p_filesz, fileSize))
-        return refused(kCutShort);
+        return refusal::refused(refusal::kCutShort);
     const bool alignmentIsPower = (segment.p_align & (segment.p_align - 1)) == 0;
     const bool samePlaceInPage = (segment.p_vaddr - segment.p_offset) % kSmallestPageInMemory == 0;
     const bool endsInAddressSpace =
@@ -92,8 +83,9 @@ Result<> checkLoadedSegment(const Segment& segment, std::uint64_t fileSize)
     // Only what can be written has a part that the file does not hold.
     const bool sizesAgree = (segment.p_flags & PF_W) != 0 ? segment.p_filesz <= segment.p_memsz
                                                           : segment.p_filesz == segment.p_memsz;
-    return alignmentIsPower && samePlaceInPage && endsInAddressSpace && sizesAgree ? Result<>()
-                                                                                   : refused(kDamaged);
+    return alignmentIsPower && samePlaceInPage && endsInAddressSpace && sizesAgree
+               ? Result<>()
+               : refusal::refused(refusal::kDamaged);
 }
 
 // How far a segment's addresses lie past its place in the file.
@@ -130,11 +122,11 @@ Result<> checkLoadedSegments(std::span<const Segment> segments, std::uint64_t fi
         if (auto checked = checkLoadedSegment(segment, fileSize); !checked)
             return checked;
         if (previous && !follows(segment, *previous))
-            return refused(kDamaged);
+            return refusal::refused(refusal::kDamaged);
         previous = &segment;
         hasCode |= (segment.p_flags & PF_X) != 0;
     }
-    return hasCode ? Result<>() : refused(kDamaged);
+    return hasCode ? Result<>() : refusal::refused(refusal::kDamaged);
 }
 
 bool holds(const Segment& loaded, const Segment& part)
@@ -178,12 +170,12 @@ Result<> checkSegments(std::span<const Segment> segments, std::uint64_t fileSize
         return std::ranges::count(segments, type, &Segment::p_type);
     };
     if (count(PT_INTERP) > 0)
-        return refused(kIsProgram);
+        return refusal::refused(refusal::kIsProgram);
     if (auto checked = checkLoadedSegments(segments, fileSize); !checked)
         return checked;
     const bool partsAreSound =
         std::ranges::all_of(segments, [&](const Segment& part) { return isSoundPart(part, segments); });
-    return partsAreSound && count(PT_DYNAMIC) == 1 ? Result<>() : refused(kDamaged);
+    return partsAreSound && count(PT_DYNAMIC) == 1 ? Result<>() : refusal::refused(refusal::kDamaged);
 }
 
 // A file too short for a header may still show what it was meant to be.
@@ -192,7 +184,7 @@ Result<> checkShortFile(std::uint64_t fileSize, const ReadAt& readAt)
     std::array<unsigned char, SELFMAG> start = {};
     const bool wasElf = readAt(0, start.data(), std::min<std::uint64_t>(fileSize, start.size())) &&
                         std::memcmp(start.data(), ELFMAG, start.size()) == 0;
-    return refused(wasElf ? kCutShort : kNoLibrary);
+    return refusal::refused(wasElf ? refusal::kCutShort : refusal::kNoLibrary);
 }
 } // namespace
 
@@ -207,7 +199,7 @@ Result<> checkMappable(std::uint64_t fileSize, const ReadAt& readAt)
         return checked;
     std::array<Segment, kMostSegments> table;
     if (!readAt(header.e_phoff, table.data(), header.e_phnum * sizeof(Segment)))
-        return refused(kCutShort);
+        return refusal::refused(refusal::kCutShort);
     return checkSegments(std::span(table).first(header.e_phnum), fileSize);
 }
 } // namespace tessel

@@ -8,25 +8,14 @@
 #include <mach-o/fat.h>
 #include <mach-o/loader.h>
 
+#include "host/platform/ImageRefusal.h"
 #include "host/platform/MachOFile.h"
-#include "host/text/Translation.h"
 
 namespace tessel
 {
 namespace
 {
 constexpr std::uint32_t kMostArchitectures = 32;
-
-constexpr auto kNoLibrary = Sentence(L"it is not a shared library");
-constexpr auto kIsProgram = Sentence(L"it is a program, not a shared library");
-constexpr auto kOtherMachine = Sentence(L"it is built for another kind of processor");
-constexpr auto kCutShort = Sentence(L"the file is cut short");
-constexpr auto kDamaged = Sentence(L"its program headers are damaged");
-
-Failure refused(Sentence<> reason)
-{
-    return {translated(reason)};
-}
 
 cpu_type_t ownProcessor()
 {
@@ -36,12 +25,14 @@ cpu_type_t ownProcessor()
 Result<> checkKind(const mach_header_64& header)
 {
     if (header.magic != MH_MAGIC_64)
-        return refused(kNoLibrary);
+        return refusal::refused(refusal::kNoLibrary);
     if (header.cputype != ownProcessor())
-        return refused(kOtherMachine);
+        return refusal::refused(refusal::kOtherMachine);
     if (header.filetype == MH_EXECUTE)
-        return refused(kIsProgram);
-    return header.filetype == MH_BUNDLE || header.filetype == MH_DYLIB ? Result<>() : refused(kNoLibrary);
+        return refusal::refused(refusal::kIsProgram);
+    return header.filetype == MH_BUNDLE || header.filetype == MH_DYLIB
+               ? Result<>()
+               : refusal::refused(refusal::kNoLibrary);
 }
 
 // Whether the file holds all that it says a segment has.
@@ -49,11 +40,11 @@ Result<> checkSegment(const MachOImage& image, std::uint64_t place, const ReadAt
 {
     segment_command_64 segment = {};
     if (!readAt(place, &segment, sizeof segment))
-        return refused(kCutShort);
+        return refusal::refused(refusal::kCutShort);
     if (segment.cmdsize < sizeof segment)
-        return refused(kDamaged);
+        return refusal::refused(refusal::kDamaged);
     const bool fits = segment.filesize <= image.size && segment.fileoff <= image.size - segment.filesize;
-    return fits ? Result<>() : refused(kCutShort);
+    return fits ? Result<>() : refusal::refused(refusal::kCutShort);
 }
 
 Result<> checkCommands(const MachOImage& image, const mach_header_64& header, const ReadAt& readAt)
@@ -64,9 +55,9 @@ Result<> checkCommands(const MachOImage& image, const mach_header_64& header, co
     {
         load_command command = {};
         if (!readAt(place, &command, sizeof command))
-            return refused(kCutShort);
+            return refusal::refused(refusal::kCutShort);
         if (command.cmdsize < sizeof command || command.cmdsize > room)
-            return refused(kDamaged);
+            return refusal::refused(refusal::kDamaged);
         const auto checked = command.cmd == LC_SEGMENT_64 ? checkSegment(image, place, readAt) : Result<>();
         if (!checked)
             return checked;
@@ -80,11 +71,11 @@ Result<> checkThin(const MachOImage& image, const ReadAt& readAt)
 {
     mach_header_64 header = {};
     if (image.size < sizeof header || !readAt(image.start, &header, sizeof header))
-        return refused(kCutShort);
+        return refusal::refused(refusal::kCutShort);
     if (auto checked = checkKind(header); !checked)
         return checked;
     if (header.sizeofcmds > image.size - sizeof header)
-        return refused(kCutShort);
+        return refusal::refused(refusal::kCutShort);
     return checkCommands(image, header, readAt);
 }
 
@@ -95,29 +86,29 @@ Result<MachOImage> imageForThisProcessor(std::uint64_t fileSize, const ReadAt& r
 {
     fat_header header = {};
     if (!readAt(0, &header.magic, sizeof header.magic))
-        return refused(kNoLibrary);
+        return refusal::refused(refusal::kNoLibrary);
     if (header.magic != FAT_CIGAM)
         return MachOImage{0, fileSize};
     if (!readAt(0, &header, sizeof header))
-        return refused(kCutShort);
+        return refusal::refused(refusal::kCutShort);
     const std::uint32_t count = OSSwapBigToHostInt32(header.nfat_arch);
     if (count > kMostArchitectures)
-        return refused(kNoLibrary);
+        return refusal::refused(refusal::kNoLibrary);
     for (std::uint32_t i = 0; i < count; ++i)
     {
         fat_arch image = {};
         if (!readAt(sizeof header + i * sizeof image, &image, sizeof image))
-            return refused(kCutShort);
+            return refusal::refused(refusal::kCutShort);
         if (static_cast<cpu_type_t>(OSSwapBigToHostInt32(static_cast<std::uint32_t>(image.cputype))) !=
             ownProcessor())
             continue;
         const std::uint64_t start = OSSwapBigToHostInt32(image.offset);
         const std::uint64_t size = OSSwapBigToHostInt32(image.size);
         if (size > fileSize || start > fileSize - size)
-            return refused(kCutShort);
+            return refusal::refused(refusal::kCutShort);
         return MachOImage{start, size};
     }
-    return refused(kOtherMachine);
+    return refusal::refused(refusal::kOtherMachine);
 }
 
 Result<> checkMappable(std::uint64_t fileSize, const ReadAt& readAt)
