@@ -71,15 +71,8 @@ std::wstring otherPathOf(const std::wstring& path, const Result<ModuleFile>& fil
 
 Result<> checkLoadable(const RegularFile& program)
 {
-    if (!program.opened())
-        return program.opened();
-    const auto readAt = [&](std::uint64_t offset, void* buffer, std::size_t size)
-    {
-        return program.read(offset, buffer, size);
-    };
-    if (auto mappable = checkMappable(program.size(), readAt); !mappable)
-        return mappable;
-    return checkSdkVersion(sdkVersionIn(program.size(), readAt));
+    auto mappable = checkMappable(program);
+    return mappable ? checkSdkVersion(sdkVersionIn(program.size(), readerOf(program))) : mappable;
 }
 
 // What is wrong with the program in a bundle.

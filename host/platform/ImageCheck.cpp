@@ -4,11 +4,16 @@
 
 namespace tessel
 {
+ReadAt readerOf(const RegularFile& file)
+{
+    return [&file](std::uint64_t offset, void* buffer, std::size_t size)
+    {
+        return file.read(offset, buffer, size);
+    };
+}
+
 Result<> checkMappable(const RegularFile& file)
 {
-    if (!file.opened())
-        return file.opened();
-    return checkMappable(file.size(), [&](std::uint64_t offset, void* buffer, std::size_t size)
-                         { return file.read(offset, buffer, size); });
+    return file.opened() ? checkMappable(file.size(), readerOf(file)) : file.opened();
 }
 } // namespace tessel

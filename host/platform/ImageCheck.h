@@ -18,6 +18,9 @@ class RegularFile;
 // Fills the buffer with bytes of the file from an offset; false when the file does not hold that many there.
 using ReadAt = std::function<bool(std::uint64_t offset, void* buffer, std::size_t size)>;
 
+// Reads that file, for as long as it is there.
+ReadAt readerOf(const RegularFile& file);
+
 // Whether the file may be mapped; why not is the end of a sentence.
 Result<> checkMappable(std::uint64_t fileSize, const ReadAt& readAt);
 // A file that is not open may not, for the reason (and its code) that it is not.
