@@ -16,17 +16,18 @@ wchar_t* copyText(std::wstring_view text)
     return copy;
 }
 
+TsResultBuffer* newBuffer(std::wstring_view text)
+{
+    return new TsResultBuffer{.next = nullptr, .type = TS_STRING, .value = {.string = copyText(text)}};
+}
+
 TsResultBuffer* newBuffer(const TsRbValue& value)
 {
-    auto buffer = std::make_unique<TsResultBuffer>();
-    buffer->next = nullptr;
-    buffer->type = value.type();
-    buffer->value.real = 0;
+    if (value.type() == TS_STRING)
+        return newBuffer(std::wstring_view(value.text() ? value.text() : L""));
+    auto* buffer = new TsResultBuffer{.next = nullptr, .type = value.type(), .value = {.real = 0}};
     switch (value.type())
     {
-    case TS_STRING:
-        buffer->value.string = copyText(value.text() ? value.text() : L"");
-        break;
     case TS_SHORT:
         buffer->value.shortNumber = static_cast<std::int16_t>(value.number());
         break;
@@ -39,12 +40,7 @@ TsResultBuffer* newBuffer(const TsRbValue& value)
     default: // truth values carry nothing else
         break;
     }
-    return buffer.release();
-}
-
-TsResultBuffer* newBuffer(std::wstring_view text)
-{
-    return new TsResultBuffer{.next = nullptr, .type = TS_STRING, .value = {.string = copyText(text)}};
+    return buffer;
 }
 
 void freeBuffers(TsResultBuffer* list)
