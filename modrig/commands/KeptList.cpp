@@ -150,11 +150,11 @@ public:
     CStdStr PlaceOfOther(const CStdStr& name, const CStdStr& data) const
     {
         wchar_t place[kPlaceSize] = {};
-        CStdStr counts;
-        if (!Have(name) || (ReadModrigRegString(HKEY_CURRENT_USER, mPath, name, counts) && counts == data))
+        if (!mIsOpen || !tsRegIsLaidDown(mKey, name.c_str(), place, kPlaceSize))
             return {};
-        static_cast<void>(tsRegIsLaidDown(mKey, name.c_str(), place, kPlaceSize)); // it is, as was seen
-        return CStdStr(std::wstring(place));
+        CStdStr counts;
+        const bool isTheSame = ReadModrigRegString(HKEY_CURRENT_USER, mPath, name, counts) && counts == data;
+        return isTheSame ? CStdStr() : CStdStr(std::wstring(place));
     }
 
 private:
