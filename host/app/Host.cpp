@@ -280,11 +280,15 @@ void Host::addCommands()
 
 void Host::showWhatWasNotTaken()
 {
+    const auto show = [this](const std::wstring& sentence)
+    {
+        static_cast<void>(mParts->messageBox->show(sentence.c_str(), MB_OK | MB_ICONEXCLAMATION, nullptr));
+    };
+    for (const std::wstring& sentence : mParts->notTaken)
+        show(sentence);
     // A module's own box, if it shows one, does not know why.
     if (const auto& canStore = mParts->registry->canStore(); !canStore)
-        mParts->notTaken.push_back(canStore.sentence());
-    for (const std::wstring& sentence : mParts->notTaken)
-        static_cast<void>(mParts->messageBox->show(sentence.c_str(), MB_OK | MB_ICONEXCLAMATION, nullptr));
+        show(canStore.sentence());
 }
 
 bool Host::run(const std::wstring& input)
