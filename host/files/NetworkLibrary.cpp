@@ -34,10 +34,9 @@ std::wstring lastWordsOfLinker()
 Result<void*> openLibrary(const std::filesystem::path& beside)
 {
     const auto mappable = checkMappable(RegularFile(beside.native()));
-    if (!mappable && mappable.code() != kNothingThere)
-        return Failure{toWide(beside.native()) + L": " + mappable.sentence()};
-    if (void* library = dlopen(mappable ? beside.c_str() : kLinkedLibrary, RTLD_NOW | RTLD_LOCAL))
-        return library;
+    if (mappable || mappable.code() == kNothingThere)
+        if (void* library = dlopen(mappable ? beside.c_str() : kLinkedLibrary, RTLD_NOW | RTLD_LOCAL))
+            return library;
     return Failure{mappable ? lastWordsOfLinker() : toWide(beside.native()) + L": " + mappable.sentence()};
 }
 
@@ -64,8 +63,8 @@ Result<Network*> network()
     static Network* found = nullptr;
     if (found)
         return found;
-    auto mapped =
-        mapNetwork(); // where it failed before, it may only have been that no more files could be opened
+    // Where it failed before, it may only have been that no more files could be opened.
+    auto mapped = mapNetwork();
     if (mapped)
         found = *mapped;
     return mapped;
